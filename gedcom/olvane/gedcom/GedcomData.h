@@ -1,0 +1,174 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "olvane/gedcom/GedcomDate.h"
+#include "olvane/gedcom/GedcomDiagnostic.h"
+
+namespace olvane::gedcom {
+
+// Persons and families count from 1 in the order of the file, each by its own; 0 is nobody.
+using PersonId = std::uint32_t;
+using FamilyId = std::uint32_t;
+// Lines count from 1.
+using LineNumber = std::uint32_t;
+
+enum class Sex : std::uint8_t { male = 0, female = 1, other = 2 };
+
+enum class Pedigree : std::uint8_t { notGiven, birth, adopted, foster, sealing, other };
+
+// One NAME of a person. Pieces come from the record's own pieces (GIVN, SURN with SPFX, NPFX, NSFX, NICK);
+// given name, surname and suffix come from the slashes of the value where the record has none.
+//
+// Holds: valid UTF-8 without control characters, trimmed; empty where not given.
+struct PersonName {
+    std::string_view written;  // the value with its slashes
+    std::string_view prefix;
+    std::string_view given;
+    std::string_view surname;
+    std::string_view suffix;
+    std::string_view nickname;
+};
+
+// The whole name for a person to read: the value without its slashes, or else the pieces in order.
+std::string displayName(const PersonName& name);
+
+// A run of a list that all records share.
+struct Slice {
+    std::uint32_t first = 0;
+    std::uint32_t count = 0;
+};
+
+// A person, with relatives as a tree wants them.
+//
+// Holds: father and mother come from the first FAMC of birth (or without a PEDI), else from the first FAMC,
+//        and are never outside 1 to personCount(), or 0. A person may be their own relative: data, not ours.
+struct Person {
+    std::string_view xref;  // without its @; empty if the record has none
+    GedcomDate birth;       // of the first BIRT that has a date
+    GedcomDate death;       // of the first DEAT that has a date
+    PersonId father = 0;
+    PersonId mother = 0;
+    Slice nameSlice;
+    Slice spouseSlice;
+    Slice childSlice;
+    Slice parentLinkSlice;
+    Slice coupleLinkSlice;
+    LineNumber line = 0;
+    Sex sex = Sex::other;
+    bool dead = false;  // DEAT, BURI, CREM or PROB is there
+};
+
+// A person's FAMC or FAMS. family is 0 for a void pointer and for one that leads to no family.
+struct FamilyLink {
+    FamilyId family = 0;
+    LineNumber line = 0;
+    Pedigree pedigree = Pedigree::notGiven;  // of a FAMC
+};
+
+// A family's CHIL. child is 0 for a void pointer and for one that leads to no person.
+struct ChildLink {
+    PersonId child = 0;
+    LineNumber line = 0;
+};
+
+// A family as its record gives it. The first two partners alone count; husband is the father, wife the mother.
+// Two HUSB, or two WIFE, stand in the order of the record: the first as husband, the second as wife.
+struct Family {
+    std::string_view xref;  // without its @
+    GedcomDate marriage;    // of the first MARR that has a date
+    PersonId husband = 0;
+    PersonId wife = 0;
+    Slice childLinkSlice;
+    LineNumber line = 0;
+    LineNumber husbandLine = 0;
+    LineNumber wifeLine = 0;
+    bool married = false;   // MARR is there
+    bool divorced = false;  // DIV is there, and no second MARR after it
+};
+
+// The lists behind the records, as the reader fills them.
+struct GedcomTables {
+    // Owner of the text that every view looks into; never moves.
+    std::shared_ptr<const void> text;
+    std::vector<Person> persons;
+    std::vector<Family> families;
+    std::vector<PersonName> names;
+    std::vector<FamilyLink> parentLinks;
+    std::vector<FamilyLink> coupleLinks;
+    std::vector<ChildLink> childLinks;
+    std::vector<PersonId> spouses;
+    std::vector<PersonId> children;
+    // Persons and families, each sorted by xref, first of a kind only; found by halving.
+    std::vector<PersonId> personsByXref;
+    std::vector<FamilyId> familiesByXref;
+    std::vector<Diagnostic> diagnostics;
+    std::string file;
+    std::string encoding;
+    std::string version;
+};
+
+// Everything that was read from one GEDCOM file. Every relative is found in constant time.
+//
+// Holds: moves, is never copied; views stay valid as long as the data lives, moved or not.
+// Fails: an id outside 1 to the count throws std::out_of_range.
+class GedcomData {
+public:
+    explicit GedcomData(GedcomTables tables);
+    GedcomData(GedcomData&&) noexcept = default;
+    GedcomData& operator=(GedcomData&&) noexcept = default;
+    GedcomData(const GedcomData&) = delete;
+    GedcomData& operator=(const GedcomData&) = delete;
+
+    std::size_t personCount() const { return tables_.persons.size(); }
+    std::size_t familyCount() const { return tables_.families.size(); }
+    bool hasPerson(PersonId id) const { return id >= 1 && id <= personCount(); }
+
+    const Person& person(PersonId id) const;
+    const Family& family(FamilyId id) const;
+    // persons()[0] is person 1.
+    std::span<const Person> persons() const { return tables_.persons; }
+    std::span<const Family> families() const { return tables_.families; }
+
+    // All NAMEs in the order of the record; the first is the one to show.
+    std::span<const PersonName> names(PersonId id) const;
+    // The first name; one without text for a person without any.
+    const PersonName& firstName(PersonId id) const;
+
+    // Partners over all FAMS in order, each once; the first is the preferred one. Never the person themself.
+    std::span<const PersonId> spouses(PersonId id) const;
+    // Children over all FAMS in order, each once.
+    std::span<const PersonId> children(PersonId id) const;
+    // All FAMC in order.
+    std::span<const FamilyLink> parentLinks(PersonId id) const;
+    // All FAMS in order.
+    std::span<const FamilyLink> coupleLinks(PersonId id) const;
+    // All CHIL in order.
+    std::span<const ChildLink> childLinks(FamilyId id) const;
+
+    // By xref, with or without @; 0 if there is none. Of several records of one xref the first is found.
+    PersonId personByXref(std::string_view xref) const;
+    FamilyId familyByXref(std::string_view xref) const;
+
+    // What was wrong with the file, in the order of its lines.
+    const std::vector<Diagnostic>& diagnostics() const { return tables_.diagnostics; }
+    const std::string& file() const { return tables_.file; }
+    // How the bytes were read: "UTF-8", "UTF-16LE", "UTF-16BE", "ANSEL", "ASCII", "windows-1252" and so on.
+    const std::string& encoding() const { return tables_.encoding; }
+    // GEDC.VERS as written: "5.5.1", "7.0"; empty if not given.
+    const std::string& version() const { return tables_.version; }
+
+private:
+    GedcomTables tables_;
+};
+
+}  // namespace olvane::gedcom
