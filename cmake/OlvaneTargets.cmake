@@ -1,0 +1,16 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+
+# What every target of ours is compiled with. Exact results are part of the interface: a fused multiply-add would
+# change them, so contraction is off for the engine and for everything that compares with it.
+function(olvane_target target)
+  target_compile_options(${target} PRIVATE -ffp-contract=off)
+  set_target_properties(${target} PROPERTIES CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON
+                                             POSITION_INDEPENDENT_CODE ON)
+  if(OLVANE_DEV)
+    target_compile_options(${target} PRIVATE -Wall -Wextra -Wconversion -Wshadow)
+    if(OLVANE_WERROR)
+      target_compile_options(${target} PRIVATE -Werror)
+    endif()
+  endif()
+endfunction()

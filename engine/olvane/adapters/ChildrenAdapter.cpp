@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The order of children: first sight in the request for children of a real person, dates and ids for records
+// that have no place in a host's list.
+
+#include <olvane/adapters/ChildrenAdapter.h>
+
+#include <cstring>
+#include <utility>
+
+ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string hostId, int placeInList)
+    : key(childKey), date(std::move(dateText)), idText(std::move(hostId)), hostOrder(placeInList) {}
+
+ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string hostId)
+    : ChildrenAdapter(childKey, std::move(dateText), std::move(hostId), 0) {}
+
+bool ChildrenAdapter::operator<(const ChildrenAdapter& other) const {
+    if (hostOrder >= 1 && other.hostOrder >= 1) return key < other.key;
+    if (date != other.date) return date < other.date;
+    // True both ways round, so no order at all. Sort texts are empty wherever the engine makes the records; a
+    // proper comparison here would let hosts rely on a field that nothing fills.
+    if (sortText != other.sortText) return std::strcmp(sortText.c_str(), other.sortText.c_str()) != 0;
+    if (idText != other.idText) return idText < other.idText;
+    return key < other.key;
+}

@@ -1,0 +1,46 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+#include <limits>
+#include <string>
+#include <vector>
+
+// The host's data source: eight questions about persons. All that the engine knows of a family comes through
+// these.
+//
+// Units: person ids are the host's own. Real persons have ids of 1 and more; ids below 1 mark synthetic
+// persons
+//        inside the engine. Only the low 32 bits of an id count.
+// Holds: asked on the caller's thread, within a layout, and many times for the same person, since no answer
+// is
+//        kept. Answers must agree with each other within one layout. They may contradict each other otherwise
+//        (a child that does not name its parent, a person who is their own ancestor): the layout takes them
+//        as told.
+// Fails: an operation may throw anything. The layout then ends with the text written so far.
+class OlvaneViewerManagerWrapProtocol {
+public:
+    // The answer of fatherForPersonWithID and motherForPersonWithID for a parent who is not known.
+    static constexpr std::int64_t kPersonNotFound = std::numeric_limits<std::int64_t>::max();
+
+    OlvaneViewerManagerWrapProtocol() = default;
+    OlvaneViewerManagerWrapProtocol(const OlvaneViewerManagerWrapProtocol&) = default;
+    OlvaneViewerManagerWrapProtocol& operator=(const OlvaneViewerManagerWrapProtocol&) = default;
+    virtual ~OlvaneViewerManagerWrapProtocol() = default;
+
+    virtual std::int64_t fatherForPersonWithID(std::int64_t personId) = 0;
+    virtual std::int64_t motherForPersonWithID(std::int64_t personId) = 0;
+    // The order of this list is the order of drawing. A spouse listed twice is drawn twice, with all
+    // children.
+    virtual std::vector<std::int64_t> spousesForPersonWithID(std::int64_t personId) = 0;
+    virtual std::vector<std::int64_t> childrenForPersonWithID(std::int64_t personId) = 0;
+    virtual bool isPreferredSpouse(std::int64_t personId, std::int64_t spouseId) = 0;
+    virtual bool isPersonDead(std::int64_t personId) = 0;
+    // UTF-8, in a form of the host's choosing. Asked with true for children and with false for spouses; the
+    // engine compares no more than the first character.
+    virtual std::string dateForPersonWithID(std::int64_t personId, bool isBirth) = 0;
+    // 0 for male; any other number counts as female.
+    virtual std::int32_t sexOfPersonWithID(std::int64_t personId) = 0;
+};

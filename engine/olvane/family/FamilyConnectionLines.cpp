@@ -1,0 +1,240 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The lines of the family view, in two passes over the whole graph: first every person's marriage lines, then
+// the lines to children, siblings and parents, which hang from them.
+//
+//        [F]---+---[M]      marriage line at mid-height, the drop in the gap between the two
+//              |
+//        +-----+-----+      the bus, at half the gap between generations
+//        |           |
+//       [P]         [B]     a stem for each child
+//
+// A child of one parent hangs from the bottom centre of that parent, and its bus runs at a quarter of the
+// gap, which keeps it apart from the buses of the couples. The shapes seen from below (a person's own
+// parents, its siblings) cut more of their numbers to whole points than those seen from above; hosts know the
+// lines by these numbers.
+//
+// Each child repeats the drop of its couple, and the repetition reaches the host: it is how a host counts the
+// lines that hang from a couple. Nothing here reads the lines on edges back.
+
+#include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/WholePoint.h>
+#include <olvane/layouter/LineCourse.h>
+
+#include <boost/make_shared.hpp>
+
+namespace SharedTreeViewer {
+
+using olvane::cutToWholePoint;
+
+// A man's spouses stand at his right, a woman's at her left. All lines of a person start at one edge, stacked
+// about mid-height, and a line to a farther spouse passes behind the nearer ones. With an even number of
+// spouses above two the stack is not symmetric about mid-height; drops and hosts' marriage labels hang from
+// it as it is.
+void TreeViewFamilyLayouter::addSpouseLinesToPerson(TreeViewPerson& person) {
+    const bool male = person.gender;
+    const float ownEdgeX = male ? treeSize.nodeWidth : 0.0f;
+    const float spouseEdgeX = male ? 0.0f : treeSize.nodeWidth;
+    const float offsetStep = male ? -1.0f : 1.0f;
+    int lineOffset = getLineOffset(person.getSpouseCount(), male);
+
+    person.spouseIterator([&](TreeViewPerson& spouse) {
+        const TreePoint own = person.getNodeCenter();
+        const TreePoint other = spouse.getNodeCenter();
+        const float dropX = male ? other.x - treeSize.horzPadding * 0.5f
+                                 : (other.x + treeSize.horzPadding * 0.5f) + treeSize.nodeWidth;
+        const float x1 = cutToWholePoint(own.x + ownEdgeX);
+        const float y = cutToWholePoint(own.y + treeSize.nodeHeight * 0.5f + static_cast<float>(lineOffset));
+        const float x2 = cutToWholePoint(other.x + spouseEdgeX);
+        person.addLineSegment(x1, y, x2, y, true);
+        person.spouseEdge(&spouse, TreeLine({TreePoint{x1, y}, TreePoint{dropX, y}, TreePoint{x2, y}}));
+        person.addSpouseLine(spouse.personId, x1, y, x2, y);
+        lineOffset =
+            olvane::wholePoint(treeSize.spouseLineStep * offsetStep + static_cast<float>(lineOffset));
+    });
+}
+
+// The order of the three stages is the order of the segments in every list.
+void TreeViewFamilyLayouter::addLinesToPerson(TreeViewPerson& person) {
+    person.childAndSpouseIterator(
+        [&](TreeViewPerson& child, TreeViewPerson& spouse) { addChildLine(person, child, spouse); });
+    person.allSiblingsIterator(false, [&](TreeViewPerson& sibling) { addSiblingLine(person, sibling); });
+    addParentLines(person);
+}
+
+void TreeViewFamilyLayouter::addChildLine(TreeViewPerson& person, TreeViewPerson& child,
+                                          TreeViewPerson& spouse) {
+    if (spouse.personId == person.personId) {
+        const TreeLine line = drawDropBusAndStem(dropToChildOfLoneParent(spouse), spouse, child);
+        person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &child, &person));
+    } else {
+        const TreeLine line = drawDropBusAndStem(dropToChildOfCouple(person, spouse), spouse, child);
+        TreeViewSpouseEdge* const couple = person.spouseEdge(&spouse, TreeLine());
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &child, couple));
+    }
+}
+
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfLoneParent(
+    const TreeViewPerson& parent) const {
+    const TreePoint at = parent.getNodeCenter();
+    Drop drop;
+    drop.x = at.x + treeSize.nodeWidth * 0.5f;
+    drop.startY = at.y + treeSize.nodeHeight;
+    drop.busY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
+    return drop;
+}
+
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfCouple(TreeViewPerson& person,
+                                                                         TreeViewPerson& spouse) const {
+    const TreePoint at = spouse.getNodeCenter();
+    Drop drop;
+    drop.x = person.gender ? at.x + treeSize.horzPadding * -0.5f
+                           : treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
+    drop.startY = person.getSpouseLine(spouse.personId).y1;
+    drop.busY = at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f;
+    return drop;
+}
+
+// Drop, bus and stem in this order: each joins the course at its end. A stem right below the drop gives a bus
+// of no length, which is drawn like any other.
+TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder,
+                                                    TreeViewPerson& child) const {
+    const TreePoint at = child.getNodeCenter();
+    const float stemX = cutToWholePoint(at.x + treeSize.nodeWidth * 0.5f);
+    LineCourse course;
+    course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
+    course.draw(child, stemX, drop.busY, drop.x, drop.busY);
+    course.draw(child, stemX, at.y, stemX, drop.busY);
+    return course.line();
+}
+
+// From a father's mid-height, in the gap at his right, down to the bus of a couple's children.
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(const TreeViewPerson& father) const {
+    const TreePoint at = father.getNodeCenter();
+    Drop drop;
+    drop.x = treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
+    drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight * 0.5f);
+    drop.busY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
+    return drop;
+}
+
+// From a parent's bottom centre, for a person with one parent and for a half sibling.
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromSingleParent(
+    const TreeViewPerson& parent) const {
+    const TreePoint at = parent.getNodeCenter();
+    Drop drop;
+    drop.x = at.x + treeSize.nodeWidth * 0.5f;
+    drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight);
+    drop.busY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
+    return drop;
+}
+
+// A full sibling names no parent of its own; a half sibling names the one that it shares.
+void TreeViewFamilyLayouter::addSiblingLine(TreeViewPerson& person, TreeViewPerson& sibling) {
+    if (sibling.personId == person.personId) return;
+    const int sharedParent = sibling.getParentId();
+    if (dataAdapter->isAddNode(sharedParent)) {
+        TreeViewPerson& father = person.getPreferredFather();
+        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromCouple(father), father, sibling));
+    } else {
+        const bool throughFather =
+            person.preferredFatherIndex != -1 && person.getPreferredFather().personId == sharedParent;
+        TreeViewPerson& parent = throughFather ? person.getPreferredFather() : person.getPreferredMother();
+        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromSingleParent(parent), parent, sibling));
+    }
+}
+
+// With both parents drawn the edge goes to the couple, a half sibling's too, although its line begins under
+// one parent: a host that walks a couple's edges meets all of its row. With a single parent the edge goes to
+// the person and not to the parent, unlike at the other places that make one; a host finds a sibling's edge
+// beside the person.
+void TreeViewFamilyLayouter::addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling,
+                                            const TreeLine& line) {
+    const bool hasFather = person.preferredFatherIndex != -1;
+    const bool hasMother = person.preferredMotherIndex != -1;
+    if (hasFather && hasMother) {
+        TreeViewSpouseEdge* const couple =
+            siblingParentsEdge(person.getPreferredFather(), person.getPreferredMother());
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &sibling, couple));
+        return;
+    }
+    const bool throughFather = hasFather && person.getPreferredFather().personId == sibling.getParentId();
+    TreeViewPerson& parent = throughFather ? person.getPreferredFather() : person.getPreferredMother();
+    person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &sibling, &parent));
+}
+
+// The points count only when this call is the one that makes the edge.
+TreeViewSpouseEdge* TreeViewFamilyLayouter::siblingParentsEdge(TreeViewPerson& father,
+                                                               TreeViewPerson& mother) {
+    const TreePoint fatherAt = father.getNodeCenter();
+    const TreePoint motherAt = mother.getNodeCenter();
+    const float y = cutToWholePoint(fatherAt.y + treeSize.nodeHeight * 0.5f);
+    const float middleX = father.gender ? motherAt.x + treeSize.horzPadding * -0.5f
+                                        : treeSize.nodeWidth + (motherAt.x + treeSize.horzPadding * 0.5f);
+    const TreePoint fatherEnd{fatherAt.x + treeSize.nodeWidth, y};
+    const TreePoint middle{middleX, y};
+    const TreePoint motherEnd{motherAt.x, y};
+    TreeLine line;
+    switch (courseOfParentsLine(father, mother)) {
+        case ParentsCourse::fromFather:
+            line = TreeLine({fatherEnd, middle, motherEnd});
+            break;
+        case ParentsCourse::fromMother:
+            line = TreeLine({motherEnd, middle, fatherEnd});
+            break;
+        case ParentsCourse::none:
+            break;
+    }
+    return mother.spouseEdge(&father, line);
+}
+
+// The mother is asked about twice with the same question: a data source may answer differently the second
+// time, and then the edge has no points. Asking for the father's host spouses loads them once and is needed
+// for that.
+TreeViewFamilyLayouter::ParentsCourse TreeViewFamilyLayouter::courseOfParentsLine(TreeViewPerson& father,
+                                                                                  TreeViewPerson& mother) {
+    const float fatherEndX = father.getNodeCenter().x + treeSize.nodeWidth;
+    if (!(mother.getNodeCenter().x > fatherEndX)) return ParentsCourse::fromFather;
+    father.getNonDisplayedSpouseIterator(dataAdapter->getSpouses);
+    if (father.getNonDisplayedSpouseCount() == 0) return ParentsCourse::fromMother;
+    if (father.nonDisplayedSpouses.front().personId == mother.personId) return ParentsCourse::fromMother;
+    if (!dataAdapter->isAddNode(mother.personId)) return ParentsCourse::fromFather;
+    if (dataAdapter->isAddNode(mother.personId)) return ParentsCourse::fromMother;
+    return ParentsCourse::none;
+}
+
+// Only where parents were added: children and siblings that hang under a person get their lines from above.
+void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
+    const int parentCount = person.getParentCount();
+    if (parentCount == 0) return;
+    if (parentCount == 1) {
+        TreeViewPerson& parent =
+            person.preferredFatherIndex != -1 ? person.getPreferredFather() : person.getPreferredMother();
+        const TreeLine line = drawDropBusAndStem(dropFromSingleParent(parent), parent, person);
+        parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &person, &parent));
+        return;
+    }
+    TreeViewPerson& father = person.getPreferredFather();
+    TreeViewPerson& mother = person.getPreferredMother();
+    const Drop drop = dropFromCouple(father);
+    const TreeLine line = drawDropBusAndStem(drop, father, person);
+    drawParentsMarriageLine(father, mother, drop);
+    TreeViewSpouseEdge* const couple = father.spouseEdge(&mother, TreeLine());
+    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &person, couple));
+}
+
+// The one marriage line of a couple that stands on the chart as somebody's parents and not as each other's
+// spouses. Its ends keep their fractions in x. Whether the father is an add-node is asked and changes
+// nothing: the look-up that it makes fails on a key that was never handed out.
+void TreeViewFamilyLayouter::drawParentsMarriageLine(TreeViewPerson& father, TreeViewPerson& mother,
+                                                     const Drop& drop) {
+    const float fatherEndX = father.getNodeCenter().x + treeSize.nodeWidth;
+    const float motherEndX = mother.getNodeCenter().x;
+    father.addLineSegment(fatherEndX, drop.startY, motherEndX, drop.startY, true);
+    dataAdapter->isAddNode(father.personId);
+    father.spouseEdge(&mother, TreeLine({TreePoint{fatherEndX, drop.startY}, TreePoint{drop.x, drop.startY},
+                                         TreePoint{motherEndX, drop.startY}}));
+}
+
+}  // namespace SharedTreeViewer

@@ -1,0 +1,153 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The flag of each person: the data source knows a relative who stands nowhere on the chart. The passes over
+// ancestors, siblings, children and spouses come first, each overwriting what it finds; then a final pass
+// compares every real person with the whole display and has the last word.
+//
+// All of them stay although the final pass replaces most answers: they fill what the nodes keep of the data
+// source's answers, they use up synthetic ids in a fixed order, and they alone decide about add-nodes.
+
+#include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/layouter/HiddenRelatives.h>
+
+#include <algorithm>
+
+namespace SharedTreeViewer {
+
+void TreeViewFamilyLayouter::flagNonDisplayedRelationships(TreeViewPerson& focus) {
+    flagGreatGrandparentsWithParents(*this, focus);
+    flagSiblings(focus);
+    traverseTreeForStacking(0, focus);
+    flagChildren(focus);
+    clearVisitedMarks();
+    flagNonDisplayedRelationshipsForSpouses(focus, false);
+    collectShownPersons();
+    graphIterator([this](TreeViewPerson& person) { flagAgainstWholeDisplay(person); });
+    stackedPersons.clear();
+    shownKeys.clear();
+}
+
+void TreeViewFamilyLayouter::flagSiblings(TreeViewPerson& focus) {
+    focus.allSiblingsIterator(false, [&](TreeViewPerson& sibling) {
+        if (sibling.allChildrenLoaded) flagNonDisplayedRelationshipsForSpouses(sibling, true);
+        if (!sibling.hasNonDisplayedRelationships && hasParents(sibling)) {
+            sibling.hasNonDisplayedRelationships = siblingHasAnotherParent(sibling, focus);
+        }
+        checkPersonsChildren(sibling);
+    });
+}
+
+bool TreeViewFamilyLayouter::siblingHasAnotherParent(TreeViewPerson& sibling, TreeViewPerson& focus) {
+    const ParentKeys parents = parentKeysOf(*this, sibling);
+    if (!dataAdapter->isAddNode(parents.father) && focus.preferredFatherIndex != -1 &&
+        focus.getPreferredFather().personId != parents.father) {
+        return true;
+    }
+    if (dataAdapter->isAddNode(parents.mother) || focus.preferredMotherIndex == -1) return false;
+    return focus.getPreferredMother().personId != parents.mother;
+}
+
+void TreeViewFamilyLayouter::flagChildren(TreeViewPerson& focus) {
+    focus.allChildrenIterator(true, [&](TreeViewPerson& child) {
+        checkChildForUnshownParents(focus, child);
+        flagNonDisplayedRelationshipsForSpouses(child, true);
+        checkPersonsChildren(child);
+    });
+}
+
+void TreeViewFamilyLayouter::clearVisitedMarks() {
+    for (TreeViewPerson* person : stackedPersons) person->setHasBeenVisited(false);
+    stackedPersons.clear();
+}
+
+void TreeViewFamilyLayouter::collectShownPersons() {
+    graphIterator([this](TreeViewPerson& person) {
+        stackedPersons.push_back(&person);
+        shownKeys.insert(person.personId);
+    });
+}
+
+void TreeViewFamilyLayouter::flagAgainstWholeDisplay(TreeViewPerson& person) {
+    if (dataAdapter->isAddNode(person.personId)) return;
+    const bool hiddenChildren = hasHiddenChildren(person);
+    const bool hiddenSpouses = hasHiddenSpouses(person);
+    const bool hiddenParent = hasHiddenParent(person);
+    person.hasNonDisplayedRelationships = hiddenChildren || hiddenSpouses || hiddenParent;
+}
+
+namespace {
+
+// A relative counts as shown if any node with its key stands anywhere on the display. Where as many are drawn
+// under the person as the data source knows, nobody is looked up.
+template <class Records, class Keys>
+bool someAreHidden(const Records& records, int drawnUnderPerson, const Keys& shownKeys) {
+    if (static_cast<int>(records.size()) == drawnUnderPerson) return false;
+    return std::any_of(records.begin(), records.end(),
+                       [&](const auto& record) { return shownKeys.find(record.key) == shownKeys.end(); });
+}
+
+}  // namespace
+
+bool TreeViewFamilyLayouter::hasHiddenChildren(TreeViewPerson& person) {
+    const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
+    return someAreHidden(children, person.getAllChildrenCount(), shownKeys);
+}
+
+bool TreeViewFamilyLayouter::hasHiddenSpouses(TreeViewPerson& person) {
+    SpouseSet spouses;
+    dataAdapter->getSpouses(person.personId, spouses);
+    return someAreHidden(spouses, person.getSpouseCount(), shownKeys);
+}
+
+bool TreeViewFamilyLayouter::hasHiddenParent(TreeViewPerson& person) {
+    int father =
+        person.preferredFatherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredFather().personId;
+    int mother =
+        person.preferredMotherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredMother().personId;
+    if (father == TreeViewPerson::kNoKey || mother == TreeViewPerson::kNoKey) {
+        dataAdapter->getParents(person.personId, father, mother);
+    }
+    const bool fatherShown = isShownOrUnknown(father);
+    const bool motherShown = isShownOrUnknown(mother);
+    return !(fatherShown && motherShown);
+}
+
+bool TreeViewFamilyLayouter::isShownOrUnknown(int parentKey) {
+    return parentKey == TreeViewPerson::kNoKey || dataAdapter->isAddNode(parentKey) ||
+           shownKeys.find(parentKey) != shownKeys.end();
+}
+
+void TreeViewFamilyLayouter::flagNonDisplayedRelationshipsForSpouses(TreeViewPerson& person,
+                                                                     bool checkChildren) {
+    person.spouseIterator([&](TreeViewPerson& spouse) {
+        bool flag = spouseHasRelativesElsewhere(*this, spouse);
+        if (checkChildren) {
+            const ChildrenSet& children = spouse.getAllChildrenVector(dataAdapter->getChildren);
+            if (!children.empty()) {
+                int child = children.begin()->key;
+                int other = spouse.personId;
+                if (!checkIfPrefferedParent(person, child, other)) flag = true;
+            }
+        }
+        spouse.hasNonDisplayedRelationships = flag;
+    });
+}
+
+// The host's spouses of the parent are loaded where the couple is not on the chart. How many there are
+// changes nothing; that they were asked for does.
+void TreeViewFamilyLayouter::checkChildForUnshownParents(TreeViewPerson& parent, TreeViewPerson& child) {
+    const ParentKeys parents = parentKeysOf(*this, child);
+    bool unshown = !parentsAreAShownCouple(*this, parent, parents);
+    if (unshown) {
+        loadHostSpouses(*this, parent);
+        if (dataAdapter->isAddNode(parents.father) || dataAdapter->isAddNode(parents.mother)) unshown = false;
+    }
+    child.hasNonDisplayedRelationships = unshown;
+}
+
+void TreeViewFamilyLayouter::checkPersonsChildren(TreeViewPerson& person) {
+    flagChildrenWithFamilies(*this, person);
+}
+
+}  // namespace SharedTreeViewer

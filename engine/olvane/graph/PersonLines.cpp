@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A person's lines: the segments that reach the host, and the marriage lines once more by the spouse's key,
+// so that a drop to a child can hang from the line of its own couple.
+
+#include <olvane/graph/TreeViewPerson.h>
+
+void TreeViewPerson::addLineSegment(float x1, float y1, float x2, float y2, bool isSpouseLine) {
+    lineSegments.push_back(TreeLineSegment{x1, y1, x2, y2, isSpouseLine});
+}
+
+void TreeViewPerson::addSpouseLine(int spouseKey, float x1, float y1, float x2, float y2) {
+    spouseLines[spouseKey].push_back(TreeLineSegment{x1, y1, x2, y2, true});
+}
+
+TreeLineSegment& TreeViewPerson::getSpouseLine(int spouseKey) {
+    return spouseLines[spouseKey].at(0);
+}
+
+void TreeViewPerson::lineSegmentIterator(const SegmentVisitor& visitor) {
+    for (TreeLineSegment& segment : lineSegments) visitor(segment);
+}

@@ -1,0 +1,151 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Polylines: growing one at either end, measuring it, and chaining loose segments into as few lines as the
+// rules of joining allow. The chaining walks the loose segments from the first one again after every join;
+// the lists are the few segments of one person.
+
+#include <olvane/graph/TreeLine.h>
+
+#include <cmath>
+#include <cstddef>
+#include <stdexcept>
+#include <utility>
+
+TreeLine::TreeLine(std::vector<TreePoint> points) : points_(std::move(points)) {}
+
+TreeLine::TreeLine(TreeLineSegment segment) : points_{segment.firstEnd(), segment.secondEnd()} {}
+
+void TreeLine::pushPointBack(TreePoint point) {
+    points_.push_back(point);
+    lengthIsCached = false;
+}
+
+void TreeLine::pushPointFront(TreePoint point) {
+    points_.insert(points_.begin(), point);
+    lengthIsCached = false;
+}
+
+TreePoint TreeLine::first() const {
+    return points_.at(0);
+}
+
+TreePoint TreeLine::last() const {
+    return points_.at(points_.size() - 1);
+}
+
+TreeLineSegment TreeLine::frontLineSegment() const {
+    const TreePoint from = points_.at(0);
+    const TreePoint to = points_.at(1);
+    return TreeLineSegment{from.x, from.y, to.x, to.y, false};
+}
+
+TreeLineSegment TreeLine::backLineSegment() const {
+    const TreePoint from = points_.at(points_.size() - 1);
+    const TreePoint to = points_.at(points_.size() - 2);
+    return TreeLineSegment{from.x, from.y, to.x, to.y, false};
+}
+
+bool TreeLine::addLineSegmentFront(TreeLineSegment segment) {
+    if (points_.empty()) return addLineSegmentBack(segment);
+    if (segment.firstEnd() == first()) {
+        pushPointFront(segment.secondEnd());
+        return true;
+    }
+    if (segment.secondEnd() == first()) {
+        pushPointFront(segment.firstEnd());
+        return true;
+    }
+    return false;
+}
+
+bool TreeLine::addLineSegmentBack(TreeLineSegment segment) {
+    if (points_.empty()) {
+        pushPointBack(segment.firstEnd());
+        pushPointBack(segment.secondEnd());
+        return true;
+    }
+    if (segment.firstEnd() == last()) {
+        pushPointBack(segment.secondEnd());
+        return true;
+    }
+    if (segment.secondEnd() == last()) {
+        pushPointBack(segment.firstEnd());
+        return true;
+    }
+    return false;
+}
+
+float TreeLine::length() {
+    if (lengthIsCached) return cachedLength;
+    cachedLength = 0.0f;
+    for (std::size_t i = 1; i < points_.size(); ++i) {
+        const float dx = points_[i].x - points_[0].x;
+        const float dy = points_[i].y - points_[0].y;
+        cachedLength += std::sqrt(dx * dx + dy * dy);
+    }
+    lengthIsCached = true;
+    return cachedLength;
+}
+
+namespace {
+
+enum class Joint { none, front, back };
+
+// Where the candidate may join the line. The first end that meets settles it, even when the directions then
+// refuse the join: no later end of the same candidate is tried.
+Joint jointFor(const TreeLine& line, const TreeLineSegment& candidate) {
+    const auto unlessSame = [](int lineCode, int candidateCode, Joint joint) {
+        return lineCode != candidateCode ? joint : Joint::none;
+    };
+    const TreePoint front = line.first();
+    const TreePoint back = line.last();
+    if (candidate.firstEnd() == front) {
+        return unlessSame(line.frontLineSegment().directionFromX1Y1(), candidate.directionFromX1Y1(),
+                          Joint::front);
+    }
+    if (candidate.secondEnd() == front) {
+        return unlessSame(line.frontLineSegment().directionFromX1Y1(), candidate.directionFromX2Y2(),
+                          Joint::front);
+    }
+    if (candidate.firstEnd() == back) {
+        return unlessSame(line.backLineSegment().directionFromX2Y2(), candidate.directionFromX1Y1(),
+                          Joint::back);
+    }
+    if (candidate.secondEnd() == back) {
+        return unlessSame(line.backLineSegment().directionFromX2Y2(), candidate.directionFromX2Y2(),
+                          Joint::back);
+    }
+    return Joint::none;
+}
+
+// Joins the first segment that may join, takes it out of the list, and says whether there was one.
+bool growByOneSegment(TreeLine& line, std::vector<TreeLineSegment>& segments) {
+    for (auto candidate = segments.begin(); candidate != segments.end(); ++candidate) {
+        const Joint joint = jointFor(line, *candidate);
+        if (joint == Joint::none) continue;
+        const bool joined = joint == Joint::front ? line.addLineSegmentFront(*candidate)
+                                                  : line.addLineSegmentBack(*candidate);
+        if (!joined) {
+            throw std::logic_error(
+                "logic error: The position returned by find_if should agree with addLine()");
+        }
+        segments.erase(candidate);
+        return true;
+    }
+    return false;
+}
+
+}  // namespace
+
+std::vector<TreeLine> TreeLine::TreeLinesFromLineSegments(std::vector<TreeLineSegment> segments) {
+    std::vector<TreeLine> lines;
+    while (!segments.empty()) {
+        TreeLine line(segments.back());
+        segments.pop_back();
+        while (growByOneSegment(line, segments)) {
+        }
+        lines.push_back(line);
+    }
+    return lines;
+}

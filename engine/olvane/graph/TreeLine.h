@@ -1,0 +1,59 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <vector>
+
+#include <olvane/Export.h>
+#include <olvane/graph/TreeLineSegment.h>
+#include <olvane/graph/TreePoint.h>
+
+// A polyline that grows at either end. A plain value: a copy is a deep copy.
+//
+// Units: points. Ends meet only when both coordinates are exactly equal.
+// Fails: the operations that need points on the line (first, last, frontLineSegment, backLineSegment) throw
+//        std::out_of_range on a line that is too short.
+class OLVANE_API TreeLine {
+public:
+    TreeLine() = default;
+    explicit TreeLine(std::vector<TreePoint> points);
+    explicit TreeLine(TreeLineSegment segment);  // two points: the first end, then the second
+
+    void pushPointBack(TreePoint point);
+    void pushPointFront(TreePoint point);
+
+    TreePoint first() const;
+    TreePoint last() const;
+
+    // The segment from the first point to the second.
+    TreeLineSegment frontLineSegment() const;
+
+    // The segment from the last point to the one before it. The order is reversed, unlike at the front, and
+    // must stay so: TreeLinesFromLineSegments tells a turn from a straight run by it.
+    TreeLineSegment backLineSegment() const;
+
+    // Joins a segment by whichever of its ends lies on the first (or last) point; the first end is tried
+    // first. False, and no change, when neither end does. Any segment joins an empty line.
+    bool addLineSegmentFront(TreeLineSegment segment);
+    bool addLineSegmentBack(TreeLineSegment segment);
+
+    // The sum of the distances of all later points from the FIRST point, not from the point before: for three
+    // or more points this is not the length of the polyline. (0,0) (10,0) (10,10) gives 10 + 14.142136. Hosts
+    // compare lines by this number, so a corrected sum would rank their lines anew. Kept until the next
+    // change.
+    float length();
+
+    // Chains loose segments into polylines, growing each from the last segment that is left. A candidate that
+    // would run back over the front segment is refused, and so is one that runs straight on at the back: the
+    // two ends differ, on purpose (see backLineSegment). Lines come in the order in which they were finished.
+    // Fails: std::logic_error when a chosen segment does not join; ordinary numbers cannot bring that about.
+    static std::vector<TreeLine> TreeLinesFromLineSegments(std::vector<TreeLineSegment> segments);
+
+    const std::vector<TreePoint>& points() const { return points_; }
+
+private:
+    std::vector<TreePoint> points_;
+    float cachedLength = 0.0f;
+    bool lengthIsCached = false;
+};

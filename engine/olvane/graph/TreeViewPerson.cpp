@@ -1,0 +1,87 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A person's relatives, and how they come in. Every entry goes through addPerson, which builds a bare person
+// and appends a copy of it, so that a failed allocation leaves the list untouched.
+
+#include <olvane/graph/TreeViewPerson.h>
+
+#include <cstddef>
+
+TreeViewPerson::TreeViewPerson(int key) : personId(key) {}
+
+TreeViewPerson::~TreeViewPerson() {
+    for (const auto& owned : spouseEdges) delete owned.second;
+}
+
+TreeViewPerson& TreeViewPerson::addPerson(int id, Persons& list, bool male) {
+    list.push_back(TreeViewPerson(id));
+    list.back().gender = male;
+    return list.back();
+}
+
+TreeViewPerson& TreeViewPerson::addChild(int id, Persons& list, bool male) {
+    return addPerson(id, list, male);
+}
+
+TreeViewPerson& TreeViewPerson::addSiblingHelper(int id, Persons& list, bool male) {
+    return addPerson(id, list, male);
+}
+
+TreeViewPerson& TreeViewPerson::addParent(int id, bool male) {
+    return addPerson(id, parents, male);
+}
+
+void TreeViewPerson::setParents(int fatherId, int motherId) {
+    setParentsFatherOnly(fatherId);
+    setParentsMotherOnly(motherId);
+}
+
+void TreeViewPerson::setParentsFatherOnly(int fatherId) {
+    addParent(fatherId, true);
+    preferredFatherIndex = getParentCount() - 1;
+}
+
+void TreeViewPerson::setParentsMotherOnly(int motherId) {
+    addParent(motherId, false);
+    preferredMotherIndex = getParentCount() - 1;
+}
+
+TreeViewPerson& TreeViewPerson::addSibling(int id, bool male) {
+    return addSiblingHelper(id, siblings, male);
+}
+
+TreeViewPerson& TreeViewPerson::addHalfSibling(int id, int sharedParentId, bool male) {
+    TreeViewPerson& sibling = addSiblingHelper(id, siblings, male);
+    sibling.parentId = sharedParentId;
+    return sibling;
+}
+
+TreeViewPerson& TreeViewPerson::addSpouse(int id, bool male) {
+    return addPerson(id, spouses, male);
+}
+
+TreeViewPerson& TreeViewPerson::addNonDisplayedSpouse(int id) {
+    return addPerson(id, nonDisplayedSpouses, false);
+}
+
+TreeViewPerson& TreeViewPerson::addChildWithSpouse(int childId, int spouseId, bool male) {
+    return addChild(childId, children[spouseId], male);
+}
+
+TreeViewPerson& TreeViewPerson::addChildWithNoOtherSpouse(int childId, bool male) {
+    return addChildWithSpouse(childId, kNoKey, male);
+}
+
+// An index of -1 wraps to one that no list can hold, so it fails like any other.
+TreeViewPerson& TreeViewPerson::getPreferredFather() {
+    return parents.at(static_cast<std::size_t>(preferredFatherIndex));
+}
+
+TreeViewPerson& TreeViewPerson::getPreferredMother() {
+    return parents.at(static_cast<std::size_t>(preferredMotherIndex));
+}
+
+TreeViewPerson& TreeViewPerson::getPreferredSpouse() {
+    return spouses.at(0);
+}

@@ -1,0 +1,194 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Who is admitted to the graph, and as what. One person's relatives are fetched through the callbacks and
+// entered into that person: who is a child of which couple, who a child of one parent alone, who a full and
+// who a half sibling.
+//
+// Two things here look wasteful and are not. Parents are asked for again at every look: each answer for a
+// person with an unknown parent makes new synthetic keys, and the keys of everybody met later, and with them
+// the order of children, depend on how many were made. And a child is looked up by the order of its records,
+// not by its key: the record from a real parent and the one from an add-node differ where there is a birth
+// date, so such a child counts as a child of the real parent alone.
+
+#include <olvane/layouter/TreeViewLayouter.h>
+
+namespace SharedTreeViewer {
+
+namespace {
+
+// A set of records whose orders may contradict each other (see above) depends on the road by which it was
+// filled: one plain insert after another.
+void addAllTo(ChildrenSet& set, const ChildrenSet& records) {
+    for (const ChildrenAdapter& record : records) set.insert(record);
+}
+
+bool contains(const ChildrenSet& set, const ChildrenAdapter& record) {
+    return set.find(record) != set.end();
+}
+
+}  // namespace
+
+void TreeViewLayouter::addSpousesToPerson(TreeViewPerson& person) {
+    SpouseSet records;
+    dataAdapter->getSpouses(person.personId, records);
+    for (const SpouseAdapter& record : records) {
+        admit(record.key);
+        person.addSpouse(record.key, !person.gender);
+    }
+}
+
+void TreeViewLayouter::addParentsToPerson(TreeViewPerson& person) {
+    int father = TreeViewPerson::kNoKey;
+    int mother = TreeViewPerson::kNoKey;
+    dataAdapter->getParents(person.personId, father, mother);
+    if (father != TreeViewPerson::kNoKey && mother != TreeViewPerson::kNoKey) {
+        person.setParents(father, mother);
+    } else if (father != TreeViewPerson::kNoKey) {
+        person.setParentsFatherOnly(father);
+    } else if (mother != TreeViewPerson::kNoKey) {
+        person.setParentsMotherOnly(mother);
+    }
+}
+
+bool TreeViewLayouter::hasParents(TreeViewPerson& person) {
+    int father = TreeViewPerson::kNoKey;
+    int mother = TreeViewPerson::kNoKey;
+    dataAdapter->getParents(person.personId, father, mother);
+    return (father != TreeViewPerson::kNoKey && !dataAdapter->isAddNode(father)) ||
+           (mother != TreeViewPerson::kNoKey && !dataAdapter->isAddNode(mother));
+}
+
+void TreeViewLayouter::addAllChildrenToPerson(TreeViewPerson& person) {
+    const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
+    if (children.empty()) return;
+    addBastardChildrenToPerson(person, person.getSpouseIterator());
+    person.spouseIterator(
+        [&](TreeViewPerson& spouse) { addChildrenWithSpousesToPerson(person, spouse, children); });
+}
+
+void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator) {
+    for (const ChildrenAdapter& record : getBastardChildrenOfPerson(person, iterator)) {
+        admit(record.key);
+        person.addChildWithNoOtherSpouse(record.key, dataAdapter->isMale(record.key));
+    }
+}
+
+ChildrenSet TreeViewLayouter::getBastardChildrenOfPerson(TreeViewPerson& person, Iterator iterator) {
+    const ChildrenSet& own = person.getAllChildrenVector(dataAdapter->getChildren);
+    ChildrenSet alone;
+    if (own.empty()) return alone;
+    ChildrenSet others;
+    iterator([&](TreeViewPerson& other) {
+        if (other.personId == person.personId) return;
+        addAllTo(others, other.getAllChildrenVector(dataAdapter->getChildren));
+    });
+    for (const ChildrenAdapter& record : own) {
+        if (!contains(others, record)) alone.insert(record);
+    }
+    return alone;
+}
+
+ChildrenSet TreeViewLayouter::getIntersectingVector(const ChildrenSet& first,
+                                                    const ChildrenSet& second) const {
+    ChildrenSet common;
+    ChildrenSet::const_iterator a = first.begin();
+    ChildrenSet::const_iterator b = second.begin();
+    while (a != first.end() && b != second.end()) {
+        if (*a < *b) {
+            ++a;
+        } else if (*b < *a) {
+            ++b;
+        } else {
+            common.insert(*a);
+            ++a;
+            ++b;
+        }
+    }
+    return common;
+}
+
+void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, TreeViewPerson& spouse,
+                                                      const ChildrenSet& children) {
+    if (children.empty()) return;
+    const ChildrenSet common =
+        getIntersectingVector(children, spouse.getAllChildrenVector(dataAdapter->getChildren));
+    for (const ChildrenAdapter& record : common) {
+        int child = record.key;
+        int other = spouse.personId;
+        if (!checkIfPrefferedParent(person, child, other)) continue;
+        admit(child);
+        const bool male = dataAdapter->isMale(child);
+        person.addChildWithSpouse(child, spouse.personId, male);
+    }
+}
+
+// The mixed cases look redundant and are kept: sexes that contradict each other in the data (a man listed as
+// a mother) come through here, and a child would vanish from its couple without them. So is the first test
+// over the whole record of the admitted: a child of whom nobody stands on the chart yet is let through,
+// whoever asks.
+bool TreeViewLayouter::checkIfPrefferedParent(TreeViewPerson& person, int& child, int& other) {
+    int father = TreeViewPerson::kNoKey;
+    int mother = TreeViewPerson::kNoKey;
+    dataAdapter->getParents(child, father, mother);
+    const int self = person.personId;
+    if (!isAdmitted(father) && !isAdmitted(mother) && !isAdmitted(child)) return true;
+    if (self == father && other == mother) return true;
+    if ((self == father || self == mother) && other == father) return true;
+    return self == mother && other == mother;
+}
+
+// The person comes in among its own siblings: its place in the list is how the row later finds where it
+// stands.
+void TreeViewLayouter::addSiblingsToPerson(TreeViewPerson& person) {
+    if (person.getParentCount() == 0) return;
+    const bool hasFather = person.preferredFatherIndex != -1;
+    const bool hasMother = person.preferredMotherIndex != -1;
+    const bool fatherIsReal = hasFather && !dataAdapter->isAddNode(person.getPreferredFather().personId);
+    const bool motherIsReal = hasMother && !dataAdapter->isAddNode(person.getPreferredMother().personId);
+
+    if (fatherIsReal) addFatherSide(person, motherIsReal);
+    if (motherIsReal) addMotherSide(person);
+    const bool bothAreAddNodes = hasFather && !fatherIsReal && hasMother && !motherIsReal;
+    if (bothAreAddNodes) person.addSibling(person.personId, person.gender);
+}
+
+// The father's own children, the person last among them, then the children of both parents. On the mother's
+// side the person comes first instead; the two differ on purpose, since each side grows away from the person.
+void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) {
+    TreeViewPerson& father = person.getPreferredFather();
+    bool personIsAmongThem = false;
+    for (const ChildrenAdapter& record : getBastardChildrenOfPerson(father, person.getParentIterator())) {
+        if (record.key == person.personId) {
+            personIsAmongThem = true;
+        } else {
+            person.addHalfSibling(record.key, father.personId, dataAdapter->isMale(record.key));
+        }
+    }
+    if (personIsAmongThem) person.addHalfSibling(person.personId, father.personId, person.gender);
+    if (!motherIsReal) return;
+
+    TreeViewPerson& mother = person.getPreferredMother();
+    const ChildrenSet& fathersChildren = father.getAllChildrenVector(dataAdapter->getChildren);
+    const ChildrenSet& mothersChildren = mother.getAllChildrenVector(dataAdapter->getChildren);
+    for (const ChildrenAdapter& record : getIntersectingVector(fathersChildren, mothersChildren)) {
+        person.addSibling(record.key, dataAdapter->isMale(record.key));
+    }
+}
+
+void TreeViewLayouter::addMotherSide(TreeViewPerson& person) {
+    TreeViewPerson& mother = person.getPreferredMother();
+    const ChildrenSet alone = getBastardChildrenOfPerson(mother, person.getParentIterator());
+    for (const ChildrenAdapter& record : alone) {
+        if (record.key == person.personId) {
+            person.addHalfSibling(person.personId, mother.personId, person.gender);
+        }
+    }
+    for (const ChildrenAdapter& record : alone) {
+        if (record.key != person.personId) {
+            person.addHalfSibling(record.key, mother.personId, dataAdapter->isMale(record.key));
+        }
+    }
+}
+
+}  // namespace SharedTreeViewer

@@ -1,0 +1,104 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <boost/unordered_map.hpp>
+
+#include <map>
+#include <string>
+
+#include <olvane/Export.h>
+#include <olvane/adapters/DataAdapter.h>
+#include <olvane/graph/TreeViewPerson.h>
+#include <olvane/layouter/TreeSize.h>
+
+namespace SharedTreeViewer {
+
+typedef boost::unordered_map<std::string, bool> OptionMap;
+
+// What the layouters of all views share: the focus person, from whom the whole graph hangs, the options, the
+// sizes, the way to the data, the record of who has been admitted, the growth of the graph, and a few
+// placements.
+//
+// Units: points. A bool that comes with a person is its gender, true for male.
+// Holds: one layouter serves one layout. It points to the DataAdapter, which must outlive it.
+// Fails: whatever a callback throws passes on; an empty callback throws boost::bad_function_call.
+//
+// No virtual destructor: a layouter is made and destroyed through its concrete type, by whoever runs it.
+class OLVANE_API TreeViewLayouter {
+public:
+    typedef TreeViewPerson::Visitor Visitor;
+    typedef TreeViewPerson::Iterator Iterator;
+
+    // isMale: not 0 for a male focus. Options and sizes are copied.
+    TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
+                     const TreeSize& sizes);
+    TreeViewLayouter(const TreeViewLayouter&) = delete;
+    TreeViewLayouter& operator=(const TreeViewLayouter&) = delete;
+
+    // Builds the graph around the focus, gives every person its place, flags and routes the lines. Called
+    // once.
+    virtual void layoutForFocusNID() = 0;
+    // Visits each person of the finished graph once, in the order of the result.
+    virtual void graphIterator(const Visitor& visitor) = 0;
+
+    // The option's value, or the default where the key is absent. Never enters the key.
+    bool boolOptionForKey(const std::string& key, bool defaultValue) const;
+
+    // --- Placement.
+    // The person in the middle of a span that starts at left.
+    void centerPerson(TreeViewPerson& person, float width, float left, float y) const;
+    // The pair around the middle of that span, nodeWidth + horzPadding apart, the husband at the left.
+    void centerHusbandAndWife(TreeViewPerson& husband, TreeViewPerson& wife, float width, float left,
+                              float y) const;
+    // A row of count persons at y, evenly spaced around centerX, in the iterator's order from left to right.
+    // With count 0 the iterator is not called. An iterator that visits fewer than count leaves the row half a
+    // stride too far left for each one: the count is believed, and the persons who are there keep their
+    // distances.
+    void initializeParentsXAndYCenteredAboveChild(const Iterator& iterator, float y, float centerX,
+                                                  int count) const;
+
+    // --- Growing the graph. Each asks the data source for one person's relatives and enters them there. They
+    // are asked anew at each call, but for the children, which every node keeps. A spouse's gender is the
+    // opposite of the person's: the data source is not asked for it.
+    void addSpousesToPerson(TreeViewPerson& person);
+    void addAllChildrenToPerson(TreeViewPerson& person);
+    // The person's children who are not also children of somebody whom the iterator visits.
+    void addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator);
+    ChildrenSet getBastardChildrenOfPerson(TreeViewPerson& person, Iterator iterator);
+    void addChildrenWithSpousesToPerson(TreeViewPerson& person, TreeViewPerson& spouse,
+                                        const ChildrenSet& children);
+    // Records of first that are equivalent to one of second, in the sets' own order.
+    ChildrenSet getIntersectingVector(const ChildrenSet& first, const ChildrenSet& second) const;
+    // Siblings and half siblings through the person's preferred parents, with an entry for the person itself.
+    void addSiblingsToPerson(TreeViewPerson& person);
+    void addParentsToPerson(TreeViewPerson& person);
+    // A real parent is known. Uses up a synthetic id for each parent that is not.
+    bool hasParents(TreeViewPerson& person);
+    // The child belongs under the couple of person and other: its parents are the two, or none of its keys
+    // has been admitted yet.
+    bool checkIfPrefferedParent(TreeViewPerson& person, int& child, int& other);
+
+    TreeViewPerson focusPerson;
+    OptionMap options;
+    DataAdapter* dataAdapter;
+    TreeSize treeSize;
+    std::map<int, bool>
+        shownPersons;  // keys admitted to the graph; presence counts, the value is always true
+
+protected:
+    ~TreeViewLayouter() = default;
+
+    // The step from one row or column to the next.
+    float rowStep() const { return treeSize.nodeHeight + treeSize.vertPadding; }
+
+    void admit(int key) { shownPersons.emplace(key, true); }
+    bool isAdmitted(int key) const { return shownPersons.find(key) != shownPersons.end(); }
+
+private:
+    void addFatherSide(TreeViewPerson& person, bool motherIsReal);
+    void addMotherSide(TreeViewPerson& person);
+};
+
+}  // namespace SharedTreeViewer
