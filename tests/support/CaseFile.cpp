@@ -102,7 +102,10 @@ void readFocus(DirectiveLine& line, CaseFile& result) {
 void readView(DirectiveLine& line, CaseFile& result) {
     const std::string_view name = line.field();
     if (name == "family") {
-        result.view = CaseView::family;
+        const CaseFile defaults;
+        result.view = defaults.view;
+        result.maxGenerations = defaults.maxGenerations;
+        result.maxStackDepth = defaults.maxStackDepth;
     } else if (name == "pedigree") {
         result.view = CaseView::pedigree;
         result.maxGenerations = line.number<std::int32_t>();

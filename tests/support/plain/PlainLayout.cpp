@@ -10,7 +10,6 @@
 
 #include <array>
 #include <bit>
-#include <charconv>
 #include <cstdint>
 #include <exception>
 #include <memory>
@@ -29,11 +28,21 @@ std::string cutText(float value) {
 // Written piece by piece, so that a failure leaves what was there before it.
 void writeRecord(Person& person, const Data& data, std::string& text) {
     const std::string idText = data.textOf(person.key);
-    text += idText + ":" + cutText(person.corner.x) + ":" + cutText(person.corner.y) + ":";
-    text += person.flagged ? "1:" : "0:";
+    text += idText;
+    text += ':';
+    text += cutText(person.corner.x);
+    text += ':';
+    text += cutText(person.corner.y);
+    text += person.flagged ? ":1:" : ":0:";
     for (const Segment& segment : person.segments) {
-        text += cutText(segment.x1) + "," + cutText(segment.y1) + ",";
-        text += cutText(segment.x2) + "," + cutText(segment.y2) + "|";
+        text += cutText(segment.x1);
+        text += ',';
+        text += cutText(segment.y1);
+        text += ',';
+        text += cutText(segment.x2);
+        text += ',';
+        text += cutText(segment.y2);
+        text += '|';
     }
     if (idOf(idText) < 0) {
         text += ":";
@@ -57,43 +66,80 @@ std::string bitsText(float value) {
     return std::string(digits.data(), digits.size());
 }
 
-std::string coordinatesText(const Segment& segment) {
-    return " " + bitsText(segment.x1) + " " + bitsText(segment.y1) + " " + bitsText(segment.x2) + " " +
-           bitsText(segment.y2);
+using Words = std::vector<std::string>;
+
+std::string lineOf(const Words& words) {
+    std::string line;
+    for (const std::string& word : words) {
+        if (!line.empty()) line += ' ';
+        line += word;
+    }
+    return line;
 }
 
-std::string pointsText(const Line& line) {
-    std::string text = " " + std::to_string(line.points.size());
-    for (const Point& point : line.points) text += " " + bitsText(point.x) + " " + bitsText(point.y);
-    return text;
+void addCoordinates(const Segment& segment, Words& words) {
+    for (const float value : {segment.x1, segment.y1, segment.x2, segment.y2}) {
+        words.push_back(bitsText(value));
+    }
+}
+
+void addPoints(const Line& line, Words& words) {
+    words.push_back(std::to_string(line.points.size()));
+    for (const Point& point : line.points) {
+        words.push_back(bitsText(point.x));
+        words.push_back(bitsText(point.y));
+    }
+}
+
+std::string flagText(bool flag) {
+    return flag ? "1" : "0";
+}
+
+std::string personLine(const Person& person, const Data& data) {
+    return lineOf({"P", std::to_string(person.key), data.textOf(person.key), flagText(person.male),
+                   bitsText(person.corner.x), bitsText(person.corner.y), flagText(person.flagged),
+                   std::to_string(person.parentKey)});
+}
+
+std::string segmentLine(const Segment& segment) {
+    Words words = {"S"};
+    addCoordinates(segment, words);
+    words.push_back(flagText(segment.isSpouseLine));
+    return lineOf(words);
+}
+
+std::string spouseLineLine(int key, const Segment& segment) {
+    Words words = {"L", std::to_string(key)};
+    addCoordinates(segment, words);
+    return lineOf(words);
+}
+
+std::string edgeLine(Words words, const Line& line) {
+    addPoints(line, words);
+    return lineOf(words);
 }
 
 void describeEdges(const Person& person, std::vector<std::string>& lines) {
     for (const auto& [key, edge] : person.ownedEdges) {
-        lines.push_back("E " + std::to_string(edge->person->key) + " " + std::to_string(edge->spouse->key) +
-                        pointsText(edge->line));
+        const std::string first = std::to_string(edge->person->key);
+        const std::string second = std::to_string(edge->spouse->key);
+        lines.push_back(edgeLine({"E", first, second}, edge->line));
         for (const GenerationEdge& child : edge->childEdges) {
-            lines.push_back("C " + std::to_string(child.child->key) + pointsText(child.line));
+            lines.push_back(edgeLine({"C", std::to_string(child.child->key)}, child.line));
         }
     }
     for (const GenerationEdge& edge : person.generationEdges) {
-        lines.push_back("G " + std::to_string(edge.child->key) + " " +
-                        std::to_string(edge.singleParent->key) + pointsText(edge.line));
+        const std::string child = std::to_string(edge.child->key);
+        const std::string parent = std::to_string(edge.singleParent->key);
+        lines.push_back(edgeLine({"G", child, parent}, edge.line));
     }
 }
 
 void describePerson(const Person& person, const Data& data, std::vector<std::string>& lines) {
-    lines.push_back("P " + std::to_string(person.key) + " " + data.textOf(person.key) +
-                    (person.male ? " 1 " : " 0 ") + bitsText(person.corner.x) + " " +
-                    bitsText(person.corner.y) + (person.flagged ? " 1 " : " 0 ") +
-                    std::to_string(person.parentKey));
-    for (const Segment& segment : person.segments) {
-        lines.push_back("S" + coordinatesText(segment) + (segment.isSpouseLine ? " 1" : " 0"));
-    }
+    lines.push_back(personLine(person, data));
+    for (const Segment& segment : person.segments) lines.push_back(segmentLine(segment));
     for (const auto& [key, list] : person.spouseLines) {
-        for (const Segment& segment : list) {
-            lines.push_back("L " + std::to_string(key) + coordinatesText(segment));
-        }
+        for (const Segment& segment : list) lines.push_back(spouseLineLine(key, segment));
     }
     describeEdges(person, lines);
 }
@@ -125,7 +171,10 @@ void run(Data& data, const support::CaseFile& request, bool graph, std::string& 
 
 std::string Answer::text() const {
     std::string whole;
-    for (const std::string& line : lines) whole += line + "\n";
+    for (const std::string& line : lines) {
+        whole += line;
+        whole += '\n';
+    }
     return whole;
 }
 
