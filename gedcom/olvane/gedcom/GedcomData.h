@@ -5,7 +5,6 @@
 #include <cstddef>
 #include <cstdint>
 #include <memory>
-#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -81,8 +80,8 @@ struct ChildLink {
     LineNumber line = 0;
 };
 
-// A family as its record gives it. The first two partners alone count; husband is the father, wife the mother.
-// Two HUSB, or two WIFE, stand in the order of the record: the first as husband, the second as wife.
+// A family as its record gives it. The first two partners alone count; husband is the father, wife the
+// mother. Two HUSB, or two WIFE, stand in the order of the record: the first as husband, the second as wife.
 struct Family {
     std::string_view xref;  // without its @
     GedcomDate marriage;    // of the first MARR that has a date
@@ -96,6 +95,8 @@ struct Family {
     bool divorced = false;  // DIV is there, and no second MARR after it
 };
 
+class XrefTable;
+
 // The lists behind the records, as the reader fills them.
 struct GedcomTables {
     // Owner of the text that every view looks into; never moves.
@@ -108,9 +109,8 @@ struct GedcomTables {
     std::vector<ChildLink> childLinks;
     std::vector<PersonId> spouses;
     std::vector<PersonId> children;
-    // Persons and families, each sorted by xref, first of a kind only; found by halving.
-    std::vector<PersonId> personsByXref;
-    std::vector<FamilyId> familiesByXref;
+    // Which records the identifiers stand for.
+    std::shared_ptr<const XrefTable> xrefs;
     std::vector<Diagnostic> diagnostics;
     std::string file;
     std::string encoding;

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <compare>
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -41,9 +40,9 @@ struct GedcomDate {
 // dates, small letters and months in full. Never fails: what cannot be read comes back with year 0.
 GedcomDate parseGedcomDate(std::string_view written);
 
-// Text that sorts as the dates do, by plain comparison of bytes: "1819-05-24", "1819-05", "1819"; a "~" at the
-// end puts a date behind all that begin alike ("after 1819" is "1819~", "before 1820" too). Years B.C.
-// begin with "-" and count from 9999 down. Empty for a date that was not read. At most 11 bytes.
+// Text that sorts as the dates do, by plain comparison of bytes: "1819-05-24", "1819-05", "1819"; a "~" at
+// the end puts a date behind all that begin alike ("after 1819" is "1819~", "before 1820" too). Years B.C.
+// begin with "-" and count from 9999 down. Empty for a date that was not read. At most 12 bytes.
 std::string sortText(const GedcomDate& date);
 
 // The year for a person to read: "1819", "44 BC"; with marks "~1819", "<1819", ">1819", "1819-1825".

@@ -1,0 +1,126 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Access to what was read: slices of shared lists, and names as people write them.
+
+#include "olvane/gedcom/GedcomData.h"
+
+#include <array>
+#include <stdexcept>
+#include <utility>
+
+#include "olvane/gedcom/UnicodeTextInternal.h"
+#include "olvane/gedcom/XrefTableInternal.h"
+
+namespace olvane::gedcom {
+namespace {
+
+template <typename Item>
+std::span<const Item> part(const std::vector<Item>& list, Slice slice) {
+    return std::span(list).subspan(slice.first, slice.count);
+}
+
+// Whether text begins with a character of a script that is written without spaces. UTF-8 leads from E2 BA on
+// are CJK radicals, kana, Han and Hangul up to ED; EF A4 to EF AB the compatibility forms; F0 A0 and on the
+// further planes.
+bool beginsUnspaced(std::string_view text) {
+    if (text.size() < 3) return false;
+    const auto first = static_cast<unsigned char>(text[0]);
+    const auto second = static_cast<unsigned char>(text[1]);
+    if (first == 0xE2) return second >= 0xBA;
+    if (first >= 0xE3 && first <= 0xED) return true;
+    if (first == 0xEF) return second >= 0xA4 && second <= 0xAB;
+    return first == 0xF0 && second >= 0xA0;
+}
+
+bool endsUnspaced(std::string_view text) {
+    std::size_t start = text.size();
+    while (start > 0 && (static_cast<unsigned char>(text[start - 1]) & 0xC0) == 0x80) --start;
+    return start > 0 && beginsUnspaced(text.substr(start - 1));
+}
+
+// The value with a space for each slash, but none between characters that are written without, and no two in
+// a row.
+std::string withoutSlashes(std::string_view written) {
+    std::string text;
+    text.reserve(written.size());
+    bool space = false;
+    bool slash = false;
+    for (std::size_t at = 0; at < written.size(); ++at) {
+        if (written[at] == ' ' || written[at] == '/') {
+            space = space || written[at] == ' ';
+            slash = slash || written[at] == '/';
+            continue;
+        }
+        const bool parted = space || (slash && !(endsUnspaced(text) && beginsUnspaced(written.substr(at))));
+        if (parted && !text.empty()) text += ' ';
+        text += written[at];
+        space = slash = false;
+    }
+    return text;
+}
+
+}  // namespace
+
+std::string displayName(const PersonName& name) {
+    std::string text = withoutSlashes(name.written);
+    if (!text.empty()) return text;
+    for (const std::string_view piece : {name.prefix, name.given, name.surname, name.suffix}) {
+        if (piece.empty()) continue;
+        if (!text.empty()) text += ' ';
+        text += piece;
+    }
+    return text.empty() ? std::string(name.nickname) : text;
+}
+
+GedcomData::GedcomData(GedcomTables tables) : tables_(std::move(tables)) {}
+
+const Person& GedcomData::person(PersonId id) const {
+    if (!hasPerson(id)) throw std::out_of_range("no person " + std::to_string(id));
+    return tables_.persons[id - 1];
+}
+
+const Family& GedcomData::family(FamilyId id) const {
+    if (id < 1 || id > familyCount()) throw std::out_of_range("no family " + std::to_string(id));
+    return tables_.families[id - 1];
+}
+
+std::span<const PersonName> GedcomData::names(PersonId id) const {
+    return part(tables_.names, person(id).nameSlice);
+}
+
+const PersonName& GedcomData::firstName(PersonId id) const {
+    static const PersonName kNone;
+    const auto all = names(id);
+    return all.empty() ? kNone : all.front();
+}
+
+std::span<const PersonId> GedcomData::spouses(PersonId id) const {
+    return part(tables_.spouses, person(id).spouseSlice);
+}
+
+std::span<const PersonId> GedcomData::children(PersonId id) const {
+    return part(tables_.children, person(id).childSlice);
+}
+
+std::span<const FamilyLink> GedcomData::parentLinks(PersonId id) const {
+    return part(tables_.parentLinks, person(id).parentLinkSlice);
+}
+
+std::span<const FamilyLink> GedcomData::coupleLinks(PersonId id) const {
+    return part(tables_.coupleLinks, person(id).coupleLinkSlice);
+}
+
+std::span<const ChildLink> GedcomData::childLinks(FamilyId id) const {
+    return part(tables_.childLinks, family(id).childLinkSlice);
+}
+
+PersonId GedcomData::personByXref(std::string_view xref) const {
+    return tables_.xrefs == nullptr ? 0 : tables_.xrefs->at(tables_.xrefs->find(bareXref(xref))).person;
+}
+
+FamilyId GedcomData::familyByXref(std::string_view xref) const {
+    return tables_.xrefs == nullptr ? 0 : tables_.xrefs->at(tables_.xrefs->find(bareXref(xref))).family;
+}
+
+}  // namespace olvane::gedcom

@@ -1,0 +1,124 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Diagnostics as text, and the list that gathers them. A broken file may hold a million broken lines, so the
+// list keeps the first of each kind and counts the others; what it quotes from a file is short and fit to
+// print.
+
+#include "olvane/gedcom/GedcomDiagnostic.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "olvane/gedcom/DiagnosticListInternal.h"
+#include "olvane/gedcom/UnicodeTextInternal.h"
+
+namespace olvane::gedcom {
+namespace {
+
+constexpr std::size_t kQuotedBytes = 60;
+
+// Kinds as the counting diagnostics name them, in the order of the enumeration.
+constexpr const char* kKindNames[] = {
+    "missing header",
+    "missing trailer",
+    "record behind the trailer",
+    "line without level and tag",
+    "empty line",
+    "wrong level",
+    "level jump",
+    "broken identifier",
+    "identifier used twice",
+    "pointer to no record",
+    "wrong pointer",
+    "family with a third partner",
+    "family with one person as both partners",
+    "encoding other than declared",
+    "unknown encoding",
+    "bytes that are no character",
+    "control character",
+    "unreadable date",
+    "archive member of another name",
+    "more of a kind",
+};
+
+std::string printable(std::string_view raw) {
+    std::string shown = lossyUtf8(raw.substr(0, std::min(raw.size(), kQuotedBytes)));
+    for (char& c : shown) {
+        if (static_cast<unsigned char>(c) < 0x20 || c == 0x7F) c = '?';
+    }
+    if (raw.size() > kQuotedBytes) shown += "...";
+    return shown;
+}
+
+}  // namespace
+
+const char* severityName(Severity severity) {
+    switch (severity) {
+        case Severity::note:
+            return "note";
+        case Severity::warning:
+            return "warning";
+        case Severity::error:
+            return "error";
+    }
+    return "error";
+}
+
+std::string formatDiagnostic(const Diagnostic& diagnostic) {
+    std::string text = diagnostic.file;
+    if (diagnostic.line != 0) text += ":" + std::to_string(diagnostic.line);
+    text += ": ";
+    text += severityName(diagnostic.severity);
+    text += ": " + diagnostic.what;
+    if (!diagnostic.done.empty()) text += "; " + diagnostic.done;
+    return text;
+}
+
+DiagnosticList::DiagnosticList(std::string file, std::size_t listedPerKind)
+    : file_(std::move(file)), listedPerKind_(listedPerKind) {}
+
+void DiagnosticList::add(DiagnosticKind kind, Severity severity, std::uint32_t line, std::string_view what,
+                         std::string_view done, std::string_view quoted) {
+    Tally& tally = tallies_[static_cast<std::size_t>(kind)];
+    if (++tally.seen > listedPerKind_) return;
+    std::string whole(what);
+    if (!quoted.empty()) whole += " (" + printable(quoted) + ")";
+    listed_.push_back({file_, line, severity, kind, std::move(whole), std::string(done)});
+}
+
+void DiagnosticList::count(DiagnosticKind kind, std::uint32_t line) {
+    Tally& tally = tallies_[static_cast<std::size_t>(kind)];
+    if (tally.onlyCounted++ == 0) tally.firstCountedLine = line;
+}
+
+std::vector<Diagnostic> DiagnosticList::take() {
+    listCounted();
+    std::stable_sort(listed_.begin(), listed_.end(),
+                     [](const Diagnostic& a, const Diagnostic& b) { return a.line < b.line; });
+    listUnlisted();
+    return std::exchange(listed_, {});
+}
+
+void DiagnosticList::listCounted() {
+    for (std::size_t kind = 0; kind < kKinds; ++kind) {
+        const Tally& tally = tallies_[kind];
+        if (tally.onlyCounted == 0) continue;
+        const std::string what = tally.onlyCounted == 1 ? std::string(kKindNames[kind])
+                                                        : std::string(kKindNames[kind]) + ", the first of " +
+                                                              std::to_string(tally.onlyCounted);
+        listed_.push_back({file_, tally.firstCountedLine, Severity::note, static_cast<DiagnosticKind>(kind),
+                           what, "skipped"});
+    }
+}
+
+void DiagnosticList::listUnlisted() {
+    for (std::size_t kind = 0; kind < kKinds; ++kind) {
+        if (tallies_[kind].seen <= listedPerKind_) continue;
+        const std::size_t unlisted = tallies_[kind].seen - listedPerKind_;
+        listed_.push_back({file_, 0, Severity::note, DiagnosticKind::moreOfAKind,
+                           std::to_string(unlisted) + " more of: " + kKindNames[kind], "not listed singly"});
+    }
+}
+
+}  // namespace olvane::gedcom

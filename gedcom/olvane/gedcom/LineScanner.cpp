@@ -1,0 +1,204 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Lines of GEDCOM: level, perhaps an identifier, tag, perhaps a value. The depth of a line is one more than
+// that of the nearest line before it with a smaller number, which for sound files is the number itself. Only
+// the four topmost depths matter to the reader, so nothing grows with the depth of a file.
+
+#include "olvane/gedcom/LineScannerInternal.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace olvane::gedcom {
+namespace {
+
+constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::uint32_t kHighestLevel = 1000000;
+
+bool isBlank(char c) {
+    return c == ' ' || c == '\t';
+}
+bool isDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+
+bool isTagLetter(char c) {
+    return isDigit(c) || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || c == '_' ||
+           static_cast<unsigned char>(c) >= 0x80;
+}
+
+std::string_view withoutLeadingBlanks(std::string_view text) {
+    while (!text.empty() && isBlank(text.front())) text.remove_prefix(1);
+    return text;
+}
+
+std::size_t find(std::string_view bytes, std::size_t from, char wanted) {
+    const void* found = std::memchr(bytes.data() + from, wanted, bytes.size() - from);
+    return found == nullptr ? bytes.size()
+                            : static_cast<std::size_t>(static_cast<const char*>(found) - bytes.data());
+}
+
+// Takes the number at the front; what is higher than any sensible level counts as kHighestLevel.
+std::uint32_t takeNumber(std::string_view& rest) {
+    std::uint32_t number = 0;
+    while (!rest.empty() && isDigit(rest.front())) {
+        number = std::min(number * 10 + static_cast<std::uint32_t>(rest.front() - '0'), kHighestLevel);
+        rest.remove_prefix(1);
+    }
+    return number;
+}
+
+// A CONC or CONT line below a level.
+struct Continuation {
+    bool isOne = false;
+    bool newLine = false;
+    std::string_view text;
+};
+
+Continuation readContinuation(std::string_view text, std::uint32_t aboveLevel) {
+    std::string_view rest = withoutLeadingBlanks(text);
+    if (rest.empty() || !isDigit(rest.front())) return {};
+    const std::uint32_t level = takeNumber(rest);
+    rest = withoutLeadingBlanks(rest);
+    const bool conc = rest.starts_with("CONC");
+    if (level <= aboveLevel || (!conc && !rest.starts_with("CONT"))) return {};
+    rest.remove_prefix(4);
+    if (!rest.empty() && !isBlank(rest.front())) return {};
+    return {true, !conc, rest.empty() ? rest : rest.substr(1)};
+}
+
+}  // namespace
+
+std::string_view trimmed(std::string_view text) {
+    text = withoutLeadingBlanks(text);
+    while (!text.empty() && isBlank(text.back())) text.remove_suffix(1);
+    return text;
+}
+
+std::size_t LineCutter::nearestEnd() {
+    if (!knowsLf_ || nextLf_ < at_) nextLf_ = find(bytes_, at_, '\n');
+    if (!knowsCr_ || nextCr_ < at_) nextCr_ = find(bytes_, at_, '\r');
+    knowsLf_ = knowsCr_ = true;
+    return std::min(nextLf_, nextCr_);
+}
+
+bool LineCutter::next(std::string_view& text) {
+    if (at_ >= bytes_.size()) return false;
+    const std::size_t end = nearestEnd();
+    text = bytes_.substr(at_, end - at_);
+    at_ = end;
+    if (at_ < bytes_.size() && bytes_[at_] == '\r') ++at_;
+    if (at_ < bytes_.size() && bytes_[at_] == '\n') ++at_;
+    ++number_;
+    return true;
+}
+
+LineScanner::LineScanner(std::string_view bytes, DiagnosticList& diagnostics)
+    : cutter_(bytes), diagnostics_(diagnostics) {}
+
+bool LineScanner::next(GedcomLine& line) {
+    std::string_view text;
+    while (cutter_.next(text)) {
+        line.number = cutter_.number();
+        if (parse(text, line)) {
+            settleDepth(line);
+            return true;
+        }
+    }
+    return false;
+}
+
+bool LineScanner::parse(std::string_view text, GedcomLine& line) {
+    std::string_view rest = withoutLeadingBlanks(text);
+    if (rest.starts_with(kByteOrderMark)) rest.remove_prefix(kByteOrderMark.size());
+    if (rest.empty()) {
+        diagnostics_.count(DiagnosticKind::emptyLine, line.number);
+        return false;
+    }
+    if (!takeLevel(rest, line) || !takeXref(rest, line) || !takeTag(rest, line)) return refuse(text, line);
+    line.value = rest;
+    return true;
+}
+
+bool LineScanner::refuse(std::string_view text, const GedcomLine& line) {
+    diagnostics_.add(DiagnosticKind::notALine, Severity::error, line.number, "not a line with level and tag",
+                     "skipped", text);
+    return false;
+}
+
+bool LineScanner::takeLevel(std::string_view& rest, GedcomLine& line) {
+    const bool negative = rest.front() == '-';
+    std::string_view digits = rest.substr(negative ? 1 : 0);
+    if (digits.empty() || !isDigit(digits.front())) return false;
+    const bool padded = digits.size() > 1 && digits[0] == '0' && isDigit(digits[1]);
+    const std::string_view written = rest.substr(0, 12);
+    writtenLevel_ = takeNumber(digits);
+    const bool parted = !digits.empty() && isBlank(digits.front());
+    if (!parted && (digits.empty() || (digits.front() != '@' && !isTagLetter(digits.front())))) return false;
+    if (negative || padded || !parted) {
+        diagnostics_.add(DiagnosticKind::wrongLevel, Severity::warning, line.number, "level badly written",
+                         "read as level " + std::to_string(writtenLevel_), written);
+    }
+    rest = withoutLeadingBlanks(digits);
+    return true;
+}
+
+bool LineScanner::takeXref(std::string_view& rest, GedcomLine& line) {
+    line.xref = {};
+    if (rest.empty() || rest.front() != '@') return true;
+    std::size_t end = rest.find('@', 1);
+    const std::size_t blank = std::min(rest.find(' '), rest.size());
+    const bool closed = end != std::string_view::npos && (end + 1 == rest.size() || isBlank(rest[end + 1]));
+    if (!closed) {
+        diagnostics_.add(DiagnosticKind::brokenXref, Severity::warning, line.number,
+                         "identifier without its second @", "read up to the space", rest.substr(0, blank));
+        end = blank;
+    }
+    line.xref = trimmed(rest.substr(1, end - 1));
+    rest = withoutLeadingBlanks(rest.substr(std::min(closed ? end + 1 : end, rest.size())));
+    return true;
+}
+
+bool LineScanner::takeTag(std::string_view& rest, GedcomLine& line) {
+    std::size_t length = 0;
+    while (length < rest.size() && isTagLetter(rest[length])) ++length;
+    if (length == 0 || (length < rest.size() && !isBlank(rest[length]))) return false;
+    line.tag = rest.substr(0, length);
+    rest.remove_prefix(std::min(length + 1, rest.size()));
+    return true;
+}
+
+void LineScanner::settleDepth(GedcomLine& line) {
+    while (ancestorCount_ > 1 && ancestors_[ancestorCount_ - 1] >= writtenLevel_) --ancestorCount_;
+    line.level = writtenLevel_ == 0 ? 0 : ancestorCount_;
+    if (writtenLevel_ != 0 && ancestorCount_ < ancestors_.size())
+        ancestors_[ancestorCount_++] = writtenLevel_;
+    if (writtenLevel_ > previousLevel_ + 1) {
+        diagnostics_.add(
+            DiagnosticKind::levelJump, Severity::warning, line.number,
+            "level jumps from " + std::to_string(previousLevel_) + " to " + std::to_string(writtenLevel_),
+            "read as one below the line before", line.tag);
+    }
+    previousLevel_ = writtenLevel_;
+}
+
+std::string_view LineScanner::wholeValue(const GedcomLine& line) {
+    LineCutter ahead = cutter_;
+    std::string_view text;
+    bool joining = false;
+    while (!ahead.rest().empty()) {
+        // The first line end need not be looked for if the line is no continuation anyway.
+        if (!isDigit(ahead.rest().front()) && !isBlank(ahead.rest().front())) break;
+        ahead.next(text);
+        const Continuation more = readContinuation(text, writtenLevel_);
+        if (!more.isOne) break;
+        if (!joining) joined_.assign(line.value);
+        joining = true;
+        if (more.newLine) joined_ += '\n';
+        joined_ += more.text;
+    }
+    return joining ? std::string_view(joined_) : line.value;
+}
+
+}  // namespace olvane::gedcom

@@ -1,0 +1,437 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Records of persons and families, line by line. A line means something by its own tag, the tag of the fact
+// above it and the sort of record it lies in; that is all the state there is. Names and links of one record
+// lie together in lists that all records share, so a record that has few of them is small.
+
+#include "olvane/gedcom/RecordReaderInternal.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <string>
+
+namespace olvane::gedcom {
+namespace {
+
+constexpr std::string_view kVoid = "VOID";
+
+// A tag as a number, in capitals; longer tags than any known one are 0.
+constexpr std::uint64_t tagCode(std::string_view tag) {
+    if (tag.size() > 8) return 0;
+    std::uint64_t code = 0;
+    for (const char c : tag) {
+        const char capital = c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+        code = code << 8 | static_cast<unsigned char>(capital);
+    }
+    return code;
+}
+
+constexpr std::uint64_t kBirth = tagCode("BIRT");
+constexpr std::uint64_t kBurial = tagCode("BURI");
+constexpr std::uint64_t kChild = tagCode("CHIL");
+constexpr std::uint64_t kCremation = tagCode("CREM");
+constexpr std::uint64_t kDate = tagCode("DATE");
+constexpr std::uint64_t kDeath = tagCode("DEAT");
+constexpr std::uint64_t kDivorce = tagCode("DIV");
+constexpr std::uint64_t kFamily = tagCode("FAM");
+constexpr std::uint64_t kFamilyAsChild = tagCode("FAMC");
+constexpr std::uint64_t kFamilyAsSpouse = tagCode("FAMS");
+constexpr std::uint64_t kGiven = tagCode("GIVN");
+constexpr std::uint64_t kHeader = tagCode("HEAD");
+constexpr std::uint64_t kHusband = tagCode("HUSB");
+constexpr std::uint64_t kIndividual = tagCode("INDI");
+constexpr std::uint64_t kMarriage = tagCode("MARR");
+constexpr std::uint64_t kName = tagCode("NAME");
+constexpr std::uint64_t kNamePrefix = tagCode("NPFX");
+constexpr std::uint64_t kNameSuffix = tagCode("NSFX");
+constexpr std::uint64_t kNickname = tagCode("NICK");
+constexpr std::uint64_t kPedigree = tagCode("PEDI");
+constexpr std::uint64_t kPhrase = tagCode("PHRASE");
+constexpr std::uint64_t kProbate = tagCode("PROB");
+constexpr std::uint64_t kSex = tagCode("SEX");
+constexpr std::uint64_t kSurname = tagCode("SURN");
+constexpr std::uint64_t kSurnamePrefix = tagCode("SPFX");
+constexpr std::uint64_t kTrailer = tagCode("TRLR");
+constexpr std::uint64_t kWife = tagCode("WIFE");
+
+bool isKnownRecord(std::uint64_t tag) {
+    switch (tag) {
+        case kHeader:
+        case kIndividual:
+        case kFamily:
+        case kTrailer:
+        case tagCode("NOTE"):
+        case tagCode("SNOTE"):
+        case tagCode("SOUR"):
+        case tagCode("SUBM"):
+        case tagCode("SUBN"):
+        case tagCode("REPO"):
+        case tagCode("OBJE"):
+            return true;
+        default:
+            return false;
+    }
+}
+
+Sex sexOf(std::string_view value) {
+    if (value == "M" || value == "m") return Sex::male;
+    if (value == "F" || value == "f") return Sex::female;
+    return Sex::other;
+}
+
+Pedigree pedigreeOf(std::string_view value) {
+    switch (tagCode(value)) {
+        case tagCode(""):
+            return Pedigree::notGiven;
+        case tagCode("BIRTH"):
+            return Pedigree::birth;
+        case tagCode("ADOPTED"):
+            return Pedigree::adopted;
+        case tagCode("FOSTER"):
+            return Pedigree::foster;
+        case tagCode("SEALING"):
+            return Pedigree::sealing;
+        default:
+            return Pedigree::other;
+    }
+}
+
+// The parts of a value at its slashes: before, between and behind them.
+struct SlashParts {
+    std::string_view before;
+    std::string_view between;
+    std::string_view behind;
+};
+
+SlashParts cutAtSlashes(std::string_view value) {
+    const std::size_t first = value.find('/');
+    if (first == std::string_view::npos) return {value, {}, {}};
+    const std::size_t second = value.find('/', first + 1);
+    if (second == std::string_view::npos)
+        return {trimmed(value.substr(0, first)), trimmed(value.substr(first + 1)), {}};
+    return {trimmed(value.substr(0, first)), trimmed(value.substr(first + 1, second - first - 1)),
+            trimmed(value.substr(second + 1))};
+}
+
+// Fills the pieces that have no line of their own from the value. Where the surname comes first, what follows
+// it is the given name; where both sides are there, it is a suffix.
+void fillFromSlashes(PersonName& name) {
+    SlashParts parts = cutAtSlashes(name.written);
+    if (!name.prefix.empty() && parts.before.starts_with(name.prefix)) {
+        parts.before = trimmed(parts.before.substr(name.prefix.size()));
+    }
+    const bool surnameFirst = parts.before.empty();
+    if (name.given.empty()) name.given = surnameFirst ? parts.behind : parts.before;
+    if (name.surname.empty()) name.surname = parts.between;
+    if (name.suffix.empty() && !surnameFirst) name.suffix = parts.behind;
+}
+
+}  // namespace
+
+bool RecordReader::readAll() {
+    GedcomLine line;
+    while (scanner_.next(line)) readLine(line);
+    endRecord();
+    if (anyRecord_ && !trailerSeen_) {
+        diagnostics_.add(DiagnosticKind::missingTrailer, Severity::warning, scanner_.lineNumber(),
+                         "the file ends without TRLR and may have been cut off", "read as far as it goes");
+    }
+    return anyRecord_;
+}
+
+void RecordReader::readLine(const GedcomLine& line) {
+    if (!anyLine_) checkBeginning(line);
+    anyLine_ = true;
+    if (line.level > 3 || (line.level > 0 && record_ == Record::other)) return;
+    const std::uint64_t tag = tagCode(line.tag);
+    if (line.level == 0) return beginRecord(line);
+    if (line.level == 1) {
+        endName();
+        openDate_ = nullptr;
+        fact_ = tag;
+        return record_ == Record::person ? readPersonFact(line, tag) : readFamilyFact(line, tag);
+    }
+    if (line.level == 2) {
+        openDate_ = nullptr;
+        return record_ == Record::person ? readPersonDetail(line, tag) : readFamilyDetail(line, tag);
+    }
+    if (tag == kPhrase && openDate_ != nullptr) readDatePhrase(line);
+}
+
+void RecordReader::beginRecord(const GedcomLine& line) {
+    endRecord();
+    const std::uint64_t tag = tagCode(line.tag);
+    checkEnd(line, tag);
+    anyRecord_ = anyRecord_ || isKnownRecord(tag);
+    fact_ = 0;
+    if (tag == kIndividual) {
+        beginPerson(line);
+    } else if (tag == kFamily) {
+        beginFamily(line);
+    } else {
+        record_ = Record::other;
+        claimXref(line);
+    }
+}
+
+void RecordReader::checkBeginning(const GedcomLine& line) {
+    if (line.level == 0 && tagCode(line.tag) == kHeader) return;
+    diagnostics_.add(DiagnosticKind::missingHeader, Severity::warning, line.number,
+                     "the file does not begin with HEAD", "read without it", line.tag);
+}
+
+void RecordReader::checkEnd(const GedcomLine& line, std::uint64_t tag) {
+    if (trailerSeen_) {
+        diagnostics_.add(DiagnosticKind::afterTrailer, Severity::warning, line.number, "a record behind TRLR",
+                         "read like the others", line.tag);
+    }
+    trailerSeen_ = trailerSeen_ || tag == kTrailer;
+}
+
+void RecordReader::endRecord() {
+    endName();
+    openDate_ = nullptr;
+    if (record_ == Record::family) endFamily();
+    record_ = Record::other;
+}
+
+// The place of the record's identifier, which is now known to have a record; null if it has none.
+XrefTable::Entry* RecordReader::claimXref(const GedcomLine& line) {
+    if (line.xref.empty()) return nullptr;
+    XrefTable::Entry& entry = xrefs_.at(xrefs_.place(keeper_.keep(line.xref, line.number)));
+    if (entry.line != 0) {
+        diagnostics_.add(DiagnosticKind::duplicateXref, Severity::warning, line.number,
+                         "identifier already used in line " + std::to_string(entry.line),
+                         "read as a record of its own; pointers lead to the first", line.xref);
+    } else {
+        entry.line = line.number;
+    }
+    return &entry;
+}
+
+void RecordReader::beginPerson(const GedcomLine& line) {
+    record_ = Record::person;
+    sexRead_ = false;
+    Person fresh;
+    fresh.line = line.number;
+    fresh.xref = keeper_.keep(line.xref, line.number);
+    fresh.nameSlice.first = static_cast<std::uint32_t>(tables_.names.size());
+    fresh.parentLinkSlice.first = static_cast<std::uint32_t>(tables_.parentLinks.size());
+    fresh.coupleLinkSlice.first = static_cast<std::uint32_t>(tables_.coupleLinks.size());
+    tables_.persons.push_back(fresh);
+    XrefTable::Entry* entry = claimXref(line);
+    if (entry != nullptr && entry->person == 0) entry->person = static_cast<PersonId>(tables_.persons.size());
+}
+
+void RecordReader::beginFamily(const GedcomLine& line) {
+    record_ = Record::family;
+    marriages_ = 0;
+    marriedLast_ = false;
+    husbands_ = {};
+    wives_ = {};
+    Family fresh;
+    fresh.line = line.number;
+    fresh.xref = keeper_.keep(line.xref, line.number);
+    fresh.childLinkSlice.first = static_cast<std::uint32_t>(tables_.childLinks.size());
+    tables_.families.push_back(fresh);
+    XrefTable::Entry* entry = claimXref(line);
+    if (entry != nullptr && entry->family == 0)
+        entry->family = static_cast<FamilyId>(tables_.families.size());
+}
+
+void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
+    switch (tag) {
+        case kName:
+            return beginName(line);
+        case kSex:
+            if (!sexRead_) person().sex = sexOf(trimmed(line.value));
+            sexRead_ = true;
+            return;
+        case kDeath:
+        case kBurial:
+        case kCremation:
+        case kProbate:
+            person().dead = true;
+            return;
+        case kFamilyAsChild:
+            tables_.parentLinks.push_back({readPointer(line), line.number, Pedigree::notGiven});
+            ++person().parentLinkSlice.count;
+            return;
+        case kFamilyAsSpouse:
+            tables_.coupleLinks.push_back({readPointer(line), line.number, Pedigree::notGiven});
+            ++person().coupleLinkSlice.count;
+            return;
+        default:
+            return;
+    }
+}
+
+void RecordReader::readPersonDetail(const GedcomLine& line, std::uint64_t tag) {
+    if (fact_ == kName) return readNamePiece(line, tag);
+    if (fact_ == kBirth && tag == kDate) return readDate(line, person().birth);
+    if (fact_ == kDeath && tag == kDate) return readDate(line, person().death);
+    if (fact_ == kFamilyAsChild && tag == kPedigree && !trimmed(line.value).empty()) {
+        tables_.parentLinks.back().pedigree = pedigreeOf(trimmed(line.value));
+    }
+}
+
+void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
+    switch (tag) {
+        case kHusband:
+            return addPartner(line, husbands_);
+        case kWife:
+            return addPartner(line, wives_);
+        case kChild:
+            tables_.childLinks.push_back({readPointer(line), line.number});
+            ++family().childLinkSlice.count;
+            return;
+        case kMarriage:
+            family().married = true;
+            marriedLast_ = true;
+            ++marriages_;
+            return;
+        case kDivorce:
+            if (trimmed(line.value) == "N") return;  // an older custom for "not divorced"
+            family().divorced = true;
+            marriedLast_ = false;
+            return;
+        default:
+            return;
+    }
+}
+
+void RecordReader::readFamilyDetail(const GedcomLine& line, std::uint64_t tag) {
+    if (fact_ == kMarriage && tag == kDate) readDate(line, family().marriage);
+}
+
+void RecordReader::beginName(const GedcomLine& line) {
+    name_ = {};
+    nameOpen_ = true;
+    name_.written = keptValue(line);
+}
+
+void RecordReader::readNamePiece(const GedcomLine& line, std::uint64_t tag) {
+    switch (tag) {
+        case kGiven:
+            return addPiece(name_.given, line, " ");
+        case kSurname:
+            return addPiece(name_.surname, line, " ");
+        case kSurnamePrefix:
+            return addPiece(name_.surnamePrefix, line, " ");
+        case kNamePrefix:
+            return addPiece(name_.prefix, line, " ");
+        case kNameSuffix:
+            return addPiece(name_.suffix, line, " ");
+        case kNickname:
+            return addPiece(name_.nickname, line, ", ");
+        default:
+            return;
+    }
+}
+
+void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint) {
+    const std::string_view more = keptValue(line);
+    if (more.empty()) return;
+    if (piece.first.empty()) {
+        piece.first = more;
+        return;
+    }
+    if (piece.joined.empty()) piece.joined = piece.first;
+    piece.joined += joint;
+    piece.joined += more;
+}
+
+std::string_view RecordReader::keptPiece(const PieceDraft& piece) {
+    return piece.joined.empty() ? piece.first : keeper_.keepMade(piece.joined);
+}
+
+void RecordReader::endName() {
+    if (!nameOpen_) return;
+    nameOpen_ = false;
+    if (!name_.surname.first.empty() && !name_.surnamePrefix.first.empty()) {
+        PieceDraft whole = name_.surnamePrefix;
+        whole.joined = std::string(keptPiece(whole)) + " " + std::string(keptPiece(name_.surname));
+        name_.surname = whole;
+    }
+    PersonName name = {name_.written,           keptPiece(name_.prefix),
+                       keptPiece(name_.given),  keptPiece(name_.surname),
+                       keptPiece(name_.suffix), keptPiece(name_.nickname)};
+    fillFromSlashes(name);
+    tables_.names.push_back(name);
+    ++person().nameSlice.count;
+}
+
+// Of several dates the first stands.
+void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
+    if (date.isGiven()) return;
+    const std::string_view value = keptValue(line);
+    if (value.empty()) {
+        openDate_ = &date;
+        return;
+    }
+    date = parseGedcomDate(value);
+    if (date.isRead() || value.front() == '(') return;
+    diagnostics_.add(DiagnosticKind::unreadableDate, Severity::note, line.number,
+                     "a date that cannot be read", "shown as written", value);
+}
+
+void RecordReader::readDatePhrase(const GedcomLine& line) {
+    openDate_->written = keptValue(line);
+    openDate_ = nullptr;
+}
+
+void RecordReader::addPartner(const GedcomLine& line, PartnerDraft& draft) {
+    const XrefPlace place = readPointer(line);
+    if (place == 0) return;
+    if (draft.count == draft.mentions.size()) return refusePartner(line.number);
+    draft.mentions[draft.count++] = {place, line.number};
+}
+
+void RecordReader::refusePartner(LineNumber line) {
+    diagnostics_.add(DiagnosticKind::tooManyPartners, Severity::error, line,
+                     "a family with more than two partners", "left out", family().xref);
+}
+
+void RecordReader::endFamily() {
+    settlePartners();
+    if (marriages_ > 1 && marriedLast_) family().divorced = false;
+}
+
+// One HUSB and one WIFE if there are both; else two of one tag in their order.
+void RecordReader::settlePartners() {
+    const bool couple = husbands_.count > 0 && wives_.count > 0;
+    if (couple && husbands_.count > 1) refusePartner(husbands_.mentions[1].line);
+    if (couple && wives_.count > 1) refusePartner(wives_.mentions[1].line);
+    const bool twoWives = !couple && wives_.count == 2;
+    const bool twoHusbands = !couple && husbands_.count == 2;
+    const auto husband = twoWives ? wives_.mentions[0] : husbands_.mentions[0];
+    const auto wife = twoHusbands ? husbands_.mentions[1] : wives_.mentions[twoWives ? 1 : 0];
+    family().husband = husband.place;
+    family().husbandLine = husband.line;
+    family().wife = wife.place;
+    family().wifeLine = wife.line;
+}
+
+XrefPlace RecordReader::readPointer(const GedcomLine& line) {
+    const std::string_view xref = pointedXref(line);
+    return xref.empty() || xref == kVoid ? 0 : xrefs_.place(keeper_.keep(xref, line.number));
+}
+
+// Empty if there is none. A void pointer is as good as none, and needs no word.
+std::string_view RecordReader::pointedXref(const GedcomLine& line) {
+    const std::string_view value = trimmed(line.value);
+    if (value.empty() || value.front() != '@') {
+        diagnostics_.add(DiagnosticKind::wrongPointer, Severity::error, line.number,
+                         "a link without a pointer", "left out", value.empty() ? line.tag : value);
+        return {};
+    }
+    const std::size_t end = std::min(value.find('@', 1), value.size());
+    if (end + 1 != value.size()) {
+        diagnostics_.add(DiagnosticKind::brokenXref, Severity::warning, line.number,
+                         "a pointer that does not end with @", "read as if it did", value);
+    }
+    return trimmed(value.substr(1, end - 1));
+}
+
+}  // namespace olvane::gedcom

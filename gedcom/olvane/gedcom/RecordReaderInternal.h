@@ -1,0 +1,118 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+#include "olvane/gedcom/GedcomData.h"
+#include "olvane/gedcom/LineScannerInternal.h"
+#include "olvane/gedcom/TextKeeperInternal.h"
+#include "olvane/gedcom/XrefTableInternal.h"
+
+namespace olvane::gedcom {
+
+// Fills the tables from the lines of a file, in one pass and without a tree of lines.
+//
+// Holds: until links are resolved, each id in parentLinks, coupleLinks, childLinks and a family's partners is
+// an
+//        XrefPlace. Spouses, children, fathers and mothers are not filled in here.
+class RecordReader {
+public:
+    RecordReader(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables, XrefTable& xrefs,
+                 DiagnosticList& diagnostics)
+        : scanner_(scanner), keeper_(keeper), tables_(tables), xrefs_(xrefs), diagnostics_(diagnostics) {}
+
+    // False if there was no record that GEDCOM knows.
+    bool readAll();
+
+private:
+    enum class Record : std::uint8_t { other, person, family };
+
+    // A piece of a name, which may come several times.
+    struct PieceDraft {
+        std::string_view first;
+        std::string joined;  // empty while there is but one
+    };
+
+    // A NAME while its pieces come in.
+    struct NameDraft {
+        std::string_view written;
+        PieceDraft prefix;
+        PieceDraft given;
+        PieceDraft surnamePrefix;
+        PieceDraft surname;
+        PieceDraft suffix;
+        PieceDraft nickname;
+    };
+
+    // The HUSB, or the WIFE, of a family: the first two that point to anybody.
+    struct PartnerDraft {
+        struct Mention {
+            XrefPlace place = 0;
+            LineNumber line = 0;
+        };
+        std::array<Mention, 2> mentions{};
+        std::size_t count = 0;
+    };
+
+    void readLine(const GedcomLine& line);
+    void beginRecord(const GedcomLine& line);
+    void endRecord();
+    void checkBeginning(const GedcomLine& line);
+    void checkEnd(const GedcomLine& line, std::uint64_t tag);
+    void beginPerson(const GedcomLine& line);
+    void beginFamily(const GedcomLine& line);
+    XrefTable::Entry* claimXref(const GedcomLine& line);
+
+    void readPersonFact(const GedcomLine& line, std::uint64_t tag);
+    void readPersonDetail(const GedcomLine& line, std::uint64_t tag);
+    void readFamilyFact(const GedcomLine& line, std::uint64_t tag);
+    void readFamilyDetail(const GedcomLine& line, std::uint64_t tag);
+
+    void beginName(const GedcomLine& line);
+    void readNamePiece(const GedcomLine& line, std::uint64_t tag);
+    void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint);
+    std::string_view keptPiece(const PieceDraft& piece);
+    void endName();
+
+    void readDate(const GedcomLine& line, GedcomDate& date);
+    void readDatePhrase(const GedcomLine& line);
+    void addPartner(const GedcomLine& line, PartnerDraft& draft);
+    void endFamily();
+    void settlePartners();
+    void refusePartner(LineNumber line);
+    XrefPlace readPointer(const GedcomLine& line);
+    std::string_view pointedXref(const GedcomLine& line);
+
+    std::string_view keptValue(const GedcomLine& line) {
+        return keeper_.keep(scanner_.wholeValue(line), line.number);
+    }
+    Person& person() { return tables_.persons.back(); }
+    Family& family() { return tables_.families.back(); }
+
+    LineScanner& scanner_;
+    TextKeeper& keeper_;
+    GedcomTables& tables_;
+    XrefTable& xrefs_;
+    DiagnosticList& diagnostics_;
+
+    Record record_ = Record::other;
+    std::uint64_t fact_ = 0;          // tag of the line on level 1 that the one in hand lies under
+    GedcomDate* openDate_ = nullptr;  // a date without a value, which a phrase may still fill
+    NameDraft name_;
+    bool nameOpen_ = false;
+    bool sexRead_ = false;
+    PartnerDraft husbands_;
+    PartnerDraft wives_;
+    std::uint32_t marriages_ = 0;
+    bool marriedLast_ = false;  // no DIV behind the last MARR
+    bool anyLine_ = false;
+    bool anyRecord_ = false;
+    bool trailerSeen_ = false;
+};
+
+}  // namespace olvane::gedcom

@@ -1,0 +1,85 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Values on their way from the file to the records. Nearly all are plain ASCII or sound UTF-8 and cost one
+// look.
+
+#include "olvane/gedcom/TextKeeperInternal.h"
+
+#include <algorithm>
+#include <functional>
+
+#include "olvane/gedcom/LineScannerInternal.h"
+#include "olvane/gedcom/UnicodeTextInternal.h"
+
+namespace olvane::gedcom {
+namespace {
+
+bool isControl(char c) {
+    return static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
+}
+
+bool isWhiteControl(char c) {
+    return c == '\t' || c == '\n' || c == '\r' || c == '\v' || c == '\f';
+}
+
+}  // namespace
+
+bool TextKeeper::isPlain(std::string_view raw) const {
+    bool ascii = true;
+    for (const char c : raw) {
+        if (isControl(c) || c == '@') return false;
+        ascii = ascii && static_cast<unsigned char>(c) < 0x80;
+    }
+    return ascii || (form_.encoding == Encoding::utf8 && isUtf8(raw));
+}
+
+bool TextKeeper::liesInBytes(std::string_view text) const {
+    const std::string& bytes = store_.bytes;
+    const std::less<const char*> before;
+    return !before(text.data(), bytes.data()) && before(text.data(), bytes.data() + bytes.size());
+}
+
+std::string_view TextKeeper::keep(std::string_view raw, std::uint32_t line) {
+    raw = trimmed(raw);
+    if (isPlain(raw)) return liesInBytes(raw) ? raw : store_.arena.keep(raw);
+    std::string text = decoded(raw, line);
+    undouble(text);
+    removeControls(text, line);
+    return store_.arena.keep(trimmed(text));
+}
+
+std::string TextKeeper::decoded(std::string_view raw, std::uint32_t line) {
+    std::size_t faults = 0;
+    std::string text = decodeText(raw, form_.encoding, faults);
+    if (faults != 0) {
+        diagnostics_.add(
+            DiagnosticKind::badCharacter, Severity::warning, line,
+            std::to_string(faults) + " bytes that are no character in " + encodingName(form_.encoding),
+            "read as well as can be", text);
+    }
+    return text;
+}
+
+void TextKeeper::undouble(std::string& text) const {
+    if (!form_.doublesEveryAt) {
+        if (text.starts_with("@@")) text.erase(0, 1);
+        return;
+    }
+    std::size_t kept = 0;
+    for (std::size_t at = 0; at < text.size(); ++at) {
+        text[kept++] = text[at];
+        if (text[at] == '@' && at + 1 < text.size() && text[at + 1] == '@') ++at;
+    }
+    text.resize(kept);
+}
+
+void TextKeeper::removeControls(std::string& text, std::uint32_t line) {
+    std::replace_if(text.begin(), text.end(), isWhiteControl, ' ');
+    const std::size_t removed = std::erase_if(text, isControl);
+    if (removed == 0) return;
+    diagnostics_.add(DiagnosticKind::controlCharacter, Severity::warning, line,
+                     std::to_string(removed) + " control characters", "left out", text);
+}
+
+}  // namespace olvane::gedcom
