@@ -55,30 +55,33 @@ bool isDigit(char c) {
 // Words of a value from left to right.
 class Words {
 public:
-    explicit Words(std::string_view text) : rest_(text) { skipSpace(); }
+    explicit Words(std::string_view text) : rest_(text) { findWord(); }
 
     bool atEnd() const { return rest_.empty(); }
     char front() const { return rest_.empty() ? '\0' : rest_.front(); }
-    std::string_view peek() const {
-        return rest_.substr(0, std::min(rest_.find_first_of(" \t\r\n"), rest_.size()));
-    }
-    void skip() { drop(peek().size()); }
+    std::string_view peek() const { return rest_.substr(0, wordLength_); }
+    std::string_view rest() const { return rest_; }
+    void skip() { drop(wordLength_); }
     void drop(std::size_t bytes) {
         rest_.remove_prefix(bytes);
-        skipSpace();
+        findWord();
     }
+    // No choice begins with a digit.
     bool skipIf(std::initializer_list<std::string_view> choices) {
-        if (!Word(peek()).isOneOf(choices)) return false;
+        if (isDigit(front()) || !Word(peek()).isOneOf(choices)) return false;
         skip();
         return true;
     }
-    std::string_view rest() const { return rest_; }
 
 private:
-    void skipSpace() {
+    void findWord() {
         while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
+        wordLength_ = 0;
+        while (wordLength_ < rest_.size() && !isSpace(rest_[wordLength_])) ++wordLength_;
     }
+
     std::string_view rest_;
+    std::size_t wordLength_ = 0;
 };
 
 std::optional<int> wholeNumber(std::string_view digits, std::size_t longest) {
@@ -89,36 +92,51 @@ std::optional<int> wholeNumber(std::string_view digits, std::size_t longest) {
     return number;
 }
 
+constexpr std::size_t kLongestMonthCode = 4;
+
+// Up to four letters as a number, in capitals; 0 for more.
+constexpr std::uint32_t code(std::string_view letters) {
+    if (letters.size() > kLongestMonthCode) return 0;
+    std::uint32_t packed = 0;
+    for (const char c : letters) {
+        packed = packed << 8 | static_cast<unsigned char>(c >= 'a' && c <= 'z' ? c - 'a' + 'A' : c);
+    }
+    return packed;
+}
+
+constexpr std::array kMonths = {code("JAN"), code("FEB"), code("MAR"), code("APR"), code("MAY"), code("JUN"),
+                                code("JUL"), code("AUG"), code("SEP"), code("OCT"), code("NOV"), code("DEC")};
+constexpr std::array kFrenchMonths = {code("VEND"), code("BRUM"), code("FRIM"), code("NIVO"), code("PLUV"),
+                                      code("VENT"), code("GERM"), code("FLOR"), code("PRAI"), code("MESS"),
+                                      code("THER"), code("FRUC"), code("COMP")};
+constexpr std::array kHebrewMonths = {code("TSH"), code("CSH"), code("KSL"), code("TVT"), code("SHV"),
+                                      code("ADR"), code("ADS"), code("NSN"), code("IYR"), code("SVN"),
+                                      code("TMZ"), code("AAV"), code("ELL")};
+constexpr std::array<std::string_view, 12> kLongMonths = {"JANUARY",   "FEBRUARY", "MARCH",    "APRIL",
+                                                          "MAY",       "JUNE",     "JULY",     "AUGUST",
+                                                          "SEPTEMBER", "OCTOBER",  "NOVEMBER", "DECEMBER"};
+
 // Place of the name in the list from 1; 0 if it is not there.
-template <std::size_t N>
-int placeIn(const std::array<std::string_view, N>& names, std::string_view name) {
+template <typename Name, std::size_t N>
+int placeIn(const std::array<Name, N>& names, Name name) {
     const auto found = std::find(names.begin(), names.end(), name);
     return found == names.end() ? 0 : static_cast<int>(found - names.begin()) + 1;
 }
 
-constexpr std::array<std::string_view, 12> kMonths = {"JAN", "FEB", "MAR", "APR", "MAY", "JUN",
-                                                      "JUL", "AUG", "SEP", "OCT", "NOV", "DEC"};
-constexpr std::array<std::string_view, 12> kLongMonths = {"JANUARY",   "FEBRUARY", "MARCH",    "APRIL",
-                                                          "MAY",       "JUNE",     "JULY",     "AUGUST",
-                                                          "SEPTEMBER", "OCTOBER",  "NOVEMBER", "DECEMBER"};
-constexpr std::array<std::string_view, 13> kFrenchMonths = {
-    "VEND", "BRUM", "FRIM", "NIVO", "PLUV", "VENT", "GERM", "FLOR", "PRAI", "MESS", "THER", "FRUC", "COMP"};
-constexpr std::array<std::string_view, 13> kHebrewMonths = {"TSH", "CSH", "KSL", "TVT", "SHV", "ADR", "ADS",
-                                                            "NSN", "IYR", "SVN", "TMZ", "AAV", "ELL"};
-
-int monthOf(Calendar calendar, std::string_view raw) {
-    const Word word(raw);
+int monthOf(Calendar calendar, std::string_view word) {
+    if (!word.empty() && word.back() == '.') word.remove_suffix(1);
     switch (calendar) {
         case Calendar::gregorian:
         case Calendar::julian: {
-            if (word.stem() == "SEPT") return 9;
-            const int place = placeIn(kMonths, word.stem());
-            return place != 0 ? place : placeIn(kLongMonths, word.stem());
+            const std::uint32_t letters = code(word);
+            if (letters == code("SEPT")) return 9;
+            const int place = letters == 0 ? 0 : placeIn(kMonths, letters);
+            return place != 0 || word.size() <= 3 ? place : placeIn(kLongMonths, Word(word).text());
         }
         case Calendar::frenchRepublican:
-            return placeIn(kFrenchMonths, word.stem());
+            return placeIn(kFrenchMonths, code(word));
         case Calendar::hebrew:
-            return placeIn(kHebrewMonths, word.stem());
+            return placeIn(kHebrewMonths, code(word));
     }
     return 0;
 }
@@ -142,7 +160,8 @@ std::optional<Calendar> takeCalendar(Words& words) {
         words.drop(end + 1);
         return calendar;
     }
-    const auto calendar = calendarNamed(Word(words.peek()).text());
+    const std::string_view word = words.peek();
+    const auto calendar = word.size() > kLongestMonthCode ? calendarNamed(Word(word).text()) : std::nullopt;
     if (!calendar) return Calendar::gregorian;
     words.skip();
     return calendar;
@@ -187,7 +206,7 @@ bool takeYear(Words& words, ReadDate& result) {
 }
 
 bool takeEpoch(Words& words, ReadDate& result) {
-    if (!words.skipIf({"BC", "B.C", "BCE", "B.C.E"})) return true;
+    if (words.atEnd() || !words.skipIf({"BC", "B.C", "BCE", "B.C.E"})) return true;
     const bool counted = result.calendar == Calendar::gregorian || result.calendar == Calendar::julian;
     result.date.year = -result.date.year;
     return counted;
@@ -226,7 +245,7 @@ std::optional<ReadDate> takeDate(Words& words) {
         return result;
     }
     const Words start = words;
-    if (const auto day = wholeNumber(words.peek(), 2)) {
+    if (const auto day = isDigit(words.front()) ? wholeNumber(words.peek(), 2) : std::nullopt) {
         words.skip();
         result.date.month = monthOf(result.calendar, words.peek());
         result.date.day = *day;
@@ -284,21 +303,23 @@ std::string yearText(int year) {
     return year < 0 ? std::to_string(-year) + " BC" : std::to_string(year);
 }
 
-// The number in so many digits at least.
-std::string padded(int number, std::size_t digits) {
-    const std::string text = std::to_string(number);
-    return text.size() >= digits ? text : std::string(digits - text.size(), '0') + text;
+// Appends the number in so many digits at least.
+void appendPadded(std::string& text, int number, std::size_t digits) {
+    const std::string plain = std::to_string(number);
+    if (plain.size() < digits) text.append(digits - plain.size(), '0');
+    text.append(plain);
 }
 
-// "0044", or "-9955" for 44 B.C.
-std::string sortableYear(int year) {
-    return year < 0 ? "-" + padded(kLastYear + year, 4) : padded(year, 4);
-}
-
+// Years B.C. are turned round, so that they sort: "-9955" is 44 B.C.
 std::string sortableDate(const CalendarDate& date) {
-    std::string text = sortableYear(date.year);
-    if (date.month != 0) text += "-" + padded(date.month, 2);
-    if (date.day != 0) text += "-" + padded(date.day, 2);
+    std::string text;
+    if (date.year < 0) text.push_back('-');
+    appendPadded(text, date.year < 0 ? kLastYear + date.year : date.year, 4);
+    for (const int part : {date.month, date.day}) {
+        if (part == 0) break;
+        text.push_back('-');
+        appendPadded(text, part, 2);
+    }
     return text;
 }
 
@@ -344,21 +365,15 @@ std::string sortText(const GedcomDate& date) {
 
 std::string displayYear(const GedcomDate& date) {
     if (!date.isRead()) return std::string(date.written);
-    const std::string year = yearText(date.year);
-    switch (date.mark) {
-        case DateMark::exact:
-            return year;
-        case DateMark::about:
-            return "~" + year;
-        case DateMark::before:
-            return "<" + year;
-        case DateMark::after:
-            return ">" + year;
-        case DateMark::between:
-            return date.lastYear == 0 || date.lastYear == date.year ? year
-                                                                    : year + "-" + yearText(date.lastYear);
+    std::string text;
+    if (date.mark == DateMark::about) text.push_back('~');
+    if (date.mark == DateMark::before) text.push_back('<');
+    if (date.mark == DateMark::after) text.push_back('>');
+    text.append(yearText(date.year));
+    if (date.mark == DateMark::between && date.lastYear != 0 && date.lastYear != date.year) {
+        text.append("-").append(yearText(date.lastYear));
     }
-    return year;
+    return text;
 }
 
 }  // namespace olvane::gedcom

@@ -67,11 +67,11 @@ const char* severityName(Severity severity) {
 
 std::string formatDiagnostic(const Diagnostic& diagnostic) {
     std::string text = diagnostic.file;
-    if (diagnostic.line != 0) text += ":" + std::to_string(diagnostic.line);
+    if (diagnostic.line != 0) text.append(":").append(std::to_string(diagnostic.line));
     text += ": ";
     text += severityName(diagnostic.severity);
-    text += ": " + diagnostic.what;
-    if (!diagnostic.done.empty()) text += "; " + diagnostic.done;
+    text.append(": ").append(diagnostic.what);
+    if (!diagnostic.done.empty()) text.append("; ").append(diagnostic.done);
     return text;
 }
 
@@ -83,7 +83,7 @@ void DiagnosticList::add(DiagnosticKind kind, Severity severity, std::uint32_t l
     Tally& tally = tallies_[static_cast<std::size_t>(kind)];
     if (++tally.seen > listedPerKind_) return;
     std::string whole(what);
-    if (!quoted.empty()) whole += " (" + printable(quoted) + ")";
+    if (!quoted.empty()) whole.append(" (").append(printable(quoted)).append(")");
     listed_.push_back({file_, line, severity, kind, std::move(whole), std::string(done)});
 }
 

@@ -23,9 +23,17 @@ bool isDigit(char c) {
     return c >= '0' && c <= '9';
 }
 
+constexpr std::array<bool, 256> kTagLetters = [] {
+    std::array<bool, 256> letters{};
+    for (std::size_t c = 0; c < letters.size(); ++c) {
+        letters[c] = (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || c == '_' ||
+                     c >= 0x80;
+    }
+    return letters;
+}();
+
 bool isTagLetter(char c) {
-    return isDigit(c) || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || c == '_' ||
-           static_cast<unsigned char>(c) >= 0x80;
+    return kTagLetters[static_cast<unsigned char>(c)];
 }
 
 std::string_view withoutLeadingBlanks(std::string_view text) {
@@ -47,6 +55,14 @@ std::uint32_t takeNumber(std::string_view& rest) {
         rest.remove_prefix(1);
     }
     return number;
+}
+
+// Whether a text may begin with a CONC or CONT line: a look at a few characters that spares looking for the
+// line's end.
+bool mayContinue(std::string_view rest) {
+    std::size_t at = 0;
+    while (at < rest.size() && (isBlank(rest[at]) || isDigit(rest[at]))) ++at;
+    return at > 0 && rest.substr(at, 3) == "CON";
 }
 
 // A CONC or CONT line below a level.
@@ -127,7 +143,16 @@ bool LineScanner::refuse(std::string_view text, const GedcomLine& line) {
     return false;
 }
 
+// Nearly all levels are one digit and a space.
 bool LineScanner::takeLevel(std::string_view& rest, GedcomLine& line) {
+    if (rest.size() < 3 || !isDigit(rest[0]) || rest[1] != ' ') return takeUnusualLevel(rest, line);
+    writtenLevel_ = static_cast<std::uint32_t>(rest[0] - '0');
+    rest.remove_prefix(2);
+    if (isBlank(rest.front())) rest = withoutLeadingBlanks(rest);
+    return true;
+}
+
+bool LineScanner::takeUnusualLevel(std::string_view& rest, GedcomLine& line) {
     const bool negative = rest.front() == '-';
     std::string_view digits = rest.substr(negative ? 1 : 0);
     if (digits.empty() || !isDigit(digits.front())) return false;
@@ -148,15 +173,14 @@ bool LineScanner::takeXref(std::string_view& rest, GedcomLine& line) {
     line.xref = {};
     if (rest.empty() || rest.front() != '@') return true;
     std::size_t end = rest.find('@', 1);
-    const std::size_t blank = std::min(rest.find(' '), rest.size());
     const bool closed = end != std::string_view::npos && (end + 1 == rest.size() || isBlank(rest[end + 1]));
     if (!closed) {
+        end = std::min(rest.find(' '), rest.size());
         diagnostics_.add(DiagnosticKind::brokenXref, Severity::warning, line.number,
-                         "identifier without its second @", "read up to the space", rest.substr(0, blank));
-        end = blank;
+                         "identifier without its second @", "read up to the space", rest.substr(0, end));
     }
     line.xref = trimmed(rest.substr(1, end - 1));
-    rest = withoutLeadingBlanks(rest.substr(std::min(closed ? end + 1 : end, rest.size())));
+    rest = withoutLeadingBlanks(rest.substr(closed ? end + 1 : end));
     return true;
 }
 
@@ -187,9 +211,7 @@ std::string_view LineScanner::wholeValue(const GedcomLine& line) {
     LineCutter ahead = cutter_;
     std::string_view text;
     bool joining = false;
-    while (!ahead.rest().empty()) {
-        // The first line end need not be looked for if the line is no continuation anyway.
-        if (!isDigit(ahead.rest().front()) && !isBlank(ahead.rest().front())) break;
+    while (mayContinue(ahead.rest())) {
         ahead.next(text);
         const Continuation more = readContinuation(text, writtenLevel_);
         if (!more.isOne) break;

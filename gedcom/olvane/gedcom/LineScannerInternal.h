@@ -37,6 +37,8 @@ public:
     bool next(std::string_view& text);
     std::uint32_t number() const { return number_; }
     std::string_view rest() const { return bytes_.substr(at_); }
+    // How much of the bytes lies behind, from 0 to 1.
+    double share() const { return static_cast<double>(at_) / static_cast<double>(bytes_.size()); }
 
 private:
     std::size_t nearestEnd();
@@ -68,10 +70,13 @@ public:
     std::string_view wholeValue(const GedcomLine& line);
 
     std::uint32_t lineNumber() const { return cutter_.number(); }
+    // How much of the text is read, from 0 to 1.
+    double share() const { return cutter_.share(); }
 
 private:
     bool parse(std::string_view text, GedcomLine& line);
     bool takeLevel(std::string_view& rest, GedcomLine& line);
+    bool takeUnusualLevel(std::string_view& rest, GedcomLine& line);
     bool takeXref(std::string_view& rest, GedcomLine& line);
     bool takeTag(std::string_view& rest, GedcomLine& line);
     void settleDepth(GedcomLine& line);

@@ -10,6 +10,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <string>
+#include <vector>
 
 namespace olvane::gedcom {
 namespace {
@@ -95,6 +96,20 @@ Pedigree pedigreeOf(std::string_view value) {
         default:
             return Pedigree::other;
     }
+}
+
+// Adds to a list that is read from a text of which this share is behind. A full list grows to what the whole
+// text will take if it goes on so, and at least to twice its size: a big list moves once instead of many
+// times.
+template <typename Item>
+void addForeseeing(std::vector<Item>& list, const Item& item, double share) {
+    constexpr double kEnoughToJudge = 1.0 / 64;
+    constexpr double kMargin = 1.05;
+    if (list.size() == list.capacity() && share > kEnoughToJudge) {
+        const auto foreseen = static_cast<std::size_t>(static_cast<double>(list.size()) / share * kMargin);
+        list.reserve(std::max(foreseen, list.size() * 2));
+    }
+    list.push_back(item);
 }
 
 // The parts of a value at its slashes: before, between and behind them.
@@ -219,7 +234,7 @@ void RecordReader::beginPerson(const GedcomLine& line) {
     fresh.nameSlice.first = static_cast<std::uint32_t>(tables_.names.size());
     fresh.parentLinkSlice.first = static_cast<std::uint32_t>(tables_.parentLinks.size());
     fresh.coupleLinkSlice.first = static_cast<std::uint32_t>(tables_.coupleLinks.size());
-    tables_.persons.push_back(fresh);
+    addForeseeing(tables_.persons, fresh, scanner_.share());
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->person == 0) entry->person = static_cast<PersonId>(tables_.persons.size());
 }
@@ -234,7 +249,7 @@ void RecordReader::beginFamily(const GedcomLine& line) {
     fresh.line = line.number;
     fresh.xref = keeper_.keep(line.xref, line.number);
     fresh.childLinkSlice.first = static_cast<std::uint32_t>(tables_.childLinks.size());
-    tables_.families.push_back(fresh);
+    addForeseeing(tables_.families, fresh, scanner_.share());
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->family == 0)
         entry->family = static_cast<FamilyId>(tables_.families.size());
@@ -358,7 +373,7 @@ void RecordReader::endName() {
                        keptPiece(name_.given),  keptPiece(name_.surname),
                        keptPiece(name_.suffix), keptPiece(name_.nickname)};
     fillFromSlashes(name);
-    tables_.names.push_back(name);
+    addForeseeing(tables_.names, name, scanner_.share());
     ++person().nameSlice.count;
 }
 

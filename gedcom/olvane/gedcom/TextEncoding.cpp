@@ -245,26 +245,28 @@ void reportFaults(const Utf8Census& census, Encoding used, DiagnosticList& diagn
                     "those in names and dates are told below");
 }
 
+// A file's version counts as 7 or later by its first number.
+bool isBeforeVersion7(std::string_view version) {
+    const std::string_view major = version.substr(0, version.find('.'));
+    return major.empty() || major.size() > 1 || major[0] < '7' || major[0] > '9';
+}
+
+// All that the header says fits a text of ASCII alone, but for UTF-16. Since version 7 there is UTF-8 only.
+Encoding encodingOfAscii(const HeaderClaims& claims, std::optional<Encoding> claimed) {
+    if (claimed && !isUtf16(*claimed)) return *claimed;
+    return isBeforeVersion7(claims.version) ? Encoding::ascii : Encoding::utf8;
+}
+
 Encoding chooseEncoding(std::string_view bytes, const HeaderClaims& claims, bool marked,
                         DiagnosticList& diagnostics) {
     const auto claimed = encodingLabelled(capitals(claims.characters));
     const Utf8Census census = takeUtf8Census(bytes);
     const bool ascii = census.characters == 0 && census.faults == 0;
     Encoding used = Encoding::utf8;
-    if (ascii && !marked) {
-        used = claimed && !isUtf16(*claimed) ? *claimed : Encoding::ascii;
-    } else if (!marked) {
-        used = encodingByBytes(bytes, claimed, census);
-    }
+    if (!marked) used = ascii ? encodingOfAscii(claims, claimed) : encodingByBytes(bytes, claimed, census);
     reportClaims(claims, claimed, used, diagnostics);
     reportFaults(census, used, diagnostics);
     return used;
-}
-
-// A file's version counts as 7 or later by its first number.
-bool isBeforeVersion7(std::string_view version) {
-    const std::string_view major = version.substr(0, version.find('.'));
-    return major.empty() || major.size() > 1 || major[0] < '7' || major[0] > '9';
 }
 
 // Takes a pair of lone surrogates that a CONC line had parted; 0 if there is none at the front.

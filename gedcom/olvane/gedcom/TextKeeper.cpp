@@ -7,6 +7,8 @@
 #include "olvane/gedcom/TextKeeperInternal.h"
 
 #include <algorithm>
+#include <array>
+#include <cstddef>
 #include <functional>
 
 #include "olvane/gedcom/LineScannerInternal.h"
@@ -19,6 +21,17 @@ bool isControl(char c) {
     return static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
 }
 
+// What a character asks of a value that holds it.
+enum Demand : unsigned char { kNothing = 0, kDecoding = 1, kCare = 2 };
+
+constexpr std::array<unsigned char, 256> kDemands = [] {
+    std::array<unsigned char, 256> demands{};
+    for (std::size_t c = 0; c < demands.size(); ++c) {
+        demands[c] = c < 0x20 || c == 0x7F || c == '@' ? kCare : (c >= 0x80 ? kDecoding : kNothing);
+    }
+    return demands;
+}();
+
 bool isWhiteControl(char c) {
     return c == '\t' || c == '\n' || c == '\r' || c == '\v' || c == '\f';
 }
@@ -26,12 +39,9 @@ bool isWhiteControl(char c) {
 }  // namespace
 
 bool TextKeeper::isPlain(std::string_view raw) const {
-    bool ascii = true;
-    for (const char c : raw) {
-        if (isControl(c) || c == '@') return false;
-        ascii = ascii && static_cast<unsigned char>(c) < 0x80;
-    }
-    return ascii || (form_.encoding == Encoding::utf8 && isUtf8(raw));
+    unsigned demands = 0;
+    for (const char c : raw) demands |= kDemands[static_cast<unsigned char>(c)];
+    return demands == kNothing || (demands == kDecoding && form_.encoding == Encoding::utf8 && isUtf8(raw));
 }
 
 bool TextKeeper::liesInBytes(std::string_view text) const {

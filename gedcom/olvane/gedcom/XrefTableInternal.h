@@ -18,7 +18,9 @@ using XrefPlace = std::uint32_t;
 // All identifiers of a file, whether a record has them or only a pointer.
 //
 // Holds: places never change; place 0 stands for no identifier, and for a void pointer. Finding one takes
-// constant time on the average. Lifetime: the texts are views; whatever they look into outlives the table.
+// constant
+//        time on the average. Memory is at most some 100 bytes an identifier.
+// Lifetime: the texts are views; whatever they look into outlives the table.
 class XrefTable {
 public:
     struct Entry {
@@ -40,11 +42,33 @@ public:
     Entry& at(XrefPlace place) { return entries_[place]; }
 
 private:
-    std::size_t bucketOf(std::string_view xref, std::uint32_t hash) const;
+    // Identifiers of one beginning that count up, such as I1, I2, I3: places by number.
+    struct Series {
+        std::string_view beginning;
+        std::size_t digits = 0;  // of numbers with zeros in front; 0 for those without
+        std::vector<XrefPlace> places;
+    };
+
+    // An identifier as a member of a series; number is npos for one that cannot be.
+    struct Serial {
+        std::string_view beginning;
+        std::size_t digits = 0;
+        std::size_t number = 0;
+    };
+
+    static Serial serialOf(std::string_view xref);
+    std::size_t seriesOf(const Serial& serial) const;
+    XrefPlace findInSeries(const Serial& serial) const;
+    XrefPlace findByHash(std::string_view xref) const;
+    bool addToSeries(const Serial& serial, XrefPlace place);
+    void addByHash(XrefPlace place);
+    void putIntoBucket(XrefPlace place);
     void grow();
 
     std::vector<Entry> entries_;
+    std::vector<Series> series_;
     std::vector<XrefPlace> buckets_;  // size is a power of two, at most half of them taken; 0 is free
+    std::size_t hashed_ = 0;
 };
 
 // The identifier without its @, if it has them.
