@@ -64,13 +64,12 @@ public:
         return text == "1";
     }
 
-    // Read as a double and narrowed; what a float cannot hold, and what is not finite, is refused.
+    // Read as a double and narrowed; what a float cannot hold becomes an infinity.
     float size() {
-        const std::string_view before = rest;
         const double value = number<double>();
-        const bool fits = std::isfinite(value) && std::abs(value) <= std::numeric_limits<float>::max();
-        if (!fits) failNumber(before.substr(0, before.find(' ')));
-        return static_cast<float>(value);
+        constexpr double kGreatest = std::numeric_limits<float>::max();
+        if (std::abs(value) <= kGreatest || std::isnan(value)) return static_cast<float>(value);
+        return std::copysign(std::numeric_limits<float>::infinity(), static_cast<float>(value > 0 ? 1 : -1));
     }
 
     std::vector<PersonId> persons() {
@@ -412,6 +411,23 @@ void CaseHost::countAndPerhapsFail(HostOperation operation) {
     const auto found = family.failures.find(operation);
     if (found == family.failures.end() || found->second.count(call) == 0) return;
     throw HostFailure(std::string(operationName(operation)) + " fails at call " + std::to_string(call));
+}
+
+std::set<PersonId> personsOf(const CaseFile& source) {
+    std::set<PersonId> persons;
+    const auto addKeysOf = [&persons](const auto& answers) {
+        for (const auto& answer : answers) persons.insert(answer.first);
+    };
+    addKeysOf(source.fathers);
+    addKeysOf(source.mothers);
+    addKeysOf(source.spouses);
+    addKeysOf(source.children);
+    addKeysOf(source.preferredSpouses);
+    addKeysOf(source.dead);
+    addKeysOf(source.births);
+    addKeysOf(source.dates);
+    addKeysOf(source.sexes);
+    return persons;
 }
 
 }  // namespace support

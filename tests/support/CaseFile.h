@@ -91,6 +91,9 @@ CaseFile readCase(const std::string& path);
 // Directives that say what is the default anyway are left out, but for entries of the maps.
 std::string formatCase(const CaseFile& source);
 
+// The persons of whom a case speaks, each once, by ascending id: those with answers of their own.
+std::set<PersonId> personsOf(const CaseFile& source);
+
 // Raised by CaseHost where the case says that a call fails.
 class HostFailure : public std::runtime_error {
 public:

@@ -4,8 +4,10 @@
 // layout-case: reads case files, a family and one layout request each, and prints what the engine made of
 // them. It is how golden layouts are made and how a bug is reported.
 //
-//     layout-case [--graph] [--trace] [--record] CASEFILE...
+//     layout-case [--graph] [--trace] [--record] [--every-person] CASEFILE...
 //
+// --every-person lays out each person of whom the file speaks, instead of its focus, behind a line "focus
+// ID".
 // --record writes CASEFILE.new for each file: the case with its expected lines ("#= ...") as they are now. A
 // person compares the two and renames.
 
@@ -26,10 +28,12 @@ struct Request {
     bool graph = false;
     bool trace = false;
     bool record = false;
+    bool everyPerson = false;
     std::vector<std::string> files;
 };
 
-constexpr const char* kUsage = "usage: layout-case [--graph] [--trace] [--record] CASEFILE...\n";
+constexpr const char* kUsage =
+    "usage: layout-case [--graph] [--trace] [--record] [--every-person] CASEFILE...\n";
 
 bool readArguments(int argc, char** argv, Request& request) {
     for (int i = 1; i < argc; ++i) {
@@ -40,6 +44,8 @@ bool readArguments(int argc, char** argv, Request& request) {
             request.trace = true;
         } else if (argument == "--record") {
             request.record = true;
+        } else if (argument == "--every-person") {
+            request.everyPerson = true;
         } else if (argument.rfind("--", 0) == 0) {
             std::cerr << "layout-case: unknown option " << argument << "\n" << kUsage;
             return false;
@@ -59,10 +65,26 @@ void recordCase(const std::string& file) {
     std::cerr << "layout-case: wrote " << path << "; compare and rename\n";
 }
 
+void printLayout(const Request& request, const support::CaseFile& source) {
+    std::cout << support::joinLines(support::runCase(source, request.graph, request.trace));
+}
+
+void printEveryPerson(const Request& request, support::CaseFile source) {
+    for (const support::PersonId id : support::personsOf(source)) {
+        source.focus = id;
+        std::cout << "focus " << id << "\n";
+        printLayout(request, source);
+    }
+}
+
 void printCase(const Request& request, const std::string& file) {
     const support::CaseFile source = support::readCase(file);
     if (request.files.size() > 1) std::cout << "case " << file << "\n";
-    std::cout << support::joinLines(support::runCase(source, request.graph, request.trace));
+    if (request.everyPerson) {
+        printEveryPerson(request, source);
+    } else {
+        printLayout(request, source);
+    }
 }
 
 }  // namespace

@@ -6,6 +6,10 @@
 
 #include <olvane/layouter/TreeViewLayouter.h>
 
+#ifdef __FAST_MATH__
+#error "Results are exact to the last bit: the engine must not be compiled with -ffast-math."
+#endif
+
 namespace SharedTreeViewer {
 
 TreeViewLayouter::TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
