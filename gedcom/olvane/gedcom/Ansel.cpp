@@ -8,6 +8,7 @@
 
 #include <cstddef>
 
+#include "olvane/gedcom/LineScannerInternal.h"
 #include "olvane/gedcom/UnicodeTextInternal.h"
 
 namespace olvane::gedcom {
@@ -57,6 +58,13 @@ bool composes(char32_t mark, unsigned char letter) {
     return composed(pair).size() < pair.size();
 }
 
+// The one that the text goes on with, in a CONC line if need be.
+unsigned char characterBehind(std::string_view rest) {
+    const std::size_t conc = findConcText(rest);
+    if (conc != std::string_view::npos) rest.remove_prefix(conc);
+    return static_cast<unsigned char>(rest.empty() ? ' ' : rest.front());
+}
+
 }  // namespace
 
 AnselCensus takeAnselCensus(std::string_view bytes) {
@@ -64,7 +72,7 @@ AnselCensus takeAnselCensus(std::string_view bytes) {
     for (std::size_t at = 0; at < bytes.size(); ++at) {
         const auto byte = static_cast<unsigned char>(bytes[at]);
         if (byte < 0x80) continue;
-        const auto next = static_cast<unsigned char>(at + 1 < bytes.size() ? bytes[at + 1] : ' ');
+        const unsigned char next = characterBehind(bytes.substr(at + 1));
         const char32_t mark = markOf(byte);
         const bool fits =
             mark != 0 ? markOf(next) != 0 || (isLetter(next) && composes(mark, next)) : signOf(byte) != 0;

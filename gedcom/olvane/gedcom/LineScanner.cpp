@@ -92,6 +92,15 @@ std::string_view trimmed(std::string_view text) {
     return text;
 }
 
+std::size_t findConcText(std::string_view rest) {
+    std::size_t at = 0;
+    if (at < rest.size() && rest[at] == '\r') ++at;
+    if (at < rest.size() && rest[at] == '\n') ++at;
+    if (at == 0) return std::string_view::npos;
+    while (at < rest.size() && (isDigit(rest[at]) || isBlank(rest[at]))) ++at;
+    return rest.substr(at, 5) == "CONC " ? at + 5 : std::string_view::npos;
+}
+
 std::size_t LineCutter::nearestEnd() {
     if (!knowsLf_ || nextLf_ < at_) nextLf_ = find(bytes_, at_, '\n');
     if (!knowsCr_ || nextCr_ < at_) nextCr_ = find(bytes_, at_, '\r');

@@ -15,6 +15,9 @@ namespace olvane::gedcom {
 // Without spaces and tabs on either side.
 std::string_view trimmed(std::string_view text);
 
+// Where the text of a CONC line begins, if rest starts with a line end and such a line; else npos.
+std::size_t findConcText(std::string_view rest);
+
 // A line taken apart. Views into the scanned bytes, in the encoding of the file.
 struct GedcomLine {
     static constexpr std::size_t kDeep = 4;

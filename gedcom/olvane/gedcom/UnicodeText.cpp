@@ -12,6 +12,8 @@
 #include <cstring>
 #include <memory>
 
+#include "olvane/gedcom/LineScannerInternal.h"
+
 namespace olvane::gedcom {
 namespace {
 
@@ -57,24 +59,13 @@ std::size_t announcedLength(char first) {
     return byte < 0x80 ? 1 : 0;
 }
 
-// Where the text of a CONC line begins, if rest starts with a line end and such a line; else npos.
-std::size_t concTextAfterLineEnd(std::string_view rest) {
-    std::size_t at = 0;
-    if (at < rest.size() && rest[at] == '\r') ++at;
-    if (at < rest.size() && rest[at] == '\n') ++at;
-    if (at == 0) return std::string_view::npos;
-    while (at < rest.size() && rest[at] >= '0' && rest[at] <= '9') ++at;
-    if (rest.substr(at, 6) != " CONC ") return std::string_view::npos;
-    return at + 6;
-}
-
 // Length over a character that begins at the front and goes on in a CONC line; 0 if that is not the case.
 std::size_t cutCharacterLength(std::string_view rest) {
     const std::size_t announced = announcedLength(rest.front());
     std::size_t head = 1;
     while (head < announced && head < rest.size() && isContinuation(rest[head])) ++head;
     if (announced < 2 || head >= announced) return 0;
-    const std::size_t gap = concTextAfterLineEnd(rest.substr(head));
+    const std::size_t gap = findConcText(rest.substr(head));
     if (gap == std::string_view::npos) return 0;
     const std::string joined =
         std::string(rest.substr(0, head)) + std::string(rest.substr(head + gap, announced - head));

@@ -1,0 +1,214 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Who is whose father, mother, spouse and child, by which record, and in which order.
+
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+#include <string>
+
+#include "GedcomText.h"
+
+namespace olvane::gedcom::test {
+namespace {
+
+TEST(Relations, aFamilyJoinsParentsAndChildren) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I2@ INDI\n1 SEX F\n1 FAMS @F1@\n"
+                      "0 @I3@ INDI\n1 FAMC @F1@\n0 @I4@ INDI\n1 SEX X\n1 FAMC @F1@\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I4@\n1 CHIL @I3@\n"));
+    EXPECT_EQ(idsOf(data.spouses(1)), "2");
+    EXPECT_EQ(idsOf(data.spouses(2)), "1");
+    EXPECT_EQ(idsOf(data.children(1)), "4 3");
+    EXPECT_EQ(data.person(3).father, 1U);
+    EXPECT_EQ(data.person(3).mother, 2U);
+    EXPECT_EQ(data.person(1).sex, Sex::male);
+    EXPECT_EQ(data.person(2).sex, Sex::female);
+    EXPECT_EQ(data.person(3).sex, Sex::other);
+    EXPECT_EQ(data.person(4).sex, Sex::other);
+    EXPECT_TRUE(data.diagnostics().empty());
+}
+
+TEST(Relations, idsCountPersonsInFileOrderWhateverTheirIdentifiers) {
+    const GedcomData data =
+        read(document("0 @Z@ INDI\n1 NAME A\n0 @N@ NOTE x\n0 INDI\n1 NAME B\n0 @A@ INDI\n1 NAME C\n"));
+    EXPECT_EQ(namesOf(data), "A|B|C");
+    EXPECT_EQ(data.person(2).xref, "");
+    EXPECT_EQ(data.personByXref("@A@"), 3U);
+    EXPECT_EQ(data.personByXref("Z"), 1U);
+    EXPECT_EQ(data.personByXref("N"), 0U);
+    EXPECT_EQ(data.personByXref(""), 0U);
+    EXPECT_EQ(data.person(3).line, 11U);
+}
+
+// Family 1 has persons 1 and 2 as partners, family 2 persons 3 and 4; person 5 is the child.
+std::string childOf(const std::string& links) {
+    return document(
+        std::string("0 @I1@ INDI\n0 @I2@ INDI\n0 @I3@ INDI\n0 @I4@ INDI\n0 @I5@ INDI\n")
+            .append(links)
+            .append("0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n0 @F2@ FAM\n1 HUSB @I3@\n1 WIFE @I4@\n"));
+}
+
+PersonId fatherBy(const std::string& links) {
+    return read(childOf(links)).person(5).father;
+}
+
+TEST(Relations, parentsAreOfTheFirstFamilyOfBirth) {
+    EXPECT_EQ(fatherBy("1 FAMC @F1@\n1 FAMC @F2@\n"), 1U);
+    EXPECT_EQ(fatherBy("1 FAMC @F1@\n2 PEDI adopted\n1 FAMC @F2@\n2 PEDI birth\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @F1@\n2 PEDI foster\n1 FAMC @F2@\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @F1@\n2 PEDI BIRTH\n1 FAMC @F2@\n"), 1U);
+    EXPECT_EQ(fatherBy("1 FAMC @F1@\n2 PEDI\n1 FAMC @F2@\n2 PEDI birth\n"), 1U);
+}
+
+TEST(Relations, withoutAFamilyOfBirthTheFirstFamilyCounts) {
+    EXPECT_EQ(fatherBy("1 FAMC @F2@\n2 PEDI ADOPTED\n1 FAMC @F1@\n2 PEDI FOSTER\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @F2@\n2 PEDI sealing\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @F2@\n2 PEDI _KIND\n"), 3U);
+}
+
+TEST(Relations, linksThatLeadNowhereAreNoFamily) {
+    EXPECT_EQ(fatherBy("1 FAMC @VOID@\n1 FAMC @F2@\n2 PEDI adopted\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @F9@\n1 FAMC @F2@\n2 PEDI adopted\n"), 3U);
+    EXPECT_EQ(fatherBy("1 FAMC @I1@\n"), 0U);
+}
+
+TEST(Relations, pedigreesAndLinesOfAllLinksAreKept) {
+    const GedcomData data =
+        read(childOf("1 FAMC @F1@\n2 PEDI adopted\n1 FAMC @F2@\n2 PEDI Foster\n1 FAMC @VOID@\n"));
+    ASSERT_EQ(data.parentLinks(5).size(), 3U);
+    EXPECT_EQ(data.parentLinks(5)[0].pedigree, Pedigree::adopted);
+    EXPECT_EQ(data.parentLinks(5)[0].line, 11U);
+    EXPECT_EQ(data.parentLinks(5)[1].pedigree, Pedigree::foster);
+    EXPECT_EQ(data.parentLinks(5)[1].family, 2U);
+    EXPECT_EQ(data.parentLinks(5)[2].pedigree, Pedigree::notGiven);
+    EXPECT_EQ(data.parentLinks(5)[2].family, 0U);
+}
+
+TEST(Relations, aFamilyInAnAdoptionEventIsNoLink) {
+    EXPECT_EQ(fatherBy("1 ADOP\n2 FAMC @F1@\n1 FAMC @F2@\n"), 3U);
+}
+
+TEST(Relations, oneSpouseInSeveralRecordsIsOneSpouse) {
+    const GedcomData data = read(
+        document("0 @I1@ INDI\n1 FAMS @F1@\n1 FAMS @F2@\n1 FAMS @F3@\n0 @I2@ INDI\n1 FAMS @F1@\n1 FAMS @F3@\n"
+                 "0 @I3@ INDI\n1 FAMS @F2@\n0 @I4@ INDI\n0 @I5@ INDI\n"
+                 "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I4@\n0 @F2@ FAM\n1 HUSB @I1@\n1 WIFE @I3@\n"
+                 "0 @F3@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I5@\n1 CHIL @I4@\n"));
+    EXPECT_EQ(idsOf(data.spouses(1)), "2 3");
+    EXPECT_EQ(idsOf(data.children(1)), "4 5");
+    EXPECT_EQ(idsOf(data.spouses(3)), "1");
+    EXPECT_EQ(data.coupleLinks(1).size(), 3U);
+}
+
+TEST(Relations, aCoupleOfOneSexStandsByItsPlaceInTheRecord) {
+    const std::string persons =
+        "0 @I1@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @I2@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @I3@ INDI\n1 FAMC @F1@\n";
+    const auto parents = [&persons](const std::string& family) {
+        const GedcomData data = read(document(std::string(persons).append("0 @F1@ FAM\n").append(family)));
+        EXPECT_EQ(idsOf(data.spouses(1)), "2") << family;
+        EXPECT_EQ(idsOf(data.spouses(2)), "1") << family;
+        return std::to_string(data.person(3).father)
+            .append(" ")
+            .append(std::to_string(data.person(3).mother));
+    };
+    EXPECT_EQ(parents("1 WIFE @I1@\n1 WIFE @I2@\n"), "1 2");
+    EXPECT_EQ(parents("1 WIFE @I2@\n1 WIFE @I1@\n"), "2 1");
+    EXPECT_EQ(parents("1 HUSB @I2@\n1 HUSB @I1@\n"), "2 1");
+    EXPECT_EQ(parents("1 WIFE @I1@\n1 HUSB @I2@\n"), "2 1");
+    EXPECT_EQ(parents("1 HUSB @I1@\n1 WIFE @I2@\n"), "1 2");
+}
+
+TEST(Relations, aThirdPartnerIsLeftOutAndTold) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 HUSB @I3@\n1 WIFE @I2@\n"));
+    EXPECT_EQ(data.family(1).husband, 1U);
+    EXPECT_EQ(data.family(1).wife, 2U);
+    EXPECT_EQ(linesTold(data, DiagnosticKind::tooManyPartners), "13");
+}
+
+TEST(Relations, nobodyIsTheirOwnSpouse) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I1@\n"));
+    EXPECT_EQ(idsOf(data.spouses(1)), "");
+    EXPECT_EQ(linesTold(data, DiagnosticKind::samePartners), "10");
+}
+
+TEST(Relations, oneSidedLinksAreReadFromTheirSide) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n0 @I4@ INDI\n1 FAMC @F1@\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I3@\n"));
+    EXPECT_EQ(idsOf(data.spouses(1)), "");
+    EXPECT_EQ(idsOf(data.spouses(2)), "1");
+    EXPECT_EQ(idsOf(data.children(2)), "3");
+    EXPECT_EQ(data.person(3).father, 0U);
+    EXPECT_EQ(data.person(4).father, 1U);
+}
+
+TEST(Relations, aFamilyMayHaveOneParent) {
+    const GedcomData data = read(document(
+        "0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMC @F1@\n0 @F1@ FAM\n1 WIFE @I1@\n1 CHIL @I2@\n"));
+    EXPECT_EQ(data.person(2).father, 0U);
+    EXPECT_EQ(data.person(2).mother, 1U);
+    EXPECT_EQ(idsOf(data.spouses(1)), "");
+    EXPECT_EQ(idsOf(data.children(1)), "2");
+}
+
+TEST(Relations, circlesAreData) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMC @F1@\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I1@\n1 CHIL @I1@\n"));
+    EXPECT_EQ(data.person(1).father, 1U);
+    EXPECT_EQ(idsOf(data.children(1)), "1");
+}
+
+TEST(Relations, deathBurialCremationAndProbateMeanDead) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 DEAT\n0 @I2@ INDI\n1 BURI\n0 @I3@ INDI\n1 CREM\n0 @I4@ INDI\n1 PROB\n0 "
+                      "@I5@ INDI\n1 BIRT Y\n"
+                      "0 @I6@ INDI\n1 NO DEAT\n0 @I7@ INDI\n1 EVEN\n2 DEAT\n"));
+    std::string dead;
+    for (const Person& person : data.persons()) dead.push_back(person.dead ? '+' : '-');
+    EXPECT_EQ(dead, "++++---");
+}
+
+TEST(Relations, theFirstEventWithADateGivesIt) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 BIRT\n2 PLAC here\n1 BIRT\n2 DATE 1801\n1 BIRT\n2 DATE 1802\n1 DEAT\n2 "
+                      "DATE 1870\n2 SOUR x\n3 DATE 1999\n"));
+    EXPECT_EQ(data.person(1).birth.year, 1801);
+    EXPECT_EQ(data.person(1).death.year, 1870);
+}
+
+TEST(Relations, aPhraseStandsInForAMissingDate) {
+    const GedcomData data = read(
+        document7("0 @I1@ INDI\n1 BIRT\n2 DATE\n3 PHRASE on a Sunday\n1 DEAT\n2 DATE 1900\n3 PHRASE x\n"));
+    EXPECT_EQ(displayYear(data.person(1).birth), "on a Sunday");
+    EXPECT_EQ(displayYear(data.person(1).death), "1900");
+}
+
+TEST(Relations, divorceEndsAMarriageUntilTheNext) {
+    const GedcomData data =
+        read(document("0 @F1@ FAM\n1 MARR\n2 DATE 1900\n1 DIV\n0 @F2@ FAM\n1 MARR\n1 DIV\n1 MARR\n0 @F3@ "
+                      "FAM\n1 DIV\n1 MARR\n2 DATE 1910\n"
+                      "0 @F4@ FAM\n1 MARR\n0 @F5@ FAM\n1 DIV N\n0 @F6@ FAM\n1 MARR\n1 DIV\n1 MARR\n1 DIV\n"));
+    std::string ended;
+    for (const Family& family : data.families()) ended.push_back(family.divorced ? '+' : '-');
+    EXPECT_EQ(ended, "+-+--+");
+    EXPECT_EQ(data.family(1).marriage.year, 1900);
+    EXPECT_TRUE(data.family(4).married);
+    EXPECT_FALSE(data.family(5).married);
+    EXPECT_EQ(data.familyByXref("F3"), 3U);
+}
+
+TEST(Relations, idsOutsideTheFileThrow) {
+    const GedcomData data = read(document("0 @I1@ INDI\n"));
+    EXPECT_THROW(data.person(0), std::out_of_range);
+    EXPECT_THROW(data.person(2), std::out_of_range);
+    EXPECT_THROW(data.family(1), std::out_of_range);
+    EXPECT_THROW(data.spouses(2), std::out_of_range);
+}
+
+}  // namespace
+}  // namespace olvane::gedcom::test
