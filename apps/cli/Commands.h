@@ -1,0 +1,40 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <cli/LayoutRun.h>
+
+namespace olvane::cli {
+
+// What the user asked for. Each run... does one subcommand and answers the exit status.
+// Fails: throws UsageError; whatever else goes wrong passes on as it is.
+
+struct PeopleOptions {
+    std::string file;
+    std::vector<std::string> words;
+};
+
+struct LayoutOptions {
+    std::string file;
+    std::string focus;
+    LayoutRequest request;
+};
+
+struct DrawOptions {
+    std::string file;
+    std::string focus;
+    std::string output;
+    LayoutRequest request;
+    std::string theme = "light";
+    std::string title;  // empty for one made of the focus's name
+};
+
+int runPeople(const PeopleOptions& options);
+int runLayout(const LayoutOptions& options);
+int runDraw(const DrawOptions& options);
+
+}  // namespace olvane::cli

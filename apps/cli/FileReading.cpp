@@ -1,0 +1,41 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Reading with a person in front: what is wrong in a file goes to stderr, and the rest is used.
+
+#include <cli/FileReading.h>
+
+#include <iostream>
+
+#include <olvane/gedcom/GedcomReader.h>
+
+#include <cli/UsageError.h>
+
+namespace olvane::cli {
+
+namespace {
+
+constexpr std::size_t kPerKind = 10;
+
+void report(const gedcom::GedcomData& data) {
+    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
+        if (diagnostic.severity == gedcom::Severity::note) continue;
+        std::cerr << gedcom::formatDiagnostic(diagnostic) << '\n';
+    }
+}
+
+}  // namespace
+
+gedcom::GedcomData readFile(const std::string& path) {
+    try {
+        gedcom::ReadOptions options;
+        options.diagnosticsPerKind = kPerKind;
+        gedcom::GedcomData data = gedcom::readGedcomFile(path, options);
+        report(data);
+        return data;
+    } catch (const gedcom::GedcomError& error) {
+        throw UsageError(std::string(error.what()) + " (a GEDCOM file is needed, .ged or .gdz)");
+    }
+}
+
+}  // namespace olvane::cli

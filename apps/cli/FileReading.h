@@ -1,0 +1,16 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+
+#include <olvane/gedcom/GedcomData.h>
+
+namespace olvane::cli {
+
+// Reads a GEDCOM file and reports on stderr, by file and line, what was wrong in it: errors and warnings, not
+// notes. Fails: throws UsageError with a hint where there is nothing to read.
+gedcom::GedcomData readFile(const std::string& path);
+
+}  // namespace olvane::cli

@@ -1,0 +1,34 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/layouter/TreeSize.h>
+
+namespace olvane::cli {
+
+enum class View : std::uint8_t { family, pedigree };
+
+// The form of the boxes: tall ones as hosts draw them, or wide ones, which keep a sideways chart low.
+enum class BoxForm : std::uint8_t { tall, wide };
+
+struct LayoutRequest {
+    View view = View::family;
+    int generations = 5;  // columns of a pedigree, the focus's own included
+    BoxForm boxes = BoxForm::tall;
+    // Relatives that a family view leaves out, by the engine's option keys.
+    std::vector<std::string> keysOff;
+};
+
+TreeSize sizeOf(BoxForm boxes);
+
+// The result text of one layout. Safe to call on several threads with the same data.
+// Fails: passes on what the engine throws; an id that is no person throws std::out_of_range.
+std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
+
+}  // namespace olvane::cli

@@ -1,0 +1,353 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Draws the boxes. A tall box has the silhouette on top and centred lines below it; a wide one, as sideways
+// pictures use, has the silhouette at the left and lines beside it. Names take the largest of a few sizes in
+// which no word has to be cut; only when the smallest does not do are words cut and lines shortened.
+
+#include <olvane/draw/BoxArtInternal.h>
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+#include <vector>
+
+#include <olvane/draw/SvgTextInternal.h>
+#include <olvane/draw/TextFitInternal.h>
+
+namespace olvane::draw {
+
+namespace {
+
+// All in px.
+constexpr double kInset = 7;  // from the border to any text
+constexpr double kSilhouetteWidth = 44;
+constexpr double kSilhouetteHeight = 40;
+constexpr double kYearsSize = 10.5;
+constexpr double kYearsPitch = 14;
+constexpr double kBadgeHeight = 15;
+constexpr double kBadgeSize = 10;
+constexpr double kFocusBorder = 4;
+constexpr std::array<double, 4> kNameSizes = {13, 12, 11, 10};
+
+bool isWide(const Box& box) {
+    return box.width > box.height;
+}
+
+// What a box leaves for text.
+struct TextRoom {
+    double x = 0;  // anchor of each line
+    double width = 0;
+    double top = 0;
+    double bottom = 0;
+    bool centred = true;
+};
+
+TextRoom textRoomOf(const Box& box) {
+    if (isWide(box)) {
+        const double left = kInset + kSilhouetteWidth + kInset;
+        return {left, box.width - left - kInset, 4, box.height - 5, false};
+    }
+    return {box.width / 2, box.width - 2 * kInset, 55, box.height - 6, true};
+}
+
+struct NameLine {
+    std::string text;
+    bool isSurname = false;
+};
+
+struct NameBlock {
+    std::vector<NameLine> lines;
+    double size = 0;
+    double pitch() const { return size + 3; }
+    double height() const { return static_cast<double>(lines.size()) * pitch(); }
+};
+
+void appendFitted(NameBlock& block, const FittedText& fitted, bool isSurname) {
+    for (const std::string& line : fitted.lines) block.lines.push_back({line, isSurname});
+}
+
+// Both names at one size; whole says that nothing was cut.
+struct NameTrial {
+    NameBlock block;
+    bool whole = false;
+};
+
+NameTrial tryNameSize(const PersonLabel& label, double size, const TextRoom& room, double height) {
+    const std::string given = cleanText(label.given);
+    const std::string surname = cleanText(label.surname);
+    const Font font{size, true};
+    NameTrial trial;
+    trial.block.size = size;
+    const auto most = static_cast<std::size_t>(std::max(2.0, height / trial.block.pitch()));
+    const std::size_t surnameNeeds = fitText(surname, font, room.width, most).lines.size();
+    const std::size_t reserved =
+        surname.empty() ? 0 : std::min<std::size_t>(surnameNeeds, std::max<std::size_t>(1, most / 2));
+    const FittedText first = fitText(given, font, room.width, most - reserved);
+    const FittedText second = fitText(surname, font, room.width, most - first.lines.size());
+    trial.whole = !first.shortened && !first.wordBroken && !second.shortened && !second.wordBroken;
+    appendFitted(trial.block, label.surnameFirst ? second : first, label.surnameFirst);
+    appendFitted(trial.block, label.surnameFirst ? first : second, !label.surnameFirst);
+    return trial;
+}
+
+NameBlock nameBlockOf(const PersonLabel& label, const TextRoom& room, double height) {
+    NameTrial trial;
+    for (const double size : kNameSizes) {
+        trial = tryNameSize(label, size, room, height);
+        if (trial.whole) return trial.block;
+    }
+    return trial.block;
+}
+
+std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& room) {
+    const Font font{kYearsSize, false};
+    std::vector<std::string> parts;
+    if (!label.birth.empty()) parts.push_back("* " + cleanText(label.birth));
+    if (!label.death.empty()) parts.push_back("\xE2\x80\xA0 " + cleanText(label.death));
+    if (parts.size() == 2) {
+        const std::string both = parts[0] + "  " + parts[1];
+        if (textWidth(both, font) <= room.width) return {both};
+    }
+    for (std::string& part : parts) part = fitLine(part, font, room.width);
+    return parts;
+}
+
+void appendTextLine(std::string& svg, double x, double y, std::string_view text,
+                    std::string_view attributes) {
+    svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\"";
+    svg += attributes;
+    if (runsRightToLeft(text)) svg += " direction=\"rtl\"";
+    svg += ">" + escaped(text) + "</text>\n";
+}
+
+std::string anchorAttribute(const TextRoom& room, std::string_view text) {
+    if (room.centred) return " text-anchor=\"middle\"";
+    return runsRightToLeft(text) ? " text-anchor=\"end\"" : "";
+}
+
+void appendNames(std::string& svg, const NameBlock& block, const TextRoom& room, double top,
+                 const DrawingTheme& theme) {
+    double y = top + block.size;
+    for (const NameLine& line : block.lines) {
+        appendTextLine(svg, room.x, y, line.text,
+                       anchorAttribute(room, line.text) + " font-weight=\"bold\" font-size=\"" +
+                           px(block.size) + "\" fill=\"" + std::string(theme.text) + "\"");
+        y += block.pitch();
+    }
+}
+
+void appendYears(std::string& svg, const std::vector<std::string>& lines, const TextRoom& room,
+                 double lastBaseline, const DrawingTheme& theme) {
+    double y = lastBaseline - kYearsPitch * (static_cast<double>(lines.size()) - 1);
+    for (const std::string& line : lines) {
+        appendTextLine(svg, room.x, y, line,
+                       std::string(room.centred ? " text-anchor=\"middle\"" : "") + " font-size=\"" +
+                           px(kYearsSize) + "\" fill=\"" + std::string(theme.quietText) + "\"");
+        y += kYearsPitch;
+    }
+}
+
+// Names in the middle of what the years leave.
+void appendTexts(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+    const TextRoom room = textRoomOf(box);
+    const std::vector<std::string> years = yearLinesOf(label, room);
+    const double namesBottom =
+        room.bottom - kYearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : 2);
+    const double namesHeight = namesBottom - room.top;
+    const NameBlock names = nameBlockOf(label, room, namesHeight);
+    appendNames(svg, names, room, room.top + std::max(0.0, (namesHeight - names.height()) / 2), theme);
+    appendYears(svg, years, room, room.bottom - 3, theme);
+}
+
+// Square corners for men, round ones for women, in between for everybody else.
+double cornerOf(LabelSex sex) {
+    switch (sex) {
+        case LabelSex::male:
+            return 3;
+        case LabelSex::female:
+            return 18;
+        case LabelSex::other:
+            break;
+    }
+    return 9;
+}
+
+std::string_view silhouetteOf(LabelSex sex) {
+    switch (sex) {
+        case LabelSex::male:
+            return "olvane-man";
+        case LabelSex::female:
+            return "olvane-woman";
+        case LabelSex::other:
+            break;
+    }
+    return "olvane-person";
+}
+
+void appendFrame(std::string& svg, const Box& box, LabelSex sex, const DrawingTheme& theme) {
+    const BoxColours& colours = theme.coloursOf(sex);
+    const double corner = cornerOf(sex);
+    svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" + px(corner) +
+           "\" fill=\"" + std::string(colours.fill) + "\" stroke=\"" +
+           std::string(box.isFocus ? theme.focus : colours.border) + "\" stroke-width=\"" +
+           px(box.isFocus ? kFocusBorder : 1.4) + "\"/>\n";
+    if (!box.isFocus) return;
+    // A second, thin frame outside tells the focus where colours are lost.
+    svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
+           "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.focus) +
+           "\" stroke-width=\"1.4\"/>\n";
+}
+
+void appendSilhouette(std::string& svg, const Box& box, LabelSex sex, const DrawingTheme& theme) {
+    const BoxColours& colours = theme.coloursOf(sex);
+    const double x = isWide(box) ? kInset : (box.width - kSilhouetteWidth) / 2;
+    const double y = isWide(box) ? (box.height - kSilhouetteHeight) / 2 : 11;
+    svg += "<use href=\"#" + std::string(silhouetteOf(sex)) + "\" x=\"" + px(x) + "\" y=\"" + px(y) +
+           "\" color=\"" + std::string(colours.silhouette) + "\"/>\n";
+}
+
+std::string counted(int count, const char* one, const char* many) {
+    return std::to_string(count) + " " + (count == 1 ? one : many);
+}
+
+std::string hiddenSentence(const PersonLabel& label) {
+    std::string list;
+    const auto add = [&list](const std::string& part) { list += (list.empty() ? "" : ", ") + part; };
+    const HiddenRelatives hidden = label.hidden.value_or(HiddenRelatives());
+    if (hidden.parents > 0) add(counted(hidden.parents, "parent", "parents"));
+    if (hidden.spouses > 0) add(counted(hidden.spouses, "spouse", "spouses"));
+    if (hidden.children > 0) add(counted(hidden.children, "child", "children"));
+    if (!list.empty()) return "Not shown: " + list;
+    return label.hidden ? "Has relatives who stand elsewhere in this picture"
+                        : "Has relatives who are not shown";
+}
+
+std::string hiddenMark(const PersonLabel& label) {
+    const HiddenRelatives hidden = label.hidden.value_or(HiddenRelatives());
+    const int count = hidden.parents + hidden.spouses + hidden.children;
+    return count > 0 ? "+" + std::to_string(count) : "+";
+}
+
+std::string repeatSentence(const Box& box) {
+    return "Stands in " + std::to_string(box.repeatCount) + " boxes, all marked " +
+           std::to_string(box.repeatNumber);
+}
+
+// A pill in an upper corner with a title of its own.
+void appendBadge(std::string& svg, double x, double width, const std::string& text, const std::string& title,
+                 const DrawingTheme& theme, bool hollow) {
+    const std::string fill(hollow ? theme.page : theme.badge);
+    const std::string ink(hollow ? theme.text : theme.badgeText);
+    svg += "<g><title>" + escaped(title) + "</title>\n<rect x=\"" + px(x) + "\" y=\"6\" width=\"" +
+           px(width) + "\" height=\"" + px(kBadgeHeight) + "\" rx=\"7.5\" fill=\"" + fill + "\" stroke=\"" +
+           std::string(theme.badge) + "\"/>\n";
+    appendTextLine(svg, x + width / 2, 6 + kBadgeHeight - 4, text,
+                   " text-anchor=\"middle\" font-weight=\"bold\" font-size=\"" + px(kBadgeSize) +
+                       "\" fill=\"" + ink + "\"");
+    svg += "</g>\n";
+}
+
+double badgeWidth(const std::string& text) {
+    return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9);
+}
+
+void appendHiddenBadge(std::string& svg, const Box& box, const PersonLabel& label,
+                       const DrawingTheme& theme) {
+    if (!box.record->hasHiddenRelatives) return;
+    const std::string text = hiddenMark(label);
+    const double width = badgeWidth(text);
+    appendBadge(svg, box.width - width - 6, width, text, hiddenSentence(label), theme, false);
+}
+
+void appendRepeatBadge(std::string& svg, const Box& box, const DrawingTheme& theme) {
+    if (box.repeatNumber == 0) return;
+    const std::string text = "=" + std::to_string(box.repeatNumber);
+    appendBadge(svg, 6, badgeWidth(text), text, repeatSentence(box), theme, true);
+}
+
+std::string titleOf(const Box& box, const PersonLabel& label) {
+    std::string title = fullName(label);
+    if (!label.living && !label.birth.empty()) title += ", * " + label.birth;
+    if (!label.living && !label.death.empty()) title += ", \xE2\x80\xA0 " + label.death;
+    if (box.isFocus) title += " (focus of this picture)";
+    if (box.repeatNumber > 0) title += ". " + repeatSentence(box);
+    if (box.record->hasHiddenRelatives) title += ". " + hiddenSentence(label);
+    return title;
+}
+
+void openBox(std::string& svg, const Box& box, const std::string& title) {
+    svg += "<g role=\"img\" transform=\"translate(" + px(box.x) + " " + px(box.y) + ")\"><title>" +
+           escaped(title) + "</title>\n";
+}
+
+// What is left of a label when it must not be told.
+PersonLabel shownLabel(const PersonLabel& label) {
+    if (!label.living) {
+        PersonLabel shown = label;
+        if (shown.given.empty() && shown.surname.empty()) shown.given = "?";
+        return shown;
+    }
+    PersonLabel shown;
+    shown.given = "Living";
+    shown.living = true;
+    return shown;
+}
+
+}  // namespace
+
+std::string fullName(const PersonLabel& label) {
+    if (label.living) return "Living";
+    const std::string& first = label.surnameFirst ? label.surname : label.given;
+    const std::string& second = label.surnameFirst ? label.given : label.surname;
+    if (first.empty() && second.empty()) return "Name not known";
+    return first.empty() || second.empty() ? first + second : first + " " + second;
+}
+
+void appendBoxDefinitions(std::string& svg) {
+    svg +=
+        "<defs>\n"
+        "<g id=\"olvane-man\" fill=\"currentColor\"><circle cx=\"22\" cy=\"10.5\" r=\"9\"/>"
+        "<path d=\"M4 40v-5c0-8 5-12.5 11-13.5l7 5 7-5c6 1 11 5.5 11 13.5v5z\"/></g>\n"
+        "<g id=\"olvane-woman\" fill=\"currentColor\"><path d=\"M22 1c-8 0-11.5 5.5-11.5 12 0 5.5-.5 8.5-3.5 "
+        "11.5 4 1.5 8 1 10.5-.5v3h9v-3c2.5 1.5 6.5 2 10.5 .5-3-3-3.5-6-3.5-11.5 0-6.5-3.5-12-11.5-12z\"/>"
+        "<path d=\"M6 40c0-8 5-12.5 11-13.5h10c6 1 11 5.5 11 13.5z\"/></g>\n"
+        "<g id=\"olvane-person\" fill=\"none\" stroke=\"currentColor\" stroke-width=\"2.5\"><circle "
+        "cx=\"22\" "
+        "cy=\"10.5\" r=\"8\"/><path d=\"M5.5 38.7v-3c0-8 7-12 16.5-12s16.5 4 16.5 12v3z\"/></g>\n"
+        "</defs>\n";
+}
+
+void appendPersonBox(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+    const PersonLabel shown = shownLabel(label);
+    openBox(svg, box, titleOf(box, label));
+    appendFrame(svg, box, shown.sex, theme);
+    appendSilhouette(svg, box, shown.sex, theme);
+    appendTexts(svg, box, shown, theme);
+    appendRepeatBadge(svg, box, theme);
+    appendHiddenBadge(svg, box, label, theme);
+    svg += "</g>\n";
+}
+
+void appendPlaceholderBox(std::string& svg, const Box& box, const std::string& childName,
+                          const DrawingTheme& theme) {
+    const char* invitation = box.record->addNode->male ? "add father" : "add mother";
+    const LabelSex sex = box.record->addNode->male ? LabelSex::male : LabelSex::female;
+    openBox(svg, box, std::string(invitation) + " of " + childName);
+    svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" +
+           px(cornerOf(sex)) + "\" fill=\"" + std::string(theme.page) + "\" stroke=\"" +
+           std::string(theme.placeholder) + "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n";
+    const double middleX = isWide(box) ? kInset + kSilhouetteWidth / 2 : box.width / 2;
+    const double middleY = isWide(box) ? box.height / 2 : box.height / 2 - 18;
+    svg += "<path d=\"M" + px(middleX - 11) + " " + px(middleY) + "h22m-11 -11v22\" stroke=\"" +
+           std::string(theme.placeholder) +
+           "\" stroke-width=\"3\" stroke-linecap=\"round\" fill=\"none\"/>\n";
+    const TextRoom room = textRoomOf(box);
+    const double baseline = isWide(box) ? box.height / 2 + 4 : box.height / 2 + 22;
+    appendTextLine(svg, room.x, baseline, invitation,
+                   anchorAttribute(room, invitation) + " font-size=\"12\" fill=\"" +
+                       std::string(theme.quietText) + "\"");
+    svg += "</g>\n";
+}
+
+}  // namespace olvane::draw
