@@ -9,8 +9,9 @@
 
 namespace olvane::cli {
 
-// Reads a GEDCOM file and reports on stderr, by file and line, what was wrong in it: errors and warnings, not
-// notes. Fails: throws UsageError with a hint where there is nothing to read.
+// Reads a GEDCOM file and reports on stderr, by file and line, what was wrong in it: errors and warnings, but
+// not notes.
+// Fails: throws UsageError with a hint where there is nothing to read.
 gedcom::GedcomData readFile(const std::string& path);
 
 }  // namespace olvane::cli

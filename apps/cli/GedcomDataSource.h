@@ -11,8 +11,7 @@ namespace olvane::cli {
 // A GEDCOM file as the engine's data source: the person of id n is the n-th of the file.
 //
 // Holds: refers to the data, which must outlive it. Nothing is kept between questions, so several threads may
-// each
-//        have one around the same data.
+//        each have one around the same data.
 class GedcomDataSource final : public OlvaneViewerManagerWrapProtocol {
 public:
     explicit GedcomDataSource(const gedcom::GedcomData& data) : data_(data) {}

@@ -9,8 +9,8 @@
 namespace olvane::cli {
 
 // Writes a whole file or nothing: first beside its place, then moved there, so that a failure leaves what was
-// there before. "-" is the standard output; a device or pipe is written straight. Fails: throws UsageError;
-// no partial file is left.
+// there before. "-" is the standard output; a device or pipe is written straight.
+// Fails: throws UsageError; no partial file is left.
 void writeOutput(const std::string& path, std::string_view content);
 
 // Writes to the standard output and makes sure that it arrived.

@@ -6,8 +6,9 @@
 //
 //     parents' tap    one segment that ends on the trunk at the joint; held by a parent
 //     child's run     along the trunk from the joint to beside the child, then across to the child; held by
-//     the child parents' run    in a sideways layout: from the marriage line, along the trunk, to the child;
-//     held by the child
+//                     the child
+//     parents' run    sideways only: from the marriage line to the trunk, along it, then across to the child;
+//                     held by the child
 //
 // All pieces that name the same joint are one family. A segment of marriage runs from box to box, across the
 // direction of the taps. Sideways layouts are read with x and y exchanged, so one recognition serves both.

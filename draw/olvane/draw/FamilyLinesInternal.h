@@ -14,7 +14,7 @@ namespace olvane::draw {
 // A line that joins a family's trunk to a parent (or to the parents' marriage line) or to a child.
 //
 // Units: points. at counts along the trunk, end across it: x and y in a downward layout, y and x in a
-// sideways one.
+//        sideways one.
 struct FamilyTap {
     int at = 0;
     int end = 0;

@@ -13,7 +13,8 @@ namespace olvane::draw {
 // they run in. A trunk that meets no other keeps its place. Among the orders of the tracks one with few
 // crossings is taken.
 //
-// Units: points across the trunk. Holds: the answer has one place for each family.
+// Units: points across the trunk.
+// Holds: the answer has one place for each family.
 std::vector<double> separateTracks(const std::vector<FamilyLine>& families,
                                    const std::vector<LayoutRecord>& records, LineDirection direction,
                                    const BoxSize& box);

@@ -18,8 +18,7 @@ namespace olvane::draw {
 // What a picture shows: a layout, and what its host knows of the persons in it.
 //
 // Holds: the questions are asked for persons of the records and for the children of add-nodes, never for an
-// add-node,
-//        and must give the same answer to the same question. labelOf is required.
+//        add-node, and must give the same answer to the same question. labelOf is required.
 // Fails: whatever a question throws passes on.
 struct DrawingContent {
     std::vector<LayoutRecord> records;
@@ -55,8 +54,7 @@ std::string fullName(const PersonLabel& label);
 // used.
 //
 // Holds: the same content gives the same bytes. Texts stay texts; they are measured and fit into their boxes.
-// Nothing
-//        in a label or title becomes markup. A picture without records is a page that says so.
+//        Nothing in a label or title becomes markup. A picture without records is a page that says so.
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options);
 
 }  // namespace olvane::draw

@@ -6,9 +6,8 @@
 //     17:0:-110:0:40,-15,40,0|40,0,82,0|;-1:-40:-220:0::M:17;
 //
 // A record is id, x, y and flag, each closed by ":", then segments, each closed by "|", then for a negative
-// id
-// ":", the sex, ":" and the child, and last ";". There is one reader, which stops at the first byte that does
-// not fit; the strict form turns that into an exception, the lenient one hands out what came before.
+// id ":", the sex, ":" and the child, and last ";". There is one reader, which stops at the first byte that
+// does not fit; the strict form turns that into an exception, the lenient one hands out what came before.
 
 #include <olvane/host/LayoutText.h>
 

@@ -35,8 +35,8 @@ struct AddNodeSuffix {
 
 // One box of a layout.
 //
-// Units: points; x grows right, y grows down. (x, y) is the box's upper-left corner; its size is not in the
-// text. Holds: addNode is set exactly when id is negative.
+// Units: points; x grows right, y grows down. (x, y) is the upper-left corner; the size is not in the text.
+// Holds: addNode is set exactly when id is negative.
 struct LayoutRecord {
     std::int64_t id = 0;
     int x = 0;
