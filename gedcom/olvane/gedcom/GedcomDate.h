@@ -26,6 +26,7 @@ enum class DateMark : std::uint8_t {
 // Lifetime: written is a view into the text of the GedcomData that the date came from.
 struct GedcomDate {
     std::string_view written;
+    std::uint32_t line = 0;  // of its DATE in the file, from 1; 0 for a date that is from no file
     std::int16_t year = 0;
     std::int16_t lastYear = 0;
     std::uint8_t month = 0;

@@ -386,6 +386,7 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
         return;
     }
     date = parseGedcomDate(value);
+    date.line = line.number;
     if (date.isRead() || value.front() == '(') return;
     diagnostics_.add(DiagnosticKind::unreadableDate, Severity::note, line.number,
                      "a date that cannot be read", "shown as written", value);
@@ -393,6 +394,7 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
 
 void RecordReader::readDatePhrase(const GedcomLine& line) {
     openDate_->written = keptValue(line);
+    openDate_->line = line.number;
     openDate_ = nullptr;
 }
 

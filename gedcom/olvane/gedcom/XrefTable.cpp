@@ -5,12 +5,13 @@
 // list, which keeps neighbours of the file neighbours in memory; a million random places would cost more than
 // all the rest of the reading. Everything else, and numbers too far ahead for a list to be filled, goes by
 // hash with open addressing. An identifier stays where it was first put, so one looks in the list and then by
-// hash.
+// hash. The hash has a seed that no file can know; nothing that is read depends on it.
 
 #include "olvane/gedcom/XrefTableInternal.h"
 
 #include <algorithm>
-#include <functional>
+#include <cstring>
+#include <random>
 
 #include "olvane/gedcom/LineScannerInternal.h"
 
@@ -26,15 +27,32 @@ bool isDigit(char c) {
     return c >= '0' && c <= '9';
 }
 
-std::uint32_t hashOf(std::string_view text) {
-    const std::uint64_t hash = std::hash<std::string_view>{}(text);
-    return static_cast<std::uint32_t>(hash ^ (hash >> 32));
+std::uint64_t mixed(std::uint64_t a, std::uint64_t b) {
+    __extension__ using Wide = unsigned __int128;
+    const Wide product = static_cast<Wide>(a) * b;
+    return static_cast<std::uint64_t>(product) ^ static_cast<std::uint64_t>(product >> 64);
+}
+
+std::uint64_t randomSeed() {
+    std::random_device device;
+    return std::uint64_t{device()} << 32 | device();
 }
 
 }  // namespace
 
-XrefTable::XrefTable() : entries_(1), buckets_(kFirstBuckets, 0) {
+XrefTable::XrefTable() : entries_(1), buckets_(kFirstBuckets, 0), seed_(randomSeed()) {
     series_.reserve(kMostSeries);
+}
+
+std::uint32_t XrefTable::hashOf(std::string_view text) const {
+    constexpr std::uint64_t kFactor = 0x9E3779B97F4A7C15U;
+    std::uint64_t hash = seed_ ^ text.size();
+    for (std::size_t at = 0; at < text.size(); at += sizeof hash) {
+        std::uint64_t piece = 0;
+        std::memcpy(&piece, text.data() + at, std::min(sizeof piece, text.size() - at));
+        hash = mixed(hash ^ piece, seed_ ^ kFactor);
+    }
+    return static_cast<std::uint32_t>(hash ^ (hash >> 32));
 }
 
 XrefTable::Serial XrefTable::serialOf(std::string_view xref) {

@@ -57,6 +57,7 @@ private:
     };
 
     static Serial serialOf(std::string_view xref);
+    std::uint32_t hashOf(std::string_view text) const;
     std::size_t seriesOf(const Serial& serial) const;
     XrefPlace findInSeries(const Serial& serial) const;
     XrefPlace findByHash(std::string_view xref) const;
@@ -69,6 +70,7 @@ private:
     std::vector<Series> series_;
     std::vector<XrefPlace> buckets_;  // size is a power of two, at most half of them taken; 0 is free
     std::size_t hashed_ = 0;
+    std::uint64_t seed_;
 };
 
 // The identifier without its @, if it has them.

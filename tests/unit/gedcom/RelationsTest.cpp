@@ -178,6 +178,7 @@ TEST(Relations, theFirstEventWithADateGivesIt) {
         read(document("0 @I1@ INDI\n1 BIRT\n2 PLAC here\n1 BIRT\n2 DATE 1801\n1 BIRT\n2 DATE 1802\n1 DEAT\n2 "
                       "DATE 1870\n2 SOUR x\n3 DATE 1999\n"));
     EXPECT_EQ(data.person(1).birth.year, 1801);
+    EXPECT_EQ(data.person(1).birth.line, 10U);
     EXPECT_EQ(data.person(1).death.year, 1870);
 }
 
