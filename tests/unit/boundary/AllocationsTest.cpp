@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Memory that runs out at each allocation of a request in turn. Inside the guarded region the text written so
+// far comes back; before and behind it std::bad_alloc reaches the caller. Nothing is ever left behind.
+
+#include <cstdint>
+#include <memory>
+#include <new>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include <olvane/boundary/FamilyViewLayout.h>
+#include <support/FamilyText.h>
+#include <unit/boundary/AllocationCountdown.h>
+#include <unit/boundary/Request.h>
+
+namespace {
+
+using support::CaseFile;
+using support::family;
+using unit::AllocationFailure;
+using unit::allocationsMade;
+using unit::allocationsOutstanding;
+
+typedef std::shared_ptr<OlvaneViewerManagerWrapProtocol> Source;
+
+struct Attempt {
+    std::string text;
+    bool passedOn = false;  // std::bad_alloc came out
+    std::int64_t allocations = 0;
+    std::int64_t leftBehind = 0;  // beside the text
+};
+
+Attempt layOutWithFailureAt(std::int64_t n, const Source& source) {
+    Attempt attempt;
+    const std::int64_t madeBefore = allocationsMade();
+    const std::int64_t outstandingBefore = allocationsOutstanding();
+    {
+        std::string text;
+        try {
+            const AllocationFailure failure(n);
+            text = FamilyViewLayout("17", source);
+        } catch (const std::bad_alloc&) {
+            attempt.passedOn = true;
+        }
+        attempt.allocations = allocationsMade() - madeBefore;
+        attempt.text = text;
+        text = std::string();
+    }
+    const std::int64_t keptByAttempt = attempt.text.size() > std::string().capacity() ? 1 : 0;
+    attempt.leftBehind = allocationsOutstanding() - outstandingBefore - keptByAttempt;
+    return attempt;
+}
+
+// Allocations ahead of the guarded region: the tables and the callbacks.
+std::int64_t allocationsBeforeTheGuard(const Source& source) {
+    const std::int64_t before = allocationsMade();
+    ViewerGlue glue;
+    const olvane::HostCallbacks callbacks(glue, source);
+    return allocationsMade() - before;
+}
+
+void expectEveryAllocationMayFail(const CaseFile& told) {
+    const Source source = std::make_shared<support::CaseManager>(told);
+    const Attempt whole = layOutWithFailureAt(0, source);
+    ASSERT_LT(100u, whole.text.size());
+    ASSERT_EQ(0, whole.leftBehind);
+    const std::int64_t before = allocationsBeforeTheGuard(source);
+    int cutTexts = 0;
+    for (std::int64_t n = 1; n <= whole.allocations; ++n) {
+        const Attempt attempt = layOutWithFailureAt(n, source);
+        const bool isOutside = n <= before || n == whole.allocations;  // the last one makes the returned text
+        EXPECT_EQ(isOutside, attempt.passedOn) << "allocation " << n << " of " << whole.allocations;
+        EXPECT_EQ(0, attempt.leftBehind) << "allocation " << n;
+        EXPECT_EQ(whole.text.substr(0, attempt.text.size()), attempt.text) << "allocation " << n;
+        EXPECT_LT(attempt.text.size(), whole.text.size()) << "allocation " << n;
+        EXPECT_EQ(1, source.use_count());
+        cutTexts += attempt.text.empty() ? 0 : 1;
+    }
+    EXPECT_LT(0, cutTexts);  // some failed while records were written
+    EXPECT_EQ(whole.text, layOutWithFailureAt(0, source).text);
+}
+
+TEST(MemoryRunsOut, atAnyAllocationOfASmallFamilyAPrefixComesBackAndNothingLeaks) {
+    expectEveryAllocationMayFail(family("17+42: 5; 3+4: 17"));
+}
+
+TEST(MemoryRunsOut, atAnyAllocationOfAFamilyWithSiblingsStepChildrenAndUnknownParents) {
+    CaseFile told = family("17+42: 5 6f; 17+43; 42f: 8; 3+4: 17 18; 3: 20; 1+2: 3 22; 5+50: 51");
+    told.births[17] = "1850";
+    expectEveryAllocationMayFail(told);
+}
+
+TEST(MemoryRunsOut, forTheReturnedTextBehindTheLayoutTheFailurePassesOn) {
+    const Source source = std::make_shared<support::CaseManager>(family("17"));
+    const std::int64_t all = layOutWithFailureAt(0, source).allocations;
+    const Attempt attempt = layOutWithFailureAt(all, source);
+    EXPECT_TRUE(attempt.passedOn);
+    EXPECT_EQ(0, attempt.leftBehind);
+}
+
+TEST(MemoryRunsOut, insideTheHostItIsAFailureOfTheHostLikeAnyOther) {
+    class HostOutOfMemory : public support::CaseManager {
+    public:
+        using CaseManager::CaseManager;
+        std::int64_t motherForPersonWithID(std::int64_t) override { throw std::bad_alloc(); }
+    };
+    EXPECT_EQ("", FamilyViewLayout("17", std::make_shared<HostOutOfMemory>(family("17"))));
+}
+
+}  // namespace
