@@ -156,7 +156,7 @@ TEST(HostileInput, changedBytesAreReadOrRefused) {
                                                   random.below(60)));
                     break;
             }
-            if (bytes.empty()) bytes = "0";
+            if (bytes.empty()) bytes.assign(1, '0');
         }
         try {
             touchAll(test::read(bytes));
