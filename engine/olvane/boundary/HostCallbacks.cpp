@@ -18,6 +18,7 @@
 
 #include <cstdint>
 #include <stdexcept>
+#include <utility>
 
 namespace {
 
@@ -36,88 +37,84 @@ OlvaneViewerManagerWrapProtocol& host(const ManagerReference& manager) {
     return *manager;
 }
 
-// The host's id under a key. Ids below 1 mark synthetic persons, of whom the host is never asked.
-int hostId(const ViewerGlue& glue, int key) {
-    return stringToInt(glue.personOfKey(key));
-}
-
-// One parent's slot: the parent's id text, whose key has been written to the slot.
-struct ParentSlot {
+// A parent's key, and whether the host knows that parent.
+struct Parent {
     bool isReal;
-    std::string personText;
+    int key;
 };
 
-ParentSlot fillSlot(ViewerGlue& glue, std::int64_t answer, int& slot) {
-    const bool isReal = answer != OlvaneViewerManagerWrapProtocol::kPersonNotFound;
-    ParentSlot parent{isReal, intToString(isReal ? lowBits(answer) : ADD_PARENT_ID)};
-    slot = glue.getKeyFromPerson(parent.personText);
-    if (!isReal) --ADD_PARENT_ID;
-    return parent;
+Parent parentOf(ViewerGlue& glue, std::int64_t answer) {
+    if (answer != OlvaneViewerManagerWrapProtocol::kPersonNotFound) {
+        return Parent{true, glue.keyOfNumber(lowBits(answer))};
+    }
+    const int key = glue.keyOfNumber(ADD_PARENT_ID);
+    --ADD_PARENT_ID;
+    return Parent{false, key};
 }
 
+void registerAddNode(ViewerGlue& glue, int key, bool male, int childKey, int otherParentKey) {
+    glue.addAddNodeValue(glue.personOfKey(key), male, glue.personOfKey(childKey),
+                         glue.personOfKey(otherParentKey));
+}
+
+// Ids below 1 mark synthetic persons, of whom the host is never asked.
 void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int& father, int& mother) {
-    const std::string personText = glue.personOfKey(key);
-    const int id = stringToInt(personText);
+    const int id = glue.numberOfKey(key);
     if (id < 1) return;
-    const ParentSlot fatherSlot = fillSlot(glue, host(manager).fatherForPersonWithID(id), father);
-    const ParentSlot motherSlot = fillSlot(glue, host(manager).motherForPersonWithID(id), mother);
-    if (!fatherSlot.isReal) {
-        glue.addAddNodeValue(fatherSlot.personText, true, personText, motherSlot.personText);
-    }
-    if (!motherSlot.isReal) {
-        glue.addAddNodeValue(motherSlot.personText, false, personText, fatherSlot.personText);
-    }
+    const Parent first = parentOf(glue, host(manager).fatherForPersonWithID(id));
+    father = first.key;
+    const Parent second = parentOf(glue, host(manager).motherForPersonWithID(id));
+    mother = second.key;
+    if (!first.isReal) registerAddNode(glue, first.key, true, key, second.key);
+    if (!second.isReal) registerAddNode(glue, second.key, false, key, first.key);
 }
 
 void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, SpouseSet& spouses) {
-    const int id = hostId(glue, key);
+    const int id = glue.numberOfKey(key);
     if (id < 1) return;
     int place = 0;
     for (const std::int64_t entry : host(manager).spousesForPersonWithID(id)) {
         const int spouseId = lowBits(entry);
-        const std::string spouseText = intToString(spouseId);
-        const int spouseKey = glue.getKeyFromPerson(spouseText);
+        const int spouseKey = glue.keyOfNumber(spouseId);
         const bool preferred = host(manager).isPreferredSpouse(id, spouseId);
         const bool alive = !host(manager).isPersonDead(spouseId);
-        const std::string date = stringToString(host(manager).dateForPersonWithID(spouseId, false));
-        spouses.insert(SpouseAdapter(spouseKey, preferred, alive, date, spouseText, ++place));
+        std::string date = stringToString(host(manager).dateForPersonWithID(spouseId, false));
+        spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, std::move(date),
+                             glue.personOfKey(spouseKey), ++place);
     }
 }
 
 // An add-node has one child: the person for whom it stands.
 void getChildOfAddNode(ViewerGlue& glue, int key, ChildrenSet& children) {
-    const AddNodeValues addNode = glue.getAddNodeValue(glue.personOfKey(key));
-    if (addNode.childText.empty()) return;
-    const int childKey = glue.getKeyFromPerson(addNode.childText);
-    children.insert(ChildrenAdapter(childKey, std::string(), addNode.childText));
+    const std::string childText = glue.addNode(glue.personOfKey(key)).childText;
+    if (childText.empty()) return;
+    children.insert(ChildrenAdapter(glue.getKeyFromPerson(childText), std::string(), childText));
 }
 
 void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, ChildrenSet& children) {
-    const int id = hostId(glue, key);
+    const int id = glue.numberOfKey(key);
     if (id < 1) {
         getChildOfAddNode(glue, key, children);
         return;
     }
     int place = 0;
     for (const std::int64_t entry : host(manager).childrenForPersonWithID(id)) {
-        const int childId = lowBits(entry);
-        const std::string childText = intToString(childId);
-        const int childKey = glue.getKeyFromPerson(childText);
-        const std::string date = stringToString(host(manager).dateForPersonWithID(childId, true));
-        children.insert(ChildrenAdapter(childKey, date, childText, ++place));
+        const int childKey = glue.keyOfNumber(lowBits(entry));
+        std::string date = stringToString(host(manager).dateForPersonWithID(lowBits(entry), true));
+        children.emplace(childKey, std::move(date), glue.personOfKey(childKey), ++place);
     }
 }
 
 bool isMale(const ViewerGlue& glue, const ManagerReference& manager, int key) {
-    const int id = hostId(glue, key);
+    const int id = glue.numberOfKey(key);
     if (id >= 1) return host(manager).sexOfPersonWithID(id) == 0;
-    return glue.getAddNodeValue(glue.personOfKey(key)).male;
+    return glue.addNode(glue.personOfKey(key)).male;
 }
 
 // The writer of the result tests for an id below 0 instead. The two differ for the id 0 alone, which is
 // synthetic here and has no suffix there; hosts' parsers count on the suffix standing with negative ids only.
 bool isAddNode(const ViewerGlue& glue, int key) {
-    return key < 0 || hostId(glue, key) < 1;
+    return key < 0 || glue.numberOfKey(key) < 1;
 }
 
 }  // namespace
@@ -132,7 +129,7 @@ HostCallbacks::HostCallbacks(ViewerGlue& glue, const ManagerReference& manager)
       getChildren([&glue, &manager](int key, ChildrenSet& set) { ::getChildren(glue, manager, key, set); }),
       isMale([&glue, &manager](int key) { return ::isMale(glue, manager, key); }),
       isAddNode([&glue](int key) { return ::isAddNode(glue, key); }),
-      touchPerson([&glue](int key) { glue.personOfKey(key); }) {}
+      touchPerson([&glue](int key) { glue.numberOfKey(key); }) {}
 
 DataAdapter HostCallbacks::dataAdapter() const {
     return DataAdapter(getSpouses, getParents, getChildren, isMale, isAddNode, touchPerson);

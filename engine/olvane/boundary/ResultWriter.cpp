@@ -55,9 +55,9 @@ void appendSegments(std::string& text, TreeViewPerson& person) {
 
 void appendSexAndChild(std::string& text, const ViewerGlue& glue, const std::string& personText) {
     text += ':';
-    text += glue.getAddNodeValue(personText).male ? 'M' : 'F';
+    text += glue.addNode(personText).male ? 'M' : 'F';
     text += ':';
-    text += glue.getAddNodeValue(personText).childText;
+    text += glue.addNode(personText).childText;
 }
 
 void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text, TreeViewPerson& person) {
@@ -67,7 +67,7 @@ void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text
     updateBounds(bounds, x, y);
     appendPlaceAndFlag(text, personText, x, y, person.hasNonDisplayedRelationships);
     appendSegments(text, person);
-    if (stringToInt(personText) < 0) appendSexAndChild(text, glue, personText);
+    if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, personText);
     text += ';';
 }
 

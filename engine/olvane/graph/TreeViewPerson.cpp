@@ -15,7 +15,7 @@ TreeViewPerson::~TreeViewPerson() {
 }
 
 TreeViewPerson& TreeViewPerson::addPerson(int id, Persons& list, bool male) {
-    list.push_back(TreeViewPerson(id));
+    list.emplace_back(id);
     list.back().gender = male;
     return list.back();
 }
