@@ -4,12 +4,12 @@
 // ANSEL (ANSI/NISO Z39.47) with the additions of the GEDCOM standard: bytes above 0xA0 are letters and signs,
 // those from 0xE0 on are marks, which come before their letter, where Unicode has them behind it.
 
-#include "olvane/gedcom/AnselInternal.h"
+#include <olvane/gedcom/AnselInternal.h>
 
 #include <cstddef>
 
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -7,7 +7,7 @@
 // postponements, as in Dershowitz and Reingold, Calendrical Calculations. The French calendar uses its leap
 // years 3, 7, 11 and so on.
 
-#include "olvane/gedcom/CalendarDaysInternal.h"
+#include <olvane/gedcom/CalendarDaysInternal.h>
 
 #include <cstdint>
 

@@ -3,7 +3,7 @@
 
 // Eight-bit encodings, as the makers of the systems that they come from have published them.
 
-#include "olvane/gedcom/CodePagesInternal.h"
+#include <olvane/gedcom/CodePagesInternal.h>
 
 namespace olvane::gedcom {
 

@@ -8,7 +8,7 @@
 #include <string_view>
 #include <vector>
 
-#include "olvane/gedcom/GedcomDiagnostic.h"
+#include <olvane/gedcom/GedcomDiagnostic.h>
 
 namespace olvane::gedcom {
 

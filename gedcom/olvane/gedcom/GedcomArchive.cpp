@@ -4,9 +4,7 @@
 // GEDCOM in a zip archive (.gdz): the standard puts the text into a member named gedcom.ged, beside the media
 // files.
 
-#include "olvane/gedcom/GedcomArchiveInternal.h"
-
-#include <zip.h>
+#include <olvane/gedcom/GedcomArchiveInternal.h>
 
 #include <algorithm>
 #include <array>
@@ -14,7 +12,9 @@
 #include <cstdint>
 #include <memory>
 
-#include "olvane/gedcom/GedcomError.h"
+#include <zip.h>
+
+#include <olvane/gedcom/GedcomError.h>
 
 namespace olvane::gedcom {
 namespace {

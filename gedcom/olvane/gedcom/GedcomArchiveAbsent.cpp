@@ -3,8 +3,8 @@
 
 // Stands in for the archive reader where there is no zip library.
 
-#include "olvane/gedcom/GedcomArchiveInternal.h"
-#include "olvane/gedcom/GedcomError.h"
+#include <olvane/gedcom/GedcomArchiveInternal.h>
+#include <olvane/gedcom/GedcomError.h>
 
 namespace olvane::gedcom {
 

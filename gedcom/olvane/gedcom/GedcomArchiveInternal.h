@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-#include "olvane/gedcom/DiagnosticListInternal.h"
+#include <olvane/gedcom/DiagnosticListInternal.h>
 
 namespace olvane::gedcom {
 

@@ -3,14 +3,14 @@
 
 // Access to what was read: slices of shared lists, and names as people write them.
 
-#include "olvane/gedcom/GedcomData.h"
+#include <olvane/gedcom/GedcomData.h>
 
 #include <array>
 #include <stdexcept>
 #include <utility>
 
-#include "olvane/gedcom/UnicodeTextInternal.h"
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <olvane/gedcom/UnicodeTextInternal.h>
+#include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -10,8 +10,8 @@
 #include <string_view>
 #include <vector>
 
-#include "olvane/gedcom/GedcomDate.h"
-#include "olvane/gedcom/GedcomDiagnostic.h"
+#include <olvane/gedcom/GedcomDate.h>
+#include <olvane/gedcom/GedcomDiagnostic.h>
 
 namespace olvane::gedcom {
 

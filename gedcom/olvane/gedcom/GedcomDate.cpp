@@ -6,7 +6,7 @@
 // takes what it knows and gives up on the first word that it does not: a guess would be worse than the text
 // as it stands.
 
-#include "olvane/gedcom/GedcomDate.h"
+#include <olvane/gedcom/GedcomDate.h>
 
 #include <algorithm>
 #include <array>
@@ -14,7 +14,7 @@
 #include <initializer_list>
 #include <optional>
 
-#include "olvane/gedcom/CalendarDaysInternal.h"
+#include <olvane/gedcom/CalendarDaysInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -5,13 +5,13 @@
 // list keeps the first of each kind and counts the others; what it quotes from a file is short and fit to
 // print.
 
-#include "olvane/gedcom/GedcomDiagnostic.h"
+#include <olvane/gedcom/GedcomDiagnostic.h>
 
 #include <algorithm>
 #include <utility>
 
-#include "olvane/gedcom/DiagnosticListInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
+#include <olvane/gedcom/DiagnosticListInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -4,7 +4,7 @@
 // Reading files, apart from the rest, since not every host has a file system. A pipe has no size beforehand,
 // so the size is a guess that saves copying and no more.
 
-#include <array>
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
@@ -13,7 +13,7 @@
 #include <system_error>
 #include <utility>
 
-#include "olvane/gedcom/GedcomReader.h"
+#include <olvane/gedcom/GedcomReader.h>
 
 namespace olvane::gedcom {
 namespace {

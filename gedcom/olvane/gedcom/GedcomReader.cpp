@@ -4,19 +4,19 @@
 // From bytes to data: unpack an archive, settle the encoding, read the records, resolve the links. The text
 // stays where it was read to, and nearly everything that is kept is a view into it.
 
-#include "olvane/gedcom/GedcomReader.h"
+#include <olvane/gedcom/GedcomReader.h>
 
 #include <memory>
 #include <utility>
 
-#include "olvane/gedcom/DiagnosticListInternal.h"
-#include "olvane/gedcom/GedcomArchiveInternal.h"
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/LinkResolverInternal.h"
-#include "olvane/gedcom/RecordReaderInternal.h"
-#include "olvane/gedcom/TextEncodingInternal.h"
-#include "olvane/gedcom/TextKeeperInternal.h"
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <olvane/gedcom/DiagnosticListInternal.h>
+#include <olvane/gedcom/GedcomArchiveInternal.h>
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/LinkResolverInternal.h>
+#include <olvane/gedcom/RecordReaderInternal.h>
+#include <olvane/gedcom/TextEncodingInternal.h>
+#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
 

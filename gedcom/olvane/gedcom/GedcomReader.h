@@ -5,8 +5,8 @@
 #include <cstddef>
 #include <string>
 
-#include "olvane/gedcom/GedcomData.h"
-#include "olvane/gedcom/GedcomError.h"
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/gedcom/GedcomError.h>
 
 namespace olvane::gedcom {
 

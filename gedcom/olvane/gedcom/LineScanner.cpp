@@ -5,7 +5,7 @@
 // that of the nearest line before it with a smaller number, which for sound files is the number itself. Only
 // the four topmost depths matter to the reader, so nothing grows with the depth of a file.
 
-#include "olvane/gedcom/LineScannerInternal.h"
+#include <olvane/gedcom/LineScannerInternal.h>
 
 #include <algorithm>
 #include <cstring>

@@ -5,7 +5,7 @@
 // by the person's own FAMC, spouses and children by their own FAMS. Where only one side names the other, the
 // picture differs from either end, as the data do.
 
-#include "olvane/gedcom/LinkResolverInternal.h"
+#include <olvane/gedcom/LinkResolverInternal.h>
 
 #include <cstddef>
 #include <span>

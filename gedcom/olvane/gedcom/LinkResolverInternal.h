@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "olvane/gedcom/DiagnosticListInternal.h"
-#include "olvane/gedcom/GedcomData.h"
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <olvane/gedcom/DiagnosticListInternal.h>
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
 

@@ -4,15 +4,15 @@
 // Finding persons by what a user types. Names are folded as they are compared; a file of a million persons is
 // searched in well under a second, and nothing is kept beside the data.
 
-#include "olvane/gedcom/PersonSearch.h"
+#include <olvane/gedcom/PersonSearch.h>
 
 #include <algorithm>
 #include <charconv>
 #include <string>
 #include <system_error>
 
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 namespace olvane::gedcom {
 namespace {

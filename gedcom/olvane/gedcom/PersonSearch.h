@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "olvane/gedcom/GedcomData.h"
+#include <olvane/gedcom/GedcomData.h>
 
 namespace olvane::gedcom {
 

@@ -5,7 +5,7 @@
 // above it and the sort of record it lies in; that is all the state there is. Names and links of one record
 // lie together in lists that all records share, so a record that has few of them is small.
 
-#include "olvane/gedcom/RecordReaderInternal.h"
+#include <olvane/gedcom/RecordReaderInternal.h>
 
 #include <algorithm>
 #include <cstddef>

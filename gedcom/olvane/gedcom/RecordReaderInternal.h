@@ -8,10 +8,10 @@
 #include <string>
 #include <string_view>
 
-#include "olvane/gedcom/GedcomData.h"
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/TextKeeperInternal.h"
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
 

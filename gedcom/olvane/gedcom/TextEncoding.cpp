@@ -7,16 +7,16 @@
 // code page by whether its marks stand before letters that can bear them. The text stays as it is in the file
 // until a value is kept, because a character may be cut in two by a CONC line.
 
-#include "olvane/gedcom/TextEncodingInternal.h"
+#include <olvane/gedcom/TextEncodingInternal.h>
 
 #include <array>
 #include <cstddef>
 #include <optional>
 
-#include "olvane/gedcom/AnselInternal.h"
-#include "olvane/gedcom/CodePagesInternal.h"
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
+#include <olvane/gedcom/AnselInternal.h>
+#include <olvane/gedcom/CodePagesInternal.h>
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -4,15 +4,15 @@
 // Values on their way from the file to the records. Nearly all are plain ASCII or sound UTF-8 and cost one
 // look.
 
-#include "olvane/gedcom/TextKeeperInternal.h"
+#include <olvane/gedcom/TextKeeperInternal.h>
 
 #include <algorithm>
 #include <array>
 #include <cstddef>
 #include <functional>
 
-#include "olvane/gedcom/LineScannerInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
+#include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 namespace olvane::gedcom {
 namespace {

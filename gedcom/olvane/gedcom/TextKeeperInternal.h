@@ -7,9 +7,9 @@
 #include <string>
 #include <string_view>
 
-#include "olvane/gedcom/DiagnosticListInternal.h"
-#include "olvane/gedcom/TextArenaInternal.h"
-#include "olvane/gedcom/TextEncodingInternal.h"
+#include <olvane/gedcom/DiagnosticListInternal.h>
+#include <olvane/gedcom/TextArenaInternal.h>
+#include <olvane/gedcom/TextEncodingInternal.h>
 
 namespace olvane::gedcom {
 

@@ -4,15 +4,15 @@
 // Unicode as the reader needs it, over utf8proc: what is a character, which normal form, what counts as equal
 // when a user searches. Most text is ASCII, and every function has a short way through for it.
 
-#include "olvane/gedcom/UnicodeTextInternal.h"
-
-#include <utf8proc.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 
 #include <cstdlib>
 #include <cstring>
 #include <memory>
 
-#include "olvane/gedcom/LineScannerInternal.h"
+#include <utf8proc.h>
+
+#include <olvane/gedcom/LineScannerInternal.h>
 
 namespace olvane::gedcom {
 namespace {

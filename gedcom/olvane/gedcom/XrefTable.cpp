@@ -7,13 +7,13 @@
 // hash with open addressing. An identifier stays where it was first put, so one looks in the list and then by
 // hash. The hash has a seed that no file can know; nothing that is read depends on it.
 
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <olvane/gedcom/XrefTableInternal.h>
 
 #include <algorithm>
 #include <cstring>
 #include <random>
 
-#include "olvane/gedcom/LineScannerInternal.h"
+#include <olvane/gedcom/LineScannerInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -3,9 +3,9 @@
 
 // Broken files: every trouble is told with its line, and everything that can be read is read.
 
-#include <gtest/gtest.h>
-
 #include <string>
+
+#include <gtest/gtest.h>
 
 #include "GedcomText.h"
 

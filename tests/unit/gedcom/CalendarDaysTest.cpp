@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include "olvane/gedcom/CalendarDaysInternal.h"
+#include <olvane/gedcom/CalendarDaysInternal.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -3,13 +3,13 @@
 
 // Dates of every form: which year is shown, and that the sortable text sorts.
 
-#include <gtest/gtest.h>
-
 #include <algorithm>
 #include <string>
 #include <vector>
 
-#include "olvane/gedcom/GedcomDate.h"
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/GedcomDate.h>
 
 namespace olvane::gedcom {
 namespace {

@@ -3,13 +3,13 @@
 
 // One name in every encoding, and headers that say what is not so.
 
-#include <gtest/gtest.h>
-
 #include <string>
 
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/AnselInternal.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 #include "GedcomText.h"
-#include "olvane/gedcom/AnselInternal.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
 
 namespace olvane::gedcom::test {
 namespace {

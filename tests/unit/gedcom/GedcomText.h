@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "olvane/gedcom/GedcomReader.h"
+#include <olvane/gedcom/GedcomReader.h>
 
 // Small GEDCOM texts for tests, and what came of them as text that a failure can print.
 namespace olvane::gedcom::test {

@@ -4,13 +4,13 @@
 // Input made to hurt: depth, length, number and tangle. Each must be read in time and memory that follow its
 // size; a quadratic reader would be killed by the test's time limit.
 
-#include <gtest/gtest.h>
-
 #include <cstdint>
 #include <string>
 
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/PersonSearch.h>
 #include "GedcomText.h"
-#include "olvane/gedcom/PersonSearch.h"
 
 namespace olvane::gedcom::test {
 namespace {

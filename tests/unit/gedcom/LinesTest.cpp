@@ -3,12 +3,12 @@
 
 // Lines: their ends, their parts, and values that go on in further lines.
 
-#include <gtest/gtest.h>
-
 #include <string>
 
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/LineScannerInternal.h>
 #include "GedcomText.h"
-#include "olvane/gedcom/LineScannerInternal.h"
 
 namespace olvane::gedcom::test {
 namespace {

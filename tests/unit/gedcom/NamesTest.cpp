@@ -3,9 +3,9 @@
 
 // Names: pieces from their own lines or from the slashes, in scripts of every direction.
 
-#include <gtest/gtest.h>
-
 #include <string>
+
+#include <gtest/gtest.h>
 
 #include "GedcomText.h"
 

@@ -3,11 +3,11 @@
 
 // Files and archives on disk, and paths that are neither.
 
-#include <gtest/gtest.h>
-
 #include <filesystem>
 #include <fstream>
 #include <string>
+
+#include <gtest/gtest.h>
 
 #include "GedcomText.h"
 

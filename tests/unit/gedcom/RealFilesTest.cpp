@@ -4,15 +4,15 @@
 // Files of other programs and makers, which are not kept with the source: their folder is named by
 // OLVANE_GEDCOM_DIR.
 
-#include <gtest/gtest.h>
-
 #include <cstdlib>
 #include <filesystem>
 #include <map>
 #include <string>
 
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/PersonSearch.h>
 #include "GedcomText.h"
-#include "olvane/gedcom/PersonSearch.h"
 
 namespace olvane::gedcom::test {
 namespace {

@@ -3,10 +3,10 @@
 
 // Who is whose father, mother, spouse and child, by which record, and in which order.
 
-#include <gtest/gtest.h>
-
 #include <stdexcept>
 #include <string>
+
+#include <gtest/gtest.h>
 
 #include "GedcomText.h"
 

@@ -5,9 +5,9 @@
 
 #include <gtest/gtest.h>
 
+#include <olvane/gedcom/PersonSearch.h>
+#include <olvane/gedcom/UnicodeTextInternal.h>
 #include "GedcomText.h"
-#include "olvane/gedcom/PersonSearch.h"
-#include "olvane/gedcom/UnicodeTextInternal.h"
 
 namespace olvane::gedcom::test {
 namespace {

@@ -3,12 +3,12 @@
 
 // Identifiers of every shape find their places again, numbered or not, near or far.
 
-#include <gtest/gtest.h>
-
 #include <string>
 #include <vector>
 
-#include "olvane/gedcom/XrefTableInternal.h"
+#include <gtest/gtest.h>
+
+#include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
 namespace {
