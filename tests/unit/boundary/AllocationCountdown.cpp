@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Replaces the global allocation functions. The forms for arrays, for sizes and without exceptions come down
-// to these by the rules of the language.
+// Replaces the global allocation functions. The forms without exceptions come down to these by the
+// rules of the language.
 
 #include <unit/boundary/AllocationCountdown.h>
 
@@ -17,35 +17,78 @@ std::int64_t untilFailure = 0;
 
 }  // namespace
 
-void* operator new(std::size_t size) {
+// The alignment is a power of two and at least that of a pointer, or 0 for the ordinary one.
+static void* countedMemory(std::size_t size, std::size_t alignment) {
     ++made;
     if (untilFailure > 0 && --untilFailure == 0) throw std::bad_alloc();
-    void* const memory = std::malloc(size == 0 ? 1 : size);
+    void* memory = nullptr;
+    if (alignment == 0) {
+        memory = std::malloc(size == 0 ? 1 : size);
+    } else if (posix_memalign(&memory, alignment, size == 0 ? 1 : size) != 0) {
+        memory = nullptr;
+    }
     if (memory == nullptr) throw std::bad_alloc();
     ++outstanding;
     return memory;
 }
 
-void operator delete(void* memory) noexcept {
+static void giveBack(void* memory) {
     if (memory == nullptr) return;
     --outstanding;
     std::free(memory);
 }
 
-void operator delete(void* memory, std::size_t) noexcept {
-    operator delete(memory);
+static std::size_t usableAlignment(std::align_val_t alignment) {
+    const auto asked = static_cast<std::size_t>(alignment);
+    return asked < sizeof(void*) ? sizeof(void*) : asked;
+}
+
+void* operator new(std::size_t size) {
+    return countedMemory(size, 0);
 }
 
 void* operator new[](std::size_t size) {
-    return operator new(size);
+    return countedMemory(size, 0);
+}
+
+void* operator new(std::size_t size, std::align_val_t alignment) {
+    return countedMemory(size, usableAlignment(alignment));
+}
+
+void* operator new[](std::size_t size, std::align_val_t alignment) {
+    return countedMemory(size, usableAlignment(alignment));
+}
+
+void operator delete(void* memory) noexcept {
+    giveBack(memory);
 }
 
 void operator delete[](void* memory) noexcept {
-    operator delete(memory);
+    giveBack(memory);
+}
+
+void operator delete(void* memory, std::size_t) noexcept {
+    giveBack(memory);
 }
 
 void operator delete[](void* memory, std::size_t) noexcept {
-    operator delete(memory);
+    giveBack(memory);
+}
+
+void operator delete(void* memory, std::align_val_t) noexcept {
+    giveBack(memory);
+}
+
+void operator delete[](void* memory, std::align_val_t) noexcept {
+    giveBack(memory);
+}
+
+void operator delete(void* memory, std::size_t, std::align_val_t) noexcept {
+    giveBack(memory);
+}
+
+void operator delete[](void* memory, std::size_t, std::align_val_t) noexcept {
+    giveBack(memory);
 }
 
 namespace unit {
