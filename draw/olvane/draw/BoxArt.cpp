@@ -27,6 +27,7 @@ constexpr double kYearsSize = 10.5;
 constexpr double kYearsPitch = 14;
 constexpr double kBadgeHeight = 15;
 constexpr double kBadgeSize = 10;
+constexpr double kBadgeInset = 6;
 constexpr double kFocusBorder = 4;
 constexpr std::array<double, 4> kNameSizes = {13, 12, 11, 10};
 
@@ -234,36 +235,45 @@ std::string repeatSentence(const Box& box) {
            std::to_string(box.repeatNumber);
 }
 
-// A pill in an upper corner with a title of its own.
-void appendBadge(std::string& svg, double x, double width, const std::string& text, const std::string& title,
-                 const DrawingTheme& theme, bool hollow) {
-    const std::string fill(hollow ? theme.page : theme.badge);
-    const std::string ink(hollow ? theme.text : theme.badgeText);
-    svg += "<g><title>" + escaped(title) + "</title>\n<rect x=\"" + px(x) + "\" y=\"6\" width=\"" +
-           px(width) + "\" height=\"" + px(kBadgeHeight) + "\" rx=\"7.5\" fill=\"" + fill + "\" stroke=\"" +
-           std::string(theme.badge) + "\"/>\n";
-    appendTextLine(svg, x + width / 2, 6 + kBadgeHeight - 4, text,
+struct Badge {
+    std::string text;
+    std::string title;
+    bool hollow = false;
+    double x = 0;
+
+    double width() const { return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9); }
+};
+
+// A pill with a title of its own: on top of a tall box, where the silhouette leaves room, and at the foot of
+// a wide one, beside the years.
+void appendBadge(std::string& svg, const Box& box, const Badge& badge, const DrawingTheme& theme) {
+    const double y = isWide(box) ? box.height - kBadgeHeight - kBadgeInset : kBadgeInset;
+    const std::string fill(badge.hollow ? theme.page : theme.badge);
+    const std::string ink(badge.hollow ? theme.text : theme.badgeText);
+    svg += "<g><title>" + escaped(badge.title) + "</title>\n<rect x=\"" + px(badge.x) + "\" y=\"" + px(y) +
+           "\" width=\"" + px(badge.width()) + "\" height=\"" + px(kBadgeHeight) + "\" rx=\"7.5\" fill=\"" +
+           fill + "\" stroke=\"" + std::string(theme.badge) + "\"/>\n";
+    appendTextLine(svg, badge.x + badge.width() / 2, y + kBadgeHeight - 4, badge.text,
                    " text-anchor=\"middle\" font-weight=\"bold\" font-size=\"" + px(kBadgeSize) +
                        "\" fill=\"" + ink + "\"");
     svg += "</g>\n";
 }
 
-double badgeWidth(const std::string& text) {
-    return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9);
-}
-
-void appendHiddenBadge(std::string& svg, const Box& box, const PersonLabel& label,
-                       const DrawingTheme& theme) {
-    if (!box.record->hasHiddenRelatives) return;
-    const std::string text = hiddenMark(label);
-    const double width = badgeWidth(text);
-    appendBadge(svg, box.width - width - 6, width, text, hiddenSentence(label), theme, false);
-}
-
-void appendRepeatBadge(std::string& svg, const Box& box, const DrawingTheme& theme) {
-    if (box.repeatNumber == 0) return;
-    const std::string text = "=" + std::to_string(box.repeatNumber);
-    appendBadge(svg, 6, badgeWidth(text), text, repeatSentence(box), theme, true);
+// The count of hidden relatives in the right corner; the repeat mark in the left one, or before it in a wide
+// box.
+void appendBadges(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+    double right = box.width - kBadgeInset;
+    if (box.record->hasHiddenRelatives) {
+        Badge badge{hiddenMark(label), hiddenSentence(label)};
+        badge.x = right - badge.width();
+        right = badge.x - kBadgeInset / 2;
+        appendBadge(svg, box, badge, theme);
+    }
+    if (box.repeatNumber > 0) {
+        Badge badge{"=" + std::to_string(box.repeatNumber), repeatSentence(box), true};
+        badge.x = isWide(box) ? right - badge.width() : kBadgeInset;
+        appendBadge(svg, box, badge, theme);
+    }
 }
 
 std::string titleOf(const Box& box, const PersonLabel& label) {
@@ -324,8 +334,7 @@ void appendPersonBox(std::string& svg, const Box& box, const PersonLabel& label,
     appendFrame(svg, box, shown.sex, theme);
     appendSilhouette(svg, box, shown.sex, theme);
     appendTexts(svg, box, shown, theme);
-    appendRepeatBadge(svg, box, theme);
-    appendHiddenBadge(svg, box, label, theme);
+    appendBadges(svg, box, label, theme);
     svg += "</g>\n";
 }
 

@@ -46,8 +46,8 @@ const DrawingTheme& darkTheme() {
         .badge = "#dfe4ea",
         .badgeText = "#15181d",
         .placeholder = "#8b95a2",
-        .male = {"#1b3554", "#7fb0e6", "#4d759f"},
-        .female = {"#4e2239", "#ee9dbf", "#8f5170"},
+        .male = {"#18304d", "#7fb0e6", "#4d759f"},
+        .female = {"#592740", "#ee9dbf", "#8f5170"},
         .other = {"#35373c", "#b4b4b4", "#6c6d71"},
     };
     return kTheme;

@@ -23,6 +23,7 @@ constexpr int kMargin = 28;
 constexpr int kHeadlineHeight = 40;
 constexpr double kHeadlineSize = 20;
 constexpr int kLegendPitch = 22;
+constexpr int kLegendGap = 12;  // between the last row of boxes and the legend
 constexpr int kLegendWidth = 170;
 constexpr int kLegendStroke = 44;
 constexpr double kLegendSize = 11.5;
@@ -165,13 +166,13 @@ private:
         if (styles.divorced) appendLegendLine(legend, row++, LineStyle::divorced, "marriage ended");
         if (styles.adopted) appendLegendLine(legend, row++, LineStyle::adopted, "adopted child");
         if (styles.foster) appendLegendLine(legend, row++, LineStyle::foster, "foster child");
-        picture_.height += row * kLegendPitch;
+        picture_.height += row * kLegendPitch + kLegendGap;
         picture_.width = std::max(picture_.width, kLegendWidth + 2 * kMargin);
         return legend + "</g>\n";
     }
 
     void appendLegendLine(std::string& legend, int row, LineStyle style, const char* meaning) const {
-        const int y = picture_.height - kMargin + kLegendPitch * row + kLegendPitch / 2;
+        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * row + kLegendPitch / 2;
         legend += "<path d=\"M" + std::to_string(kMargin) + " " + std::to_string(y) + "h" +
                   std::to_string(kLegendStroke) + "\" fill=\"none\" stroke=\"" + std::string(theme().line) +
                   "\" stroke-width=\"1.6\" stroke-dasharray=\"" + dashesOf(style) + "\"/>\n<text x=\"" +
