@@ -12,8 +12,10 @@
 
 #include <olvane/boundary/LayoutPieces.h>
 
-#include <olvane/boundary/HostText.h>
 #include <olvane/graph/WholePoint.h>
+
+#include <charconv>
+#include <cstddef>
 
 namespace olvane {
 
@@ -27,30 +29,28 @@ void updateBounds(ResultBounds& bounds, int x, int y) {
     if (bounds.maxY < y || bounds.maxY == 0) bounds.maxY = y;
 }
 
+void appendNumber(std::string& text, int value, char separator) {
+    char digits[13];
+    char* const end = std::to_chars(digits, digits + sizeof digits - 1, value).ptr;
+    *end = separator;
+    text.append(digits, static_cast<std::size_t>(end - digits) + 1);
+}
+
 void appendPlaceAndFlag(std::string& text, const std::string& personText, int x, int y, bool flag) {
     text += personText;
     text += ':';
-    text += intToString(x);
-    text += ':';
-    text += intToString(y);
-    text += ':';
-    text += intToString(flag ? 1 : 0);
-    text += ':';
+    appendNumber(text, x, ':');
+    appendNumber(text, y, ':');
+    appendNumber(text, flag ? 1 : 0, ':');
 }
 
 void appendSegments(std::string& text, TreeViewPerson& person) {
-    std::string segments;
-    person.lineSegmentIterator([&segments](TreeLineSegment& segment) {
-        segments += intToString(wholePoint(segment.x1));
-        segments += ',';
-        segments += intToString(wholePoint(segment.y1));
-        segments += ',';
-        segments += intToString(wholePoint(segment.x2));
-        segments += ',';
-        segments += intToString(wholePoint(segment.y2));
-        segments += '|';
+    person.lineSegmentIterator([&text](TreeLineSegment& segment) {
+        appendNumber(text, wholePoint(segment.x1), ',');
+        appendNumber(text, wholePoint(segment.y1), ',');
+        appendNumber(text, wholePoint(segment.x2), ',');
+        appendNumber(text, wholePoint(segment.y2), '|');
     });
-    text += segments;
 }
 
 void appendSexAndChild(std::string& text, const ViewerGlue& glue, const std::string& personText) {

@@ -24,6 +24,8 @@
 
 #include <boost/make_shared.hpp>
 
+#include <utility>
+
 namespace SharedTreeViewer {
 
 using olvane::cutToWholePoint;
@@ -66,12 +68,13 @@ void TreeViewFamilyLayouter::addLinesToPerson(TreeViewPerson& person) {
 void TreeViewFamilyLayouter::addChildLine(TreeViewPerson& person, TreeViewPerson& child,
                                           TreeViewPerson& spouse) {
     if (spouse.personId == person.personId) {
-        const TreeLine line = drawDropBusAndStem(dropToChildOfLoneParent(spouse), spouse, child);
-        person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &child, &person));
+        TreeLine line = drawDropBusAndStem(dropToChildOfLoneParent(spouse), spouse, child);
+        person.addGenerationEdge(
+            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &person));
     } else {
-        const TreeLine line = drawDropBusAndStem(dropToChildOfCouple(person, spouse), spouse, child);
+        TreeLine line = drawDropBusAndStem(dropToChildOfCouple(person, spouse), spouse, child);
         TreeViewSpouseEdge* const couple = person.spouseEdge(&spouse, TreeLine());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &child, couple));
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, couple));
     }
 }
 
@@ -106,7 +109,7 @@ TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPe
     course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
     course.draw(child, stemX, drop.busY, drop.x, drop.busY);
     course.draw(child, stemX, at.y, stemX, drop.busY);
-    return course.line();
+    return course.takeLine();
 }
 
 // From a father's mid-height, in the gap at his right, down to the bus of a couple's children.
@@ -149,19 +152,18 @@ void TreeViewFamilyLayouter::addSiblingLine(TreeViewPerson& person, TreeViewPers
 // one parent: a host that walks a couple's edges meets all of its row. With a single parent the edge goes to
 // the person and not to the parent, unlike at the other places that make one; a host finds a sibling's edge
 // beside the person.
-void TreeViewFamilyLayouter::addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling,
-                                            const TreeLine& line) {
+void TreeViewFamilyLayouter::addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling, TreeLine line) {
     const bool hasFather = person.preferredFatherIndex != -1;
     const bool hasMother = person.preferredMotherIndex != -1;
     if (hasFather && hasMother) {
         TreeViewSpouseEdge* const couple =
             siblingParentsEdge(person.getPreferredFather(), person.getPreferredMother());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &sibling, couple));
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &sibling, couple));
         return;
     }
     const bool throughFather = hasFather && person.getPreferredFather().personId == sibling.getParentId();
     TreeViewPerson& parent = throughFather ? person.getPreferredFather() : person.getPreferredMother();
-    person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &sibling, &parent));
+    person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &sibling, &parent));
 }
 
 // The points count only when this call is the one that makes the edge.
@@ -186,7 +188,7 @@ TreeViewSpouseEdge* TreeViewFamilyLayouter::siblingParentsEdge(TreeViewPerson& f
         case ParentsCourse::none:
             break;
     }
-    return mother.spouseEdge(&father, line);
+    return mother.spouseEdge(&father, std::move(line));
 }
 
 // The mother is asked about twice with the same question: a data source may answer differently the second
@@ -211,17 +213,18 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
     if (parentCount == 1) {
         TreeViewPerson& parent =
             person.preferredFatherIndex != -1 ? person.getPreferredFather() : person.getPreferredMother();
-        const TreeLine line = drawDropBusAndStem(dropFromSingleParent(parent), parent, person);
-        parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(line, &person, &parent));
+        TreeLine line = drawDropBusAndStem(dropFromSingleParent(parent), parent, person);
+        parent.addGenerationEdge(
+            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, &parent));
         return;
     }
     TreeViewPerson& father = person.getPreferredFather();
     TreeViewPerson& mother = person.getPreferredMother();
     const Drop drop = dropFromCouple(father);
-    const TreeLine line = drawDropBusAndStem(drop, father, person);
+    TreeLine line = drawDropBusAndStem(drop, father, person);
     drawParentsMarriageLine(father, mother, drop);
     TreeViewSpouseEdge* const couple = father.spouseEdge(&mother, TreeLine());
-    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(line, &person, couple));
+    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, couple));
 }
 
 // The one marriage line of a couple that stands on the chart as somebody's parents and not as each other's

@@ -16,7 +16,7 @@ void TreeViewFamilyLayouter::graphIterator(const Visitor& visitor) {
 
 void TreeViewFamilyLayouter::graphIteratorHelper(TreeViewPerson& person, const Visitor& visitor) {
     visitor(person);
-    const auto goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
+    const Visitor goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
     person.parentsIterator(goOn);
     person.spouseIterator(goOn);
     person.allChildrenIterator(false, goOn);

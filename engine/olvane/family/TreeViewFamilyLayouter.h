@@ -147,7 +147,7 @@ private:
     Drop dropFromSingleParent(const TreeViewPerson& parent) const;
     TreeLine drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder, TreeViewPerson& child) const;
     void drawParentsMarriageLine(TreeViewPerson& father, TreeViewPerson& mother, const Drop& drop);
-    void addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling, const TreeLine& line);
+    void addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling, TreeLine line);
     TreeViewSpouseEdge* siblingParentsEdge(TreeViewPerson& father, TreeViewPerson& mother);
     // Which way the three points of a parents' line made for a sibling run.
     enum class ParentsCourse { fromFather, fromMother, none };

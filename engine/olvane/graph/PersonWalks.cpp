@@ -152,6 +152,7 @@ TreeViewPerson::Iterator TreeViewPerson::getNonDisplayedSpouseIterator(const Spo
         nonDisplayedSpousesLoaded = true;
         SpouseSet records;
         loader(personId, records);
+        nonDisplayedSpouses.reserve(nonDisplayedSpouses.size() + records.size());
         for (const SpouseAdapter& record : records) addNonDisplayedSpouse(record.key);
     }
     return [this](const Visitor& visitor) { nonDisplayedSpouseIterator(visitor); };

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <cstddef>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -20,6 +21,7 @@ public:
     explicit TreeLine(std::vector<TreePoint> points);
     explicit TreeLine(TreeLineSegment segment);  // two points: the first end, then the second
 
+    void reserve(std::size_t points) { points_.reserve(points); }
     void pushPointBack(TreePoint point);
     void pushPointFront(TreePoint point);
 

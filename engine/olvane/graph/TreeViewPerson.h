@@ -52,7 +52,8 @@ public:
 
     explicit TreeViewPerson(int key);
     TreeViewPerson(const TreeViewPerson&) = default;
-    TreeViewPerson(TreeViewPerson&&) noexcept = default;  // how a list grows: the relatives come along as they lie
+    TreeViewPerson(TreeViewPerson&&) noexcept =
+        default;  // how a list grows: the relatives come along as they lie
     TreeViewPerson& operator=(const TreeViewPerson&) = delete;
     ~TreeViewPerson();  // deletes the spouse edges that this person owns, first of all
 

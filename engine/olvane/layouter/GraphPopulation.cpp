@@ -13,18 +13,75 @@
 
 #include <olvane/layouter/TreeViewLayouter.h>
 
+#include <algorithm>
+#include <vector>
+
 namespace SharedTreeViewer {
 
 namespace {
 
-// A set of records whose orders may contradict each other (see above) depends on the road by which it was
-// filled: one plain insert after another.
-void addAllTo(ChildrenSet& set, const ChildrenSet& records) {
-    for (const ChildrenAdapter& record : records) set.insert(record);
+bool allHavePlaces(const ChildrenSet& set) {
+    return std::all_of(set.begin(), set.end(),
+                       [](const ChildrenAdapter& record) { return record.hostOrder >= 1; });
 }
 
-bool contains(const ChildrenSet& set, const ChildrenAdapter& record) {
-    return set.find(record) != set.end();
+// The children of several persons, for asking whether a record is among them.
+//
+// Records that all have a place are in one order, by key, so they are looked up in the sets where they lie.
+// Others may contradict each other's order (see above), and then an answer depends on the road by which one
+// set was filled with all of them: one plain insert after another.
+class ChildrenOfOthers {
+public:
+    void add(const ChildrenSet& children) {
+        if (children.empty()) return;
+        sets_.push_back(&children);
+        allHavePlaces_ = allHavePlaces_ && allHavePlaces(children);
+    }
+
+    bool contains(const ChildrenAdapter& record) {
+        if (allHavePlaces_ && record.hostOrder >= 1) {
+            return std::any_of(sets_.begin(), sets_.end(),
+                               [&record](const ChildrenSet* set) { return set->find(record) != set->end(); });
+        }
+        if (together_.empty()) putTogether();
+        return together_.find(record) != together_.end();
+    }
+
+private:
+    void putTogether() {
+        for (const ChildrenSet* set : sets_) {
+            for (const ChildrenAdapter& record : *set) together_.insert(record);
+        }
+    }
+
+    std::vector<const ChildrenSet*> sets_;
+    bool allHavePlaces_ = true;
+    ChildrenSet together_;
+};
+
+ChildrenSet copyOf(const std::vector<const ChildrenAdapter*>& records) {
+    ChildrenSet set;
+    for (const ChildrenAdapter* record : records) set.insert(*record);
+    return set;
+}
+
+// Records of first that are equivalent to one of second, in the order of first.
+std::vector<const ChildrenAdapter*> commonRecords(const ChildrenSet& first, const ChildrenSet& second) {
+    std::vector<const ChildrenAdapter*> common;
+    ChildrenSet::const_iterator a = first.begin();
+    ChildrenSet::const_iterator b = second.begin();
+    while (a != first.end() && b != second.end()) {
+        if (*a < *b) {
+            ++a;
+        } else if (*b < *a) {
+            ++b;
+        } else {
+            common.push_back(&*a);
+            ++a;
+            ++b;
+        }
+    }
+    return common;
 }
 
 }  // namespace
@@ -32,6 +89,7 @@ bool contains(const ChildrenSet& set, const ChildrenAdapter& record) {
 void TreeViewLayouter::addSpousesToPerson(TreeViewPerson& person) {
     SpouseSet records;
     dataAdapter->getSpouses(person.personId, records);
+    person.spouses.reserve(person.spouses.size() + records.size());
     for (const SpouseAdapter& record : records) {
         admit(record.key);
         person.addSpouse(record.key, !person.gender);
@@ -68,53 +126,43 @@ void TreeViewLayouter::addAllChildrenToPerson(TreeViewPerson& person) {
 }
 
 void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator) {
-    for (const ChildrenAdapter& record : getBastardChildrenOfPerson(person, iterator)) {
-        admit(record.key);
-        person.addChildWithNoOtherSpouse(record.key, dataAdapter->isMale(record.key));
+    for (const ChildrenAdapter* record : childrenOfPersonAlone(person, iterator)) {
+        admit(record->key);
+        person.addChildWithNoOtherSpouse(record->key, dataAdapter->isMale(record->key));
     }
 }
 
 ChildrenSet TreeViewLayouter::getBastardChildrenOfPerson(TreeViewPerson& person, Iterator iterator) {
+    return copyOf(childrenOfPersonAlone(person, iterator));
+}
+
+TreeViewLayouter::Records TreeViewLayouter::childrenOfPersonAlone(TreeViewPerson& person,
+                                                                  const Iterator& iterator) {
+    Records alone;
     const ChildrenSet& own = person.getAllChildrenVector(dataAdapter->getChildren);
-    ChildrenSet alone;
     if (own.empty()) return alone;
-    ChildrenSet others;
+    ChildrenOfOthers others;
     iterator([&](TreeViewPerson& other) {
-        if (other.personId == person.personId) return;
-        addAllTo(others, other.getAllChildrenVector(dataAdapter->getChildren));
+        if (other.personId != person.personId)
+            others.add(other.getAllChildrenVector(dataAdapter->getChildren));
     });
     for (const ChildrenAdapter& record : own) {
-        if (!contains(others, record)) alone.insert(record);
+        if (!others.contains(record)) alone.push_back(&record);
     }
     return alone;
 }
 
 ChildrenSet TreeViewLayouter::getIntersectingVector(const ChildrenSet& first,
                                                     const ChildrenSet& second) const {
-    ChildrenSet common;
-    ChildrenSet::const_iterator a = first.begin();
-    ChildrenSet::const_iterator b = second.begin();
-    while (a != first.end() && b != second.end()) {
-        if (*a < *b) {
-            ++a;
-        } else if (*b < *a) {
-            ++b;
-        } else {
-            common.insert(*a);
-            ++a;
-            ++b;
-        }
-    }
-    return common;
+    return copyOf(commonRecords(first, second));
 }
 
 void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, TreeViewPerson& spouse,
                                                       const ChildrenSet& children) {
     if (children.empty()) return;
-    const ChildrenSet common =
-        getIntersectingVector(children, spouse.getAllChildrenVector(dataAdapter->getChildren));
-    for (const ChildrenAdapter& record : common) {
-        int child = record.key;
+    const ChildrenSet& spousesChildren = spouse.getAllChildrenVector(dataAdapter->getChildren);
+    for (const ChildrenAdapter* record : commonRecords(children, spousesChildren)) {
+        int child = record->key;
         int other = spouse.personId;
         if (!checkIfPrefferedParent(person, child, other)) continue;
         admit(child);
@@ -158,11 +206,11 @@ void TreeViewLayouter::addSiblingsToPerson(TreeViewPerson& person) {
 void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) {
     TreeViewPerson& father = person.getPreferredFather();
     bool personIsAmongThem = false;
-    for (const ChildrenAdapter& record : getBastardChildrenOfPerson(father, person.getParentIterator())) {
-        if (record.key == person.personId) {
+    for (const ChildrenAdapter* record : childrenOfPersonAlone(father, person.getParentIterator())) {
+        if (record->key == person.personId) {
             personIsAmongThem = true;
         } else {
-            person.addHalfSibling(record.key, father.personId, dataAdapter->isMale(record.key));
+            person.addHalfSibling(record->key, father.personId, dataAdapter->isMale(record->key));
         }
     }
     if (personIsAmongThem) person.addHalfSibling(person.personId, father.personId, person.gender);
@@ -171,22 +219,22 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
     TreeViewPerson& mother = person.getPreferredMother();
     const ChildrenSet& fathersChildren = father.getAllChildrenVector(dataAdapter->getChildren);
     const ChildrenSet& mothersChildren = mother.getAllChildrenVector(dataAdapter->getChildren);
-    for (const ChildrenAdapter& record : getIntersectingVector(fathersChildren, mothersChildren)) {
-        person.addSibling(record.key, dataAdapter->isMale(record.key));
+    for (const ChildrenAdapter* record : commonRecords(fathersChildren, mothersChildren)) {
+        person.addSibling(record->key, dataAdapter->isMale(record->key));
     }
 }
 
 void TreeViewLayouter::addMotherSide(TreeViewPerson& person) {
     TreeViewPerson& mother = person.getPreferredMother();
-    const ChildrenSet alone = getBastardChildrenOfPerson(mother, person.getParentIterator());
-    for (const ChildrenAdapter& record : alone) {
-        if (record.key == person.personId) {
+    const Records alone = childrenOfPersonAlone(mother, person.getParentIterator());
+    for (const ChildrenAdapter* record : alone) {
+        if (record->key == person.personId) {
             person.addHalfSibling(person.personId, mother.personId, person.gender);
         }
     }
-    for (const ChildrenAdapter& record : alone) {
-        if (record.key != person.personId) {
-            person.addHalfSibling(record.key, mother.personId, dataAdapter->isMale(record.key));
+    for (const ChildrenAdapter* record : alone) {
+        if (record->key != person.personId) {
+            person.addHalfSibling(record->key, mother.personId, dataAdapter->isMale(record->key));
         }
     }
 }

@@ -7,6 +7,7 @@
 
 #include <map>
 #include <string>
+#include <vector>
 
 #include <olvane/Export.h>
 #include <olvane/adapters/DataAdapter.h>
@@ -97,6 +98,9 @@ protected:
     bool isAdmitted(int key) const { return shownPersons.find(key) != shownPersons.end(); }
 
 private:
+    typedef std::vector<const ChildrenAdapter*> Records;  // in the sets where they lie
+
+    Records childrenOfPersonAlone(TreeViewPerson& person, const Iterator& iterator);
     void addFatherSide(TreeViewPerson& person, bool motherIsReal);
     void addMotherSide(TreeViewPerson& person);
 };

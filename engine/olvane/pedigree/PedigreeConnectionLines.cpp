@@ -72,14 +72,15 @@ void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeV
         const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
         course.draw(spouse, at.x, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
-        focus.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(course.line(), &child, &focus));
+        focus.addGenerationEdge(
+            boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &child, &focus));
     } else {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;
         course.draw(spouse, lineX, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
         TreeViewSpouseEdge* const couple = spouse.spouseEdge(&focus, TreeLine());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.line(), &child, couple));
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &child, couple));
     }
 }
 
@@ -127,7 +128,7 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
     course.draw(person, x, middleY, middleX, middleY);
     course.draw(person, middleX, middleY, middleX, ownY);
     course.draw(person, middleX, ownY, ownRight, ownY);
-    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.line(), &person, couple));
+    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &person, couple));
     addParentLinesForPerson(father);
     addParentLinesForPerson(mother);
 }
@@ -144,7 +145,7 @@ void TreeViewPedigreeLayouter::addSingleParentLines(TreeViewPerson& person, Tree
     course.draw(parent, parentX, parentY, stubX, parentY);
     course.draw(person, stubX, ownY, stubX, parentY);
     course.draw(person, own.x + treeSize.nodeWidth, ownY, stubX, ownY);
-    parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(course.line(), &person, &parent));
+    parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &person, &parent));
     addParentLinesForPerson(parent);
 }
 

@@ -90,7 +90,7 @@ void TreeViewPedigreeLayouter::graphIterator(const Visitor& visitor) {
 
 void TreeViewPedigreeLayouter::graphIteratorHelper(TreeViewPerson& person, const Visitor& visitor) {
     visitor(person);
-    const auto goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
+    const Visitor goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
     person.parentsIterator(goOn);
     person.spouseIterator(goOn);
     person.allChildrenIterator(false, goOn);
