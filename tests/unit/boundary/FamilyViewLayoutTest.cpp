@@ -93,7 +93,7 @@ TEST(Bridge, idOfZeroOrBelowGivesTheEmptyText) {
 
 TEST(Bridge, idAboveAnIntIsCutToItsLow32Bits) {
     EXPECT_EQ(textOfLoneFocus("17"), layOutById(0x100000011, family("17")));
-    EXPECT_EQ(textOfLoneFocus("17"), layOutById(-0xffffffef, family("17")));
+    EXPECT_EQ(textOfLoneFocus("17"), layOutById(-std::int64_t{0xffffffef}, family("17")));
     EXPECT_EQ("", layOutById(0x100000000, family("17")));
     EXPECT_EQ("", layOutById(0x80000011, family("17")));  // negative once it is cut
 }
