@@ -144,7 +144,7 @@ private:
         addFocus(*draw_, drawOptions_.focus);
         draw_
             ->add_option("-o,--output", drawOptions_.output,
-                         "Picture to write: .svg, or - for the standard output")
+                         "Picture to write: .svg, .png or .pdf; - writes SVG to the standard output")
             ->required()
             ->type_name("OUT");
         addView(*draw_, drawOptions_.request);
@@ -156,6 +156,22 @@ private:
             ->type_name("light|dark|print");
         draw_->add_option("--title", drawOptions_.title, "Title above the picture; none is drawn without it")
             ->type_name("TEXT");
+        draw_
+            ->add_option(
+                "--page", drawOptions_.page,
+                "Lay the picture out on sheets of this paper, with strips to glue them by. A .pdf holds "
+                "them all; other forms become OUT-1, OUT-2 and so on")
+            ->check(CLI::IsMember({"A4", "A3", "letter"}))
+            ->type_name("A4|A3|letter");
+        draw_->add_flag(
+            "--hide-living", drawOptions_.hideLiving,
+            "Draw as 'Living', without name, sex and dates, whoever may be alive: no death told and "
+            "born less than 110 years ago, or dates that cannot tell and near kin of such a person");
+        draw_
+            ->add_option("--year", drawOptions_.year,
+                         "The year that --hide-living counts from; this year if not given")
+            ->check(CLI::Range(1, 9999))
+            ->type_name("YEAR");
         addFamilySwitches(*draw_, drawOptions_.request);
     }
 

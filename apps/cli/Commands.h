@@ -31,6 +31,9 @@ struct DrawOptions {
     LayoutRequest request;
     std::string theme = "light";
     std::string title;  // empty for one made of the focus's name
+    std::string page;   // name of a paper; empty for a picture of its own size
+    bool hideLiving = false;
+    int year = 0;  // the present one for hideLiving; 0 asks the clock
 };
 
 int runPeople(const PeopleOptions& options);

@@ -1,15 +1,22 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Draws the layout of one person to a file.
+// Draws the layout of one person to a file, in the form that the file's name asks for, whole or on sheets of
+// paper.
 
 #include <cli/Commands.h>
 
+#include <iomanip>
+#include <sstream>
+
+#include <olvane/draw/PageSplit.h>
 #include <olvane/host/LayoutText.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
+#include <cli/LivingPersons.h>
 #include <cli/OutputFile.h>
+#include <cli/PictureConversion.h>
 #include <cli/PictureLabels.h>
 #include <cli/UsageError.h>
 
@@ -17,9 +24,24 @@ namespace olvane::cli {
 
 namespace {
 
-void requireKnownForm(const std::string& output) {
-    if (output == "-" || output.ends_with(".svg")) return;
-    throw UsageError(output + ": pictures are written as .svg");
+enum class Form { svg, png, pdf };
+
+constexpr double kSheetPngScale = 2;  // 192 pixels an inch, for paper
+
+std::string lowerCase(std::string text) {
+    for (char& c : text) {
+        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+    }
+    return text;
+}
+
+// Settled before anything is read, so that a mistyped name costs no time.
+Form formOf(const std::string& output) {
+    const std::string name = lowerCase(output);
+    if (name == "-" || name.ends_with(".svg")) return Form::svg;
+    if (name.ends_with(".png")) return Form::png;
+    if (name.ends_with(".pdf")) return Form::pdf;
+    throw UsageError(output + ": pictures are written as .svg, .png or .pdf");
 }
 
 draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::DrawingContent& content) {
@@ -38,16 +60,56 @@ draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::Draw
     return drawing;
 }
 
+draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options) {
+    const gedcom::PersonId focus = chooseFocus(data, options.focus);
+    std::vector<bool> living;
+    if (options.hideLiving) living = livingPersons(data, options.year != 0 ? options.year : currentYear());
+    const std::string text = layoutText(data, focus, options.request);
+    return pictureContent(data, readLayoutText(text), focus, std::move(living));
+}
+
+// "tree.svg" and sheet 3 of 12 give "tree-03.svg".
+std::string sheetName(const std::string& output, std::size_t sheet, std::size_t count) {
+    const std::size_t dot = output.rfind('.');
+    std::ostringstream name;
+    name << output.substr(0, dot) << '-' << std::setw(static_cast<int>(std::to_string(count).size()))
+         << std::setfill('0') << sheet << output.substr(dot);
+    return name.str();
+}
+
+void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets,
+                 double pngScale) {
+    for (std::size_t i = 0; i < sheets.size(); ++i) {
+        const std::string path =
+            sheets.size() == 1 ? options.output : sheetName(options.output, i + 1, sheets.size());
+        writeOutput(path, form == Form::png ? pngOf(sheets[i], pngScale) : sheets[i].svg);
+    }
+}
+
+std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::SvgPicture& picture,
+                                       const std::string& title) {
+    const auto paper = draw::paperOfName(options.page);
+    if (!paper) return {picture};
+    return draw::splitPages(picture, *paper, title);
+}
+
 }  // namespace
 
 int runDraw(const DrawOptions& options) {
-    requireKnownForm(options.output);
+    const Form form = formOf(options.output);
     const gedcom::GedcomData data = readFile(options.file);
-    const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    const draw::DrawingContent content =
-        pictureContent(data, readLayoutText(layoutText(data, focus, options.request)), focus);
-    const draw::SvgPicture picture = draw::drawSvg(content, drawingOptions(options, content));
-    writeOutput(options.output, picture.svg);
+    const draw::DrawingContent content = contentOf(data, options);
+    const draw::DrawingOptions drawing = drawingOptions(options, content);
+    const auto sheets = sheetsOf(options, draw::drawSvg(content, drawing), drawing.title);
+    if (options.output == "-" && sheets.size() > 1) {
+        throw UsageError("the picture takes " + std::to_string(sheets.size()) +
+                         " sheets; name a file for them");
+    }
+    if (form == Form::pdf) {
+        writeOutput(options.output, pdfOf(sheets, drawing.title));
+    } else {
+        writeSheets(options, form, sheets, options.page.empty() ? 1 : kSheetPngScale);
+    }
     return 0;
 }
 

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <memory>
 #include <unordered_set>
+#include <utility>
 
 namespace olvane::cli {
 
@@ -61,6 +62,13 @@ draw::PersonLabel labelOf(const gedcom::GedcomData& data, gedcom::PersonId id, c
     return label;
 }
 
+// Holds nothing of the person, so that nothing can get out.
+draw::PersonLabel livingLabel() {
+    draw::PersonLabel label;
+    label.living = true;
+    return label;
+}
+
 // The link to the parents who are drawn: the first by birth, or else the first of all.
 draw::ParentLink parentLinkOf(const gedcom::GedcomData& data, gedcom::PersonId id) {
     const auto links = data.parentLinks(id);
@@ -102,13 +110,16 @@ gedcom::PersonId asPerson(std::int64_t id) {
 }  // namespace
 
 draw::DrawingContent pictureContent(const gedcom::GedcomData& data, std::vector<LayoutRecord> records,
-                                    gedcom::PersonId focus) {
+                                    gedcom::PersonId focus, std::vector<bool> living) {
     const auto shown = std::make_shared<Ids>();
     for (const LayoutRecord& record : records) shown->insert(record.id);
     draw::DrawingContent content;
     content.records = std::move(records);
     content.focusId = focus;
-    content.labelOf = [&data, shown](std::int64_t id) { return labelOf(data, asPerson(id), *shown); };
+    content.labelOf = [&data, shown, living = std::move(living)](std::int64_t id) {
+        const gedcom::PersonId person = asPerson(id);
+        return !living.empty() && living[person - 1] ? livingLabel() : labelOf(data, person, *shown);
+    };
     content.parentLinkOf = [&data](std::int64_t id) { return parentLinkOf(data, asPerson(id)); };
     content.isDivorced = [&data](std::int64_t one, std::int64_t other) {
         return areDivorced(data, asPerson(one), asPerson(other));

@@ -1,0 +1,112 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Renders SVG through librsvg onto surfaces of cairo.
+
+#include <cli/PictureConversion.h>
+
+#include <algorithm>
+#include <cmath>
+#include <memory>
+#include <stdexcept>
+
+#include <cli/RenderLibraries.h>
+
+namespace olvane::cli {
+
+namespace {
+
+constexpr double kLongestPng = 32000;      // pixels; cairo's images end at 32,767
+constexpr double kLongestPdf = 14400;      // points; what viewers of PDF take
+constexpr double kPointsOfPx = 72.0 / 96;  // a px is 1/96 inch, a point 1/72
+
+// Frees what the libraries hand out.
+template <class Object, class Free>
+std::unique_ptr<Object, Free> owned(Object* object, Free free) {
+    return std::unique_ptr<Object, Free>(object, free);
+}
+
+cairo_status_t appendBytes(void* target, const unsigned char* bytes, unsigned int length) {
+    try {
+        static_cast<std::string*>(target)->append(reinterpret_cast<const char*>(bytes), length);
+        return CAIRO_STATUS_SUCCESS;
+    } catch (...) {
+        return CAIRO_STATUS_WRITE_ERROR;  // no exception may pass through the library
+    }
+}
+
+void requireSuccess(cairo_status_t status) {
+    if (status == CAIRO_STATUS_SUCCESS) return;
+    throw std::runtime_error(std::string("the picture could not be rendered: ") +
+                             renderLibraries().cairo_status_to_string(status));
+}
+
+[[noreturn]] void failWith(GError* error) {
+    const std::string text = error == nullptr ? "unknown reason" : error->message;
+    if (error != nullptr) renderLibraries().g_error_free(error);
+    throw std::runtime_error("the picture could not be rendered: " + text);
+}
+
+void renderOnto(cairo_t* target, const draw::SvgPicture& picture) {
+    const RenderLibraries& lib = renderLibraries();
+    GError* error = nullptr;
+    const auto handle =
+        owned(lib.rsvg_handle_new_from_data(reinterpret_cast<const guint8*>(picture.svg.data()),
+                                            picture.svg.size(), &error),
+              lib.g_object_unref);
+    if (!handle) failWith(error);
+    lib.rsvg_handle_set_dpi(handle.get(), 96);
+    const RsvgRectangle viewport = {0, 0, static_cast<double>(picture.width),
+                                    static_cast<double>(picture.height)};
+    if (!lib.rsvg_handle_render_document(handle.get(), target, &viewport, &error)) failWith(error);
+    requireSuccess(lib.cairo_status(target));
+}
+
+double longestSide(const draw::SvgPicture& picture) {
+    return std::max({picture.width, picture.height, 1});
+}
+
+int pixels(double length) {
+    return std::max(1, static_cast<int>(std::ceil(length)));
+}
+
+}  // namespace
+
+std::string pngOf(const draw::SvgPicture& picture, double scale) {
+    const RenderLibraries& lib = renderLibraries();
+    const double allowed = std::min(scale, kLongestPng / longestSide(picture));
+    const auto surface =
+        owned(lib.cairo_image_surface_create(CAIRO_FORMAT_ARGB32, pixels(picture.width * allowed),
+                                             pixels(picture.height * allowed)),
+              lib.cairo_surface_destroy);
+    requireSuccess(lib.cairo_surface_status(surface.get()));
+    const auto target = owned(lib.cairo_create(surface.get()), lib.cairo_destroy);
+    lib.cairo_scale(target.get(), allowed, allowed);
+    renderOnto(target.get(), picture);
+    std::string bytes;
+    requireSuccess(lib.cairo_surface_write_to_png_stream(surface.get(), appendBytes, &bytes));
+    return bytes;
+}
+
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title) {
+    const RenderLibraries& lib = renderLibraries();
+    std::string bytes;
+    {
+        const auto surface = owned(lib.cairo_pdf_surface_create_for_stream(appendBytes, &bytes, 1, 1),
+                                   lib.cairo_surface_destroy);
+        lib.cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_TITLE, title.c_str());
+        for (const draw::SvgPicture& page : pages) {
+            const double scale = std::min(kPointsOfPx, kLongestPdf / longestSide(page));
+            lib.cairo_pdf_surface_set_size(surface.get(), page.width * scale, page.height * scale);
+            const auto target = owned(lib.cairo_create(surface.get()), lib.cairo_destroy);
+            lib.cairo_scale(target.get(), scale, scale);
+            renderOnto(target.get(), page);
+            lib.cairo_show_page(target.get());
+        }
+        lib.cairo_surface_finish(surface.get());
+        requireSuccess(lib.cairo_surface_status(surface.get()));
+    }
+    return bytes;
+}
+
+}  // namespace olvane::cli

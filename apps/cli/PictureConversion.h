@@ -1,0 +1,25 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <olvane/draw/SvgDrawing.h>
+
+namespace olvane::cli {
+
+// Other forms of finished pictures. The libraries that do it are opened at the first use, since opening them
+// takes longer than drawing most families does.
+//
+// Fails: throws UsageError where the libraries are not installed, std::runtime_error where they fail.
+
+// A PNG of scale pixels for each px; smaller where a side would be longer than a PNG library takes.
+std::string pngOf(const draw::SvgPicture& picture, double scale);
+
+// A PDF with one page for each picture, of its size at 96 px an inch, in vectors and with its text as text. A
+// page larger than the form allows (14,400 points) is scaled down.
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title);
+
+}  // namespace olvane::cli

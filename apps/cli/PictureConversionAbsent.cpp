@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Stands in for the conversion where the command was built without librsvg and cairo.
+
+#include <cli/PictureConversion.h>
+
+#include <cli/UsageError.h>
+
+namespace olvane::cli {
+
+namespace {
+
+[[noreturn]] void refuse() {
+    throw UsageError("this olvane was built without librsvg and cairo; it writes .svg alone");
+}
+
+}  // namespace
+
+std::string pngOf(const draw::SvgPicture&, double) {
+    refuse();
+}
+
+std::string pdfOf(const std::vector<draw::SvgPicture>&, const std::string&) {
+    refuse();
+}
+
+}  // namespace olvane::cli
