@@ -187,6 +187,15 @@ TEST(FamilyChart, stepChildrenComeThroughTheSpousesOfTheFocus) {
     EXPECT_EQ(110.0f, chart.at(6).y);
 }
 
+TEST(FamilyChart, stepChildrenComeWithTheirSpousesAndChildren) {
+    LaidOutCase chart(
+        "focus 1\nspouses 1 2\nspouses 2 1\nchildren 2 6\nmother 6 2\nspouses 6 7\nspouses 7 6\n"
+        "children 6 8\nchildren 7 8\nfather 8 6\nmother 8 7\n");
+    EXPECT_TRUE(chart.shows(6));
+    EXPECT_TRUE(chart.shows(7));
+    EXPECT_TRUE(chart.shows(8));
+}
+
 TEST(FamilyChart, childrenOfASpousesOtherMarriageAreNoStepChildren) {
     LaidOutCase chart(
         "focus 1\nspouses 1 2\nspouses 2 1 8\nchildren 1 3\nchildren 2 3 9\nchildren 8 9\n"
@@ -254,6 +263,18 @@ TEST_F(FamilyDriver, leavesTheMarksOfItsWalksClean) {
     layouter.layoutForFocusNID();
     EXPECT_TRUE(layouter.stackedPersons.empty());
     layouter.graphIterator([](TreeViewPerson& person) { EXPECT_FALSE(person.hasBeenVisited()); });
+}
+
+// The last question about the focus's spouses comes with the flags; by then nothing is drawn yet.
+TEST_F(FamilyDriver, setsFlagsBeforeItDrawsLines) {
+    data.parents[0] = {1, 2};
+    int asked = 0;
+    adapter.getSpouses = [&asked](int key, SpouseSet&) {
+        if (key == 0 && ++asked == 2) throw std::domain_error("no spouses today");
+    };
+    EXPECT_THROW(layouter.layoutForFocusNID(), std::domain_error);
+    EXPECT_EQ(Segments{}, segmentsOf(focus));
+    EXPECT_EQ((Point{-12.5f, -110.0f}), views::placeOf(focus.getPreferredFather()));
 }
 
 TEST_F(FamilyDriver, failsOnACallbackThatWasLeftEmpty) {

@@ -178,6 +178,13 @@ TEST_F(FamilyFlags, answerAboutAMissingParentMayReplaceTheOneWithANode) {
     EXPECT_TRUE(flagOf(focus));
 }
 
+TEST_F(FamilyFlags, fatherOffTheChartIsHiddenBesideAMotherOnIt) {
+    focus.setParentsMotherOnly(2);
+    data.parents[0] = {8, -1};
+    flagAll();
+    EXPECT_TRUE(flagOf(focus));
+}
+
 TEST_F(FamilyFlags, parentOffTheChartIsHidden) {
     focus.setParentsFatherOnly(1);
     data.parents[0] = {1, 9};

@@ -47,14 +47,14 @@ protected:
         return visits;
     }
     // The parents 1 and 2 with the father's father 3, the wife 4 with a child 9 of her own, a child 5 alone
-    // and 6 with her, and the siblings 7 and 8 around the focus's own entry.
+    // and 6 with her, and the siblings 10, 7 and 8 around the focus's own entry.
     void buildOneOfEachKind() {
         focus.setParents(1, 2);
         focus.getPreferredFather().setParentsFatherOnly(3);
         focus.addSpouse(4, kFemale).addChildWithNoOtherSpouse(9, kMale);
         focus.addChildWithNoOtherSpouse(5, kMale);
         focus.addChildWithSpouse(6, 4, kMale);
-        for (const int key : {7, 0, 8}) focus.addSibling(key, kMale);
+        for (const int key : {10, 7, 0, 8}) focus.addSibling(key, kMale);
     }
 };
 
@@ -77,7 +77,7 @@ TEST_F(FamilyTraversal, loneFocusIsVisitedOnce) {
 
 TEST_F(FamilyTraversal, everybodyIsMetParentsFirstThenSpousesChildrenAndSiblings) {
     buildOneOfEachKind();
-    EXPECT_EQ((Keys{0, 1, 3, 2, 4, 9, 5, 6, 7, 8}), everybody());
+    EXPECT_EQ((Keys{0, 1, 3, 2, 4, 9, 5, 6, 10, 7, 8}), everybody());
 }
 
 TEST_F(FamilyTraversal, secondWalkMeetsTheSamePersonsInTheSameOrder) {
@@ -118,6 +118,7 @@ TEST_F(FamilyTraversal, directLinesLeadUpAndDownAndAsideButToNoSpouse) {
                                   {2, false, {}},
                                   {5, true, {0, 4}},
                                   {6, true, {0, 4}},
+                                  {10, true, {1, 2}},
                                   {7, true, {1, 2}},
                                   {8, true, {1, 2}}}),
               directLines());

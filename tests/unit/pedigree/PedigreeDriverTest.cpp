@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -116,6 +117,16 @@ TEST_F(PedigreeDriver, dataAreAskedInAFixedOrder) {
                          "getSpouses 2", "getChildren 2", "getParents 2",  // the child's flag
                          "getSpouses 1", "getParents 1"}),                 // the wife's flag
               data.questions);
+}
+
+// A parent is asked about spouses only for the flags; by then the lines stand.
+TEST_F(PedigreeDriver, drawsLinesBeforeItSetsFlags) {
+    data.parents[0] = {1, 2};
+    adapter.getSpouses = [](int key, SpouseSet&) {
+        if (key == 1) throw std::domain_error("no spouses today");
+    };
+    EXPECT_THROW(layOut(2), std::domain_error);
+    EXPECT_EQ(3u, focus.lineSegments.size());
 }
 
 TEST_F(PedigreeDriver, failsOnACallbackThatWasLeftEmpty) {

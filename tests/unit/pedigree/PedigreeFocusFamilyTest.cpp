@@ -184,6 +184,14 @@ TEST_F(PedigreeFocusFamily, everyChildIsEnteredAsShown) {
     for (const int key : {1, 2, 5, 6, 7}) EXPECT_EQ(1u, layouter.shownPersons.count(key)) << key;
 }
 
+// Also one whom the data source does not list: what counts is that it hangs under the focus.
+TEST_F(PedigreeFocusFamily, childThatHangsThereAlreadyIsEnteredAsShown) {
+    focus.addChildWithNoOtherSpouse(8, views::kMale);
+    setOut();
+    EXPECT_EQ(1u, layouter.shownPersons.count(8));
+    EXPECT_EQ((Heights{-80}), childHeights(-1));
+}
+
 TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
     tellOfWife(1, {5});
     data.children[1].push_back(8);

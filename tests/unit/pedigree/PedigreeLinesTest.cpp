@@ -241,6 +241,16 @@ TEST_F(PedigreeLines, middleOfTheParentsLineIsCutTowardZero) {
     EXPECT_EQ((Segment{107, -4, 95, -4, false}), segmentsOf(focus).front());
 }
 
+TEST_F(PedigreeLines, ofTwoParentsAreCutTowardZeroThroughout) {
+    place(focus, 27.5f, 0.75f);
+    addBothParents(-99.25f, 10.75f);
+    father().nodeCenter.x = 108.5f;
+    drawParentLines();
+    EXPECT_EQ((Segments{{108, -19, 108, 10, true}}), segmentsOf(father()));
+    EXPECT_EQ((Segments{{108, -4, 95, -4, false}, {95, -4, 95, 40, false}, {95, 40, 82, 40, false}}),
+              segmentsOf(focus));
+}
+
 TEST_F(PedigreeLines, parentsLineStandsAtTheInset) {
     layouter.treeSize.lineInset = 6.0f;
     addBothParents(-100.0f, 10.0f);
@@ -286,6 +296,15 @@ TEST_F(PedigreeLines, ofAMotherAloneTakeTheSameShape) {
     drawParentLines();
     EXPECT_EQ((Segments{{107, 95, 100, 95, false}}), segmentsOf(mother()));
     EXPECT_EQ((Segments{{100, 40, 100, 95, false}, {82.5f, 40, 100, 40, false}}), segmentsOf(focus));
+}
+
+TEST_F(PedigreeLines, ofALoneParentAreCutButForThePersonsRightEdge) {
+    place(focus, 27.5f, 0.75f);
+    focus.setParentsFatherOnly(1);
+    place(father(), 107.75f, 20.75f);
+    drawParentLines();
+    EXPECT_EQ((Segments{{107, 60, 100, 60, false}}), segmentsOf(father()));
+    EXPECT_EQ((Segments{{100, 40, 100, 60, false}, {82.5f, 40, 100, 40, false}}), segmentsOf(focus));
 }
 
 // --- Up through the ancestors.
