@@ -1,0 +1,68 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Memory that runs out at any moment of a call is a status, and nothing is lost with it.
+
+#include <gtest/gtest.h>
+
+#include <support/FamilyText.h>
+#include <unit/bindings-c/CallbackHost.h>
+#include <unit/boundary/AllocationCountdown.h>
+
+namespace {
+
+using support::family;
+using unit::CallbackHost;
+
+// A host that allocates nothing of its own, so that every allocation is the library's.
+olvane_host bareHost() {
+    olvane_host host = {};
+    host.father_of = [](void*, std::int64_t, std::int64_t*) { return 0; };
+    host.mother_of = host.father_of;
+    host.spouses_of = [](void*, std::int64_t person, olvane_person_list* spouses) {
+        const std::int64_t spouse = person == 17 ? 42 : 17;
+        if (person == 17 || person == 42) olvane_person_list_append(spouses, &spouse, 1);
+        return 0;  // a callback that does not look
+    };
+    host.children_of = [](void*, std::int64_t person, olvane_person_list* children) {
+        const std::int64_t child = 5;
+        if (person == 17 || person == 42) olvane_person_list_append(children, &child, 1);
+        return 0;
+    };
+    host.is_preferred_spouse = [](void*, std::int64_t, std::int64_t, int*) { return 0; };
+    host.is_dead = [](void*, std::int64_t, int*) { return 0; };
+    host.date_of = [](void*, std::int64_t, int, olvane_date* date) {
+        olvane_date_set(date, "a date that is too long to lie within its own text");
+        return 0;
+    };
+    host.sex_of = [](void*, std::int64_t person, std::int32_t* sex) {
+        *sex = person == 17 ? 0 : 1;
+        return 0;
+    };
+    return host;
+}
+
+TEST(CMemory, thatRunsOutAnywhereIsAStatus) {
+    const olvane_host host = bareHost();
+    const std::int64_t before = unit::allocationsMade();
+    const unit::Answer whole = unit::familyOf(host, 17);
+    const std::int64_t needed = unit::allocationsMade() - before;
+    ASSERT_EQ(OLVANE_OK, whole.status);
+    ASSERT_GT(needed, 20);
+    const std::string expected = whole.text();
+    for (std::int64_t n = 1; n <= needed; ++n) {
+        const std::int64_t outstanding = unit::allocationsOutstanding();
+        olvane_layout* layout = nullptr;
+        olvane_status status = OLVANE_OK;
+        {
+            const unit::AllocationFailure failure(n);
+            status = olvane_layout_family(&host, 17, nullptr, &layout);
+        }
+        EXPECT_EQ(OLVANE_OUT_OF_MEMORY, status) << n;
+        olvane_layout_free(layout);
+        EXPECT_EQ(outstanding, unit::allocationsOutstanding()) << n;
+    }
+    EXPECT_EQ(expected, unit::familyOf(host, 17).text());
+}
+
+}  // namespace

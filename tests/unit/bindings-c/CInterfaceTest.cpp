@@ -1,0 +1,323 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The C interface gives what the engine gives, tells what went wrong, and lets nothing escape.
+
+#include <algorithm>
+#include <atomic>
+#include <limits>
+#include <set>
+#include <stdexcept>
+#include <string>
+#include <thread>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include <olvane/family/FamilyOptions.h>
+#include <support/CaseRun.h>
+#include <support/FamilyMaker.h>
+#include <support/FamilyText.h>
+#include <unit/bindings-c/CallbackHost.h>
+
+namespace {
+
+using support::CaseFile;
+using support::CaseView;
+using support::family;
+using unit::Answer;
+using unit::CallbackHost;
+using unit::familyOf;
+using unit::layoutOf;
+using unit::pedigreeOf;
+using unit::readerForm;
+
+const char* const kThreeGenerations = "17+42: 5 6f; 3+4: 17 18; 1+2: 3; 5+8: 9";
+
+CaseFile randomRequest(std::uint64_t seed) {
+    support::FamilyMaker maker(seed, 30);
+    if (seed % 3 == 0) maker.strewOddIds();
+    CaseFile request = maker.any();
+    maker.setRequest(request);
+    request.adapter = support::CaseAdapter::host;
+    if (request.view == CaseView::pedigree) {
+        request.maxGenerations = std::max(1, request.maxGenerations);
+        request.maxStackDepth = std::max(0, request.maxStackDepth);
+    }
+    return request;
+}
+
+TEST(CLayout, hasTheTextOfTheEngine) {
+    const CaseFile told = family(kThreeGenerations);
+    const Answer answer = layoutOf(told);
+    EXPECT_EQ(OLVANE_OK, answer.status);
+    EXPECT_NE("", answer.text());
+    EXPECT_EQ(support::layoutText(told), answer.text());
+}
+
+TEST(CLayout, hasTheTextOfTheEngineForManyFamiliesAndRequests) {
+    int complete = 0;
+    int pedigrees = 0;
+    for (std::uint64_t seed = 1; seed <= 400; ++seed) {
+        const CaseFile request = randomRequest(seed);
+        const Answer answer = layoutOf(request);
+        ASSERT_NE(nullptr, answer.layout) << support::formatCase(request);
+        ASSERT_EQ(support::layoutText(request), answer.text()) << support::formatCase(request);
+        complete += answer.status == OLVANE_OK ? 1 : 0;
+        pedigrees += request.view == CaseView::pedigree ? 1 : 0;
+    }
+    EXPECT_GT(complete, 200);
+    EXPECT_GT(pedigrees, 20);
+}
+
+TEST(CLayout, asksTheSameQuestionsAsTheEngine) {
+    CallbackHost host(family(kThreeGenerations), true);
+    ASSERT_EQ(OLVANE_OK, familyOf(host.callbacks(), 17).status);
+    std::vector<std::string> calls = support::runCase(family(kThreeGenerations), false, true);
+    calls.erase(calls.begin());  // the text
+    EXPECT_EQ(calls, host.source.trace());
+}
+
+TEST(CRecords, sayWhatTheTextSays) {
+    std::size_t addNodes = 0;
+    for (std::uint64_t seed = 1; seed <= 100; ++seed) {
+        const Answer answer = layoutOf(randomRequest(seed));
+        std::vector<olvane::LayoutRecord> records;
+        for (const olvane_record& record : answer.records()) {
+            records.push_back(readerForm(record));
+            addNodes += record.kind == OLVANE_PERSON ? 0 : 1;
+            EXPECT_EQ(record.segment_count == 0, record.segments == nullptr);
+        }
+        ASSERT_EQ(olvane::readWholeRecords(answer.text()).records, records);
+    }
+    EXPECT_GT(addNodes, 100u);
+}
+
+TEST(CRecords, tellForWhomAnAddNodeStands) {
+    const Answer answer = layoutOf(family("17"));
+    const std::vector<olvane_record> records = answer.records();
+    ASSERT_EQ(3u, records.size());
+    EXPECT_EQ(OLVANE_PERSON, records[0].kind);
+    EXPECT_EQ(0, records[0].child);
+    EXPECT_EQ(OLVANE_MISSING_FATHER, records[1].kind);
+    EXPECT_EQ(-1, records[1].id);
+    EXPECT_EQ(17, records[1].child);
+    EXPECT_EQ(OLVANE_MISSING_MOTHER, records[2].kind);
+}
+
+TEST(CRecords, holdTheWholeOnesOfACutText) {
+    CaseFile told = family("17+42: 5");
+    told.children[17] = {5, -9};
+    const Answer answer = layoutOf(told);
+    EXPECT_EQ(OLVANE_LAYOUT_FAILED, answer.status);
+    EXPECT_EQ(olvane::readWholeRecords(answer.text()).records.size(), answer.records().size());
+}
+
+TEST(COptions, standAtWhatTheEngineTakes) {
+    olvane_options options;
+    ASSERT_EQ(OLVANE_OK, olvane_options_default(&options));
+    CallbackHost host(family(kThreeGenerations));
+    EXPECT_EQ(familyOf(host.callbacks(), 17).text(), familyOf(host.callbacks(), 17, &options).text());
+    EXPECT_EQ(pedigreeOf(host.callbacks(), 17).text(), pedigreeOf(host.callbacks(), 17, &options).text());
+    EXPECT_EQ(55.0f, options.sizes.node_width);
+    EXPECT_EQ(5, options.generations);
+}
+
+TEST(COptions, leaveOutWhomTheyName) {
+    using namespace SharedTreeViewer;
+    const std::vector<std::string> keys = {
+        kTreeViewFamShowAuntsUnclesKey,       kTreeViewFamShowCousinsKey,
+        kTreeViewFamShowSiblingsKey,          kTreeViewFamShowSiblingSpousesKey,
+        kTreeViewFamShowNeicesNephewsKey,     kTreeViewFamShowGrandchildrenKey,
+        kTreeViewFamShowGreatGrandparentsKey, kTreeViewFamShowSpousesOfChildrenKey};
+    const CaseFile everybody =
+        family("17+42: 5; 5+50: 51; 3+4: 17 18; 18+80: 81; 1+2: 3 7; 7+70: 71; 11+12: 1");
+    const std::string whole = layoutOf(everybody).text();
+    std::set<std::string> texts;
+    for (const std::string& key : keys) {
+        CaseFile request = everybody;
+        request.options[key] = false;
+        const std::string text = layoutOf(request).text();
+        EXPECT_NE(whole, text) << key;
+        EXPECT_EQ(support::layoutText(request), text) << key;
+        texts.insert(text);
+    }
+    EXPECT_EQ(keys.size(), texts.size());
+}
+
+TEST(COptions, outOfTheirRangeAreRefused) {
+    CallbackHost host(family("17"));
+    const auto statusWith = [&host](auto change) {
+        olvane_options options;
+        olvane_options_default(&options);
+        change(options);
+        const Answer answer = pedigreeOf(host.callbacks(), 17, &options);
+        EXPECT_EQ(answer.status == OLVANE_OK, answer.layout != nullptr);
+        return answer.status;
+    };
+    EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options&) {}));
+    EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options& o) { o.generations = 1; }));
+    EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options& o) { o.flag_depth = 0; }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.generations = 0; }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.flag_depth = -1; }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.shown = 0x100u; }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) {
+                  o.sizes.line_inset = std::numeric_limits<float>::quiet_NaN();
+              }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) {
+                  o.sizes.node_width = std::numeric_limits<float>::infinity();
+              }));
+}
+
+TEST(CFailures, ofAnyCallbackAtAnyTimeAreReported) {
+    CallbackHost sound(family(kThreeGenerations));
+    ASSERT_EQ(OLVANE_OK, familyOf(sound.callbacks(), 17).status);
+    for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
+        const auto operation = static_cast<support::HostOperation>(i);
+        const std::int64_t calls = sound.source.callCount(operation);
+        ASSERT_GT(calls, 0);
+        for (const std::int64_t nth : {std::int64_t{1}, (calls + 1) / 2, calls}) {
+            CaseFile told = family(kThreeGenerations);
+            told.failures[operation].insert(nth);
+            const Answer answer = layoutOf(told);
+            EXPECT_EQ(OLVANE_HOST_FAILED, answer.status);
+            EXPECT_EQ(unit::kHostCode, answer.hostCode());
+            EXPECT_EQ(support::layoutText(told), answer.text());
+        }
+    }
+}
+
+TEST(CFailures, leaveNoCodeWhereTheHostIsSound) {
+    EXPECT_EQ(0, layoutOf(family("17")).hostCode());
+}
+
+TEST(CFailures, ofACallbackThatThrowsCountAsItsOwn) {
+    CallbackHost host(family("17"));
+    olvane_host callbacks = host.callbacks();
+    callbacks.sex_of = [](void*, std::int64_t, std::int32_t*) -> int { throw std::runtime_error("thrown"); };
+    const Answer answer = familyOf(callbacks, 17);
+    EXPECT_EQ(OLVANE_HOST_FAILED, answer.status);
+    EXPECT_EQ(-1, answer.hostCode());
+    EXPECT_EQ("", answer.text());
+}
+
+TEST(CFailures, ofMissingCallbacksAreSeenBeforeTheFirstQuestion) {
+    CallbackHost host(family("17"));
+    const auto statusWithout = [&host](auto member) {
+        olvane_host callbacks = host.callbacks();
+        callbacks.*member = nullptr;
+        return familyOf(callbacks, 17).status;
+    };
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::father_of));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::mother_of));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::spouses_of));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::children_of));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::is_preferred_spouse));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::is_dead));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::date_of));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWithout(&olvane_host::sex_of));
+    EXPECT_EQ(0, host.source.callCount());
+}
+
+TEST(CFailures, ofNullPointersAreStatuses) {
+    CallbackHost host(family("17"));
+    const olvane_host callbacks = host.callbacks();
+    olvane_layout* layout = reinterpret_cast<olvane_layout*>(&host);
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_family(nullptr, 17, nullptr, &layout));
+    EXPECT_EQ(nullptr, layout);
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_pedigree(&callbacks, 17, nullptr, nullptr));
+    const char* text = nullptr;
+    const olvane_record* records = nullptr;
+    std::size_t count = 0;
+    int code = 0;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_text(nullptr, &text, nullptr));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_records(nullptr, &records, &count));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_host_code(nullptr, &code));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_options_default(nullptr));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_person_list_append(nullptr, nullptr, 0));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_date_set(nullptr, "1850"));
+    const Answer answer = familyOf(callbacks, 17);
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_text(answer.layout.get(), nullptr, &count));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_records(answer.layout.get(), &records, nullptr));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_layout_host_code(answer.layout.get(), nullptr));
+    olvane_layout_free(nullptr);
+}
+
+TEST(CFailures, ofNullListsAndDatesAreTold) {
+    CallbackHost host(family("17+42"));
+    olvane_host callbacks = host.callbacks();
+    callbacks.children_of = [](void*, std::int64_t, olvane_person_list* children) {
+        EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_person_list_append(children, nullptr, 3));
+        EXPECT_EQ(OLVANE_OK, olvane_person_list_append(children, nullptr, 0));
+        return 0;
+    };
+    callbacks.date_of = [](void*, std::int64_t, int, olvane_date* date) {
+        EXPECT_EQ(OLVANE_OK, olvane_date_set(date, nullptr));
+        return 0;
+    };
+    EXPECT_EQ(familyOf(host.callbacks(), 17).text(), familyOf(callbacks, 17).text());
+}
+
+TEST(CFailures, haveATextForEachStatus) {
+    std::set<std::string> texts;
+    for (int status = OLVANE_OK; status <= OLVANE_NESTED_CALL; ++status) {
+        texts.insert(olvane_status_text(static_cast<olvane_status>(status)));
+    }
+    EXPECT_EQ(7u, texts.size());
+    const std::string beyond = olvane_status_text(static_cast<olvane_status>(7));
+    EXPECT_EQ(0u, texts.count(beyond));
+    EXPECT_NE(std::string::npos, beyond.find("not a status"));
+}
+
+TEST(CFocus, countsByTheLow32BitsOfItsId) {
+    CallbackHost host(family(kThreeGenerations));
+    const std::string text = familyOf(host.callbacks(), 17).text();
+    EXPECT_EQ(text, familyOf(host.callbacks(), 17 + (std::int64_t{5} << 32)).text());
+    for (const std::int64_t id : {std::int64_t{0}, std::int64_t{-17}, std::int64_t{1} << 32}) {
+        const Answer answer = familyOf(host.callbacks(), id);
+        EXPECT_EQ(OLVANE_INVALID_PERSON, answer.status) << id;
+        EXPECT_EQ("", answer.text());
+        EXPECT_TRUE(answer.records().empty());
+    }
+}
+
+struct NestedHost {
+    CallbackHost host;
+    olvane_host callbacks;
+    olvane_status inner = OLVANE_OK;
+};
+
+TEST(CNesting, isRefusedAndLeavesTheOuterLayoutAlone) {
+    NestedHost nested{CallbackHost(family("17")), {}};
+    olvane_host callbacks = nested.host.callbacks();
+    nested.callbacks = callbacks;
+    callbacks.context = &nested;
+    callbacks.sex_of = [](void* context, std::int64_t, std::int32_t*) {
+        NestedHost& outer = *static_cast<NestedHost*>(context);
+        outer.inner = familyOf(outer.callbacks, 17).status;
+        return 1;
+    };
+    EXPECT_EQ(OLVANE_HOST_FAILED, familyOf(callbacks, 17).status);
+    EXPECT_EQ(OLVANE_NESTED_CALL, nested.inner);
+    EXPECT_EQ(OLVANE_OK, familyOf(nested.callbacks, 17).status);
+}
+
+TEST(CThreads, layOutTheirOwnFamiliesAtOnce) {
+    const std::vector<CaseFile> families = {family("17"), family(kThreeGenerations)};
+    std::atomic<int> differences{0};
+    const auto run = [&differences](const CaseFile& told) {
+        const std::string expected = support::layoutText(told);
+        for (int i = 0; i < 100; ++i) differences += layoutOf(told).text() == expected ? 0 : 1;
+    };
+    std::thread first([&] { run(families[0]); });
+    std::thread second([&] { run(families[1]); });
+    first.join();
+    second.join();
+    EXPECT_EQ(0, differences);
+}
+
+TEST(CVersion, hasThreeNumbers) {
+    EXPECT_EQ(std::string(OLVANE_EXPECTED_VERSION), olvane_version());
+}
+
+}  // namespace
