@@ -1,0 +1,41 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+"""What a host answers."""
+
+from __future__ import annotations
+
+from collections.abc import Iterable
+from typing import Protocol
+
+
+class Host(Protocol):
+    """The eight questions of a layout. Any object with these methods will do; none need derive from this class.
+
+    Ids are the host's own, 1 and more for real persons; only their low 32 bits count. The methods are asked many times
+    for the same person, since no answer is kept, and must agree with themselves within one layout. A method may raise:
+    the layout then ends with :class:`HostError`.
+    """
+
+    def father_of(self, person: int) -> int | None:
+        """The id of the father, or None where he is not known."""
+
+    def mother_of(self, person: int) -> int | None:
+        """The id of the mother, or None where she is not known."""
+
+    def spouses_of(self, person: int) -> Iterable[int]:
+        """The ids of the spouses, in the order of drawing."""
+
+    def children_of(self, person: int) -> Iterable[int]:
+        """The ids of the children."""
+
+    def is_preferred_spouse(self, person: int, spouse: int) -> bool:
+        """Whether the second is the preferred spouse of the first."""
+
+    def is_dead(self, person: int) -> bool:
+        """Whether the person is dead."""
+
+    def date_of(self, person: int, is_birth: bool) -> str:
+        """The date of birth, asked of children, or another date, asked of spouses; in any form, empty if not known."""
+
+    def sex_of(self, person: int) -> int:
+        """0 for male; any other number counts as female."""

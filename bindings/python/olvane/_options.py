@@ -1,0 +1,56 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+"""What a host can choose."""
+
+from __future__ import annotations
+
+from dataclasses import dataclass, field
+from enum import Enum, IntFlag
+
+
+class View(Enum):
+    """FAMILY: relatives above, beside and below. PEDIGREE: ancestors, lying sideways."""
+
+    FAMILY = "family"
+    PEDIGREE = "pedigree"
+
+
+class Shown(IntFlag):
+    """Relatives that a family view shows."""
+
+    AUNTS_UNCLES = 0x01
+    COUSINS = 0x02  # needs aunts and uncles
+    SIBLINGS = 0x04
+    SIBLING_SPOUSES = 0x08
+    NIECES_NEPHEWS = 0x10
+    GRANDCHILDREN = 0x20
+    GREAT_GRANDPARENTS = 0x40
+    SPOUSES_OF_CHILDREN = 0x80
+    ALL = 0xFF
+
+
+@dataclass(frozen=True)
+class Sizes:
+    """The sizes of the drawing, in points; all are finite."""
+
+    node_width: float = 55.0
+    node_height: float = 80.0
+    horz_padding: float = 25.0  # gap between boxes of a row
+    vert_padding: float = 30.0  # gap between generations
+    spouse_line_step: float = 10.0  # between the stacked lines of one person's marriages
+    line_inset: float = 0.0  # of a marriage line from a box's left edge; read by the pedigree alone
+
+
+@dataclass(frozen=True)
+class Options:
+    """Choices of one layout.
+
+    shown is read by the family view. generations counts a pedigree's columns, the focus's own included; a full ancestry
+    of n columns is 2**n - 1 boxes. flag_depth counts the generations of a pedigree, the focus's own included, in which
+    a parent's partners who are off the chart raise the flag.
+    """
+
+    sizes: Sizes = field(default_factory=Sizes)
+    shown: Shown = Shown.ALL
+    generations: int = 5
+    flag_depth: int = 4
