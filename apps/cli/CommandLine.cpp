@@ -7,7 +7,6 @@
 #include <cli/CommandLine.h>
 
 #include <exception>
-#include <iostream>
 #include <map>
 #include <new>
 
@@ -16,6 +15,7 @@
 #include <olvane/family/FamilyOptions.h>
 
 #include <cli/Commands.h>
+#include <cli/Messages.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -96,6 +96,16 @@ void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defa
         ->type_name("tall|wide");
 }
 
+void addHideLiving(CLI::App& command, bool& hideLiving, int& year) {
+    command.add_flag(
+        "--hide-living", hideLiving,
+        "Tell nothing of whoever may be alive but 'Living': no death told and born less than 110 years "
+        "ago, or dates that cannot tell and near kin of such a person");
+    command.add_option("--year", year, "The year that --hide-living counts from; this year if not given")
+        ->check(CLI::Range(1, 9999))
+        ->type_name("YEAR");
+}
+
 // The subcommands with what they were given.
 class CommandLine {
 public:
@@ -106,6 +116,8 @@ public:
         addPeople();
         addLayout();
         addDraw();
+        addBatch();
+        addCheck();
     }
 
     int run(int argc, char** argv) {
@@ -115,7 +127,9 @@ public:
             return app_.exit(error) == 0 ? 0 : kWrongUse;
         }
         if (people_->parsed()) return runPeople(peopleOptions_);
-        if (layout_->parsed()) return runLayout(layoutOptions_);
+        if (layout_->parsed()) return runLayout(completedLayoutOptions());
+        if (batch_->parsed()) return runBatch(batchOptions_);
+        if (check_->parsed()) return runCheck(checkOptions_);
         return runDraw(completedDrawOptions());
     }
 
@@ -133,8 +147,16 @@ private:
         layout_ = app_.add_subcommand("layout", "Print where everybody stands, as the engine's result text");
         addFile(*layout_, layoutOptions_.file);
         addFocus(*layout_, layoutOptions_.focus);
+        layout_
+            ->add_option(
+                "--format", layoutFormat_,
+                "text: a record for each box on one line (default); json: each field by name, with names "
+                "and dates of the persons")
+            ->check(CLI::IsMember({"text", "json"}))
+            ->type_name("text|json");
         addView(*layout_, layoutOptions_.request);
         addBoxes(*layout_, layoutOptions_.request, "default tall");
+        addHideLiving(*layout_, layoutOptions_.hideLiving, layoutOptions_.year);
         addFamilySwitches(*layout_, layoutOptions_.request);
     }
 
@@ -163,16 +185,47 @@ private:
                 "them all; other forms become OUT-1, OUT-2 and so on")
             ->check(CLI::IsMember({"A4", "A3", "letter"}))
             ->type_name("A4|A3|letter");
-        draw_->add_flag(
-            "--hide-living", drawOptions_.hideLiving,
-            "Draw as 'Living', without name, sex and dates, whoever may be alive: no death told and "
-            "born less than 110 years ago, or dates that cannot tell and near kin of such a person");
-        draw_
-            ->add_option("--year", drawOptions_.year,
-                         "The year that --hide-living counts from; this year if not given")
-            ->check(CLI::Range(1, 9999))
-            ->type_name("YEAR");
+        addHideLiving(*draw_, drawOptions_.hideLiving, drawOptions_.year);
         addFamilySwitches(*draw_, drawOptions_.request);
+    }
+
+    void addBatch() {
+        batch_ = app_.add_subcommand("batch",
+                                     "Print many layouts: id, a tab and the result text on a line for each");
+        addFile(*batch_, batchOptions_.file);
+        batch_
+            ->add_option(
+                "--focus-from", batchOptions_.focusFrom,
+                "File with the focuses, an id or xref on each line; - for the standard input. Everybody "
+                "when not given")
+            ->type_name("FROM");
+        addView(*batch_, batchOptions_.request);
+        addBoxes(*batch_, batchOptions_.request, "default tall");
+        addFamilySwitches(*batch_, batchOptions_.request);
+    }
+
+    void addCheck() {
+        check_ =
+            app_.add_subcommand("check", "Tell what is wrong or odd in a file, or hard to read in a layout");
+        addFile(*check_, checkOptions_.file);
+        CLI::Option* focus =
+            check_
+                ->add_option(
+                    "--focus", checkOptions_.focus,
+                    "Look at this person's layout: boxes that overlap, lines through boxes, two families' "
+                    "lines on one track, persons in several boxes")
+                ->type_name("WHO");
+        check_->add_flag("--all", checkOptions_.all, "Look at everybody's layout, a line of counts for each")
+            ->excludes(focus);
+        addView(*check_, checkOptions_.request);
+        addBoxes(*check_, checkOptions_.request, "default tall");
+        addFamilySwitches(*check_, checkOptions_.request);
+    }
+
+    LayoutOptions completedLayoutOptions() const {
+        LayoutOptions options = layoutOptions_;
+        options.json = layoutFormat_ == "json";
+        return options;
     }
 
     DrawOptions completedDrawOptions() const {
@@ -187,9 +240,14 @@ private:
     CLI::App* people_ = nullptr;
     CLI::App* layout_ = nullptr;
     CLI::App* draw_ = nullptr;
+    CLI::App* batch_ = nullptr;
+    CLI::App* check_ = nullptr;
     PeopleOptions peopleOptions_;
     LayoutOptions layoutOptions_;
+    std::string layoutFormat_ = "text";
     DrawOptions drawOptions_;
+    BatchOptions batchOptions_;
+    CheckOptions checkOptions_;
 };
 
 }  // namespace
@@ -198,11 +256,11 @@ int runCommand(int argc, char** argv) {
     try {
         return CommandLine().run(argc, argv);
     } catch (const UsageError& error) {
-        std::cerr << "olvane: " << error.what() << '\n';
+        tell(error.what());
     } catch (const std::bad_alloc&) {
-        std::cerr << "olvane: not enough memory\n";
+        tell("not enough memory");
     } catch (const std::exception& error) {
-        std::cerr << "olvane: " << error.what() << '\n';
+        tell(error.what());
     }
     return kWrongUse;
 }

@@ -21,6 +21,9 @@ struct PeopleOptions {
 struct LayoutOptions {
     std::string file;
     std::string focus;
+    bool json = false;
+    bool hideLiving = false;
+    int year = 0;  // as with DrawOptions
     LayoutRequest request;
 };
 
@@ -36,8 +39,23 @@ struct DrawOptions {
     int year = 0;  // the present one for hideLiving; 0 asks the clock
 };
 
+struct BatchOptions {
+    std::string file;
+    std::string focusFrom;  // file of ids, "-" for the standard input; empty for everybody
+    LayoutRequest request;
+};
+
+struct CheckOptions {
+    std::string file;
+    std::string focus;  // empty for the data alone
+    bool all = false;   // the layouts of everybody
+    LayoutRequest request;
+};
+
 int runPeople(const PeopleOptions& options);
 int runLayout(const LayoutOptions& options);
 int runDraw(const DrawOptions& options);
+int runBatch(const BatchOptions& options);
+int runCheck(const CheckOptions& options);
 
 }  // namespace olvane::cli

@@ -1,12 +1,14 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Prints the layout of one person as the engine's result text.
+// Prints the layout of one person, as the engine's result text or as JSON.
 
 #include <cli/Commands.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
+#include <cli/LayoutJson.h>
+#include <cli/LivingPersons.h>
 #include <cli/OutputFile.h>
 
 namespace olvane::cli {
@@ -14,7 +16,14 @@ namespace olvane::cli {
 int runLayout(const LayoutOptions& options) {
     const gedcom::GedcomData data = readFile(options.file);
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    writeStandardOutput(layoutText(data, focus, options.request) + "\n");
+    std::string text = layoutText(data, focus, options.request);
+    if (options.json) {
+        std::vector<bool> living;
+        if (options.hideLiving)
+            living = livingPersons(data, options.year != 0 ? options.year : currentYear());
+        text = layoutJson(data, focus, options.request, readLayoutText(text), living);
+    }
+    writeStandardOutput(text + "\n");
     return 0;
 }
 

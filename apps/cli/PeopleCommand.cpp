@@ -5,12 +5,11 @@
 
 #include <cli/Commands.h>
 
-#include <iostream>
-
 #include <olvane/gedcom/PersonSearch.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
+#include <cli/Messages.h>
 #include <cli/OutputFile.h>
 
 namespace olvane::cli {
@@ -39,10 +38,8 @@ int runPeople(const PeopleOptions& options) {
     for (const gedcom::PersonId id : persons) text += personLine(data, id) + "\n";
     writeStandardOutput(text);
     if (!persons.empty()) return 0;
-    std::cerr << "olvane: " << options.file << ": "
-              << (words.empty() ? std::string("no person in this file")
-                                : "no person is called '" + words + "'")
-              << '\n';
+    tell(options.file + ": " +
+         (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));
     return 1;
 }
 

@@ -136,7 +136,7 @@ SvgPicture sheetOf(const SvgPicture& picture, const Grid& grid, int column, int 
         "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
         px(grid.sheet.width / kPxOfMm) + "mm\" height=\"" + px(grid.sheet.height / kPxOfMm) +
         "mm\" viewBox=\"0 0 " + px(grid.sheet.width) + " " + px(grid.sheet.height) + "\">\n<title>" +
-        escaped(title) + "</title>\n";
+        escaped(title) + "</title>\n<rect width=\"100%\" height=\"100%\" fill=\"#ffffff\"/>\n";
     sheet.svg += windowOf(picture, grid, column, row);
     if (grid.count() > 1) {
         appendSeams(sheet.svg, grid, column, row);

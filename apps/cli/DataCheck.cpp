@@ -1,0 +1,207 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Looks through the data for what will make a tree look odd. Dates are compared as spans of years, wide where
+// a date says "about", open where it says "before" or "after", so that only what cannot be is told.
+
+#include <cli/DataCheck.h>
+
+#include <algorithm>
+#include <cstdint>
+#include <limits>
+#include <span>
+#include <string_view>
+#include <utility>
+
+#include <cli/OwnAncestors.h>
+
+namespace olvane::cli {
+
+namespace {
+
+using gedcom::FamilyId;
+using gedcom::GedcomData;
+using gedcom::PersonId;
+
+constexpr int kAboutYears = 5;
+constexpr int kLongestLife = 120;
+constexpr int kYoungestParent = 12;
+constexpr int kOldestMother = 60;
+constexpr int kOldestFather = 90;
+
+// Years that a date may stand for; all of them for one that is not known.
+struct Years {
+    int first = std::numeric_limits<std::int16_t>::min();
+    int last = std::numeric_limits<std::int16_t>::max();
+};
+
+Years yearsOf(const gedcom::GedcomDate& date) {
+    Years years;
+    if (!date.isRead()) return years;
+    switch (date.mark) {
+        case gedcom::DateMark::exact:
+            return {date.year, date.year};
+        case gedcom::DateMark::about:
+            return {date.year - kAboutYears, date.year + kAboutYears};
+        case gedcom::DateMark::before:
+            years.last = date.year;
+            return years;
+        case gedcom::DateMark::after:
+            years.first = date.year;
+            return years;
+        case gedcom::DateMark::between:
+            return {date.year, date.lastYear};
+    }
+    return years;
+}
+
+std::string tagOf(std::string_view xref) {
+    return xref.empty() ? "(no xref)" : "@" + std::string(xref) + "@";
+}
+
+class DataChecker {
+public:
+    explicit DataChecker(const GedcomData& data) : data_(data) {}
+
+    std::vector<DataFinding> check() {
+        for (PersonId id = 1; id <= data_.personCount(); ++id) checkPerson(id);
+        for (FamilyId id = 1; id <= data_.familyCount(); ++id) checkFamily(id);
+        findOwnAncestors();
+        std::stable_sort(findings_.begin(), findings_.end(),
+                         [](const DataFinding& a, const DataFinding& b) { return a.line < b.line; });
+        return std::move(findings_);
+    }
+
+private:
+    void tell(gedcom::LineNumber line, const std::string& text) { findings_.push_back({line, text}); }
+
+    std::string named(PersonId id) const {
+        return tagOf(data_.person(id).xref) + " " + gedcom::displayName(data_.firstName(id));
+    }
+    std::string namedFamily(FamilyId id) const { return tagOf(data_.family(id).xref); }
+
+    void checkPerson(PersonId id) {
+        checkParentLinks(id);
+        checkCoupleLinks(id);
+        checkLife(id);
+        checkBirthAgainstParent(id, data_.person(id).father, kOldestFather, 1);
+        checkBirthAgainstParent(id, data_.person(id).mother, kOldestMother, 0);
+    }
+
+    void checkParentLinks(PersonId id) {
+        const auto links = data_.parentLinks(id);
+        std::size_t births = 0;
+        for (const gedcom::FamilyLink& link : links) {
+            if (link.family == 0) continue;
+            if (!hasChild(link.family, id)) {
+                tell(link.line, named(id) + " names " + namedFamily(link.family) +
+                                    " as parents, which does not list the child");
+            }
+            const bool byBirth =
+                link.pedigree == gedcom::Pedigree::birth || link.pedigree == gedcom::Pedigree::notGiven;
+            if (byBirth && ++births == 2) {
+                tell(link.line, named(id) + " is a child in two families; the first one is drawn");
+            }
+        }
+    }
+
+    bool hasChild(FamilyId family, PersonId child) const {
+        const auto links = data_.childLinks(family);
+        return std::any_of(links.begin(), links.end(),
+                           [child](const gedcom::ChildLink& link) { return link.child == child; });
+    }
+
+    void checkCoupleLinks(PersonId id) {
+        for (const gedcom::FamilyLink& link : data_.coupleLinks(id)) {
+            if (link.family == 0) continue;
+            const gedcom::Family& family = data_.family(link.family);
+            if (family.husband != id && family.wife != id) {
+                tell(link.line, named(id) + " names " + namedFamily(link.family) +
+                                    " as marriage, which does not name the partner");
+            }
+        }
+    }
+
+    void checkLife(PersonId id) {
+        const gedcom::Person& person = data_.person(id);
+        if (!person.birth.isRead() || !person.death.isRead()) return;
+        const Years birth = yearsOf(person.birth);
+        const Years death = yearsOf(person.death);
+        if (death.last < birth.first) {
+            tell(person.line, named(id) + " died before being born");
+        } else if (death.first - birth.last > kLongestLife) {
+            tell(person.line, named(id) + " lived for more than " + std::to_string(kLongestLife) + " years");
+        }
+    }
+
+    // yearsAfterDeath: how long after this parent's death a child can be born.
+    void checkBirthAgainstParent(PersonId id, PersonId parent, int oldest, int yearsAfterDeath) {
+        if (parent == 0 || !data_.person(id).birth.isRead()) return;
+        const Years birth = yearsOf(data_.person(id).birth);
+        const Years parentBirth = yearsOf(data_.person(parent).birth);
+        const Years parentDeath = yearsOf(data_.person(parent).death);
+        const gedcom::LineNumber line = data_.person(id).line;
+        if (birth.last < parentBirth.first) {
+            tell(line, named(id) + " was born before the parent " + named(parent));
+        } else if (birth.last - parentBirth.first < kYoungestParent) {
+            tell(line, named(id) + " has a parent younger than " + std::to_string(kYoungestParent) + ", " +
+                           named(parent));
+        } else if (birth.first - parentBirth.last > oldest) {
+            tell(line,
+                 named(id) + " has a parent older than " + std::to_string(oldest) + ", " + named(parent));
+        } else if (birth.first > parentDeath.last + yearsAfterDeath) {
+            tell(line, named(id) + " was born after the death of the parent " + named(parent));
+        }
+    }
+
+    void checkFamily(FamilyId id) {
+        const gedcom::Family& family = data_.family(id);
+        checkPartner(id, family.husband, family.husbandLine);
+        if (family.wife != family.husband) checkPartner(id, family.wife, family.wifeLine);
+        for (const gedcom::ChildLink& link : data_.childLinks(id)) checkChild(id, link);
+    }
+
+    void checkPartner(FamilyId id, PersonId partner, gedcom::LineNumber line) {
+        if (partner == 0) return;
+        const gedcom::Family& family = data_.family(id);
+        if (!namesFamily(data_.coupleLinks(partner), id)) {
+            tell(line,
+                 namedFamily(id) + " names " + named(partner) + " as partner, who does not name the family");
+        }
+        if (family.marriage.isRead() &&
+            yearsOf(family.marriage).last < yearsOf(data_.person(partner).birth).first) {
+            tell(family.line, named(partner) + " married before being born");
+        }
+        if (family.marriage.isRead() &&
+            yearsOf(family.marriage).first > yearsOf(data_.person(partner).death).last) {
+            tell(family.line, named(partner) + " married after dying");
+        }
+    }
+
+    void checkChild(FamilyId id, const gedcom::ChildLink& link) {
+        if (link.child == 0 || namesFamily(data_.parentLinks(link.child), id)) return;
+        tell(link.line,
+             namedFamily(id) + " lists " + named(link.child) + " as a child, who does not name the family");
+    }
+
+    static bool namesFamily(std::span<const gedcom::FamilyLink> links, FamilyId family) {
+        return std::any_of(links.begin(), links.end(),
+                           [family](const gedcom::FamilyLink& link) { return link.family == family; });
+    }
+
+    void findOwnAncestors() {
+        for (const PersonId id : ownAncestors(data_))
+            tell(data_.person(id).line, named(id) + " is their own ancestor");
+    }
+
+    const GedcomData& data_;
+    std::vector<DataFinding> findings_;
+};
+
+}  // namespace
+
+std::vector<DataFinding> checkData(const GedcomData& data) {
+    return DataChecker(data).check();
+}
+
+}  // namespace olvane::cli

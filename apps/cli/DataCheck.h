@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <olvane/gedcom/GedcomData.h>
+
+namespace olvane::cli {
+
+// Something in the data that will make a tree look odd, and the line that it comes from.
+struct DataFinding {
+    gedcom::LineNumber line = 0;
+    std::string text;  // names persons and families by their xrefs
+};
+
+// Everything odd in the data, in the order of the lines: links that one side alone tells, persons in two
+// families as a child, people who are their own ancestors, dates that cannot be.
+std::vector<DataFinding> checkData(const gedcom::GedcomData& data);
+
+}  // namespace olvane::cli

@@ -1,0 +1,96 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Layouts for other programs, in words.
+
+#include <cli/LayoutJson.h>
+
+#include <nlohmann/json.hpp>
+
+namespace olvane::cli {
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+constexpr int kFormatVersion = 1;
+
+const char* sexName(gedcom::Sex sex) {
+    switch (sex) {
+        case gedcom::Sex::male:
+            return "male";
+        case gedcom::Sex::female:
+            return "female";
+        case gedcom::Sex::other:
+            break;
+    }
+    return "other";
+}
+
+// As written and, where it could be read, in the form that sorts.
+Json dateJson(const gedcom::GedcomDate& date) {
+    Json json;
+    json["written"] = std::string(date.written);
+    if (date.isRead()) {
+        json["year"] = date.year;
+        json["sort"] = gedcom::sortText(date);
+    }
+    json["shown"] = gedcom::displayYear(date);
+    return json;
+}
+
+Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id) {
+    const gedcom::Person& person = data.person(id);
+    const gedcom::PersonName& name = data.firstName(id);
+    Json json;
+    json["xref"] = std::string(person.xref);
+    json["name"] = gedcom::displayName(name);
+    json["given"] = std::string(name.given);
+    json["surname"] = std::string(name.surname);
+    json["sex"] = sexName(person.sex);
+    json["dead"] = person.dead;
+    if (person.birth.isGiven()) json["birth"] = dateJson(person.birth);
+    if (person.death.isGiven()) json["death"] = dateJson(person.death);
+    return json;
+}
+
+Json segmentJson(const LayoutSegment& segment) {
+    return {{"x1", segment.x1}, {"y1", segment.y1}, {"x2", segment.x2}, {"y2", segment.y2}};
+}
+
+Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const std::vector<bool>& living) {
+    Json json;
+    json["id"] = record.id;
+    json["x"] = record.x;
+    json["y"] = record.y;
+    json["hasHiddenRelatives"] = record.hasHiddenRelatives;
+    json["segments"] = Json::array();
+    for (const LayoutSegment& segment : record.segments) json["segments"].push_back(segmentJson(segment));
+    if (record.addNode) {
+        json["addNode"] = {{"sex", record.addNode->male ? "male" : "female"},
+                           {"child", record.addNode->childId}};
+    } else if (!living.empty() && living[static_cast<std::size_t>(record.id - 1)]) {
+        json["living"] = true;
+    } else {
+        json["person"] = personJson(data, static_cast<gedcom::PersonId>(record.id));
+    }
+    return json;
+}
+
+}  // namespace
+
+std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
+                       const std::vector<LayoutRecord>& records, const std::vector<bool>& living) {
+    const TreeSize size = sizeOf(request.boxes);
+    Json json;
+    json["format"] = kFormatVersion;
+    json["view"] = request.view == View::pedigree ? "pedigree" : "family";
+    json["focus"] = focus;
+    json["boxWidth"] = static_cast<int>(size.nodeWidth);
+    json["boxHeight"] = static_cast<int>(size.nodeHeight);
+    json["boxes"] = Json::array();
+    for (const LayoutRecord& record : records) json["boxes"].push_back(boxJson(data, record, living));
+    return json.dump(1, ' ', false, Json::error_handler_t::replace);
+}
+
+}  // namespace olvane::cli

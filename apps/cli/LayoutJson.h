@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/host/LayoutText.h>
+
+#include <cli/LayoutRun.h>
+
+namespace olvane::cli {
+
+// A layout as JSON, each field by name, with what the file tells of the persons. Its form is in
+// layout.schema.json.
+//
+// living: whose data are left out, an entry for each person; empty for nobody.
+std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
+                       const std::vector<LayoutRecord>& records, const std::vector<bool>& living);
+
+}  // namespace olvane::cli

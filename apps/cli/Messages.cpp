@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What the user is told beside the results.
+
+#include <cli/Messages.h>
+
+#include <cstdlib>
+#include <iostream>
+
+#include <unistd.h>
+
+namespace olvane::cli {
+
+namespace {
+
+const char* const kRed = "\x1B[1;31m";
+const char* const kYellow = "\x1B[33m";
+const char* const kPlain = "\x1B[0m";
+
+bool coloursWanted() {
+    static const bool kWanted = [] {
+        const char* noColour = std::getenv("NO_COLOR");
+        return ::isatty(STDERR_FILENO) != 0 && (noColour == nullptr || *noColour == '\0');
+    }();
+    return kWanted;
+}
+
+void print(const std::string& text, const char* colour) {
+    if (coloursWanted()) {
+        std::cerr << colour << text << kPlain << '\n';
+    } else {
+        std::cerr << text << '\n';
+    }
+}
+
+}  // namespace
+
+void tell(const std::string& text) {
+    print("olvane: " + text, kRed);
+}
+
+void tell(const gedcom::Diagnostic& diagnostic) {
+    print(gedcom::formatDiagnostic(diagnostic),
+          diagnostic.severity == gedcom::Severity::error ? kRed : kYellow);
+}
+
+}  // namespace olvane::cli
