@@ -19,6 +19,10 @@ namespace olvane::draw {
 
 namespace {
 
+// Coordinates are cut to whole points, so that a line that ends on a box may seem to reach into it by as
+// much.
+constexpr int kCut = 1;
+
 // The records in the order of their left edges.
 class BoxIndex {
 public:
@@ -58,8 +62,8 @@ bool runsThrough(const LayoutSegment& s, const LayoutRecord& record, const BoxSi
     const auto [left, right] = std::minmax(s.x1, s.x2);
     const auto [top, bottom] = std::minmax(s.y1, s.y2);
     const bool isPoint = left == right && top == bottom;
-    return !isPoint && right > record.x && left < record.x + box.width && bottom > record.y &&
-           top < record.y + box.height;
+    return !isPoint && right > record.x + kCut && left < record.x + box.width - kCut &&
+           bottom > record.y + kCut && top < record.y + box.height - kCut;
 }
 
 void findLinesThroughBoxes(const std::vector<LayoutRecord>& records, const BoxIndex& index,

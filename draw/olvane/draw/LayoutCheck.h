@@ -35,7 +35,7 @@ struct LayoutFindings {
 };
 
 // Looks at a layout as the engine gave it, before a drawing puts lines apart. Boxes that share no more than
-// an edge do not overlap, and a line along an edge does not run through a box.
+// an edge do not overlap, and a line that ends on an edge, or runs along one, does not run through the box.
 LayoutFindings checkLayout(const std::vector<LayoutRecord>& records, LineDirection direction,
                            const BoxSize& box);
 

@@ -1,0 +1,45 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+
+# Completion of the olvane command for bash.
+
+_olvane() {
+    local cur prev words cword
+    if declare -F _init_completion > /dev/null; then
+        _init_completion || return
+    else
+        words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
+    fi
+    local commands="people layout draw batch check"
+    local view="--view --generations --boxes"
+    local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
+        --no-grandchildren --no-great-grandparents --no-spouses-of-children"
+    local living="--hide-living --year"
+    case $prev in
+        --view) COMPREPLY=($(compgen -W "family pedigree" -- "$cur")); return ;;
+        --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
+        --boxes) COMPREPLY=($(compgen -W "tall wide" -- "$cur")); return ;;
+        --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
+        --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
+        --format) COMPREPLY=($(compgen -W "text json" -- "$cur")); return ;;
+        --focus | --title | --year) return ;;
+        -o | --output | --focus-from) COMPREPLY=($(compgen -f -- "$cur")); return ;;
+    esac
+    if ((cword == 1)); then
+        COMPREPLY=($(compgen -W "$commands --help --version" -- "$cur"))
+        return
+    fi
+    if [[ $cur != -* ]]; then
+        COMPREPLY=($(compgen -f -- "$cur"))
+        return
+    fi
+    case ${words[1]} in
+        people) COMPREPLY=($(compgen -W "--help" -- "$cur")) ;;
+        layout) COMPREPLY=($(compgen -W "--help --focus --format $view $living $family" -- "$cur")) ;;
+        draw) COMPREPLY=($(compgen -W "--help --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
+        batch) COMPREPLY=($(compgen -W "--help --focus-from $view $family" -- "$cur")) ;;
+        check) COMPREPLY=($(compgen -W "--help --focus --all $view $family" -- "$cur")) ;;
+    esac
+}
+
+complete -o filenames -F _olvane olvane

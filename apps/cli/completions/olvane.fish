@@ -1,0 +1,36 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+
+# Completion of the olvane command for fish.
+
+complete -c olvane -n __fish_use_subcommand -f -a people -d 'List persons'
+complete -c olvane -n __fish_use_subcommand -f -a layout -d 'Print where everybody stands'
+complete -c olvane -n __fish_use_subcommand -f -a draw -d 'Draw a family or pedigree'
+complete -c olvane -n __fish_use_subcommand -f -a batch -d 'Print many layouts'
+complete -c olvane -n __fish_use_subcommand -f -a check -d 'Tell what is wrong or odd'
+complete -c olvane -n __fish_use_subcommand -l version -d 'Show the version'
+complete -c olvane -l help -d 'Show help'
+
+set -l layouts layout draw batch check
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l view -x -a 'family pedigree' -d 'Which relatives'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l generations -x -a '(seq 12)' -d 'Generations of a pedigree'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l boxes -x -a 'tall wide' -d 'Form of the boxes'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-aunts-uncles -d 'Leave out siblings of the parents'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-cousins -d 'Leave out cousins'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-siblings -d 'Leave out siblings'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-sibling-spouses -d 'Leave out spouses of the siblings'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-nieces-nephews -d 'Leave out children of the siblings'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-grandchildren -d 'Leave out grandchildren'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-great-grandparents -d 'Leave out great-grandparents'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-spouses-of-children -d 'Leave out spouses of the children'
+
+complete -c olvane -n '__fish_seen_subcommand_from layout draw check' -l focus -x -d 'The person in the middle'
+complete -c olvane -n '__fish_seen_subcommand_from layout draw' -l hide-living -d 'Tell nothing of the living'
+complete -c olvane -n '__fish_seen_subcommand_from layout draw' -l year -x -d 'The year to count from'
+complete -c olvane -n '__fish_seen_subcommand_from layout' -l format -x -a 'text json' -d 'Form of the output'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -s o -l output -r -d 'Picture to write'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -l theme -x -a 'light dark print' -d 'Colours'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -l title -x -d 'Title above the picture'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -l page -x -a 'A4 A3 letter' -d 'Paper to lay the picture out on'
+complete -c olvane -n '__fish_seen_subcommand_from batch' -l focus-from -r -d 'File with the focuses'
+complete -c olvane -n '__fish_seen_subcommand_from check' -l all -d 'Look at every layout'
