@@ -1,0 +1,125 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The bridge gives a host on Foundation what the engine gives one in C++, and keeps its exceptions inside.
+
+#import <bindings/foundation/FoundationHosts.h>
+#import <olvane/foundation/OlvaneViewerBridge.h>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <string>
+
+#include <support/CaseRun.h>
+#include <support/FamilyMaker.h>
+#include <support/FamilyText.h>
+
+namespace {
+
+using support::CaseFile;
+using support::family;
+
+const char* const kThreeGenerations = "17+42: 5 6f; 3+4: 17 18; 1+2: 3; 5+8: 9";
+
+class FoundationBridge : public testing::Test {
+protected:
+    void SetUp() override { pool_ = [[NSAutoreleasePool alloc] init]; }
+    void TearDown() override { [pool_ release]; }
+
+    template <class Host>
+    Host* hostOf(const CaseFile& told) {
+        return [[[Host alloc] initWithCase:told] autorelease];
+    }
+
+    std::string valuesOf(id host, std::int64_t personId) {
+        OlvaneViewerBridge* bridge = [[[OlvaneViewerBridge alloc] initWithManagerWrap:host] autorelease];
+        return [[bridge valuesForPersonId:personId] UTF8String];
+    }
+
+    std::string familyOf(const CaseFile& told) {
+        return valuesOf(hostOf<CaseFoundationHost>(told), told.focus);
+    }
+
+    // Two brothers whose father is not known: the undated child of an unknown father meets the one of the
+    // mother.
+    std::string textWithBirth(const std::string& date) {
+        CaseFile told = family("2f: 17 18");
+        told.focus = 17;
+        told.births[17] = date;
+        EXPECT_EQ(support::layoutText(told), familyOf(told)) << date;
+        return familyOf(told);
+    }
+
+private:
+    NSAutoreleasePool* pool_ = nil;
+};
+
+TEST_F(FoundationBridge, givesTheTextOfTheEngine) {
+    const CaseFile told = family(kThreeGenerations);
+    EXPECT_EQ(support::layoutText(told), familyOf(told));
+    EXPECT_NE(std::string::npos, familyOf(told).find("17:"));
+}
+
+TEST_F(FoundationBridge, givesTheTextOfTheEngineForManyFamilies) {
+    for (std::uint64_t seed = 1; seed <= 100; ++seed) {
+        support::FamilyMaker maker(seed, 25);
+        if (seed % 3 == 0) maker.strewOddIds();
+        const CaseFile told = maker.any();
+        ASSERT_EQ(support::layoutText(told), familyOf(told)) << support::formatCase(told);
+    }
+}
+
+TEST_F(FoundationBridge, takesANilListForAnEmptyOne) {
+    const CaseFile told = family(kThreeGenerations);
+    EXPECT_EQ(familyOf(told), valuesOf(hostOf<NilListHost>(told), 17));
+}
+
+TEST_F(FoundationBridge, readsListsByCountObjectAtIndexAndIntegerValueAlone) {
+    const CaseFile told = family(kThreeGenerations);
+    EXPECT_EQ(familyOf(told), valuesOf(hostOf<BareListHost>(told), 17));
+}
+
+TEST_F(FoundationBridge, endsALayoutWhereTheHostRaises) {
+    for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
+        for (const std::int64_t nth : {1, 3}) {
+            CaseFile told = family(kThreeGenerations);
+            told.failures[static_cast<support::HostOperation>(i)].insert(nth);
+            EXPECT_EQ(support::layoutText(told), familyOf(told)) << i;
+        }
+    }
+    EXPECT_NE("", familyOf(family(kThreeGenerations)));
+}
+
+TEST_F(FoundationBridge, endsALayoutAtANilDate) {
+    EXPECT_EQ("", valuesOf(hostOf<NilDateHost>(family("17+42")), 17));
+    EXPECT_NE("", valuesOf(hostOf<NilDateHost>(family("17")), 17));
+}
+
+TEST_F(FoundationBridge, tellsAnEmptyDateFromAnyOther) {
+    const std::string dated = textWithBirth("1850");
+    EXPECT_NE(dated, textWithBirth(""));
+    EXPECT_EQ(dated, textWithBirth("2"));
+    EXPECT_EQ(dated, textWithBirth("\xC3\xA9t\xC3\xA9 1850"));
+}
+
+TEST_F(FoundationBridge, countsTheLow32BitsOfAnId) {
+    const CaseFile told = family(kThreeGenerations);
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(told);
+    EXPECT_EQ(familyOf(told), valuesOf(host, 17 + (std::int64_t{3} << 32)));
+    EXPECT_EQ("", valuesOf(host, 0));
+    EXPECT_EQ("", valuesOf(host, -17));
+}
+
+TEST_F(FoundationBridge, holdsItsHostAsLongAsItLives) {
+    CaseFoundationHost* host = [[CaseFoundationHost alloc] initWithCase:family("17")];
+    OlvaneViewerBridge* bridge = [[OlvaneViewerBridge alloc] initWithManagerWrap:host];
+    [host release];
+    EXPECT_EQ(1, [CaseFoundationHost alive]);
+    NSString* text = [bridge valuesForPersonId:17];
+    [bridge release];
+    EXPECT_EQ(0, [CaseFoundationHost alive]);
+    EXPECT_TRUE([text hasPrefix:@"17:27:0:0:"]);
+}
+
+}  // namespace

@@ -1,0 +1,193 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Hosts on Foundation over a case.
+
+#import <bindings/foundation/FoundationHosts.h>
+
+#include <utility>
+#include <vector>
+
+namespace {
+
+int livingHosts = 0;
+
+// An exception of C++ becomes the one that a host on Foundation would raise. It's raised outside of the
+// handler: the two kinds don't mix. (A closure in a method does not find its instance variables with GCC, so
+// the source is handed in.)
+template <class Question>
+auto answerOf(support::CaseHost* source, Question question) {
+    try {
+        return question(*source);
+    } catch (const support::HostFailure&) {
+    }
+    [NSException raise:NSGenericException format:@"the data base is closed"];
+    return decltype(question(*source)){};
+}
+
+NSArray* arrayOf(const std::vector<std::int64_t>& ids) {
+    NSMutableArray* list = [NSMutableArray array];
+    for (const std::int64_t id : ids) [list addObject:[NSNumber numberWithLongLong:id]];
+    return list;
+}
+
+// Bytes that are no UTF-8 are told as they stand.
+NSString* textOf(const std::string& date) {
+    NSString* text = [NSString stringWithUTF8String:date.c_str()];
+    return text ? text : [NSString stringWithCString:date.c_str() encoding:NSISOLatin1StringEncoding];
+}
+
+}  // namespace
+
+@implementation CaseFoundationHost
+
++ (int)alive {
+    return livingHosts;
+}
+
+- (id)initWithCase:(const support::CaseFile&)told {
+    self = [super init];
+    if (self) {
+        _source = new support::CaseHost(told);
+        ++livingHosts;
+    }
+    return self;
+}
+
+- (void)dealloc {
+    delete _source;
+    --livingHosts;
+    [super dealloc];
+}
+
+- (int64_t)fatherForPersonWithID:(int64_t)personId {
+    return answerOf(_source,
+                    [&](support::CaseHost& source) { return source.fatherForPersonWithID(personId); });
+}
+
+- (int64_t)motherForPersonWithID:(int64_t)personId {
+    return answerOf(_source,
+                    [&](support::CaseHost& source) { return source.motherForPersonWithID(personId); });
+}
+
+- (NSArray*)spousesForPersonWithID:(int64_t)personId {
+    return arrayOf(answerOf(
+        _source, [&](support::CaseHost& source) { return source.spousesForPersonWithID(personId); }));
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    return arrayOf(answerOf(
+        _source, [&](support::CaseHost& source) { return source.childrenForPersonWithID(personId); }));
+}
+
+- (BOOL)isPreferredSpouse:(int64_t)personId ofPerson:(int64_t)spouseId {
+    return answerOf(_source,
+                    [&](support::CaseHost& source) { return source.isPreferredSpouse(personId, spouseId); });
+}
+
+- (BOOL)isPersonDead:(int64_t)personId {
+    return answerOf(_source, [&](support::CaseHost& source) { return source.isPersonDead(personId); });
+}
+
+- (NSString*)dateForPersonWithID:(int64_t)personId isBirth:(BOOL)isBirth {
+    const std::string date = answerOf(_source, [&](support::CaseHost& source) {
+        return source.dateForPersonWithID(personId, isBirth != 0);
+    });
+    return textOf(date);
+}
+
+- (int32_t)sexOfPersonWithID:(int64_t)personId {
+    return answerOf(_source, [&](support::CaseHost& source) { return source.sexOfPersonWithID(personId); });
+}
+
+@end
+
+@implementation NilListHost
+
+- (NSArray*)spousesForPersonWithID:(int64_t)personId {
+    NSArray* list = [super spousesForPersonWithID:personId];
+    return [list count] == 0 ? nil : list;
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    NSArray* list = [super childrenForPersonWithID:personId];
+    return [list count] == 0 ? nil : list;
+}
+
+@end
+
+@implementation NilDateHost
+
+- (NSString*)dateForPersonWithID:(int64_t)personId isBirth:(BOOL)isBirth {
+    (void)personId;
+    (void)isBirth;
+    return nil;
+}
+
+@end
+
+// A number that answers one message.
+@interface BareNumber : NSObject {
+    int64_t _value;
+}
++ (BareNumber*)numberWithValue:(int64_t)value;
+- (NSInteger)integerValue;
+@end
+
+@implementation BareNumber
+
++ (BareNumber*)numberWithValue:(int64_t)value {
+    BareNumber* number = [[[BareNumber alloc] init] autorelease];
+    number->_value = value;
+    return number;
+}
+
+- (NSInteger)integerValue {
+    return static_cast<NSInteger>(_value);
+}
+
+@end
+
+// A list that answers two.
+@interface BareList : NSObject {
+    NSArray* _numbers;
+}
++ (NSArray*)listOf:(NSArray*)numbers;
+- (NSUInteger)count;
+- (id)objectAtIndex:(NSUInteger)index;
+@end
+
+@implementation BareList
+
++ (NSArray*)listOf:(NSArray*)numbers {
+    BareList* list = [[[BareList alloc] init] autorelease];
+    list->_numbers = [numbers retain];
+    return (NSArray*)list;
+}
+
+- (void)dealloc {
+    [_numbers release];
+    [super dealloc];
+}
+
+- (NSUInteger)count {
+    return [_numbers count];
+}
+
+- (id)objectAtIndex:(NSUInteger)index {
+    return [BareNumber numberWithValue:[[_numbers objectAtIndex:index] longLongValue]];
+}
+
+@end
+
+@implementation BareListHost
+
+- (NSArray*)spousesForPersonWithID:(int64_t)personId {
+    return [BareList listOf:[super spousesForPersonWithID:personId]];
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    return [BareList listOf:[super childrenForPersonWithID:personId]];
+}
+
+@end
