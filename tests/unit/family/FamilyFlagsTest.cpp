@@ -310,6 +310,18 @@ TEST_F(FamilyFlags, spousesOfASiblingAreFlaggedOnlyWhenItsChildrenAreLoaded) {
     }
 }
 
+TEST_F(FamilyFlags, spouseOfASiblingIsFlaggedForAChildFromElsewhere) {
+    TreeViewPerson& sibling = focus.addSibling(3, kMale);
+    sibling.allChildrenLoaded = true;
+    sibling.addSpouse(4, kFemale);
+    data.children[4] = {5};
+    data.parents[5] = {8, 4};
+    data.addNodes = {4};
+    layouter.shownPersons[4] = true;
+    flagAll();
+    EXPECT_TRUE(flagOf(sibling.spouses.front()));
+}
+
 TEST_F(FamilyFlags, childrenOfASiblingAreFlaggedForTheirOwnFamilies) {
     focus.addSibling(3, kMale).addChildWithNoOtherSpouse(5, kMale);
     data.children[5] = {6};
@@ -332,6 +344,16 @@ TEST_F(FamilyFlags, spouseOfAChildIsFlaggedForAnotherMarriage) {
     focus.addChildWithNoOtherSpouse(5, kMale).addSpouse(6, kFemale);
     data.spouses[6] = {5, 8};
     data.addNodes = {6};
+    flagAll();
+    EXPECT_TRUE(flagOf(unknownChild(focus).spouses.front()));
+}
+
+TEST_F(FamilyFlags, spouseOfAChildIsFlaggedForAChildFromElsewhere) {
+    focus.addChildWithNoOtherSpouse(5, kMale).addSpouse(6, kFemale);
+    data.children[6] = {7};
+    data.parents[7] = {8, 6};
+    data.addNodes = {6};
+    layouter.shownPersons[6] = true;
     flagAll();
     EXPECT_TRUE(flagOf(unknownChild(focus).spouses.front()));
 }

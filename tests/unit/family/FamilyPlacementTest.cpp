@@ -245,6 +245,16 @@ TEST_F(FamilyPlacement, husbandInACoupleHasHisOwnChildrenAtTheLeft) {
     EXPECT_EQ((Point{107.5f, 110.0f}), placeOf(childUnder(focus, 1)));
 }
 
+TEST_F(FamilyPlacement, childrenOfANonCombinedSpouseStandOneRowBelowHer) {
+    addSpouses(2);
+    focus.addChildWithSpouse(7, 2, kMale);
+    spouse(1).addChildWithNoOtherSpouse(8, kMale);
+    measureAndPlace(focus, 0.0f, 1000.0f);
+    EXPECT_EQ(1000.0f, placeOf(spouse(1)).y);
+    EXPECT_EQ(1110.0f, placeOf(childUnder(focus, 2)).y);
+    EXPECT_EQ(1110.0f, placeOf(unknownChild(spouse(1))).y);
+}
+
 // The first wife's block measures 135, but her married son's unit alone fills that: his brother stands in the
 // span of the second wife, whose own child is set there as well.
 TEST_F(FamilyPlacement, unitThatMeasuredTooNarrowRunsUnderTheNextOne) {

@@ -64,6 +64,11 @@ TEST_F(FamilySiblingLines, repeatTheDropForEachSibling) {
     for (const int key : {3, 4, 0, 5}) addSibling(key);
     drawLines();
     EXPECT_EQ(3u + 1u + 1u, father().lineSegments.size()) << "siblings, the person, the marriage line";
+    std::vector<int> order;
+    for (const TreeViewGenerationEdge* edge : childEdgesOf(onlySpouseEdge(mother()))) {
+        order.push_back(edge->child->personId);
+    }
+    EXPECT_EQ((std::vector<int>{3, 4, 5, 0}), order) << "in list order, the person last";
 }
 
 TEST_F(FamilySiblingLines, skipThePersonsOwnEntry) {
