@@ -15,6 +15,7 @@
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/LivingPersons.h>
+#include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PictureConversion.h>
 #include <cli/PictureLabels.h>
@@ -77,12 +78,19 @@ std::string sheetName(const std::string& output, std::size_t sheet, std::size_t 
     return name.str();
 }
 
-void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets,
-                 double pngScale) {
+std::string pngSheet(const std::string& path, const draw::SvgPicture& sheet, double scale) {
+    if (pngScale(sheet, scale) < scale) {
+        tell(path + ": made smaller, since a PNG cannot be that large; .svg and .pdf can");
+    }
+    return pngOf(sheet, scale);
+}
+
+void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets) {
+    const double scale = options.page.empty() ? 1 : kSheetPngScale;
     for (std::size_t i = 0; i < sheets.size(); ++i) {
         const std::string path =
             sheets.size() == 1 ? options.output : sheetName(options.output, i + 1, sheets.size());
-        writeOutput(path, form == Form::png ? pngOf(sheets[i], pngScale) : sheets[i].svg);
+        writeOutput(path, form == Form::png ? pngSheet(path, sheets[i], scale) : sheets[i].svg);
     }
 }
 
@@ -108,7 +116,7 @@ int runDraw(const DrawOptions& options) {
     if (form == Form::pdf) {
         writeOutput(options.output, pdfOf(sheets, drawing.title));
     } else {
-        writeSheets(options, form, sheets, options.page.empty() ? 1 : kSheetPngScale);
+        writeSheets(options, form, sheets);
     }
     return 0;
 }

@@ -72,9 +72,13 @@ int pixels(double length) {
 
 }  // namespace
 
+double pngScale(const draw::SvgPicture& picture, double wanted) {
+    return std::min(wanted, kLongestPng / longestSide(picture));
+}
+
 std::string pngOf(const draw::SvgPicture& picture, double scale) {
     const RenderLibraries& lib = renderLibraries();
-    const double allowed = std::min(scale, kLongestPng / longestSide(picture));
+    const double allowed = pngScale(picture, scale);
     const auto surface =
         owned(lib.cairo_image_surface_create(CAIRO_FORMAT_ARGB32, pixels(picture.width * allowed),
                                              pixels(picture.height * allowed)),

@@ -108,28 +108,54 @@ private:
         return child.addNode ? LineStyle::plain : styleOf(content_.parentLinkOf(child.id));
     }
 
-    // The trunk is plain as far as plain taps need it; a child of another style has its own way from there.
+    // The trunk is plain as far as it serves plain taps or more than one child. Beyond, it belongs to the
+    // last child alone and is drawn in one go with that child's tap, in its style.
     void addFamily(const FamilyLine& family, std::size_t index, double place) {
-        double first = family.joint;
-        double last = family.joint;
-        std::vector<std::pair<const FamilyTap*, LineStyle>> styled;
+        std::vector<StyledTap> styled;
         for (const FamilyTap& tap : family.taps) {
             const LineStyle style = styleOfTap(tap);
             if (style != LineStyle::plain) {
-                styled.emplace_back(&tap, style);
+                styled.push_back({tap, style});
                 continue;
             }
-            first = std::min(first, static_cast<double>(tap.at));
-            last = std::max(last, static_cast<double>(tap.at));
             strokes_.across.push_back(
                 {static_cast<double>(tap.at), static_cast<double>(tap.end), place, index});
         }
-        if (last > first) strokes_.along.push_back({first, last, place, index, LineStyle::plain});
-        for (const auto& [tap, style] : styled) {
-            const double at = tap->at;
-            strokes_.children.push_back(
-                {std::clamp(at, first, last), at, place, static_cast<double>(tap->end), style});
+        const Span trunk = sharedTrunk(family, styled);
+        if (trunk.last > trunk.first) {
+            strokes_.along.push_back({trunk.first, trunk.last, place, index, LineStyle::plain});
         }
+        for (const StyledTap& child : styled) {
+            const double at = child.tap.at;
+            strokes_.children.push_back({std::clamp(at, trunk.first, trunk.last), at, place,
+                                         static_cast<double>(child.tap.end), child.style});
+        }
+    }
+
+    struct StyledTap {
+        FamilyTap tap;
+        LineStyle style;
+    };
+
+    struct Span {
+        double first;
+        double last;
+    };
+
+    // All taps but a styled one that is the outermost on its side.
+    static Span sharedTrunk(const FamilyLine& family, const std::vector<StyledTap>& styled) {
+        std::vector<int> places = {family.joint};
+        for (const FamilyTap& tap : family.taps) places.push_back(tap.at);
+        std::sort(places.begin(), places.end());
+        const auto isStyledAlone = [&](int at) {
+            return at != family.joint && std::count(places.begin(), places.end(), at) == 1 &&
+                   std::any_of(styled.begin(), styled.end(),
+                               [at](const StyledTap& child) { return child.tap.at == at; });
+        };
+        Span span{static_cast<double>(places.front()), static_cast<double>(places.back())};
+        if (isStyledAlone(places.front())) span.first = places[1];
+        if (isStyledAlone(places.back())) span.last = places[places.size() - 2];
+        return span;
     }
 
     // A slanting segment would be neither; layouts have none, and such a one is left out of the crossings.
@@ -167,7 +193,26 @@ public:
         return sideways_ ? "H" + px(frame_.x(across)) : "V" + px(frame_.y(across));
     }
 
+    void noteAreas(const Strokes& strokes, std::vector<PictureArea>& areas) const {
+        for (const AlongStroke& s : strokes.along) areas.push_back(area(s.from, s.across, s.to, s.across));
+        for (const AcrossStroke& s : strokes.across) areas.push_back(area(s.along, s.from, s.along, s.to));
+        for (const ChildStroke& s : strokes.children) {
+            areas.push_back(area(s.from, s.across, s.along, s.across));
+            areas.push_back(area(s.along, s.across, s.along, s.end));
+        }
+    }
+
 private:
+    PictureArea area(double along1, double across1, double along2, double across2) const {
+        const auto [firstAlong, lastAlong] = std::minmax(along1, along2);
+        const auto [firstAcross, lastAcross] = std::minmax(across1, across2);
+        const double x = sideways_ ? firstAcross : firstAlong;
+        const double y = sideways_ ? firstAlong : firstAcross;
+        const double width = sideways_ ? lastAcross - firstAcross : lastAlong - firstAlong;
+        const double height = sideways_ ? lastAlong - firstAlong : lastAcross - firstAcross;
+        return {frame_.x(x), frame_.y(y), width * Frame::kScale, height * Frame::kScale};
+    }
+
     bool sideways_;
     const Frame& frame_;
 };
@@ -247,10 +292,12 @@ const char* dashesOf(LineStyle style) {
     return "";
 }
 
-LineStylesUsed appendLines(std::string& svg, const DrawingContent& content, const DrawingOptions& options,
+LineStylesUsed appendLines(SvgPicture& picture, const DrawingContent& content, const DrawingOptions& options,
                            const Frame& frame) {
     const Strokes strokes = StrokeBuilder(content, options).build();
     const StrokePen pen(options, frame);
+    std::string& svg = picture.svg;
+    pen.noteAreas(strokes, picture.lines);
     const std::string divorced = pathOfAlong(strokes, LineStyle::divorced, pen);
     const std::string adopted = pathOfChildren(strokes, LineStyle::adopted, pen);
     const std::string foster = pathOfChildren(strokes, LineStyle::foster, pen);

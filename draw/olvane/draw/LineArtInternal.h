@@ -37,9 +37,9 @@ struct Frame {
     double y(double points) const { return (points - top) * kScale + marginY; }
 };
 
-// Appends all lines of a layout. Where a line crosses another family's, that one gives way with a small gap,
-// so that a crossing cannot be read as a joint.
-LineStylesUsed appendLines(std::string& svg, const DrawingContent& content, const DrawingOptions& options,
+// Appends all lines of a layout to the picture. Where a line crosses another family's, that one gives way
+// with a small gap, so that a crossing cannot be read as a joint.
+LineStylesUsed appendLines(SvgPicture& picture, const DrawingContent& content, const DrawingOptions& options,
                            const Frame& frame);
 
 }  // namespace olvane::draw

@@ -19,10 +19,10 @@ namespace olvane::draw {
 
 namespace {
 
-constexpr int kApart = 4;                 // points; nearer lines read as one
-constexpr int kSameLane = 3;              // points; taps nearer than this would run into each other
-constexpr int kLaneClash = 100;           // crossings that one such run counts for
-constexpr std::size_t kMostOrdered = 64;  // larger groups keep their order
+constexpr int kApart = 4;                  // points; nearer lines read as one
+constexpr int kSameLane = 3;               // points; taps nearer than this would run into each other
+constexpr int kLaneClash = 100;            // crossings that one such run counts for
+constexpr std::size_t kMostOrdered = 512;  // larger groups keep their order
 
 struct Gap {
     int from = 0;

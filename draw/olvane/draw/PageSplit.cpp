@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/draw/TextFitInternal.h>
@@ -110,21 +111,48 @@ void appendFoot(std::string& svg, const Grid& grid, int column, int row, const s
            "</text>\n</g>\n";
 }
 
-// The elements of a picture, without its prologue, so that another one can hold it.
-std::string innerElement(const SvgPicture& picture) {
-    return picture.svg.substr(picture.svg.find("<svg"));
+// What a sheet shows of the picture.
+PictureArea windowOf(const Grid& grid, int column, int row) {
+    PictureArea window;
+    window.width = grid.sheet.roomWidth() / grid.scale;
+    window.height = grid.sheet.roomHeight() / grid.scale;
+    window.x = column * (window.width - kStrip / grid.scale);
+    window.y = row * (window.height - kStrip / grid.scale);
+    return window;
 }
 
-// The picture as a nested one that shows a window of itself at a place of the sheet.
-std::string windowOf(const SvgPicture& picture, const Grid& grid, int column, int row) {
-    const double width = grid.sheet.roomWidth() / grid.scale;
-    const double height = grid.sheet.roomHeight() / grid.scale;
-    const double x = column * (width - kStrip / grid.scale);
-    const double y = row * (height - kStrip / grid.scale);
-    return "<svg x=\"" + px(kMargin) + "\" y=\"" + px(kMargin) + "\" width=\"" + px(grid.sheet.roomWidth()) +
-           "\" height=\"" + px(grid.sheet.roomHeight()) + "\" viewBox=\"" + px(x) + " " + px(y) + " " +
-           px(width) + " " + px(height) + "\" preserveAspectRatio=\"xMinYMin\">\n" + innerElement(picture) +
-           "</svg>\n";
+bool shows(const PictureArea& window, const PictureArea& area) {
+    return area.x <= window.x + window.width && area.x + area.width >= window.x &&
+           area.y <= window.y + window.height && area.y + area.height >= window.y;
+}
+
+bool showsAnything(const PictureArea& window, const SvgPicture& picture) {
+    const auto isShown = [&window](const PictureArea& area) { return shows(window, area); };
+    return std::any_of(picture.boxes.begin(), picture.boxes.end(),
+                       [&](const PictureBox& box) { return isShown(box.area); }) ||
+           std::any_of(picture.lines.begin(), picture.lines.end(), isShown) ||
+           (picture.legend.width > 0 && isShown(picture.legend));
+}
+
+// The elements of a picture, without its prologue, so that another one can hold it, and without the boxes
+// that the window does not show.
+std::string elementsWithin(const SvgPicture& picture, const PictureArea& window) {
+    std::size_t done = picture.svg.find("<svg");
+    std::string elements;
+    for (const PictureBox& box : picture.boxes) {
+        if (shows(window, box.area)) continue;
+        elements.append(picture.svg, done, box.start - done);
+        done = box.start + box.length;
+    }
+    return elements.append(picture.svg, done);
+}
+
+// The picture as a nested one that shows a window of itself on the sheet.
+std::string nestedPicture(const SvgPicture& picture, const Sheet& sheet, const PictureArea& window) {
+    return "<svg x=\"" + px(kMargin) + "\" y=\"" + px(kMargin) + "\" width=\"" + px(sheet.roomWidth()) +
+           "\" height=\"" + px(sheet.roomHeight()) + "\" viewBox=\"" + px(window.x) + " " + px(window.y) +
+           " " + px(window.width) + " " + px(window.height) + "\" preserveAspectRatio=\"xMinYMin\">\n" +
+           elementsWithin(picture, window) + "</svg>\n";
 }
 
 SvgPicture sheetOf(const SvgPicture& picture, const Grid& grid, int column, int row,
@@ -137,7 +165,7 @@ SvgPicture sheetOf(const SvgPicture& picture, const Grid& grid, int column, int 
         px(grid.sheet.width / kPxOfMm) + "mm\" height=\"" + px(grid.sheet.height / kPxOfMm) +
         "mm\" viewBox=\"0 0 " + px(grid.sheet.width) + " " + px(grid.sheet.height) + "\">\n<title>" +
         escaped(title) + "</title>\n<rect width=\"100%\" height=\"100%\" fill=\"#ffffff\"/>\n";
-    sheet.svg += windowOf(picture, grid, column, row);
+    sheet.svg += nestedPicture(picture, grid.sheet, windowOf(grid, column, row));
     if (grid.count() > 1) {
         appendSeams(sheet.svg, grid, column, row);
         appendFoot(sheet.svg, grid, column, row, title);
@@ -160,7 +188,9 @@ std::vector<SvgPicture> splitPages(const SvgPicture& picture, const Paper& paper
     std::vector<SvgPicture> sheets;
     for (int row = 0; row < grid.rows; ++row) {
         for (int column = 0; column < grid.columns; ++column) {
-            sheets.push_back(sheetOf(picture, grid, column, row, title));
+            const bool isFirst = row == 0 && column == 0;  // a headline would stand here
+            if (isFirst || showsAnything(windowOf(grid, column, row), picture))
+                sheets.push_back(sheetOf(picture, grid, column, row, title));
         }
     }
     return sheets;

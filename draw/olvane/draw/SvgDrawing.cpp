@@ -68,12 +68,13 @@ public:
         picture_.width = (bounds.right - bounds.left) * Frame::kScale + 2 * kMargin;
         picture_.height = (bounds.bottom - bounds.top) * Frame::kScale + 2 * kMargin + headline;
 
-        std::string lines;
+        SvgPicture lines;
         const LineStylesUsed styles = appendLines(lines, content_, options_, frame_);
+        picture_.lines = std::move(lines.lines);
         const std::string legend = legendFor(styles);
         openPicture();
         appendHeadline();
-        picture_.svg += lines;
+        picture_.svg += lines.svg;
         appendBoxes();
         picture_.svg += legend + "</g>\n</svg>\n";
         return std::move(picture_);
@@ -150,12 +151,14 @@ private:
     }
 
     void appendBox(const LayoutRecord& record, const Box& box) {
+        const std::size_t start = picture_.svg.size();
         if (record.addNode) {
             appendPlaceholderBox(picture_.svg, box, fullName(content_.labelOf(record.addNode->childId)),
                                  theme());
         } else {
             appendPersonBox(picture_.svg, box, content_.labelOf(record.id), theme());
         }
+        picture_.boxes.push_back({{box.x, box.y, box.width, box.height}, start, picture_.svg.size() - start});
     }
 
     // Below the picture, as wide as it needs; tells only what is there.
@@ -163,11 +166,13 @@ private:
         if (!styles.any()) return std::string();
         std::string legend = "<g>\n<title>Legend</title>\n";
         int row = 0;
-        if (styles.divorced) appendLegendLine(legend, row++, LineStyle::divorced, "marriage ended");
+        if (styles.divorced) appendLegendLine(legend, row++, LineStyle::divorced, "divorced");
         if (styles.adopted) appendLegendLine(legend, row++, LineStyle::adopted, "adopted child");
         if (styles.foster) appendLegendLine(legend, row++, LineStyle::foster, "foster child");
         picture_.height += row * kLegendPitch + kLegendGap;
         picture_.width = std::max(picture_.width, kLegendWidth + 2 * kMargin);
+        const double height = row * kLegendPitch;
+        picture_.legend = {kMargin, picture_.height - kMargin - height, kLegendWidth, height};
         return legend + "</g>\n";
     }
 

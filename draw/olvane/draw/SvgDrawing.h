@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <string>
@@ -40,11 +41,32 @@ struct DrawingOptions {
     bool headline = false;
 };
 
-// A finished picture. Units: px, two for each point of the layout.
+// A place in a picture, in px.
+struct PictureArea {
+    double x = 0;
+    double y = 0;
+    double width = 0;
+    double height = 0;
+};
+
+// A box of a picture: where it is to be seen, and which bytes of the text draw it.
+struct PictureBox {
+    PictureArea area;
+    std::size_t start = 0;
+    std::size_t length = 0;
+};
+
+// A finished picture.
+//
+// Units: px, two for each point of the layout.
+// Holds: boxes come in the order of the text; without the bytes of some of them the rest is still a picture.
 struct SvgPicture {
     std::string svg;
     int width = 0;
     int height = 0;
+    std::vector<PictureBox> boxes;
+    std::vector<PictureArea> lines;  // every stroke of a line; those have no width or no height
+    PictureArea legend;              // of no size where there is none
 };
 
 // A person's name for a sentence; "Living" or "Name not known" where there is none to tell.

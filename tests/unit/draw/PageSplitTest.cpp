@@ -23,6 +23,7 @@ SvgPicture pictureOf(int width, int height) {
     picture.height = height;
     picture.svg = "<?xml version=\"1.0\"?>\n<svg width=\"" + std::to_string(width) + "\" height=\"" +
                   std::to_string(height) + "\"></svg>\n";
+    picture.lines.push_back({0, 0, static_cast<double>(width), static_cast<double>(height)});
     return picture;
 }
 
@@ -97,6 +98,24 @@ TEST(PageSplit, neighboursShareAStripAndTheLastReachesTheEnd) {
     const auto [start, width] = windowOf(sheets.back().svg);
     EXPECT_GE(start + width, 10000);
     EXPECT_LT(start, 10000);
+}
+
+TEST(PageSplit, blankSheetsAreLeftOut) {
+    SvgPicture picture = pictureOf(10000, 500);
+    picture.lines = {{0, 100, 200, 0}, {9000, 100, 200, 0}};
+    const auto sheets = splitPages(picture, kA4, "");
+    ASSERT_EQ(sheets.size(), 2u);
+    EXPECT_THAT(sheets[0].svg, HasSubstr("column 1 of "));
+    EXPECT_THAT(sheets[1].svg, Not(HasSubstr("column 2 of ")));
+}
+
+TEST(PageSplit, sheetHoldsOnlyTheBoxesThatItShows) {
+    SvgPicture picture = pictureOf(10000, 500);
+    picture.svg = "<svg>[left][right]</svg>";
+    picture.boxes = {{{10, 10, 100, 100}, 5, 6}, {{9900, 10, 50, 100}, 11, 7}};
+    const auto sheets = splitPages(picture, kA4, "");
+    EXPECT_THAT(sheets.front().svg, HasSubstr("<svg>[left]</svg>"));
+    EXPECT_THAT(sheets.back().svg, HasSubstr("<svg>[right]</svg>"));
 }
 
 TEST(PageSplit, titleIsText) {

@@ -161,7 +161,7 @@ TEST_F(Picture, secondBoxOfTheFocusIsNotDrawnAsFocus) {
 TEST_F(Picture, legendAppearsOnlyWhenAStyleIsUsed) {
     EXPECT_THAT(draw(), Not(HasSubstr("Legend")));
     content_.isDivorced = [](std::int64_t, std::int64_t) { return true; };
-    EXPECT_THAT(draw(), HasSubstr(">marriage ended</text>"));
+    EXPECT_THAT(draw(), HasSubstr(">divorced</text>"));
     EXPECT_THAT(draw(), Not(HasSubstr("adopted")));
 }
 
@@ -173,6 +173,20 @@ TEST_F(Picture, adoptedAndFosterChildrenHaveLinesOfTheirOwn) {
     EXPECT_THAT(svg, HasSubstr(">adopted child</text>"));
     EXPECT_THAT(svg, HasSubstr(">foster child</text>"));
     EXPECT_EQ(countOf(svg, "stroke-dasharray=\"2 4\""), 2u);  // the line and the legend
+}
+
+TEST_F(Picture, styledChildrenShareAPlainTrunk) {
+    // Both children are on the left; the near one's way along the trunk serves the far one too.
+    content_.records = readLayoutText(
+        "1:200:0:0:227,80,227,95|;3:0:110:0:27,95,227,95|27,110,27,95|;4:80:110:0:107,95,227,95|107,110,107,"
+        "95|;");
+    content_.parentLinkOf = [](std::int64_t id) {
+        return id == 3 ? ParentLink::adopted : ParentLink::foster;
+    };
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr("M242 218H482"));      // plain, from the near child to the joint
+    EXPECT_THAT(svg, HasSubstr("M242 218H82V248"));   // the far child's own
+    EXPECT_THAT(svg, HasSubstr("M242 218H242V248"));  // the near child's own
 }
 
 TEST_F(Picture, nameNotKnownIsAQuestionMark) {
@@ -206,6 +220,18 @@ TEST_F(Picture, pageTakesAllBoxes) {
     const SvgPicture picture = drawSvg(content_, options_);
     EXPECT_EQ(picture.width, 135 * 2 + 56);
     EXPECT_EQ(picture.height, 300 * 2 + 56);
+}
+
+TEST_F(Picture, boxesTellWhereTheyAreInPictureAndText) {
+    const SvgPicture picture = drawSvg(content_, options_);
+    ASSERT_EQ(picture.boxes.size(), 5u);
+    const PictureBox& focus = picture.boxes[0];
+    EXPECT_EQ(focus.area.x, 28);
+    EXPECT_EQ(focus.area.width, 110);
+    const std::string text = picture.svg.substr(focus.start, focus.length);
+    EXPECT_TRUE(text.starts_with("<g role=\"img\""));
+    EXPECT_TRUE(text.ends_with("</g>\n"));
+    EXPECT_THAT(text, HasSubstr(">Karl</text>"));
 }
 
 TEST_F(Picture, emptyLayoutIsAPageThatSaysSo) {
