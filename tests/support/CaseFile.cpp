@@ -339,47 +339,51 @@ std::string formatCase(const CaseFile& source) {
     return out.str();
 }
 
-CaseHost::CaseHost(CaseFile source, bool traced) : family(std::move(source)), recordTrace(traced) {}
+CaseHost::CaseHost(CaseFile source, bool traced)
+    : CaseHost(std::make_shared<const CaseFile>(std::move(source)), traced) {}
+
+CaseHost::CaseHost(std::shared_ptr<const CaseFile> source, bool traced)
+    : family(std::move(source)), recordTrace(traced) {}
 
 std::int64_t CaseHost::fatherForPersonWithID(std::int64_t personId) {
     noteCall(HostOperation::fatherForPersonWithID, personId);
-    return answerOr(family.fathers, personId, kNotFound);
+    return answerOr(family->fathers, personId, kNotFound);
 }
 
 std::int64_t CaseHost::motherForPersonWithID(std::int64_t personId) {
     noteCall(HostOperation::motherForPersonWithID, personId);
-    return answerOr(family.mothers, personId, kNotFound);
+    return answerOr(family->mothers, personId, kNotFound);
 }
 
 std::vector<std::int64_t> CaseHost::spousesForPersonWithID(std::int64_t personId) {
     noteCall(HostOperation::spousesForPersonWithID, personId);
-    return answerOr(family.spouses, personId, {});
+    return answerOr(family->spouses, personId, {});
 }
 
 std::vector<std::int64_t> CaseHost::childrenForPersonWithID(std::int64_t personId) {
     noteCall(HostOperation::childrenForPersonWithID, personId);
-    return answerOr(family.children, personId, {});
+    return answerOr(family->children, personId, {});
 }
 
 bool CaseHost::isPreferredSpouse(std::int64_t personId, std::int64_t spouseId) {
     noteCall(HostOperation::isPreferredSpouse, personId, spouseId);
-    const auto found = family.preferredSpouses.find(personId);
-    return found != family.preferredSpouses.end() && found->second == spouseId;
+    const auto found = family->preferredSpouses.find(personId);
+    return found != family->preferredSpouses.end() && found->second == spouseId;
 }
 
 bool CaseHost::isPersonDead(std::int64_t personId) {
     noteCall(HostOperation::isPersonDead, personId);
-    return answerOr(family.dead, personId, false);
+    return answerOr(family->dead, personId, false);
 }
 
 std::string CaseHost::dateForPersonWithID(std::int64_t personId, bool isBirth) {
     noteCall(HostOperation::dateForPersonWithID, personId, isBirth ? 1 : 0);
-    return answerOr(isBirth ? family.births : family.dates, personId, std::string());
+    return answerOr(isBirth ? family->births : family->dates, personId, std::string());
 }
 
 std::int32_t CaseHost::sexOfPersonWithID(std::int64_t personId) {
     noteCall(HostOperation::sexOfPersonWithID, personId);
-    return answerOr(family.sexes, personId, 0);
+    return answerOr(family->sexes, personId, 0);
 }
 
 std::int64_t CaseHost::callCount() const {
@@ -408,8 +412,8 @@ void CaseHost::writeDown(HostOperation operation, const std::string& arguments) 
 
 void CaseHost::countAndPerhapsFail(HostOperation operation) {
     const std::int64_t call = ++counts.at(static_cast<std::size_t>(operation));
-    const auto found = family.failures.find(operation);
-    if (found == family.failures.end() || found->second.count(call) == 0) return;
+    const auto found = family->failures.find(operation);
+    if (found == family->failures.end() || found->second.count(call) == 0) return;
     throw HostFailure(std::string(operationName(operation)) + " fails at call " + std::to_string(call));
 }
 

@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <istream>
 #include <map>
+#include <memory>
 #include <set>
 #include <stdexcept>
 #include <string>
@@ -100,6 +101,11 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// The case for a host that does not outlive it: nothing is copied, nothing owned.
+inline std::shared_ptr<const CaseFile> borrowed(const CaseFile& source) {
+    return std::shared_ptr<const CaseFile>(std::shared_ptr<const CaseFile>(), &source);
+}
+
 // A data source that answers as a case says, counts the calls, and writes them down when asked to.
 //
 // Fails: any operation throws HostFailure at the calls that the case names; such a call is counted and
@@ -107,6 +113,7 @@ public:
 class CaseHost {
 public:
     explicit CaseHost(CaseFile family, bool recordTrace = false);
+    explicit CaseHost(std::shared_ptr<const CaseFile> family, bool recordTrace = false);
 
     std::int64_t fatherForPersonWithID(std::int64_t personId);
     std::int64_t motherForPersonWithID(std::int64_t personId);
@@ -129,7 +136,7 @@ private:
     void writeDown(HostOperation operation, const std::string& arguments);
     void countAndPerhapsFail(HostOperation operation);
 
-    CaseFile family;
+    std::shared_ptr<const CaseFile> family;
     bool recordTrace;
     std::array<std::int64_t, kHostOperationCount> counts{};
     std::vector<std::string> traceLines;

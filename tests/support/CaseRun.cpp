@@ -25,6 +25,9 @@ using SharedTreeViewer::TreeViewPedigreeLayouter;
 
 CaseManager::CaseManager(CaseFile family, bool recordTrace) : host(std::move(family), recordTrace) {}
 
+CaseManager::CaseManager(std::shared_ptr<const CaseFile> family, bool recordTrace)
+    : host(std::move(family), recordTrace) {}
+
 std::int64_t CaseManager::fatherForPersonWithID(std::int64_t personId) {
     return host.fatherForPersonWithID(personId);
 }
@@ -138,7 +141,7 @@ Outcome layOut(const CaseFile& request, const std::shared_ptr<CaseManager>& mana
 }  // namespace
 
 std::vector<std::string> runCase(const CaseFile& request, bool graph, bool trace) {
-    const auto manager = std::make_shared<CaseManager>(request, trace);
+    const auto manager = std::make_shared<CaseManager>(borrowed(request), trace);
     const Outcome outcome = layOut(request, manager, graph);
     std::vector<std::string> lines{"text " + outcome.text};
     lines.insert(lines.end(), outcome.graphLines.begin(), outcome.graphLines.end());
@@ -147,7 +150,7 @@ std::vector<std::string> runCase(const CaseFile& request, bool graph, bool trace
 }
 
 std::string layoutText(const CaseFile& request) {
-    return layOut(request, std::make_shared<CaseManager>(request), false).text;
+    return layOut(request, std::make_shared<CaseManager>(borrowed(request)), false).text;
 }
 
 std::string joinLines(const std::vector<std::string>& lines) {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,7 @@ namespace support {
 class CaseManager : public OlvaneViewerManagerWrapProtocol {
 public:
     explicit CaseManager(CaseFile family, bool recordTrace = false);
+    explicit CaseManager(std::shared_ptr<const CaseFile> family, bool recordTrace = false);
 
     std::int64_t fatherForPersonWithID(std::int64_t personId) override;
     std::int64_t motherForPersonWithID(std::int64_t personId) override;

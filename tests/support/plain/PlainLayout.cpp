@@ -179,7 +179,7 @@ std::string Answer::text() const {
 }
 
 Answer layOut(const support::CaseFile& request, bool graph, bool trace) {
-    support::CaseHost host(request, trace);
+    support::CaseHost host(support::borrowed(request), trace);
     Data data(host, request.adapter);
     std::string text;
     std::vector<std::string> chart;
