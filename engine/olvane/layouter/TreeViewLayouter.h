@@ -55,8 +55,7 @@ public:
                               float y) const;
     // A row of count persons at y, evenly spaced around centerX, in the iterator's order from left to right.
     // With count 0 the iterator is not called. An iterator that visits fewer than count leaves the row half a
-    // stride too far left for each one: the count is believed, and the persons who are there keep their
-    // distances.
+    // stride too far left: the step behind the last one is taken for a gap inside the row.
     void initializeParentsXAndYCenteredAboveChild(const Iterator& iterator, float y, float centerX,
                                                   int count) const;
 
