@@ -14,7 +14,7 @@
 namespace olvane::cli {
 
 // A layout as JSON, each field by name, with what the file tells of the persons. Its form is in
-// layout.schema.json.
+// docs/layout.schema.json.
 //
 // living: whose data are left out, an entry for each person; empty for nobody.
 std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,

@@ -20,9 +20,8 @@ TreeViewSpouseEdge* TreeViewPerson::spouseEdge(TreeViewPerson* spouse, TreeLine 
     TreeViewPerson* const first = gender ? this : spouse;
     TreeViewPerson* const second = gender ? spouse : this;
     auto edge = std::make_unique<TreeViewSpouseEdge>(std::move(line), first, second);
-    TreeViewSpouseEdge* const made = edge.get();
-    spouseEdges.emplace(spouseKey, made);
-    edge.release();
+    spouseEdges.emplace(spouseKey, edge.get());
+    TreeViewSpouseEdge* const made = edge.release();
     spouse->addUnownedSpouseEdge(made, personId);
     return made;
 }

@@ -120,7 +120,8 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
         father.spouseEdge(&mother, TreeLine({TreePoint{x, y1}, turn, TreePoint{x, y2}}));
 
     const std::int64_t sumOfEnds = static_cast<std::int64_t>(wholePoint(y1)) + wholePoint(y2);
-    const float middleY = static_cast<float>(sumOfEnds / 2);  // toward zero: -9 gives -4
+    const std::int64_t halfOfSum = sumOfEnds / 2;  // toward zero: -9 gives -4
+    const float middleY = static_cast<float>(halfOfSum);
     const float middleX = cutToWholePoint((fatherAt.x + own.x + treeSize.nodeWidth) * 0.5f);
     const float ownY = cutToWholePoint(own.y + treeSize.nodeHeight * 0.5f);
     const float ownRight = cutToWholePoint(own.x + treeSize.nodeWidth);

@@ -300,7 +300,7 @@ std::size_t repairUtf8(std::string_view raw, std::string& text) {
         return raw.size();
     }
     const char32_t windows = kWindows1252[byteAt(raw, 0) - 0x80];
-    appendUtf8(text, windows == 0 || windows < 0xA0 ? kReplacement : windows);
+    appendUtf8(text, windows < 0xA0 ? kReplacement : windows);
     return 1;
 }
 
