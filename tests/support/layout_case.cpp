@@ -6,10 +6,10 @@
 //
 //     layout-case [--graph] [--trace] [--record] [--every-person] CASEFILE...
 //
-// --every-person lays out each person of whom the file speaks, instead of its focus, behind a line "focus
-// ID".
-// --record writes CASEFILE.new for each file: the case with its expected lines ("#= ...") as they are now. A
-// person compares the two and renames.
+// --every-person lays out each person of whom the file speaks, instead of its focus, behind a line "focus ID".
+//
+// --record writes CASEFILE.new for each file: the case with its expected lines ("#= ...") as they are now. A person
+// compares the two and renames.
 
 #include <support/CaseFile.h>
 #include <support/CaseRun.h>

@@ -12,10 +12,9 @@
 
 // The six callbacks through which a layouter learns of a family. Persons are known by key alone.
 //
-// A plain holder: it copies the callbacks and keeps no answers. It must outlive the layouter that points to
-// it. Fails: calling a field that was left empty throws boost::bad_function_call ("call to empty
-// boost::function");
-//        whatever a callback throws passes through the layouter unchanged.
+// A plain holder: it copies the callbacks and keeps no answers. It must outlive the layouter that points to it.
+// Fails: calling a field that was left empty throws boost::bad_function_call ("call to empty
+//        boost::function"); whatever a callback throws passes through the layouter unchanged.
 struct DataAdapter {
     typedef boost::function<void(int, SpouseSet&)> SpousesCallback;
     typedef boost::function<void(int, int&, int&)> ParentsCallback;

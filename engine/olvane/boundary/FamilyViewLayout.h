@@ -14,8 +14,7 @@
 //
 // personText is the decimal form of the host's id of the focus. The data source is held for the whole call.
 // Fails: never because of the data or the host. Whatever goes wrong in the layout leaves the text written so
-// far,
-//        usually the empty one. Memory that runs out before or after the layout throws std::bad_alloc.
+//        far, usually the empty one. Memory that runs out before or after the layout throws std::bad_alloc.
 // Threads: several calls may run at once, each with a data source of its own or one that is safe to share.
 OLVANE_API std::string FamilyViewLayout(std::string personText,
                                         std::shared_ptr<OlvaneViewerManagerWrapProtocol> manager);

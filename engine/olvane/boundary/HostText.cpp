@@ -23,11 +23,12 @@ int stringToInt(std::string text) {
 
 namespace {
 
+// How a character goes on behind its first byte. The bounds of the second byte rule out overlong forms, surrogates, and
+// what lies beyond the last code point.
 struct Utf8Form {
     std::size_t length;  // in bytes
-    unsigned char
-        least;           // bounds of the second byte: they rule out overlong forms, surrogates, and what lies
-    unsigned char most;  // beyond the last code point
+    unsigned char least;
+    unsigned char most;
 };
 
 Utf8Form formOfLead(unsigned char lead) {

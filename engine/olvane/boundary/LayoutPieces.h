@@ -73,8 +73,7 @@ struct ResultBounds {
 
 // A visitor for graphIterator that appends one record for each person to the text. It refers to all three.
 // Fails: std::out_of_range for a person of an unknown key, before anything is written, and for a person of
-// negative
-//        id without an add-node record, behind its segments.
+//        negative id without an add-node record, behind its segments.
 OLVANE_API TreeViewPerson::Visitor resultWriter(ViewerGlue& glue, ResultBounds& bounds, std::string& text);
 
 // Does the work and swallows whatever it throws: the caller is left with what was written so far.

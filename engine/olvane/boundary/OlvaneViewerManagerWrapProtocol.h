@@ -12,13 +12,11 @@
 // these.
 //
 // Units: person ids are the host's own. Real persons have ids of 1 and more; ids below 1 mark synthetic
-// persons
-//        inside the engine. Only the low 32 bits of an id count.
+//        persons inside the engine. Only the low 32 bits of an id count.
 // Holds: asked on the caller's thread, within a layout, and many times for the same person, since no answer
-// is
-//        kept. Answers must agree with each other within one layout. They may contradict each other otherwise
-//        (a child that does not name its parent, a person who is their own ancestor): the layout takes them
-//        as told.
+//        is kept. Answers must agree with each other within one layout. They may contradict each other
+//        otherwise (a child that does not name its parent, a person who is their own ancestor): the layout
+//        takes them as told.
 // Fails: an operation may throw anything. The layout then ends with the text written so far.
 class OlvaneViewerManagerWrapProtocol {
 public:

@@ -9,7 +9,7 @@
 // source's answers, they use up synthetic ids in a fixed order, and they alone decide about add-nodes.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
-#include <olvane/layouter/HiddenRelatives.h>
+#include <olvane/layouter/HiddenRelativesInternal.h>
 
 #include <algorithm>
 

@@ -6,7 +6,7 @@
 // skips, by id, is a person's own entry among its siblings.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
-#include <olvane/layouter/AncestorStacking.h>
+#include <olvane/layouter/AncestorStackingInternal.h>
 
 namespace SharedTreeViewer {
 

@@ -18,11 +18,10 @@ namespace SharedTreeViewer {
 //
 // Units: points; x grows right, y grows down, and one generation is nodeHeight + vertPadding.
 // Holds: men stand left of their spouses, women right. Boxes are set at the middle of their spans while lines
-// and
-//        hosts take the same point for the box's upper-left corner, so the whole drawing stands half a
+//        and hosts take the same point for the box's upper-left corner, so the whole drawing stands half a
 //        nodeWidth to the right of the spans. All boxes alike: it is part of the picture.
 // Fails: as the base; std::out_of_range where the data leave a line without the person that it should hang
-// from.
+//        from.
 //
 // The operations are public so that each act can be run and looked at alone. Hosts call layoutForFocusNID
 // once, then graphIterator.

@@ -20,20 +20,19 @@
 // A person's box in the chart, with the relatives that hang from it.
 //
 // Units: points; x grows right, y grows down. nodeCenter is the upper-left corner of the box for lines and
-// for
-//        the host, in spite of its name.
+//        for the host, in spite of its name.
 // Holds: relatives lie here by value, each in exactly one list of exactly one person; a copy is a deep copy.
-// The
-//        same human being can stand in the graph several times, and such nodes are never merged.
+//        The same human being can stand in the graph several times, and such nodes are never merged.
 //
 // Three phases, in this order:
 //   1. relatives are added and placed. A reference into a list is good until the next append to that list.
 //   2. lines and flags. No list of displayed relatives grows any more; only now may pointers to persons be
-//   kept
-//      and spouse edges be made (nonDisplayedSpouses may still be filled: nothing points at those nodes).
+//      kept and spouse edges be made (nonDisplayedSpouses may still be filled: nothing points at those
+//      nodes).
 //   3. the whole graph goes in one destruction.
-// A copy takes the plain pointers in spouseEdges along, so a person that owns edges must not be copied: the
-// edge would have two owners. Growing a list in phase 2 would do just that.
+//
+// A copy takes the plain pointers in spouseEdges along, so a person that owns edges must not be copied: the edge
+// would have two owners. Growing a list in phase 2 would leave edges that point at where persons were.
 class OLVANE_API TreeViewPerson {
 public:
     typedef boost::function<void(TreeViewPerson&)> Visitor;
@@ -52,8 +51,8 @@ public:
 
     explicit TreeViewPerson(int key);
     TreeViewPerson(const TreeViewPerson&) = default;
-    TreeViewPerson(TreeViewPerson&&) noexcept =
-        default;  // how a list grows: the relatives come along as they lie
+    // How a list grows: the relatives come along as they lie.
+    TreeViewPerson(TreeViewPerson&&) noexcept = default;
     TreeViewPerson& operator=(const TreeViewPerson&) = delete;
     ~TreeViewPerson();  // deletes the spouse edges that this person owns, first of all
 
@@ -159,8 +158,8 @@ public:
     bool hasNonDisplayedRelationships = false;              // the flag of the result
     std::map<int, TreeViewSpouseEdge*> spouseEdges;         // owned, by the other spouse's key
     std::map<int, TreeViewSpouseEdge*> unownedSpouseEdges;  // owned by the other spouse, by that spouse's key
-    std::vector<boost::shared_ptr<TreeViewGenerationEdge>>
-        generationEdges;            // to children of this person alone
+    // To children of whom this person is the only drawn parent.
+    std::vector<boost::shared_ptr<TreeViewGenerationEdge>> generationEdges;
     ChildrenSet allChildren;        // the host's children, filled at most once
     int preferredFatherIndex = -1;  // into parents
     int preferredMotherIndex = -1;  // into parents

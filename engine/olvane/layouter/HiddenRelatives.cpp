@@ -4,7 +4,7 @@
 // Looks for relatives off the picture, shared by the views. Each view decides on its own when to look and
 // what a later look may overwrite; here stands only what the two ask in the very same words.
 
-#include <olvane/layouter/HiddenRelatives.h>
+#include <olvane/layouter/HiddenRelativesInternal.h>
 
 namespace SharedTreeViewer {
 

@@ -23,6 +23,10 @@ bool TreeViewLayouter::boolOptionForKey(const std::string& key, bool defaultValu
     return option == options.end() ? defaultValue : option->second;
 }
 
+float TreeViewLayouter::rowStep() const {
+    return treeSize.nodeHeight + treeSize.vertPadding;
+}
+
 void TreeViewLayouter::centerPerson(TreeViewPerson& person, float width, float left, float y) const {
     person.getNodeCenter() = TreePoint{width * 0.5f + left, y};
 }

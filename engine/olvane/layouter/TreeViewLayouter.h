@@ -84,14 +84,13 @@ public:
     OptionMap options;
     DataAdapter* dataAdapter;
     TreeSize treeSize;
-    std::map<int, bool>
-        shownPersons;  // keys admitted to the graph; presence counts, the value is always true
+    std::map<int, bool> shownPersons;  // keys admitted to the graph; the value is always true
 
 protected:
     ~TreeViewLayouter() = default;
 
     // The step from one row or column to the next.
-    float rowStep() const { return treeSize.nodeHeight + treeSize.vertPadding; }
+    float rowStep() const;
 
     void admit(int key) { shownPersons.emplace(key, true); }
     bool isAdmitted(int key) const { return shownPersons.find(key) != shownPersons.end(); }

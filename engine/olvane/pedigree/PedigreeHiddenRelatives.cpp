@@ -6,7 +6,7 @@
 
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
-#include <olvane/layouter/HiddenRelatives.h>
+#include <olvane/layouter/HiddenRelativesInternal.h>
 
 #include <algorithm>
 

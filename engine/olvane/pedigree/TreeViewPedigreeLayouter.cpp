@@ -8,7 +8,7 @@
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
 #include <olvane/graph/WholePoint.h>
-#include <olvane/layouter/AncestorStacking.h>
+#include <olvane/layouter/AncestorStackingInternal.h>
 
 #include <cmath>
 #include <cstdint>

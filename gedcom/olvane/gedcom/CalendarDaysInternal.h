@@ -9,8 +9,8 @@ enum class Calendar { gregorian, julian, frenchRepublican, hebrew };
 // A day, or with day 0 a month, or with month 0 as well a year.
 //
 // Units: year as people count: no year 0, 44 B.C. is -44. The months of the French calendar are 1 to 13 with
-// the complementary days last; those of the Hebrew one begin with Tishri as 1, Adar is 6, the second Adar 7,
-// Elul 13.
+//        the complementary days last; those of the Hebrew one begin with Tishri as 1, Adar is 6, the second
+//        Adar 7, Elul 13.
 struct CalendarDate {
     int year = 0;
     int month = 0;

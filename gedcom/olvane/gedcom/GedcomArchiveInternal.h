@@ -14,7 +14,7 @@ bool looksLikeArchive(std::string_view bytes);
 
 // The GEDCOM member of a .gdz archive.
 // Fails: GedcomError if there is none, if it cannot be unpacked or is larger than its archive can sensibly
-// make it, and always in a library that was built without zip.
+//        make it, and always in a library that was built without zip.
 std::string unpackGedcom(const std::string& archive, const std::string& name, DiagnosticList& diagnostics);
 
 }  // namespace olvane::gedcom

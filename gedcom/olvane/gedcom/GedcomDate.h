@@ -21,8 +21,8 @@ enum class DateMark : std::uint8_t {
 //
 // Units: years count without a year 0: 44 B.C. is -44. month is 1 to 12, day 1 to 31; 0 means not given.
 // Holds: a date that could not be read has year 0, and written is all there is to show. A year alone of a
-//        calendar whose year begins in autumn is the Gregorian year that most of it falls in. A dual
-//        year (1731/32) is the later one, by which the year begins in January.
+//        calendar whose year begins in autumn is the Gregorian year that most of it falls in. A dual year
+//        (1731/32) is the later one, by which the year begins in January.
 // Lifetime: written is a view into the text of the GedcomData that the date came from.
 struct GedcomDate {
     std::string_view written;

@@ -12,8 +12,7 @@ namespace olvane::gedcom {
 // child.
 //
 // Holds: a pointer to nothing becomes nobody, with a diagnostic. Time and memory are linear in the number of
-// links, even
-//        where many persons claim the same large family.
+//        links, even where many persons claim the same large family.
 void resolveLinks(GedcomTables& tables, const XrefTable& xrefs, DiagnosticList& diagnostics);
 
 }  // namespace olvane::gedcom

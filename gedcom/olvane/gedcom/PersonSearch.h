@@ -19,7 +19,7 @@ namespace olvane::gedcom {
 // Łukasz.
 //
 // Holds: persons with each word whole come first, then the rest, each in the order of the file. At most
-// limit.
+//        limit.
 std::vector<PersonId> findPersons(const GedcomData& data, std::string_view text,
                                   std::size_t limit = std::numeric_limits<std::size_t>::max());
 

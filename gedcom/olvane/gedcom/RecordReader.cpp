@@ -267,6 +267,7 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
         case kBurial:
         case kCremation:
         case kProbate:
+            if (trimmed(line.value) == "N") return;  // an older custom for "did not happen"
             person().dead = true;
             return;
         case kFamilyAsChild:

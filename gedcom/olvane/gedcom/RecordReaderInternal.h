@@ -18,8 +18,7 @@ namespace olvane::gedcom {
 // Fills the tables from the lines of a file, in one pass and without a tree of lines.
 //
 // Holds: until links are resolved, each id in parentLinks, coupleLinks, childLinks and a family's partners is
-// an
-//        XrefPlace. Spouses, children, fathers and mothers are not filled in here.
+//        an XrefPlace. Spouses, children, fathers and mothers are not filled in here.
 class RecordReader {
 public:
     RecordReader(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables, XrefTable& xrefs,

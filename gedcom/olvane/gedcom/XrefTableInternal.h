@@ -18,8 +18,7 @@ using XrefPlace = std::uint32_t;
 // All identifiers of a file, whether a record has them or only a pointer.
 //
 // Holds: places never change; place 0 stands for no identifier, and for a void pointer. Finding one takes
-// constant
-//        time on the average. Memory is at most some 100 bytes an identifier.
+//        constant time on the average. Memory is at most some 100 bytes an identifier.
 // Lifetime: the texts are views; whatever they look into outlives the table.
 class XrefTable {
 public:

@@ -22,8 +22,8 @@ struct Synthetic {
 //
 // Holds: nothing is remembered but the keys and the synthetic persons, so each question goes to the host
 //        again, and each question for the parents of a person who lacks one makes new synthetic persons.
-// Fails: std::out_of_range for a key never handed out, or an id below 1 that is no synthetic person; what
-//        the host throws passes through.
+// Fails: std::out_of_range for a key never handed out, or an id below 1 that is no synthetic person; what the
+//        host throws passes through.
 class Data {
 public:
     Data(support::CaseHost& source, support::CaseAdapter adapterKind) : host(source), adapter(adapterKind) {}

@@ -20,8 +20,7 @@ struct Answer {
 // rules. It is slow and plain on purpose, and the judge that the engine is compared with, byte for byte.
 //
 // Fails: never on account of a family. A host call that fails ends the layout with the text so far, as it
-// does
-//        in the engine. A pedigree of very many generations in one line can use up the stack.
+//        does in the engine. A pedigree of very many generations in one line can use up the stack.
 Answer layOut(const support::CaseFile& request, bool graph, bool trace);
 
 }  // namespace plain
