@@ -7,7 +7,9 @@
 
 #include <cli/Commands.h>
 
+#include <charconv>
 #include <csignal>
+#include <filesystem>
 #include <fstream>
 #include <iostream>
 #include <memory>
@@ -49,12 +51,30 @@ public:
     }
 };
 
+struct BatchFocus {
+    std::string written;      // as the stream has it; empty where everybody is taken
+    gedcom::PersonId id = 0;  // 0 where the words are still to be searched
+};
+
+// The person of a bare number; 0 for other words and for numbers beyond the last person.
+gedcom::PersonId idOfNumber(const gedcom::GedcomData& data, const std::string& written) {
+    gedcom::PersonId id = 0;
+    const char* const end = written.data() + written.size();
+    const auto [stop, error] = std::from_chars(written.data(), end, id);
+    return error == std::errc() && stop == end && id <= data.personCount() ? id : 0;
+}
+
 // The focuses, one after the other: everybody of the file, or the lines of a stream.
+//
+// Fails: throws UsageError where the stream cannot be opened or breaks off.
 class FocusList {
 public:
-    FocusList(const gedcom::GedcomData& data, const std::string& from) : data_(data) {
+    FocusList(const gedcom::GedcomData& data, const std::string& from) : data_(data), from_(from) {
         if (from.empty()) return;
         if (from != "-") {
+            if (std::filesystem::is_directory(from)) {
+                throw UsageError(from + ": is a directory; a file with an id on each line is needed");
+            }
             file_ = std::make_unique<std::ifstream>(from);
             if (!*file_) throw UsageError(from + ": cannot be read");
         }
@@ -64,30 +84,37 @@ public:
     // How many there will be; 0 where that cannot be known.
     std::size_t total() const { return lines_ == nullptr ? data_.personCount() : 0; }
 
-    std::vector<std::string> nextBlock() {
-        std::vector<std::string> block;
-        for (std::string focus; block.size() < kBlock && next(focus);) block.push_back(focus);
+    std::vector<BatchFocus> nextBlock() {
+        std::vector<BatchFocus> block;
+        for (BatchFocus focus; block.size() < kBlock && next(focus);) block.push_back(focus);
         return block;
     }
 
 private:
-    bool next(std::string& focus) {
-        if (lines_ == nullptr) {
-            if (given_ == data_.personCount()) return false;
-            focus = std::to_string(++given_);
+    bool next(BatchFocus& focus) {
+        if (lines_ == nullptr) return nextPerson(focus);
+        std::string& written = focus.written;
+        while (std::getline(*lines_, written)) {
+            if (!written.empty() && written.back() == '\r') written.pop_back();
+            if (written.empty()) continue;
+            focus.id = idOfNumber(data_, written);
             return true;
         }
-        while (std::getline(*lines_, focus)) {
-            if (!focus.empty() && focus.back() == '\r') focus.pop_back();
-            if (!focus.empty()) return true;
-        }
+        if (lines_->bad() && interrupted == 0) throw UsageError(from_ + ": cannot be read to its end");
         return false;
     }
 
+    bool nextPerson(BatchFocus& focus) {
+        if (given_ == data_.personCount()) return false;
+        focus.id = ++given_;
+        return true;
+    }
+
     const gedcom::GedcomData& data_;
+    std::string from_;
     std::unique_ptr<std::ifstream> file_;
     std::istream* lines_ = nullptr;
-    std::size_t given_ = 0;
+    gedcom::PersonId given_ = 0;
 };
 
 // On a terminal alone, and on stderr, so that results stay clean.
@@ -121,11 +148,18 @@ struct BatchLine {
     bool isKnown = false;
 };
 
-// Ids and xrefs are what this is for; a name serves where it means one person.
-BatchLine lineFor(const gedcom::GedcomData& data, const std::string& focus, const LayoutRequest& request) {
-    const auto found = gedcom::findPersons(data, focus, 2);
-    if (found.size() != 1) return {focus + "\t\n", false};
-    return {std::to_string(found.front()) + "\t" + layoutText(data, found.front(), request) + "\n", true};
+// A number is an id first, as this command itself and the list of persons print it, even where a file has
+// numbers for xrefs. Then xrefs; a name serves where it means one person.
+gedcom::PersonId personOf(const gedcom::GedcomData& data, const BatchFocus& focus) {
+    if (focus.id != 0) return focus.id;
+    const auto found = gedcom::findPersons(data, focus.written, 2);
+    return found.size() == 1 ? found.front() : 0;
+}
+
+BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const LayoutRequest& request) {
+    const gedcom::PersonId id = personOf(data, focus);
+    if (id == 0) return {focus.written + "\t\n", false};
+    return {std::to_string(id) + "\t" + layoutText(data, id, request) + "\n", true};
 }
 
 }  // namespace
@@ -146,7 +180,7 @@ int runBatch(const BatchOptions& options) {
             writeStandardOutput(lines[i].text);
             if (lines[i].isKnown) continue;
             ++unknown;
-            tell(options.file + ": '" + block[i] + "' is not one person");
+            tell(options.file + ": '" + block[i].written + "' is not one person");
         }
         progress.show(done);
     }

@@ -194,10 +194,10 @@ private:
                                      "Print many layouts: id, a tab and the result text on a line for each");
         addFile(*batch_, batchOptions_.file);
         batch_
-            ->add_option(
-                "--focus-from", batchOptions_.focusFrom,
-                "File with the focuses, an id or xref on each line; - for the standard input. Everybody "
-                "when not given")
+            ->add_option("--focus-from", batchOptions_.focusFrom,
+                         "File with the focuses, an id or xref on each line; - for the standard input. A "
+                         "bare number is "
+                         "an id first. Everybody when not given")
             ->type_name("FROM");
         addView(*batch_, batchOptions_.request);
         addBoxes(*batch_, batchOptions_.request, "default tall");
