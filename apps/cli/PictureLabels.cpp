@@ -116,12 +116,18 @@ draw::DrawingContent pictureContent(const gedcom::GedcomData& data, std::vector<
     draw::DrawingContent content;
     content.records = std::move(records);
     content.focusId = focus;
-    content.labelOf = [&data, shown, living = std::move(living)](std::int64_t id) {
-        const gedcom::PersonId person = asPerson(id);
-        return !living.empty() && living[person - 1] ? livingLabel() : labelOf(data, person, *shown);
+    const auto isLiving = [living = std::move(living)](gedcom::PersonId id) {
+        return !living.empty() && living[id - 1];
     };
-    content.parentLinkOf = [&data](std::int64_t id) { return parentLinkOf(data, asPerson(id)); };
-    content.isDivorced = [&data](std::int64_t one, std::int64_t other) {
+    content.labelOf = [&data, shown, isLiving](std::int64_t id) {
+        return isLiving(asPerson(id)) ? livingLabel() : labelOf(data, asPerson(id), *shown);
+    };
+    // Of the living the lines tell no more than the boxes do.
+    content.parentLinkOf = [&data, isLiving](std::int64_t id) {
+        return isLiving(asPerson(id)) ? draw::ParentLink::birth : parentLinkOf(data, asPerson(id));
+    };
+    content.isDivorced = [&data, isLiving](std::int64_t one, std::int64_t other) {
+        if (isLiving(asPerson(one)) || isLiving(asPerson(other))) return false;
         return areDivorced(data, asPerson(one), asPerson(other));
     };
     return content;
