@@ -173,6 +173,15 @@ TEST(Relations, deathBurialCremationAndProbateMeanDead) {
     EXPECT_EQ(dead, "++++---");
 }
 
+TEST(Relations, anEventThatDidNotHappenLeavesAPersonAlive) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 DEAT N\n0 @I2@ INDI\n1 BURI N\n0 @I3@ INDI\n1 DEAT Y\n0 @I4@ INDI\n"
+                      "1 DEAT N\n1 BURI\n"));
+    std::string dead;
+    for (const Person& person : data.persons()) dead.push_back(person.dead ? '+' : '-');
+    EXPECT_EQ(dead, "--++");
+}
+
 TEST(Relations, theFirstEventWithADateGivesIt) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 BIRT\n2 PLAC here\n1 BIRT\n2 DATE 1801\n1 BIRT\n2 DATE 1802\n1 DEAT\n2 "
