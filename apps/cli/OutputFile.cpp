@@ -87,9 +87,14 @@ void writeOutput(const std::string& path, std::string_view content) {
     beside.move(path);
 }
 
+// Past the stream of the C library, which loses its place when a signal breaks into a write.
 void writeStandardOutput(std::string_view content) {
-    const bool written = std::fwrite(content.data(), 1, content.size(), stdout) == content.size();
-    if (!written || std::fflush(stdout) != 0) refuse("standard output", errno);
+    if (std::fflush(stdout) != 0) refuse("standard output", errno);
+    while (!content.empty()) {
+        const ssize_t written = ::write(STDOUT_FILENO, content.data(), content.size());
+        if (written < 0 && errno != EINTR) refuse("standard output", errno);
+        if (written > 0) content.remove_prefix(static_cast<std::size_t>(written));
+    }
 }
 
 }  // namespace olvane::cli

@@ -13,7 +13,7 @@ namespace olvane::cli {
 // Fails: throws UsageError; no partial file is left.
 void writeOutput(const std::string& path, std::string_view content);
 
-// Writes to the standard output and makes sure that it arrived.
+// Writes to the standard output and makes sure that it arrived. A signal that is only marked does not cut it.
 // Fails: throws UsageError.
 void writeStandardOutput(std::string_view content);
 
