@@ -5,6 +5,10 @@
 
 #include <cli/FileReading.h>
 
+#include <array>
+#include <cstddef>
+#include <limits>
+
 #include <olvane/gedcom/GedcomReader.h>
 
 #include <cli/Messages.h>
@@ -14,16 +18,32 @@ namespace olvane::cli {
 
 namespace {
 
-constexpr std::size_t kPerKind = 10;
+constexpr std::size_t kPerKind = 10;     // told on stderr
+constexpr std::size_t kCounted = 10000;  // of a kind; memory does not grow with the trouble beyond these
 
+// The first of each kind, and how many were kept back. Notes are for those who ask.
 void report(const gedcom::GedcomData& data) {
+    std::array<std::size_t, static_cast<std::size_t>(gedcom::DiagnosticKind::moreOfAKind) + 1> seen{};
+    std::size_t keptBack = 0;
+    bool isWhole = true;
     for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
         if (diagnostic.severity == gedcom::Severity::note) continue;
-        tell(diagnostic);
+        const std::size_t ofKind = ++seen[static_cast<std::size_t>(diagnostic.kind)];
+        if (ofKind > kPerKind) {
+            ++keptBack;
+            isWhole = isWhole && ofKind < kCounted;
+        } else {
+            tell(diagnostic);
+        }
     }
+    if (keptBack == 0) return;
+    tell(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) +
+         " more; 'olvane check " + data.file() + "' tells them all");
 }
 
-gedcom::GedcomData read(const std::string& path, const gedcom::ReadOptions& options) {
+gedcom::GedcomData read(const std::string& path, std::size_t diagnosticsPerKind) {
+    gedcom::ReadOptions options;
+    options.diagnosticsPerKind = diagnosticsPerKind;
     try {
         return gedcom::readGedcomFile(path, options);
     } catch (const gedcom::GedcomError& error) {
@@ -34,15 +54,13 @@ gedcom::GedcomData read(const std::string& path, const gedcom::ReadOptions& opti
 }  // namespace
 
 gedcom::GedcomData readFile(const std::string& path) {
-    gedcom::ReadOptions options;
-    options.diagnosticsPerKind = kPerKind;
-    gedcom::GedcomData data = read(path, options);
+    gedcom::GedcomData data = read(path, kCounted);
     report(data);
     return data;
 }
 
 gedcom::GedcomData readFileQuietly(const std::string& path) {
-    return read(path, gedcom::ReadOptions());
+    return read(path, std::numeric_limits<std::size_t>::max());
 }
 
 }  // namespace olvane::cli
