@@ -6,8 +6,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-// What must be true of every input. Unlike assert it stands in every build; a fuzzer sees the abort as a
-// finding.
+// What must be true of every input. It stands in every build, unlike assert, and its abort is a finding.
 #define HOLDS(condition)                                                                 \
     do {                                                                                 \
         if (!(condition)) {                                                              \

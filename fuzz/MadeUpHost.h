@@ -54,8 +54,8 @@ std::vector<MadeUpPerson> makeUpFamily(ByteSource& bytes);
 // A data source that says what it was made of, in any contradiction.
 //
 // Holds: no layout goes on for ever: the call behind kMostCalls throws, whatever the mischief says. A spouse
-// listed
-//        twice is drawn with all children twice, so the questions can grow with a power of the list's length.
+//        listed twice is drawn with all children twice, so the questions can grow with a power of the list's
+//        length.
 class MadeUpHost final : public OlvaneViewerManagerWrapProtocol {
 public:
     static constexpr std::size_t kMostCalls = 5'000;

@@ -3,8 +3,7 @@
 
 // Any family, laid out in either view with any options, depth and sizes. Contradictions, cycles, duplicates,
 // ids from the edges of the numbers and a host that throws are all part of it. What is looked for: memory
-// errors and undefined behaviour inside, an exception that gets out, a text that its own reader cannot read
-// back.
+// errors, undefined behaviour, an exception that gets out, a text that its own reader cannot read back.
 
 #include <array>
 #include <cstddef>
@@ -21,6 +20,10 @@
 #include <olvane/boundary/OlvaneViewerBridge.h>
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/TreeLine.h>
+#include <olvane/graph/TreeViewGenerationEdge.h>
+#include <olvane/graph/TreeViewPerson.h>
+#include <olvane/graph/TreeViewSpouseEdge.h>
 #include <olvane/host/LayoutText.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
@@ -141,9 +144,62 @@ DataAdapter::ParentsCallback bareParents(ViewerGlue& glue, OlvaneViewerManagerWr
     };
 }
 
+bool isKnown(const ViewerGlue& glue, const TreeViewPerson& person) {
+    return glue.keyToPerson.count(person.personId) == 1;
+}
+
+void followSpouseEdges(const ViewerGlue& glue, TreeViewPerson& person) {
+    person.spouseEdgeIterator([&](TreeViewSpouseEdge* edge) {
+        HOLDS(isKnown(glue, *edge->person) && isKnown(glue, *edge->spouse));
+        const auto first = edge->begin();
+        for (auto child = first; child != edge->end(); ++child) {
+            HOLDS(isKnown(glue, *(*child)->child));
+            HOLDS((*child)->hasSingleParent() || (*child)->parentsEdge == edge);
+            (*child)->line().length();
+        }
+        edge->line().length();
+    });
+}
+
+void followGenerationEdges(const ViewerGlue& glue, TreeViewPerson& person) {
+    person.generationEdgeIterator([&](TreeViewGenerationEdge* edge) {
+        HOLDS(isKnown(glue, *edge->child));
+        HOLDS(edge->hasMultipleParents() || isKnown(glue, *edge->singleParent));
+        edge->line().length();
+    });
+}
+
+// Chaining looks at every pair of segments, so it is tried on short lists alone.
+void chainSegments(const TreeViewPerson& person) {
+    constexpr std::size_t kMostChained = 40;
+    if (person.lineSegments.size() > kMostChained) return;
+    for (TreeLine& line : TreeLine::TreeLinesFromLineSegments(person.lineSegments)) {
+        HOLDS(line.points().size() >= 2);
+        line.length();
+    }
+}
+
+// What a host does that draws from the graph. It asks the data source nothing, so nothing may throw, and what
+// does ends the program. Sizes of no sense make segments that cannot be chained.
 template <class Layouter>
-void layOutAndWrite(Layouter& layouter, ViewerGlue& glue, std::string& text) {
+void lookAtGraph(const Request& request, Layouter& layouter, const ViewerGlue& glue) noexcept {
+    layouter.graphIterator([&](TreeViewPerson& person) {
+        followSpouseEdges(glue, person);
+        followGenerationEdges(glue, person);
+        if (!request.hasOwnSizes) chainSegments(person);
+    });
+    layouter.iterateDirectLineFromFocusPerson(
+        [&glue](TreeViewPerson& person, bool hasNeighbours, const TreeViewPerson::Iterator& neighbours) {
+            HOLDS(isKnown(glue, person));
+            const auto look = [&glue](TreeViewPerson& neighbour) { HOLDS(isKnown(glue, neighbour)); };
+            if (hasNeighbours) neighbours(look);
+        });
+}
+
+template <class Layouter>
+void layOutAndWrite(const Request& request, Layouter& layouter, ViewerGlue& glue, std::string& text) {
     layouter.layoutForFocusNID();
+    lookAtGraph(request, layouter, glue);
     olvane::ResultBounds bounds;
     layouter.graphIterator(olvane::resultWriter(glue, bounds, text));
 }
@@ -155,12 +211,12 @@ void runLayouter(const Request& request, DataAdapter& adapter, ViewerGlue& glue,
         SharedTreeViewer::TreeViewPedigreeLayouter layouter(&adapter, focusKey, isMale, request.options,
                                                             request.size, request.generations,
                                                             request.stackDepth);
-        layOutAndWrite(layouter, glue, text);
+        layOutAndWrite(request, layouter, glue, text);
     } else {
         SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, request.options,
                                                           request.size);
         layouter.maxStackDepth = request.stackDepth;
-        layOutAndWrite(layouter, glue, text);
+        layOutAndWrite(request, layouter, glue, text);
     }
 }
 

@@ -22,8 +22,7 @@ namespace {
 
 using namespace olvane::gedcom;
 
-// Persons whose names are searched for: each search looks at every person, and a file of 64 KiB has
-// thousands.
+// Persons whose names are searched for: each search looks at all, and a file of 64 KiB has thousands.
 constexpr std::size_t kSearchedPersons = 8;
 constexpr std::size_t kSortTextBytes = 12;
 
