@@ -7,6 +7,7 @@
 #include <cli/Commands.h>
 
 #include <algorithm>
+#include <functional>
 
 #include <olvane/draw/LayoutCheck.h>
 
@@ -53,6 +54,7 @@ std::size_t tellOddities(const gedcom::GedcomData& data, std::string& text) {
 
 struct CheckedLayout {
     std::size_t boxes = 0;
+    draw::BoxSize size{};
     draw::LayoutFindings findings;
 };
 
@@ -63,7 +65,7 @@ CheckedLayout checkLayoutOf(const gedcom::GedcomData& data, gedcom::PersonId foc
     const auto direction =
         request.view == View::pedigree ? draw::LineDirection::sideways : draw::LineDirection::downward;
     const draw::BoxSize box{static_cast<int>(size.nodeWidth), static_cast<int>(size.nodeHeight)};
-    return {records.size(), draw::checkLayout(records, direction, box)};
+    return {records.size(), box, draw::checkLayout(records, direction, box)};
 }
 
 void tellPairs(const std::vector<draw::IdPair>& pairs, const char* what, std::string& text) {
@@ -80,29 +82,53 @@ void tellLayout(const CheckedLayout& layout, std::string& text) {
     for (const draw::RepeatedPerson& person : findings.repeatedPersons) {
         text += "several boxes\t" + std::to_string(person.id) + "\t" + std::to_string(person.boxes) + "\n";
     }
-    text += counted(layout.boxes, "box", "boxes") + ", " + std::to_string(findings.overlappingBoxes.size()) +
+    text += counted(layout.boxes, "box", "boxes") + " of " + std::to_string(layout.size.width) + " by " +
+            std::to_string(layout.size.height) + ", " + std::to_string(findings.overlappingBoxes.size()) +
             " overlapping, " + counted(findings.linesThroughBoxes.size(), "line", "lines") +
             " through boxes, " + std::to_string(findings.sharedTracks.size()) +
             " pairs of families on one track, " +
             counted(findings.repeatedPersons.size(), "person", "persons") + " in several boxes\n";
 }
 
-std::string tableLine(gedcom::PersonId id, const CheckedLayout& layout) {
+std::vector<std::size_t> countsOf(const CheckedLayout& layout) {
     const draw::LayoutFindings& findings = layout.findings;
-    std::string text = std::to_string(id);
-    for (const std::size_t count :
-         {layout.boxes, findings.overlappingBoxes.size(), findings.linesThroughBoxes.size(),
-          findings.sharedTracks.size(), findings.repeatedPersons.size()}) {
-        text += "\t" + std::to_string(count);
-    }
-    return text + "\n";
+    return {layout.boxes, findings.overlappingBoxes.size(), findings.linesThroughBoxes.size(),
+            findings.sharedTracks.size(), findings.repeatedPersons.size()};
 }
 
-// One line for each person as focus; answers how many layouts have trouble.
+void appendPairs(const std::vector<draw::IdPair>& pairs, const char* what, std::string& text) {
+    if (pairs.empty()) return;
+    text += (text.empty() ? "" : "; ") + std::string(what);
+    for (const auto& [one, other] : pairs) text += " " + std::to_string(one) + "+" + std::to_string(other);
+}
+
+// Whom the counts of a line are about: "overlap 3+8; several boxes 4 9".
+std::string idsOf(const draw::LayoutFindings& findings) {
+    std::string text;
+    appendPairs(findings.overlappingBoxes, "overlap", text);
+    appendPairs(findings.linesThroughBoxes, "through", text);
+    appendPairs(findings.sharedTracks, "one track", text);
+    if (findings.repeatedPersons.empty()) return text;
+    text += std::string(text.empty() ? "" : "; ") + "several boxes";
+    for (const draw::RepeatedPerson& person : findings.repeatedPersons)
+        text += " " + std::to_string(person.id);
+    return text;
+}
+
+std::string tableLine(const std::string& name, const std::vector<std::size_t>& counts,
+                      const std::string& ids) {
+    std::string text = name;
+    for (const std::size_t count : counts) text += "\t" + std::to_string(count);
+    return text + "\t" + ids + "\n";
+}
+
+// One line for each person as focus, and one for all of them; answers how many layouts have trouble.
 std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& request) {
     writeStandardOutput(
-        "focus\tboxes\toverlaps\tlines through boxes\tfamilies on one track\tpersons in several boxes\n");
+        "focus\tboxes\toverlaps\tlines through boxes\tfamilies on one track\tpersons in several "
+        "boxes\tids\n");
     std::size_t troubled = 0;
+    std::vector<std::size_t> totals(countsOf({}).size());
     const std::size_t count = data.personCount();
     for (std::size_t start = 0; start < count; start += kBlock) {
         std::vector<CheckedLayout> layouts(std::min(kBlock, count - start));
@@ -111,30 +137,44 @@ std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& 
                    [&](std::size_t i) { layouts[i] = checkLayoutOf(data, idAt(i), request); });
         std::string text;
         for (std::size_t i = 0; i < layouts.size(); ++i) {
-            text += tableLine(idAt(i), layouts[i]);
+            const std::vector<std::size_t> counts = countsOf(layouts[i]);
+            std::transform(totals.begin(), totals.end(), counts.begin(), totals.begin(), std::plus<>());
+            text += tableLine(std::to_string(idAt(i)), counts, idsOf(layouts[i].findings));
             if (layouts[i].findings.anyTrouble()) ++troubled;
         }
         writeStandardOutput(text);
     }
+    writeStandardOutput(tableLine("total", totals, counted(troubled, "layout", "layouts") + " with trouble"));
     return troubled;
+}
+
+// Answers whether the layout has trouble.
+bool tellOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
+    const CheckedLayout layout = checkLayoutOf(data, focus, request);
+    std::string text;
+    tellLayout(layout, text);
+    writeStandardOutput(text);
+    return layout.findings.anyTrouble();
+}
+
+// Answers how many problems were told.
+std::size_t tellData(const gedcom::GedcomData& data) {
+    std::string text = summaryOf(data);
+    const std::size_t problems = tellDiagnostics(data, text) + tellOddities(data, text);
+    writeStandardOutput(text);
+    return problems;
 }
 
 }  // namespace
 
+// The focus is settled first, so that a mistyped name is not lost below what the data brings up.
 int runCheck(const CheckOptions& options) {
     const gedcom::GedcomData data = readFileQuietly(options.file);
-    if (options.all) return tellAllLayouts(data, options.request) == 0 ? 0 : 1;
-    if (!options.focus.empty()) {
-        const CheckedLayout layout = checkLayoutOf(data, chooseFocus(data, options.focus), options.request);
-        std::string text;
-        tellLayout(layout, text);
-        writeStandardOutput(text);
-        return layout.findings.anyTrouble() ? 1 : 0;
-    }
-    std::string text = summaryOf(data);
-    const std::size_t problems = tellDiagnostics(data, text) + tellOddities(data, text);
-    writeStandardOutput(text);
-    return problems == 0 ? 0 : 1;
+    const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
+    bool anyTrouble = tellData(data) > 0;
+    if (focus != 0) anyTrouble = tellOneLayout(data, focus, options.request) || anyTrouble;
+    if (options.all) anyTrouble = tellAllLayouts(data, options.request) > 0 || anyTrouble;
+    return anyTrouble ? 1 : 0;
 }
 
 }  // namespace olvane::cli

@@ -53,7 +53,10 @@ void addFile(CLI::App& command, std::string& file) {
 
 void addFocus(CLI::App& command, std::string& focus) {
     command
-        .add_option("--focus", focus, "The person in the middle: an xref (I17 or @I17@) or words of the name")
+        .add_option(
+            "--focus", focus,
+            "The person in the middle: an xref (I17 or @I17@), a number as 'olvane people' tells it, or "
+            "words of the name")
         ->required()
         ->type_name("WHO");
 }
@@ -124,16 +127,59 @@ public:
         try {
             app_.parse(argc, argv);
         } catch (const CLI::ParseError& error) {
-            return app_.exit(error) == 0 ? 0 : kWrongUse;
+            if (error.get_exit_code() == 0) return app_.exit(error);
+            tell(complaintOf(error));
+            return kWrongUse;
         }
+        refuseWithoutEffect();
         if (people_->parsed()) return runPeople(peopleOptions_);
         if (layout_->parsed()) return runLayout(completedLayoutOptions());
         if (batch_->parsed()) return runBatch(batchOptions_);
-        if (check_->parsed()) return runCheck(checkOptions_);
+        if (check_->parsed()) return runCheck(completedCheckOptions());
         return runDraw(completedDrawOptions());
     }
 
 private:
+    // The library would only ask for a command where the first word is none.
+    std::string complaintOf(const CLI::ParseError& error) const {
+        const std::vector<std::string> strangers = app_.remaining();
+        if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
+            return "there is no command '" + strangers.front() +
+                   "', but people, layout, draw, batch and check; 'olvane --help' tells more";
+        }
+        return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' tells more";
+    }
+
+    std::string nameOfChosen() const {
+        const auto chosen = app_.get_subcommands();
+        return chosen.empty() ? "" : " " + chosen.front()->get_name();
+    }
+
+    // An option that changes nothing was meant to change something.
+    void refuseWithoutEffect() const {
+        const CLI::App& command = *app_.get_subcommands().front();
+        if (isGiven(command, "--year") && !isGiven(command, "--hide-living")) {
+            throw UsageError("--year changes nothing without --hide-living");
+        }
+        if (isGiven(command, "--generations") && viewOf(command) != View::pedigree) {
+            throw UsageError("--generations changes nothing without --view pedigree");
+        }
+        for (const FamilySwitch& option : familySwitches()) {
+            if (!isGiven(command, option.name) || viewOf(command) == View::family) continue;
+            throw UsageError(std::string(option.name) + " changes nothing in a pedigree");
+        }
+    }
+
+    static bool isGiven(const CLI::App& command, const char* option) {
+        return command.get_option_no_throw(option) != nullptr && command.count(option) > 0;
+    }
+
+    View viewOf(const CLI::App& command) const {
+        if (&command == layout_) return layoutOptions_.request.view;
+        if (&command == draw_) return drawOptions_.request.view;
+        return &command == batch_ ? batchOptions_.request.view : checkOptions_.request.view;
+    }
+
     void addPeople() {
         people_ = app_.add_subcommand("people", "List persons with ids, names and years");
         addFile(*people_, peopleOptions_.file);
@@ -208,17 +254,20 @@ private:
         check_ =
             app_.add_subcommand("check", "Tell what is wrong or odd in a file, or hard to read in a layout");
         addFile(*check_, checkOptions_.file);
-        CLI::Option* focus =
-            check_
-                ->add_option(
-                    "--focus", checkOptions_.focus,
-                    "Look at this person's layout: boxes that overlap, lines through boxes, two families' "
-                    "lines on one track, persons in several boxes")
-                ->type_name("WHO");
-        check_->add_flag("--all", checkOptions_.all, "Look at everybody's layout, a line of counts for each")
+        CLI::Option* focus = check_
+                                 ->add_option("--focus", checkOptions_.focus,
+                                              "Look at this person's layout as well, an xref, a number of "
+                                              "'olvane people' or words of the "
+                                              "name: boxes that overlap, lines through boxes, two families' "
+                                              "lines on one track, persons in several boxes")
+                                 ->type_name("WHO");
+        check_
+            ->add_flag(
+                "--all", checkOptions_.all,
+                "Look at everybody's layout as well: a line of counts for each, with ids, and the totals")
             ->excludes(focus);
         addView(*check_, checkOptions_.request);
-        addBoxes(*check_, checkOptions_.request, "default tall");
+        addBoxes(*check_, checkOptions_.request, "default tall, and wide in a pedigree");
         addFamilySwitches(*check_, checkOptions_.request);
     }
 
@@ -230,9 +279,19 @@ private:
 
     DrawOptions completedDrawOptions() const {
         DrawOptions options = drawOptions_;
-        const bool isPedigree = options.request.view == View::pedigree;
-        if (isPedigree && draw_->count("--boxes") == 0) options.request.boxes = BoxForm::wide;
+        widenPedigree(*draw_, options.request);
         return options;
+    }
+
+    CheckOptions completedCheckOptions() const {
+        CheckOptions options = checkOptions_;
+        widenPedigree(*check_, options.request);
+        return options;
+    }
+
+    // Pictures of pedigrees have wide boxes, and what is checked is the picture.
+    static void widenPedigree(const CLI::App& command, LayoutRequest& request) {
+        if (request.view == View::pedigree && command.count("--boxes") == 0) request.boxes = BoxForm::wide;
     }
 
     CLI::App app_{"Family trees from GEDCOM files: lists persons, lays out families and draws them.",
