@@ -85,13 +85,22 @@ std::string pngSheet(const std::string& path, const draw::SvgPicture& sheet, dou
     return pngOf(sheet, scale);
 }
 
+std::string contentOfSheet(const std::string& path, Form form, const draw::SvgPicture& sheet, double scale) {
+    return form == Form::png ? pngSheet(path, sheet, scale) : sheet.svg;
+}
+
+// All of them or none: half a wall of sheets is of no use.
 void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets) {
     const double scale = options.page.empty() ? 1 : kSheetPngScale;
-    for (std::size_t i = 0; i < sheets.size(); ++i) {
-        const std::string path =
-            sheets.size() == 1 ? options.output : sheetName(options.output, i + 1, sheets.size());
-        writeOutput(path, form == Form::png ? pngSheet(path, sheets[i], scale) : sheets[i].svg);
+    if (sheets.size() == 1) {
+        return writeOutput(options.output, contentOfSheet(options.output, form, sheets.front(), scale));
     }
+    OutputSet set;
+    for (std::size_t i = 0; i < sheets.size(); ++i) {
+        const std::string path = sheetName(options.output, i + 1, sheets.size());
+        set.add(path, contentOfSheet(path, form, sheets[i], scale));
+    }
+    set.finish();
 }
 
 std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::SvgPicture& picture,

@@ -35,6 +35,21 @@ void writeStraight(const std::string& shownPath, const std::string& path, std::s
     if (!closed) refuse(shownPath, errno);
 }
 
+bool isSpecial(const fs::path& path) {
+    std::error_code ignored;
+    const fs::file_status status = fs::status(path, ignored);
+    return fs::exists(status) && !fs::is_regular_file(status) && !fs::is_directory(status);
+}
+
+// Where a link leads to, so that the link stays.
+fs::path withoutLinks(const fs::path& path) {
+    std::error_code error;
+    const fs::path target = fs::canonical(path, error);
+    return error ? path : target;
+}
+
+}  // namespace
+
 // Removes the file beside the place unless it was moved there.
 class FileBeside {
 public:
@@ -57,34 +72,41 @@ public:
         moved_ = true;
     }
 
+    void removeMoved() {
+        std::error_code ignored;
+        if (moved_) fs::remove(place_, ignored);
+    }
+
 private:
     fs::path place_;
     fs::path path_;
     bool moved_ = false;
 };
 
-bool isSpecial(const fs::path& path) {
-    std::error_code ignored;
-    const fs::file_status status = fs::status(path, ignored);
-    return fs::exists(status) && !fs::is_regular_file(status) && !fs::is_directory(status);
+OutputSet::OutputSet() = default;
+OutputSet::~OutputSet() = default;
+
+void OutputSet::add(const std::string& path, std::string_view content) {
+    if (fs::is_directory(path)) refuse(path, EISDIR);
+    if (isSpecial(path)) return writeStraight(path, path, content);
+    parts_.push_back({path, std::make_unique<FileBeside>(withoutLinks(path))});
+    writeStraight(path, parts_.back().file->path().string(), content);
 }
 
-// Where a link leads to, so that the link stays.
-fs::path withoutLinks(const fs::path& path) {
-    std::error_code error;
-    const fs::path target = fs::canonical(path, error);
-    return error ? path : target;
+void OutputSet::finish() {
+    try {
+        for (const Part& part : parts_) part.file->move(part.shownPath);
+    } catch (...) {
+        for (const Part& part : parts_) part.file->removeMoved();
+        throw;
+    }
 }
-
-}  // namespace
 
 void writeOutput(const std::string& path, std::string_view content) {
     if (path == "-") return writeStandardOutput(content);
-    if (fs::is_directory(path)) refuse(path, EISDIR);
-    if (isSpecial(path)) return writeStraight(path, path, content);
-    FileBeside beside(withoutLinks(path));
-    writeStraight(path, beside.path().string(), content);
-    beside.move(path);
+    OutputSet set;
+    set.add(path, content);
+    set.finish();
 }
 
 // Past the stream of the C library, which loses its place when a signal breaks into a write.
