@@ -202,7 +202,6 @@ public:
         }
     }
 
-private:
     PictureArea area(double along1, double across1, double along2, double across2) const {
         const auto [firstAlong, lastAlong] = std::minmax(along1, along2);
         const auto [firstAcross, lastAcross] = std::minmax(across1, across2);
@@ -213,8 +212,20 @@ private:
         return {frame_.x(x), frame_.y(y), width * Frame::kScale, height * Frame::kScale};
     }
 
+private:
     bool sideways_;
     const Frame& frame_;
+};
+
+// The data of a path, with the bytes of each stroke: without some of them the rest is still a path.
+struct PathData {
+    std::string text;
+    std::vector<PictureBox> strokes;
+
+    void add(const std::string& stroke, const PictureArea& area) {
+        strokes.push_back({area, text.size(), stroke.size()});
+        text += stroke;
+    }
 };
 
 bool crosses(const AcrossStroke& tap, const AlongStroke& trunk) {
@@ -225,51 +236,64 @@ bool crosses(const AcrossStroke& tap, const AlongStroke& trunk) {
 }
 
 // A short stroke of page colour for each crossing, along the stroke that passes.
-std::string crossingGaps(const Strokes& strokes, const StrokePen& pen) {
+PathData crossingGaps(const Strokes& strokes, const StrokePen& pen) {
     std::vector<const AcrossStroke*> taps;
     for (const AcrossStroke& tap : strokes.across) taps.push_back(&tap);
     std::stable_sort(taps.begin(), taps.end(),
                      [](const AcrossStroke* a, const AcrossStroke* b) { return a->along < b->along; });
     constexpr double kHalf = kGapLength / 2 / Frame::kScale;
-    std::string path;
+    PathData path;
     for (const AlongStroke& trunk : strokes.along) {
         auto tap = std::lower_bound(taps.begin(), taps.end(), trunk.from,
                                     [](const AcrossStroke* a, double from) { return a->along < from; });
         for (; tap != taps.end() && (*tap)->along <= trunk.to; ++tap) {
             if (!crosses(**tap, trunk)) continue;
-            path += pen.moveTo((*tap)->along, trunk.across - kHalf) + pen.acrossTo(trunk.across + kHalf);
+            const double at = (*tap)->along;
+            path.add(pen.moveTo(at, trunk.across - kHalf) + pen.acrossTo(trunk.across + kHalf),
+                     pen.area(at, trunk.across - kHalf, at, trunk.across + kHalf));
         }
     }
     return path;
 }
 
-std::string pathOfAlong(const Strokes& strokes, LineStyle style, const StrokePen& pen) {
-    std::string path;
+PathData pathOfAlong(const Strokes& strokes, LineStyle style, const StrokePen& pen) {
+    PathData path;
     for (const AlongStroke& stroke : strokes.along) {
-        if (stroke.style == style) path += pen.moveTo(stroke.from, stroke.across) + pen.alongTo(stroke.to);
+        if (stroke.style != style) continue;
+        path.add(pen.moveTo(stroke.from, stroke.across) + pen.alongTo(stroke.to),
+                 pen.area(stroke.from, stroke.across, stroke.to, stroke.across));
     }
     return path;
 }
 
-std::string pathOfAcross(const Strokes& strokes, const StrokePen& pen) {
-    std::string path;
+PathData pathOfAcross(const Strokes& strokes, const StrokePen& pen) {
+    PathData path;
     for (const AcrossStroke& stroke : strokes.across) {
-        path += pen.moveTo(stroke.along, stroke.from) + pen.acrossTo(stroke.to);
+        path.add(pen.moveTo(stroke.along, stroke.from) + pen.acrossTo(stroke.to),
+                 pen.area(stroke.along, stroke.from, stroke.along, stroke.to));
     }
     return path;
 }
 
-std::string pathOfChildren(const Strokes& strokes, LineStyle style, const StrokePen& pen) {
-    std::string path;
+PathData pathOfChildren(const Strokes& strokes, LineStyle style, const StrokePen& pen) {
+    PathData path;
     for (const ChildStroke& stroke : strokes.children) {
         if (stroke.style != style) continue;
-        path += pen.moveTo(stroke.from, stroke.across) + pen.alongTo(stroke.along) + pen.acrossTo(stroke.end);
+        path.add(
+            pen.moveTo(stroke.from, stroke.across) + pen.alongTo(stroke.along) + pen.acrossTo(stroke.end),
+            pen.area(stroke.from, stroke.across, stroke.along, stroke.end));
     }
     return path;
 }
 
-void appendPath(std::string& svg, const std::string& path, const std::string& attributes) {
-    if (!path.empty()) svg += "<path" + attributes + " d=\"" + path + "\"/>\n";
+void appendPath(SvgPicture& picture, const PathData& path, const std::string& attributes) {
+    if (path.text.empty()) return;
+    picture.svg += "<path" + attributes + " d=\"";
+    for (PictureBox stroke : path.strokes) {
+        stroke.start += picture.svg.size();
+        picture.strokes.push_back(stroke);
+    }
+    picture.svg += path.text + "\"/>\n";
 }
 
 std::string dashAttribute(LineStyle style) {
@@ -298,20 +322,20 @@ LineStylesUsed appendLines(SvgPicture& picture, const DrawingContent& content, c
     const StrokePen pen(options, frame);
     std::string& svg = picture.svg;
     pen.noteAreas(strokes, picture.lines);
-    const std::string divorced = pathOfAlong(strokes, LineStyle::divorced, pen);
-    const std::string adopted = pathOfChildren(strokes, LineStyle::adopted, pen);
-    const std::string foster = pathOfChildren(strokes, LineStyle::foster, pen);
+    const PathData divorced = pathOfAlong(strokes, LineStyle::divorced, pen);
+    const PathData adopted = pathOfChildren(strokes, LineStyle::adopted, pen);
+    const PathData foster = pathOfChildren(strokes, LineStyle::foster, pen);
     svg += "<g fill=\"none\" stroke=\"" + std::string(options.theme->line) + "\" stroke-width=\"" +
            px(kLineWidth) + "\" stroke-linejoin=\"round\">\n";
-    appendPath(svg, pathOfAlong(strokes, LineStyle::plain, pen), " stroke-linecap=\"square\"");
-    appendPath(svg, divorced, dashAttribute(LineStyle::divorced));
-    appendPath(svg, crossingGaps(strokes, pen),
+    appendPath(picture, pathOfAlong(strokes, LineStyle::plain, pen), " stroke-linecap=\"square\"");
+    appendPath(picture, divorced, dashAttribute(LineStyle::divorced));
+    appendPath(picture, crossingGaps(strokes, pen),
                " stroke=\"" + std::string(options.theme->page) + "\" stroke-width=\"" + px(kGapWidth) + "\"");
-    appendPath(svg, pathOfAcross(strokes, pen), "");
-    appendPath(svg, adopted, dashAttribute(LineStyle::adopted));
-    appendPath(svg, foster, dashAttribute(LineStyle::foster));
+    appendPath(picture, pathOfAcross(strokes, pen), "");
+    appendPath(picture, adopted, dashAttribute(LineStyle::adopted));
+    appendPath(picture, foster, dashAttribute(LineStyle::foster));
     svg += "</g>\n";
-    return {!divorced.empty(), !adopted.empty(), !foster.empty()};
+    return {!divorced.text.empty(), !adopted.text.empty(), !foster.text.empty()};
 }
 
 }  // namespace olvane::draw

@@ -25,6 +25,7 @@ constexpr double kStrip = 15 * kPxOfMm;   // comes again on the next sheet
 constexpr double kTick = 4 * kPxOfMm;
 constexpr double kLeastScale = 0.5;
 constexpr double kFootSize = 10;
+constexpr double kStrokeRoom = 8;  // px; more than any stroke is wide
 
 struct Sheet {
     double width = 0;  // of the paper, in px
@@ -134,15 +135,26 @@ bool showsAnything(const PictureArea& window, const SvgPicture& picture) {
            (picture.legend.width > 0 && isShown(picture.legend));
 }
 
-// The elements of a picture, without its prologue, so that another one can hold it, and without the boxes
-// that the window does not show.
+// With the halves of its width beside it.
+PictureArea inked(const PictureArea& stroke) {
+    return {stroke.x - kStrokeRoom, stroke.y - kStrokeRoom, stroke.width + 2 * kStrokeRoom,
+            stroke.height + 2 * kStrokeRoom};
+}
+
+// The elements of a picture, without its prologue, so that another one can hold it, and without the strokes
+// and boxes that the window does not show.
 std::string elementsWithin(const SvgPicture& picture, const PictureArea& window) {
     std::size_t done = picture.svg.find("<svg");
     std::string elements;
+    const auto leaveOut = [&](const PictureBox& piece) {
+        elements.append(picture.svg, done, piece.start - done);
+        done = piece.start + piece.length;
+    };
+    for (const PictureBox& stroke : picture.strokes) {
+        if (!shows(window, inked(stroke.area))) leaveOut(stroke);
+    }
     for (const PictureBox& box : picture.boxes) {
-        if (shows(window, box.area)) continue;
-        elements.append(picture.svg, done, box.start - done);
-        done = box.start + box.length;
+        if (!shows(window, box.area)) leaveOut(box);
     }
     return elements.append(picture.svg, done);
 }

@@ -74,6 +74,8 @@ public:
         const std::string legend = legendFor(styles);
         openPicture();
         appendHeadline();
+        for (PictureBox& stroke : lines.strokes) stroke.start += picture_.svg.size();
+        picture_.strokes = std::move(lines.strokes);
         picture_.svg += lines.svg;
         appendBoxes();
         picture_.svg += legend + "</g>\n</svg>\n";

@@ -49,7 +49,7 @@ struct PictureArea {
     double height = 0;
 };
 
-// A box of a picture: where it is to be seen, and which bytes of the text draw it.
+// A box or stroke of a picture: where it is to be seen, and which bytes of the text draw it.
 struct PictureBox {
     PictureArea area;
     std::size_t start = 0;
@@ -59,12 +59,14 @@ struct PictureBox {
 // A finished picture.
 //
 // Units: px, two for each point of the layout.
-// Holds: boxes come in the order of the text; without the bytes of some of them the rest is still a picture.
+// Holds: strokes and boxes come in the order of the text, all strokes before the first box; without the bytes
+//        of some of them the rest is still a picture.
 struct SvgPicture {
     std::string svg;
     int width = 0;
     int height = 0;
     std::vector<PictureBox> boxes;
+    std::vector<PictureBox> strokes;
     std::vector<PictureArea> lines;  // every stroke of a line; those have no width or no height
     PictureArea legend;              // of no size where there is none
 };

@@ -118,6 +118,18 @@ TEST(PageSplit, sheetHoldsOnlyTheBoxesThatItShows) {
     EXPECT_THAT(sheets.back().svg, HasSubstr("<svg>[right]</svg>"));
 }
 
+TEST(PageSplit, sheetHoldsOnlyTheStrokesThatItShows) {
+    SvgPicture picture = pictureOf(10000, 500);
+    picture.svg = "<svg>{M1}{M2}{M3}[right]</svg>";
+    picture.strokes = {{{10, 10, 100, 0}, 5, 4}, {{0, 20, 10000, 0}, 9, 4}, {{9900, 10, 0, 50}, 13, 4}};
+    picture.boxes = {{{9900, 60, 50, 100}, 17, 7}};
+    const auto sheets = splitPages(picture, kA4, "");
+    ASSERT_GT(sheets.size(), 2u);
+    EXPECT_THAT(sheets.front().svg, HasSubstr("<svg>{M1}{M2}</svg>"));
+    EXPECT_THAT(sheets[1].svg, HasSubstr("<svg>{M2}</svg>"));
+    EXPECT_THAT(sheets.back().svg, HasSubstr("<svg>{M2}{M3}[right]</svg>"));
+}
+
 TEST(PageSplit, titleIsText) {
     const auto sheets = splitPages(pictureOf(10000, 500), kA4, "<script>");
     EXPECT_THAT(sheets[0].svg, Not(HasSubstr("<script")));

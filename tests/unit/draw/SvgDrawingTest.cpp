@@ -234,6 +234,19 @@ TEST_F(Picture, boxesTellWhereTheyAreInPictureAndText) {
     EXPECT_THAT(text, HasSubstr(">Karl</text>"));
 }
 
+TEST_F(Picture, strokesTellTheirBytesOfThePaths) {
+    const SvgPicture picture = drawSvg(content_, options_);
+    ASSERT_FALSE(picture.strokes.empty());
+    for (const PictureBox& stroke : picture.strokes) {
+        const std::string text = picture.svg.substr(stroke.start, stroke.length);
+        EXPECT_EQ(text.find_first_not_of("MHV0123456789. "), std::string::npos) << text;
+        EXPECT_EQ(text.rfind('M'), 0u) << text;
+        const char behind = picture.svg[stroke.start + stroke.length];
+        EXPECT_TRUE(behind == 'M' || behind == '"') << behind;
+        EXPECT_LT(stroke.start, picture.boxes.front().start);
+    }
+}
+
 TEST_F(Picture, emptyLayoutIsAPageThatSaysSo) {
     content_.records.clear();
     EXPECT_THAT(draw(), HasSubstr(">Nobody to show</text>"));
