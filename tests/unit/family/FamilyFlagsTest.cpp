@@ -14,7 +14,7 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/layouter/HiddenRelatives.h>
+#include <olvane/layouter/HiddenRelativesInternal.h>
 
 #include "HandMadeFamily.h"
 #include "LaidOutCase.h"
