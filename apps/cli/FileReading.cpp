@@ -7,7 +7,6 @@
 
 #include <array>
 #include <cstddef>
-#include <limits>
 
 #include <olvane/gedcom/GedcomReader.h>
 
@@ -19,7 +18,7 @@ namespace olvane::cli {
 namespace {
 
 constexpr std::size_t kPerKind = 10;     // told on stderr
-constexpr std::size_t kCounted = 10000;  // of a kind; memory does not grow with the trouble beyond these
+constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are told as a number, for memory's sake
 
 // The first of each kind, and how many were kept back. Notes are for those who ask.
 void report(const gedcom::GedcomData& data) {
@@ -60,7 +59,7 @@ gedcom::GedcomData readFile(const std::string& path) {
 }
 
 gedcom::GedcomData readFileQuietly(const std::string& path) {
-    return read(path, std::numeric_limits<std::size_t>::max());
+    return read(path, kCounted);
 }
 
 }  // namespace olvane::cli

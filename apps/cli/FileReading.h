@@ -14,7 +14,7 @@ namespace olvane::cli {
 // Fails: throws UsageError with a hint where there is nothing to read.
 gedcom::GedcomData readFile(const std::string& path);
 
-// The same, with every diagnostic in the data and none on stderr.
+// The same, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
 gedcom::GedcomData readFileQuietly(const std::string& path);
 
 }  // namespace olvane::cli
