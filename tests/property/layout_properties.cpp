@@ -152,8 +152,8 @@ RC_GTEST_PROP(LayoutProperties, aFailingHostLeavesAPrefixOfTheWholeText, ()) {
 
 RC_GTEST_PROP(LayoutProperties, idsRenamedInTheSameOrderGiveTheSamePicture, ()) {
     CaseFile request = drawCase(property::consistentFamily(kMostPersons));
-    const std::int64_t shift = 1000;
-    const auto renamed = [shift](std::int64_t id) { return id + shift; };
+    constexpr std::int64_t kShift = 1000;
+    const auto renamed = [](std::int64_t id) { return id + kShift; };
     CaseFile other = request;
     const auto renameMap = [&](auto& map, const auto& renameValue) {
         auto copy = map;
