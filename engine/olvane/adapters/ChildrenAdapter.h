@@ -3,9 +3,11 @@
 
 #pragma once
 
+#include <functional>
 #include <set>
 #include <string>
 
+#include <olvane/Arena.h>
 #include <olvane/Export.h>
 
 // One child of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
@@ -31,4 +33,5 @@ struct OLVANE_API ChildrenAdapter {
     bool operator<(const ChildrenAdapter& other) const;
 };
 
-typedef std::set<ChildrenAdapter> ChildrenSet;
+typedef std::set<ChildrenAdapter, std::less<ChildrenAdapter>, olvane::ArenaAllocator<ChildrenAdapter>>
+    ChildrenSet;

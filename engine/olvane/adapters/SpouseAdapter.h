@@ -3,9 +3,11 @@
 
 #pragma once
 
+#include <functional>
 #include <set>
 #include <string>
 
+#include <olvane/Arena.h>
 #include <olvane/Export.h>
 
 // One spouse of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
@@ -27,4 +29,4 @@ struct OLVANE_API SpouseAdapter {
     bool operator<(const SpouseAdapter& other) const;
 };
 
-typedef std::set<SpouseAdapter> SpouseSet;
+typedef std::set<SpouseAdapter, std::less<SpouseAdapter>, olvane::ArenaAllocator<SpouseAdapter>> SpouseSet;

@@ -95,7 +95,7 @@ bool TreeViewFamilyLayouter::hasHiddenChildren(TreeViewPerson& person) {
 }
 
 bool TreeViewFamilyLayouter::hasHiddenSpouses(TreeViewPerson& person) {
-    SpouseSet spouses;
+    SpouseSet spouses(&memory);
     dataAdapter->getSpouses(person.personId, spouses);
     return someAreHidden(spouses, person.getSpouseCount(), shownKeys);
 }

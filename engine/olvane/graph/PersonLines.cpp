@@ -18,11 +18,15 @@ void TreeViewPerson::addLineSegment(float x1, float y1, float x2, float y2, bool
 }
 
 void TreeViewPerson::addSpouseLine(int spouseKey, float x1, float y1, float x2, float y2) {
-    spouseLines[spouseKey].push_back(TreeLineSegment{x1, y1, x2, y2, true});
+    linesTo(spouseKey).push_back(TreeLineSegment{x1, y1, x2, y2, true});
+}
+
+TreeViewPerson::Segments& TreeViewPerson::linesTo(int spouseKey) {
+    return spouseLines.try_emplace(spouseKey, arena()).first->second;
 }
 
 TreeLineSegment& TreeViewPerson::getSpouseLine(int spouseKey) {
-    return spouseLines[spouseKey].at(0);
+    return linesTo(spouseKey).at(0);
 }
 
 void TreeViewPerson::lineSegmentIterator(const SegmentVisitor& visitor) {

@@ -47,7 +47,7 @@ void TreeViewPerson::nonDisplayedSpouseIterator(const Visitor& visitor) {
 }
 
 void TreeViewPerson::childrenIterator(int key, const Visitor& visitor) {
-    walk(children[key], visitor);
+    walk(childrenUnder(key), visitor);
 }
 
 void TreeViewPerson::grandparentsIterator(const Visitor& visitor) {
@@ -78,7 +78,7 @@ void TreeViewPerson::allChildrenWithSpouseIterator(TreeViewPerson& spouse, const
 
 void TreeViewPerson::childAndSpouseIterator(const PairVisitor& visitor) {
     const auto visitChildrenWith = [&visitor, this](int key, TreeViewPerson& other) {
-        for (TreeViewPerson& child : children[key]) visitor(child, other);
+        for (TreeViewPerson& child : childrenUnder(key)) visitor(child, other);
     };
     if (gender) visitChildrenWith(kNoKey, *this);
     for (TreeViewPerson& spouse : spouses) visitChildrenWith(spouse.personId, spouse);
@@ -150,7 +150,7 @@ TreeViewPerson::Iterator TreeViewPerson::getChildrenAndBastardsWithSpouseIterato
 TreeViewPerson::Iterator TreeViewPerson::getNonDisplayedSpouseIterator(const SpousesLoader& loader) {
     if (!nonDisplayedSpousesLoaded) {
         nonDisplayedSpousesLoaded = true;
-        SpouseSet records;
+        SpouseSet records(arena());
         loader(personId, records);
         nonDisplayedSpouses.reserve(nonDisplayedSpouses.size() + records.size());
         for (const SpouseAdapter& record : records) addNonDisplayedSpouse(record.key);
@@ -191,7 +191,7 @@ int TreeViewPerson::getGreatGrandparentCount() {
 }
 
 int TreeViewPerson::getChildrenWithSpouseCount(int key) {
-    return countOf(children[key]);
+    return countOf(childrenUnder(key));
 }
 
 int TreeViewPerson::getChildrenWithNoOtherParentCount() {
@@ -205,7 +205,7 @@ int TreeViewPerson::getAllChildrenCount() {
 }
 
 bool TreeViewPerson::hasChildWithSpouse(int spouseKey, int childKey) {
-    const Persons& list = children[spouseKey];
+    const Persons& list = childrenUnder(spouseKey);
     return std::any_of(list.begin(), list.end(),
                        [childKey](const TreeViewPerson& child) { return child.personId == childKey; });
 }

@@ -8,14 +8,26 @@
 
 #include <cstddef>
 
-TreeViewPerson::TreeViewPerson(int key) : personId(key) {}
+TreeViewPerson::TreeViewPerson(int key, olvane::Arena* arena)
+    : personId(key),
+      spouseEdges(arena),
+      unownedSpouseEdges(arena),
+      generationEdges(arena),
+      allChildren(arena),
+      parents(arena),
+      spouses(arena),
+      nonDisplayedSpouses(arena),
+      children(arena),
+      siblings(arena),
+      lineSegments(arena),
+      spouseLines(arena) {}
 
 TreeViewPerson::~TreeViewPerson() {
     for (const auto& owned : spouseEdges) delete owned.second;
 }
 
 TreeViewPerson& TreeViewPerson::addPerson(int id, Persons& list, bool male) {
-    list.emplace_back(id);
+    list.emplace_back(id, list.get_allocator().arena());
     list.back().gender = male;
     return list.back();
 }
@@ -66,11 +78,21 @@ TreeViewPerson& TreeViewPerson::addNonDisplayedSpouse(int id) {
 }
 
 TreeViewPerson& TreeViewPerson::addChildWithSpouse(int childId, int spouseId, bool male) {
-    return addChild(childId, children[spouseId], male);
+    return addChild(childId, childrenUnder(spouseId), male);
 }
 
 TreeViewPerson& TreeViewPerson::addChildWithNoOtherSpouse(int childId, bool male) {
     return addChildWithSpouse(childId, kNoKey, male);
+}
+
+void TreeViewPerson::expectChildrenWithSpouse(int spouseId, std::size_t count) {
+    if (count == 0) return;
+    Persons& list = childrenUnder(spouseId);
+    list.reserve(list.size() + count);
+}
+
+TreeViewPerson::Persons& TreeViewPerson::childrenUnder(int key) {
+    return children.try_emplace(key, arena()).first->second;
 }
 
 // An index of -1 wraps to one that no list can hold, so it fails like any other.

@@ -3,12 +3,16 @@
 
 #pragma once
 
+#include <boost/container/flat_map.hpp>
 #include <boost/function.hpp>
 #include <boost/shared_ptr.hpp>
 
-#include <map>
+#include <cstddef>
+#include <functional>
+#include <utility>
 #include <vector>
 
+#include <olvane/Arena.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/ChildrenAdapter.h>
 #include <olvane/adapters/SpouseAdapter.h>
@@ -44,13 +48,20 @@ public:
     typedef boost::function<void(TreeLineSegment&)> SegmentVisitor;
     typedef boost::function<void(TreeViewGenerationEdge*)> GenerationEdgeVisitor;
     typedef boost::function<void(TreeViewSpouseEdge*)> SpouseEdgeVisitor;
-    typedef std::vector<TreeViewPerson> Persons;
-    typedef std::vector<TreeLineSegment> Segments;
+    template <class Element>
+    using List = std::vector<Element, olvane::ArenaAllocator<Element>>;
+    // A few entries side by side: a new one moves those behind it, though never what a list in them holds.
+    template <class Value>
+    using ByKey =
+        boost::container::flat_map<int, Value, std::less<int>, olvane::ArenaAllocator<std::pair<int, Value>>>;
+    typedef List<TreeViewPerson> Persons;
+    typedef List<TreeLineSegment> Segments;
 
     static constexpr int kNoKey = -1;  // unset, or no other parent
 
-    explicit TreeViewPerson(int key);
-    TreeViewPerson(const TreeViewPerson&) = default;
+    // All that hangs from the person lies in the arena, or on the heap without one.
+    explicit TreeViewPerson(int key, olvane::Arena* arena = nullptr);
+    TreeViewPerson(const TreeViewPerson&) = default;  // on the heap, whatever the original's arena
     // How a list grows: the relatives come along as they lie.
     TreeViewPerson(TreeViewPerson&&) noexcept = default;
     TreeViewPerson& operator=(const TreeViewPerson&) = delete;
@@ -74,6 +85,8 @@ public:
     TreeViewPerson& addNonDisplayedSpouse(int id);
     TreeViewPerson& addChildWithSpouse(int childId, int spouseId, bool male);
     TreeViewPerson& addChildWithNoOtherSpouse(int childId, bool male);
+    // Room for so many more children under that key, where any are to come.
+    void expectChildrenWithSpouse(int spouseId, std::size_t count);
 
     // --- Plain reads and writes.
     void setGender(bool male) { gender = male; }
@@ -154,24 +167,28 @@ public:
     int parentId = kNoKey;           // on a half sibling: the parent through whom it is related
     bool gender = false;             // true for male
     bool allChildrenLoaded = false;  // allChildren has been asked for
-    bool nonDisplayedSpousesLoaded = false;                 // nonDisplayedSpouses has been asked for
-    bool hasNonDisplayedRelationships = false;              // the flag of the result
-    std::map<int, TreeViewSpouseEdge*> spouseEdges;         // owned, by the other spouse's key
-    std::map<int, TreeViewSpouseEdge*> unownedSpouseEdges;  // owned by the other spouse, by that spouse's key
+    bool nonDisplayedSpousesLoaded = false;         // nonDisplayedSpouses has been asked for
+    bool hasNonDisplayedRelationships = false;      // the flag of the result
+    ByKey<TreeViewSpouseEdge*> spouseEdges;         // owned, by the other spouse's key
+    ByKey<TreeViewSpouseEdge*> unownedSpouseEdges;  // owned by the other spouse, by that spouse's key
     // To children of whom this person is the only drawn parent.
-    std::vector<boost::shared_ptr<TreeViewGenerationEdge>> generationEdges;
+    List<boost::shared_ptr<TreeViewGenerationEdge>> generationEdges;
     ChildrenSet allChildren;        // the host's children, filled at most once
     int preferredFatherIndex = -1;  // into parents
     int preferredMotherIndex = -1;  // into parents
     Persons parents;
     Persons spouses;
-    Persons nonDisplayedSpouses;      // every spouse that the host knows; never drawn
-    std::map<int, Persons> children;  // by the other parent's key; kNoKey without one
-    Persons siblings;                 // with an entry for the person itself
-    Segments lineSegments;            // in the order added; what the result text writes
-    std::map<int, Segments> spouseLines;
+    Persons nonDisplayedSpouses;  // every spouse that the host knows; never drawn
+    ByKey<Persons> children;      // by the other parent's key; kNoKey without one
+    Persons siblings;             // with an entry for the person itself
+    Segments lineSegments;        // in the order added; what the result text writes
+    ByKey<Segments> spouseLines;
     TreePoint nodeCenter;
 
 private:
+    olvane::Arena* arena() const { return parents.get_allocator().arena(); }
+    Persons& childrenUnder(int key);  // both make the list where there is none
+    Segments& linesTo(int spouseKey);
+
     bool hasBeenVisited_ = false;  // mark of the traversals that enter a node once
 };

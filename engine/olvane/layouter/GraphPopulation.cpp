@@ -87,7 +87,7 @@ std::vector<const ChildrenAdapter*> commonRecords(const ChildrenSet& first, cons
 }  // namespace
 
 void TreeViewLayouter::addSpousesToPerson(TreeViewPerson& person) {
-    SpouseSet records;
+    SpouseSet records(&memory);
     dataAdapter->getSpouses(person.personId, records);
     person.spouses.reserve(person.spouses.size() + records.size());
     for (const SpouseAdapter& record : records) {
@@ -126,7 +126,9 @@ void TreeViewLayouter::addAllChildrenToPerson(TreeViewPerson& person) {
 }
 
 void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator) {
-    for (const ChildrenAdapter* record : childrenOfPersonAlone(person, iterator)) {
+    const Records alone = childrenOfPersonAlone(person, iterator);
+    person.expectChildrenWithSpouse(TreeViewPerson::kNoKey, alone.size());
+    for (const ChildrenAdapter* record : alone) {
         admit(record->key);
         person.addChildWithNoOtherSpouse(record->key, dataAdapter->isMale(record->key));
     }
@@ -161,7 +163,9 @@ void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, Tr
                                                       const ChildrenSet& children) {
     if (children.empty()) return;
     const ChildrenSet& spousesChildren = spouse.getAllChildrenVector(dataAdapter->getChildren);
-    for (const ChildrenAdapter* record : commonRecords(children, spousesChildren)) {
+    const Records common = commonRecords(children, spousesChildren);
+    person.expectChildrenWithSpouse(spouse.personId, common.size());
+    for (const ChildrenAdapter* record : common) {
         int child = record->key;
         int other = spouse.personId;
         if (!checkIfPrefferedParent(person, child, other)) continue;
@@ -206,7 +210,9 @@ void TreeViewLayouter::addSiblingsToPerson(TreeViewPerson& person) {
 void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) {
     TreeViewPerson& father = person.getPreferredFather();
     bool personIsAmongThem = false;
-    for (const ChildrenAdapter* record : childrenOfPersonAlone(father, person.getParentIterator())) {
+    const Records alone = childrenOfPersonAlone(father, person.getParentIterator());
+    person.siblings.reserve(person.siblings.size() + alone.size());
+    for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {
             personIsAmongThem = true;
         } else {
@@ -219,7 +225,9 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
     TreeViewPerson& mother = person.getPreferredMother();
     const ChildrenSet& fathersChildren = father.getAllChildrenVector(dataAdapter->getChildren);
     const ChildrenSet& mothersChildren = mother.getAllChildrenVector(dataAdapter->getChildren);
-    for (const ChildrenAdapter* record : commonRecords(fathersChildren, mothersChildren)) {
+    const Records common = commonRecords(fathersChildren, mothersChildren);
+    person.siblings.reserve(person.siblings.size() + common.size());
+    for (const ChildrenAdapter* record : common) {
         person.addSibling(record->key, dataAdapter->isMale(record->key));
     }
 }
@@ -227,6 +235,7 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
 void TreeViewLayouter::addMotherSide(TreeViewPerson& person) {
     TreeViewPerson& mother = person.getPreferredMother();
     const Records alone = childrenOfPersonAlone(mother, person.getParentIterator());
+    person.siblings.reserve(person.siblings.size() + alone.size());
     for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {
             person.addHalfSibling(person.personId, mother.personId, person.gender);

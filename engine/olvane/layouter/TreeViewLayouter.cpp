@@ -14,7 +14,7 @@ namespace SharedTreeViewer {
 
 TreeViewLayouter::TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
                                    const TreeSize& sizes)
-    : focusPerson(focusKey), options(optionValues), dataAdapter(data), treeSize(sizes) {
+    : focusPerson(focusKey, &memory), options(optionValues), dataAdapter(data), treeSize(sizes) {
     focusPerson.setGender(isMale != 0);
 }
 

@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include <olvane/Arena.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/DataAdapter.h>
 #include <olvane/graph/TreeViewPerson.h>
@@ -28,6 +29,9 @@ typedef boost::unordered_map<std::string, bool> OptionMap;
 //
 // No virtual destructor: a layouter is made and destroyed through its concrete type, by whoever runs it.
 class OLVANE_API TreeViewLayouter {
+protected:
+    olvane::Arena memory;  // of the whole graph: declared ahead of the focus, so destroyed after it
+
 public:
     typedef TreeViewPerson::Visitor Visitor;
     typedef TreeViewPerson::Iterator Iterator;

@@ -1,0 +1,91 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstddef>
+#include <new>
+#include <type_traits>
+
+#include <olvane/Export.h>
+
+namespace olvane {
+
+// Memory for the many small pieces of one picture. It comes from the system in blocks that go back all at
+// once, when the arena does; pieces returned before that are handed out again, by size.
+//
+// Units: bytes. A piece is aligned for every fundamental type.
+// Holds: the arena outlives whatever lies in it.
+// Fails: take throws std::bad_alloc and changes nothing.
+class OLVANE_API Arena {
+public:
+    Arena() = default;
+    Arena(const Arena&) = delete;
+    Arena& operator=(const Arena&) = delete;
+    ~Arena();
+
+    void* take(std::size_t bytes);
+    // The size must be the one that was asked for.
+    void giveBack(void* piece, std::size_t bytes) noexcept;
+
+private:
+    struct Link {
+        Link* next;
+    };
+    static constexpr std::size_t kGranule = 16;
+    static constexpr std::size_t kReusedSizes = 64;  // in granules; larger pieces wait for the end
+
+    static std::size_t granulesOf(std::size_t bytes) {
+        return bytes == 0 ? 1 : (bytes + kGranule - 1) / kGranule;
+    }
+    void* cutFromNewBlock(std::size_t size);
+    char* addBlock(std::size_t size);
+
+    Link* returned_[kReusedSizes] = {};  // by size in granules
+    char* place_ = nullptr;              // where the free rest of the newest block begins
+    std::size_t left_ = 0;               // length of that rest
+    std::size_t taken_ = 0;              // of all blocks
+    Link* blocks_ = nullptr;
+};
+
+// The allocator of containers in an arena; without one it is the heap.
+//
+// A copy of a container lies on the heap and stands alone. A container that is moved stays where it is, so it
+// must not outlive the arena.
+template <class T>
+class ArenaAllocator {
+public:
+    typedef T value_type;
+    typedef std::true_type propagate_on_container_move_assignment;
+    typedef std::true_type propagate_on_container_swap;
+
+    ArenaAllocator() = default;
+    ArenaAllocator(Arena* arena) : arena_(arena) {}
+    template <class Other>
+    ArenaAllocator(const ArenaAllocator<Other>& other) : arena_(other.arena()) {}
+
+    T* allocate(std::size_t count) {
+        if (arena_ == nullptr) return static_cast<T*>(::operator new(count * sizeof(T)));
+        return static_cast<T*>(arena_->take(count * sizeof(T)));
+    }
+    void deallocate(T* piece, std::size_t count) noexcept {
+        if (arena_ == nullptr) {
+            ::operator delete(piece);
+        } else {
+            arena_->giveBack(piece, count * sizeof(T));
+        }
+    }
+    ArenaAllocator select_on_container_copy_construction() const { return ArenaAllocator(); }
+
+    Arena* arena() const { return arena_; }
+
+    template <class Other>
+    bool operator==(const ArenaAllocator<Other>& other) const {
+        return arena_ == other.arena();
+    }
+
+private:
+    Arena* arena_ = nullptr;
+};
+
+}  // namespace olvane
