@@ -11,7 +11,7 @@
 #include <olvane/boundary/FamilyViewLayout.h>
 #include <olvane/gedcom/GedcomReader.h>
 
-#include <cli/GedcomDataSource.h>
+#include <olvane/source/GedcomDataSource.h>
 
 #include <algorithm>
 #include <chrono>
@@ -33,7 +33,7 @@ std::string gedcomPath() {
 
 constexpr double kSlowMilliseconds = 3;
 
-double millisecondsOf(std::size_t id, const std::shared_ptr<olvane::cli::GedcomDataSource>& source,
+double millisecondsOf(std::size_t id, const std::shared_ptr<olvane::gedcom::GedcomDataSource>& source,
                       std::size_t& boxes) {
     const auto start = std::chrono::steady_clock::now();
     const std::string text = FamilyViewLayout(std::to_string(id), source);
@@ -44,7 +44,7 @@ double millisecondsOf(std::size_t id, const std::shared_ptr<olvane::cli::GedcomD
 
 void everyPersonOfTheFile(benchmark::State& state, const std::string& path) {
     const olvane::gedcom::GedcomData data = olvane::gedcom::readGedcomFile(path);
-    const auto source = std::make_shared<olvane::cli::GedcomDataSource>(data);
+    const auto source = std::make_shared<olvane::gedcom::GedcomDataSource>(data);
     std::vector<double> least(data.personCount(), std::numeric_limits<double>::infinity());
     std::size_t boxes = 0;
     for (auto _ : state) {

@@ -12,8 +12,7 @@
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
-
-#include <cli/GedcomDataSource.h>
+#include <olvane/source/GedcomDataSource.h>
 
 namespace olvane::cli {
 
@@ -53,7 +52,8 @@ TreeSize sizeOf(BoxForm boxes) {
 
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
     ViewerGlue glue;
-    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source = std::make_shared<GedcomDataSource>(data);
+    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source =
+        std::make_shared<gedcom::GedcomDataSource>(data);
     const HostCallbacks callbacks(glue, source);
     resetAddParentId();
     DataAdapter adapter = callbacks.dataAdapter();

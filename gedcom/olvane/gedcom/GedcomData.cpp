@@ -115,6 +115,18 @@ std::span<const ChildLink> GedcomData::childLinks(FamilyId id) const {
     return part(tables_.childLinks, family(id).childLinkSlice);
 }
 
+std::span<const Fact> GedcomData::factsOfPerson(PersonId id) const {
+    if (!hasPerson(id)) throw std::out_of_range("no person " + std::to_string(id));
+    return tables_.factsOfPersons.empty() ? std::span<const Fact>()
+                                          : part(tables_.facts, tables_.factsOfPersons[id - 1]);
+}
+
+std::span<const Fact> GedcomData::factsOfFamily(FamilyId id) const {
+    if (id < 1 || id > familyCount()) throw std::out_of_range("no family " + std::to_string(id));
+    return tables_.factsOfFamilies.empty() ? std::span<const Fact>()
+                                           : part(tables_.facts, tables_.factsOfFamilies[id - 1]);
+}
+
 PersonId GedcomData::personByXref(std::string_view xref) const {
     return tables_.xrefs == nullptr ? 0 : tables_.xrefs->at(tables_.xrefs->find(bareXref(xref))).person;
 }

@@ -95,6 +95,19 @@ struct Family {
     bool divorced = false;  // DIV is there, and no second MARR after it
 };
 
+// Something that a file tells of a person or a couple: an event or an attribute.
+//
+// Holds: tag is in capitals and one of the standard's, and lives for ever. value is what stands behind the
+//        tag, or else the TYPE below it; the texts are as those of a name. An event that the file says did not
+//        happen is no fact.
+struct Fact {
+    std::string_view tag;
+    std::string_view value;
+    std::string_view place;
+    GedcomDate date;
+    LineNumber line = 0;
+};
+
 class XrefTable;
 
 // The lists behind the records, as the reader fills them.
@@ -109,6 +122,10 @@ struct GedcomTables {
     std::vector<ChildLink> childLinks;
     std::vector<PersonId> spouses;
     std::vector<PersonId> children;
+    // Empty, all three, unless facts were asked for; else a slice for each person and each family.
+    std::vector<Fact> facts;
+    std::vector<Slice> factsOfPersons;
+    std::vector<Slice> factsOfFamilies;
     // Which records the identifiers stand for.
     std::shared_ptr<const XrefTable> xrefs;
     std::vector<Diagnostic> diagnostics;
@@ -154,6 +171,10 @@ public:
     std::span<const FamilyLink> coupleLinks(PersonId id) const;
     // All CHIL in order.
     std::span<const ChildLink> childLinks(FamilyId id) const;
+
+    // In the order of the record; empty unless the facts were asked for when the file was read.
+    std::span<const Fact> factsOfPerson(PersonId id) const;
+    std::span<const Fact> factsOfFamily(FamilyId id) const;
 
     // By xref, with or without @; 0 if there is none. Of several records of one xref the first is found.
     PersonId personByXref(std::string_view xref) const;

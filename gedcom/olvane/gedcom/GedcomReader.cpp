@@ -31,7 +31,7 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     GedcomTables tables;
     LineScanner scanner(store->bytes, diagnostics);
     TextKeeper keeper(*store, form, diagnostics);
-    RecordReader records(scanner, keeper, tables, *xrefs, diagnostics);
+    RecordReader records(scanner, keeper, tables, *xrefs, diagnostics, options.facts);
     if (!records.readAll()) throw GedcomError(name, "holds nothing that looks like GEDCOM");
     resolveLinks(tables, *xrefs, diagnostics);
 

@@ -13,6 +13,9 @@ namespace olvane::gedcom {
 struct ReadOptions {
     // So many diagnostics of one kind are listed singly; one more then tells how many there were.
     std::size_t diagnosticsPerKind = 100;
+    // Whether events and attributes are kept beyond birth, death and marriage, with their places. They take
+    // memory, and a layout needs none of them.
+    bool facts = false;
 };
 
 // Reads the bytes of a GEDCOM file, 5.5 to 7.0, or of a .gdz archive, in any encoding that is known.

@@ -8,7 +8,9 @@
 #include <olvane/gedcom/RecordReaderInternal.h>
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
+#include <iterator>
 #include <string>
 #include <vector>
 
@@ -49,11 +51,13 @@ constexpr std::uint64_t kNameSuffix = tagCode("NSFX");
 constexpr std::uint64_t kNickname = tagCode("NICK");
 constexpr std::uint64_t kPedigree = tagCode("PEDI");
 constexpr std::uint64_t kPhrase = tagCode("PHRASE");
+constexpr std::uint64_t kPlace = tagCode("PLAC");
 constexpr std::uint64_t kProbate = tagCode("PROB");
 constexpr std::uint64_t kSex = tagCode("SEX");
 constexpr std::uint64_t kSurname = tagCode("SURN");
 constexpr std::uint64_t kSurnamePrefix = tagCode("SPFX");
 constexpr std::uint64_t kTrailer = tagCode("TRLR");
+constexpr std::uint64_t kType = tagCode("TYPE");
 constexpr std::uint64_t kWife = tagCode("WIFE");
 
 bool isKnownRecord(std::uint64_t tag) {
@@ -75,10 +79,43 @@ bool isKnownRecord(std::uint64_t tag) {
     }
 }
 
+struct FactTag {
+    std::uint64_t code;
+    std::string_view name;
+};
+
+// What is told of persons and couples, but for numbers by which an office knows them, which are nobody's
+// business.
+constexpr std::string_view kFactNames[] = {
+    "ADOP", "ANUL", "BAPM", "BARM", "BASM", "BIRT", "BLES", "BURI", "CAST", "CENS", "CHR",
+    "CHRA", "CONF", "CREM", "DEAT", "DIV",  "DIVF", "DSCR", "EDUC", "EMIG", "ENGA", "EVEN",
+    "FACT", "FCOM", "GRAD", "IMMI", "MARB", "MARC", "MARL", "MARR", "MARS", "NATI", "NATU",
+    "NCHI", "NMR",  "OCCU", "ORDN", "PROB", "PROP", "RELI", "RESI", "RETI", "TITL", "WILL"};
+
+constexpr auto kFactTags = [] {
+    std::array<FactTag, std::size(kFactNames)> tags{};
+    for (std::size_t i = 0; i < tags.size(); ++i) tags[i] = {tagCode(kFactNames[i]), kFactNames[i]};
+    std::sort(tags.begin(), tags.end(), [](const FactTag& a, const FactTag& b) { return a.code < b.code; });
+    return tags;
+}();
+
+// Empty for a tag that tells no fact.
+std::string_view factName(std::uint64_t tag) {
+    const auto* const found =
+        std::lower_bound(kFactTags.begin(), kFactTags.end(), tag,
+                         [](const FactTag& fact, std::uint64_t code) { return fact.code < code; });
+    return found != kFactTags.end() && found->code == tag ? found->name : std::string_view();
+}
+
 Sex sexOf(std::string_view value) {
     if (value == "M" || value == "m") return Sex::male;
     if (value == "F" || value == "f") return Sex::female;
     return Sex::other;
+}
+
+// An older custom.
+bool didNotHappen(const GedcomLine& line) {
+    return trimmed(line.value) == "N";
 }
 
 Pedigree pedigreeOf(std::string_view value) {
@@ -165,11 +202,14 @@ void RecordReader::readLine(const GedcomLine& line) {
         endName();
         openDate_ = nullptr;
         fact_ = tag;
+        if (keepsFacts_) beginFact(line, tag);
         return record_ == Record::person ? readPersonFact(line, tag) : readFamilyFact(line, tag);
     }
     if (line.level == 2) {
         openDate_ = nullptr;
-        return record_ == Record::person ? readPersonDetail(line, tag) : readFamilyDetail(line, tag);
+        record_ == Record::person ? readPersonDetail(line, tag) : readFamilyDetail(line, tag);
+        if (factOpen_) readFactDetail(line, tag);
+        return;
     }
     if (tag == kPhrase && openDate_ != nullptr) readDatePhrase(line);
 }
@@ -207,6 +247,7 @@ void RecordReader::checkEnd(const GedcomLine& line, std::uint64_t tag) {
 void RecordReader::endRecord() {
     endName();
     openDate_ = nullptr;
+    factOpen_ = false;
     if (record_ == Record::family) endFamily();
     record_ = Record::other;
 }
@@ -235,6 +276,7 @@ void RecordReader::beginPerson(const GedcomLine& line) {
     fresh.parentLinkSlice.first = static_cast<std::uint32_t>(tables_.parentLinks.size());
     fresh.coupleLinkSlice.first = static_cast<std::uint32_t>(tables_.coupleLinks.size());
     addForeseeing(tables_.persons, fresh, scanner_.share());
+    if (keepsFacts_) tables_.factsOfPersons.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->person == 0) entry->person = static_cast<PersonId>(tables_.persons.size());
 }
@@ -250,6 +292,7 @@ void RecordReader::beginFamily(const GedcomLine& line) {
     fresh.xref = keeper_.keep(line.xref, line.number);
     fresh.childLinkSlice.first = static_cast<std::uint32_t>(tables_.childLinks.size());
     addForeseeing(tables_.families, fresh, scanner_.share());
+    if (keepsFacts_) tables_.factsOfFamilies.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->family == 0)
         entry->family = static_cast<FamilyId>(tables_.families.size());
@@ -267,7 +310,10 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
         case kBurial:
         case kCremation:
         case kProbate:
-            if (trimmed(line.value) == "N") return;  // an older custom for "did not happen"
+            if (didNotHappen(line)) {
+                fact_ = 0;  // whatever is told below did not happen either
+                return;
+            }
             person().dead = true;
             return;
         case kFamilyAsChild:
@@ -308,7 +354,7 @@ void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
             ++marriages_;
             return;
         case kDivorce:
-            if (trimmed(line.value) == "N") return;  // an older custom for "not divorced"
+            if (didNotHappen(line)) return;
             family().divorced = true;
             marriedLast_ = false;
             return;
@@ -378,6 +424,34 @@ void RecordReader::endName() {
     ++person().nameSlice.count;
 }
 
+void RecordReader::beginFact(const GedcomLine& line, std::uint64_t tag) {
+    const std::string_view name = factName(tag);
+    factOpen_ = !name.empty() && !didNotHappen(line);
+    if (!factOpen_) return;
+    Fact fact;
+    fact.tag = name;
+    fact.line = line.number;
+    if (trimmed(line.value) != "Y") fact.value = keptValue(line);
+    valueFromType_ = fact.value.empty();
+    tables_.facts.push_back(fact);
+    ++factsInHand().count;
+}
+
+Slice& RecordReader::factsInHand() {
+    return record_ == Record::person ? tables_.factsOfPersons.back() : tables_.factsOfFamilies.back();
+}
+
+// Of several dates, places and types the first stands. A date that the record has kept is taken from there, so
+// that its trouble is told once.
+void RecordReader::readFactDetail(const GedcomLine& line, std::uint64_t tag) {
+    Fact& fact = tables_.facts.back();
+    if (tag == kPlace && fact.place.empty()) fact.place = keptValue(line);
+    if (tag == kType && valueFromType_ && fact.value.empty()) fact.value = keptValue(line);
+    if (tag != kDate || fact.date.isGiven()) return;
+    fact.date = lastDate_.line == line.number ? lastDate_ : parseGedcomDate(keptValue(line));
+    fact.date.line = line.number;
+}
+
 // Of several dates the first stands.
 void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
     if (date.isGiven()) return;
@@ -388,6 +462,7 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
     }
     date = parseGedcomDate(value);
     date.line = line.number;
+    lastDate_ = date;
     if (date.isRead() || value.front() == '(') return;
     diagnostics_.add(DiagnosticKind::unreadableDate, Severity::note, line.number,
                      "a date that cannot be read", "shown as written", value);
@@ -396,6 +471,7 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
 void RecordReader::readDatePhrase(const GedcomLine& line) {
     openDate_->written = keptValue(line);
     openDate_->line = line.number;
+    if (factOpen_ && !tables_.facts.back().date.isGiven()) tables_.facts.back().date = *openDate_;
     openDate_ = nullptr;
 }
 

@@ -22,8 +22,13 @@ namespace olvane::gedcom {
 class RecordReader {
 public:
     RecordReader(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables, XrefTable& xrefs,
-                 DiagnosticList& diagnostics)
-        : scanner_(scanner), keeper_(keeper), tables_(tables), xrefs_(xrefs), diagnostics_(diagnostics) {}
+                 DiagnosticList& diagnostics, bool keepsFacts)
+        : scanner_(scanner),
+          keeper_(keeper),
+          tables_(tables),
+          xrefs_(xrefs),
+          diagnostics_(diagnostics),
+          keepsFacts_(keepsFacts) {}
 
     // False if there was no record that GEDCOM knows.
     bool readAll();
@@ -78,6 +83,10 @@ private:
     std::string_view keptPiece(const PieceDraft& piece);
     void endName();
 
+    void beginFact(const GedcomLine& line, std::uint64_t tag);
+    void readFactDetail(const GedcomLine& line, std::uint64_t tag);
+    Slice& factsInHand();
+
     void readDate(const GedcomLine& line, GedcomDate& date);
     void readDatePhrase(const GedcomLine& line);
     void addPartner(const GedcomLine& line, PartnerDraft& draft);
@@ -98,10 +107,14 @@ private:
     GedcomTables& tables_;
     XrefTable& xrefs_;
     DiagnosticList& diagnostics_;
+    bool keepsFacts_;
 
     Record record_ = Record::other;
     std::uint64_t fact_ = 0;          // tag of the line on level 1 that the one in hand lies under
     GedcomDate* openDate_ = nullptr;  // a date without a value, which a phrase may still fill
+    GedcomDate lastDate_;             // of the last line with a date of birth, death or marriage
+    bool factOpen_ = false;           // the last of the facts lies above the line in hand
+    bool valueFromType_ = false;
     NameDraft name_;
     bool nameOpen_ = false;
     bool sexRead_ = false;

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-// The one place that knows the Unicode library.
+// UnicodeForms.cpp is the one place that knows the Unicode library.
 namespace olvane::gedcom {
 
 // How bytes look as UTF-8.

@@ -6,7 +6,7 @@
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/gedcom/GedcomData.h>
 
-namespace olvane::cli {
+namespace olvane::gedcom {
 
 // A GEDCOM file as the engine's data source: the person of id n is the n-th of the file.
 //
@@ -14,7 +14,7 @@ namespace olvane::cli {
 //        each have one around the same data.
 class GedcomDataSource final : public OlvaneViewerManagerWrapProtocol {
 public:
-    explicit GedcomDataSource(const gedcom::GedcomData& data) : data_(data) {}
+    explicit GedcomDataSource(const GedcomData& data) : data_(data) {}
 
     std::int64_t fatherForPersonWithID(std::int64_t personId) override;
     std::int64_t motherForPersonWithID(std::int64_t personId) override;
@@ -28,7 +28,7 @@ public:
     std::int32_t sexOfPersonWithID(std::int64_t personId) override;
 
 private:
-    const gedcom::GedcomData& data_;
+    const GedcomData& data_;
 };
 
-}  // namespace olvane::cli
+}  // namespace olvane::gedcom

@@ -3,21 +3,21 @@
 
 // The engine's eight questions, answered from a GEDCOM file.
 
-#include <cli/GedcomDataSource.h>
+#include <olvane/source/GedcomDataSource.h>
 
-namespace olvane::cli {
+namespace olvane::gedcom {
 
 namespace {
 
-gedcom::PersonId asPerson(std::int64_t id) {
-    return static_cast<gedcom::PersonId>(id);
+PersonId asPerson(std::int64_t id) {
+    return static_cast<PersonId>(id);
 }
 
-std::int64_t knownOrNot(gedcom::PersonId id) {
+std::int64_t knownOrNot(PersonId id) {
     return id == 0 ? OlvaneViewerManagerWrapProtocol::kPersonNotFound : std::int64_t{id};
 }
 
-std::vector<std::int64_t> asHostIds(std::span<const gedcom::PersonId> persons) {
+std::vector<std::int64_t> asHostIds(std::span<const PersonId> persons) {
     return std::vector<std::int64_t>(persons.begin(), persons.end());
 }
 
@@ -49,12 +49,12 @@ bool GedcomDataSource::isPersonDead(std::int64_t personId) {
 }
 
 std::string GedcomDataSource::dateForPersonWithID(std::int64_t personId, bool isBirth) {
-    const gedcom::Person& person = data_.person(asPerson(personId));
-    return gedcom::sortText(isBirth ? person.birth : person.death);
+    const Person& person = data_.person(asPerson(personId));
+    return sortText(isBirth ? person.birth : person.death);
 }
 
 std::int32_t GedcomDataSource::sexOfPersonWithID(std::int64_t personId) {
     return static_cast<std::int32_t>(data_.person(asPerson(personId)).sex);
 }
 
-}  // namespace olvane::cli
+}  // namespace olvane::gedcom

@@ -1,0 +1,30 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <olvane/gedcom/GedcomData.h>
+
+namespace olvane::gedcom {
+
+struct WriteOptions {
+    // By person, entry 0 for person 1: whose identifier, name, dates and facts stay out. Empty for nobody.
+    std::vector<bool> hidden;
+    // The name that hidden persons get. One line of UTF-8.
+    std::string hiddenName = "Living";
+};
+
+// A GEDCOM text of what was read and no more: persons with names, sex, facts and links, families with facts.
+// Notes, sources, media, addresses and whatever else a file may hold are not in it.
+//
+// Holds: UTF-8. Read again with facts, it gives the same persons and families with the same ids, relatives,
+//        names, dates and facts. Identifiers stay where each stands for one record; others are made. Of a
+//        hidden person there are sex and links alone; of a family with a hidden partner also MARR and DIV,
+//        without date and place, since a picture tells the couple's state.
+// Fails: what was read without facts is written without; nothing is thrown but std::bad_alloc.
+std::string writeGedcom(const GedcomData& data, const WriteOptions& options = {});
+
+}  // namespace olvane::gedcom
