@@ -52,11 +52,6 @@ Parent parentOf(ViewerGlue& glue, std::int64_t answer) {
     return Parent{false, key};
 }
 
-void registerAddNode(ViewerGlue& glue, int key, bool male, int childKey, int otherParentKey) {
-    glue.addAddNodeValue(glue.personOfKey(key), male, glue.personOfKey(childKey),
-                         glue.personOfKey(otherParentKey));
-}
-
 // Ids below 1 mark synthetic persons, of whom the host is never asked.
 void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int& father, int& mother) {
     const int id = glue.numberOfKey(key);
@@ -65,8 +60,8 @@ void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int&
     father = first.key;
     const Parent second = parentOf(glue, host(manager).motherForPersonWithID(id));
     mother = second.key;
-    if (!first.isReal) registerAddNode(glue, first.key, true, key, second.key);
-    if (!second.isReal) registerAddNode(glue, second.key, false, key, first.key);
+    if (!first.isReal) glue.addAddNode(first.key, true, key, second.key);
+    if (!second.isReal) glue.addAddNode(second.key, false, key, first.key);
 }
 
 void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, SpouseSet& spouses) {
@@ -86,7 +81,7 @@ void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, Spou
 
 // An add-node has one child: the person for whom it stands.
 void getChildOfAddNode(ViewerGlue& glue, int key, ChildrenSet& children) {
-    const std::string childText = glue.addNode(glue.personOfKey(key)).childText;
+    const std::string childText = glue.childTextOfAddNode(key);
     if (childText.empty()) return;
     children.insert(ChildrenAdapter(glue.getKeyFromPerson(childText), std::string(), childText));
 }
@@ -108,7 +103,7 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
 bool isMale(const ViewerGlue& glue, const ManagerReference& manager, int key) {
     const int id = glue.numberOfKey(key);
     if (id >= 1) return host(manager).sexOfPersonWithID(id) == 0;
-    return glue.addNode(glue.personOfKey(key)).male;
+    return glue.addNodeIsMale(key);
 }
 
 // The writer of the result tests for an id below 0 instead. The two differ for the id 0 alone, which is

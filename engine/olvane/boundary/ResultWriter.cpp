@@ -29,45 +29,58 @@ void updateBounds(ResultBounds& bounds, int x, int y) {
     if (bounds.maxY < y || bounds.maxY == 0) bounds.maxY = y;
 }
 
-void appendNumber(std::string& text, int value, char separator) {
-    char digits[13];
-    char* const end = std::to_chars(digits, digits + sizeof digits - 1, value).ptr;
-    *end = separator;
-    text.append(digits, static_cast<std::size_t>(end - digits) + 1);
-}
+// Four numbers and what stands behind them, put together here and appended at once.
+class Piece {
+public:
+    void add(int value, char separator) {
+        end_ = std::to_chars(end_, end_ + kLongestNumber, value).ptr;
+        *end_++ = separator;
+    }
+    void appendTo(std::string& text) const { text.append(room_, static_cast<std::size_t>(end_ - room_)); }
+
+private:
+    static constexpr std::size_t kLongestNumber = 11;
+
+    char room_[4 * (kLongestNumber + 1)];
+    char* end_ = room_;
+};
 
 void appendPlaceAndFlag(std::string& text, const std::string& personText, int x, int y, bool flag) {
     text += personText;
     text += ':';
-    appendNumber(text, x, ':');
-    appendNumber(text, y, ':');
-    appendNumber(text, flag ? 1 : 0, ':');
+    Piece piece;
+    piece.add(x, ':');
+    piece.add(y, ':');
+    piece.add(flag ? 1 : 0, ':');
+    piece.appendTo(text);
 }
 
-void appendSegments(std::string& text, TreeViewPerson& person) {
-    person.lineSegmentIterator([&text](TreeLineSegment& segment) {
-        appendNumber(text, wholePoint(segment.x1), ',');
-        appendNumber(text, wholePoint(segment.y1), ',');
-        appendNumber(text, wholePoint(segment.x2), ',');
-        appendNumber(text, wholePoint(segment.y2), '|');
-    });
+void appendSegments(std::string& text, const TreeViewPerson& person) {
+    for (const TreeLineSegment& segment : person.lineSegments) {
+        Piece piece;
+        piece.add(wholePoint(segment.x1), ',');
+        piece.add(wholePoint(segment.y1), ',');
+        piece.add(wholePoint(segment.x2), ',');
+        piece.add(wholePoint(segment.y2), '|');
+        piece.appendTo(text);
+    }
 }
 
-void appendSexAndChild(std::string& text, const ViewerGlue& glue, const std::string& personText) {
+void appendSexAndChild(std::string& text, const ViewerGlue& glue, int key) {
     text += ':';
-    text += glue.addNode(personText).male ? 'M' : 'F';
+    text += glue.addNodeIsMale(key) ? 'M' : 'F';
     text += ':';
-    text += glue.addNode(personText).childText;
+    text += glue.childTextOfAddNode(key);
 }
 
 void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text, TreeViewPerson& person) {
-    const std::string& personText = glue.personOfKey(person.personId);
+    const std::string personText = glue.personOfKey(person.personId);
     const int x = wholePoint(person.getNodeCenter().x);
     const int y = wholePoint(person.getNodeCenter().y);
     updateBounds(bounds, x, y);
     appendPlaceAndFlag(text, personText, x, y, person.hasNonDisplayedRelationships);
     appendSegments(text, person);
-    if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, personText);
+    if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, person.personId);
     text += ';';
 }
 

@@ -3,10 +3,10 @@
 
 // Keys by first sight, and the records of add-nodes.
 //
-// A layout asks about eleven questions for each record that it writes, and each begins with a key or a
-// number. So the tables of texts are kept true, but two small indexes answer first: an array by key, and a
-// hash from numbers to keys. A number's slot stands for its plain decimal text alone; "017" and "17" are two
-// persons with one number.
+// A layout asks about eleven questions for each record that it writes, each begins with a key or a number,
+// and most of the add-nodes that it makes are never drawn. So all is kept as numbers: an array by key, and a
+// hash from numbers to keys. Texts are made when somebody looks. A number stands for its plain decimal text
+// alone; "017" and "17" are two persons with one number, and such odd texts are kept apart.
 
 #include <olvane/boundary/ViewerGlue.h>
 
@@ -17,7 +17,6 @@
 
 namespace {
 
-constexpr std::size_t kLeastBuckets = 11;
 constexpr std::size_t kFirstSlots = 64;
 
 [[noreturn]] void failToFind() {
@@ -29,75 +28,135 @@ std::size_t scattered(int number) {
     return static_cast<std::size_t>(product >> 32);
 }
 
+// The slot that holds the number, or the empty one where it belongs.
+template <class Slots>
+auto& findSlot(Slots& slots, int number, int emptyKey) {
+    const std::size_t mask = slots.size() - 1;
+    std::size_t place = scattered(number) & mask;
+    while (slots[place].key != emptyKey && slots[place].number != number) place = (place + 1) & mask;
+    return slots[place];
+}
+
 }  // namespace
 
 ViewerGlue::ViewerGlue()
-    : keyToPerson(kLeastBuckets, &blocks_),
-      personToKey(kLeastBuckets, &blocks_),
-      addNodes(kLeastBuckets, &blocks_),
-      slots_(kFirstSlots) {
-    keyToPerson.max_load_factor(1.0f);
-    personToKey.max_load_factor(1.0f);
-    addNodes.max_load_factor(1.0f);
-}
+    : keyToPerson(*this, &ViewerGlue::fillKeyToPerson),
+      personToKey(*this, &ViewerGlue::fillPersonToKey),
+      addNodes(*this, &ViewerGlue::fillAddNodes),
+      slots_(kFirstSlots) {}
 
 int ViewerGlue::getKeyFromPerson(std::string personText) {
     const int number = stringToInt(personText);
     if (personText == intToString(number)) return keyOfNumber(number);
-    const auto known = personToKey.find(personText);
-    return known != personToKey.end() ? known->second : addEntry(personText, number);
+    const auto known = oddTexts_.find(personText);
+    if (known != oddTexts_.end()) return known->second;
+    const auto entry = oddTexts_.emplace(personText, static_cast<int>(entries_.size())).first;
+    return addEntry(number, &entry->first);
 }
 
 int ViewerGlue::keyOfNumber(int id) {
-    NumberSlot& slot = slotOf(id);
-    if (slot.key != kNoSlot) return slot.key;
-    const int key = addEntry(intToString(id), id);
+    NumberSlot& slot = findSlot(slots_, id, kNone);
+    if (slot.key != kNone) return slot.key;
+    const int key = addEntry(id, nullptr);
     slot = NumberSlot{id, key};
     if (++usedSlots_ * 2 > slots_.size()) growSlots();
     return key;
 }
 
-int ViewerGlue::addEntry(const std::string& personText, int number) {
-    const int key = static_cast<int>(keyToPerson.size());
-    const auto entry = keyToPerson.emplace(key, personText).first;
-    personToKey.emplace(personText, key);
-    entries_.push_back(KeyEntry{&entry->second, number});
+int ViewerGlue::addEntry(int number, const std::string* oddText) {
+    const int key = static_cast<int>(entries_.size());
+    entries_.push_back(KeyEntry{number, kNone, oddText});
     return key;
-}
-
-// The slot that holds the number, or the empty one where it belongs.
-ViewerGlue::NumberSlot& ViewerGlue::slotOf(int number) {
-    const std::size_t mask = slots_.size() - 1;
-    std::size_t place = scattered(number) & mask;
-    while (slots_[place].key != kNoSlot && slots_[place].number != number) place = (place + 1) & mask;
-    return slots_[place];
 }
 
 void ViewerGlue::growSlots() {
     std::vector<NumberSlot> smaller(slots_.size() * 2);
     smaller.swap(slots_);
     for (const NumberSlot& slot : smaller) {
-        if (slot.key != kNoSlot) slotOf(slot.number) = slot;
+        if (slot.key != kNone) findSlot(slots_, slot.number, kNone) = slot;
     }
-}
-
-void ViewerGlue::addAddNodeValue(const std::string& addNodeText, bool male, const std::string& childText,
-                                 const std::string& otherParentText) {
-    if (addNodes.find(addNodeText) != addNodes.end()) return;
-    addNodes.emplace(addNodeText, AddNodeValues{male, addNodeText, childText, otherParentText});
-}
-
-AddNodeValues ViewerGlue::getAddNodeValue(std::string personText) const {
-    return addNode(personText);
-}
-
-const AddNodeValues& ViewerGlue::addNode(const std::string& personText) const {
-    const auto entry = addNodes.find(personText);
-    if (entry == addNodes.end()) failToFind();
-    return entry->second;
 }
 
 const ViewerGlue::KeyEntry& ViewerGlue::entryOfKey(int key) const {
     if (key < 0 || static_cast<std::size_t>(key) >= entries_.size()) failToFind();
     return entries_[static_cast<std::size_t>(key)];
+}
+
+std::string ViewerGlue::personOfKey(int key) const {
+    const KeyEntry& entry = entryOfKey(key);
+    return entry.oddText != nullptr ? *entry.oddText : intToString(entry.number);
+}
+
+// kNone for a text that has no key.
+int ViewerGlue::knownKeyOf(const std::string& personText) const {
+    const int number = stringToInt(personText);
+    if (personText == intToString(number)) return findSlot(slots_, number, kNone).key;
+    const auto known = oddTexts_.find(personText);
+    return known != oddTexts_.end() ? known->second : kNone;
+}
+
+void ViewerGlue::addAddNodeValue(const std::string& addNodeText, bool male, const std::string& childText,
+                                 const std::string& otherParentText) {
+    const int key = knownKeyOf(addNodeText);
+    if (key != kNone && recordOfKey(key) != nullptr) return;
+    toldRecords_.emplace(addNodeText, AddNodeValues{male, addNodeText, childText, otherParentText});
+}
+
+void ViewerGlue::addAddNode(int key, bool male, int childKey, int otherParentKey) {
+    if (recordOfKey(key) != nullptr) return;
+    if (!toldRecords_.empty() && toldRecords_.count(personOfKey(key)) != 0) return;
+    records_.push_back(AddNodeRecord{key, childKey, otherParentKey, male});
+    entries_[static_cast<std::size_t>(key)].addNode = static_cast<int>(records_.size()) - 1;
+}
+
+AddNodeValues ViewerGlue::getAddNodeValue(std::string personText) const {
+    const int key = knownKeyOf(personText);
+    const AddNodeRecord* const record = key != kNone ? recordOfKey(key) : nullptr;
+    return record != nullptr ? valuesOf(*record) : toldRecord(personText);
+}
+
+bool ViewerGlue::addNodeIsMale(int key) const {
+    const AddNodeRecord* const record = recordOfKey(key);
+    return record != nullptr ? record->male : toldRecord(personOfKey(key)).male;
+}
+
+std::string ViewerGlue::childTextOfAddNode(int key) const {
+    const AddNodeRecord* const record = recordOfKey(key);
+    return record != nullptr ? personOfKey(record->childKey) : toldRecord(personOfKey(key)).childText;
+}
+
+// Null where the add-node came as text, or where there is none.
+const ViewerGlue::AddNodeRecord* ViewerGlue::recordOfKey(int key) const {
+    const int place = entryOfKey(key).addNode;
+    return place != kNone ? &records_[static_cast<std::size_t>(place)] : nullptr;
+}
+
+const AddNodeValues& ViewerGlue::toldRecord(const std::string& personText) const {
+    const auto entry = toldRecords_.find(personText);
+    if (entry == toldRecords_.end()) failToFind();
+    return entry->second;
+}
+
+AddNodeValues ViewerGlue::valuesOf(const AddNodeRecord& record) const {
+    return AddNodeValues{record.male, personOfKey(record.key), personOfKey(record.childKey),
+                         personOfKey(record.otherParentKey)};
+}
+
+void ViewerGlue::fillKeyToPerson(boost::unordered_map<int, std::string>& map) const {
+    for (int key = static_cast<int>(map.size()); static_cast<std::size_t>(key) < entries_.size(); ++key) {
+        map.emplace(key, personOfKey(key));
+    }
+}
+
+void ViewerGlue::fillPersonToKey(boost::unordered_map<std::string, int>& map) const {
+    for (int key = static_cast<int>(map.size()); static_cast<std::size_t>(key) < entries_.size(); ++key) {
+        map.emplace(personOfKey(key), key);
+    }
+}
+
+// An add-node is in one of the two collections, so as many entries as both have together is all of them.
+void ViewerGlue::fillAddNodes(boost::unordered_map<std::string, AddNodeValues>& map) const {
+    if (map.size() == records_.size() + toldRecords_.size()) return;
+    for (const AddNodeRecord& record : records_) map.emplace(personOfKey(record.key), valuesOf(record));
+    for (const auto& told : toldRecords_) map.insert(told);
 }

@@ -5,7 +5,7 @@
 
 #include <boost/unordered_map.hpp>
 
-#include <memory_resource>
+#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -27,15 +27,40 @@ struct AddNodeValues {
 // Fails: a look-up of an unknown key or add-node throws std::out_of_range ("Unable to find key in
 //        unordered_map."). No text is refused a key.
 class OLVANE_API ViewerGlue {
-private:
-    // The tables' entries lie in blocks that go all at once. Declared ahead of the tables, so destroyed after
-    // them.
-    std::pmr::monotonic_buffer_resource blocks_;
-
 public:
+    // A table as a hash map to look at. A layout never does, so its entries are made at the first look, and
+    // at later ones those that have come since.
     template <class Key, class Value>
-    using Table = boost::unordered_map<Key, Value, boost::hash<Key>, std::equal_to<Key>,
-                                       std::pmr::polymorphic_allocator<std::pair<const Key, Value>>>;
+    class Table {
+    public:
+        typedef boost::unordered_map<Key, Value> Map;
+        typedef void (ViewerGlue::*Filling)(Map&) const;
+
+        Table(const ViewerGlue& glue, Filling fill) : glue_(glue), fill_(fill), map_(kLeastBuckets) {
+            map_.max_load_factor(1.0f);
+        }
+
+        const Map& map() const {
+            (glue_.*fill_)(map_);
+            return map_;
+        }
+        typename Map::const_iterator begin() const { return map().begin(); }
+        typename Map::const_iterator end() const { return map_.end(); }
+        typename Map::const_iterator find(const Key& key) const { return map().find(key); }
+        const Value& at(const Key& key) const { return map().at(key); }
+        std::size_t count(const Key& key) const { return map().count(key); }
+        std::size_t size() const { return map().size(); }
+        bool empty() const { return map().empty(); }
+        std::size_t bucket_count() const { return map().bucket_count(); }
+        float max_load_factor() const { return map_.max_load_factor(); }
+
+    private:
+        static constexpr std::size_t kLeastBuckets = 11;
+
+        const ViewerGlue& glue_;
+        Filling fill_;
+        mutable Map map_;
+    };
 
     ViewerGlue();
     ViewerGlue(const ViewerGlue&) = delete;
@@ -43,44 +68,61 @@ public:
 
     // The key of a person; a new one where the text has none yet.
     int getKeyFromPerson(std::string personText);
-    // The same for the decimal text of a number, without making that text where the number has been seen.
+    // The same for the decimal text of a number, without making that text.
     int keyOfNumber(int id);
 
-    // The first record of a text stands; a later one for the same text is dropped.
+    // The id text under a key, and the number that it says (0 for none).
+    std::string personOfKey(int key) const;
+    int numberOfKey(int key) const { return entryOfKey(key).number; }
+
+    // The first record of an add-node stands; a later one for the same text is dropped.
     void addAddNodeValue(const std::string& addNodeText, bool male, const std::string& childText,
                          const std::string& otherParentText);
     AddNodeValues getAddNodeValue(std::string personText) const;
-    // The same record where it lies.
-    const AddNodeValues& addNode(const std::string& personText) const;
-
-    // The id text under a key, and the number that it says (0 for none).
-    const std::string& personOfKey(int key) const { return entryOfKey(key).text(); }
-    int numberOfKey(int key) const { return entryOfKey(key).number; }
+    // The same by keys, without making the texts.
+    void addAddNode(int key, bool male, int childKey, int otherParentKey);
+    bool addNodeIsMale(int key) const;
+    std::string childTextOfAddNode(int key) const;
 
     Table<int, std::string> keyToPerson;
     Table<std::string, int> personToKey;
     Table<std::string, AddNodeValues> addNodes;
 
 private:
-    // What is asked over and over, by key: the entry of keyToPerson, and its number.
+    static constexpr int kNone = -1;
+
     struct KeyEntry {
-        const std::string* personText;
         int number;
-        const std::string& text() const { return *personText; }
+        int addNode;                 // into records_
+        const std::string* oddText;  // null where the text is the plain decimal form of the number
     };
-    // A slot of the table from numbers to keys, which answers ahead of personToKey.
+    struct AddNodeRecord {
+        int key;
+        int childKey;
+        int otherParentKey;
+        bool male;
+    };
     struct NumberSlot {
         int number = 0;
-        int key = kNoSlot;
+        int key = kNone;
     };
-    static constexpr int kNoSlot = -1;
 
     const KeyEntry& entryOfKey(int key) const;
-    int addEntry(const std::string& personText, int number);
-    NumberSlot& slotOf(int number);
+    int addEntry(int number, const std::string* oddText);
     void growSlots();
+    int knownKeyOf(const std::string& personText) const;
+    const AddNodeRecord* recordOfKey(int key) const;
+    const AddNodeValues& toldRecord(const std::string& personText) const;
+    AddNodeValues valuesOf(const AddNodeRecord& record) const;
+
+    void fillKeyToPerson(boost::unordered_map<int, std::string>& map) const;
+    void fillPersonToKey(boost::unordered_map<std::string, int>& map) const;
+    void fillAddNodes(boost::unordered_map<std::string, AddNodeValues>& map) const;
 
     std::vector<KeyEntry> entries_;  // by key
     std::vector<NumberSlot> slots_;  // a power of two; open addressing, one step at a time
     std::size_t usedSlots_ = 0;
+    boost::unordered_map<std::string, int> oddTexts_;  // to keys
+    std::vector<AddNodeRecord> records_;
+    boost::unordered_map<std::string, AddNodeValues> toldRecords_;  // those that came as texts
 };
