@@ -5,8 +5,10 @@
 # change them, so contraction is off for the engine and for everything that compares with it.
 function(olvane_target target)
   target_compile_options(${target} PRIVATE -ffp-contract=off)
-  set_target_properties(${target} PROPERTIES CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON
-                                             POSITION_INDEPENDENT_CODE ON)
+  set_target_properties(${target} PROPERTIES CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON)
+  if(NOT EMSCRIPTEN)
+    set_target_properties(${target} PROPERTIES POSITION_INDEPENDENT_CODE ON)
+  endif()
   if(OLVANE_DEV)
     target_compile_options(${target} PRIVATE -Wall -Wextra -Wconversion -Wshadow)
     if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")

@@ -31,7 +31,7 @@ private:
 
     void addBlock(std::size_t atLeast) {
         const std::size_t size = std::max(atLeast, kBlockBytes);
-        blocks_.push_back(std::make_unique_for_overwrite<char[]>(size));
+        blocks_.push_back(std::unique_ptr<char[]>(new char[size]));  // left as it is, without zeros
         next_ = blocks_.back().get();
         free_ = size;
     }

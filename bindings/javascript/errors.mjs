@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What can go wrong, and what is left of the layout then.
+
+export class LayoutError extends Error {
+    constructor(status, message, text, records, options) {
+        super(message, options);
+        this.name = new.target.name;
+        this.status = status;
+        this.text = text;
+        this.records = records;
+    }
+}
+
+export class HostError extends LayoutError {}
+
+export class GedcomError extends Error {
+    constructor(message) {
+        super(message);
+        this.name = "GedcomError";
+    }
+}

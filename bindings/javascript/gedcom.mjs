@@ -1,0 +1,138 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A GEDCOM file that the module has read. Persons and families come over once, as one JSON text of arrays; facts
+// when they are asked for.
+
+import { GedcomError } from "./errors.mjs";
+import { runLayout } from "./layout.mjs";
+
+const SEXES = ["male", "female", "other"];
+const MARKS = ["exact", "about", "before", "after", "between"];
+const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other"];
+
+function dateFrom(told) {
+    if (told === 0) return null;
+    const [written, year, month, day, mark, lastYear, shown] = told;
+    return { written, year, month, day, mark: MARKS[mark], lastYear, shown };
+}
+
+function parentFamiliesFrom(told) {
+    const families = [];
+    for (let i = 0; i < told.length; i += 2) {
+        families.push({ family: told[i], pedigree: PEDIGREES[told[i + 1]] });
+    }
+    return families;
+}
+
+function personFrom(told, index) {
+    const [xref, names, given, surname, sex, dead, birth, death, father, mother, spouses, children] = told;
+    return {
+        id: index + 1,
+        xref,
+        name: names[0] ?? "",
+        given,
+        surname,
+        names,
+        sex: SEXES[sex],
+        dead: dead !== 0,
+        birth: dateFrom(birth),
+        death: dateFrom(death),
+        father,
+        mother,
+        spouses,
+        children,
+        parentFamilies: parentFamiliesFrom(told[12]),
+        coupleFamilies: told[13],
+    };
+}
+
+function familyFrom([husband, wife, children, married, divorced, marriage], index) {
+    return {
+        id: index + 1,
+        husband,
+        wife,
+        children,
+        married: married !== 0,
+        divorced: divorced !== 0,
+        marriage: dateFrom(marriage),
+    };
+}
+
+function factFrom([tag, value, date, place]) {
+    return { tag, value, date: dateFrom(date), place };
+}
+
+function diagnosticFrom([line, severity, message, hint]) {
+    return { line, severity, message, hint };
+}
+
+export class GedcomFile {
+    #instance;
+    #file;
+
+    constructor(instance, file, name) {
+        this.#instance = instance;
+        this.#file = file;
+        this.name = name;
+        const [encoding, version, persons, families, diagnostics] = this.#told("gedcom_table");
+        this.encoding = encoding;
+        this.version = version;
+        this.persons = persons.map(personFrom);
+        this.families = families.map(familyFrom);
+        this.diagnostics = diagnostics.map(diagnosticFrom);
+    }
+
+    factsOfPerson(id) {
+        return this.#told("gedcom_person_facts", id).map(factFrom);
+    }
+
+    factsOfFamily(id) {
+        return this.#told("gedcom_family_facts", id).map(factFrom);
+    }
+
+    layout(focus, options = {}) {
+        return this.#run(focus, options).records;
+    }
+
+    layoutText(focus, options = {}) {
+        return this.#run(focus, options).text;
+    }
+
+    close() {
+        if (this.#file !== 0) this.#instance.exports.gedcom_close(this.#file);
+        this.#file = 0;
+    }
+
+    #run(focus, options) {
+        const file = this.#opened();
+        return runLayout(this.#instance, null, options, (view) =>
+            this.#instance.exports.gedcom_layout(file, view, focus),
+        );
+    }
+
+    #told(question, ...values) {
+        const pointer = this.#instance.exports[question](this.#opened(), ...values);
+        if (pointer === 0) throw new GedcomError(this.#instance.text(this.#instance.exports.last_text()));
+        return JSON.parse(this.#instance.text(pointer));
+    }
+
+    #opened() {
+        if (this.#file === 0) throw new GedcomError(`${this.name}: the file has been closed`);
+        return this.#file;
+    }
+}
+
+export function readGedcom(instance, bytes, name) {
+    const { exports } = instance;
+    const file = instance.withText(name, (namePointer) =>
+        instance.withBytes(bytes, (pointer, length) => exports.gedcom_open(pointer, length, namePointer)),
+    );
+    if (file === 0) throw new GedcomError(instance.text(exports.last_text()));
+    try {
+        return new GedcomFile(instance, file, name);
+    } catch (error) {
+        exports.gedcom_close(file);
+        throw error;
+    }
+}

@@ -1,0 +1,137 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The WebAssembly module at work: its memory as texts and numbers, and what it imports. A host's error can't pass
+// through the module, so a question keeps what the host threw and tells a failure; the layout throws it on.
+
+import { PERSON_NOT_FOUND } from "./values.mjs";
+
+const utf8 = { decoder: new TextDecoder(), encoder: new TextEncoder() };
+
+function wholeId(id) {
+    if (Number.isSafeInteger(id)) return id;
+    throw new TypeError(`a host answered ${String(id)} where an id is a whole number`);
+}
+
+function parentId(answer) {
+    const unknown = answer === null || answer === undefined || answer === PERSON_NOT_FOUND;
+    return unknown ? Infinity : wholeId(answer);
+}
+
+export class Instance {
+    static async of(module) {
+        const instance = new Instance();
+        const compiled = module instanceof WebAssembly.Module ? module : await WebAssembly.compile(module);
+        const { exports } = await WebAssembly.instantiate(compiled, instance.#imports(compiled));
+        instance.exports = exports;
+        exports._initialize();
+        return instance;
+    }
+
+    /** The host of the layout that is running, and what it threw. */
+    #host = null;
+    #thrown = null;
+
+    text(pointer) {
+        const bytes = new Uint8Array(this.exports.memory.buffer);
+        return utf8.decoder.decode(bytes.subarray(pointer, bytes.indexOf(0, pointer)));
+    }
+
+    numbers(pointer, count) {
+        return new Int32Array(this.exports.memory.buffer, pointer, count);
+    }
+
+    /** Copies bytes in, with a zero behind them, for as long as use runs. */
+    withBytes(bytes, use) {
+        const pointer = this.exports.malloc(bytes.length + 1);
+        if (pointer === 0) throw new RangeError("not enough memory");
+        try {
+            const memory = new Uint8Array(this.exports.memory.buffer);
+            memory.set(bytes, pointer);
+            memory[pointer + bytes.length] = 0;
+            return use(pointer, bytes.length);
+        } finally {
+            this.exports.free(pointer);
+        }
+    }
+
+    withText(text, use) {
+        return this.withBytes(utf8.encoder.encode(text), use);
+    }
+
+    /** What run gives, and what the host threw meanwhile, in an array of one; null if nothing. */
+    askingHost(host, run) {
+        const outer = { host: this.#host, thrown: this.#thrown };
+        this.#host = host;
+        this.#thrown = null;
+        try {
+            return { result: run(), thrown: this.#thrown };
+        } finally {
+            this.#host = outer.host;
+            this.#thrown = outer.thrown;
+        }
+    }
+
+    #ask(question, failure) {
+        try {
+            return question(this.#host);
+        } catch (error) {
+            this.#thrown = [error];
+            return failure;
+        }
+    }
+
+    #askParent(question) {
+        return this.#ask((host) => parentId(question(host)), NaN);
+    }
+
+    #askList(question, list) {
+        return this.#ask((host) => {
+            for (const id of question(host)) {
+                if (this.exports.append_person(list, wholeId(id)) !== 0) return 1;
+            }
+            return 0;
+        }, 1);
+    }
+
+    #askNumber(question, pointer) {
+        return this.#ask((host) => {
+            this.numbers(pointer, 1)[0] = Number(question(host));
+            return 0;
+        }, 1);
+    }
+
+    #imports(module) {
+        const imports = {
+            olvane: {
+                father_of: (person) => this.#askParent((host) => host.fatherOf(person)),
+                mother_of: (person) => this.#askParent((host) => host.motherOf(person)),
+                spouses_of: (person, list) => this.#askList((host) => host.spousesOf(person), list),
+                children_of: (person, list) => this.#askList((host) => host.childrenOf(person), list),
+                is_preferred_spouse: (person, spouse, answer) =>
+                    this.#askNumber((host) => host.isPreferredSpouse(person, spouse), answer),
+                is_dead: (person, answer) => this.#askNumber((host) => host.isDead(person), answer),
+                date_of: (person, isBirth, date) =>
+                    this.#ask((host) => {
+                        const text = String(host.dateOf(person, isBirth !== 0) ?? "");
+                        return this.withText(text, (pointer) => this.exports.set_date(date, pointer));
+                    }, 1),
+                sex_of: (person, answer) => this.#askNumber((host) => host.sexOf(person), answer),
+                compose: (pointer, length, result) => {
+                    const bytes = new Uint8Array(this.exports.memory.buffer, pointer, length);
+                    const text = utf8.decoder.decode(bytes).normalize("NFC");
+                    this.withText(text, (made, size) => this.exports.composed_text(result, made, size));
+                },
+            },
+        };
+        // The rest is what a C library asks of its system on its way to an end: nothing is printed, nothing opened.
+        for (const { module: from, name } of WebAssembly.Module.imports(module)) {
+            imports[from] ??= {};
+            imports[from][name] ??= () => {
+                if (name === "proc_exit" || name === "abort") throw new Error("the module ended itself");
+                return 0;
+            };
+        }
+        return imports;
+    }
+}

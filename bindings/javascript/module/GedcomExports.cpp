@@ -1,0 +1,213 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A GEDCOM file in the module's memory: opened from bytes, told as JSON in the order that Gedcom.mjs reads, laid
+// out, closed. What is told once per person is kept short; facts are told when somebody asks for them.
+
+#include <cstddef>
+#include <exception>
+#include <memory>
+#include <span>
+#include <string>
+#include <string_view>
+
+#include <olvane/gedcom/GedcomReader.h>
+
+#include "GedcomHost.h"
+#include "JsonText.h"
+#include "LayoutAnswer.h"
+
+#define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
+
+namespace olvane::js {
+namespace {
+
+struct OpenFile {
+    explicit OpenFile(gedcom::GedcomData read) : data(std::move(read)), source(data) {}
+
+    gedcom::GedcomData data;
+    gedcom::GedcomDataSource source;
+};
+
+// What the last call had to say: a table, facts, or why a file was refused.
+std::string lastText;
+
+void tell(JsonText& json, const gedcom::GedcomDate& date) {
+    if (!date.isGiven()) return json.number(0);
+    json.begin();
+    json.string(date.written);
+    json.number(date.year);
+    json.number(date.month);
+    json.number(date.day);
+    json.number(static_cast<int>(date.mark));
+    json.number(date.lastYear);
+    json.string(gedcom::displayYear(date));
+    json.end();
+}
+
+template <class Ids>
+void tellIds(JsonText& json, const Ids& ids) {
+    json.begin();
+    for (const auto id : ids) json.number(id);
+    json.end();
+}
+
+void tellNames(JsonText& json, std::span<const gedcom::PersonName> names) {
+    json.begin();
+    for (const gedcom::PersonName& name : names) json.string(gedcom::displayName(name));
+    json.end();
+}
+
+void tellParentFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
+    json.begin();
+    for (const gedcom::FamilyLink& link : links) {
+        if (link.family == 0) continue;
+        json.number(link.family);
+        json.number(static_cast<int>(link.pedigree));
+    }
+    json.end();
+}
+
+void tellCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
+    json.begin();
+    for (const gedcom::FamilyLink& link : links) {
+        if (link.family != 0) json.number(link.family);
+    }
+    json.end();
+}
+
+void tellPerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonId id) {
+    const gedcom::Person& person = data.person(id);
+    json.begin();
+    json.string(person.xref);
+    tellNames(json, data.names(id));
+    json.string(data.firstName(id).given);
+    json.string(data.firstName(id).surname);
+    json.number(static_cast<int>(person.sex));
+    json.number(person.dead ? 1 : 0);
+    tell(json, person.birth);
+    tell(json, person.death);
+    json.number(person.father);
+    json.number(person.mother);
+    tellIds(json, data.spouses(id));
+    tellIds(json, data.children(id));
+    tellParentFamilies(json, data.parentLinks(id));
+    tellCoupleFamilies(json, data.coupleLinks(id));
+    json.end();
+}
+
+void tellFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyId id) {
+    const gedcom::Family& family = data.family(id);
+    json.begin();
+    json.number(family.husband);
+    json.number(family.wife);
+    json.begin();
+    for (const gedcom::ChildLink& link : data.childLinks(id)) {
+        if (link.child != 0) json.number(link.child);
+    }
+    json.end();
+    json.number(family.married ? 1 : 0);
+    json.number(family.divorced ? 1 : 0);
+    tell(json, family.marriage);
+    json.end();
+}
+
+void tell(JsonText& json, const gedcom::Diagnostic& diagnostic) {
+    json.begin();
+    json.number(diagnostic.line);
+    json.string(gedcom::severityName(diagnostic.severity));
+    json.string(diagnostic.what);
+    json.string(diagnostic.done);
+    json.end();
+}
+
+std::string tableOf(const gedcom::GedcomData& data) {
+    JsonText json;
+    json.begin();
+    json.string(data.encoding());
+    json.string(data.version());
+    json.begin();
+    for (gedcom::PersonId id = 1; id <= data.personCount(); ++id) tellPerson(json, data, id);
+    json.end();
+    json.begin();
+    for (gedcom::FamilyId id = 1; id <= data.familyCount(); ++id) tellFamily(json, data, id);
+    json.end();
+    json.begin();
+    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) tell(json, diagnostic);
+    json.end();
+    json.end();
+    return std::move(json).take();
+}
+
+std::string factsText(std::span<const gedcom::Fact> facts) {
+    JsonText json;
+    json.begin();
+    for (const gedcom::Fact& fact : facts) {
+        json.begin();
+        json.string(fact.tag);
+        json.string(fact.value);
+        tell(json, fact.date);
+        json.string(fact.place);
+        json.end();
+    }
+    json.end();
+    return std::move(json).take();
+}
+
+// The text that make gives, or null with the reason in its place.
+template <class Make>
+const char* toldOrRefused(const Make& make) {
+    try {
+        lastText = make();
+        return lastText.c_str();
+    } catch (const std::exception& error) {
+        lastText = error.what();
+        return nullptr;
+    }
+}
+
+}  // namespace
+}  // namespace olvane::js
+
+using namespace olvane;
+using js::OpenFile;
+
+// Null for a file that is refused; last_text then says why.
+OLVANE_EXPORT("gedcom_open") OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name) {
+    try {
+        gedcom::ReadOptions options;
+        options.facts = true;
+        return std::make_unique<OpenFile>(
+                   gedcom::readGedcomBytes(std::string(bytes, length), name, options))
+            .release();
+    } catch (const std::exception& error) {
+        js::lastText = error.what();
+        return nullptr;
+    }
+}
+
+// Texts live until the next call that gives one; null where there is none, and last_text says why.
+OLVANE_EXPORT("gedcom_table") const char* gedcomTable(const OpenFile* file) {
+    return js::toldOrRefused([&] { return js::tableOf(file->data); });
+}
+
+OLVANE_EXPORT("gedcom_person_facts") const char* gedcomPersonFacts(const OpenFile* file, std::uint32_t id) {
+    return js::toldOrRefused([&] { return js::factsText(file->data.factsOfPerson(id)); });
+}
+
+OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFile* file, std::uint32_t id) {
+    return js::toldOrRefused([&] { return js::factsText(file->data.factsOfFamily(id)); });
+}
+
+OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {
+    return js::layoutAnswer(js::hostOfFile(file->source), static_cast<js::View>(view), focus,
+                            js::nextOptions());
+}
+
+OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {
+    delete file;
+}
+
+OLVANE_EXPORT("last_text") const char* lastTextTold() {
+    return js::lastText.c_str();
+}

@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A layout by the C interface, and its records as one run of numbers, which JavaScript reads faster than
+// structs or text.
+
+#include "LayoutAnswer.h"
+
+#include <cmath>
+#include <cstddef>
+#include <new>
+
+#include "HostImports.h"
+
+#define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
+
+namespace olvane::js {
+namespace {
+
+olvane_options optionsToUse;
+
+void appendRecord(std::vector<std::int32_t>& numbers, const olvane_record& record) {
+    numbers.insert(numbers.end(),
+                   {static_cast<std::int32_t>(record.id), record.x, record.y, record.has_hidden_relatives,
+                    static_cast<std::int32_t>(record.kind), static_cast<std::int32_t>(record.child),
+                    static_cast<std::int32_t>(record.segment_count)});
+    for (std::size_t i = 0; i < record.segment_count; ++i) {
+        const olvane_segment& segment = record.segments[i];
+        numbers.insert(numbers.end(), {segment.x1, segment.y1, segment.x2, segment.y2});
+    }
+}
+
+void readRecords(LayoutAnswer& answer) {
+    const olvane_record* records = nullptr;
+    std::size_t count = 0;
+    if (!answer.layout || olvane_layout_records(answer.layout.get(), &records, &count) != OLVANE_OK) return;
+    for (std::size_t i = 0; i < count; ++i) appendRecord(answer.numbers, records[i]);
+}
+
+// JavaScript hands over whole numbers; what none of 64 bits could be is nobody.
+std::int64_t idFrom(double focus) {
+    constexpr double kLimit = 9007199254740992.0;  // 2^53, up to which doubles tell all whole numbers apart
+    return std::abs(focus) < kLimit ? static_cast<std::int64_t>(focus) : 0;
+}
+
+}  // namespace
+
+const olvane_options& nextOptions() {
+    return optionsToUse;
+}
+
+LayoutAnswer* layoutAnswer(const olvane_host& host, View view, double focus, const olvane_options& options) {
+    try {
+        auto answer = std::make_unique<LayoutAnswer>();
+        olvane_layout* layout = nullptr;
+        const auto make = view == View::family ? olvane_layout_family : olvane_layout_pedigree;
+        answer->status = make(&host, idFrom(focus), &options, &layout);
+        answer->layout.reset(layout);
+        readRecords(*answer);
+        return answer.release();
+    } catch (const std::bad_alloc&) {
+        return nullptr;
+    }
+}
+
+}  // namespace olvane::js
+
+using olvane::js::LayoutAnswer;
+
+OLVANE_EXPORT("set_options")
+void setOptions(float nodeWidth, float nodeHeight, float horzPadding, float vertPadding, float spouseLineStep,
+                float lineInset, std::uint32_t shown, std::int32_t generations, std::int32_t flagDepth) {
+    olvane::js::optionsToUse = {
+        {nodeWidth, nodeHeight, horzPadding, vertPadding, spouseLineStep, lineInset},
+        shown,
+        generations,
+        flagDepth};
+}
+
+OLVANE_EXPORT("layout_host") LayoutAnswer* layoutHost(int view, double focus) {
+    return olvane::js::layoutAnswer(olvane::js::hostOfJavaScript(), static_cast<olvane::js::View>(view), focus,
+                                    olvane::js::nextOptions());
+}
+
+OLVANE_EXPORT("answer_status") int answerStatus(const LayoutAnswer* answer) {
+    return answer->status;
+}
+
+OLVANE_EXPORT("answer_text") const char* answerText(const LayoutAnswer* answer) {
+    const char* text = "";
+    if (answer->layout) olvane_layout_text(answer->layout.get(), &text, nullptr);
+    return text;
+}
+
+OLVANE_EXPORT("answer_numbers") const std::int32_t* answerNumbers(const LayoutAnswer* answer) {
+    return answer->numbers.data();
+}
+
+OLVANE_EXPORT("answer_count") std::size_t answerCount(const LayoutAnswer* answer) {
+    return answer->numbers.size();
+}
+
+OLVANE_EXPORT("answer_free") void answerFree(LayoutAnswer* answer) {
+    delete answer;
+}
+
+OLVANE_EXPORT("status_text") const char* statusText(int status) {
+    return olvane_status_text(static_cast<olvane_status>(status));
+}
+
+OLVANE_EXPORT("version") const char* version() {
+    return olvane_version();
+}

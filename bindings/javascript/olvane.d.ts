@@ -1,0 +1,235 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+/**
+ * Family trees in JavaScript: which relatives of a person are shown, and where each box and line stands.
+ *
+ * A host is any object with the eight methods of Host. One call is one whole layout:
+ *
+ *     const olvane = await loadOlvane();
+ *     for (const record of olvane.layout(host, 17)) drawBox(record.id, record.x, record.y);
+ *
+ * Units are points; x grows right, y grows down, and (x, y) is the upper-left corner of a box. The size of a box
+ * is that of the options, 55 by 80 unless told otherwise.
+ */
+
+/** The answer for a parent whom the host does not know; null and undefined say the same. */
+export const PERSON_NOT_FOUND: number;
+
+/**
+ * What a host answers. Ids are the host's own, whole numbers of 1 and more for real persons; only their low 32
+ * bits count. The methods are asked many times for the same person, since no answer is kept, and must agree with
+ * themselves within one layout. A method may throw: the layout then ends with HostError.
+ */
+export interface Host {
+    fatherOf(person: number): number | null | undefined;
+    motherOf(person: number): number | null | undefined;
+    /** In the order of drawing. */
+    spousesOf(person: number): Iterable<number>;
+    childrenOf(person: number): Iterable<number>;
+    /** Whether spouse is the preferred one of person. */
+    isPreferredSpouse(person: number, spouse: number): boolean;
+    isDead(person: number): boolean;
+    /** The date of birth, asked of children, or another date, asked of spouses: any form, empty if not known. */
+    dateOf(person: number, isBirth: boolean): string;
+    /** 0 is male; any other number counts as female. */
+    sexOf(person: number): number;
+}
+
+/** Relatives that a family view shows: bits to be added up. */
+export const Shown: {
+    readonly auntsUncles: 0x01;
+    /** Needs aunts and uncles. */
+    readonly cousins: 0x02;
+    readonly siblings: 0x04;
+    readonly siblingSpouses: 0x08;
+    readonly niecesNephews: 0x10;
+    readonly grandchildren: 0x20;
+    readonly greatGrandparents: 0x40;
+    readonly spousesOfChildren: 0x80;
+    readonly all: 0xff;
+};
+
+/** The sizes of the drawing, in points. All are finite. */
+export interface Sizes {
+    /** Of one person's box; 55. */
+    nodeWidth: number;
+    /** Of one person's box; 80. */
+    nodeHeight: number;
+    /** Gap between boxes of a row; 25. */
+    horzPadding: number;
+    /** Gap between generations; 30. */
+    vertPadding: number;
+    /** Between the stacked lines of one person's marriages; 10. */
+    spouseLineStep: number;
+    /** Of a marriage line from a box's left edge, read by the pedigree alone; 0. */
+    lineInset: number;
+}
+
+export interface Options {
+    /** family: relatives above, beside and below. pedigree: ancestors, lying sideways. */
+    view?: "family" | "pedigree";
+    sizes?: Partial<Sizes>;
+    /** Family view: bits of Shown; all of them if not given. */
+    shown?: number;
+    /** Pedigree: columns, the focus's own included; 5. A full ancestry of n columns is 2 ** n - 1 boxes. */
+    generations?: number;
+    /** Pedigree: generations, the focus's own included, in which partners off the chart raise the flag; 4. */
+    flagDepth?: number;
+}
+
+/** A straight piece of a line, in points. */
+export interface Segment {
+    readonly x1: number;
+    readonly y1: number;
+    readonly x2: number;
+    readonly y2: number;
+}
+
+/** One box, and the lines that hang from it. One person may stand in several boxes, and segments may repeat. */
+export interface LayoutRecord {
+    /** Negative for an add-node: an empty box where the host knows no parent. */
+    readonly id: number;
+    readonly x: number;
+    readonly y: number;
+    readonly hasHiddenRelatives: boolean;
+    readonly kind: "person" | "missingFather" | "missingMother";
+    /** The person whose parent is missing, for an add-node; else null. */
+    readonly child: number | null;
+    readonly segments: readonly Segment[];
+}
+
+/** A layout that did not come to its end. text and records are what was laid out before, often nothing. */
+export class LayoutError extends Error {
+    readonly status:
+        | "invalidArgument"
+        | "invalidPerson"
+        | "hostFailed"
+        | "layoutFailed"
+        | "outOfMemory"
+        | "nestedCall";
+    readonly text: string;
+    readonly records: readonly LayoutRecord[];
+}
+
+/** A method of the host threw. What it threw is the cause. */
+export class HostError extends LayoutError {
+    readonly cause: unknown;
+}
+
+/** A file that is no GEDCOM file, or holds no person. */
+export class GedcomError extends Error {}
+
+export type Sex = "male" | "female" | "other";
+
+/** A date as a file gives it. year is 0 where it could not be read; there is no year 0 else, and 44 B.C. is -44. */
+export interface GedcomDate {
+    readonly written: string;
+    readonly year: number;
+    /** 1 to 12, and 0 for not given. */
+    readonly month: number;
+    /** 1 to 31, and 0 for not given. */
+    readonly day: number;
+    readonly mark: "exact" | "about" | "before" | "after" | "between";
+    /** The later year of a range; 0 without one. */
+    readonly lastYear: number;
+    /** The year for a person to read: "1819", "~1819", "<1819", ">1819", "1819-1825", "44 BC". */
+    readonly shown: string;
+}
+
+/** Something that a file tells of a person or a couple. */
+export interface Fact {
+    /** The file's own tag: BIRT, DEAT, OCCU, RESI, MARR, DIV and so on. */
+    readonly tag: string;
+    /** What stands behind the tag, or the TYPE below it; often empty. */
+    readonly value: string;
+    readonly date: GedcomDate | null;
+    readonly place: string;
+}
+
+/** Persons and families count from 1 in the order of the file; 0 is nobody. */
+export interface Person {
+    readonly id: number;
+    /** Without its @; empty if the record has none. */
+    readonly xref: string;
+    /** The whole name for a person to read; empty where the file gives none. */
+    readonly name: string;
+    readonly given: string;
+    readonly surname: string;
+    /** All the names of the person, the first one included. */
+    readonly names: readonly string[];
+    readonly sex: Sex;
+    readonly dead: boolean;
+    readonly birth: GedcomDate | null;
+    readonly death: GedcomDate | null;
+    readonly father: number;
+    readonly mother: number;
+    /** The first is the preferred one. */
+    readonly spouses: readonly number[];
+    readonly children: readonly number[];
+    readonly parentFamilies: readonly ParentFamily[];
+    /** Families of the person's own, in the order of the file. */
+    readonly coupleFamilies: readonly number[];
+}
+
+export interface ParentFamily {
+    readonly family: number;
+    readonly pedigree: "notGiven" | "birth" | "adopted" | "foster" | "sealing" | "other";
+}
+
+export interface Family {
+    readonly id: number;
+    readonly husband: number;
+    readonly wife: number;
+    readonly children: readonly number[];
+    readonly married: boolean;
+    readonly divorced: boolean;
+    readonly marriage: GedcomDate | null;
+}
+
+/** Something wrong or odd in a file. */
+export interface Diagnostic {
+    /** From 1; 0 where no line can be named. */
+    readonly line: number;
+    readonly severity: "error" | "warning" | "note";
+    readonly message: string;
+    readonly hint: string;
+}
+
+/** A GEDCOM file that has been read. Memory outside of JavaScript is held until close. */
+export class GedcomFile {
+    /** persons[0] is person 1. */
+    readonly persons: readonly Person[];
+    readonly families: readonly Family[];
+    readonly diagnostics: readonly Diagnostic[];
+    readonly name: string;
+    /** How the bytes were read: "UTF-8", "UTF-16LE", "ANSEL", "windows-1252" and so on. */
+    readonly encoding: string;
+    /** As written: "5.5.1", "7.0"; empty if not given. */
+    readonly version: string;
+    /** Everything that the file tells of a person, in its order. */
+    factsOfPerson(id: number): readonly Fact[];
+    factsOfFamily(id: number): readonly Fact[];
+    /** As Olvane.layout, with the file as the host. */
+    layout(focus: number, options?: Options): LayoutRecord[];
+    layoutText(focus: number, options?: Options): string;
+    /** Gives the memory back; nothing can be asked afterwards but what was read out before. */
+    close(): void;
+}
+
+export class Olvane {
+    /** "MAJOR.MINOR.PATCH". */
+    readonly version: string;
+    /** One record for each box, in the order of the walk. Throws LayoutError. */
+    layout(host: Host, focus: number, options?: Options): LayoutRecord[];
+    /** The engine's own line of text. Throws LayoutError. */
+    layoutText(host: Host, focus: number, options?: Options): string;
+    /** Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Throws GedcomError. */
+    readGedcom(bytes: Uint8Array, name?: string): GedcomFile;
+}
+
+/**
+ * Makes the engine ready. module is the compiled WebAssembly module or its bytes; without it, olvane.wasm is read
+ * from beside this file.
+ */
+export function loadOlvane(module?: WebAssembly.Module | BufferSource): Promise<Olvane>;

@@ -1,0 +1,49 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What a JavaScript host loads; olvane.d.ts tells what everything means.
+
+import { readGedcom } from "./gedcom.mjs";
+import { Instance } from "./instance.mjs";
+import { runLayout } from "./layout.mjs";
+
+export { GedcomError, HostError, LayoutError } from "./errors.mjs";
+export { GedcomFile } from "./gedcom.mjs";
+export { PERSON_NOT_FOUND, Shown } from "./values.mjs";
+
+export class Olvane {
+    #instance;
+
+    constructor(instance) {
+        this.#instance = instance;
+        this.version = instance.text(instance.exports.version());
+    }
+
+    layout(host, focus, options = {}) {
+        return this.#run(host, focus, options).records;
+    }
+
+    layoutText(host, focus, options = {}) {
+        return this.#run(host, focus, options).text;
+    }
+
+    readGedcom(bytes, name = "family.ged") {
+        return readGedcom(this.#instance, bytes, name);
+    }
+
+    #run(host, focus, options) {
+        return runLayout(this.#instance, host, options, (view) => this.#instance.exports.layout_host(view, focus));
+    }
+}
+
+// Node reads files otherwise than a browser; the name stands apart so that no bundler looks for it.
+async function moduleBesideThisFile() {
+    const place = new URL("olvane.wasm", import.meta.url);
+    if (place.protocol !== "file:") return (await fetch(place)).arrayBuffer();
+    const files = "node:fs/promises";
+    return (await import(files)).readFile(place);
+}
+
+export async function loadOlvane(module) {
+    return new Olvane(await Instance.of(module ?? (await moduleBesideThisFile())));
+}

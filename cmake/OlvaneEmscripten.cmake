@@ -1,0 +1,16 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+
+# What a build for a browser needs. Boost is headers alone, and lies among the machine's own headers, which are for
+# another machine than WebAssembly's; so a folder that holds nothing but a link to it stands for it.
+find_path(OLVANE_BOOST_INCLUDE_DIR boost/version.hpp PATHS /usr/include /usr/local/include REQUIRED
+          NO_CMAKE_FIND_ROOT_PATH)
+set(boost_alone ${CMAKE_BINARY_DIR}/boost-alone)
+file(MAKE_DIRECTORY ${boost_alone})
+file(CREATE_LINK ${OLVANE_BOOST_INCLUDE_DIR}/boost ${boost_alone}/boost SYMBOLIC)
+add_library(Boost::headers INTERFACE IMPORTED GLOBAL)
+target_include_directories(Boost::headers INTERFACE ${boost_alone})
+
+# Exceptions as WebAssembly has them: smaller and faster than those by way of JavaScript.
+add_compile_options(-fwasm-exceptions)
+add_link_options(-fwasm-exceptions)
