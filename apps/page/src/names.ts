@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Names and dates of a person as words on the page.
+
+import type { GedcomDate, Person } from "olvane";
+import type { Messages } from "./messages";
+
+export type Direction = "ltr" | "rtl";
+
+/** The name to show, and a word for one who has none. */
+export function nameOf(person: Person, messages: Messages): string {
+    return person.name || messages.unknownName;
+}
+
+/** "12 February 1809", "before 1820"; what the file says where the date could not be read. */
+export function dateText(date: GedcomDate, messages: Messages): string {
+    return textOf(date, date.month, date.day, messages);
+}
+
+/** "1809–1882", "about 1809 – 1882", "born 1809", "died 1882"; empty where neither year is known. */
+export function yearsOf(person: Person, messages: Messages): string {
+    const born = yearText(person.birth, messages);
+    const died = yearText(person.death, messages);
+    if (born === "" || died === "") {
+        if (born !== "") return messages.dates.born(born);
+        return died === "" ? "" : messages.dates.died(died);
+    }
+    const isPlain = person.birth?.mark === "exact" && person.death?.mark === "exact";
+    return isPlain ? `${born}–${died}` : `${born} – ${died}`;
+}
+
+function yearText(date: GedcomDate | null, messages: Messages): string {
+    return date && date.year !== 0 ? textOf(date, 0, 0, messages) : "";
+}
+
+// Of the end of a range nothing but the year is known, so a range is one of years.
+function textOf(date: GedcomDate, month: number, day: number, messages: Messages): string {
+    if (date.year === 0) return date.written;
+    const { dates } = messages;
+    if (date.mark !== "between") return dates.marked(date.mark, dates.day(date.year, month, day), "");
+    if (date.lastYear === 0 || date.lastYear === date.year) return dates.day(date.year, 0, 0);
+    return dates.marked("between", dates.day(date.year, 0, 0), dates.day(date.lastYear, 0, 0));
+}
+
+// Hebrew, Arabic, Syriac, Thaana, N'Ko and their neighbours, the forms for printing, the old scripts of the east,
+// and the two marks of direction themselves.
+const kRightToLeft = /[\u0590-\u08ff\u200f\ufb1d-\ufdff\ufe70-\ufeff\u{10800}-\u{10fff}\u{1e800}-\u{1efff}]/u;
+const kStrong = /[\p{L}\u200e\u200f\u061c]/u;
+
+/** By the first letter; left to right for a text without letters. */
+export function directionOf(text: string): Direction {
+    const strong = kStrong.exec(text);
+    return strong && kRightToLeft.test(strong[0]) ? "rtl" : "ltr";
+}

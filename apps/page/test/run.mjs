@@ -1,0 +1,32 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Bundles each test beside this file and runs them all with node's own runner: node test/run.mjs
+
+import { spawnSync } from "node:child_process";
+import { mkdtempSync, readdirSync, rmSync } from "node:fs";
+import { tmpdir } from "node:os";
+import { dirname, join } from "node:path";
+import { fileURLToPath } from "node:url";
+import { build } from "esbuild";
+
+const here = dirname(fileURLToPath(import.meta.url));
+const tests = readdirSync(here).filter((name) => name.endsWith(".test.ts"));
+const folder = mkdtempSync(join(tmpdir(), "olvane-page-test-"));
+try {
+    await build({
+        entryPoints: tests.map((name) => join(here, name)),
+        outdir: folder,
+        outExtension: { ".js": ".mjs" },
+        bundle: true,
+        format: "esm",
+        platform: "node",
+        sourcemap: "inline",
+        logLevel: "warning",
+    });
+    const files = tests.map((name) => join(folder, name.replace(/\.ts$/, ".mjs")));
+    const run = spawnSync(process.execPath, ["--enable-source-maps", "--test", ...files], { stdio: "inherit" });
+    process.exitCode = run.status ?? 1;
+} finally {
+    rmSync(folder, { recursive: true, force: true });
+}
