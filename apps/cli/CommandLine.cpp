@@ -61,15 +61,19 @@ void addFocus(CLI::App& command, std::string& focus) {
         ->type_name("WHO");
 }
 
-void addView(CLI::App& command, LayoutRequest& request) {
+void addViewAlone(CLI::App& command, View& view) {
     static const std::map<std::string, View> kViews = {{"family", View::family},
                                                        {"pedigree", View::pedigree}};
     command
         .add_option(
-            "--view", request.view,
+            "--view", view,
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways")
         ->transform(CLI::CheckedTransformer(kViews))
         ->type_name("family|pedigree");
+}
+
+void addView(CLI::App& command, LayoutRequest& request) {
+    addViewAlone(command, request.view);
     command
         .add_option(
             "--generations", request.generations,
@@ -121,6 +125,7 @@ public:
         addDraw();
         addBatch();
         addCheck();
+        addPage();
     }
 
     int run(int argc, char** argv) {
@@ -136,6 +141,7 @@ public:
         if (layout_->parsed()) return runLayout(completedLayoutOptions());
         if (batch_->parsed()) return runBatch(batchOptions_);
         if (check_->parsed()) return runCheck(completedCheckOptions());
+        if (page_->parsed()) return runPage(pageOptions_);
         return runDraw(completedDrawOptions());
     }
 
@@ -145,7 +151,7 @@ private:
         const std::vector<std::string> strangers = app_.remaining();
         if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
             return "there is no command '" + strangers.front() +
-                   "', but people, layout, draw, batch and check; 'olvane --help' tells more";
+                   "', but people, layout, draw, batch, check and page; 'olvane --help' tells more";
         }
         return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' tells more";
     }
@@ -175,6 +181,7 @@ private:
     }
 
     View viewOf(const CLI::App& command) const {
+        if (&command == page_) return pageOptions_.view;
         if (&command == layout_) return layoutOptions_.request.view;
         if (&command == draw_) return drawOptions_.request.view;
         return &command == batch_ ? batchOptions_.request.view : checkOptions_.request.view;
@@ -271,6 +278,38 @@ private:
         addFamilySwitches(*check_, checkOptions_.request);
     }
 
+    void addPage() {
+        page_ = app_.add_subcommand("page",
+                                    "Write a page to explore the family in any browser, without a network");
+        page_
+            ->add_option("FILE", pageOptions_.file,
+                         "GEDCOM file: .ged, or a .gdz archive; without one the page asks for it when opened")
+            ->type_name("");
+        page_->add_option("-o,--output", pageOptions_.output, "Page to write; - for the standard output")
+            ->required()
+            ->type_name("OUT.html");
+        CLI::Option* focus =
+            page_
+                ->add_option(
+                    "--focus", pageOptions_.focus,
+                    "The person in the middle when the page opens: an xref, a number of 'olvane people' "
+                    "or words of the name; the page's own choice when not given")
+                ->type_name("WHO");
+        addViewAlone(*page_, pageOptions_.view);
+        page_
+            ->add_option("--title", pageOptions_.title,
+                         "Title of the page; made of the focus's name when not given")
+            ->type_name("TEXT");
+        addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year);
+        needsFile(focus);
+        needsFile(page_->get_option("--hide-living"));
+        needsFile(page_->get_option("--title"));
+        needsFile(page_->get_option("--view"));
+    }
+
+    // Without a family these would change nothing.
+    void needsFile(CLI::Option* option) { option->needs(page_->get_option("FILE")); }
+
     LayoutOptions completedLayoutOptions() const {
         LayoutOptions options = layoutOptions_;
         options.json = layoutFormat_ == "json";
@@ -301,12 +340,14 @@ private:
     CLI::App* draw_ = nullptr;
     CLI::App* batch_ = nullptr;
     CLI::App* check_ = nullptr;
+    CLI::App* page_ = nullptr;
     PeopleOptions peopleOptions_;
     LayoutOptions layoutOptions_;
     std::string layoutFormat_ = "text";
     DrawOptions drawOptions_;
     BatchOptions batchOptions_;
     CheckOptions checkOptions_;
+    PageOptions pageOptions_;
 };
 
 }  // namespace

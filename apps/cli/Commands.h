@@ -52,10 +52,21 @@ struct CheckOptions {
     LayoutRequest request;
 };
 
+struct PageOptions {
+    std::string file;  // empty for a page without a family
+    std::string focus;
+    std::string output;
+    std::string title;  // empty for one made of the focus's name
+    View view = View::family;
+    bool hideLiving = false;
+    int year = 0;  // as with DrawOptions
+};
+
 int runPeople(const PeopleOptions& options);
 int runLayout(const LayoutOptions& options);
 int runDraw(const DrawOptions& options);
 int runBatch(const BatchOptions& options);
 int runCheck(const CheckOptions& options);
+int runPage(const PageOptions& options);
 
 }  // namespace olvane::cli

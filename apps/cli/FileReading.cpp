@@ -40,9 +40,10 @@ void report(const gedcom::GedcomData& data) {
          " more; 'olvane check " + data.file() + "' tells them all");
 }
 
-gedcom::GedcomData read(const std::string& path, std::size_t diagnosticsPerKind) {
+gedcom::GedcomData read(const std::string& path, bool facts = false) {
     gedcom::ReadOptions options;
-    options.diagnosticsPerKind = diagnosticsPerKind;
+    options.diagnosticsPerKind = kCounted;
+    options.facts = facts;
     try {
         return gedcom::readGedcomFile(path, options);
     } catch (const gedcom::GedcomError& error) {
@@ -53,13 +54,19 @@ gedcom::GedcomData read(const std::string& path, std::size_t diagnosticsPerKind)
 }  // namespace
 
 gedcom::GedcomData readFile(const std::string& path) {
-    gedcom::GedcomData data = read(path, kCounted);
+    gedcom::GedcomData data = read(path);
+    report(data);
+    return data;
+}
+
+gedcom::GedcomData readFileWithFacts(const std::string& path) {
+    gedcom::GedcomData data = read(path, true);
     report(data);
     return data;
 }
 
 gedcom::GedcomData readFileQuietly(const std::string& path) {
-    return read(path, kCounted);
+    return read(path);
 }
 
 }  // namespace olvane::cli

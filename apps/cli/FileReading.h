@@ -14,7 +14,10 @@ namespace olvane::cli {
 // Fails: throws UsageError with a hint where there is nothing to read.
 gedcom::GedcomData readFile(const std::string& path);
 
-// The same, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
+// As readFile, and keeps the facts of persons and couples.
+gedcom::GedcomData readFileWithFacts(const std::string& path);
+
+// As readFile, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
 gedcom::GedcomData readFileQuietly(const std::string& path);
 
 }  // namespace olvane::cli

@@ -177,8 +177,7 @@ OLVANE_EXPORT("gedcom_open") OpenFile* gedcomOpen(const char* bytes, std::size_t
     try {
         gedcom::ReadOptions options;
         options.facts = true;
-        return std::make_unique<OpenFile>(
-                   gedcom::readGedcomBytes(std::string(bytes, length), name, options))
+        return std::make_unique<OpenFile>(gedcom::readGedcomBytes(std::string(bytes, length), name, options))
             .release();
     } catch (const std::exception& error) {
         js::lastText = error.what();

@@ -70,16 +70,15 @@ using olvane::js::LayoutAnswer;
 OLVANE_EXPORT("set_options")
 void setOptions(float nodeWidth, float nodeHeight, float horzPadding, float vertPadding, float spouseLineStep,
                 float lineInset, std::uint32_t shown, std::int32_t generations, std::int32_t flagDepth) {
-    olvane::js::optionsToUse = {
-        {nodeWidth, nodeHeight, horzPadding, vertPadding, spouseLineStep, lineInset},
-        shown,
-        generations,
-        flagDepth};
+    olvane::js::optionsToUse = {{nodeWidth, nodeHeight, horzPadding, vertPadding, spouseLineStep, lineInset},
+                                shown,
+                                generations,
+                                flagDepth};
 }
 
 OLVANE_EXPORT("layout_host") LayoutAnswer* layoutHost(int view, double focus) {
-    return olvane::js::layoutAnswer(olvane::js::hostOfJavaScript(), static_cast<olvane::js::View>(view), focus,
-                                    olvane::js::nextOptions());
+    return olvane::js::layoutAnswer(olvane::js::hostOfJavaScript(), static_cast<olvane::js::View>(view),
+                                    focus, olvane::js::nextOptions());
 }
 
 OLVANE_EXPORT("answer_status") int answerStatus(const LayoutAnswer* answer) {

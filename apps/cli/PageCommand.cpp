@@ -1,0 +1,88 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Writes a page that opens in any browser, with the engine inside and a family if one is named. The family goes in
+// as a GEDCOM text of its own making, so that nothing is in the page that the page does not show.
+
+#include <cli/Commands.h>
+
+#include <cstddef>
+
+#include <olvane/gedcom/GedcomWriter.h>
+
+#include <cli/FileReading.h>
+#include <cli/FocusChoice.h>
+#include <cli/LivingPersons.h>
+#include <cli/OutputFile.h>
+#include <cli/PageFamily.h>
+#include <cli/PageTemplate.h>
+#include <cli/UsageError.h>
+
+namespace olvane::cli {
+
+namespace {
+
+// A browser holds a page and what is unpacked from it several times over.
+constexpr std::size_t kMostBytes = std::size_t{64} << 20;
+// People do not open a page with more than this in it; a program reads the file itself.
+constexpr std::size_t kMostPersons = 200000;
+
+void refuseTooLarge(const gedcom::GedcomData& data, std::size_t bytes) {
+    if (data.personCount() <= kMostPersons && bytes <= kMostBytes) return;
+    throw UsageError(
+        data.file() + ": " + std::to_string(data.personCount()) + " persons and " +
+        std::to_string(bytes >> 20) +
+        " MiB are more than a page can hold, which is 200,000 persons and 64 MiB; take a part of the "
+        "family, or draw pictures");
+}
+
+std::string fileNameOf(const std::string& path) {
+    return path.substr(path.find_last_of('/') + 1);
+}
+
+std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus,
+                    const gedcom::WriteOptions& hiding) {
+    if (focus == 0 || (!hiding.hidden.empty() && hiding.hidden[focus - 1])) return "Family tree";
+    const std::string name = gedcom::displayName(data.firstName(focus));
+    return name.empty() ? "Family tree" : "Family of " + name;
+}
+
+// By what the page finds the person again: the text is read there, and its persons are those of the data.
+std::string focusOf(gedcom::PersonId focus) {
+    return focus == 0 ? "" : std::to_string(focus);
+}
+
+PageFamily familyOf(const PageOptions& options) {
+    const gedcom::GedcomData data = readFileWithFacts(options.file);
+    gedcom::WriteOptions hiding;
+    if (options.hideLiving) {
+        hiding.hidden = livingPersons(data, options.year != 0 ? options.year : currentYear());
+    }
+    const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
+    PageFamily family;
+    family.gedcom = gedcom::writeGedcom(data, hiding);
+    refuseTooLarge(data, family.gedcom.size());
+    family.name = fileNameOf(options.file);
+    family.title = options.title.empty() ? titleOf(data, focus, hiding) : options.title;
+    family.focus = focusOf(focus);
+    family.view = options.view == View::pedigree ? "pedigree" : "family";
+    family.livingHidden = options.hideLiving;
+    return family;
+}
+
+}  // namespace
+
+int runPage(const PageOptions& options) {
+    if (pageTemplate().empty()) {
+        throw UsageError(
+            "this olvane was built without the page; install emscripten, nodejs and npm, and build it again");
+    }
+    if (options.file.empty()) {
+        writeOutput(options.output, pageTemplate());
+    } else {
+        writeOutput(options.output, pageWith(pageTemplate(), familyOf(options)));
+    }
+    return 0;
+}
+
+}  // namespace olvane::cli

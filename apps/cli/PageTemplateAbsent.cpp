@@ -1,0 +1,14 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Stands in for the page where it could not be built, for want of a compiler for browsers.
+
+#include <cli/PageTemplate.h>
+
+namespace olvane::cli {
+
+std::string_view pageTemplate() {
+    return {};
+}
+
+}  // namespace olvane::cli
