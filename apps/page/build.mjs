@@ -1,0 +1,69 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Builds the page: one HTML file that holds its code, its looks and the engine, and may load nothing else.
+//
+//     node build.mjs --wasm olvane.wasm --out page.html
+
+import { createHash } from "node:crypto";
+import { readFile, writeFile } from "node:fs/promises";
+import { fileURLToPath } from "node:url";
+import { parseArgs } from "node:util";
+import { gzipSync } from "node:zlib";
+import { build, transform } from "esbuild";
+
+const here = (path) => fileURLToPath(new URL(path, import.meta.url));
+
+const { values } = parseArgs({ options: { wasm: { type: "string" }, out: { type: "string" } } });
+if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
+
+async function bundledScript() {
+    const { outputFiles } = await build({
+        entryPoints: [here("src/main.ts")],
+        bundle: true,
+        minify: true,
+        write: false,
+        format: "iife",
+        target: ["es2022"],
+        charset: "utf8",
+        legalComments: "none",
+        // The engine lies in the page, not beside it.
+        define: { "import.meta.url": '"data:,"' },
+        alias: {
+            olvane: here("../../bindings/javascript/olvane.mjs"),
+            // The page moves things by itself, so most of what zooming could do beside that stays out.
+            "d3-transition": here("src/scene/noTransition.ts"),
+            "d3-interpolate": here("src/scene/noInterpolation.ts"),
+        },
+    });
+    // What would end the element early may stand in a script only as an escape.
+    return outputFiles[0].text.trim().replaceAll("</script", "<\\/script");
+}
+
+async function minifiedStyle() {
+    const { code } = await transform(await readFile(here("src/page.css"), "utf8"), { loader: "css", minify: true });
+    return code.trim();
+}
+
+const hashOf = (text) => "'sha256-" + createHash("sha256").update(text).digest("base64") + "'";
+
+// No network at all: what is not listed is refused.
+function policyOf(script, style) {
+    return [
+        "default-src 'none'",
+        `script-src ${hashOf(script)} 'wasm-unsafe-eval'`,
+        `style-src ${hashOf(style)}`,
+        "img-src data: blob:",
+        "connect-src 'none'",
+        "base-uri 'none'",
+        "form-action 'none'",
+    ].join("; ");
+}
+
+const [script, style] = await Promise.all([bundledScript(), minifiedStyle()]);
+const engine = gzipSync(await readFile(values.wasm), { level: 9 }).toString("base64");
+const parts = { policy: policyOf(script, style), style, script, engine };
+const template = await readFile(here("src/page.html"), "utf8");
+const page = template.replace(/\{\{(\w+)\}\}/g, (_, name) => parts[name]);
+await writeFile(values.out, page);
+console.log(`${values.out}: ${page.length} characters (script ${script.length}, style ${style.length}, engine ${engine.length})`);

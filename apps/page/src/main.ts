@@ -1,0 +1,25 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Starts the engine, then the page, then the family that came with it.
+
+import { App } from "./App";
+import { embeddedFamily, startEngine } from "./engine/engine";
+import { uiMessagesFor } from "./messages/ui";
+import { html } from "./ui/dom";
+
+async function start(): Promise<void> {
+    const root = document.getElementById("app")!;
+    const { errors } = uiMessagesFor(navigator.language);
+    try {
+        const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
+        const app = new App(root, engine);
+        if (family) await app.openEmbedded(family);
+    } catch (error) {
+        const reason = typeof DecompressionStream === "undefined" ? errors.tooNew : errors.engine;
+        const detail = error instanceof Error ? error.message : String(error);
+        root.replaceChildren(html("p", { class: "fatal", role: "alert" }, reason, html("small", {}, detail)));
+    }
+}
+
+void start();

@@ -1,0 +1,121 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The texts of the page's own parts, in each language that it speaks.
+
+import type { RelativeName } from "../view/ViewState";
+import { uiGerman } from "./ui.de";
+import { uiEnglish } from "./ui.en";
+
+export interface UiMessages {
+    readonly language: string;
+    readonly languageName: string;
+    readonly appTitle: string;
+    readonly welcome: {
+        readonly title: string;
+        readonly text: string;
+        readonly drop: string;
+        readonly choose: string;
+        readonly kinds: string;
+        readonly privacy: string;
+        readonly dropNow: string;
+        readonly reading: (name: string) => string;
+    };
+    readonly search: { readonly label: string; readonly none: string; readonly count: (n: number) => string };
+    readonly views: { readonly label: string; readonly family: string; readonly pedigree: string };
+    readonly back: string;
+    readonly forward: string;
+    readonly zoomIn: string;
+    readonly zoomOut: string;
+    readonly fit: string;
+    readonly home: string;
+    readonly options: string;
+    readonly relatives: string;
+    readonly relativeNames: Readonly<Record<RelativeName, string>>;
+    readonly generations: string;
+    readonly fewer: string;
+    readonly more: string;
+    readonly look: string;
+    readonly theme: string;
+    readonly themes: { readonly auto: string; readonly light: string; readonly dark: string; readonly contrast: string };
+    readonly languageLabel: string;
+    readonly kinshipInBoxes: string;
+    readonly file: string;
+    readonly openFile: string;
+    readonly saveSvg: string;
+    readonly savePng: string;
+    readonly print: string;
+    readonly saved: (name: string) => string;
+    readonly savedSmaller: (name: string, percent: number) => string;
+    readonly pictureFailed: string;
+    readonly keys: string;
+    readonly keyList: readonly (readonly [string, string])[];
+    readonly close: string;
+    readonly legend: string;
+    readonly legendItems: {
+        readonly male: string;
+        readonly female: string;
+        readonly other: string;
+        readonly focus: string;
+        readonly hidden: string;
+        readonly missing: string;
+        readonly repeated: string;
+    };
+    readonly treeLabel: (name: string, view: string) => string;
+    readonly treeHint: string;
+    readonly living: string;
+    readonly missingFather: string;
+    readonly missingMother: string;
+    readonly missingOf: (what: string, child: string) => string;
+    readonly hiddenCount: (n: number) => string;
+    readonly severalBoxes: (n: number) => string;
+    readonly nextBox: string;
+    readonly focusNow: (name: string, boxes: number) => string;
+    readonly inFocus: string;
+    readonly relatedTo: (kinship: string, focus: string) => string;
+    readonly notRelated: (focus: string) => string;
+    readonly makeFocus: string;
+    readonly panel: {
+        readonly label: string;
+        readonly toggle: string;
+        readonly facts: string;
+        readonly parents: string;
+        readonly siblings: string;
+        readonly partners: string;
+        readonly children: string;
+        readonly otherNames: string;
+        readonly noFacts: string;
+        readonly unknownPartner: string;
+        readonly married: string;
+        readonly divorced: string;
+    };
+    readonly pedigrees: { readonly adopted: string; readonly foster: string; readonly sealing: string };
+    readonly diagnostics: {
+        readonly title: string;
+        readonly button: (n: number) => string;
+        readonly summary: (persons: number, problems: number) => string;
+        readonly line: (n: number) => string;
+        readonly severities: { readonly error: string; readonly warning: string; readonly note: string };
+        readonly furtherOnes: (n: number) => string;
+    };
+    readonly errors: {
+        readonly notGedcom: (name: string) => string;
+        readonly hint: string;
+        readonly noPersons: string;
+        readonly tooNew: string;
+        readonly archive: string;
+        readonly engine: string;
+        readonly layout: string;
+        readonly dismiss: string;
+    };
+    readonly livingHidden: string;
+    readonly personCount: (n: number) => string;
+}
+
+export const uiLanguages: readonly UiMessages[] = [uiEnglish, uiGerman];
+
+// For a tag such as "de-AT"; English where the language is not spoken.
+export function uiMessagesFor(tag: string): UiMessages {
+    const language = tag.toLowerCase().split("-")[0];
+    return uiLanguages.find((messages) => messages.language === language) ?? uiEnglish;
+}

@@ -1,0 +1,35 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Puts the whole picture on one sheet of paper, lying or standing as suits it, in colours made for paper.
+
+import { html } from "../ui/dom";
+import type { WholePicture } from "./pictureSvg";
+
+export class PrintSheet {
+    readonly element = html("div", { id: "print-sheet", "aria-hidden": "true" });
+    private orientation: CSSStyleSheet | null = null;
+
+    // draw makes the picture whenever the browser is about to print, or gives null when there is none.
+    constructor(draw: () => WholePicture | null) {
+        addEventListener("beforeprint", () => this.fill(draw()));
+        addEventListener("afterprint", () => this.empty());
+    }
+
+    private fill(whole: WholePicture | null): void {
+        this.empty();
+        if (!whole) return;
+        const { svg, width, height } = whole;
+        svg.setAttribute("width", "100%");
+        svg.setAttribute("height", "100%");
+        this.element.append(svg);
+        this.orientation = new CSSStyleSheet();
+        this.orientation.insertRule(`@page { size: ${width > height ? "landscape" : "portrait"}; margin: 10mm; }`);
+        document.adoptedStyleSheets = [...document.adoptedStyleSheets, this.orientation];
+    }
+
+    private empty(): void {
+        this.element.replaceChildren();
+        document.adoptedStyleSheets = document.adoptedStyleSheets.filter((sheet) => sheet !== this.orientation);
+    }
+}

@@ -1,0 +1,60 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Hands files to the browser's downloads, and turns a drawing into pixels.
+
+import { html } from "../ui/dom";
+import { svgText, type WholePicture } from "./pictureSvg";
+
+const kSharpness = 2; // px for a point
+const kMostSide = 12000; // px; beyond it some browsers hand out an empty canvas
+const kMostPixels = 100e6;
+
+export function saveFile(name: string, content: Blob): void {
+    const address = URL.createObjectURL(content);
+    const link = html("a", { href: address, download: name });
+    document.body.append(link);
+    link.click();
+    link.remove();
+    setTimeout(() => URL.revokeObjectURL(address), 60_000);
+}
+
+export function svgBlob(whole: WholePicture): Blob {
+    return new Blob([svgText(whole.svg)], { type: "image/svg+xml" });
+}
+
+export interface Pixels {
+    readonly blob: Blob;
+    // 1 for the full sharpness, less where that would be more than a browser can draw.
+    readonly part: number;
+}
+
+export async function pngOf(whole: WholePicture): Promise<Pixels> {
+    const { width, height } = whole;
+    const most = Math.min(kSharpness, kMostSide / Math.max(width, height), Math.sqrt(kMostPixels / (width * height)));
+    const canvas = html("canvas", { width: Math.max(1, Math.floor(width * most)), height: Math.max(1, Math.floor(height * most)) });
+    const pen = canvas.getContext("2d");
+    if (!pen) throw new Error("no canvas");
+    pen.drawImage(await imageOf(svgBlob(whole)), 0, 0, canvas.width, canvas.height);
+    const blob = await new Promise<Blob | null>((done) => canvas.toBlob(done, "image/png"));
+    if (!blob) throw new Error("no picture");
+    return { blob, part: Math.min(1, most / kSharpness) };
+}
+
+async function imageOf(blob: Blob): Promise<HTMLImageElement> {
+    const address = URL.createObjectURL(blob);
+    try {
+        const image = new Image();
+        image.src = address;
+        await image.decode();
+        return image;
+    } finally {
+        URL.revokeObjectURL(address);
+    }
+}
+
+// "darwin-wedgwood - Charles Darwin"; without what file systems refuse.
+export function fileNameOf(...parts: string[]): string {
+    const plain = parts.map((part) => part.replace(/[\\/:*?"<>|\p{Cc}\p{Cf}]+/gu, " ").replace(/\s+/g, " ").trim());
+    return plain.filter(Boolean).join(" - ").slice(0, 100) || "family";
+}

@@ -1,0 +1,168 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Where the picture stands on the screen: moved by hand, wheel, pinch and keys, or travelling to a place of its own.
+
+import { select } from "d3-selection";
+import { type D3ZoomEvent, zoom, zoomIdentity, type ZoomTransform } from "d3-zoom";
+import { prefersStillness } from "../ui/dom";
+import type { Rectangle } from "../view/SpatialGrid";
+
+// screen = world * k + (x, y), in CSS px.
+export interface Placing {
+    readonly k: number;
+    readonly x: number;
+    readonly y: number;
+}
+
+export interface Point {
+    readonly x: number;
+    readonly y: number;
+}
+
+const kLeastZoom = 0.02;
+const kMostZoom = 4;
+const kFitMargin = 28; // px
+const kTravelTime = 420; // ms
+const kButtonsWidth = 64; // px, of the buttons over the right edge
+const kWideWindow = 700; // px; a narrower one has no room to leave for them
+const kReadable = 0.6; // the least zoom at which names are read with ease
+const kUsualZoom = 0.85;
+
+export class Camera {
+    private readonly behaviour = zoom<SVGSVGElement, unknown>();
+    private readonly selection;
+    private travel = 0; // the frame that is asked for; 0 at rest
+
+    constructor(
+        private readonly surface: SVGSVGElement,
+        onMove: (placing: Placing) => void,
+    ) {
+        this.selection = select<SVGSVGElement, unknown>(surface);
+        this.behaviour
+            .scaleExtent([kLeastZoom, kMostZoom])
+            .clickDistance(6)
+            .on("zoom", (event: D3ZoomEvent<SVGSVGElement, unknown>) => {
+                if (event.sourceEvent) this.stop();
+                onMove(event.transform);
+            });
+        this.selection.call(this.behaviour).on("dblclick.zoom", null);
+    }
+
+    get placing(): Placing {
+        return (this.surface as unknown as { __zoom: ZoomTransform }).__zoom;
+    }
+
+    get size(): { width: number; height: number } {
+        return { width: this.surface.clientWidth || 1, height: this.surface.clientHeight || 1 };
+    }
+
+    // What is in sight, in world points.
+    window(placing: Placing = this.placing): Rectangle {
+        const { k, x, y } = placing;
+        const { width, height } = this.size;
+        return { left: -x / k, top: -y / k, right: (width - x) / k, bottom: (height - y) / k };
+    }
+
+    place(placing: Placing): void {
+        this.stop();
+        this.jump(placing);
+    }
+
+    travelTo(target: Placing, time = kTravelTime): void {
+        this.stop();
+        if (prefersStillness()) return this.jump(target);
+        const from = this.placing;
+        const start = performance.now();
+        const step = (now: number) => {
+            const part = Math.min(1, Math.max(0, now - start) / time);
+            this.travel = part < 1 ? requestAnimationFrame(step) : 0;
+            this.jump(between(from, target, eased(part), this.size));
+        };
+        this.travel = requestAnimationFrame(step);
+    }
+
+    stop(): void {
+        cancelAnimationFrame(this.travel);
+        this.travel = 0;
+    }
+
+    zoomBy(factor: number): void {
+        const { width, height } = this.size;
+        const { k, x, y } = this.placing;
+        const next = Math.min(kMostZoom, Math.max(kLeastZoom, k * factor));
+        const ratio = next / k;
+        this.travelTo({ k: next, x: width / 2 - (width / 2 - x) * ratio, y: height / 2 - (height / 2 - y) * ratio }, 180);
+    }
+
+    panBy(dx: number, dy: number): void {
+        const { k, x, y } = this.placing;
+        this.place({ k, x: x + dx, y: y + dy });
+    }
+
+    // The whole area in sight, no larger than life.
+    fitting(area: Rectangle, mostZoom = 1.15): Placing {
+        const { width, height } = this.size;
+        const aside = width > kWideWindow ? kButtonsWidth : 0;
+        const room = (size: number) => Math.max(40, size - 2 * kFitMargin);
+        const k = Math.max(
+            kLeastZoom,
+            Math.min(mostZoom, room(width - aside) / (area.right - area.left), room(height) / (area.bottom - area.top)),
+        );
+        const { x, y } = this.centring({ x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 }, k);
+        return { k, x: x - aside / 2, y };
+    }
+
+    // Where a picture begins: whole if it can be read so, else readable, with its middle in the window's middle and all
+    // of its height if there is room.
+    opening(area: Rectangle, middle: Point): Placing {
+        const whole = this.fitting(area);
+        if (whole.k >= kReadable) return whole;
+        const { height } = this.size;
+        const tall = (height - 2 * kFitMargin) / (area.bottom - area.top);
+        if (tall < kReadable) return this.centring(middle, kUsualZoom);
+        return this.centring({ x: middle.x, y: (area.top + area.bottom) / 2 }, Math.min(1, tall));
+    }
+
+    centring(point: Point, k: number): Placing {
+        const { width, height } = this.size;
+        return { k, x: width / 2 - point.x * k, y: height / 2 - point.y * k };
+    }
+
+    // The least move that brings an area into the window less a margin, in parts of the window's size.
+    including(area: Rectangle, margin: number, from: Placing = this.placing): Placing {
+        const { width, height } = this.size;
+        const { k } = from;
+        const x = nudged(from.x, area.left * k, area.right * k, width, margin * width);
+        const y = nudged(from.y, area.top * k, area.bottom * k, height, margin * height);
+        return { k, x, y };
+    }
+
+    private jump({ k, x, y }: Placing): void {
+        this.behaviour.transform(this.selection, zoomIdentity.translate(x, y).scale(k));
+    }
+}
+
+export function eased(part: number): number {
+    return part < 0.5 ? 4 * part ** 3 : 1 - (-2 * part + 2) ** 3 / 2;
+}
+
+// Zooms evenly, and keeps the middle of the window on a straight way.
+export function between(a: Placing, b: Placing, part: number, { width, height }: { width: number; height: number }): Placing {
+    const k = a.k * (b.k / a.k) ** part;
+    const middle = (from: number, to: number, size: number) => {
+        const start = (size / 2 - from) / a.k;
+        const end = (size / 2 - to) / b.k;
+        const share = a.k === b.k ? part : (1 / a.k - 1 / k) / (1 / a.k - 1 / b.k);
+        return size / 2 - (start + (end - start) * share) * k;
+    };
+    return { k, x: middle(a.x, b.x, width), y: middle(a.y, b.y, height) };
+}
+
+function nudged(offset: number, low: number, high: number, size: number, margin: number): number {
+    const room = Math.max(0, Math.min(margin, (size - (high - low)) / 2));
+    if (high - low > size) return offset + low < 0 && offset + high > size ? offset : (size - low - high) / 2;
+    if (low + offset < room) return room - low;
+    if (high + offset > size - room) return size - room - high;
+    return offset;
+}

@@ -1,0 +1,373 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The picture on the screen. Only what is in sight has elements, with some room around it, so that panning moves one
+// group and nothing else. Where too many boxes to be read are in sight they become a crowd: one path a colour.
+//
+// Holds: the focus's box, and the box that the keys stand on, always have their elements.
+
+import type { Sex } from "olvane";
+import { prefersStillness, svg } from "../ui/dom";
+import type { Box, Picture } from "../view/Picture";
+import { encloses, grown, type Rectangle } from "../view/SpatialGrid";
+import { type BoxLook, drawBox, repaintBox } from "./boxArt";
+import { Camera, eased, type Placing, type Point } from "./Camera";
+
+const kMostReadable = 420; // boxes in sight
+const kGlideTime = 520; // ms
+const kFadeTime = 200; // ms
+const kRoomAround = 0.6; // of the window, drawn on each side of it
+
+export interface SceneEvents {
+    // A box was clicked, or Enter pressed on it.
+    chosen(box: Box): void;
+    // The keys stand on another box.
+    active(box: Box): void;
+    pointed(box: Box | null, element: SVGGElement | null): void;
+    moved(placing: Placing): void;
+}
+
+// How the boxes of a picture are to be drawn.
+export interface Dress {
+    lookOf(box: Box): BoxLook;
+    // Of a person's box.
+    sexOf(box: Box): Sex;
+}
+
+interface Glide {
+    readonly start: number; // of performance.now()
+    readonly from: ReadonlyMap<string, Point>;
+}
+
+export class Scene {
+    readonly camera: Camera;
+    private readonly world = svg("g", { class: "world" });
+    private readonly lines = svg("path", { class: "line" });
+    private readonly crowd = svg("g", { class: "crowd", "aria-hidden": "true" });
+    private readonly ghosts = svg("g", { class: "ghosts", "aria-hidden": "true" });
+    private readonly boxLayer = svg("g", { class: "boxes" });
+    private readonly elements = new Map<Box, SVGGElement>();
+    private picture: Picture | null = null;
+    private dress!: Dress; // given with the picture
+    private activeBox: Box | null = null;
+    private drawn: Rectangle | null = null; // whose boxes and lines have elements
+    private crowded = false;
+    private glide: Glide | null = null;
+    private frame = 0;
+
+    constructor(
+        readonly surface: SVGSVGElement,
+        private readonly events: SceneEvents,
+    ) {
+        this.world.append(this.crowd, this.lines, this.ghosts, this.boxLayer);
+        surface.append(this.world);
+        this.camera = new Camera(surface, (placing) => this.cameraMoved(placing));
+        this.listen();
+    }
+
+    // Draws another picture. Boxes of the same persons glide from where they stood, while the anchor, a box of the
+    // picture so far, hands its place on the screen to the new focus.
+    show(picture: Picture, dress: Dress, anchor: Box | null): void {
+        const before = this.picture;
+        const hadKeys = this.surface.contains(document.activeElement);
+        const oldElements = new Map(this.elements);
+        const held = before ? (anchor ?? before.boxOfKey(picture.focusBox.key) ?? null) : null;
+
+        this.endGlide();
+        this.picture = picture;
+        this.dress = dress;
+        this.activeBox = picture.focusBox;
+        this.elements.clear();
+        this.boxLayer.replaceChildren();
+        this.crowd.replaceChildren();
+        this.drawn = null;
+
+        if (before && held) this.arrive(before, picture, held, oldElements);
+        else this.begin(picture);
+        if (hadKeys) this.focusActive();
+    }
+
+    // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
+    redraw(): void {
+        for (const [box, element] of this.elements) repaintBox(element, this.dress.lookOf(box), this.picture!.sizes);
+    }
+
+    dressAnew(dress: Dress): void {
+        this.dress = dress;
+        this.redraw();
+    }
+
+    clear(): void {
+        this.endGlide();
+        this.picture = null;
+        this.activeBox = null;
+        this.elements.clear();
+        this.lines.removeAttribute("d");
+        for (const group of [this.boxLayer, this.crowd, this.ghosts]) group.replaceChildren();
+    }
+
+    fit(): void {
+        if (this.picture) this.camera.travelTo(this.camera.fitting(this.picture.bounds));
+    }
+
+    get active(): Box | null {
+        return this.activeBox;
+    }
+
+    // Puts the keys on a box and brings it into sight.
+    activate(box: Box, takeKeys = true): void {
+        const before = this.activeBox;
+        this.activeBox = box;
+        this.update();
+        if (before) this.elements.get(before)?.setAttribute("tabindex", "-1");
+        this.elements.get(box)?.setAttribute("tabindex", "0");
+        if (takeKeys) this.focusActive();
+        this.bringIntoSight(box);
+        this.events.active(box);
+    }
+
+    // To call when the window's size has changed.
+    resized(): void {
+        this.drawn = null;
+        this.update();
+    }
+
+    elementOf(box: Box): SVGGElement | undefined {
+        return this.elements.get(box);
+    }
+
+    // Marks all the boxes of one person, when one of several is pointed at.
+    markTwins(person: number): void {
+        for (const [box, element] of this.elements) element.classList.toggle("twin-lit", person > 0 && box.person === person);
+    }
+
+    private begin(picture: Picture): void {
+        this.camera.place(this.opening(picture));
+        this.update();
+        fadeIn(this.boxLayer);
+        fadeIn(this.lines);
+    }
+
+    private arrive(before: Picture, picture: Picture, held: Box, oldElements: Map<Box, SVGGElement>): void {
+        const { k, x, y } = this.camera.placing;
+        const oldCentre = middleOf(before.areaOf(held));
+        const newCentre = middleOf(picture.areaOf(picture.focusBox));
+        const shift = { x: newCentre.x - oldCentre.x, y: newCentre.y - oldCentre.y };
+        const start = { k, x: x - shift.x * k, y: y - shift.y * k };
+        this.camera.place(start);
+        const target = this.comfortable(picture, start, before.view !== picture.view);
+
+        if (prefersStillness()) {
+            this.ghosts.replaceChildren();
+            this.camera.place(target);
+            this.update();
+            return;
+        }
+        const from = new Map<string, Point>();
+        for (const box of before.boxes) from.set(box.key, { x: box.x + shift.x, y: box.y + shift.y });
+        from.set(picture.focusBox.key, {
+            x: oldCentre.x + shift.x - picture.sizes.nodeWidth / 2,
+            y: oldCentre.y + shift.y - picture.sizes.nodeHeight / 2,
+        });
+        this.leaveGhosts(picture, shift, oldElements);
+        this.glide = { start: performance.now(), from };
+        this.update(this.camera.window(target));
+        this.fadeNewcomers(before);
+        this.step(performance.now());
+        this.camera.travelTo(target, kGlideTime);
+    }
+
+    private opening(picture: Picture): Placing {
+        return this.camera.opening(picture.bounds, middleOf(picture.areaOf(picture.focusBox)));
+    }
+
+    // Near to where it starts: only so far that the focus stands well in the window, and the whole picture where the
+    // zoom of the moment has room for it.
+    private comfortable(picture: Picture, start: Placing, otherView: boolean): Placing {
+        if (otherView) return this.opening(picture);
+        const { bounds } = picture;
+        const near = this.camera.including(picture.areaOf(picture.focusBox), 0.3, start);
+        const { width, height } = this.camera.size;
+        const fits = (bounds.right - bounds.left) * start.k <= width && (bounds.bottom - bounds.top) * start.k <= height;
+        return fits ? this.camera.including(bounds, 0.02, near) : near;
+    }
+
+    private leaveGhosts(picture: Picture, shift: Point, oldElements: Map<Box, SVGGElement>): void {
+        const gone: SVGGElement[] = [];
+        for (const [box, element] of oldElements) {
+            if (picture.boxOfKey(box.key)) continue;
+            for (const name of ["role", "tabindex", "aria-label", "data-person-id", "data-xref", "data-box"]) element.removeAttribute(name);
+            element.setAttribute("transform", `translate(${box.x + shift.x} ${box.y + shift.y})`);
+            gone.push(element);
+        }
+        this.ghosts.replaceChildren(...gone);
+        this.ghosts.animate([{ opacity: 1 }, { opacity: 0 }], { duration: kFadeTime, fill: "forwards" }).onfinish = () =>
+            this.ghosts.replaceChildren();
+    }
+
+    private fadeNewcomers(before: Picture): void {
+        for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) fadeIn(element, kGlideTime * 0.45);
+        fadeIn(this.lines, kGlideTime * 0.7);
+        fadeIn(this.crowd, kGlideTime * 0.3);
+    }
+
+    private step = (now: number): void => {
+        if (!this.glide || !this.picture) return;
+        const part = Math.min(1, Math.max(0, now - this.glide.start) / kGlideTime);
+        for (const [box, element] of this.elements) this.put(box, element, eased(part));
+        if (part < 1) this.frame = requestAnimationFrame(this.step);
+        else this.glide = null;
+    };
+
+    private put(box: Box, element: SVGGElement, part: number): void {
+        const from = this.glide?.from.get(box.key) ?? box;
+        const x = from.x + (box.x - from.x) * part;
+        const y = from.y + (box.y - from.y) * part;
+        element.setAttribute("transform", `translate(${x.toFixed(1)} ${y.toFixed(1)})`);
+    }
+
+    private endGlide(): void {
+        cancelAnimationFrame(this.frame);
+        this.glide = null;
+    }
+
+    private cameraMoved(placing: Placing): void {
+        const { k, x, y } = placing;
+        this.world.setAttribute("transform", `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`);
+        if (this.picture) this.update();
+        this.events.moved(placing);
+    }
+
+    // Sees to it that everything in sight, and in another window that is on its way, has its elements.
+    private update(alsoWindow?: Rectangle): void {
+        const { picture } = this;
+        if (!picture) return;
+        const sight = this.camera.window();
+        const needed = alsoWindow ? unionOf(sight, alsoWindow) : sight;
+        const crowded = picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
+        const far = this.drawn && this.drawn.right - this.drawn.left > 6 * (sight.right - sight.left);
+        if (this.drawn && crowded === this.crowded && !far && encloses(this.drawn, clipped(needed, this.drawn, picture.bounds))) {
+            this.keepAlways(picture);
+            return;
+        }
+        this.crowded = crowded;
+        this.drawn = grown(needed, (sight.right - sight.left) * kRoomAround, (sight.bottom - sight.top) * kRoomAround);
+        this.drawLines(picture);
+        this.drawCrowd(picture);
+        this.drawBoxes(crowded ? [] : picture.boxesWithin(this.drawn), picture);
+    }
+
+    private drawLines(picture: Picture): void {
+        const segments = this.crowded ? picture.segments : picture.segmentsWithin(this.drawn!);
+        this.lines.setAttribute("d", segments.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`).join(""));
+        // Lines stay to be seen when the picture is a long way off.
+        this.lines.setAttribute("stroke-width", String(Math.max(1.6, this.crowded ? 0.7 / this.camera.placing.k : 0)));
+    }
+
+    private drawCrowd(picture: Picture): void {
+        this.crowd.classList.toggle("shown", this.crowded);
+        if (!this.crowded || this.crowd.firstChild) return;
+        const { nodeWidth, nodeHeight } = picture.sizes;
+        const paths = new Map<string, string[]>();
+        for (const box of picture.boxes) {
+            const kind = box.person ? this.dress.sexOf(box) : "missing";
+            const list = paths.get(kind) ?? [];
+            list.push(`M${box.x} ${box.y}h${nodeWidth}v${nodeHeight}h${-nodeWidth}z`);
+            paths.set(kind, list);
+        }
+        for (const [kind, list] of paths) this.crowd.append(svg("path", { class: kind, d: list.join("") }));
+    }
+
+    private drawBoxes(boxes: readonly Box[], picture: Picture): void {
+        const wanted = new Set(boxes);
+        wanted.add(picture.focusBox);
+        if (this.activeBox) wanted.add(this.activeBox);
+        for (const [box, element] of this.elements) {
+            if (wanted.has(box)) continue;
+            element.remove();
+            this.elements.delete(box);
+        }
+        const added = document.createDocumentFragment();
+        for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box, picture));
+        this.boxLayer.append(added);
+        const focus = this.elements.get(picture.focusBox);
+        if (focus && this.boxLayer.lastChild !== focus && document.activeElement !== focus) this.boxLayer.append(focus);
+    }
+
+    private keepAlways(picture: Picture): void {
+        for (const box of [picture.focusBox, this.activeBox]) {
+            if (box && !this.elements.has(box)) this.boxLayer.append(this.newElement(box, picture));
+        }
+    }
+
+    private newElement(box: Box, picture: Picture): SVGGElement {
+        const element = drawBox(this.dress.lookOf(box), picture.sizes);
+        element.setAttribute("data-box", String(box.index));
+        if (box === this.activeBox) element.setAttribute("tabindex", "0");
+        this.elements.set(box, element);
+        this.put(box, element, this.glide ? 0 : 1);
+        return element;
+    }
+
+    private bringIntoSight(box: Box): void {
+        const placing = this.camera.including(grown(this.picture!.areaOf(box), 12, 12), 0.08);
+        const { x, y } = this.camera.placing;
+        if (Math.abs(placing.x - x) > 1 || Math.abs(placing.y - y) > 1) this.camera.travelTo(placing, 220);
+    }
+
+    private focusActive(): void {
+        if (this.activeBox) this.elements.get(this.activeBox)?.focus({ preventScroll: true });
+    }
+
+    private listen(): void {
+        const { surface, events } = this;
+        surface.addEventListener("click", (event) => {
+            const box = this.boxAt(event.target);
+            if (box?.person) events.chosen(box);
+        });
+        surface.addEventListener("focusin", (event) => {
+            const box = this.boxAt(event.target);
+            if (box && box !== this.activeBox) this.activate(box);
+        });
+        surface.addEventListener("pointerover", (event) => {
+            if (event.pointerType === "touch") return;
+            const box = this.boxAt(event.target);
+            events.pointed(box, box ? (this.elements.get(box) ?? null) : null);
+        });
+        surface.addEventListener("pointerleave", () => events.pointed(null, null));
+        // The browser itself must not scroll the surface to a box that got the keys.
+        surface.addEventListener("scroll", () => surface.scrollTo(0, 0));
+    }
+
+    private boxAt(target: EventTarget | null): Box | null {
+        const index = (target as Element | null)?.closest?.("[data-box]")?.getAttribute("data-box");
+        return index ? (this.picture?.boxes[Number(index)] ?? null) : null;
+    }
+}
+
+function middleOf(area: Rectangle): Point {
+    return { x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 };
+}
+
+function unionOf(a: Rectangle, b: Rectangle): Rectangle {
+    return {
+        left: Math.min(a.left, b.left),
+        top: Math.min(a.top, b.top),
+        right: Math.max(a.right, b.right),
+        bottom: Math.max(a.bottom, b.bottom),
+    };
+}
+
+// Nothing stands outside of the picture's bounds, so a window that only reaches beyond them needs nothing new.
+function clipped(window: Rectangle, drawn: Rectangle, bounds: Rectangle): Rectangle {
+    const left = Math.max(window.left, bounds.left);
+    const top = Math.max(window.top, bounds.top);
+    const right = Math.min(window.right, bounds.right);
+    const bottom = Math.min(window.bottom, bounds.bottom);
+    return left > right || top > bottom ? drawn : { left, top, right, bottom };
+}
+
+function fadeIn(element: Element, delay = 0): void {
+    if (prefersStillness()) return;
+    element.animate([{ opacity: 0 }, { opacity: 1 }], { duration: kFadeTime, delay, fill: "backwards" });
+}

@@ -1,0 +1,151 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Draws one box. A tall box has the silhouette on top and centred lines below it; a wide one has it at the left and
+// lines beside it. Sex is told by corners and silhouette as well as by colour. Colours come from the page's themes.
+
+import type { Sex, Sizes } from "olvane";
+import { svg } from "../ui/dom";
+import { fitLine, fitName, textWidth } from "./textFit";
+
+// Everything that a box shows and says.
+export interface BoxLook {
+    readonly person: number; // 0 for a missing parent
+    readonly xref: string;
+    readonly sex: Sex;
+    // Given name and surname in the order of reading.
+    readonly nameParts: readonly string[];
+    readonly rightToLeft: boolean;
+    readonly years: string;
+    // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
+    readonly kinship: string | null;
+    // Relatives without a box: -1 for none, 0 for an unknown number.
+    readonly hidden: number;
+    readonly repeated: boolean;
+    readonly isFocus: boolean;
+    readonly label: string;
+}
+
+const kInset = 7; // px from the border to any text
+const kYearsSize = 11;
+const kKinSize = 10.5;
+
+// Silhouettes of 44 by 40 px, drawn at kFigureScale.
+const kFigureScale = 0.56;
+export const kSilhouettes: Record<Sex, string> = {
+    male: "M22 1.5a9 9 0 1 0 .01 0zM4 40v-5c0-8 5-12.5 11-13.5l7 5 7-5c6 1 11 5.5 11 13.5v5z",
+    female:
+        "M22 1c-8 0-11.5 5.5-11.5 12 0 5.5-.5 8.5-3.5 11.5 4 1.5 8 1 10.5-.5v3h9v-3c2.5 1.5 6.5 2 10.5.5-3-3-3.5-6-3.5-11.5 0-6.5-3.5-12-11.5-12z" +
+        "M6 40c0-8 5-12.5 11-13.5h10c6 1 11 5.5 11 13.5z",
+    other: "M22 2.5a8 8 0 1 0 .01 0zM5.5 38.7v-3c0-8 7-12 16.5-12s16.5 4 16.5 12v3z",
+};
+
+// Square corners for men, round ones for women, in between for everybody else.
+const kCorners: Record<Sex, number> = { male: 3, female: 16, other: 8 };
+
+export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
+    const classes = ["box", look.person ? look.sex : "missing", look.isFocus && "focus", look.repeated && "repeated"];
+    const box = svg("g", {
+        class: classes.filter(Boolean).join(" "),
+        role: look.person ? "button" : "img",
+        tabindex: -1,
+        "aria-label": look.label,
+        "aria-current": look.isFocus && "true",
+        "data-person-id": look.person || null,
+        "data-xref": look.xref || null,
+    });
+    appendFrame(box, look, sizes);
+    if (sizes.nodeWidth > 1.5 * sizes.nodeHeight) appendWideText(box, look, sizes);
+    else appendTallText(box, look, sizes);
+    if (look.hidden >= 0) appendBadge(box, look.hidden, sizes);
+    if (look.repeated) appendTwinMark(box);
+    return box;
+}
+
+// Draws a box anew without letting go of its element, on which the keys may stand.
+export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Sizes): void {
+    const fresh = drawBox(look, sizes);
+    box.setAttribute("aria-label", look.label);
+    box.replaceChildren(...fresh.childNodes);
+}
+
+function appendFrame(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+    const rx = kCorners[look.sex];
+    box.append(
+        svg("rect", { class: "ring", x: -5, y: -5, width: nodeWidth + 10, height: nodeHeight + 10, rx: rx + 5 }),
+        svg("rect", { class: "frame", width: nodeWidth, height: nodeHeight, rx }),
+    );
+}
+
+function appendTallText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+    const middle = nodeWidth / 2;
+    const room = nodeWidth - 2 * kInset;
+    const lastLine = nodeHeight - 8;
+    const yearsY = look.kinship !== null ? lastLine - 14 : lastLine;
+    const name = fitName(look.nameParts, room, 3);
+    const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
+    const top = 31;
+    const bottom = look.years || look.kinship !== null ? yearsY - kYearsSize - 1 : nodeHeight - 6;
+    const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
+
+    box.append(figure(look, middle - 12, 8));
+    name.lines.forEach((line, i) => box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)));
+    if (look.years) box.append(text("years", middle, yearsY, fitLine(look.years, kYearsSize, 400, room)));
+    if (look.kinship) box.append(text("kin", middle, lastLine, fitLine(look.kinship, kKinSize, 400, room)));
+}
+
+function appendWideText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+    const left = 40;
+    const right = nodeWidth - kInset;
+    const room = right - left;
+    const lower = lowerLines(look, room);
+    const name = fitName(look.nameParts, room, lower.length > 1 ? 1 : 2);
+    const pitch = name.size + 2;
+    const height = name.lines.length * pitch + lower.length * 14;
+    const firstY = (nodeHeight - height) / 2 + name.size - 1;
+    // In the other direction a line begins at the right edge of its room.
+    const x = look.rightToLeft ? right : left;
+
+    box.append(figure(look, 9, (nodeHeight - 22) / 2));
+    name.lines.forEach((line, i) => box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)));
+    lower.forEach((line, i) => {
+        const y = firstY + name.lines.length * pitch + i * 14;
+        box.append(text(line === look.kinship ? "kin" : "years", left, y, fitLine(line, kYearsSize, 400, room)));
+    });
+    box.classList.add("wide");
+}
+
+// Years and kinship in one line if they fit.
+function lowerLines(look: BoxLook, room: number): string[] {
+    const lines = [look.years, look.kinship].filter((line): line is string => Boolean(line));
+    const joined = lines.join(" \u00b7 ");
+    return lines.length === 2 && textWidth(joined, kYearsSize, 400) <= room ? [joined] : lines;
+}
+
+function figure(look: BoxLook, x: number, y: number): SVGElement {
+    if (look.person) return svg("path", { class: "figure", d: kSilhouettes[look.sex], transform: `translate(${x} ${y}) scale(${kFigureScale})` });
+    return text("unknown", x + 12, y + 19, "?");
+}
+
+function text(className: string, x: number, y: number, content: string, rightToLeft = false, size?: number): SVGTextElement {
+    const line = svg("text", { class: className, x, y: Math.round(y * 10) / 10, "font-size": size }, content);
+    if (rightToLeft) line.setAttribute("direction", "rtl");
+    return line;
+}
+
+// On the upper edge, where neither names nor lines go.
+function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): void {
+    const label = hidden > 0 ? "+" + hidden : "+";
+    const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
+    const badge = svg("g", { class: "badge", transform: `translate(${nodeWidth - width + 8} -9)` });
+    badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
+    box.append(badge);
+}
+
+function appendTwinMark(box: SVGGElement): void {
+    const d = "M-.5 3.5h8v8h-8zM3.5 3.5v-4h8v8h-4";
+    box.append(
+        svg("g", { class: "twin", transform: "translate(0 -1)" },
+            svg("rect", { x: -5, y: -5, width: 21, height: 21, rx: 6 }), svg("path", { d })),
+    );
+}

@@ -1,0 +1,284 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The bar at the top with its two panels, the buttons that float over the picture, the legend, and the dialogs. All
+// of it is made anew when the language changes.
+
+import type { Diagnostic } from "olvane";
+import { type UiMessages, uiLanguages } from "../messages/ui";
+import { kLeastGenerations, kMostGenerations, kRelativeNames, type RelativeName, type ViewName, type ViewState } from "../view/ViewState";
+import { html, onClick } from "./dom";
+import { icon, type IconName, silhouette } from "./icons";
+import { Popover } from "./Popover";
+import { SearchBox, type SearchSource } from "./SearchBox";
+import { kThemeChoices, type ThemeChoice } from "./theme";
+
+export interface ChromeActions extends SearchSource {
+    setView(view: ViewName): void;
+    setRelative(name: RelativeName, shown: boolean): void;
+    setGenerations(generations: number): void;
+    setKinshipInBoxes(shown: boolean): void;
+    setTheme(theme: ThemeChoice): void;
+    setLanguage(language: string): void;
+    back(): void;
+    forward(): void;
+    zoomIn(): void;
+    zoomOut(): void;
+    fit(): void;
+    home(): void;
+    openFile(): void;
+    saveSvg(): void;
+    savePng(): void;
+    print(): void;
+    togglePanel(): void;
+}
+
+export interface ChromeLooks {
+    readonly theme: ThemeChoice;
+    readonly kinshipInBoxes: boolean;
+}
+
+const kMostDiagnostics = 500; // listed; the rest is counted
+
+export class Chrome {
+    readonly bar: HTMLElement;
+    readonly corner: HTMLElement;
+    readonly keys: HTMLDialogElement;
+    readonly diagnostics: HTMLDialogElement;
+    readonly search: SearchBox;
+    private readonly title = html("div", { class: "title" });
+    private readonly diagnosticsButton: HTMLButtonElement;
+    private readonly buttons: Record<"back" | "forward" | "family" | "pedigree" | "panel", HTMLButtonElement>;
+    private readonly switches = new Map<RelativeName, HTMLInputElement>();
+    private readonly generations = html("output", { id: "generations" });
+    private readonly fewer: HTMLButtonElement;
+    private readonly more: HTMLButtonElement;
+    private readonly options: Popover;
+    private readonly files: Popover;
+    private shownGenerations = 0;
+
+    constructor(
+        private readonly ui: UiMessages,
+        private readonly actions: ChromeActions,
+        looks: ChromeLooks,
+    ) {
+        this.search = new SearchBox(actions, ui);
+        this.buttons = {
+            back: this.iconButton("back", "back", ui.back, () => actions.back()),
+            forward: this.iconButton("forward", "forward", ui.forward, () => actions.forward()),
+            family: this.viewButton("family", ui.views.family),
+            pedigree: this.viewButton("pedigree", ui.views.pedigree),
+            panel: this.iconButton("panel-button", "panel", ui.panel.toggle, () => actions.togglePanel()),
+        };
+        this.fewer = this.iconButton("generations-fewer", "minus", ui.fewer, () => actions.setGenerations(this.shownGenerations - 1));
+        this.more = this.iconButton("generations-more", "plus", ui.more, () => actions.setGenerations(this.shownGenerations + 1));
+        this.keys = this.keyDialog();
+        this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
+        this.diagnosticsButton = this.iconButton("diagnostics-button", "warning", "", () => this.diagnostics.showModal());
+        this.diagnosticsButton.hidden = true;
+        this.options = new Popover(this.iconButton("options-button", "options", ui.options, () => {}), this.optionsPanel(looks));
+        this.files = new Popover(this.iconButton("file-button", "file", ui.file, () => {}), this.filePanel());
+        this.bar = this.barElement();
+        this.corner = html("div", { class: "corner" }, this.legend(), this.zoomButtons());
+    }
+
+    showFamily(title: string, persons: string): void {
+        this.title.replaceChildren(html("strong", { dir: "auto" }, title), html("span", {}, persons));
+    }
+
+    showState(state: ViewState, canGoBack: boolean, canGoForward: boolean): void {
+        const { back, forward, family, pedigree } = this.buttons;
+        back.disabled = !canGoBack;
+        forward.disabled = !canGoForward;
+        family.setAttribute("aria-pressed", String(state.view === "family"));
+        pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
+        for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
+        // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from.
+        this.disable("cousins", state.hidden.has("auntsUncles"));
+        this.disable("siblingSpouses", state.hidden.has("siblings"));
+        this.disable("niecesNephews", state.hidden.has("siblings"));
+        this.shownGenerations = state.generations;
+        this.generations.textContent = String(state.generations);
+        this.fewer.disabled = state.generations <= kLeastGenerations;
+        this.more.disabled = state.generations >= kMostGenerations;
+    }
+
+    showPanelState(open: boolean): void {
+        this.buttons.panel.setAttribute("aria-pressed", String(open));
+    }
+
+    showDiagnostics(found: readonly Diagnostic[], persons: number): void {
+        const { ui } = this;
+        const label = ui.diagnostics.button(found.length);
+        this.diagnosticsButton.hidden = found.length === 0;
+        this.diagnosticsButton.setAttribute("aria-label", label);
+        this.diagnosticsButton.title = label;
+        const items = found.slice(0, kMostDiagnostics).map((one) => this.diagnosticItem(one));
+        if (found.length > kMostDiagnostics) items.push(html("li", {}, ui.diagnostics.furtherOnes(found.length - kMostDiagnostics)));
+        this.diagnostics.replaceChildren(
+            this.dialogHead("diagnostics-title", ui.diagnostics.title, this.diagnostics),
+            html("p", { class: "quiet" }, ui.diagnostics.summary(persons, found.length)),
+            html("ul", { class: "diagnostics", tabindex: 0, "aria-label": label }, ...items),
+        );
+    }
+
+    private diagnosticItem({ line, severity, message, hint }: Diagnostic): HTMLLIElement {
+        const { diagnostics } = this.ui;
+        return html(
+            "li",
+            { class: severity },
+            html("span", { class: "severity" }, diagnostics.severities[severity]),
+            line > 0 && html("span", { class: "line" }, diagnostics.line(line)),
+            html("span", { class: "message", dir: "auto" }, message),
+            Boolean(hint) && html("span", { class: "hint", dir: "auto" }, hint),
+        );
+    }
+
+    private barElement(): HTMLElement {
+        const { ui, buttons } = this;
+        const group = (className: string, label: string, ...children: HTMLElement[]) =>
+            html("div", { class: className, role: "group", "aria-label": label }, ...children);
+        return html(
+            "header",
+            { class: "bar" },
+            this.title,
+            this.search.element,
+            group("segments", ui.views.label, buttons.family, buttons.pedigree),
+            group("buttons travel", ui.back + ", " + ui.forward, buttons.back, buttons.forward),
+            html("div", { class: "buttons" }, this.diagnosticsButton, this.options.element, this.files.element, buttons.panel),
+        );
+    }
+
+    private zoomButtons(): HTMLElement {
+        const { ui, actions } = this;
+        return html(
+            "div",
+            { class: "zoom", role: "group", "aria-label": ui.fit },
+            this.iconButton("zoom-in", "plus", ui.zoomIn, () => actions.zoomIn()),
+            this.iconButton("zoom-out", "minus", ui.zoomOut, () => actions.zoomOut()),
+            this.iconButton("fit", "fit", ui.fit, () => actions.fit()),
+            this.iconButton("home", "home", ui.home, () => actions.home()),
+        );
+    }
+
+    private optionsPanel(looks: ChromeLooks): HTMLElement {
+        const { ui, actions } = this;
+        const relatives = html("fieldset", {}, html("legend", {}, ui.relatives));
+        for (const name of kRelativeNames) {
+            const input = this.checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
+            this.switches.set(name, input);
+            relatives.append(html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])));
+        }
+        const kinship = this.checkbox("kinship-in-boxes", (checked) => actions.setKinshipInBoxes(checked));
+        kinship.checked = looks.kinshipInBoxes;
+        const themes = kThemeChoices.map((theme) => [theme, ui.themes[theme]] as const);
+        const languages = uiLanguages.map(({ language, languageName }) => [language, languageName] as const);
+        const generations = html(
+            "div",
+            { class: "row", role: "group", "aria-label": ui.generations },
+            html("span", {}, ui.generations),
+            html("div", { class: "stepper" }, this.fewer, this.generations, this.more),
+        );
+        return html(
+            "div",
+            { id: "options-panel", class: "sheet", role: "region", "aria-label": ui.options },
+            relatives,
+            generations,
+            html("fieldset", {}, html("legend", {}, ui.look),
+                html("label", { class: "switch" }, kinship, html("span", {}, ui.kinshipInBoxes)),
+                this.choice("theme", ui.theme, themes, looks.theme, (theme) => actions.setTheme(theme as ThemeChoice)),
+                this.choice("language", ui.languageLabel, languages, ui.language, (language) => actions.setLanguage(language))),
+        );
+    }
+
+    private filePanel(): HTMLElement {
+        const { ui, actions } = this;
+        const item = (id: string, label: string, action: () => void) => {
+            const button = html("button", { id, type: "button", class: "item" }, label);
+            onClick(button, () => {
+                this.files.close();
+                this.files.button.focus();
+                action();
+            });
+            return button;
+        };
+        return html(
+            "div",
+            { id: "file-panel", class: "sheet", role: "region", "aria-label": ui.file },
+            item("save-svg", ui.saveSvg, () => actions.saveSvg()),
+            item("save-png", ui.savePng, () => actions.savePng()),
+            item("print", ui.print, () => actions.print()),
+            item("open-file", ui.openFile, () => actions.openFile()),
+            item("keys-button", ui.keys, () => this.keys.showModal()),
+        );
+    }
+
+    private keyDialog(): HTMLDialogElement {
+        const { ui } = this;
+        const dialog = html("dialog", { id: "keys", "aria-labelledby": "keys-title" });
+        const list = html("dl", { class: "keys" });
+        for (const [key, meaning] of ui.keyList) list.append(html("div", {}, html("dt", {}, html("kbd", {}, key)), html("dd", {}, meaning)));
+        dialog.append(this.dialogHead("keys-title", ui.keys, dialog), list);
+        return dialog;
+    }
+
+    private dialogHead(id: string, title: string, dialog: HTMLDialogElement): HTMLElement {
+        const close = this.iconButton(id + "-close", "close", this.ui.close, () => dialog.close());
+        return html("div", { class: "dialog-head" }, html("h2", { id }, title), close);
+    }
+
+    private legend(): HTMLElement {
+        const { ui } = this;
+        const items = ui.legendItems;
+        const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
+        const sign = (className: string, content: Element | string = "") => html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
+        const list = html(
+            "ul",
+            {},
+            row(sign("male", silhouette("male")), items.male),
+            row(sign("female", silhouette("female")), items.female),
+            row(sign("other", silhouette("other")), items.other),
+            row(sign("focus"), items.focus),
+            row(sign("more", "+3"), items.hidden),
+            row(sign("missing", "?"), items.missing),
+            row(sign("twin", "\u29c9"), items.repeated),
+        );
+        return html("details", { id: "legend" }, html("summary", {}, ui.legend), list);
+    }
+
+    private iconButton(id: string, name: IconName, label: string, action: () => void): HTMLButtonElement {
+        const button = html("button", { id, type: "button", class: "icon-button", "aria-label": label, title: label }, icon(name));
+        onClick(button, action);
+        return button;
+    }
+
+    private viewButton(view: ViewName, label: string): HTMLButtonElement {
+        const button = html("button", { id: "view-" + view, type: "button", "aria-pressed": "false" }, icon(view), html("span", {}, label));
+        onClick(button, () => this.actions.setView(view));
+        return button;
+    }
+
+    private checkbox(id: string, action: (checked: boolean) => void): HTMLInputElement {
+        const input = html("input", { id, type: "checkbox", role: "switch" });
+        input.addEventListener("change", () => action(input.checked));
+        return input;
+    }
+
+    private choice(
+        id: string,
+        label: string,
+        choices: readonly (readonly [string, string])[],
+        chosen: string,
+        action: (value: string) => void,
+    ): HTMLElement {
+        const select = html("select", { id });
+        for (const [value, text] of choices) select.append(html("option", { value, selected: value === chosen }, text));
+        select.addEventListener("change", () => action(select.value));
+        return html("label", { class: "row" }, html("span", {}, label), select);
+    }
+
+    private disable(name: RelativeName, disabled: boolean): void {
+        const input = this.switches.get(name);
+        if (input) input.disabled = disabled;
+    }
+}

@@ -1,0 +1,45 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Short messages at the lower edge. What went well goes away by itself; what went wrong stays until dismissed.
+
+import { html, onClick } from "./dom";
+import { icon } from "./icons";
+
+const kTime = 6000; // ms
+
+export class Notices {
+    readonly element = html("div", { id: "notices" });
+    private dismissLabel = "";
+
+    speak(dismissLabel: string): void {
+        this.dismissLabel = dismissLabel;
+    }
+
+    tell(text: string): void {
+        const notice = this.add("told", "status", text, []);
+        setTimeout(() => notice.remove(), kTime);
+    }
+
+    warn(text: string): void {
+        const notice = this.add("warned", "status", text, []);
+        setTimeout(() => notice.remove(), 2 * kTime);
+    }
+
+    fail(text: string, details: readonly string[]): void {
+        this.add("failed", "alert", text, details);
+    }
+
+    clear(): void {
+        this.element.replaceChildren();
+    }
+
+    private add(className: string, role: string, text: string, details: readonly string[]): HTMLElement {
+        const lines = details.filter((detail) => detail !== "").map((detail) => html("span", { dir: "auto" }, detail));
+        const dismiss = html("button", { type: "button", class: "icon-button", "aria-label": this.dismissLabel }, icon("close"));
+        const notice = html("div", { class: "notice " + className, role }, html("p", {}, html("strong", {}, text), ...lines), dismiss);
+        onClick(dismiss, () => notice.remove());
+        this.element.replaceChildren(notice);
+        return notice;
+    }
+}

@@ -1,0 +1,138 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Finds persons by name and year while one types. The keys stay in the field; the list below is walked with arrows.
+
+import type { Person } from "olvane";
+import type { UiMessages } from "../messages/ui";
+import { html, isolated, onClick } from "./dom";
+import { icon, silhouette } from "./icons";
+
+const kMostFound = 30;
+
+export interface SearchSource {
+    find(text: string, limit: number): readonly Person[];
+    nameOf(person: Person): string;
+    yearsOf(person: Person): string;
+    kinshipOf(person: Person): string;
+    choose(person: Person): void;
+}
+
+export class SearchBox {
+    readonly element: HTMLElement;
+    readonly input: HTMLInputElement;
+    private readonly list: HTMLUListElement;
+    private readonly status: HTMLElement;
+    private found: readonly Person[] = [];
+    private current = -1;
+
+    constructor(
+        private readonly source: SearchSource,
+        private readonly messages: UiMessages,
+    ) {
+        this.input = html("input", {
+            id: "search",
+            type: "text",
+            role: "combobox",
+            "aria-autocomplete": "list",
+            "aria-expanded": "false",
+            "aria-controls": "search-list",
+            "aria-label": messages.search.label,
+            placeholder: messages.search.label,
+            autocomplete: "off",
+            autocapitalize: "off",
+            spellcheck: "false",
+            enterkeyhint: "search",
+        });
+        this.list = html("ul", { id: "search-list", role: "listbox", "aria-label": messages.search.label, hidden: true });
+        this.status = html("div", { class: "unseen", role: "status" });
+        this.element = html("div", { class: "search", role: "search" }, icon("search"), this.input, this.list, this.status);
+        this.listen();
+    }
+
+    private listen(): void {
+        const { input } = this;
+        input.addEventListener("input", () => this.look());
+        input.addEventListener("focus", () => {
+            input.select();
+            if (input.value) this.look();
+        });
+        input.addEventListener("blur", () => this.close());
+        input.addEventListener("keydown", (event) => {
+            if (this.key(event.key)) event.preventDefault();
+            // Keys of the field are no keys of the picture.
+            event.stopPropagation();
+        });
+        // The field must not lose the keys before the click has come.
+        this.list.addEventListener("mousedown", (event) => event.preventDefault());
+    }
+
+    private key(name: string): boolean {
+        if (name === "ArrowDown") return this.move(1);
+        if (name === "ArrowUp") return this.move(-1);
+        if (name === "Enter") return this.choose(this.found[Math.max(0, this.current)]);
+        if (name !== "Escape") return false;
+        if (this.list.hidden) this.input.value = "";
+        this.close();
+        return true;
+    }
+
+    private move(step: number): boolean {
+        if (this.list.hidden) this.look();
+        const count = this.found.length;
+        if (count > 0) this.select((this.current + step + count) % count);
+        return true;
+    }
+
+    private select(index: number): void {
+        this.current = index;
+        [...this.list.children].forEach((option, i) => {
+            const isCurrent = i === index;
+            option.setAttribute("aria-selected", String(isCurrent));
+            if (isCurrent) option.scrollIntoView({ block: "nearest" });
+        });
+        if (index >= 0 && this.found.length > 0) this.input.setAttribute("aria-activedescendant", "found-" + index);
+        else this.input.removeAttribute("aria-activedescendant");
+    }
+
+    private look(): void {
+        const text = this.input.value.trim();
+        if (!text) return this.close();
+        this.found = this.source.find(text, kMostFound);
+        const { search } = this.messages;
+        this.list.replaceChildren(...this.found.map((person, i) => this.option(person, i)));
+        if (this.found.length === 0) this.list.append(html("li", { class: "none", role: "option", "aria-disabled": "true" }, search.none));
+        this.list.hidden = false;
+        this.input.setAttribute("aria-expanded", "true");
+        this.status.textContent = this.found.length > 0 ? search.count(this.found.length) : search.none;
+        this.select(this.found.length > 0 ? 0 : -1);
+    }
+
+    private option(person: Person, index: number): HTMLLIElement {
+        const { source } = this;
+        const option = html(
+            "li",
+            { id: "found-" + index, role: "option", "data-person-id": person.id },
+            silhouette(person.sex),
+            html("span", { class: "who" }, isolated(source.nameOf(person)), html("span", { class: "kin" }, source.kinshipOf(person))),
+            html("span", { class: "years" }, source.yearsOf(person)),
+        );
+        onClick(option, () => this.choose(person));
+        return option;
+    }
+
+    private choose(person: Person | undefined): boolean {
+        if (!person) return true;
+        this.input.value = "";
+        this.close();
+        this.source.choose(person);
+        return true;
+    }
+
+    private close(): void {
+        this.list.hidden = true;
+        this.current = -1;
+        this.input.setAttribute("aria-expanded", "false");
+        this.input.removeAttribute("aria-activedescendant");
+    }
+}

@@ -1,0 +1,192 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What the file tells of one person: who that is to the focus, facts with dates and places, and the relatives, each a
+// link. On a narrow window it is a sheet at the lower edge that shows the name until it is drawn up.
+
+import type { Fact, Family, Person } from "olvane";
+import { factLabel, type Messages } from "../messages";
+import type { UiMessages } from "../messages/ui";
+import { dateText, nameOf, yearsOf } from "../names";
+import type { OpenFamily } from "../view/OpenFamily";
+import { html, isolated, onClick } from "./dom";
+import { icon, silhouette } from "./icons";
+
+// Told by the panel in other ways, or of no use to a reader.
+const kUntold = new Set(["NAME", "SEX", "FAMC", "FAMS", "HUSB", "WIFE", "CHIL", "CHAN", "CREA", "RIN", "UID", "_UID", "OBJE", "SUBM", "EXID"]);
+
+export interface PanelEvents {
+    choose(person: number): void;
+    nextBox(person: number): void;
+    addressOf(person: number): string;
+}
+
+// What the picture knows of the person.
+export interface Standing {
+    readonly focus: Person;
+    readonly kinship: string;
+    readonly boxes: number;
+}
+
+export class SidePanel {
+    readonly element: HTMLElement;
+    private readonly body = html("div", { class: "panel-body" });
+    private readonly handle: HTMLButtonElement;
+
+    constructor(
+        private readonly messages: Messages,
+        private readonly ui: UiMessages,
+        private readonly events: PanelEvents,
+    ) {
+        this.handle = html("button", { class: "handle", type: "button", "aria-label": ui.panel.toggle, "aria-expanded": "false" }, icon("up"));
+        this.element = html("aside", { id: "side-panel", "aria-label": ui.panel.label, tabindex: -1 }, this.handle, this.body);
+        onClick(this.handle, () => this.draw(!this.element.classList.contains("drawn")));
+    }
+
+    // Draws the sheet up or down.
+    draw(up: boolean): void {
+        this.element.classList.toggle("drawn", up);
+        this.handle.setAttribute("aria-expanded", String(up));
+    }
+
+    show(person: Person, family: OpenFamily, standing: Standing): void {
+        const sections = [
+            this.header(person, standing),
+            this.facts(person, family),
+            this.people(this.ui.panel.parents, this.parents(person, family)),
+            this.couples(person, family),
+            this.people(this.ui.panel.siblings, family.siblingsOf(person).map((id) => this.link(family.person(id)))),
+        ];
+        this.body.replaceChildren(...sections.filter((section) => section !== null));
+        this.element.scrollTop = 0;
+        this.element.dataset["personId"] = String(person.id);
+    }
+
+    private header(person: Person, { focus, kinship, boxes }: Standing): HTMLElement {
+        const isFocus = person.id === focus.id;
+        const relation = kinship
+            ? this.ui.relatedTo(kinship, "\u2068" + nameOf(focus, this.messages) + "\u2069")
+            : this.ui.notRelated("\u2068" + nameOf(focus, this.messages) + "\u2069");
+        const header = html(
+            "header",
+            {},
+            silhouette(person.sex),
+            html("h2", { dir: "auto" }, nameOf(person, this.messages)),
+            html("p", { class: "years" }, yearsOf(person, this.messages)),
+            html("p", { class: "kinship" }, isFocus ? this.ui.inFocus : relation),
+        );
+        if (!isFocus) header.append(this.button("make-focus", this.ui.makeFocus, () => this.events.choose(person.id)));
+        if (boxes > 1) {
+            header.append(
+                html("p", { class: "places" }, this.ui.severalBoxes(boxes) + " "),
+                this.button("next-box", this.ui.nextBox, () => this.events.nextBox(person.id)),
+            );
+        }
+        return header;
+    }
+
+    private button(id: string, label: string, action: () => void): HTMLElement {
+        const button = html("button", { id, type: "button", class: "plain" }, label);
+        onClick(button, action);
+        return button;
+    }
+
+    private facts(person: Person, family: OpenFamily): HTMLElement {
+        const list = html("dl", {});
+        const others = person.names.slice(1).filter((name) => name !== person.name);
+        if (others.length > 0) this.appendFact(list, this.ui.panel.otherNames, others.map((name) => isolated(name)));
+        for (const fact of family.file.factsOfPerson(person.id)) if (!kUntold.has(fact.tag)) this.appendFactOf(list, fact);
+        return html(
+            "section",
+            { class: "facts" },
+            html("h3", {}, this.ui.panel.facts),
+            list.childElementCount > 0 ? list : html("p", { class: "quiet" }, this.ui.panel.noFacts),
+        );
+    }
+
+    private appendFactOf(list: HTMLElement, fact: Fact): void {
+        const { date, place, value } = fact;
+        const parts = [
+            date && html("span", { class: "date" }, dateText(date, this.messages)),
+            place && html("span", { class: "place", dir: "auto" }, place),
+            value && value !== "Y" && html("span", { class: "value", dir: "auto" }, value),
+        ].filter((part): part is HTMLSpanElement => Boolean(part));
+        this.appendFact(list, factLabel(fact.tag, this.messages), parts);
+    }
+
+    private appendFact(list: HTMLElement, label: string, parts: readonly HTMLElement[]): void {
+        list.append(html("div", {}, html("dt", {}, label), html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"]))));
+    }
+
+    private parents(person: Person, family: OpenFamily): HTMLElement[] {
+        const links: HTMLElement[] = [];
+        const listed = new Set<number>();
+        const add = (id: number, note: string) => {
+            if (id === 0 || listed.has(id)) return;
+            listed.add(id);
+            links.push(this.link(family.person(id), note));
+        };
+        add(person.father, this.adoption(person, family, person.father));
+        add(person.mother, this.adoption(person, family, person.mother));
+        for (const { family: id, pedigree } of person.parentFamilies) {
+            const couple = family.families[id - 1];
+            const note = this.ui.pedigrees[pedigree as keyof UiMessages["pedigrees"]] ?? "";
+            if (couple) [couple.husband, couple.wife].forEach((parent) => add(parent, note));
+        }
+        return links;
+    }
+
+    // How a child came to a parent, where that was not by birth.
+    private adoption(person: Person, family: OpenFamily, parent: number): string {
+        const link = person.parentFamilies.find(({ family: id }) => {
+            const couple = family.families[id - 1];
+            return couple !== undefined && (couple.husband === parent || couple.wife === parent);
+        });
+        return this.ui.pedigrees[link?.pedigree as keyof UiMessages["pedigrees"]] ?? "";
+    }
+
+    private couples(person: Person, family: OpenFamily): HTMLElement | null {
+        const couples = person.coupleFamilies.map((id) => family.families[id - 1]).filter((couple) => couple !== undefined);
+        if (couples.length === 0) return null;
+        const section = html("section", { class: "couples" }, html("h3", {}, this.ui.panel.partners));
+        for (const couple of couples) section.append(this.couple(person, couple, family));
+        return section;
+    }
+
+    private couple(person: Person, couple: Family, family: OpenFamily): HTMLElement {
+        const partner = couple.husband === person.id ? couple.wife : couple.husband;
+        const facts = html("dl", {});
+        for (const fact of family.file.factsOfFamily(couple.id)) if (!kUntold.has(fact.tag)) this.appendFactOf(facts, fact);
+        const children = couple.children.map((id) => html("li", {}, this.link(family.person(id))));
+        return html(
+            "div",
+            { class: "couple" },
+            partner ? this.link(family.person(partner)) : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
+            facts.childElementCount > 0 && facts,
+            children.length > 0 && html("ul", { class: "children", "aria-label": this.ui.panel.children }, ...children),
+        );
+    }
+
+    private people(title: string, links: readonly HTMLElement[]): HTMLElement | null {
+        if (links.length === 0) return null;
+        const items = links.map((link) => html("li", {}, link));
+        return html("section", {}, html("h3", {}, title), html("ul", {}, ...items));
+    }
+
+    private link(person: Person | undefined, note = ""): HTMLElement {
+        if (!person) return html("span", {});
+        const link = html(
+            "a",
+            { class: "relative", href: this.events.addressOf(person.id), "data-person-id": person.id },
+            silhouette(person.sex),
+            html("bdi", { class: "name" }, nameOf(person, this.messages)),
+            html("span", { class: "years" }, [yearsOf(person, this.messages), note].filter(Boolean).join(", ")),
+        );
+        onClick(link, (event) => {
+            if (event.ctrlKey || event.metaKey || event.shiftKey) return;
+            event.preventDefault();
+            this.events.choose(person.id);
+        });
+        return link;
+    }
+}

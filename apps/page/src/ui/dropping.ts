@@ -1,0 +1,37 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Takes files that are dropped anywhere on the page, or chosen in the browser's own dialog.
+
+import { html } from "./dom";
+
+export function fileInput(take: (file: File) => void): HTMLInputElement {
+    const input = html("input", { id: "file-input", type: "file", accept: ".ged,.gdz,.gedcom,.zip", "aria-hidden": "true", tabindex: -1 });
+    input.addEventListener("change", () => {
+        const file = input.files?.[0];
+        // The same file may be chosen again after it was repaired.
+        input.value = "";
+        if (file) take(file);
+    });
+    return input;
+}
+
+export function takeDrops(cover: HTMLElement, take: (file: File) => void): void {
+    const holdsFiles = (event: DragEvent) => event.dataTransfer?.types.includes("Files") ?? false;
+    addEventListener("dragover", (event) => {
+        if (!holdsFiles(event)) return;
+        event.preventDefault();
+        event.dataTransfer!.dropEffect = "copy";
+        cover.hidden = false;
+    });
+    addEventListener("dragleave", (event) => {
+        if (event.relatedTarget === null) cover.hidden = true;
+    });
+    addEventListener("drop", (event) => {
+        cover.hidden = true;
+        const file = event.dataTransfer?.files[0];
+        if (!file) return;
+        event.preventDefault();
+        take(file);
+    });
+}

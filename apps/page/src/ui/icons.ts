@@ -1,0 +1,41 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The small pictures on buttons: strokes on a square of 24 px.
+
+import type { Sex } from "olvane";
+import { kSilhouettes } from "../scene/boxArt";
+import { svg } from "./dom";
+
+const kPaths = {
+    search: "M10.5 4a6.5 6.5 0 1 0 .01 0zM15.5 15.5 20 20",
+    back: "M15 5l-7 7 7 7",
+    forward: "M9 5l7 7-7 7",
+    plus: "M12 5v14M5 12h14",
+    minus: "M5 12h14",
+    fit: "M4 9V4h5M15 4h5v5M20 15v5h-5M9 20H4v-5",
+    home: "M12 3v4M12 17v4M3 12h4M17 12h4M12 9a3 3 0 1 0 .01 0z",
+    options: "M4 7h9M17 7h3M15 4.5v5M4 17h3M11 17h9M9 14.5v5",
+    file: "M12 4v11M7.5 11l4.5 4.5 4.5-4.5M4 19.5h16",
+    panel: "M4 5h16v14H4zM14.5 5v14",
+    close: "M6 6l12 12M18 6L6 18",
+    warning: "M12 4L2.8 20h18.4zM12 10v4.5M12 17.2v.3",
+    family: "M12 4v6M6 14v-4h12v4M4 14h4v5H4zM16 14h4v5h-4zM10 2.5h4v3h-4z",
+    pedigree: "M3 10h4v4H3zM7 12h4M11 6v12M11 6h4M11 18h4M15 4h5v4h-5zM15 16h5v4h-5z",
+    up: "M6 15l6-6 6 6",
+    lock: "M6 11h12v9H6zM8.5 11V8a3.5 3.5 0 0 1 7 0v3",
+} as const;
+
+export type IconName = keyof typeof kPaths;
+
+export function icon(name: IconName): SVGSVGElement {
+    const picture = svg("svg", { class: "icon", viewBox: "0 0 24 24", "aria-hidden": "true", focusable: "false" });
+    picture.append(svg("path", { d: kPaths[name] }));
+    return picture;
+}
+
+export function silhouette(sex: Sex): SVGSVGElement {
+    const picture = svg("svg", { class: "silhouette " + sex, viewBox: "0 0 44 42", "aria-hidden": "true", focusable: "false" });
+    picture.append(svg("path", { d: kSilhouettes[sex] }));
+    return picture;
+}

@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Which set of colours the page wears. The sets themselves are in page.css, under the same names.
+
+import { recall, remember } from "./dom";
+
+export const kThemeChoices = ["auto", "light", "dark", "contrast"] as const;
+export type ThemeChoice = (typeof kThemeChoices)[number];
+
+const kDark = "(prefers-color-scheme: dark)";
+const kContrast = "(prefers-contrast: more)";
+
+export class Theme {
+    choice: ThemeChoice;
+
+    constructor() {
+        const known = recall("theme");
+        this.choice = kThemeChoices.find((choice) => choice === known) ?? "auto";
+        for (const query of [kDark, kContrast]) matchMedia(query).addEventListener("change", () => this.wear());
+        this.wear();
+    }
+
+    choose(choice: ThemeChoice): void {
+        this.choice = choice;
+        remember("theme", choice);
+        this.wear();
+    }
+
+    private wear(): void {
+        document.documentElement.dataset["theme"] = this.choice === "auto" ? systemTheme() : this.choice;
+    }
+}
+
+function systemTheme(): string {
+    if (matchMedia(kContrast).matches) return "contrast";
+    return matchMedia(kDark).matches ? "dark" : "light";
+}

@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The family that is open: its persons, its pictures, and how everybody is related to the focus.
+
+import type { Family, GedcomFile, Person } from "olvane";
+import { allKinships, type Kinship } from "../kinship";
+import { PersonIndex } from "../search";
+import { Picture, sizesOf } from "./Picture";
+import { shownBits, type ViewState } from "./ViewState";
+
+export class OpenFamily {
+    readonly persons: readonly Person[];
+    readonly families: readonly Family[];
+    readonly index: PersonIndex;
+    private kinships: ReadonlyMap<number, Kinship> | null = null;
+    private kinshipFocus = 0;
+
+    constructor(
+        readonly file: GedcomFile,
+        readonly title: string,
+        readonly livingHidden: boolean,
+    ) {
+        this.persons = file.persons;
+        this.families = file.families;
+        this.index = new PersonIndex(this.persons);
+    }
+
+    person(id: number): Person | undefined {
+        return this.persons[id - 1];
+    }
+
+    // Throws LayoutError.
+    picture(state: ViewState): Picture {
+        const records = this.file.layout(state.focus, {
+            view: state.view,
+            sizes: sizesOf(state.view),
+            shown: shownBits(state),
+            generations: state.generations,
+            flagDepth: Math.max(1, state.generations - 1),
+        });
+        return new Picture(state.view, state.focus, records);
+    }
+
+    // Relatives of the first degree who have no box.
+    hiddenRelatives(id: number, picture: Picture): number {
+        const person = this.person(id);
+        if (!person) return 0;
+        const relatives = new Set([person.father, person.mother, ...person.spouses, ...person.children]);
+        relatives.delete(0);
+        return [...relatives].filter((relative) => !picture.shows(relative)).length;
+    }
+
+    // The focus stands first among all who could be one: whoever has the most relatives near.
+    bestFocus(): number {
+        let best = 1;
+        let most = -1;
+        for (const person of this.persons) {
+            const near = this.nearness(person);
+            if (near > most) [best, most] = [person.id, near];
+        }
+        return best;
+    }
+
+    personOfXref(xref: string): Person | undefined {
+        const plain = xref.replaceAll("@", "");
+        return plain ? this.persons.find((person) => person.xref === plain) : undefined;
+    }
+
+    // Asked for again and again with one focus, searched once.
+    kinshipsTo(focus: number): ReadonlyMap<number, Kinship> {
+        if (this.kinshipFocus !== focus || !this.kinships) {
+            this.kinships = allKinships(this.persons, this.families, focus);
+            this.kinshipFocus = focus;
+        }
+        return this.kinships;
+    }
+
+    siblingsOf(person: Person): number[] {
+        const siblings = new Set<number>();
+        for (const parent of [person.father, person.mother]) {
+            for (const child of this.person(parent)?.children ?? []) if (child !== person.id) siblings.add(child);
+        }
+        return [...siblings];
+    }
+
+    close(): void {
+        this.file.close();
+    }
+
+    // Two generations up and down and across, with parents worth most: a picture with all its parts.
+    private nearness(person: Person): number {
+        const parents = [person.father, person.mother].map((id) => this.person(id)).filter((parent) => parent !== undefined);
+        const grandparents = parents.reduce((n, parent) => n + (parent.father ? 1 : 0) + (parent.mother ? 1 : 0), 0);
+        const siblings = Math.min(6, parents[0]?.children.length ?? 0);
+        const children = Math.min(6, person.children.length);
+        const grandchildren = person.children.some((child) => (this.person(child)?.children.length ?? 0) > 0) ? 2 : 0;
+        return 3 * parents.length + 2 * grandparents + siblings + children + grandchildren + Math.min(2, person.spouses.length);
+    }
+}

@@ -1,0 +1,119 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What stands in each box and what is read out for it. Kinship is told only once it is known, since a search through
+// a large family must not hold up the picture.
+
+import type { Person, Sex } from "olvane";
+import { kinshipText } from "../kinship";
+import type { Messages } from "../messages";
+import type { UiMessages } from "../messages/ui";
+import { directionOf, nameOf, yearsOf } from "../names";
+import type { BoxLook } from "../scene/boxArt";
+import type { Dress } from "../scene/Scene";
+import type { OpenFamily } from "./OpenFamily";
+import type { Box, Picture } from "./Picture";
+
+export interface Wording {
+    readonly messages: Messages;
+    readonly ui: UiMessages;
+    readonly kinshipInBoxes: boolean;
+}
+
+export class PictureDress implements Dress {
+    kinshipKnown = false;
+
+    constructor(
+        private readonly family: OpenFamily,
+        private readonly picture: Picture,
+        private readonly wording: Wording,
+    ) {}
+
+    sexOf(box: Box): Sex {
+        return this.family.person(box.person)?.sex ?? "other";
+    }
+
+    // Empty where none is known, and for the focus.
+    kinshipOf(id: number): string {
+        if (id === this.picture.focus) return "";
+        const kinship = this.family.kinshipsTo(this.picture.focus).get(id);
+        return kinship ? kinshipText(kinship, this.family.person(id)?.sex ?? "other", this.wording.messages) : "";
+    }
+
+    hiddenOf(box: Box): number {
+        return box.hasHiddenRelatives ? this.family.hiddenRelatives(box.person, this.picture) : -1;
+    }
+
+    lookOf(box: Box): BoxLook {
+        const person = this.family.person(box.person);
+        return person ? this.personLook(person, box) : this.missingLook(box);
+    }
+
+    private personLook(person: Person, box: Box): BoxLook {
+        const isFocus = box === this.picture.focusBox;
+        const boxes = this.picture.boxesOf(person.id).length;
+        const kinship = this.kinshipKnown ? this.kinshipOf(person.id) : "";
+        const hidden = this.hiddenOf(box);
+        const { ui, messages } = this.wording;
+        const label = [
+            nameOf(person, messages),
+            yearsOf(person, messages),
+            isFocus ? ui.inFocus : kinship,
+            boxes > 1 && ui.severalBoxes(boxes),
+            hidden >= 0 && ui.hiddenCount(hidden),
+        ];
+        return {
+            person: person.id,
+            xref: person.xref,
+            sex: person.sex,
+            nameParts: nameParts(person, messages),
+            rightToLeft: directionOf(person.name) === "rtl",
+            years: shortYears(person),
+            kinship: this.wording.kinshipInBoxes ? withoutExplanation(kinship) : null,
+            hidden,
+            repeated: boxes > 1,
+            isFocus,
+            label: label.filter(Boolean).join(", "),
+        };
+    }
+
+    private missingLook(box: Box): BoxLook {
+        const { ui, messages } = this.wording;
+        const child = this.family.person(box.child);
+        const what = box.kind === "missingFather" ? ui.missingFather : ui.missingMother;
+        return {
+            person: 0,
+            xref: "",
+            sex: box.kind === "missingFather" ? "male" : "female",
+            nameParts: [what],
+            rightToLeft: false,
+            years: "",
+            kinship: null,
+            hidden: -1,
+            repeated: false,
+            isFocus: false,
+            label: child ? ui.missingOf(what, nameOf(child, messages)) : what,
+        };
+    }
+}
+
+// The same in every language: "1809–1882", "* ~1809", "† 1882", and a cross alone for a death without a year.
+export function shortYears(person: Person): string {
+    const birth = person.birth?.year ? person.birth.shown : "";
+    const death = person.death?.year ? person.death.shown : "";
+    if (birth && death) return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
+    if (death) return "\u2020 " + death;
+    return [birth && "* " + birth, person.dead && "\u2020"].filter(Boolean).join("  ");
+}
+
+// Surname first where the file writes it first.
+function nameParts(person: Person, messages: Messages): string[] {
+    const { given, surname, name } = person;
+    if (!given || !surname) return [nameOf(person, messages)];
+    return name.startsWith(surname) && !name.endsWith(surname) ? [surname, given] : [given, surname];
+}
+
+// "uncle (mother's brother)" is "uncle" where there is little room.
+function withoutExplanation(kinship: string): string {
+    return kinship.replace(/ \([^)]*\)$/, "");
+}

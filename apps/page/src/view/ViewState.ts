@@ -1,0 +1,88 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
+
+import type { Person } from "olvane";
+
+export type ViewName = "family" | "pedigree";
+
+export interface ViewState {
+    readonly focus: number;
+    readonly view: ViewName;
+    // Columns of the pedigree, the focus's own included.
+    readonly generations: number;
+    // Names of kRelatives that are switched off.
+    readonly hidden: ReadonlySet<RelativeName>;
+}
+
+// In the order of the switches. A bit is the engine's own.
+export const kRelatives = {
+    siblings: 0x04,
+    siblingSpouses: 0x08,
+    niecesNephews: 0x10,
+    auntsUncles: 0x01,
+    cousins: 0x02,
+    greatGrandparents: 0x40,
+    spousesOfChildren: 0x80,
+    grandchildren: 0x20,
+} as const;
+
+export type RelativeName = keyof typeof kRelatives;
+export const kRelativeNames = Object.keys(kRelatives) as RelativeName[];
+
+export const kLeastGenerations = 2;
+export const kMostGenerations = 10;
+export const kUsualGenerations = 5;
+
+export function shownBits(state: ViewState): number {
+    return kRelativeNames.reduce((bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]), 0);
+}
+
+export function sameState(a: ViewState, b: ViewState): boolean {
+    return (
+        a.focus === b.focus &&
+        a.view === b.view &&
+        a.generations === b.generations &&
+        a.hidden.size === b.hidden.size &&
+        [...a.hidden].every((name) => b.hidden.has(name))
+    );
+}
+
+// "#person=I17&view=pedigree&generations=6&hide=cousins,siblings"; what has its usual value is left out.
+export function addressOf(state: ViewState, persons: readonly Person[]): string {
+    const parts = new URLSearchParams();
+    const person = persons[state.focus - 1];
+    if (person?.xref) parts.set("person", person.xref);
+    else parts.set("number", String(state.focus));
+    if (state.view !== "family") parts.set("view", state.view);
+    if (state.generations !== kUsualGenerations) parts.set("generations", String(state.generations));
+    if (state.hidden.size > 0) parts.set("hide", [...state.hidden].join(","));
+    return "#" + parts.toString().replaceAll("%2C", ",");
+}
+
+// Whatever an address does not tell, or tells wrongly, is as in the state that it is read into.
+export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {
+    const parts = new URLSearchParams(address.replace(/^#/, ""));
+    if (![...parts.keys()].some((key) => ["person", "number", "view", "generations", "hide"].includes(key))) return usual;
+    const view = parts.get("view");
+    const hidden = (parts.get("hide") ?? "").split(",").filter((name): name is RelativeName => name in kRelatives);
+    return {
+        focus: focusIn(parts, persons) || usual.focus,
+        view: view === "pedigree" ? "pedigree" : "family",
+        generations: clampGenerations(Number(parts.get("generations") ?? kUsualGenerations)),
+        hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
+    };
+}
+
+export function clampGenerations(generations: number): number {
+    if (!Number.isFinite(generations)) return kUsualGenerations;
+    return Math.min(kMostGenerations, Math.max(kLeastGenerations, Math.round(generations)));
+}
+
+function focusIn(parts: URLSearchParams, persons: readonly Person[]): number {
+    const xref = parts.get("person")?.replaceAll("@", "");
+    if (xref) return persons.find((person) => person.xref === xref)?.id ?? 0;
+    const id = Number(parts.get("number"));
+    return Number.isInteger(id) && persons[id - 1] ? id : 0;
+}
