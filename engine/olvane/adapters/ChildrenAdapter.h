@@ -30,7 +30,13 @@ struct OLVANE_API ChildrenAdapter {
     // equivalent only when the real parent's record has no date either. Whether such a child counts as shared
     // by both parents hangs on that, so comparing by key alone would move half siblings in every chart with
     // an unknown parent.
-    bool operator<(const ChildrenAdapter& other) const;
+    bool operator<(const ChildrenAdapter& other) const {
+        if (hostOrder >= 1 && other.hostOrder >= 1) return key < other.key;
+        return isLessByTexts(other);
+    }
+
+private:
+    bool isLessByTexts(const ChildrenAdapter& other) const;
 };
 
 typedef std::set<ChildrenAdapter, std::less<ChildrenAdapter>, olvane::ArenaAllocator<ChildrenAdapter>>

@@ -92,11 +92,19 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
         getChildOfAddNode(glue, key, children);
         return;
     }
+    // Children met for the first time come in the order of the set. Records that were there before may lack a
+    // place, and then the way by which a record comes in decides where it goes.
+    const bool endFirst = children.empty();
     int place = 0;
     for (const std::int64_t entry : host(manager).childrenForPersonWithID(id)) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
         std::string date = stringToString(host(manager).dateForPersonWithID(lowBits(entry), true));
-        children.emplace(childKey, std::move(date), glue.personOfKey(childKey), ++place);
+        ChildrenAdapter child(childKey, std::move(date), glue.personOfKey(childKey), ++place);
+        if (endFirst) {
+            children.insert(children.end(), std::move(child));
+        } else {
+            children.insert(std::move(child));
+        }
     }
 }
 

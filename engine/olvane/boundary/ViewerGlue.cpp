@@ -19,10 +19,6 @@ namespace {
 
 constexpr std::size_t kFirstSlots = 64;
 
-[[noreturn]] void failToFind() {
-    throw std::out_of_range("Unable to find key in unordered_map.");
-}
-
 std::size_t scattered(int number) {
     const std::uint64_t product = static_cast<std::uint32_t>(number) * std::uint64_t{0x9E3779B97F4A7C15};
     return static_cast<std::size_t>(product >> 32);
@@ -63,6 +59,10 @@ int ViewerGlue::keyOfNumber(int id) {
     return key;
 }
 
+void ViewerGlue::failToFind() {
+    throw std::out_of_range("Unable to find key in unordered_map.");
+}
+
 int ViewerGlue::addEntry(int number, const std::string* oddText) {
     const int key = static_cast<int>(entries_.size());
     entries_.push_back(KeyEntry{number, kNone, oddText});
@@ -75,11 +75,6 @@ void ViewerGlue::growSlots() {
     for (const NumberSlot& slot : smaller) {
         if (slot.key != kNone) findSlot(slots_, slot.number, kNone) = slot;
     }
-}
-
-const ViewerGlue::KeyEntry& ViewerGlue::entryOfKey(int key) const {
-    if (key < 0 || static_cast<std::size_t>(key) >= entries_.size()) failToFind();
-    return entries_[static_cast<std::size_t>(key)];
 }
 
 std::string ViewerGlue::personOfKey(int key) const {

@@ -107,7 +107,12 @@ private:
         int key = kNone;
     };
 
-    const KeyEntry& entryOfKey(int key) const;
+    const KeyEntry& entryOfKey(int key) const {
+        if (static_cast<std::size_t>(key) >= entries_.size())
+            failToFind();  // no list is as long as a key below 0
+        return entries_[static_cast<std::size_t>(key)];
+    }
+    [[noreturn]] static void failToFind();
     int addEntry(int number, const std::string* oddText);
     void growSlots();
     int knownKeyOf(const std::string& personText) const;

@@ -19,6 +19,7 @@
 // lines that hang from a couple. Nothing here reads the lines on edges back.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/graph/WholePoint.h>
 #include <olvane/layouter/LineCourse.h>
 
@@ -41,7 +42,7 @@ void TreeViewFamilyLayouter::addSpouseLinesToPerson(TreeViewPerson& person) {
     const float offsetStep = male ? -1.0f : 1.0f;
     int lineOffset = getLineOffset(person.getSpouseCount(), male);
 
-    person.spouseIterator([&](TreeViewPerson& spouse) {
+    for (TreeViewPerson& spouse : person.spouses) {
         const TreePoint own = person.getNodeCenter();
         const TreePoint other = spouse.getNodeCenter();
         const float dropX = male ? other.x - treeSize.horzPadding * 0.5f
@@ -54,14 +55,14 @@ void TreeViewFamilyLayouter::addSpouseLinesToPerson(TreeViewPerson& person) {
         person.addSpouseLine(spouse.personId, x1, y, x2, y);
         lineOffset =
             olvane::wholePoint(treeSize.spouseLineStep * offsetStep + static_cast<float>(lineOffset));
-    });
+    }
 }
 
 // The order of the three stages is the order of the segments in every list.
 void TreeViewFamilyLayouter::addLinesToPerson(TreeViewPerson& person) {
-    person.childAndSpouseIterator(
-        [&](TreeViewPerson& child, TreeViewPerson& spouse) { addChildLine(person, child, spouse); });
-    person.allSiblingsIterator(false, [&](TreeViewPerson& sibling) { addSiblingLine(person, sibling); });
+    visitChildrenAndSpouses(
+        person, [&](TreeViewPerson& child, TreeViewPerson& spouse) { addChildLine(person, child, spouse); });
+    for (TreeViewPerson& sibling : person.siblings) addSiblingLine(person, sibling);
     addParentLines(person);
 }
 
@@ -198,7 +199,7 @@ TreeViewFamilyLayouter::ParentsCourse TreeViewFamilyLayouter::courseOfParentsLin
                                                                                   TreeViewPerson& mother) {
     const float fatherEndX = father.getNodeCenter().x + treeSize.nodeWidth;
     if (!(mother.getNodeCenter().x > fatherEndX)) return ParentsCourse::fromFather;
-    father.getNonDisplayedSpouseIterator(dataAdapter->getSpouses);
+    father.getNonDisplayedSpouses(dataAdapter->getSpouses);
     if (father.getNonDisplayedSpouseCount() == 0) return ParentsCourse::fromMother;
     if (father.nonDisplayedSpouses.front().personId == mother.personId) return ParentsCourse::fromMother;
     if (!dataAdapter->isAddNode(mother.personId)) return ParentsCourse::fromFather;

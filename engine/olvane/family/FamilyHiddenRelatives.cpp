@@ -9,6 +9,7 @@
 // source's answers, they use up synthetic ids in a fixed order, and they alone decide about add-nodes.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/layouter/HiddenRelativesInternal.h>
 
 #include <algorithm>
@@ -23,19 +24,19 @@ void TreeViewFamilyLayouter::flagNonDisplayedRelationships(TreeViewPerson& focus
     clearVisitedMarks();
     flagNonDisplayedRelationshipsForSpouses(focus, false);
     collectShownPersons();
-    graphIterator([this](TreeViewPerson& person) { flagAgainstWholeDisplay(person); });
+    for (TreeViewPerson* person : stackedPersons) flagAgainstWholeDisplay(*person);
     stackedPersons.clear();
     shownKeys.clear();
 }
 
 void TreeViewFamilyLayouter::flagSiblings(TreeViewPerson& focus) {
-    focus.allSiblingsIterator(false, [&](TreeViewPerson& sibling) {
+    for (TreeViewPerson& sibling : focus.siblings) {
         if (sibling.allChildrenLoaded) flagNonDisplayedRelationshipsForSpouses(sibling, true);
         if (!sibling.hasNonDisplayedRelationships && hasParents(sibling)) {
             sibling.hasNonDisplayedRelationships = siblingHasAnotherParent(sibling, focus);
         }
         checkPersonsChildren(sibling);
-    });
+    }
 }
 
 bool TreeViewFamilyLayouter::siblingHasAnotherParent(TreeViewPerson& sibling, TreeViewPerson& focus) {
@@ -49,7 +50,7 @@ bool TreeViewFamilyLayouter::siblingHasAnotherParent(TreeViewPerson& sibling, Tr
 }
 
 void TreeViewFamilyLayouter::flagChildren(TreeViewPerson& focus) {
-    focus.allChildrenIterator(true, [&](TreeViewPerson& child) {
+    visitAllChildren(focus, true, [&](TreeViewPerson& child) {
         checkChildForUnshownParents(focus, child);
         flagNonDisplayedRelationshipsForSpouses(child, true);
         checkPersonsChildren(child);
@@ -62,10 +63,8 @@ void TreeViewFamilyLayouter::clearVisitedMarks() {
 }
 
 void TreeViewFamilyLayouter::collectShownPersons() {
-    graphIterator([this](TreeViewPerson& person) {
-        stackedPersons.push_back(&person);
-        shownKeys.insert(person.personId);
-    });
+    stackedPersons = everyPerson();
+    for (const TreeViewPerson* person : stackedPersons) shownKeys.insert(person->personId);
 }
 
 void TreeViewFamilyLayouter::flagAgainstWholeDisplay(TreeViewPerson& person) {
@@ -80,11 +79,11 @@ namespace {
 
 // A relative counts as shown if any node with its key stands anywhere on the display. Where as many are drawn
 // under the person as the data source knows, nobody is looked up.
-template <class Records, class Keys>
-bool someAreHidden(const Records& records, int drawnUnderPerson, const Keys& shownKeys) {
+template <class Records>
+bool someAreHidden(const Records& records, int drawnUnderPerson, const KeySet& shownKeys) {
     if (static_cast<int>(records.size()) == drawnUnderPerson) return false;
     return std::any_of(records.begin(), records.end(),
-                       [&](const auto& record) { return shownKeys.find(record.key) == shownKeys.end(); });
+                       [&](const auto& record) { return !shownKeys.contains(record.key); });
 }
 
 }  // namespace
@@ -115,12 +114,12 @@ bool TreeViewFamilyLayouter::hasHiddenParent(TreeViewPerson& person) {
 
 bool TreeViewFamilyLayouter::isShownOrUnknown(int parentKey) {
     return parentKey == TreeViewPerson::kNoKey || dataAdapter->isAddNode(parentKey) ||
-           shownKeys.find(parentKey) != shownKeys.end();
+           shownKeys.contains(parentKey);
 }
 
 void TreeViewFamilyLayouter::flagNonDisplayedRelationshipsForSpouses(TreeViewPerson& person,
                                                                      bool checkChildren) {
-    person.spouseIterator([&](TreeViewPerson& spouse) {
+    for (TreeViewPerson& spouse : person.spouses) {
         bool flag = spouseHasRelativesElsewhere(*this, spouse);
         if (checkChildren) {
             const ChildrenSet& children = spouse.getAllChildrenVector(dataAdapter->getChildren);
@@ -131,7 +130,7 @@ void TreeViewFamilyLayouter::flagNonDisplayedRelationshipsForSpouses(TreeViewPer
             }
         }
         spouse.hasNonDisplayedRelationships = flag;
-    });
+    }
 }
 
 // The host's spouses of the parent are loaded where the couple is not on the chart. How many there are

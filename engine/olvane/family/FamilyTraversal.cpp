@@ -6,6 +6,8 @@
 // skips, by id, is a person's own entry among its siblings.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
+
+#include <olvane/family/FamilyTraversalInternal.h>
 #include <olvane/layouter/AncestorStackingInternal.h>
 
 namespace SharedTreeViewer {
@@ -15,14 +17,13 @@ void TreeViewFamilyLayouter::graphIterator(const Visitor& visitor) {
 }
 
 void TreeViewFamilyLayouter::graphIteratorHelper(TreeViewPerson& person, const Visitor& visitor) {
-    visitor(person);
-    const Visitor goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
-    person.parentsIterator(goOn);
-    person.spouseIterator(goOn);
-    person.allChildrenIterator(false, goOn);
-    person.allSiblingsIterator(false, [&](TreeViewPerson& sibling) {
-        if (sibling.personId != person.personId) graphIteratorHelper(sibling, visitor);
-    });
+    visitGraph(person, visitor);
+}
+
+std::vector<TreeViewPerson*> TreeViewFamilyLayouter::everyPerson() {
+    std::vector<TreeViewPerson*> persons;
+    visitGraph(focusPerson, [&persons](TreeViewPerson& person) { persons.push_back(&person); });
+    return persons;
 }
 
 void TreeViewFamilyLayouter::iterateDirectLineFromFocusPerson(const DirectLineVisitor& visitor) {

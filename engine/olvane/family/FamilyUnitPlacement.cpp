@@ -47,9 +47,9 @@ void TreeViewFamilyLayouter::placeManAndNonCombinedSpouses(TreeViewPerson& man, 
                                                            int offset) {
     layoutUnknownChildrenAndPerson(man, x, y);
     float runningX = x + man.layoutWidth + treeSize.horzPadding;
-    man.spouseIterator([&](TreeViewPerson& spouse) {
+    for (TreeViewPerson& spouse : man.spouses) {
         layoutSpouse(spouse, man.getChildrenIterator(spouse.personId), y, &runningX, &offset, true);
-    });
+    }
 }
 
 // The offset runs away from zero here, unlike for a woman in a couple. Nothing draws by it; hosts that read
@@ -57,9 +57,9 @@ void TreeViewFamilyLayouter::placeManAndNonCombinedSpouses(TreeViewPerson& man, 
 void TreeViewFamilyLayouter::placeNonCombinedSpousesAndWoman(TreeViewPerson& woman, float x, float y,
                                                              int offset) {
     float runningX = x;
-    woman.spouseIterator([&](TreeViewPerson& spouse) {
+    for (TreeViewPerson& spouse : woman.spouses) {
         layoutSpouse(spouse, woman.getChildrenIterator(spouse.personId), y, &runningX, &offset, true);
-    });
+    }
     layoutUnknownChildrenAndPerson(woman, runningX, y);
 }
 

@@ -24,7 +24,7 @@ float TreeViewFamilyLayouter::couplesWidth() const {
 
 void TreeViewFamilyLayouter::calculateLayoutWidthForDescendantsOfProximalPerson(TreeViewPerson& person) {
     person.isProximalPerson = true;
-    person.spouseIterator([&](TreeViewPerson& spouse) { measureSpouse(person, spouse); });
+    for (TreeViewPerson& spouse : person.spouses) measureSpouse(person, spouse);
     const float unknown = unknownChildrenWidth(person);
     person.layoutWidth = treeSize.nodeWidth > unknown ? treeSize.nodeWidth : unknown;
 }
@@ -53,14 +53,14 @@ float TreeViewFamilyLayouter::sharedChildrenWidth(TreeViewPerson& person, TreeVi
     const bool loneChild = person.getChildrenWithSpouseCount(spouse.personId) == 1 &&
                            spouse.getChildrenWithNoOtherParentCount() == 0;
     float shared = 0.0f;
-    person.childrenIterator(spouse.personId, [&](TreeViewPerson& child) {
+    for (TreeViewPerson& child : person.childrenUnder(spouse.personId)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         shared = shared + familyUnitWidthForProximalPerson(child);
         if (loneChild && shared == treeSize.nodeWidth) {
             shared = shared + (treeSize.nodeWidth + treeSize.horzPadding);
             child.layoutWidth = shared;
         }
-    });
+    }
     return shared;
 }
 
@@ -72,23 +72,23 @@ void TreeViewFamilyLayouter::measureSpouseWithoutSharedChildren(TreeViewPerson& 
 
 float TreeViewFamilyLayouter::addWidthsForStepChildrenFromSpouse(TreeViewPerson& spouse) {
     float sum = 0.0f;
-    spouse.childrenIterator(TreeViewPerson::kNoKey, [&](TreeViewPerson& child) {
+    for (TreeViewPerson& child : spouse.childrenUnder(TreeViewPerson::kNoKey)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         sum = sum + child.layoutWidth;
-    });
+    }
     return sum;
 }
 
 float TreeViewFamilyLayouter::unknownChildrenWidth(TreeViewPerson& person) {
     float unknown = 0.0f;
-    person.childrenIterator(TreeViewPerson::kNoKey, [&](TreeViewPerson& child) {
+    for (TreeViewPerson& child : person.childrenUnder(TreeViewPerson::kNoKey)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         unknown = unknown + child.layoutWidth;
-        child.spouseIterator([&](TreeViewPerson& spouse) {
+        for (const TreeViewPerson& spouse : child.spouses) {
             unknown = unknown + spouse.layoutWidth;
             unknown = unknown + treeSize.horzPadding;
-        });
-    });
+        }
+    }
     return unknown + horzPaddingForNodesCount(person.getChildrenWithNoOtherParentCount());
 }
 

@@ -130,8 +130,9 @@ void TreeViewFamilyLayouter::placeGreatGrandparents() {
 }
 
 void TreeViewFamilyLayouter::drawLines() {
-    graphIterator([this](TreeViewPerson& person) { addSpouseLinesToPerson(person); });
-    graphIterator([this](TreeViewPerson& person) { addLinesToPerson(person); });
+    const std::vector<TreeViewPerson*> persons = everyPerson();
+    for (TreeViewPerson* person : persons) addSpouseLinesToPerson(*person);
+    for (TreeViewPerson* person : persons) addLinesToPerson(*person);
 }
 
 float TreeViewFamilyLayouter::parentY() const {

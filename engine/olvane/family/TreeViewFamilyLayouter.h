@@ -3,12 +3,11 @@
 
 #pragma once
 
-#include <boost/unordered_set.hpp>
-
 #include <vector>
 
 #include <olvane/Export.h>
 #include <olvane/layouter/DirectLine.h>
+#include <olvane/layouter/KeySet.h>
 #include <olvane/layouter/TreeViewLayouter.h>
 
 namespace SharedTreeViewer {
@@ -105,6 +104,7 @@ private:
     void placeAuntsAndUncles();
     void placeGreatGrandparents();
     void drawLines();
+    std::vector<TreeViewPerson*> everyPerson();  // in the order of the result; good while no list grows
     float parentY() const;
     float grandparentY() const;
     float greatGrandparentY() const;
@@ -164,8 +164,8 @@ private:
         bool spousesOfChildren = true;
     };
     Options show;
-    float rightEdge = 0.0f;               // of what the last placement of siblings reached
-    boost::unordered_set<int> shownKeys;  // the keys of stackedPersons while the whole display is in it
+    float rightEdge = 0.0f;  // of what the last placement of siblings reached
+    KeySet shownKeys;        // the keys of stackedPersons while the whole display is in it
 };
 
 }  // namespace SharedTreeViewer

@@ -8,6 +8,7 @@
 // Asking for children by key leaves an empty list under a key that is missing. An empty list behaves as no
 // list everywhere, so nobody can tell; a constant person cannot answer these questions, though.
 
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/graph/TreeViewPerson.h>
 
 #include <algorithm>
@@ -59,13 +60,7 @@ void TreeViewPerson::greatGrandparentsIterator(const Visitor& visitor) {
 }
 
 void TreeViewPerson::allChildrenIterator(bool includeBastards, const Visitor& visitor) {
-    if (gender) childrenIterator(kNoKey, visitor);
-    for (TreeViewPerson& spouse : spouses) {
-        if (gender) childrenIterator(spouse.personId, visitor);
-        if (includeBastards) spouse.childrenIterator(kNoKey, visitor);
-        if (!gender) childrenIterator(spouse.personId, visitor);
-    }
-    if (!gender) childrenIterator(kNoKey, visitor);
+    visitAllChildren(*this, includeBastards, visitor);
 }
 
 void TreeViewPerson::allChildrenWithSpouseIterator(TreeViewPerson& spouse, const Visitor& visitor) {
@@ -77,12 +72,7 @@ void TreeViewPerson::allChildrenWithSpouseIterator(TreeViewPerson& spouse, const
 }
 
 void TreeViewPerson::childAndSpouseIterator(const PairVisitor& visitor) {
-    const auto visitChildrenWith = [&visitor, this](int key, TreeViewPerson& other) {
-        for (TreeViewPerson& child : childrenUnder(key)) visitor(child, other);
-    };
-    if (gender) visitChildrenWith(kNoKey, *this);
-    for (TreeViewPerson& spouse : spouses) visitChildrenWith(spouse.personId, spouse);
-    if (!gender) visitChildrenWith(kNoKey, *this);
+    visitChildrenAndSpouses(*this, visitor);
 }
 
 // From self: outward to the left from the person's own entry, then that entry, then on to the right. Without
@@ -148,6 +138,11 @@ TreeViewPerson::Iterator TreeViewPerson::getChildrenAndBastardsWithSpouseIterato
 }
 
 TreeViewPerson::Iterator TreeViewPerson::getNonDisplayedSpouseIterator(const SpousesLoader& loader) {
+    getNonDisplayedSpouses(loader);
+    return [this](const Visitor& visitor) { nonDisplayedSpouseIterator(visitor); };
+}
+
+TreeViewPerson::Persons& TreeViewPerson::getNonDisplayedSpouses(const SpousesLoader& loader) {
     if (!nonDisplayedSpousesLoaded) {
         nonDisplayedSpousesLoaded = true;
         SpouseSet records(arena());
@@ -155,7 +150,7 @@ TreeViewPerson::Iterator TreeViewPerson::getNonDisplayedSpouseIterator(const Spo
         nonDisplayedSpouses.reserve(nonDisplayedSpouses.size() + records.size());
         for (const SpouseAdapter& record : records) addNonDisplayedSpouse(record.key);
     }
-    return [this](const Visitor& visitor) { nonDisplayedSpouseIterator(visitor); };
+    return nonDisplayedSpouses;
 }
 
 ChildrenSet& TreeViewPerson::getAllChildrenVector(const ChildrenLoader& loader) {

@@ -101,6 +101,12 @@ public:
     TreeViewPerson& getPreferredMother();
     TreeViewPerson& getPreferredSpouse();
 
+    // The children by that other parent. Leaves an empty list under a key that is missing.
+    Persons& childrenUnder(int key) {
+        const auto entry = children.find(key);
+        return entry != children.end() ? entry->second : addListOfChildren(key);
+    }
+
     // --- Walks. The order of a visit is the order on the page. None skips a person, asks for hasBeenVisited,
     // or guards an empty visitor: boost::bad_function_call comes with the first person, and never on an empty
     // walk. A visitor must not append to the list that is being walked.
@@ -129,6 +135,7 @@ public:
     // --- Loaders: ask the data source at most once for each node. The mark is set before the question, so a
     // loader that throws is not asked again.
     Iterator getNonDisplayedSpouseIterator(const SpousesLoader& loader);  // loads, then offers the walk
+    Persons& getNonDisplayedSpouses(const SpousesLoader& loader);         // loads, then offers the list
     ChildrenSet& getAllChildrenVector(const ChildrenLoader& loader);  // the ordered set, whatever its name
 
     // --- Counts. Those that ask for children by key leave an empty list under a key that is missing.
@@ -187,8 +194,8 @@ public:
 
 private:
     olvane::Arena* arena() const { return parents.get_allocator().arena(); }
-    Persons& childrenUnder(int key);  // both make the list where there is none
-    Segments& linesTo(int spouseKey);
+    Persons& addListOfChildren(int key);
+    Segments& linesTo(int spouseKey);  // makes the list where there is none
 
     bool hasBeenVisited_ = false;  // mark of the traversals that enter a node once
 };

@@ -32,6 +32,8 @@ bool allHavePlaces(const ChildrenSet& set) {
 // set was filled with all of them: one plain insert after another.
 class ChildrenOfOthers {
 public:
+    explicit ChildrenOfOthers(olvane::Arena& memory) : sets_(&memory), together_(&memory) {}
+
     void add(const ChildrenSet& children) {
         if (children.empty()) return;
         sets_.push_back(&children);
@@ -54,20 +56,22 @@ private:
         }
     }
 
-    std::vector<const ChildrenSet*> sets_;
+    TreeViewPerson::List<const ChildrenSet*> sets_;
     bool allHavePlaces_ = true;
     ChildrenSet together_;
 };
 
-ChildrenSet copyOf(const std::vector<const ChildrenAdapter*>& records) {
+typedef TreeViewPerson::List<const ChildrenAdapter*> Records;
+
+ChildrenSet copyOf(const Records& records) {
     ChildrenSet set;
     for (const ChildrenAdapter* record : records) set.insert(*record);
     return set;
 }
 
 // Records of first that are equivalent to one of second, in the order of first.
-std::vector<const ChildrenAdapter*> commonRecords(const ChildrenSet& first, const ChildrenSet& second) {
-    std::vector<const ChildrenAdapter*> common;
+Records commonRecords(const ChildrenSet& first, const ChildrenSet& second, olvane::Arena* memory) {
+    Records common(memory);
     ChildrenSet::const_iterator a = first.begin();
     ChildrenSet::const_iterator b = second.begin();
     while (a != first.end() && b != second.end()) {
@@ -82,6 +86,13 @@ std::vector<const ChildrenAdapter*> commonRecords(const ChildrenSet& first, cons
         }
     }
     return common;
+}
+
+// The walk over a list, in the form of an Iterator.
+auto walkOver(TreeViewPerson::Persons& list) {
+    return [&list](const auto& visit) {
+        for (TreeViewPerson& person : list) visit(person);
+    };
 }
 
 }  // namespace
@@ -120,13 +131,15 @@ bool TreeViewLayouter::hasParents(TreeViewPerson& person) {
 void TreeViewLayouter::addAllChildrenToPerson(TreeViewPerson& person) {
     const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
     if (children.empty()) return;
-    addBastardChildrenToPerson(person, person.getSpouseIterator());
-    person.spouseIterator(
-        [&](TreeViewPerson& spouse) { addChildrenWithSpousesToPerson(person, spouse, children); });
+    addLoneChildren(person, childrenOfPersonAlone(person, walkOver(person.spouses)));
+    for (TreeViewPerson& spouse : person.spouses) addChildrenWithSpousesToPerson(person, spouse, children);
 }
 
 void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator) {
-    const Records alone = childrenOfPersonAlone(person, iterator);
+    addLoneChildren(person, childrenOfPersonAlone(person, iterator));
+}
+
+void TreeViewLayouter::addLoneChildren(TreeViewPerson& person, const Records& alone) {
     person.expectChildrenWithSpouse(TreeViewPerson::kNoKey, alone.size());
     for (const ChildrenAdapter* record : alone) {
         admit(record->key);
@@ -138,13 +151,13 @@ ChildrenSet TreeViewLayouter::getBastardChildrenOfPerson(TreeViewPerson& person,
     return copyOf(childrenOfPersonAlone(person, iterator));
 }
 
-TreeViewLayouter::Records TreeViewLayouter::childrenOfPersonAlone(TreeViewPerson& person,
-                                                                  const Iterator& iterator) {
-    Records alone;
+template <class Walk>
+TreeViewLayouter::Records TreeViewLayouter::childrenOfPersonAlone(TreeViewPerson& person, const Walk& walk) {
+    Records alone(&memory);
     const ChildrenSet& own = person.getAllChildrenVector(dataAdapter->getChildren);
     if (own.empty()) return alone;
-    ChildrenOfOthers others;
-    iterator([&](TreeViewPerson& other) {
+    ChildrenOfOthers others(memory);
+    walk([&](TreeViewPerson& other) {
         if (other.personId != person.personId)
             others.add(other.getAllChildrenVector(dataAdapter->getChildren));
     });
@@ -156,14 +169,14 @@ TreeViewLayouter::Records TreeViewLayouter::childrenOfPersonAlone(TreeViewPerson
 
 ChildrenSet TreeViewLayouter::getIntersectingVector(const ChildrenSet& first,
                                                     const ChildrenSet& second) const {
-    return copyOf(commonRecords(first, second));
+    return copyOf(commonRecords(first, second, nullptr));
 }
 
 void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, TreeViewPerson& spouse,
                                                       const ChildrenSet& children) {
     if (children.empty()) return;
     const ChildrenSet& spousesChildren = spouse.getAllChildrenVector(dataAdapter->getChildren);
-    const Records common = commonRecords(children, spousesChildren);
+    const Records common = commonRecords(children, spousesChildren, &memory);
     person.expectChildrenWithSpouse(spouse.personId, common.size());
     for (const ChildrenAdapter* record : common) {
         int child = record->key;
@@ -210,7 +223,7 @@ void TreeViewLayouter::addSiblingsToPerson(TreeViewPerson& person) {
 void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) {
     TreeViewPerson& father = person.getPreferredFather();
     bool personIsAmongThem = false;
-    const Records alone = childrenOfPersonAlone(father, person.getParentIterator());
+    const Records alone = childrenOfPersonAlone(father, walkOver(person.parents));
     person.siblings.reserve(person.siblings.size() + alone.size());
     for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {
@@ -225,7 +238,7 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
     TreeViewPerson& mother = person.getPreferredMother();
     const ChildrenSet& fathersChildren = father.getAllChildrenVector(dataAdapter->getChildren);
     const ChildrenSet& mothersChildren = mother.getAllChildrenVector(dataAdapter->getChildren);
-    const Records common = commonRecords(fathersChildren, mothersChildren);
+    const Records common = commonRecords(fathersChildren, mothersChildren, &memory);
     person.siblings.reserve(person.siblings.size() + common.size());
     for (const ChildrenAdapter* record : common) {
         person.addSibling(record->key, dataAdapter->isMale(record->key));
@@ -234,7 +247,7 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
 
 void TreeViewLayouter::addMotherSide(TreeViewPerson& person) {
     TreeViewPerson& mother = person.getPreferredMother();
-    const Records alone = childrenOfPersonAlone(mother, person.getParentIterator());
+    const Records alone = childrenOfPersonAlone(mother, walkOver(person.parents));
     person.siblings.reserve(person.siblings.size() + alone.size());
     for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {

@@ -4,12 +4,13 @@
 // Looks for relatives off the picture, shared by the views. Each view decides on its own when to look and
 // what a later look may overwrite; here stands only what the two ask in the very same words.
 
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/layouter/HiddenRelativesInternal.h>
 
 namespace SharedTreeViewer {
 
 void loadHostSpouses(TreeViewLayouter& layouter, TreeViewPerson& person) {
-    person.getNonDisplayedSpouseIterator(layouter.dataAdapter->getSpouses);
+    person.getNonDisplayedSpouses(layouter.dataAdapter->getSpouses);
 }
 
 void flagGreatGrandparentsWithParents(TreeViewLayouter& layouter, TreeViewPerson& focus) {
@@ -31,15 +32,15 @@ ParentKeys parentKeysOf(TreeViewLayouter& layouter, const TreeViewPerson& child)
 
 bool parentsAreAShownCouple(TreeViewLayouter& layouter, TreeViewPerson& parent, const ParentKeys& parents) {
     bool shown = false;
-    parent.spouseIterator([&](TreeViewPerson& spouse) {
-        if (layouter.dataAdapter->isAddNode(spouse.personId)) return;
+    for (const TreeViewPerson& spouse : parent.spouses) {
+        if (layouter.dataAdapter->isAddNode(spouse.personId)) continue;
         if (parents.has(spouse.personId) && parents.has(parent.personId)) shown = true;
-    });
+    }
     return shown;
 }
 
 void flagChildrenWithFamilies(TreeViewLayouter& layouter, TreeViewPerson& person) {
-    person.allChildrenIterator(true, [&layouter](TreeViewPerson& child) {
+    visitAllChildren(person, true, [&layouter](TreeViewPerson& child) {
         loadHostSpouses(layouter, child);
         child.hasNonDisplayedRelationships =
             child.getNonDisplayedSpouseCount() > 0 || child.getSpouseCount() > 0 ||

@@ -14,7 +14,11 @@ namespace SharedTreeViewer {
 
 TreeViewLayouter::TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
                                    const TreeSize& sizes)
-    : focusPerson(focusKey, &memory), options(optionValues), dataAdapter(data), treeSize(sizes) {
+    : focusPerson(focusKey, &memory),
+      options(optionValues),
+      dataAdapter(data),
+      treeSize(sizes),
+      shownPersons(&memory) {
     focusPerson.setGender(isMale != 0);
 }
 

@@ -5,8 +5,10 @@
 
 #include <boost/unordered_map.hpp>
 
+#include <functional>
 #include <map>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <olvane/Arena.h>
@@ -88,7 +90,8 @@ public:
     OptionMap options;
     DataAdapter* dataAdapter;
     TreeSize treeSize;
-    std::map<int, bool> shownPersons;  // keys admitted to the graph; the value is always true
+    // Keys admitted to the graph; the value is always true.
+    std::map<int, bool, std::less<int>, olvane::ArenaAllocator<std::pair<const int, bool>>> shownPersons;
 
 protected:
     ~TreeViewLayouter() = default;
@@ -96,13 +99,17 @@ protected:
     // The step from one row or column to the next.
     float rowStep() const;
 
-    void admit(int key) { shownPersons.emplace(key, true); }
+    // Mostly in the order of the keys, so the end is the place to look first.
+    void admit(int key) { shownPersons.emplace_hint(shownPersons.end(), key, true); }
     bool isAdmitted(int key) const { return shownPersons.find(key) != shownPersons.end(); }
 
 private:
-    typedef std::vector<const ChildrenAdapter*> Records;  // in the sets where they lie
+    typedef TreeViewPerson::List<const ChildrenAdapter*> Records;  // in the sets where they lie
 
-    Records childrenOfPersonAlone(TreeViewPerson& person, const Iterator& iterator);
+    // Walk calls a visitor for each of the others, as an Iterator does.
+    template <class Walk>
+    Records childrenOfPersonAlone(TreeViewPerson& person, const Walk& walk);
+    void addLoneChildren(TreeViewPerson& person, const Records& alone);
     void addFatherSide(TreeViewPerson& person, bool motherIsReal);
     void addMotherSide(TreeViewPerson& person);
 };
