@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+import assert from "node:assert/strict";
+import { describe, test } from "node:test";
+import axe from "axe-core";
+import { visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
+import { brokenFamily } from "../support/families.mjs";
+
+async function expectNoViolation(visit, state) {
+    await visit.page.evaluate(axe.source);
+    const found = await visit.page.evaluate(async () => {
+        const { violations } = await window.axe.run(document, { resultTypes: ["violations"] });
+        return violations.map(({ id, help, nodes }) => `${id}: ${help}: ${nodes.slice(0, 3).map((node) => node.html.slice(0, 160)).join(" | ")}`);
+    });
+    assert.deepEqual(found, [], state);
+}
+
+describe("accessible", () => {
+    test("axe finds nothing on the title page", async () => {
+        for (const colorScheme of ["light", "dark"]) {
+            const visit = await visitEmpty({ colorScheme });
+            await expectNoViolation(visit, colorScheme);
+            await visit.end();
+        }
+    });
+
+    for (const [state, settings] of [
+        ["light", {}],
+        ["dark", { colorScheme: "dark" }],
+        ["high contrast", { contrast: "more" }],
+        ["a phone", { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true }],
+    ]) {
+        test(`axe finds nothing in either view: ${state}`, async () => {
+            const visit = await visitDarwins("#person=I1", settings);
+            await expectNoViolation(visit, "family");
+            await visit.click("#view-pedigree");
+            await expectNoViolation(visit, "pedigree");
+            await visit.end();
+        });
+    }
+
+    test("axe finds nothing while panels, lists and dialogs are open", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        await visit.click("#options-button");
+        await expectNoViolation(visit, "options");
+        await page.keyboard.press("Escape");
+        await visit.click("#file-button");
+        await expectNoViolation(visit, "file menu");
+        await page.click("#keys-button");
+        await expectNoViolation(visit, "keys");
+        await page.keyboard.press("Escape");
+        await page.click("#legend summary");
+        await page.fill("#search", "darwin");
+        await expectNoViolation(visit, "search and legend");
+        await visit.end();
+        const broken = await visitFamily(brokenFamily());
+        await broken.page.click("#diagnostics-button");
+        await expectNoViolation(broken, "diagnostics");
+        await broken.end();
+    });
+
+    test("the tabulator reaches everything, and back again", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        const reached = new Set();
+        for (let i = 0; i < 60; ++i) {
+            await page.keyboard.press("Tab");
+            const at = await page.evaluate(() => {
+                const element = document.activeElement;
+                return element.id || element.getAttribute("data-xref") || element.tagName;
+            });
+            reached.add(at);
+        }
+        for (const id of ["search", "view-family", "view-pedigree", "options-button", "file-button", "panel-button", "zoom-in", "fit", "I1"]) {
+            assert.ok(reached.has(id), `${id} among ${[...reached].join(" ")}`);
+        }
+        await visit.end();
+    });
+
+    test("what has the keys can be seen to have them", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        await page.keyboard.press("Tab");
+        await page.keyboard.press("Tab");
+        const outline = await page.evaluate(() => {
+            const { outlineStyle, outlineWidth, boxShadow } = getComputedStyle(document.activeElement);
+            return { outline: outlineStyle !== "none" && parseFloat(outlineWidth) > 0, shadow: boxShadow !== "none" };
+        });
+        assert.ok(outline.outline || outline.shadow);
+        const ring = (xref) => page.evaluate((xref) => {
+            const { stroke, opacity, display, visibility } = getComputedStyle(document.querySelector(`#tree [data-xref="${xref}"] .ring`));
+            return [stroke, opacity, display, visibility].join();
+        }, xref);
+        await visit.box("I1").focus();
+        const before = await ring("I12");
+        await visit.press("ArrowUp");
+        const at = await visit.keysOn();
+        assert.notEqual(await ring(at), before === (await ring(at)) ? before : "", `the box of ${at} shows it`);
+        await visit.end();
+    });
+
+    test("a change of the focus is announced", async () => {
+        const visit = await visitDarwins();
+        await visit.box("I12").click();
+        await visit.still();
+        const live = visit.page.locator("#live");
+        assert.equal(await live.getAttribute("aria-live"), "polite");
+        assert.match(await live.innerText(), /Robert Waring Darwin.*\d+ boxes/);
+        await visit.end();
+    });
+});

@@ -1,0 +1,142 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+import assert from "node:assert/strict";
+import { describe, test } from "node:test";
+import { photograph, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
+import { rightToLeftFamily } from "../support/families.mjs";
+
+const kPhone = { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true, deviceScaleFactor: 2 };
+
+// Nothing that can be used lies outside of the window or under something else.
+async function unreachable(visit) {
+    return visit.page.evaluate(() => {
+        const bad = [];
+        for (const part of document.querySelectorAll(".bar button, .bar input, .zoom button, #legend summary")) {
+            const { left, right, top, bottom, width } = part.getBoundingClientRect();
+            if (width === 0 || part.closest("[hidden]")) continue;
+            const over = document.elementFromPoint((left + right) / 2, (top + bottom) / 2);
+            const isOutside = left < 0 || top < 0 || right > innerWidth || bottom > innerHeight;
+            if (isOutside || (over !== part && !part.contains(over))) bad.push(part.id || part.outerHTML.slice(0, 80));
+        }
+        return bad;
+    });
+}
+
+describe("looks", () => {
+    test("on a window of a desk, everything can be reached", async () => {
+        const visit = await visitDarwins();
+        assert.deepEqual(await unreachable(visit), []);
+        await photograph(visit, "family");
+        await visit.end();
+    });
+
+    test("on a phone everything can be reached, and the panel is a sheet", async () => {
+        const visit = await visitDarwins("#person=I1", kPhone);
+        const { page } = visit;
+        assert.equal(await page.evaluate(() => document.documentElement.scrollWidth), 360);
+        assert.deepEqual(await unreachable(visit), []);
+        await photograph(visit, "phone");
+        const sheet = () => page.locator("#side-panel").boundingBox();
+        const down = await sheet();
+        assert.ok(down.y > 500, "most of the window is the picture's");
+        await page.tap("#side-panel .handle");
+        await page.waitForTimeout(400);
+        const up = await sheet();
+        assert.ok(up.y < down.y - 100);
+        await photograph(visit, "phone-panel");
+        await page.tap("#side-panel .handle");
+        await page.waitForTimeout(400);
+        const father = await visit.middleOf("I12");
+        await page.touchscreen.tap(father.x, father.y);
+        await visit.still();
+        assert.equal(await visit.focus(), "I12");
+        await visit.end();
+    });
+
+    test("the title page fits a phone", async () => {
+        const visit = await visitEmpty(kPhone);
+        await photograph(visit, "phone-title");
+        const { x, y, width, height } = await visit.page.locator("#choose-file").boundingBox();
+        assert.ok(x >= 0 && x + width <= 360 && y + height <= 740);
+        await visit.end();
+    });
+
+    test("themes follow the system or the choice, which is remembered", async () => {
+        const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
+        const { page } = visit;
+        const theme = () => page.evaluate(() => document.documentElement.dataset.theme);
+        const paper = () => page.evaluate(() => getComputedStyle(document.querySelector("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
+        assert.equal(await theme(), "dark");
+        await photograph(visit, "dark");
+        const dark = await paper();
+        await page.emulateMedia({ colorScheme: "light" });
+        assert.equal(await theme(), "light");
+        const light = await paper();
+        assert.notEqual(light, dark);
+        await visit.click("#options-button");
+        await page.selectOption("#theme", "contrast");
+        assert.equal(await theme(), "contrast");
+        await page.keyboard.press("Escape");
+        await photograph(visit, "contrast");
+        await page.reload();
+        await visit.untilFamily();
+        assert.equal(await theme(), "contrast");
+        await visit.end();
+    });
+
+    test("German is chosen by the browser's language, or by hand", async () => {
+        const visit = await visitDarwins("#person=I1", { locale: "de-AT" });
+        const { page } = visit;
+        assert.equal(await page.evaluate(() => document.documentElement.lang), "de");
+        assert.match(await page.innerText("#side-panel"), /Geburt\s+12\. Februar 1809/);
+        assert.match(await visit.label("I2"), /^Emma Wedgwood, 1808–1896, Ehefrau und Cousine ersten Grades/);
+        assert.match(await visit.label("I5"), /Großvater väterlicherseits/);
+        await photograph(visit, "german");
+        await visit.click("#options-button");
+        await page.selectOption("#language", "en");
+        await visit.still();
+        assert.equal(await page.evaluate(() => document.documentElement.lang), "en");
+        assert.match(await visit.label("I2"), /wife and first cousin/);
+        assert.equal(await visit.focus(), "I1", "the picture stays");
+        await visit.end();
+    });
+
+    test("names from right to left are laid out so", async () => {
+        const visit = await visitFamily(rightToLeftFamily(), {}, {}, "#person=I2");
+        const { page } = visit;
+        const directions = await page.$$eval('#tree [data-xref="I2"] .name', (lines) => lines.map((line) => line.getAttribute("direction")));
+        assert.ok(directions.length > 0 && directions.every((direction) => direction === "rtl"));
+        assert.ok((await page.locator('#tree [data-xref="I4"] .name[direction=rtl]').count()) === 0);
+        const panel = await page.evaluate(() => getComputedStyle(document.querySelector("#side-panel h2")).direction);
+        assert.equal(panel, "rtl");
+        const inside = await page.evaluate(() =>
+            [...document.querySelectorAll("#tree .box")].every((box) => {
+                const frame = box.querySelector(".frame").getBoundingClientRect();
+                return [...box.querySelectorAll("text.name, text.years")].every((line) => {
+                    const { left, right } = line.getBoundingClientRect();
+                    return left >= frame.left - 1 && right <= frame.right + 1;
+                });
+            }),
+        );
+        assert.ok(inside, "every line stays in its box");
+        await photograph(visit, "right-to-left");
+        await visit.click("#view-pedigree");
+        await photograph(visit, "right-to-left-pedigree");
+        await visit.end();
+    });
+
+    test("who wants no movement sees none", async () => {
+        const visit = await visitDarwins("#person=I1", { reducedMotion: "reduce" });
+        const middle = await visit.middleOf("I12");
+        await visit.page.mouse.click(middle.x, middle.y);
+        const at = await visit.placing();
+        const places = await visit.places();
+        await visit.page.waitForTimeout(200);
+        assert.deepEqual(await visit.placing(), at);
+        assert.deepEqual(await visit.places(), places);
+        const running = await visit.page.evaluate(() => document.getAnimations().filter((one) => one.playState === "running").length);
+        assert.equal(running, 0);
+        await visit.end();
+    });
+});

@@ -1,0 +1,110 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+import assert from "node:assert/strict";
+import { deflateRawSync } from "node:zlib";
+import { describe, test } from "node:test";
+import { photograph, sample, visitDarwins, visitEmpty } from "../support/browser.mjs";
+import { brokenFamily } from "../support/families.mjs";
+
+const kDarwins = sample("darwin-wedgwood.ged");
+
+describe("opening", () => {
+    test("without a family the page invites one in", async () => {
+        const visit = await visitEmpty();
+        assert.ok(await visit.page.isVisible("#drop-zone h1"));
+        const chosen = visit.page.waitForEvent("filechooser");
+        await visit.page.click("#choose-file");
+        await (await chosen).setFiles({ name: "darwin-wedgwood.ged", mimeType: "", buffer: kDarwins });
+        await visit.untilFamily();
+        assert.match(await visit.page.locator(".bar .title").innerText(), /darwin-wedgwood\s+142 persons/);
+        await visit.end();
+    });
+
+    test("a dropped file opens, and another one takes its place", async () => {
+        const visit = await visitEmpty();
+        await photograph(visit, "title");
+        await visit.drop("darwin-wedgwood.ged", kDarwins);
+        await visit.untilFamily();
+        assert.ok((await visit.shown()).length > 20);
+        await visit.drop("small.ged", "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n0 @A@ INDI\n1 NAME Ada /Only/\n0 TRLR\n");
+        await visit.page.waitForSelector('#tree [data-xref="A"]');
+        await visit.still();
+        assert.deepEqual(await visit.shown(), ["A"]);
+        assert.equal(await visit.page.title(), "small");
+        await visit.end();
+    });
+
+    test("an archive is opened for the family file inside", async () => {
+        const visit = await visitEmpty();
+        await visit.drop("darwin.gdz", archiveOf("gedcom.ged", kDarwins));
+        await visit.untilFamily();
+        assert.ok((await visit.shown()).length > 20);
+        await visit.end();
+    });
+
+    test("what is no family file is refused in words, and the page stays as it was", async () => {
+        const visit = await visitEmpty();
+        await visit.drop("holiday.jpg", Buffer.from([0xff, 0xd8, 0xff, 0xe0, 0, 16, 74, 70, 73, 70]));
+        await visit.page.waitForSelector('#notices [role="alert"]');
+        assert.match(await visit.page.innerText("#notices"), /holiday\.jpg.*could not be read/);
+        assert.ok(await visit.page.isVisible("#choose-file"));
+        await visit.drop("empty.ged", "0 HEAD\n0 TRLR\n");
+        await visit.page.waitForFunction(() => /empty\.ged/.test(document.querySelector("#notices").textContent));
+        await visit.drop("broken.gdz", Buffer.from("PK\u0003\u0004 not an archive"));
+        await visit.page.waitForFunction(() => /archive/i.test(document.querySelector("#notices").textContent));
+        await visit.end();
+    });
+
+    test("a broken file shows what could be read, and says what could not", async () => {
+        const visit = await visitEmpty();
+        await visit.drop("broken.ged", brokenFamily());
+        await visit.untilFamily();
+        assert.deepEqual(await visit.shown(), ["I1", "I2", "I3"]);
+        await visit.page.click("#diagnostics-button");
+        assert.ok(await visit.page.isVisible("#diagnostics"));
+        const told = await visit.page.innerText("#diagnostics");
+        assert.match(told, /line 8\b/i);
+        assert.match(told, /line 16\b/i);
+        assert.ok((await visit.page.locator("#diagnostics li").count()) >= 4);
+        await photograph(visit, "diagnostics");
+        await visit.page.keyboard.press("Escape");
+        assert.ok(!(await visit.page.isVisible("#diagnostics")));
+        await visit.end();
+    });
+
+    test("a family in the page opens by itself at the person of the address", async () => {
+        const visit = await visitDarwins("#person=I5");
+        assert.equal(await visit.focus(), "I5");
+        assert.equal(await visit.page.title(), "Darwin and Wedgwood");
+        await visit.end();
+    });
+
+    test("an address that leads to nobody leads to somebody all the same", async () => {
+        for (const hash of ["#person=I9999", "#nonsense", "#person=%E0%A4%A&view=9", "#generations=1e9&view=pedigree"]) {
+            const visit = await visitDarwins(hash);
+            assert.ok(await visit.focus());
+            await visit.end();
+        }
+    });
+});
+
+// One file, packed, in a GEDZIP archive. The check sum is left out: the page needs none.
+function archiveOf(name, content) {
+    const packed = deflateRawSync(content);
+    const fields = Buffer.alloc(26);
+    fields.writeUInt16LE(20, 0);
+    fields.writeUInt16LE(8, 4);
+    fields.writeUInt32LE(packed.length, 14);
+    fields.writeUInt32LE(content.length, 18);
+    fields.writeUInt16LE(name.length, 22);
+    const local = Buffer.concat([Buffer.from("PK\u0003\u0004"), fields, Buffer.from(name), packed]);
+    const entry = Buffer.concat([Buffer.from("PK\u0001\u0002\u0014\0"), fields, Buffer.alloc(14), Buffer.from(name)]);
+    const end = Buffer.alloc(22);
+    end.write("PK\u0005\u0006", "latin1");
+    end.writeUInt16LE(1, 8);
+    end.writeUInt16LE(1, 10);
+    end.writeUInt32LE(entry.length, 12);
+    end.writeUInt32LE(local.length, 16);
+    return Buffer.concat([local, entry, end]);
+}

@@ -1,0 +1,64 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+import assert from "node:assert/strict";
+import { describe, test } from "node:test";
+import { photograph, visitDarwins } from "../support/browser.mjs";
+
+async function found(visit) {
+    return visit.page.$$eval("#search-list [role=option] bdi", (names) => names.map((name) => name.textContent));
+}
+
+describe("searching", () => {
+    test("words in any order find a person, and Enter leads there", async () => {
+        const visit = await visitDarwins();
+        await visit.page.keyboard.press("/");
+        assert.equal(await visit.page.evaluate(() => document.activeElement.id), "search");
+        await visit.page.keyboard.type("williams ralph");
+        assert.deepEqual(await found(visit), ["Ralph Vaughan Williams"]);
+        await visit.page.keyboard.press("Enter");
+        await visit.still();
+        assert.equal(await visit.focus(), "I90");
+        assert.ok(!(await visit.page.isVisible("#search-list")));
+        await visit.end();
+    });
+
+    test("a year tells persons of one name apart", async () => {
+        const visit = await visitDarwins();
+        await visit.page.fill("#search", "erasmus darwin 1731");
+        assert.deepEqual(await found(visit), ["Erasmus Darwin"]);
+        assert.match(await visit.page.innerText("#search-list .years"), /1731–1802/);
+        await visit.end();
+    });
+
+    test("the list is walked with the arrows, tells kinship, and a click chooses", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        await page.fill("#search", "emma");
+        const names = await found(visit);
+        assert.ok(names.length >= 4);
+        assert.match(await page.innerText("#search-list"), /wife and first cousin/);
+        await photograph(visit, "search");
+        const current = () => page.locator("#search").getAttribute("aria-activedescendant");
+        const first = await current();
+        await page.press("#search", "ArrowDown");
+        assert.notEqual(await current(), first);
+        await page.press("#search", "ArrowUp");
+        assert.equal(await current(), first);
+        assert.equal(await page.locator(`#${first}`).getAttribute("aria-selected"), "true");
+        await page.locator("#search-list [role=option]", { hasText: "Emma Wedgwood" }).click();
+        await visit.still();
+        assert.equal(await visit.focus(), "I2");
+        await visit.end();
+    });
+
+    test("nobody found is said, and Escape closes the list", async () => {
+        const visit = await visitDarwins();
+        await visit.page.fill("#search", "zzz");
+        assert.match(await visit.page.innerText("#search-list"), /Nobody found/);
+        await visit.page.press("#search", "Escape");
+        assert.ok(!(await visit.page.isVisible("#search-list")));
+        assert.equal(await visit.focus(), "I1");
+        await visit.end();
+    });
+});

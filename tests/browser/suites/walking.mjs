@@ -1,0 +1,241 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Charles Darwin (I1), his wife and cousin Emma Wedgwood (I2), his parents Robert (I12) and Susannah (I55), his
+// grandfather Erasmus (I5), his sister Caroline (I34), his son Francis (I116).
+
+import assert from "node:assert/strict";
+import { describe, test } from "node:test";
+import { photograph, visitDarwins } from "../support/browser.mjs";
+
+describe("walking", () => {
+    test("a click on a person makes them the focus, of the picture, the address and the panel", async () => {
+        const visit = await visitDarwins();
+        assert.equal(await visit.focus(), "I1");
+        await visit.box("I34").click();
+        await visit.still();
+        assert.equal(await visit.focus(), "I34");
+        assert.match(await visit.hash(), /person=I34/);
+        assert.equal(await visit.page.innerText("#side-panel h2"), "Caroline Sarah Darwin");
+        assert.equal(await visit.box("I34").getAttribute("aria-current"), "true");
+        assert.match(await visit.page.locator("#tree").getAttribute("aria-label"), /Caroline Sarah Darwin/);
+        assert.match(await visit.page.locator("#live").innerText(), /Caroline Sarah Darwin/);
+        await visit.end();
+    });
+
+    test("arrow keys lead to parents, children and neighbours, and Enter makes a person the focus", async () => {
+        const visit = await visitDarwins();
+        await visit.box("I1").focus();
+        await visit.press("ArrowUp");
+        assert.ok(["I12", "I55"].includes(await visit.keysOn()));
+        await visit.press("ArrowDown");
+        const below = await visit.label(await visit.keysOn());
+        assert.match(below, /Darwin/);
+        await visit.box("I1").focus();
+        await visit.press("ArrowDown");
+        const child = await visit.keysOn();
+        assert.ok(["I107", "I109", "I110", "I111", "I113", "I115", "I116", "I120", "I123", "I125"].includes(child), child);
+        await visit.press("ArrowRight");
+        const neighbour = await visit.keysOn();
+        assert.notEqual(neighbour, child);
+        await visit.press("ArrowLeft");
+        assert.equal(await visit.keysOn(), child);
+        await visit.press("Enter");
+        assert.equal(await visit.focus(), child);
+        assert.equal(await visit.keysOn(), child, "the keys stay on the new focus");
+        await visit.press("Home");
+        assert.equal(await visit.keysOn(), child);
+        await visit.end();
+    });
+
+    test("from one end of a row, the arrow passes every box of it in order", async () => {
+        const visit = await visitDarwins("#person=I116");
+        await visit.box("I116").focus();
+        let last = (await visit.middleOf("I116")).x - (await visit.middleOf("I116")).x;
+        const seen = new Set();
+        for (let steps = 0; steps < 40; ++steps) {
+            const before = await visit.keysOn();
+            await visit.page.keyboard.press("ArrowRight");
+            const now = await visit.keysOn();
+            if (now === before) break;
+            assert.ok(!seen.has(now), `${now} twice`);
+            seen.add(now);
+            const places = await visit.places();
+            const x = Number(/ (-?\d+),/.exec(places.find((place) => place.startsWith(now + " ")))[1]);
+            assert.ok(x > last, `${now} lies to the right`);
+            last = x;
+        }
+        assert.ok(seen.size >= 3);
+        await visit.end();
+    });
+
+    test("boxes glide, and arrive where a picture without a glide has them", async () => {
+        const still = await visitDarwins("#person=I12");
+        const wanted = await still.places();
+        await still.end();
+
+        const visit = await visitDarwins("#person=I1", { reducedMotion: "no-preference" });
+        const before = await visit.middleOf("I12");
+        await visit.page.mouse.click(before.x, before.y);
+        const start = await visit.middleOf("I12");
+        assert.ok(Math.hypot(start.x - before.x, start.y - before.y) < 60, "the clicked box begins where it stood");
+        await visit.page.waitForTimeout(120);
+        const onTheWay = await visit.places();
+        assert.notDeepEqual(onTheWay, wanted);
+        await visit.still();
+        // What is in sight differs with the camera; the places of what both show do not.
+        const arrived = await visit.places();
+        const both = arrived.filter((place) => wanted.includes(place));
+        const names = (places) => new Set(places.map((place) => place.replace(/ \S+$/, "")));
+        const common = [...names(arrived)].filter((name) => names(wanted).has(name));
+        assert.ok(common.length > 20);
+        assert.equal(names(both).size, common.length);
+        await visit.end();
+    });
+
+    test("back and forward lead along the way, by our buttons and by the browser's", async () => {
+        const visit = await visitDarwins();
+        assert.ok(await visit.page.isDisabled("#back"));
+        await visit.box("I34").click();
+        await visit.still();
+        await visit.click("#view-pedigree");
+        assert.equal(await visit.page.locator("#view-pedigree").getAttribute("aria-pressed"), "true");
+        await visit.click("#back");
+        assert.equal(await visit.page.locator("#view-family").getAttribute("aria-pressed"), "true");
+        assert.equal(await visit.focus(), "I34");
+        await visit.page.goBack();
+        await visit.still();
+        assert.equal(await visit.focus(), "I1");
+        assert.ok(await visit.page.isDisabled("#back"));
+        await visit.click("#forward");
+        assert.equal(await visit.focus(), "I34");
+        await visit.page.goForward();
+        await visit.still();
+        assert.match(await visit.hash(), /view=pedigree/);
+        assert.ok(await visit.page.isDisabled("#forward"));
+        await visit.end();
+    });
+
+    test("a link leads to a person, a view and its options", async () => {
+        const visit = await visitDarwins("#person=I90&view=pedigree&generations=3");
+        assert.equal(await visit.focus(), "I90");
+        const columns = new Set((await visit.places()).map((place) => / (-?\d+),/.exec(place)[1]));
+        assert.equal(columns.size, 3);
+        await visit.page.evaluate(() => (location.hash = "#person=I1&hide=cousins,siblings"));
+        await visit.still();
+        assert.equal(await visit.focus(), "I1");
+        assert.ok(!(await visit.shows("I35")), "no sister");
+        await visit.end();
+    });
+
+    test("in the pedigree, parents stand to the right of their child", async () => {
+        const visit = await visitDarwins();
+        await visit.click("#view-pedigree");
+        const [focus, father, mother] = await Promise.all(["I1", "I12", "I55"].map((xref) => visit.middleOf(xref)));
+        assert.ok(father.x > focus.x && mother.x > focus.x);
+        assert.ok(father.y < focus.y && mother.y > focus.y);
+        await photograph(visit, "pedigree");
+        await visit.end();
+    });
+
+    test("the panel tells facts and kinship, and its relatives are links", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        assert.match(await page.innerText("#side-panel"), /Birth\s+12 February 1809/);
+        assert.match(await page.innerText("#side-panel"), /Death\s+19 April 1882/);
+        await page.click('#side-panel a[data-person-id="2"]');
+        await visit.still();
+        assert.equal(await visit.focus(), "I2");
+        await page.locator("#tree").press("ArrowUp");
+        await visit.box("I1").focus();
+        assert.match(await page.innerText("#side-panel .kinship"), /husband and first cousin/);
+        const words = [];
+        for (const xref of ["I36", "I34", "I58", "I113"]) {
+            await visit.box(xref).focus();
+            words.push(await page.innerText("#side-panel .kinship"));
+        }
+        assert.match(words[0], /^brother-in-law \(husband's brother\) and first cousin/);
+        assert.match(words[1], /^sister-in-law .* and first cousin/);
+        assert.match(words[2], /^father of/);
+        assert.match(words[3], /^son of/);
+        await visit.end();
+    });
+
+    test("each box is read out with name, years and kinship", async () => {
+        const visit = await visitDarwins();
+        assert.match(await visit.label("I2"), /^Emma Wedgwood, 1808–1896, wife and first cousin/);
+        assert.match(await visit.label("I5"), /^Erasmus Darwin, 1731–1802, grandfather \(father's father\)/);
+        assert.match(await visit.label("I24"), /half uncle \(father's half brother\)/);
+        assert.equal(await visit.box("I2").getAttribute("role"), "button");
+        await visit.end();
+    });
+
+    test("who has relatives out of the picture has a mark, and a click leads to them", async () => {
+        const visit = await visitDarwins("#person=I1&hide=cousins,greatGrandparents");
+        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
+        assert.ok(marked.includes("I5"), "Erasmus has parents who are not shown");
+        assert.match(await visit.label("I5"), /more relatives? not shown/);
+        assert.ok(!(await visit.shows("I3")));
+        await visit.box("I5").click();
+        await visit.still();
+        assert.ok(await visit.shows("I3"), "his father");
+        await visit.end();
+    });
+
+    test("an unknown parent has a place that is named", async () => {
+        const visit = await visitDarwins("#person=I17&view=pedigree");
+        const missing = visit.page.locator("#tree .box.missing");
+        assert.ok((await missing.count()) >= 1);
+        assert.match(await missing.first().getAttribute("aria-label"), /^Unknown mother of Elizabeth Collier/);
+        await visit.end();
+    });
+
+    test("the picture is moved and zoomed by hand, wheel, keys and buttons", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        const before = await visit.placing();
+        await page.mouse.move(300, 600);
+        await page.mouse.wheel(0, -240);
+        await visit.still();
+        const near = await visit.placing();
+        assert.ok(near.k > before.k);
+        await page.mouse.move(420, 640);
+        await page.mouse.down();
+        await page.mouse.move(500, 600, { steps: 4 });
+        await page.mouse.up();
+        const moved = await visit.placing();
+        assert.ok(Math.abs(moved.x - near.x - 80) < 2 && Math.abs(moved.y - near.y + 40) < 2);
+        assert.equal(await visit.focus(), "I1", "a drag is no click");
+        await visit.click("#zoom-out");
+        assert.ok((await visit.placing()).k < moved.k);
+        await visit.click("#fit");
+        const sizes = await page.evaluate(() => {
+            const tree = document.querySelector("#tree").getBoundingClientRect();
+            const boxes = [...document.querySelectorAll("#tree .frame")].map((box) => box.getBoundingClientRect());
+            return boxes.every((box) => box.left >= tree.left && box.right <= tree.right && box.top >= tree.top && box.bottom <= tree.bottom);
+        });
+        assert.ok(sizes, "everything is in sight");
+        await visit.box("I1").focus();
+        const fitted = await visit.placing();
+        await visit.press("+");
+        assert.ok((await visit.placing()).k > fitted.k);
+        await visit.press("Shift+ArrowLeft");
+        await visit.press("0");
+        assert.ok(Math.abs((await visit.placing()).k - fitted.k) < 0.001);
+        await visit.end();
+    });
+
+    test("two fingers pinch", async () => {
+        const visit = await visitDarwins("#person=I1", { hasTouch: true });
+        const session = await visit.context.newCDPSession(visit.page);
+        const touch = (type, ...xs) =>
+            session.send("Input.dispatchTouchEvent", { type, touchPoints: xs.map((x, id) => ({ x, y: 400, id })) });
+        const before = await visit.placing();
+        await touch("touchStart", 300, 400);
+        for (const spread of [20, 40, 60, 80]) await touch("touchMove", 300 - spread, 400 + spread);
+        await touch("touchEnd");
+        await visit.still();
+        assert.ok((await visit.placing()).k > before.k * 1.5);
+        await visit.end();
+    });
+});

@@ -1,0 +1,171 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A window on the page, and what a person does in it.
+
+import assert from "node:assert/strict";
+
+export class Visit {
+    /** Addresses that the page asked for, but for the page itself. */
+    requests = [];
+    /** Errors of scripts, refusals by the security policy, and dialogs. */
+    troubles = [];
+
+    static async begin(context, address) {
+        const visit = new Visit();
+        visit.context = context;
+        visit.page = await context.newPage();
+        visit.watch(address);
+        await visit.page.goto(address);
+        await visit.page.waitForSelector("#welcome, #tree, .fatal");
+        return visit;
+    }
+
+    /** Every test ends with this: whatever was done, nothing was fetched and nothing broke. */
+    async end() {
+        await this.context.close();
+        assert.deepEqual(this.requests, [], "requests");
+        assert.deepEqual(this.troubles, [], "troubles");
+    }
+
+    watch(address) {
+        const { page, requests, troubles } = this;
+        const own = address.replace(/#.*/, "");
+        page.on("request", (request) => {
+            const url = request.url().replace(/#.*/, "");
+            if (url !== own && !url.startsWith("blob:")) requests.push(url.slice(0, 200));
+        });
+        page.on("websocket", (socket) => requests.push(socket.url()));
+        page.on("pageerror", (error) => troubles.push(String(error)));
+        page.on("console", (message) => {
+            if (message.type() === "error") troubles.push(message.text());
+        });
+        page.on("dialog", (dialog) => {
+            troubles.push("dialog: " + dialog.message());
+            void dialog.dismiss();
+        });
+    }
+
+    async untilFamily() {
+        await this.page.waitForSelector("#tree .box.focus");
+        await this.still();
+    }
+
+    /** Until nothing in the picture has moved or changed its words for a while. */
+    async still() {
+        await this.page.evaluate(async () => {
+            const look = () => {
+                const boxes = [...document.querySelectorAll("#tree .boxes > g")];
+                const ghosts = document.querySelector("#tree .ghosts")?.childElementCount ?? 0;
+                const words = boxes.reduce((n, box) => n + (box.getAttribute("aria-label")?.length ?? 0), 0);
+                const places = boxes.map((box) => box.getAttribute("transform")).join();
+                return [document.querySelector("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
+            };
+            let last = look();
+            let since = performance.now();
+            while (performance.now() - since < 110) {
+                await new Promise((next) => requestAnimationFrame(next));
+                const now = look();
+                if (now === last) continue;
+                last = now;
+                since = performance.now();
+            }
+        });
+    }
+
+    /** Hands a file over as the browser's own dialog does. */
+    async choose(name, bytes) {
+        await this.page.setInputFiles("#file-input", { name, mimeType: "application/octet-stream", buffer: Buffer.from(bytes) });
+    }
+
+    /** Drags a file over the page and lets it fall. */
+    async drop(name, bytes) {
+        const data = await this.page.evaluateHandle(
+            ([name, base64]) => {
+                const transfer = new DataTransfer();
+                const bytes = Uint8Array.from(atob(base64), (letter) => letter.charCodeAt(0));
+                transfer.items.add(new File([bytes], name));
+                return transfer;
+            },
+            [name, Buffer.from(bytes).toString("base64")],
+        );
+        await this.page.dispatchEvent("body", "dragover", { dataTransfer: data });
+        await this.page.dispatchEvent("body", "drop", { dataTransfer: data });
+    }
+
+    box(xref) {
+        return this.page.locator(`#tree [data-xref="${xref}"]`).first();
+    }
+
+    /** Records of the persons whose boxes have elements, sorted, each once. */
+    async shown() {
+        const xrefs = await this.page.$$eval("#tree .boxes > [data-xref]", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
+        return [...new Set(xrefs)].sort();
+    }
+
+    async shows(xref) {
+        return (await this.box(xref).count()) > 0;
+    }
+
+    /** The record of the focus. */
+    async focus() {
+        return this.page.locator("#tree .box.focus").getAttribute("data-xref");
+    }
+
+    async label(xref) {
+        return this.box(xref).getAttribute("aria-label");
+    }
+
+    /** The record of the box that has the keys; null if none has. */
+    async keysOn() {
+        return this.page.evaluate(() => document.activeElement?.getAttribute("data-xref") ?? null);
+    }
+
+    /** Upper left corners of all boxes, relative to the focus's, by record. Add-nodes go by their label. */
+    async places() {
+        return this.page.evaluate(() => {
+            const placeOf = (box) => /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);
+            const boxes = [...document.querySelectorAll("#tree .boxes > g")];
+            const [x0, y0] = placeOf(document.querySelector("#tree .box.focus"));
+            const named = boxes.map((box) => {
+                const [x, y] = placeOf(box);
+                const name = box.getAttribute("data-xref") ?? box.getAttribute("aria-label");
+                return `${name} ${(x - x0).toFixed(0)},${(y - y0).toFixed(0)}`;
+            });
+            return named.sort();
+        });
+    }
+
+    async middleOf(xref) {
+        const { x, y, width, height } = await this.box(xref).locator(".frame").boundingBox();
+        return { x: x + width / 2, y: y + height / 2 };
+    }
+
+    /** Zoom and offset of the picture. */
+    async placing() {
+        const text = await this.page.locator("#tree .world").getAttribute("transform");
+        const [x, y, k] = text.match(/-?[\d.]+/g).map(Number);
+        return { x, y, k };
+    }
+
+    /** Through the search, as a person would. */
+    async goTo(text) {
+        await this.page.fill("#search", text);
+        await this.page.press("#search", "Enter");
+        await this.still();
+    }
+
+    async hash() {
+        return this.page.evaluate(() => location.hash);
+    }
+
+    async click(selector) {
+        await this.page.click(selector);
+        await this.still();
+    }
+
+    async press(key) {
+        await this.page.keyboard.press(key);
+        await this.still();
+    }
+}
