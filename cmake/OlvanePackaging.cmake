@@ -48,6 +48,12 @@ if(TARGET olvane_c)
  A host is any object with eight methods; a layout is a list of records.")
   set(CPACK_DEBIAN_PYTHON_PACKAGE_ARCHITECTURE all)
 endif()
+if(TARGET olvane_wasm_module)
+  olvane_package(javascript node-olvane javascript ""
+    "Layout engine of a family-tree viewer: JavaScript package
+ A host is any object with eight methods; GEDCOM files are read as well. For node and browsers, by WebAssembly.")
+  set(CPACK_DEBIAN_JAVASCRIPT_PACKAGE_ARCHITECTURE all)
+endif()
 if(TARGET olvane_foundation)
   olvane_package(foundation libolvane-foundation-dev libdevel "libgnustep-base-dev"
     "Layout engine of a family-tree viewer: bridge for hosts on Foundation

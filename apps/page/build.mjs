@@ -30,7 +30,9 @@ async function bundledScript() {
         // The engine lies in the page, not beside it.
         define: { "import.meta.url": '"data:,"' },
         alias: {
-            olvane: here("../../bindings/javascript/olvane.mjs"),
+            olvane: process.env.OLVANE_JAVASCRIPT
+                ? `${process.env.OLVANE_JAVASCRIPT}/olvane.mjs`
+                : here("../../bindings/javascript/olvane.mjs"),
             // The page moves things by itself, so most of what zooming could do beside that stays out.
             "d3-transition": here("src/scene/noTransition.ts"),
             "d3-interpolate": here("src/scene/noInterpolation.ts"),

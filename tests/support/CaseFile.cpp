@@ -9,6 +9,8 @@
 
 #include <charconv>
 #include <cmath>
+#include <cstdio>
+#include <cstdlib>
 #include <fstream>
 #include <limits>
 #include <sstream>
@@ -56,6 +58,19 @@ public:
         return value;
     }
 
+    // By the C library, since not every C++ library that this is compiled with reads doubles. Hexadecimal is none.
+    double fraction() {
+        const std::string text(field());
+        char* end = nullptr;
+        const double value = std::strtod(text.c_str(), &end);
+        const bool isWhole = end == text.c_str() + text.size();
+        if (text.empty() || !isWhole || text.front() == '+' ||
+            text.find_first_of("xX") != std::string::npos) {
+            failNumber(text);
+        }
+        return value;
+    }
+
     PersonId person() { return number<PersonId>(); }
 
     bool truth() {
@@ -66,7 +81,7 @@ public:
 
     // Read as a double and narrowed; what a float cannot hold becomes an infinity.
     float size() {
-        const double value = number<double>();
+        const double value = fraction();
         constexpr double kGreatest = std::numeric_limits<float>::max();
         if (std::abs(value) <= kGreatest || std::isnan(value)) return static_cast<float>(value);
         return std::copysign(std::numeric_limits<float>::infinity(), static_cast<float>(value > 0 ? 1 : -1));
@@ -220,9 +235,8 @@ std::string_view readLine(std::string_view text, const std::string& where, CaseF
 // The double says the float exactly, so reading it as a double and narrowing it gives the same float.
 std::string sizeText(float value) {
     std::array<char, 64> buffer{};
-    const auto written =
-        std::to_chars(buffer.data(), buffer.data() + buffer.size(), static_cast<double>(value));
-    return std::string(buffer.data(), written.ptr);
+    std::snprintf(buffer.data(), buffer.size(), "%.17g", static_cast<double>(value));
+    return buffer.data();
 }
 
 void formatRequest(const CaseFile& source, std::ostream& out) {

@@ -6,9 +6,9 @@
 
 #include <support/GraphText.h>
 
-#include <bit>
 #include <cstdint>
 #include <cstdio>
+#include <cstring>
 
 namespace support {
 
@@ -17,7 +17,8 @@ namespace {
 // -0.0 and 0.0 are one number to whoever compares coordinates, so they are printed alike.
 std::string floatText(float value) {
     char digits[9];
-    const auto bits = value == 0.0f ? std::uint32_t{0} : std::bit_cast<std::uint32_t>(value);
+    std::uint32_t bits = 0;
+    if (value != 0.0f) std::memcpy(&bits, &value, sizeof bits);
     std::snprintf(digits, sizeof digits, "%08x", static_cast<unsigned>(bits));
     return digits;
 }

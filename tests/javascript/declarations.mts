@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Never runs: a program in TypeScript must be able to say all this, and must not be able to say what is expected to
+// be an error.
+
+import { GedcomError, HostError, LayoutError, loadOlvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
+import type { Host, LayoutRecord, Options } from "../../bindings/javascript/olvane.mjs";
+
+class Family implements Host {
+    fatherOf(person: number): number | null {
+        return person === 1 ? 2 : null;
+    }
+    motherOf(): number {
+        return PERSON_NOT_FOUND;
+    }
+    *spousesOf(): Iterable<number> {}
+    childrenOf(person: number): number[] {
+        return person === 2 ? [1] : [];
+    }
+    isPreferredSpouse(): boolean {
+        return false;
+    }
+    isDead(): boolean {
+        return true;
+    }
+    dateOf(_person: number, isBirth: boolean): string {
+        return isBirth ? "1809" : "";
+    }
+    sexOf(): number {
+        return 0;
+    }
+}
+
+const options: Options = { view: "pedigree", generations: 6, flagDepth: 2, sizes: { nodeWidth: 120 } };
+const olvane = await loadOlvane(new Uint8Array());
+const records: LayoutRecord[] = olvane.layout(new Family(), 1, options);
+const texts: string[] = [olvane.version, olvane.layoutText(new Family(), 1, { shown: Shown.all & ~Shown.cousins })];
+try {
+    const file = olvane.readGedcom(new Uint8Array(), "x.ged");
+    for (const person of file.persons) texts.push(person.name, person.birth?.shown ?? "", person.sex);
+    for (const fact of file.factsOfPerson(1)) texts.push(fact.tag, fact.place, fact.date?.mark ?? "exact");
+    file.close();
+} catch (error) {
+    if (error instanceof HostError) throw error.cause;
+    if (error instanceof LayoutError) texts.push(error.status, error.text, String(error.records.length));
+    if (error instanceof GedcomError) texts.push(error.message);
+}
+
+// @ts-expect-error: a record is not the host's to change
+records[0]!.x = 1;
+// @ts-expect-error: there are two views
+olvane.layout(new Family(), 1, { view: "fan" });
+// @ts-expect-error: a host answers all eight questions
+olvane.layout({ fatherOf: () => null }, 1);

@@ -1,0 +1,166 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// GEDCOM files in JavaScript.
+
+import assert from "node:assert/strict";
+import { readFile } from "node:fs/promises";
+import test from "node:test";
+
+import { GedcomError } from "../../bindings/javascript/olvane.mjs";
+import { olvane } from "./module.mjs";
+
+const bytesOf = (text) => new TextEncoder().encode(text);
+const samples = new URL("../../samples/", import.meta.url);
+
+const couple = `0 HEAD
+1 GEDC
+2 VERS 5.5.1
+1 CHAR UTF-8
+0 @I1@ INDI
+1 NAME Johann /"Grüber"\\
+2 NICK Hans
+1 NAME /Li/ Wei
+1 SEX M
+1 BIRT
+2 DATE ABT 1819
+2 PLAC Bern
+1 OCCU Baker
+1 FAMS @F1@
+0 @I2@ INDI
+1 NAME Anna
+1 SEX F
+1 DEAT Y
+1 FAMS @F1@
+0 @I3@ INDI
+1 FAMC @F1@
+2 PEDI adopted
+0 @F1@ FAM
+1 HUSB @I1@
+1 WIFE @I2@
+1 CHIL @I3@
+1 MARR
+2 DATE BET 1840 AND 1842
+1 DIV Y
+0 TRLR
+`;
+
+test("persons, families and facts are told as the file has them", () => {
+    const file = olvane.readGedcom(bytesOf(couple), "couple.ged");
+    assert.deepEqual(
+        { name: file.name, encoding: file.encoding, version: file.version, diagnostics: file.diagnostics },
+        { name: "couple.ged", encoding: "UTF-8", version: "5.5.1", diagnostics: [] },
+    );
+    assert.deepEqual(file.persons[0], {
+        id: 1,
+        xref: "I1",
+        name: 'Johann "Grüber"\\',
+        given: "Johann",
+        surname: '"Grüber"\\',
+        names: ['Johann "Grüber"\\', "Li Wei"],
+        sex: "male",
+        dead: false,
+        birth: { written: "ABT 1819", year: 1819, month: 0, day: 0, mark: "about", lastYear: 0, shown: "~1819" },
+        death: null,
+        father: 0,
+        mother: 0,
+        spouses: [2],
+        children: [3],
+        parentFamilies: [],
+        coupleFamilies: [1],
+    });
+    assert.deepEqual(file.persons[2].parentFamilies, [{ family: 1, pedigree: "adopted" }]);
+    assert.equal(file.persons[2].sex, "other");
+    assert.equal(file.persons[1].dead, true);
+    const [family] = file.families;
+    assert.deepEqual(
+        [family.husband, family.wife, family.children, family.married, family.divorced, family.marriage.lastYear],
+        [1, 2, [3], true, true, 1842],
+    );
+    assert.deepEqual(
+        file.factsOfPerson(1).map(({ tag, value, place }) => [tag, value, place]),
+        [
+            ["BIRT", "", "Bern"],
+            ["OCCU", "Baker", ""],
+        ],
+    );
+    assert.deepEqual(
+        file.factsOfFamily(1).map(({ tag, date }) => [tag, date?.written ?? null]),
+        [
+            ["MARR", "BET 1840 AND 1842"],
+            ["DIV", null],
+        ],
+    );
+    file.close();
+});
+
+test("a file is laid out as a host that gives the same answers", async () => {
+    const file = olvane.readGedcom(await readFile(new URL("darwin-wedgwood.ged", samples)));
+    const person = (id) => file.persons[id - 1];
+    const host = {
+        fatherOf: (id) => person(id).father || null,
+        motherOf: (id) => person(id).mother || null,
+        spousesOf: (id) => person(id).spouses,
+        childrenOf: (id) => person(id).children,
+        isPreferredSpouse: (id, spouse) => person(id).spouses[0] === spouse,
+        isDead: (id) => person(id).dead,
+        dateOf(id, isBirth) {
+            const date = isBirth ? person(id).birth : person(id).death;
+            if (date === null || date.year === 0) return "";
+            const pieces = [String(date.year).padStart(4, "0"), date.month, date.day].filter((piece) => piece !== 0);
+            return pieces.map((piece) => String(piece).padStart(2, "0")).join("-");
+        },
+        sexOf: (id) => ["male", "female", "other"].indexOf(person(id).sex),
+    };
+    let compared = 0;
+    for (const { id } of file.persons) {
+        if (file.layoutText(id) === olvane.layoutText(host, id)) ++compared;
+    }
+    // Dates that are not exact sort otherwise than this host writes them.
+    assert.ok(compared > file.persons.length * 0.9, `${compared} of ${file.persons.length}`);
+    assert.ok(file.layout(1, { view: "pedigree" }).length > 0);
+});
+
+test("letters of other encodings come out composed", () => {
+    const bytes = bytesOf("0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR ANSEL\n0 @I1@ INDI\n1 NAME Gr?uber\n0 TRLR\n");
+    bytes[bytes.indexOf("?".charCodeAt(0))] = 0xe8; // the dots of an umlaut, before their letter
+    assert.equal(olvane.readGedcom(bytes).persons[0].name, "Grüber");
+});
+
+test("trouble in a file is told by its line, and the rest is read", () => {
+    const file = olvane.readGedcom(bytesOf("0 HEAD\n0 @I1@ INDI\n1 NAME A\n1 FAMS @F9@\n0 @I2@ INDI\n"), "bad.ged");
+    assert.equal(file.persons.length, 2);
+    assert.deepEqual(
+        file.diagnostics.map(({ line, severity }) => [line, severity]),
+        [
+            [4, "error"],
+            [5, "warning"],
+        ],
+    );
+});
+
+test("what is no GEDCOM file is refused with a reason", () => {
+    assert.throws(() => olvane.readGedcom(bytesOf("hello"), "letter.txt"), (error) => {
+        assert.ok(error instanceof GedcomError);
+        assert.match(error.message, /^letter\.txt: /);
+        return true;
+    });
+    assert.throws(() => olvane.readGedcom(new Uint8Array(), "empty.ged"), { message: "empty.ged: is empty" });
+    assert.throws(() => olvane.readGedcom(bytesOf("PK\u0003\u0004"), "a.gdz"), GedcomError);
+});
+
+test("a closed file gives no more answers", () => {
+    const file = olvane.readGedcom(bytesOf(couple));
+    file.close();
+    file.close();
+    assert.throws(() => file.layout(1), GedcomError);
+    assert.throws(() => file.factsOfPerson(1), GedcomError);
+    assert.equal(file.persons.length, 3);
+});
+
+test("a person outside the file is refused", () => {
+    const file = olvane.readGedcom(bytesOf(couple));
+    assert.throws(() => file.layout(4), { name: "LayoutError" });
+    assert.throws(() => file.factsOfPerson(4), GedcomError);
+    assert.throws(() => file.factsOfFamily(2), GedcomError);
+});
