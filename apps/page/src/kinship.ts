@@ -247,6 +247,17 @@ export function kinshipText(kinship: Kinship, sex: Sex, messages: Messages): str
     return kinship.also ? words.both(text, words.relativeOnSide({ ...kinship.also, sex })) : text;
 }
 
+/** The shortest words that are still right, for where there is little room: "uncle", "wife". */
+export function nearKinshipText(kinship: Kinship, sex: Sex, messages: Messages): string {
+    const words = messages.kinship;
+    const [first, second] = kinship.steps;
+    if (!first) return words.self;
+    if (!second) return nounOf({ ...first, sex }, words).plain;
+    const isSiblings = kinship.steps.some((step) => step.kind === "blood" && step.up === 1 && step.down === 1);
+    if (kinship.steps.length === 2 && isSiblings) return words.siblingInLaw[sex].plain;
+    return kinshipText({ ...kinship, also: null }, sex, messages);
+}
+
 function wayText(steps: readonly Step[], words: KinshipWords): string {
     const [first, second, third] = steps;
     if (steps.length === 1 && first?.kind === "blood") return words.relativeOnSide(first);

@@ -3,7 +3,7 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { allKinships, kinshipText } from "../src/kinship";
+import { allKinships, kinshipText, nearKinshipText } from "../src/kinship";
 import { english, german, type Messages } from "../src/messages";
 import { Tree } from "./families";
 
@@ -224,6 +224,17 @@ describe("by marriage", () => {
             ],
         ]);
         expectRows(cousins, "George", [["Emma", "mother", "Mutter"]]);
+    });
+
+    test("where there is little room, the near word stands alone", () => {
+        const near = (focus: string, name: string): string =>
+            nearKinshipText(allKinships(tree.persons, tree.families, tree.id(focus)).get(tree.id(name))!, tree.sexOf(name), english);
+        assert.equal(near("Max", "Erika"), "sister-in-law");
+        assert.equal(near("Max", "Walter"), "father-in-law");
+        assert.equal(near("Sven", "Mona"), "aunt");
+        assert.equal(near("Sven", "Hugo"), "grandfather");
+        assert.equal(near("Max", "Kora"), "wife of an uncle");
+        assert.equal(near("Max", "Max"), "the person in focus");
     });
 });
 
