@@ -32,7 +32,8 @@ import type { Box, Picture } from "./view/Picture";
 import { PictureDress } from "./view/PictureDress";
 import { addressOf, clampGenerations, kUsualGenerations, readAddress, type RelativeName, sameState, type ViewName, type ViewState } from "./view/ViewState";
 
-const kKinshipDelay = 60; // ms after a picture came; its boxes come first
+const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
+const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
 export class App implements ChromeActions {
     private messages: Messages;
@@ -103,6 +104,7 @@ export class App implements ChromeActions {
     }
 
     private open(bytes: Uint8Array, name: string, embedded: EmbeddedFamily | null): void {
+        const start = performance.now();
         const file = this.engine.readGedcom(bytes, name);
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
@@ -123,10 +125,17 @@ export class App implements ChromeActions {
         const state = embedded ? readAddress(location.hash, family.persons, usual) : usual;
         this.journey.begin(addressOf(state, family.persons));
         this.arrive(state, null);
-        if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
+        performance.measure("olvane-open", { start });
+        this.greet(family);
         if (file.diagnostics.some((one) => one.severity === "error")) {
             this.notices.warn(this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length));
         }
+    }
+
+    private greet(family: OpenFamily): void {
+        if (recall("greeted") !== "yes") this.notices.tell(this.ui.firstHint);
+        remember("greeted", "yes");
+        if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
     }
 
     private refuse(name: string, error: unknown): void {
@@ -166,6 +175,7 @@ export class App implements ChromeActions {
     private arrive(state: ViewState, from: Box | null): boolean {
         const { family } = this;
         if (!family) return false;
+        const start = performance.now();
         let picture: Picture;
         try {
             picture = family.picture(state);
@@ -178,6 +188,7 @@ export class App implements ChromeActions {
         this.picture = picture;
         this.tooltip.hide();
         this.dress = this.newDress(family, picture);
+        this.dress.kinshipKnown = family.persons.length <= kSoonSearched;
         this.scene.show(picture, this.dress, from);
         this.nameTree();
         this.showState();
@@ -186,6 +197,7 @@ export class App implements ChromeActions {
         if (isNewFocus) this.live.textContent = this.ui.focusNow(this.nameOf(focus), picture.boxes.length);
         this.shownPerson = state.focus;
         this.refreshPanel();
+        performance.measure("olvane-picture", { start });
         return true;
     }
 
@@ -193,14 +205,17 @@ export class App implements ChromeActions {
         return new PictureDress(family, picture, { messages: this.messages, ui: this.ui, kinshipInBoxes: this.kinshipInBoxes });
     }
 
-    // The boxes come first; what is written into them of kinship follows when there is time.
+    // In a large family the boxes come first; what is written into them of kinship follows when there is time.
     private learnKinships(): void {
         clearTimeout(this.kinshipTimer);
+        if (this.dress?.kinshipKnown) return;
         this.kinshipTimer = window.setTimeout(() => {
             if (!this.dress || !this.family || !this.state) return;
+            const start = performance.now();
             this.family.kinshipsTo(this.state.focus);
             this.dress.kinshipKnown = true;
             this.scene.redraw();
+            performance.measure("olvane-kinship", { start });
         }, kKinshipDelay);
     }
 

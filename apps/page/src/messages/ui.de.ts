@@ -107,6 +107,7 @@ export const uiGerman: UiMessages = {
         partners: "Partner und Kinder",
         children: "Kinder",
         otherNames: "Auch genannt",
+        allOf: (n) => `Alle ${n} zeigen`,
         noFacts: "Mehr steht nicht in der Datei.",
         unknownPartner: "Partner unbekannt",
         married: "verheiratet",
@@ -114,7 +115,7 @@ export const uiGerman: UiMessages = {
     },
     pedigrees: { adopted: "adoptiert", foster: "Pflegekind", sealing: "gesiegelt" },
     diagnostics: {
-        title: "Was in der Datei nicht so gelten konnte, wie es dasteht",
+        title: "Anmerkungen zur Datei",
         button: (n) => (n === 1 ? "1 Anmerkung zur Datei" : `${n} Anmerkungen zur Datei`),
         summary: (persons, problems) => `${persons} Personen gelesen, mit ${problems} Anmerkungen.`,
         line: (n) => `Zeile ${n}`,
@@ -131,6 +132,7 @@ export const uiGerman: UiMessages = {
         layout: "Dieses Bild ließ sich nicht anordnen. Weniger Generationen oder Verwandte helfen vielleicht.",
         dismiss: "Schließen",
     },
+    firstHint: "Ein Klick stellt eine Person in die Mitte ihrer Familie. Ziehen verschiebt, das Mausrad vergrößert.",
     livingHidden: "Lebende Personen sind in dieser Datei ausgelassen.",
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),
 };

@@ -106,6 +106,7 @@ export const uiEnglish: UiMessages = {
         partners: "Partners and children",
         children: "Children",
         otherNames: "Also called",
+        allOf: (n) => `Show all ${n}`,
         noFacts: "The file tells nothing more.",
         unknownPartner: "Unknown partner",
         married: "married",
@@ -113,7 +114,7 @@ export const uiEnglish: UiMessages = {
     },
     pedigrees: { adopted: "adopted", foster: "foster child", sealing: "sealed" },
     diagnostics: {
-        title: "What the file says that could not be taken as it stands",
+        title: "Remarks on the file",
         button: (n) => (n === 1 ? "1 remark on the file" : `${n} remarks on the file`),
         summary: (persons, problems) => `${persons} persons were read, with ${problems} remarks.`,
         line: (n) => `line ${n}`,
@@ -130,6 +131,7 @@ export const uiEnglish: UiMessages = {
         layout: "This picture could not be laid out. Try fewer generations or relatives.",
         dismiss: "Dismiss",
     },
+    firstHint: "Click a person to stand among that family. Drag to move, turn the wheel to zoom.",
     livingHidden: "Living persons are left out of this file.",
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),
 };

@@ -84,6 +84,7 @@ export interface UiMessages {
         readonly partners: string;
         readonly children: string;
         readonly otherNames: string;
+        readonly allOf: (n: number) => string;
         readonly noFacts: string;
         readonly unknownPartner: string;
         readonly married: string;
@@ -108,6 +109,7 @@ export interface UiMessages {
         readonly layout: string;
         readonly dismiss: string;
     };
+    readonly firstHint: string;
     readonly livingHidden: string;
     readonly personCount: (n: number) => string;
 }

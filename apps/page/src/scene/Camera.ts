@@ -32,6 +32,7 @@ const kUsualZoom = 0.85;
 export class Camera {
     private readonly behaviour = zoom<SVGSVGElement, unknown>();
     private readonly selection;
+    private measured: { width: number; height: number } | null = null;
     private travel = 0; // the frame that is asked for; 0 at rest
 
     constructor(
@@ -41,6 +42,7 @@ export class Camera {
         this.selection = select<SVGSVGElement, unknown>(surface);
         this.behaviour
             .scaleExtent([kLeastZoom, kMostZoom])
+            .extent(() => [[0, 0], [this.size.width, this.size.height]])
             .clickDistance(6)
             .on("zoom", (event: D3ZoomEvent<SVGSVGElement, unknown>) => {
                 if (event.sourceEvent) this.stop();
@@ -53,8 +55,13 @@ export class Camera {
         return (this.surface as unknown as { __zoom: ZoomTransform }).__zoom;
     }
 
+    // Asked for in every frame, so it is measured only when it has changed.
     get size(): { width: number; height: number } {
-        return { width: this.surface.clientWidth || 1, height: this.surface.clientHeight || 1 };
+        return (this.measured ??= { width: this.surface.clientWidth || 1, height: this.surface.clientHeight || 1 });
+    }
+
+    resized(): void {
+        this.measured = null;
     }
 
     // What is in sight, in world points.
@@ -127,6 +134,18 @@ export class Camera {
     centring(point: Point, k: number): Placing {
         const { width, height } = this.size;
         return { k, x: width / 2 - point.x * k, y: height / 2 - point.y * k };
+    }
+
+    // The least move that brings all of an area into the window, crosswise and upwards each where there is room for it.
+    includingWhole(area: Rectangle, from: Placing): Placing {
+        const { width, height } = this.size;
+        const { k } = from;
+        const whole = this.including(area, kFitMargin / width, from);
+        return {
+            k,
+            x: (area.right - area.left) * k <= width ? whole.x : from.x,
+            y: (area.bottom - area.top) * k <= height ? whole.y : from.y,
+        };
     }
 
     // The least move that brings an area into the window less a margin, in parts of the window's size.

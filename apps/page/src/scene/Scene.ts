@@ -15,8 +15,9 @@ import { Camera, eased, type Placing, type Point } from "./Camera";
 
 const kMostReadable = 420; // boxes in sight
 const kGlideTime = 520; // ms
-const kFadeTime = 200; // ms
-const kRoomAround = 0.6; // of the window, drawn on each side of it
+const kFadeTime = 200; // ms, as in page.css
+const kLineWidth = 1.6; // points
+const kRoomAround = 0.4; // of the window, drawn on each side of it
 
 export interface SceneEvents {
     // A box was clicked, or Enter pressed on it.
@@ -42,7 +43,7 @@ interface Glide {
 export class Scene {
     readonly camera: Camera;
     private readonly world = svg("g", { class: "world" });
-    private readonly lines = svg("path", { class: "line" });
+    private lines = svg("path", { class: "line" });
     private readonly crowd = svg("g", { class: "crowd", "aria-hidden": "true" });
     private readonly ghosts = svg("g", { class: "ghosts", "aria-hidden": "true" });
     private readonly boxLayer = svg("g", { class: "boxes" });
@@ -128,6 +129,7 @@ export class Scene {
 
     // To call when the window's size has changed.
     resized(): void {
+        this.camera.resized();
         this.drawn = null;
         this.update();
     }
@@ -144,8 +146,6 @@ export class Scene {
     private begin(picture: Picture): void {
         this.camera.place(this.opening(picture));
         this.update();
-        fadeIn(this.boxLayer);
-        fadeIn(this.lines);
     }
 
     private arrive(before: Picture, picture: Picture, held: Box, oldElements: Map<Box, SVGGElement>): void {
@@ -185,11 +185,8 @@ export class Scene {
     // zoom of the moment has room for it.
     private comfortable(picture: Picture, start: Placing, otherView: boolean): Placing {
         if (otherView) return this.opening(picture);
-        const { bounds } = picture;
         const near = this.camera.including(picture.areaOf(picture.focusBox), 0.3, start);
-        const { width, height } = this.camera.size;
-        const fits = (bounds.right - bounds.left) * start.k <= width && (bounds.bottom - bounds.top) * start.k <= height;
-        return fits ? this.camera.including(bounds, 0.02, near) : near;
+        return this.camera.includingWhole(picture.bounds, near);
     }
 
     private leaveGhosts(picture: Picture, shift: Point, oldElements: Map<Box, SVGGElement>): void {
@@ -201,22 +198,28 @@ export class Scene {
             gone.push(element);
         }
         this.ghosts.replaceChildren(...gone);
-        this.ghosts.animate([{ opacity: 1 }, { opacity: 0 }], { duration: kFadeTime, fill: "forwards" }).onfinish = () =>
-            this.ghosts.replaceChildren();
+        setTimeout(() => gone.forEach((element) => element.remove()), kFadeTime);
     }
 
     private fadeNewcomers(before: Picture): void {
-        for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) fadeIn(element, kGlideTime * 0.45);
-        fadeIn(this.lines, kGlideTime * 0.7);
-        fadeIn(this.crowd, kGlideTime * 0.3);
+        for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) element.classList.add("late");
+        const lines = svg("path", { class: "line later", d: this.lines.getAttribute("d"), "stroke-width": this.lines.getAttribute("stroke-width") });
+        this.lines.replaceWith(lines);
+        this.lines = lines;
     }
 
     private step = (now: number): void => {
         if (!this.glide || !this.picture) return;
         const part = Math.min(1, Math.max(0, now - this.glide.start) / kGlideTime);
         for (const [box, element] of this.elements) this.put(box, element, eased(part));
-        if (part < 1) this.frame = requestAnimationFrame(this.step);
-        else this.glide = null;
+        if (part < 1) {
+            this.frame = requestAnimationFrame(this.step);
+            return;
+        }
+        // Now there is time for what lies around.
+        this.glide = null;
+        this.drawn = null;
+        this.update();
     };
 
     private put(box: Box, element: SVGGElement, part: number): void {
@@ -235,6 +238,7 @@ export class Scene {
         const { k, x, y } = placing;
         this.world.setAttribute("transform", `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`);
         if (this.picture) this.update();
+        this.thickenLines();
         this.events.moved(placing);
     }
 
@@ -251,7 +255,8 @@ export class Scene {
             return;
         }
         this.crowded = crowded;
-        this.drawn = grown(needed, (sight.right - sight.left) * kRoomAround, (sight.bottom - sight.top) * kRoomAround);
+        const around = this.glide ? 0 : kRoomAround;
+        this.drawn = grown(needed, (sight.right - sight.left) * around, (sight.bottom - sight.top) * around);
         this.drawLines(picture);
         this.drawCrowd(picture);
         this.drawBoxes(crowded ? [] : picture.boxesWithin(this.drawn), picture);
@@ -260,8 +265,13 @@ export class Scene {
     private drawLines(picture: Picture): void {
         const segments = this.crowded ? picture.segments : picture.segmentsWithin(this.drawn!);
         this.lines.setAttribute("d", segments.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`).join(""));
-        // Lines stay to be seen when the picture is a long way off.
-        this.lines.setAttribute("stroke-width", String(Math.max(1.6, this.crowded ? 0.7 / this.camera.placing.k : 0)));
+        this.thickenLines();
+    }
+
+    // Lines stay to be seen when the picture is a long way off.
+    private thickenLines(): void {
+        const width = String(Math.max(kLineWidth, Math.round(7 / this.camera.placing.k) / 10));
+        if (this.lines.getAttribute("stroke-width") !== width) this.lines.setAttribute("stroke-width", width);
     }
 
     private drawCrowd(picture: Picture): void {
@@ -365,9 +375,4 @@ function clipped(window: Rectangle, drawn: Rectangle, bounds: Rectangle): Rectan
     const right = Math.min(window.right, bounds.right);
     const bottom = Math.min(window.bottom, bounds.bottom);
     return left > right || top > bottom ? drawn : { left, top, right, bottom };
-}
-
-function fadeIn(element: Element, delay = 0): void {
-    if (prefersStillness()) return;
-    element.animate([{ opacity: 0 }, { opacity: 1 }], { duration: kFadeTime, delay, fill: "backwards" });
 }

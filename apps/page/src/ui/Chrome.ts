@@ -241,7 +241,7 @@ export class Chrome {
             row(sign("focus"), items.focus),
             row(sign("more", "+3"), items.hidden),
             row(sign("missing", "?"), items.missing),
-            row(sign("twin", "\u29c9"), items.repeated),
+            row(sign("twin", icon("twins")), items.repeated),
         );
         return html("details", { id: "legend" }, html("summary", {}, ui.legend), list);
     }

@@ -15,6 +15,8 @@ import { icon, silhouette } from "./icons";
 // Told by the panel in other ways, or of no use to a reader.
 const kUntold = new Set(["NAME", "SEX", "FAMC", "FAMS", "HUSB", "WIFE", "CHIL", "CHAN", "CREA", "RIN", "UID", "_UID", "OBJE", "SUBM", "EXID"]);
 
+const kMostListed = 24; // relatives of a kind, until all are asked for
+
 export interface PanelEvents {
     choose(person: number): void;
     nextBox(person: number): void;
@@ -53,12 +55,13 @@ export class SidePanel {
         const sections = [
             this.header(person, standing),
             this.facts(person, family),
-            this.people(this.ui.panel.parents, this.parents(person, family)),
+            this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
             this.couples(person, family),
-            this.people(this.ui.panel.siblings, family.siblingsOf(person).map((id) => this.link(family.person(id)))),
+            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) => this.link(family.person(id))),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));
-        this.element.scrollTop = 0;
+        // Not at once: scrolling has the browser lay out the whole page, picture and all.
+        requestAnimationFrame(() => [this.element, this.body].forEach((part) => part.scrollTo(0, 0)));
         this.element.dataset["personId"] = String(person.id);
     }
 
@@ -108,7 +111,7 @@ export class SidePanel {
         const { date, place, value } = fact;
         const parts = [
             date && html("span", { class: "date" }, dateText(date, this.messages)),
-            place && html("span", { class: "place", dir: "auto" }, place),
+            place && html("span", { class: "place", dir: "auto" }, placeText(place)),
             value && value !== "Y" && html("span", { class: "value", dir: "auto" }, value),
         ].filter((part): part is HTMLSpanElement => Boolean(part));
         this.appendFact(list, factLabel(fact.tag, this.messages), parts);
@@ -157,20 +160,37 @@ export class SidePanel {
         const partner = couple.husband === person.id ? couple.wife : couple.husband;
         const facts = html("dl", {});
         for (const fact of family.file.factsOfFamily(couple.id)) if (!kUntold.has(fact.tag)) this.appendFactOf(facts, fact);
-        const children = couple.children.map((id) => html("li", {}, this.link(family.person(id))));
+        const children = this.list(couple.children, (id) => this.link(family.person(id)));
+        children.className = "children";
+        children.setAttribute("aria-label", this.ui.panel.children);
         return html(
             "div",
             { class: "couple" },
             partner ? this.link(family.person(partner)) : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
             facts.childElementCount > 0 && facts,
-            children.length > 0 && html("ul", { class: "children", "aria-label": this.ui.panel.children }, ...children),
+            couple.children.length > 0 && children,
         );
     }
 
-    private people(title: string, links: readonly HTMLElement[]): HTMLElement | null {
-        if (links.length === 0) return null;
-        const items = links.map((link) => html("li", {}, link));
-        return html("section", {}, html("h3", {}, title), html("ul", {}, ...items));
+    private people<Thing>(title: string, things: readonly Thing[], linkOf: (thing: Thing) => HTMLElement): HTMLElement | null {
+        return things.length > 0 ? html("section", {}, html("h3", {}, title), this.list(things, linkOf)) : null;
+    }
+
+    private list<Thing>(things: readonly Thing[], linkOf: (thing: Thing) => HTMLElement): HTMLElement {
+        const list = html("ul", {});
+        const add = (some: readonly Thing[]) => list.append(...some.map((thing) => html("li", {}, linkOf(thing))));
+        const isLong = things.length > kMostListed + 1;
+        add(isLong ? things.slice(0, kMostListed) : things);
+        if (!isLong) return list;
+        const rest = html("button", { type: "button", class: "plain" }, this.ui.panel.allOf(things.length));
+        const last = html("li", {}, rest);
+        onClick(rest, () => {
+            last.remove();
+            add(things.slice(kMostListed));
+            list.querySelectorAll("a")[kMostListed]?.focus();
+        });
+        list.append(last);
+        return list;
     }
 
     private link(person: Person | undefined, note = ""): HTMLElement {
@@ -189,4 +209,10 @@ export class SidePanel {
         });
         return link;
     }
+}
+
+// "Kew,,,England" is "Kew, England".
+function placeText(place: string): string {
+    const parts = place.split(",").map((part) => part.trim());
+    return parts.filter((part) => part !== "").join(", ");
 }

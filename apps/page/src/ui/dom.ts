@@ -69,6 +69,11 @@ export function recall(key: string): string | null {
     }
 }
 
+// Asked for while pictures are drawn, when a question to the browser would have it lay out the page at once.
+const stillness = matchMedia("(prefers-reduced-motion: reduce)");
+let still = stillness.matches;
+stillness.addEventListener("change", () => (still = stillness.matches));
+
 export function prefersStillness(): boolean {
-    return matchMedia("(prefers-reduced-motion: reduce)").matches;
+    return still;
 }

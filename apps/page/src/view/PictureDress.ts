@@ -40,6 +40,16 @@ export class PictureDress implements Dress {
         return kinship ? kinshipText(kinship, this.family.person(id)?.sex ?? "other", this.wording.messages) : "";
     }
 
+    // As kinshipOf, without the words that say by which side.
+    shortKinshipOf(id: number): string {
+        const kinship = id === this.picture.focus ? undefined : this.family.kinshipsTo(this.picture.focus).get(id);
+        if (!kinship) return "";
+        const sex = this.family.person(id)?.sex ?? "other";
+        const [only, ...more] = kinship.steps;
+        if (only?.kind !== "blood" || more.length > 0) return withoutExplanation(kinshipText(kinship, sex, this.wording.messages));
+        return this.wording.messages.kinship.relative({ ...only, sex }).plain;
+    }
+
     hiddenOf(box: Box): number {
         return box.hasHiddenRelatives ? this.family.hiddenRelatives(box.person, this.picture) : -1;
     }
@@ -69,7 +79,7 @@ export class PictureDress implements Dress {
             nameParts: nameParts(person, messages),
             rightToLeft: directionOf(person.name) === "rtl",
             years: shortYears(person),
-            kinship: this.wording.kinshipInBoxes ? withoutExplanation(kinship) : null,
+            kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
             hidden,
             repeated: boxes > 1,
             isFocus,
