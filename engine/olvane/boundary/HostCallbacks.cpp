@@ -99,11 +99,12 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
     for (const std::int64_t entry : host(manager).childrenForPersonWithID(id)) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
         std::string date = stringToString(host(manager).dateForPersonWithID(lowBits(entry), true));
-        ChildrenAdapter child(childKey, std::move(date), glue.personOfKey(childKey), ++place);
+        ++place;
         if (endFirst) {
-            children.insert(children.end(), std::move(child));
+            children.emplace_hint(children.end(), childKey, std::move(date), glue.personOfKey(childKey),
+                                  place);
         } else {
-            children.insert(std::move(child));
+            children.emplace(childKey, std::move(date), glue.personOfKey(childKey), place);
         }
     }
 }

@@ -58,7 +58,8 @@ std::size_t lengthOfFirstCharacter(const std::string& text) {
 
 }  // namespace
 
-std::string stringToString(const std::string& text) {
-    if (text.empty() || text.front() == '\0') return std::string();
-    return text.substr(0, lengthOfFirstCharacter(text));
+std::string stringToString(std::string text) {
+    const bool isNothing = text.empty() || text.front() == '\0';
+    text.resize(isNothing ? 0 : lengthOfFirstCharacter(text));
+    return text;
 }

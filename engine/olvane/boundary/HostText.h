@@ -18,4 +18,4 @@ OLVANE_API int stringToInt(std::string text);
 // narrow: dates are looked at only to tell two records of a child apart, and longer texts would tell apart
 // what has been one record in every chart so far. The first byte where the text does not begin with a
 // well-formed UTF-8 character.
-OLVANE_API std::string stringToString(const std::string& text);
+OLVANE_API std::string stringToString(std::string text);

@@ -33,16 +33,19 @@ void updateBounds(ResultBounds& bounds, int x, int y) {
 class Piece {
 public:
     void add(int value, char separator) {
-        end_ = std::to_chars(end_, end_ + kLongestNumber, value).ptr;
-        *end_++ = separator;
+        char* const place = room_ + length_;
+        char* const end = std::to_chars(place, place + kLongestNumber, value).ptr;
+        *end = separator;
+        length_ = static_cast<std::size_t>(end - room_) + 1;
     }
-    void appendTo(std::string& text) const { text.append(room_, static_cast<std::size_t>(end_ - room_)); }
+    void clear() { length_ = 0; }
+    void appendTo(std::string& text) const { text.append(room_, length_); }
 
 private:
     static constexpr std::size_t kLongestNumber = 11;
 
     char room_[4 * (kLongestNumber + 1)];
-    char* end_ = room_;
+    std::size_t length_ = 0;
 };
 
 void appendPlaceAndFlag(std::string& text, const std::string& personText, int x, int y, bool flag) {
@@ -55,14 +58,24 @@ void appendPlaceAndFlag(std::string& text, const std::string& personText, int x,
     piece.appendTo(text);
 }
 
+void rewrite(Piece& piece, const TreeLineSegment& segment) {
+    piece.clear();
+    piece.add(wholePoint(segment.x1), ',');
+    piece.add(wholePoint(segment.y1), ',');
+    piece.add(wholePoint(segment.x2), ',');
+    piece.add(wholePoint(segment.y2), '|');
+}
+
+// Each child of a couple leaves the same drop, one behind the other, so the last piece often serves again.
 void appendSegments(std::string& text, const TreeViewPerson& person) {
+    const TreeLineSegment* last = nullptr;
+    Piece piece;
     for (const TreeLineSegment& segment : person.lineSegments) {
-        Piece piece;
-        piece.add(wholePoint(segment.x1), ',');
-        piece.add(wholePoint(segment.y1), ',');
-        piece.add(wholePoint(segment.x2), ',');
-        piece.add(wholePoint(segment.y2), '|');
+        const bool isRepeated = last != nullptr && last->firstEnd() == segment.firstEnd() &&
+                                last->secondEnd() == segment.secondEnd();
+        if (!isRepeated) rewrite(piece, segment);
         piece.appendTo(text);
+        last = &segment;
     }
 }
 

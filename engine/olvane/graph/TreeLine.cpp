@@ -10,9 +10,10 @@
 #include <cmath>
 #include <cstddef>
 #include <stdexcept>
-#include <utility>
 
-TreeLine::TreeLine(std::vector<TreePoint> points) : points_(std::move(points)) {}
+TreeLine::TreeLine(const std::vector<TreePoint>& points) : points_(points.begin(), points.end()) {}
+
+TreeLine::TreeLine(std::initializer_list<TreePoint> points) : points_(points.begin(), points.end()) {}
 
 TreeLine::TreeLine(TreeLineSegment segment) : points_{segment.firstEnd(), segment.secondEnd()} {}
 
@@ -26,23 +27,28 @@ void TreeLine::pushPointFront(TreePoint point) {
     lengthIsCached = false;
 }
 
+const TreePoint& TreeLine::pointAt(std::size_t place) const {
+    if (place >= points_.size()) throw std::out_of_range("the line is too short");
+    return points_[place];
+}
+
 TreePoint TreeLine::first() const {
-    return points_.at(0);
+    return pointAt(0);
 }
 
 TreePoint TreeLine::last() const {
-    return points_.at(points_.size() - 1);
+    return pointAt(points_.size() - 1);
 }
 
 TreeLineSegment TreeLine::frontLineSegment() const {
-    const TreePoint from = points_.at(0);
-    const TreePoint to = points_.at(1);
+    const TreePoint from = pointAt(0);
+    const TreePoint to = pointAt(1);
     return TreeLineSegment{from.x, from.y, to.x, to.y, false};
 }
 
 TreeLineSegment TreeLine::backLineSegment() const {
-    const TreePoint from = points_.at(points_.size() - 1);
-    const TreePoint to = points_.at(points_.size() - 2);
+    const TreePoint from = pointAt(points_.size() - 1);
+    const TreePoint to = pointAt(points_.size() - 2);
     return TreeLineSegment{from.x, from.y, to.x, to.y, false};
 }
 

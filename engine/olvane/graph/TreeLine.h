@@ -3,7 +3,10 @@
 
 #pragma once
 
+#include <boost/container/small_vector.hpp>
+
 #include <cstddef>
+#include <initializer_list>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -18,10 +21,10 @@
 class OLVANE_API TreeLine {
 public:
     TreeLine() = default;
-    explicit TreeLine(std::vector<TreePoint> points);
+    explicit TreeLine(const std::vector<TreePoint>& points);
+    explicit TreeLine(std::initializer_list<TreePoint> points);
     explicit TreeLine(TreeLineSegment segment);  // two points: the first end, then the second
 
-    void reserve(std::size_t points) { points_.reserve(points); }
     void pushPointBack(TreePoint point);
     void pushPointFront(TreePoint point);
 
@@ -52,10 +55,14 @@ public:
     // Fails: std::logic_error when a chosen segment does not join; ordinary numbers cannot bring that about.
     static std::vector<TreeLine> TreeLinesFromLineSegments(std::vector<TreeLineSegment> segments);
 
-    const std::vector<TreePoint>& points() const { return points_; }
+    std::vector<TreePoint> points() const { return std::vector<TreePoint>(points_.begin(), points_.end()); }
 
 private:
-    std::vector<TreePoint> points_;
+    const TreePoint& pointAt(std::size_t place) const;
+
+    static constexpr int kUsualPoints = 4;  // of a drop, a bus and a stem
+
+    boost::container::small_vector<TreePoint, kUsualPoints> points_;
     float cachedLength = 0.0f;
     bool lengthIsCached = false;
 };

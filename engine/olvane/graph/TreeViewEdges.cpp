@@ -10,7 +10,14 @@
 #include <olvane/graph/TreeViewPerson.h>
 #include <olvane/graph/TreeViewSpouseEdge.h>
 
+#include <cstddef>
 #include <utility>
+
+namespace {
+
+constexpr std::size_t kUsualChildren = 4;  // of a couple
+
+}  // namespace
 
 TreeViewEdge::~TreeViewEdge() = default;
 
@@ -37,6 +44,7 @@ TreeViewSpouseEdge::TreeViewSpouseEdge(TreeLine line, TreeViewPerson* first, Tre
 TreeViewSpouseEdge::~TreeViewSpouseEdge() = default;
 
 void TreeViewSpouseEdge::addChildEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge) {
+    if (childEdges.empty()) childEdges.reserve(kUsualChildren);
     childEdges.push_back(edge);
 }
 

@@ -14,8 +14,6 @@ namespace SharedTreeViewer {
 // who holds it, which reach the host, and to the course that an edge keeps. Pieces are not deduplicated.
 class LineCourse {
 public:
-    LineCourse() { line_.reserve(kUsualPoints); }
-
     void draw(TreeViewPerson& holder, float x1, float y1, float x2, float y2) {
         holder.addLineSegment(x1, y1, x2, y2, false);
         line_.addLineSegmentBack(TreeLineSegment{x1, y1, x2, y2, false});
@@ -25,8 +23,6 @@ public:
     TreeLine takeLine() { return std::move(line_); }
 
 private:
-    static constexpr int kUsualPoints = 4;  // of a drop, a bus and a stem
-
     TreeLine line_;
 };
 
