@@ -10,7 +10,7 @@ _olvane() {
     else
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
-    local commands="people layout draw batch check"
+    local commands="people layout draw batch check page"
     local view="--view --generations --boxes"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
@@ -39,6 +39,7 @@ _olvane() {
         draw) COMPREPLY=($(compgen -W "--help --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --focus-from $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --focus --all $view $family" -- "$cur")) ;;
+        page) COMPREPLY=($(compgen -W "--help --focus --output --title --view $living" -- "$cur")) ;;
     esac
 }
 

@@ -104,7 +104,11 @@ private:
         if (!isHidden(id)) {
             for (const Fact& fact : data_.factsOfPerson(id)) writeFact(fact);
         }
-        for (const FamilyLink& link : data_.parentLinks(id)) writeLink("FAMC", link);
+        if (isHidden(id)) {
+            writeParentsAlone(id);
+        } else {
+            for (const FamilyLink& link : data_.parentLinks(id)) writeLink("FAMC", link);
+        }
         for (const FamilyLink& link : data_.coupleLinks(id)) writeLink("FAMS", link);
     }
 
@@ -134,6 +138,17 @@ private:
         piece("PEDI", pedigreeWord(link.pedigree));
     }
 
+    // The family that father and mother come from, as if there were no other.
+    void writeParentsAlone(PersonId id) {
+        const Person& person = data_.person(id);
+        for (const FamilyLink& link : data_.parentLinks(id)) {
+            if (link.family == 0) continue;
+            const Family& family = data_.family(link.family);
+            if (family.husband != person.father || family.wife != person.mother) continue;
+            return pointer(1, "FAMC", familyXrefs_[link.family - 1]);
+        }
+    }
+
     void writeFamily(FamilyId id) {
         const Family& family = data_.family(id);
         record(familyXrefs_[id - 1], "FAM");
@@ -142,12 +157,8 @@ private:
         for (const ChildLink& link : data_.childLinks(id)) {
             if (link.child != 0) pointer(1, "CHIL", personXrefs_[link.child - 1]);
         }
-        if (!hasHiddenPartner(id)) {
-            for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);
-            return;
-        }
-        if (family.married) line(1, "MARR", "Y");
-        if (family.divorced) line(1, "DIV", "Y");
+        if (hasHiddenPartner(id)) return;
+        for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);
     }
 
     void record(std::string_view xref, std::string_view tag) {

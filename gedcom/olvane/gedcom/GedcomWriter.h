@@ -22,8 +22,8 @@ struct WriteOptions {
 //
 // Holds: UTF-8. Read again with facts, it gives the same persons and families with the same ids, relatives,
 //        names, dates and facts. Identifiers stay where each stands for one record; others are made. Of a
-//        hidden person there are sex and links alone; of a family with a hidden partner also MARR and DIV,
-//        without date and place, since a picture tells the couple's state.
+//        hidden person there are sex and links alone, and no word on adoption; of a family with a hidden partner
+//        there is nothing but who belongs to it.
 // Fails: what was read without facts is written without; nothing is thrown but std::bad_alloc.
 std::string writeGedcom(const GedcomData& data, const WriteOptions& options = {});
 

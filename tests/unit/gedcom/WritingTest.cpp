@@ -112,8 +112,22 @@ TEST(Writing, leavesOutWhatIsHidden) {
     EXPECT_EQ(namesOf(again), "Living|Karl Shown");
     EXPECT_EQ(again.person(1).sex, Sex::female);
     EXPECT_EQ(idsOf(again.spouses(2)), "1");
-    EXPECT_TRUE(again.family(1).married);
+    EXPECT_FALSE(again.family(1).married);
     EXPECT_EQ(dateOf(again.person(2).death), "1999=1999");
+}
+
+TEST(Writing, leavesOutThatAHiddenPersonWasAdopted) {
+    const GedcomData data = readWithFacts(
+        document("0 @I1@ INDI\n1 FAMC @F1@\n2 PEDI adopted\n1 FAMC @F2@\n2 PEDI birth\n"
+                 "0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I3@ INDI\n1 SEX M\n1 FAMS @F2@\n"
+                 "0 @F1@ FAM\n1 HUSB @I2@\n1 CHIL @I1@\n0 @F2@ FAM\n1 HUSB @I3@\n1 CHIL @I1@\n"));
+    WriteOptions options;
+    options.hidden = {true, false, false};
+    const std::string text = writeGedcom(data, options);
+    EXPECT_EQ(text.find("PEDI"), std::string::npos) << text;
+    const GedcomData again = readWithFacts(text);
+    EXPECT_EQ(again.person(1).father, 3U);
+    EXPECT_EQ(again.parentLinks(1).size(), 1U);
 }
 
 TEST(Writing, readsAgainAsTheSameFamilyForEveryRealFile) {
