@@ -106,6 +106,10 @@ export class App implements ChromeActions {
     private open(bytes: Uint8Array, name: string, embedded: EmbeddedFamily | null): void {
         const start = performance.now();
         const file = this.engine.readGedcom(bytes, name);
+        if (file.persons.length === 0) {
+            file.close();
+            throw new Error(this.ui.errors.noPersons);
+        }
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
         this.family?.close();

@@ -81,6 +81,8 @@ export const uiGerman: UiMessages = {
         focus: "Hauptperson des Bildes",
         hidden: "Nicht gezeigte Verwandte: Klick zeigt sie",
         missing: "Elternteil unbekannt",
+        divorced: "Geschieden",
+        adopted: "Adoptiert oder Pflegekind",
         repeated: "Steht an mehreren Stellen",
     },
     treeLabel: (name, view) => `${view}: ${name}`,
@@ -117,7 +119,8 @@ export const uiGerman: UiMessages = {
     diagnostics: {
         title: "Anmerkungen zur Datei",
         button: (n) => (n === 1 ? "1 Anmerkung zur Datei" : `${n} Anmerkungen zur Datei`),
-        summary: (persons, problems) => `${persons} Personen gelesen, mit ${problems} Anmerkungen.`,
+        summary: (persons, problems) =>
+            `${persons.toLocaleString("de")} ${persons === 1 ? "Person" : "Personen"} gelesen, mit ${problems} ${problems === 1 ? "Anmerkung" : "Anmerkungen"}.`,
         line: (n) => `Zeile ${n}`,
         severities: { error: "Fehler", warning: "Warnung", note: "Hinweis" },
         furtherOnes: (n) => `und ${n} weitere`,

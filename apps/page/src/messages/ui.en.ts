@@ -81,6 +81,8 @@ export const uiEnglish: UiMessages = {
         focus: "Focus of the picture",
         hidden: "Relatives not shown: click to see them",
         missing: "Parent not known",
+        divorced: "Divorced",
+        adopted: "Adopted or foster child",
         repeated: "Stands in several places",
     },
     treeLabel: (name, view) => `${view} of ${name}`,
@@ -116,7 +118,8 @@ export const uiEnglish: UiMessages = {
     diagnostics: {
         title: "Remarks on the file",
         button: (n) => (n === 1 ? "1 remark on the file" : `${n} remarks on the file`),
-        summary: (persons, problems) => `${persons} persons were read, with ${problems} remarks.`,
+        summary: (persons, problems) =>
+            `${persons.toLocaleString("en")} ${persons === 1 ? "person was" : "persons were"} read, with ${problems} ${problems === 1 ? "remark" : "remarks"}.`,
         line: (n) => `line ${n}`,
         severities: { error: "Error", warning: "Warning", note: "Note" },
         furtherOnes: (n) => `and ${n} more`,

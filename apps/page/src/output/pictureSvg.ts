@@ -4,8 +4,8 @@
 // The whole picture as a drawing that stands by itself: colours and fonts as attributes, nothing that only the page
 // understands.
 
-import { drawBox } from "../scene/boxArt";
-import type { Dress } from "../scene/Scene";
+import { drawBox, handleOf } from "../scene/boxArt";
+import { type Dress, linePaths } from "../scene/Scene";
 import { kFontFamily } from "../scene/textFit";
 import { svg } from "../ui/dom";
 import type { Picture } from "../view/Picture";
@@ -19,7 +19,7 @@ const kUsual: Readonly<Record<string, string>> = {
     "text-anchor": "start",
     "unicode-bidi": "normal",
 };
-const kPageOnly = ["tabindex", "aria-current", "data-person-id", "data-xref", "data-box", "class"];
+const kPageOnly = ["tabindex", "aria-current", "aria-hidden", "data-person-id", "data-xref", "data-box", "class"];
 
 export interface WholePicture {
     readonly svg: SVGSVGElement;
@@ -42,17 +42,18 @@ export function wholePicture(picture: Picture, dress: Dress, title: string, them
         "font-family": kFontFamily,
         class: "whole",
     });
-    const d = picture.segments.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`).join("");
     drawing.append(
         svg("title", {}, title),
         svg("rect", { class: "paper", x: left - kMargin, y: top - kMargin, width, height }),
-        svg("path", { class: "line", d, "stroke-width": 1.6 }),
+        svg("g", { "stroke-width": 1.6 }, ...linePaths(picture.segments, dress)),
     );
     for (const box of picture.boxes) {
         const look = dress.lookOf(box);
         const element = drawBox(look, picture.sizes);
         element.setAttribute("transform", `translate(${box.x} ${box.y})`);
         element.setAttribute("role", "img");
+        element.setAttribute("aria-label", look.label);
+        for (const name of ["role", "aria-label"]) handleOf(element).removeAttribute(name);
         if (!look.isFocus) element.querySelector(".ring")?.remove();
         element.prepend(svg("title", {}, look.label));
         drawing.append(element);

@@ -6,11 +6,12 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
-import type { Sex } from "olvane";
+import type { Segment, Sex } from "olvane";
 import { prefersStillness, svg } from "../ui/dom";
 import type { Box, Picture } from "../view/Picture";
+import { kLineStyles, type LineStyle } from "../view/lineStyles";
 import { encloses, grown, type Rectangle } from "../view/SpatialGrid";
-import { type BoxLook, drawBox, repaintBox } from "./boxArt";
+import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, type Placing, type Point } from "./Camera";
 
 const kMostReadable = 420; // boxes in sight
@@ -33,6 +34,7 @@ export interface Dress {
     lookOf(box: Box): BoxLook;
     // Of a person's box.
     sexOf(box: Box): Sex;
+    styleOf(segment: Segment): LineStyle;
 }
 
 interface Glide {
@@ -43,7 +45,7 @@ interface Glide {
 export class Scene {
     readonly camera: Camera;
     private readonly world = svg("g", { class: "world" });
-    private lines = svg("path", { class: "line" });
+    private lines = svg("g", { class: "lines", "aria-hidden": "true" });
     private readonly crowd = svg("g", { class: "crowd", "aria-hidden": "true" });
     private readonly ghosts = svg("g", { class: "ghosts", "aria-hidden": "true" });
     private readonly boxLayer = svg("g", { class: "boxes" });
@@ -103,8 +105,7 @@ export class Scene {
         this.picture = null;
         this.activeBox = null;
         this.elements.clear();
-        this.lines.removeAttribute("d");
-        for (const group of [this.boxLayer, this.crowd, this.ghosts]) group.replaceChildren();
+        for (const group of [this.lines, this.boxLayer, this.crowd, this.ghosts]) group.replaceChildren();
     }
 
     fit(): void {
@@ -120,8 +121,8 @@ export class Scene {
         const before = this.activeBox;
         this.activeBox = box;
         this.update();
-        if (before) this.elements.get(before)?.setAttribute("tabindex", "-1");
-        this.elements.get(box)?.setAttribute("tabindex", "0");
+        if (before) this.handle(before)?.setAttribute("tabindex", "-1");
+        this.handle(box)?.setAttribute("tabindex", "0");
         if (takeKeys) this.focusActive();
         this.bringIntoSight(box);
         this.events.active(box);
@@ -193,7 +194,8 @@ export class Scene {
         const gone: SVGGElement[] = [];
         for (const [box, element] of oldElements) {
             if (picture.boxOfKey(box.key)) continue;
-            for (const name of ["role", "tabindex", "aria-label", "data-person-id", "data-xref", "data-box"]) element.removeAttribute(name);
+            for (const name of ["data-person-id", "data-xref", "data-box"]) element.removeAttribute(name);
+            for (const name of ["role", "tabindex", "aria-label", "aria-current"]) handleOf(element).removeAttribute(name);
             element.setAttribute("transform", `translate(${box.x + shift.x} ${box.y + shift.y})`);
             gone.push(element);
         }
@@ -203,7 +205,8 @@ export class Scene {
 
     private fadeNewcomers(before: Picture): void {
         for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) element.classList.add("late");
-        const lines = svg("path", { class: "line later", d: this.lines.getAttribute("d"), "stroke-width": this.lines.getAttribute("stroke-width") });
+        const lines = svg("g", { class: "lines later", "aria-hidden": "true", "stroke-width": this.lines.getAttribute("stroke-width") });
+        lines.append(...this.lines.childNodes);
         this.lines.replaceWith(lines);
         this.lines = lines;
     }
@@ -264,7 +267,7 @@ export class Scene {
 
     private drawLines(picture: Picture): void {
         const segments = this.crowded ? picture.segments : picture.segmentsWithin(this.drawn!);
-        this.lines.setAttribute("d", segments.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`).join(""));
+        this.lines.replaceChildren(...linePaths(segments, this.dress));
         this.thickenLines();
     }
 
@@ -301,7 +304,7 @@ export class Scene {
         for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box, picture));
         this.boxLayer.append(added);
         const focus = this.elements.get(picture.focusBox);
-        if (focus && this.boxLayer.lastChild !== focus && document.activeElement !== focus) this.boxLayer.append(focus);
+        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(document.activeElement)) this.boxLayer.append(focus);
     }
 
     private keepAlways(picture: Picture): void {
@@ -313,7 +316,7 @@ export class Scene {
     private newElement(box: Box, picture: Picture): SVGGElement {
         const element = drawBox(this.dress.lookOf(box), picture.sizes);
         element.setAttribute("data-box", String(box.index));
-        if (box === this.activeBox) element.setAttribute("tabindex", "0");
+        if (box === this.activeBox) handleOf(element).setAttribute("tabindex", "0");
         this.elements.set(box, element);
         this.put(box, element, this.glide ? 0 : 1);
         return element;
@@ -326,7 +329,12 @@ export class Scene {
     }
 
     private focusActive(): void {
-        if (this.activeBox) this.elements.get(this.activeBox)?.focus({ preventScroll: true });
+        if (this.activeBox) this.handle(this.activeBox)?.focus({ preventScroll: true });
+    }
+
+    private handle(box: Box): SVGRectElement | undefined {
+        const element = this.elements.get(box);
+        return element && handleOf(element);
     }
 
     private listen(): void {
@@ -353,6 +361,17 @@ export class Scene {
         const index = (target as Element | null)?.closest?.("[data-box]")?.getAttribute("data-box");
         return index ? (this.picture?.boxes[Number(index)] ?? null) : null;
     }
+}
+
+// One path for each style that is there.
+export function linePaths(segments: readonly Segment[], dress: Dress): SVGPathElement[] {
+    const paths = new Map<LineStyle, string>(kLineStyles.map((style) => [style, ""]));
+    for (const segment of segments) {
+        const { x1, y1, x2, y2 } = segment;
+        const style = dress.styleOf(segment);
+        paths.set(style, paths.get(style) + `M${x1} ${y1}L${x2} ${y2}`);
+    }
+    return [...paths].filter(([, d]) => d !== "").map(([style, d]) => svg("path", { class: "line " + style, d }));
 }
 
 function middleOf(area: Rectangle): Point {

@@ -47,10 +47,6 @@ export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
     const classes = ["box", look.person ? look.sex : "missing", look.isFocus && "focus", look.repeated && "repeated"];
     const box = svg("g", {
         class: classes.filter(Boolean).join(" "),
-        role: look.person ? "button" : "img",
-        tabindex: -1,
-        "aria-label": look.label,
-        "aria-current": look.isFocus && "true",
         "data-person-id": look.person || null,
         "data-xref": look.xref || null,
     });
@@ -65,15 +61,32 @@ export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
 // Draws a box anew without letting go of its element, on which the keys may stand.
 export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Sizes): void {
     const fresh = drawBox(look, sizes);
-    box.setAttribute("aria-label", look.label);
-    box.replaceChildren(...fresh.childNodes);
+    const handle = handleOf(box);
+    handle.setAttribute("aria-label", look.label);
+    while (handle.nextSibling) handle.nextSibling.remove();
+    const last = handleOf(fresh);
+    while (last.nextSibling) box.append(last.nextSibling);
+}
+
+// What takes the keys and is read out: the frame. The texts beside it are for the eye alone.
+export function handleOf(box: SVGGElement): SVGRectElement {
+    return box.querySelector<SVGRectElement>(":scope > .frame")!;
 }
 
 function appendFrame(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
     const rx = kCorners[look.sex];
     box.append(
         svg("rect", { class: "ring", x: -5, y: -5, width: nodeWidth + 10, height: nodeHeight + 10, rx: rx + 5 }),
-        svg("rect", { class: "frame", width: nodeWidth, height: nodeHeight, rx }),
+        svg("rect", {
+            class: "frame",
+            width: nodeWidth,
+            height: nodeHeight,
+            rx,
+            role: look.person ? "button" : "img",
+            tabindex: -1,
+            "aria-label": look.label,
+            "aria-current": look.isFocus && "true",
+        }),
     );
 }
 
@@ -128,7 +141,7 @@ function figure(look: BoxLook, x: number, y: number): SVGElement {
 }
 
 function text(className: string, x: number, y: number, content: string, rightToLeft = false, size?: number): SVGTextElement {
-    const line = svg("text", { class: className, x, y: Math.round(y * 10) / 10, "font-size": size }, content);
+    const line = svg("text", { class: className, x, y: Math.round(y * 10) / 10, "font-size": size, "aria-hidden": "true" }, content);
     if (rightToLeft) line.setAttribute("direction", "rtl");
     return line;
 }
@@ -137,7 +150,7 @@ function text(className: string, x: number, y: number, content: string, rightToL
 function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): void {
     const label = hidden > 0 ? "+" + hidden : "+";
     const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
-    const badge = svg("g", { class: "badge", transform: `translate(${nodeWidth - width + 8} -9)` });
+    const badge = svg("g", { class: "badge", "aria-hidden": "true", transform: `translate(${nodeWidth - width + 8} -9)` });
     badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
 }

@@ -83,7 +83,7 @@ export class Chrome {
     }
 
     showFamily(title: string, persons: string): void {
-        this.title.replaceChildren(html("strong", { dir: "auto" }, title), html("span", {}, persons));
+        this.title.replaceChildren(html("h1", { dir: "auto" }, title), html("span", {}, persons));
     }
 
     showState(state: ViewState, canGoBack: boolean, canGoForward: boolean): void {
@@ -241,6 +241,8 @@ export class Chrome {
             row(sign("focus"), items.focus),
             row(sign("more", "+3"), items.hidden),
             row(sign("missing", "?"), items.missing),
+            row(sign("divorced"), items.divorced),
+            row(sign("adopted"), items.adopted),
             row(sign("twin", icon("twins")), items.repeated),
         );
         return html("details", { id: "legend" }, html("summary", {}, ui.legend), list);
@@ -253,7 +255,7 @@ export class Chrome {
     }
 
     private viewButton(view: ViewName, label: string): HTMLButtonElement {
-        const button = html("button", { id: "view-" + view, type: "button", "aria-pressed": "false" }, icon(view), html("span", {}, label));
+        const button = html("button", { id: "view-" + view, type: "button", "aria-pressed": "false", "aria-label": label }, icon(view), html("span", {}, label));
         onClick(button, () => this.actions.setView(view));
         return button;
     }

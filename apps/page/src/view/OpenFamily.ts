@@ -95,6 +95,7 @@ export class OpenFamily {
         const siblings = Math.min(6, parents[0]?.children.length ?? 0);
         const children = Math.min(6, person.children.length);
         const grandchildren = person.children.some((child) => (this.person(child)?.children.length ?? 0) > 0) ? 2 : 0;
-        return 3 * parents.length + 2 * grandparents + siblings + children + grandchildren + Math.min(2, person.spouses.length);
+        const named = person.name === "" ? -10 : 0;
+        return named + 3 * parents.length + 2 * grandparents + siblings + children + grandchildren + Math.min(2, person.spouses.length);
     }
 }

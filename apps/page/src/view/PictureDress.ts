@@ -4,13 +4,14 @@
 // What stands in each box and what is read out for it. Kinship is told only once it is known, since a search through
 // a large family must not hold up the picture.
 
-import type { Person, Sex } from "olvane";
-import { kinshipText } from "../kinship";
+import type { Person, Segment, Sex } from "olvane";
+import { kinshipText, nearKinshipText } from "../kinship";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../names";
 import type { BoxLook } from "../scene/boxArt";
 import type { Dress } from "../scene/Scene";
+import { type LineStyle, lineStylesOf } from "./lineStyles";
 import type { OpenFamily } from "./OpenFamily";
 import type { Box, Picture } from "./Picture";
 
@@ -22,12 +23,19 @@ export interface Wording {
 
 export class PictureDress implements Dress {
     kinshipKnown = false;
+    private readonly lineStyles: ReadonlyMap<Segment, LineStyle>;
 
     constructor(
         private readonly family: OpenFamily,
         private readonly picture: Picture,
         private readonly wording: Wording,
-    ) {}
+    ) {
+        this.lineStyles = lineStylesOf(picture, family);
+    }
+
+    styleOf(segment: Segment): LineStyle {
+        return this.lineStyles.get(segment) ?? "plain";
+    }
 
     sexOf(box: Box): Sex {
         return this.family.person(box.person)?.sex ?? "other";
@@ -45,9 +53,7 @@ export class PictureDress implements Dress {
         const kinship = id === this.picture.focus ? undefined : this.family.kinshipsTo(this.picture.focus).get(id);
         if (!kinship) return "";
         const sex = this.family.person(id)?.sex ?? "other";
-        const [only, ...more] = kinship.steps;
-        if (only?.kind !== "blood" || more.length > 0) return withoutExplanation(kinshipText(kinship, sex, this.wording.messages));
-        return this.wording.messages.kinship.relative({ ...only, sex }).plain;
+        return nearKinshipText(kinship, sex, this.wording.messages);
     }
 
     hiddenOf(box: Box): number {
@@ -121,9 +127,4 @@ function nameParts(person: Person, messages: Messages): string[] {
     const { given, surname, name } = person;
     if (!given || !surname) return [nameOf(person, messages)];
     return name.startsWith(surname) && !name.endsWith(surname) ? [surname, given] : [given, surname];
-}
-
-// "uncle (mother's brother)" is "uncle" where there is little room.
-function withoutExplanation(kinship: string): string {
-    return kinship.replace(/ \([^)]*\)$/, "");
 }

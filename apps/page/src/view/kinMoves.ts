@@ -14,7 +14,8 @@ const kStraying = 2.2; // how much worse a step aside is than one ahead
 export function boxTowards(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box | null {
     const ahead = (box: Box) => box !== from && distanceAhead(from, box, direction) > 0;
     const kin = kinBoxes(from, direction, picture, family).filter(ahead);
-    return nearest(from, direction, kin) ?? nearest(from, direction, inSector(from, direction, picture.boxes.filter(ahead)));
+    const others = picture.boxes.filter(ahead);
+    return nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture));
 }
 
 // Parents are above in the family view, and at the right in the pedigree, which lies on its side.
@@ -29,12 +30,11 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
     return [...kin.flatMap((id) => picture.boxesOf(id)), ...missing];
 }
 
-// Along a row only the row itself counts, and along a column only the column, if anybody stands there.
-function inSector(from: Box, direction: Direction, boxes: readonly Box[]): Box[] {
-    const along = (box: Box) => distanceAhead(from, box, direction);
-    const aside = (box: Box) => distanceAside(from, box, direction);
-    const straight = boxes.filter((box) => aside(box) < 1);
-    return straight.length > 0 ? straight : boxes.filter((box) => aside(box) < along(box) * 1.8);
+// Along a generation only the generation itself counts; from one to another also what lies not quite straight ahead.
+function inLine(from: Box, direction: Direction, boxes: readonly Box[], picture: Picture): Box[] {
+    const alongGeneration = (direction === "left" || direction === "right") === (picture.view === "family");
+    const slope = alongGeneration ? 0.2 : 1.8;
+    return boxes.filter((box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope);
 }
 
 function nearest(from: Box, direction: Direction, boxes: readonly Box[]): Box | null {
