@@ -69,7 +69,7 @@ describe("accessible", () => {
             await page.keyboard.press("Tab");
             const at = await page.evaluate(() => {
                 const element = document.activeElement;
-                return element.id || element.getAttribute("data-xref") || element.tagName;
+                return element.id || element.closest("[data-xref]")?.getAttribute("data-xref") || element.tagName;
             });
             reached.add(at);
         }
@@ -93,7 +93,7 @@ describe("accessible", () => {
             const { stroke, opacity, display, visibility } = getComputedStyle(document.querySelector(`#tree [data-xref="${xref}"] .ring`));
             return [stroke, opacity, display, visibility].join();
         }, xref);
-        await visit.box("I1").focus();
+        await visit.stand("I1");
         const before = await ring("I12");
         await visit.press("ArrowUp");
         const at = await visit.keysOn();

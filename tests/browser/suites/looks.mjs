@@ -37,7 +37,7 @@ describe("looks", () => {
         assert.equal(await page.evaluate(() => document.documentElement.scrollWidth), 360);
         assert.deepEqual(await unreachable(visit), []);
         await photograph(visit, "phone");
-        const sheet = () => page.locator("#side-panel").boundingBox();
+        const sheet = () => page.locator("#side-panel .panel-body").boundingBox();
         const down = await sheet();
         assert.ok(down.y > 500, "most of the window is the picture's");
         await page.tap("#side-panel .handle");
@@ -65,23 +65,23 @@ describe("looks", () => {
     test("themes follow the system or the choice, which is remembered", async () => {
         const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
         const { page } = visit;
-        const theme = () => page.evaluate(() => document.documentElement.dataset.theme);
+        const wears = (theme) => page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
         const paper = () => page.evaluate(() => getComputedStyle(document.querySelector("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
-        assert.equal(await theme(), "dark");
+        await wears("dark");
         await photograph(visit, "dark");
         const dark = await paper();
         await page.emulateMedia({ colorScheme: "light" });
-        assert.equal(await theme(), "light");
+        await wears("light");
         const light = await paper();
         assert.notEqual(light, dark);
         await visit.click("#options-button");
         await page.selectOption("#theme", "contrast");
-        assert.equal(await theme(), "contrast");
+        await wears("contrast");
         await page.keyboard.press("Escape");
         await photograph(visit, "contrast");
         await page.reload();
         await visit.untilFamily();
-        assert.equal(await theme(), "contrast");
+        await wears("contrast");
         await visit.end();
     });
 

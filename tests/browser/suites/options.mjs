@@ -84,7 +84,6 @@ describe("options", () => {
 
 // With everything in sight.
 async function allPersons(visit) {
-    await visit.page.evaluate(() => document.getElementById("fit").click());
-    await visit.still();
+    await visit.fit();
     return visit.shown();
 }

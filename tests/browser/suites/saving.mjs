@@ -30,7 +30,7 @@ describe("saving", () => {
     test("an SVG holds every box of the picture, in sight or not, and stands by itself", async () => {
         const visit = await visitDarwins();
         await visit.click("#fit");
-        const labels = await visit.page.$$eval("#tree .boxes > g", (boxes) => boxes.map((box) => box.getAttribute("aria-label")).sort());
+        const labels = await visit.labels();
         for (let i = 0; i < 6; ++i) await visit.click("#zoom-in");
         const { name, bytes } = await save(visit, "#save-svg");
         assert.equal(name, "darwin-wedgwood - Charles Robert Darwin.svg");

@@ -32,7 +32,7 @@ describe("speed", () => {
     test("a family of 1,000 boxes has a new focus within 50 ms of script", async (context) => {
         const visit = await visitFamily(cousins(31, 30), {}, {}, "#person=C3_4");
         const times = [];
-        for (const xref of ["C3_5", "C3_4", "C3_6", "C3_5", "C3_4"]) {
+        for (const xref of ["C3_5", "C3_4", "C3_5", "C3_4", "C3_5"]) {
             times.push(await refocusTime(visit, xref));
             await visit.still();
         }

@@ -12,12 +12,13 @@ describe("walking", () => {
     test("a click on a person makes them the focus, of the picture, the address and the panel", async () => {
         const visit = await visitDarwins();
         assert.equal(await visit.focus(), "I1");
+        await visit.fit();
         await visit.box("I34").click();
         await visit.still();
         assert.equal(await visit.focus(), "I34");
         assert.match(await visit.hash(), /person=I34/);
         assert.equal(await visit.page.innerText("#side-panel h2"), "Caroline Sarah Darwin");
-        assert.equal(await visit.box("I34").getAttribute("aria-current"), "true");
+        assert.equal(await visit.handle("I34").getAttribute("aria-current"), "true");
         assert.match(await visit.page.locator("#tree").getAttribute("aria-label"), /Caroline Sarah Darwin/);
         assert.match(await visit.page.locator("#live").innerText(), /Caroline Sarah Darwin/);
         await visit.end();
@@ -25,13 +26,13 @@ describe("walking", () => {
 
     test("arrow keys lead to parents, children and neighbours, and Enter makes a person the focus", async () => {
         const visit = await visitDarwins();
-        await visit.box("I1").focus();
+        await visit.stand("I1");
         await visit.press("ArrowUp");
         assert.ok(["I12", "I55"].includes(await visit.keysOn()));
         await visit.press("ArrowDown");
         const below = await visit.label(await visit.keysOn());
         assert.match(below, /Darwin/);
-        await visit.box("I1").focus();
+        await visit.stand("I1");
         await visit.press("ArrowDown");
         const child = await visit.keysOn();
         assert.ok(["I107", "I109", "I110", "I111", "I113", "I115", "I116", "I120", "I123", "I125"].includes(child), child);
@@ -50,8 +51,8 @@ describe("walking", () => {
 
     test("from one end of a row, the arrow passes every box of it in order", async () => {
         const visit = await visitDarwins("#person=I116");
-        await visit.box("I116").focus();
-        let last = (await visit.middleOf("I116")).x - (await visit.middleOf("I116")).x;
+        await visit.stand("I116");
+        let last = 0;
         const seen = new Set();
         for (let steps = 0; steps < 40; ++steps) {
             const before = await visit.keysOn();
@@ -96,6 +97,7 @@ describe("walking", () => {
     test("back and forward lead along the way, by our buttons and by the browser's", async () => {
         const visit = await visitDarwins();
         assert.ok(await visit.page.isDisabled("#back"));
+        await visit.fit();
         await visit.box("I34").click();
         await visit.still();
         await visit.click("#view-pedigree");
@@ -146,27 +148,28 @@ describe("walking", () => {
         await page.click('#side-panel a[data-person-id="2"]');
         await visit.still();
         assert.equal(await visit.focus(), "I2");
-        await page.locator("#tree").press("ArrowUp");
-        await visit.box("I1").focus();
+        await visit.fit();
+        await visit.stand("I1");
         assert.match(await page.innerText("#side-panel .kinship"), /husband and first cousin/);
         const words = [];
         for (const xref of ["I36", "I34", "I58", "I113"]) {
-            await visit.box(xref).focus();
+            await visit.stand(xref);
             words.push(await page.innerText("#side-panel .kinship"));
         }
-        assert.match(words[0], /^brother-in-law \(husband's brother\) and first cousin/);
-        assert.match(words[1], /^sister-in-law .* and first cousin/);
-        assert.match(words[2], /^father of/);
-        assert.match(words[3], /^son of/);
+        assert.match(words[0], /Emma Wedgwood.*: brother-in-law \(husband's brother\) and first cousin/);
+        assert.match(words[1], /: sister-in-law .* and first cousin/);
+        assert.match(words[2], /: father$/);
+        assert.match(words[3], /: son$/);
         await visit.end();
     });
 
     test("each box is read out with name, years and kinship", async () => {
         const visit = await visitDarwins();
+        await visit.fit();
         assert.match(await visit.label("I2"), /^Emma Wedgwood, 1808–1896, wife and first cousin/);
         assert.match(await visit.label("I5"), /^Erasmus Darwin, 1731–1802, grandfather \(father's father\)/);
         assert.match(await visit.label("I24"), /half uncle \(father's half brother\)/);
-        assert.equal(await visit.box("I2").getAttribute("role"), "button");
+        assert.equal(await visit.handle("I2").getAttribute("role"), "button");
         await visit.end();
     });
 
@@ -184,9 +187,8 @@ describe("walking", () => {
 
     test("an unknown parent has a place that is named", async () => {
         const visit = await visitDarwins("#person=I17&view=pedigree");
-        const missing = visit.page.locator("#tree .box.missing");
-        assert.ok((await missing.count()) >= 1);
-        assert.match(await missing.first().getAttribute("aria-label"), /^Unknown mother of Elizabeth Collier/);
+        const labels = await visit.labels();
+        assert.ok(labels.includes("Unknown mother of Elizabeth Collier"), labels.join());
         await visit.end();
     });
 
@@ -215,7 +217,7 @@ describe("walking", () => {
             return boxes.every((box) => box.left >= tree.left && box.right <= tree.right && box.top >= tree.top && box.bottom <= tree.bottom);
         });
         assert.ok(sizes, "everything is in sight");
-        await visit.box("I1").focus();
+        await visit.stand("I1");
         const fitted = await visit.placing();
         await visit.press("+");
         assert.ok((await visit.placing()).k > fitted.k);

@@ -57,13 +57,13 @@ export class Visit {
             const look = () => {
                 const boxes = [...document.querySelectorAll("#tree .boxes > g")];
                 const ghosts = document.querySelector("#tree .ghosts")?.childElementCount ?? 0;
-                const words = boxes.reduce((n, box) => n + (box.getAttribute("aria-label")?.length ?? 0), 0);
+                const words = boxes.reduce((n, box) => n + box.querySelector(".frame").getAttribute("aria-label").length, 0);
                 const places = boxes.map((box) => box.getAttribute("transform")).join();
                 return [document.querySelector("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
             };
             let last = look();
             let since = performance.now();
-            while (performance.now() - since < 110) {
+            while (performance.now() - since < 80) {
                 await new Promise((next) => requestAnimationFrame(next));
                 const now = look();
                 if (now === last) continue;
@@ -97,6 +97,22 @@ export class Visit {
         return this.page.locator(`#tree [data-xref="${xref}"]`).first();
     }
 
+    /** What of a box takes the keys and is read out. */
+    handle(xref) {
+        return this.box(xref).locator(".frame");
+    }
+
+    /** Gives the keys to a box, in sight or not. */
+    async stand(xref) {
+        await this.page.evaluate((xref) => document.querySelector(`#tree .boxes > [data-xref="${xref}"] .frame`).focus(), xref);
+        await this.still();
+    }
+
+    /** Labels of all boxes that have elements. */
+    async labels() {
+        return this.page.$$eval("#tree .boxes .frame", (boxes) => boxes.map((box) => box.getAttribute("aria-label")).sort());
+    }
+
     /** Records of the persons whose boxes have elements, sorted, each once. */
     async shown() {
         const xrefs = await this.page.$$eval("#tree .boxes > [data-xref]", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
@@ -113,12 +129,18 @@ export class Visit {
     }
 
     async label(xref) {
-        return this.box(xref).getAttribute("aria-label");
+        return this.handle(xref).getAttribute("aria-label");
     }
 
     /** The record of the box that has the keys; null if none has. */
     async keysOn() {
-        return this.page.evaluate(() => document.activeElement?.getAttribute("data-xref") ?? null);
+        return this.page.evaluate(() => document.activeElement?.closest("[data-box]")?.getAttribute("data-xref") ?? null);
+    }
+
+    /** With everything in sight. */
+    async fit() {
+        await this.page.evaluate(() => document.getElementById("fit").click());
+        await this.still();
     }
 
     /** Upper left corners of all boxes, relative to the focus's, by record. Add-nodes go by their label. */
@@ -129,7 +151,7 @@ export class Visit {
             const [x0, y0] = placeOf(document.querySelector("#tree .box.focus"));
             const named = boxes.map((box) => {
                 const [x, y] = placeOf(box);
-                const name = box.getAttribute("data-xref") ?? box.getAttribute("aria-label");
+                const name = box.getAttribute("data-xref") ?? box.querySelector(".frame").getAttribute("aria-label");
                 return `${name} ${(x - x0).toFixed(0)},${(y - y0).toFixed(0)}`;
             });
             return named.sort();
@@ -137,8 +159,11 @@ export class Visit {
     }
 
     async middleOf(xref) {
-        const { x, y, width, height } = await this.box(xref).locator(".frame").boundingBox();
-        return { x: x + width / 2, y: y + height / 2 };
+        return this.page.evaluate((xref) => {
+            const frame = document.querySelector(`#tree .boxes > [data-xref="${xref}"] .frame`);
+            const { left, right, top, bottom } = frame.getBoundingClientRect();
+            return { x: (left + right) / 2, y: (top + bottom) / 2 };
+        }, xref);
     }
 
     /** Zoom and offset of the picture. */

@@ -20,6 +20,7 @@ const kArguments = [
     "--disable-component-update",
     "--disable-sync",
 ];
+const kPatience = 8000; // ms, for what should be there at once
 const kWindow = { width: 1280, height: 800 };
 
 const folder = mkdtempSync(join(tmpdir(), "olvane-browser-"));
@@ -89,6 +90,7 @@ export async function visitFile(path, settings = {}, hash = "") {
         acceptDownloads: true,
         ...settings,
     });
+    context.setDefaultTimeout(kPatience);
     return Visit.begin(context, pathToFileURL(path).href + hash);
 }
 
