@@ -35,6 +35,7 @@ describe("looks", () => {
         const visit = await visitDarwins("#person=I1", kPhone);
         const { page } = visit;
         assert.equal(await page.evaluate(() => document.documentElement.scrollWidth), 360);
+        await visit.dismiss();
         assert.deepEqual(await unreachable(visit), []);
         await photograph(visit, "phone");
         const sheet = () => page.locator("#side-panel .panel-body").boundingBox();

@@ -73,6 +73,11 @@ export class Visit {
         });
     }
 
+    /** Closes the short messages that went well, and the greeting. */
+    async dismiss() {
+        await this.page.$$eval("#notices .told button", (buttons) => buttons.forEach((button) => button.click()));
+    }
+
     /** Hands a file over as the browser's own dialog does. */
     async choose(name, bytes) {
         await this.page.setInputFiles("#file-input", { name, mimeType: "application/octet-stream", buffer: Buffer.from(bytes) });

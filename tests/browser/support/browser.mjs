@@ -100,6 +100,7 @@ export async function photograph(visit, name) {
     if (at < 0) return;
     const place = resolve(process.env.OLVANE_START ?? ".", process.argv[at + 1]);
     mkdirSync(place, { recursive: true });
+    await visit.dismiss();
     await visit.still();
     await visit.page.screenshot({ path: join(place, `page-${name}.png`) });
 }
