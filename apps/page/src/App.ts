@@ -35,6 +35,8 @@ import { addressOf, clampGenerations, kUsualGenerations, readAddress, type Relat
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
+class EmptyFamilyError extends Error {}
+
 export class App implements ChromeActions {
     private messages: Messages;
     private ui: UiMessages;
@@ -86,8 +88,12 @@ export class App implements ChromeActions {
 
     // --- families ---
 
-    async openEmbedded(embedded: EmbeddedFamily): Promise<void> {
-        this.open(embedded.bytes, embedded.name, embedded);
+    openEmbedded(embedded: EmbeddedFamily): void {
+        try {
+            this.open(embedded.bytes, embedded.name, embedded);
+        } catch (error) {
+            this.refuse(embedded.name, error);
+        }
     }
 
     async openDropped(file: File): Promise<void> {
@@ -109,6 +115,10 @@ export class App implements ChromeActions {
         if (file.persons.length === 0) {
             file.close();
             throw new Error(this.ui.errors.noPersons);
+        }
+        if (file.persons.length === 0) {
+            file.close();
+            throw new EmptyFamilyError(this.ui.errors.noPersons);
         }
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);

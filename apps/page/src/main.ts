@@ -14,7 +14,7 @@ async function start(): Promise<void> {
     try {
         const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
         const app = new App(root, engine);
-        if (family) await app.openEmbedded(family);
+        if (family) app.openEmbedded(family);
     } catch (error) {
         const reason = typeof DecompressionStream === "undefined" ? errors.tooNew : errors.engine;
         const detail = error instanceof Error ? error.message : String(error);
