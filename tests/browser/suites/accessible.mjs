@@ -4,7 +4,7 @@
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
 import axe from "axe-core";
-import { visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
+import { kTwoAtOnce, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { brokenFamily } from "../support/families.mjs";
 
 async function expectNoViolation(visit, state) {
@@ -16,7 +16,7 @@ async function expectNoViolation(visit, state) {
     assert.deepEqual(found, [], state);
 }
 
-describe("accessible", () => {
+describe("accessible", kTwoAtOnce, () => {
     test("axe finds nothing on the title page", async () => {
         for (const colorScheme of ["light", "dark"]) {
             const visit = await visitEmpty({ colorScheme });

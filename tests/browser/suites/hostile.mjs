@@ -6,12 +6,12 @@
 import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
 import { describe, test } from "node:test";
-import { visitEmpty, visitFamily } from "../support/browser.mjs";
+import { kTwoAtOnce, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { hostileFamily } from "../support/families.mjs";
 
 const kHostile = hostileFamily();
 
-describe("hostile", () => {
+describe("hostile", kTwoAtOnce, () => {
     test("markup, scripts and styles in a file are shown as text and do nothing", async () => {
         const visit = await visitEmpty();
         const { page } = visit;

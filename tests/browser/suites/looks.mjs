@@ -3,7 +3,7 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { photograph, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { rightToLeftFamily } from "../support/families.mjs";
 
 const kPhone = { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true, deviceScaleFactor: 2 };
@@ -23,7 +23,7 @@ async function unreachable(visit) {
     });
 }
 
-describe("looks", () => {
+describe("looks", kTwoAtOnce, () => {
     test("on a window of a desk, everything can be reached", async () => {
         const visit = await visitDarwins();
         assert.deepEqual(await unreachable(visit), []);

@@ -4,12 +4,12 @@
 import assert from "node:assert/strict";
 import { deflateRawSync } from "node:zlib";
 import { describe, test } from "node:test";
-import { photograph, sample, visitDarwins, visitEmpty } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty } from "../support/browser.mjs";
 import { brokenFamily } from "../support/families.mjs";
 
 const kDarwins = sample("darwin-wedgwood.ged");
 
-describe("opening", () => {
+describe("opening", kTwoAtOnce, () => {
     test("without a family the page invites one in", async () => {
         const visit = await visitEmpty();
         assert.ok(await visit.page.isVisible("#drop-zone h1"));

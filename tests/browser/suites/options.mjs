@@ -5,7 +5,7 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { photograph, visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
 
 // Sister Susan; Henry Parker, husband of sister Marianne; their brother's child does not live in this file, so the
 // nieces are Caroline's daughters; uncle John; cousin Hensleigh; great-grandfather Robert; a son's wife; a grandson.
@@ -20,7 +20,7 @@ const kSwitches = [
     ["grandchildren", "I128"],
 ];
 
-describe("options", () => {
+describe("options", kTwoAtOnce, () => {
     test("each switch takes its relatives out of the picture and back in", async () => {
         const visit = await visitDarwins();
         const all = await allPersons(visit);

@@ -4,7 +4,7 @@
 import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
 import { describe, test } from "node:test";
-import { visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, visitDarwins } from "../support/browser.mjs";
 
 async function save(visit, button) {
     await visit.click("#file-button");
@@ -26,7 +26,7 @@ async function parsed(visit, text) {
     }, text);
 }
 
-describe("saving", () => {
+describe("saving", kTwoAtOnce, () => {
     test("an SVG holds every box of the picture, in sight or not, and stands by itself", async () => {
         const visit = await visitDarwins();
         await visit.click("#fit");

@@ -3,13 +3,13 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { photograph, visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
 
 async function found(visit) {
     return visit.page.$$eval("#search-list [role=option] bdi", (names) => names.map((name) => name.textContent));
 }
 
-describe("searching", () => {
+describe("searching", kTwoAtOnce, () => {
     test("words in any order find a person, and Enter leads there", async () => {
         const visit = await visitDarwins();
         await visit.page.keyboard.press("/");

@@ -25,10 +25,14 @@ const kWindow = { width: 1280, height: 800 };
 
 const folder = mkdtempSync(join(tmpdir(), "olvane-browser-"));
 const template = readFileSync(process.env.OLVANE_PAGE, "utf8");
-let browser = null;
+let launched = null;
+let families = 0;
+
+/** Tests of one suite wait for the browser most of their time, so two of them run at once. */
+export const kTwoAtOnce = { concurrency: 2 };
 
 export async function closeBrowser() {
-    await browser?.close();
+    await (await launched)?.close();
     rmSync(folder, { recursive: true, force: true });
 }
 
@@ -68,7 +72,7 @@ export async function visitFamily(gedcom, told = {}, settings = {}, hash = "") {
         "<!-- olvane:family -->",
         () => `<script type="application/json" id="olvane-family">${block}</script>`,
     );
-    const visit = await visitFile(fileFor("family.html", page), settings, hash);
+    const visit = await visitFile(fileFor(`family-${++families}.html`, page), settings, hash);
     await visit.untilFamily();
     return visit;
 }
@@ -79,10 +83,11 @@ export async function visitDarwins(hash = "#person=I1", settings = {}) {
 
 // Movements are switched off unless a test is about them, which makes the others quick and certain.
 export async function visitFile(path, settings = {}, hash = "") {
-    browser ??= await chromium.launch({
+    launched ??= chromium.launch({
         executablePath: process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium",
         args: kArguments,
     });
+    const browser = await launched;
     const context = await browser.newContext({
         viewport: kWindow,
         locale: "en-GB",
