@@ -181,7 +181,7 @@ bool areFinite(const olvane_sizes& sizes) {
 
 bool areInRange(const olvane_options& options) {
     return areFinite(options.sizes) && (options.shown & ~OLVANE_SHOW_ALL) == 0 && options.generations >= 1 &&
-           options.flag_depth >= 0;
+           options.generations <= OLVANE_MOST_GENERATIONS && options.flag_depth >= 0;
 }
 
 TreeSize treeSizeOf(const olvane_sizes& sizes) {

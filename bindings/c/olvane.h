@@ -109,6 +109,9 @@ typedef struct olvane_host {
 #define OLVANE_SHOW_SPOUSES_OF_CHILDREN 0x80u
 #define OLVANE_SHOW_ALL 0xFFu
 
+/* A layout takes a few hundred bytes of stack for each generation; so many fit in any thread's. */
+#define OLVANE_MOST_GENERATIONS 1000
+
 /* The sizes of the drawing, in points. All are finite. */
 typedef struct olvane_sizes {
     float node_width;       /* of one person's box */
@@ -122,7 +125,8 @@ typedef struct olvane_sizes {
 typedef struct olvane_options {
     olvane_sizes sizes;
     uint32_t shown; /* Family view: OLVANE_SHOW_ bits. */
-    /* Pedigree: columns, the focus's own included; 1 and more. Full ancestry of n is 2^n - 1 boxes. */
+    /* Pedigree: columns, the focus's own included; 1 to OLVANE_MOST_GENERATIONS. Full ancestry of n is 2^n - 1
+       boxes, and nothing but memory ends that: a circle of parents fills all columns. */
     int32_t generations;
     /* Pedigree: generations, the focus's own included, in which a parent's partners who are off the chart
        raise the flag; 0 for none. */

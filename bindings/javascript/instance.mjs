@@ -31,6 +31,7 @@ export class Instance {
     /** The host of the layout that is running, and what it threw. */
     #host = null;
     #thrown = null;
+    #broken = null;
 
     text(pointer) {
         const bytes = new Uint8Array(this.exports.memory.buffer);
@@ -59,13 +60,20 @@ export class Instance {
         return this.withBytes(utf8.encoder.encode(text), use);
     }
 
-    /** What run gives, and what the host threw meanwhile, in an array of one; null if nothing. */
+    /**
+     * What run gives, and what the host threw meanwhile, in an array of one; null if nothing. What breaks out of
+     * the module itself, such as a full stack, leaves it in the middle of its work, so it answers no more.
+     */
     askingHost(host, run) {
+        if (this.#broken !== null) throw this.#broken;
         const outer = { host: this.#host, thrown: this.#thrown };
         this.#host = host;
         this.#thrown = null;
         try {
             return { result: run(), thrown: this.#thrown };
+        } catch (error) {
+            this.#broken = new Error("the module broke off in a layout; load it anew", { cause: error });
+            throw this.#broken;
         } finally {
             this.#host = outer.host;
             this.#thrown = outer.thrown;

@@ -72,7 +72,7 @@ export interface Options {
     sizes?: Partial<Sizes>;
     /** Family view: bits of Shown; all of them if not given. */
     shown?: number;
-    /** Pedigree: columns, the focus's own included; 5. A full ancestry of n columns is 2 ** n - 1 boxes. */
+    /** Pedigree: columns, the focus's own included: 1 to 1,000; 5. A full ancestry of n is 2 ** n - 1 boxes. */
     generations?: number;
     /** Pedigree: generations, the focus's own included, in which partners off the chart raise the flag; 4. */
     flagDepth?: number;

@@ -141,6 +141,9 @@ test("options out of their range are refused", () => {
     const host = new TableHost(henry);
     assert.throws(() => olvane.layout(host, 1, { view: "fan" }), TypeError);
     assert.throws(() => olvane.layout(host, 1, { view: "pedigree", generations: 0 }), { status: "invalidArgument" });
+    assert.throws(() => olvane.layout(host, 1, { view: "pedigree", generations: 1001 }), {
+        status: "invalidArgument",
+    });
     assert.throws(() => olvane.layout(host, 1, { sizes: { nodeWidth: Infinity } }), { status: "invalidArgument" });
 });
 

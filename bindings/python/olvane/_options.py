@@ -45,8 +45,8 @@ class Sizes:
 class Options:
     """Choices of one layout.
 
-    shown is read by the family view. generations counts a pedigree's columns, the focus's own included; a full ancestry
-    of n columns is 2**n - 1 boxes. flag_depth counts the generations of a pedigree, the focus's own included, in which
+    shown is read by the family view. generations, 1 to 1000, counts a pedigree's columns, the focus's own included; a
+    full ancestry of n columns is 2**n - 1 boxes. flag_depth counts the generations of a pedigree, the focus's own included, in which
     a parent's partners who are off the chart raise the flag.
     """
 

@@ -159,6 +159,9 @@ TEST(COptions, outOfTheirRangeAreRefused) {
     EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options& o) { o.generations = 1; }));
     EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options& o) { o.flag_depth = 0; }));
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.generations = 0; }));
+    EXPECT_EQ(OLVANE_OK, statusWith([](olvane_options& o) { o.generations = OLVANE_MOST_GENERATIONS; }));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT,
+              statusWith([](olvane_options& o) { o.generations = OLVANE_MOST_GENERATIONS + 1; }));
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.flag_depth = -1; }));
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) { o.shown = 0x100u; }));
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, statusWith([](olvane_options& o) {
