@@ -120,6 +120,13 @@ describe("beside the line", () => {
         expectRows(tree, "Hella", [["Niko", "half nephew", "Halbneffe"]]);
     });
 
+    test("a half great-uncle of long ago is counted as one", () => {
+        const lines = ["A0 + B0: A1.m", "A0 + C0: D1.m"];
+        for (let i = 1; i < 8; ++i) lines.push(`A${i} + B${i}: A${i + 1}.m`);
+        const long = new Tree(...lines);
+        expectRows(long, "A8", [["D1", "half 6th great-uncle (father's side)", "5×Halburgroßonkel väterlicherseits"]]);
+    });
+
     test("an unknown other parent leaves it open whether a sibling is a half one", () => {
         const open = new Tree("Anton + Berta: Cäsar.m", "Anton + ?: Dora.f");
         assert.equal(relation(open, "Cäsar", "Dora"), "sister");

@@ -99,15 +99,19 @@ function noun(word: Word): Noun {
     };
 }
 
-// "Halb" before "Onkel/Tante" is "Halbonkel/Halbtante".
+// "Halb" before "Onkel/Tante" is "Halbonkel/Halbtante", and before "4×Urgroßonkel" "4×Halburgroßonkel".
 function compound(prefix: string, word: Word): Word {
     if (prefix === "") return word;
-    const join = (words: string): string =>
-        words
-            .split("/")
-            .map((part) => prefix + (prefix.endsWith("×") ? part : part.charAt(0).toLowerCase() + part.slice(1)))
-            .join("/");
-    return { ...word, word: join(word.word), genitive: join(word.genitive) };
+    const join = (part: string): string => {
+        const [, count, head, tail] = /^(\d+×)?(.)(.*)$/u.exec(part)!;
+        return (count ?? "") + prefix + head!.toLowerCase() + tail;
+    };
+    const all = (words: string): string => words.split("/").map(join).join("/");
+    return { ...word, word: all(word.word), genitive: all(word.genitive) };
+}
+
+function counted(count: number, word: Word): Word {
+    return { ...word, word: `${count}×${word.word}`, genitive: `${count}×${word.genitive}` };
 }
 
 function nouns(prefix: string, words: WordBySex): NounBySex {
@@ -118,8 +122,7 @@ function nouns(prefix: string, words: WordBySex): NounBySex {
 // "Ur", "Urur", "Ururur", and then "4×Ur".
 function ur(count: number, word: Word): Word {
     if (count <= 0) return word;
-    const once = compound("Ur", word);
-    return count <= kUrsInWords ? compound("Ur" + "ur".repeat(count - 1), word) : compound(`${count}×`, once);
+    return count <= kUrsInWords ? compound("Ur" + "ur".repeat(count - 1), word) : counted(count, compound("Ur", word));
 }
 
 function great(generations: number, word: Word): Word {
