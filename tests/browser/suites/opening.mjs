@@ -35,6 +35,23 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("a file over the page is invited to fall, and one that leaves is not", async () => {
+        const visit = await visitEmpty();
+        const drag = (type) =>
+            visit.page.evaluate((type) => {
+                const dataTransfer = new DataTransfer();
+                dataTransfer.items.add(new File(["0 HEAD"], "a.ged"));
+                const event = new DragEvent(type, { bubbles: true, cancelable: true, dataTransfer, relatedTarget: null });
+                document.body.dispatchEvent(event);
+                return event.defaultPrevented;
+            }, type);
+        assert.ok(await drag("dragover"), "the browser itself would open the file");
+        assert.ok(await visit.page.isVisible(".cover"));
+        await drag("dragleave");
+        assert.ok(!(await visit.page.isVisible(".cover")));
+        await visit.end();
+    });
+
     test("an archive is opened for the family file inside", async () => {
         const visit = await visitEmpty();
         await visit.drop("darwin.gdz", archiveOf("gedcom.ged", kDarwins));

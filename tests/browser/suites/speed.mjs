@@ -4,7 +4,7 @@
 // Figures are printed; what is asserted is far above them, since test machines are busy.
 
 import assert from "node:assert/strict";
-import { statSync } from "node:fs";
+import { readFileSync, statSync } from "node:fs";
 import { describe, test } from "node:test";
 import { photograph, realFile, sample, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { cousins } from "../support/families.mjs";
@@ -108,5 +108,8 @@ describe("speed", () => {
         const family = gzipSync(sample("darwin-wedgwood.ged")).length * (4 / 3);
         context.diagnostic(`the page without a family: ${(page / 1000).toFixed(0)} kB; with 142 persons: ${((page + family) / 1000).toFixed(0)} kB`);
         assert.ok(page + family < 300_000, `${page + family} bytes`);
+        const engine = /<script[^>]*id="olvane-engine"[^>]*>\s*([A-Za-z0-9+/=]+)/.exec(readFileSync(process.env.OLVANE_PAGE, "utf8"))[1];
+        context.diagnostic(`the engine, packed: ${((engine.length * 3) / 4000).toFixed(0)} kB`);
+        assert.ok((engine.length * 3) / 4 < 150_000);
     });
 });
