@@ -19,6 +19,7 @@ import { Chrome, type ChromeActions } from "./ui/Chrome";
 import { html, recall, remember, svg } from "./ui/dom";
 import { fileInput, takeDrops } from "./ui/dropping";
 import { Notices } from "./ui/Notices";
+import { Overview } from "./ui/Overview";
 import { pictureKey } from "./ui/pictureKeys";
 import { SidePanel } from "./ui/SidePanel";
 import { Theme, type ThemeChoice } from "./ui/theme";
@@ -64,6 +65,7 @@ export class App implements ChromeActions {
     private readonly surface = svg("svg", { id: "tree", role: "application" });
     private readonly hint = html("p", { id: "tree-hint", class: "unseen" });
     private readonly scene: Scene;
+    private readonly overview: Overview;
     private readonly journey = new Journey((address) => this.arriveAt(address));
     private readonly sheet = new PrintSheet(() => this.whole("print"));
 
@@ -78,11 +80,18 @@ export class App implements ChromeActions {
             chosen: (box) => this.focusOn(box.person, box),
             active: (box) => this.showInPanel(box.person || box.child),
             pointed: (box, element) => this.pointAt(box, element),
-            moved: () => this.tooltip.hide(),
+            moved: () => {
+                this.tooltip.hide();
+                this.overview?.follow();
+            },
         });
+        this.overview = new Overview(this.scene.camera);
         takeDrops(this.cover, (file) => void this.openDropped(file));
         addEventListener("keydown", (event) => this.key(event));
-        new ResizeObserver(() => this.scene.resized()).observe(this.surface);
+        new ResizeObserver(() => {
+            this.scene.resized();
+            this.overview.follow();
+        }).observe(this.surface);
         this.speak();
     }
 
@@ -128,6 +137,7 @@ export class App implements ChromeActions {
         this.lastProblems = file.diagnostics;
         this.picture = null;
         this.scene.clear();
+        this.overview.clear();
         document.title = title;
         this.arrange();
         const usual: ViewState = {
@@ -204,6 +214,7 @@ export class App implements ChromeActions {
         this.dress = this.newDress(family, picture);
         this.dress.kinshipKnown = family.persons.length <= kSoonSearched;
         this.scene.show(picture, this.dress, from);
+        this.overview.show(picture, this.dress);
         this.nameTree();
         this.showState();
         this.learnKinships();
@@ -430,6 +441,7 @@ export class App implements ChromeActions {
             this.root.replaceChildren(this.welcome.element, ...always);
             return;
         }
+        chrome.corner.insertBefore(this.overview.element, chrome.corner.lastChild);
         stage.replaceChildren(this.hint, this.surface, chrome.corner, this.tooltip.element);
         this.root.replaceChildren(chrome.bar, stage, panel.element, chrome.keys, chrome.diagnostics, ...always);
         chrome.showFamily(family.title, this.ui.personCount(family.persons.length));

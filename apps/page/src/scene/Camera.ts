@@ -25,6 +25,7 @@ const kMostZoom = 4;
 const kFitMargin = 28; // px
 const kTravelTime = 420; // ms
 const kButtonsWidth = 64; // px, of the buttons over the right edge
+const kCornerHeight = 36; // px that the legend and its neighbours take beyond the margin
 const kWideWindow = 700; // px; a narrower one has no room to leave for them
 const kReadable = 0.6; // the least zoom at which names are read with ease
 const kUsualZoom = 0.85;
@@ -114,10 +115,10 @@ export class Camera {
         const room = (size: number) => Math.max(40, size - 2 * kFitMargin);
         const k = Math.max(
             kLeastZoom,
-            Math.min(mostZoom, room(width - aside) / (area.right - area.left), room(height) / (area.bottom - area.top)),
+            Math.min(mostZoom, room(width - aside) / (area.right - area.left), room(height - kCornerHeight) / (area.bottom - area.top)),
         );
         const { x, y } = this.centring({ x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 }, k);
-        return { k, x: x - aside / 2, y };
+        return { k, x: x - aside / 2, y: y - kCornerHeight / 2 };
     }
 
     // Where a picture begins: whole if it can be read so, else readable, with its middle in the window's middle and all
@@ -126,9 +127,10 @@ export class Camera {
         const whole = this.fitting(area);
         if (whole.k >= kReadable) return whole;
         const { height } = this.size;
-        const tall = (height - 2 * kFitMargin) / (area.bottom - area.top);
+        const tall = (height - 2 * kFitMargin - kCornerHeight) / (area.bottom - area.top);
         if (tall < kReadable) return this.centring(middle, kUsualZoom);
-        return this.centring({ x: middle.x, y: (area.top + area.bottom) / 2 }, Math.min(1, tall));
+        const { k, x, y } = this.centring({ x: middle.x, y: (area.top + area.bottom) / 2 }, Math.min(1, tall));
+        return { k, x, y: y - kCornerHeight / 2 };
     }
 
     centring(point: Point, k: number): Placing {

@@ -280,15 +280,7 @@ export class Scene {
     private drawCrowd(picture: Picture): void {
         this.crowd.classList.toggle("shown", this.crowded);
         if (!this.crowded || this.crowd.firstChild) return;
-        const { nodeWidth, nodeHeight } = picture.sizes;
-        const paths = new Map<string, string[]>();
-        for (const box of picture.boxes) {
-            const kind = box.person ? this.dress.sexOf(box) : "missing";
-            const list = paths.get(kind) ?? [];
-            list.push(`M${box.x} ${box.y}h${nodeWidth}v${nodeHeight}h${-nodeWidth}z`);
-            paths.set(kind, list);
-        }
-        for (const [kind, list] of paths) this.crowd.append(svg("path", { class: kind, d: list.join("") }));
+        this.crowd.append(...crowdPaths(picture, this.dress));
     }
 
     private drawBoxes(boxes: readonly Box[], picture: Picture): void {
@@ -361,6 +353,19 @@ export class Scene {
         const index = (target as Element | null)?.closest?.("[data-box]")?.getAttribute("data-box");
         return index ? (this.picture?.boxes[Number(index)] ?? null) : null;
     }
+}
+
+// All boxes of a picture, with nothing in them: a path for each sex.
+export function crowdPaths(picture: Picture, dress: Dress): SVGPathElement[] {
+    const { nodeWidth, nodeHeight } = picture.sizes;
+    const paths = new Map<string, string[]>();
+    for (const box of picture.boxes) {
+        const kind = box.person ? dress.sexOf(box) : "missing";
+        const list = paths.get(kind) ?? [];
+        list.push(`M${box.x} ${box.y}h${nodeWidth}v${nodeHeight}h${-nodeWidth}z`);
+        paths.set(kind, list);
+    }
+    return [...paths].map(([kind, list]) => svg("path", { class: kind, d: list.join("") }));
 }
 
 // One path for each style that is there.

@@ -34,6 +34,8 @@ export class SidePanel {
     readonly element: HTMLElement;
     private readonly body = html("div", { class: "panel-body" });
     private readonly handle: HTMLButtonElement;
+    // Known without asking: a question, or a scroll that changes nothing, has the browser lay out the whole page.
+    private isScrolled = false;
 
     constructor(
         private readonly messages: Messages,
@@ -42,6 +44,7 @@ export class SidePanel {
     ) {
         this.handle = html("button", { class: "handle", type: "button", "aria-label": ui.panel.toggle, "aria-expanded": "false" }, icon("up"));
         this.element = html("aside", { id: "side-panel", "aria-label": ui.panel.label, tabindex: -1 }, this.handle, this.body);
+        for (const part of [this.element, this.body]) part.addEventListener("scroll", () => (this.isScrolled = true));
         onClick(this.handle, () => this.draw(!this.element.classList.contains("drawn")));
     }
 
@@ -60,8 +63,8 @@ export class SidePanel {
             this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) => this.link(family.person(id))),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));
-        // Not at once: scrolling has the browser lay out the whole page, picture and all.
-        requestAnimationFrame(() => [this.element, this.body].forEach((part) => part.scrollTo(0, 0)));
+        if (this.isScrolled) [this.element, this.body].forEach((part) => part.scrollTo(0, 0));
+        this.isScrolled = false;
         this.element.dataset["personId"] = String(person.id);
     }
 
