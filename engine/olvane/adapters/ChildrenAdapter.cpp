@@ -15,7 +15,7 @@ ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string
 ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string hostId)
     : ChildrenAdapter(childKey, std::move(dateText), std::move(hostId), 0) {}
 
-bool ChildrenAdapter::isLessByTexts(const ChildrenAdapter& other) const {
+bool ChildrenAdapter::isLessWithoutPlaces(const ChildrenAdapter& other) const {
     if (date != other.date) return date < other.date;
     // True both ways round, so no order at all. Sort texts are empty wherever the engine makes the records; a
     // proper comparison here would let hosts rely on a field that nothing fills.

@@ -32,11 +32,11 @@ struct OLVANE_API ChildrenAdapter {
     // an unknown parent.
     bool operator<(const ChildrenAdapter& other) const {
         if (hostOrder >= 1 && other.hostOrder >= 1) return key < other.key;
-        return isLessByTexts(other);
+        return isLessWithoutPlaces(other);
     }
 
 private:
-    bool isLessByTexts(const ChildrenAdapter& other) const;
+    bool isLessWithoutPlaces(const ChildrenAdapter& other) const;
 };
 
 typedef std::set<ChildrenAdapter, std::less<ChildrenAdapter>, olvane::ArenaAllocator<ChildrenAdapter>>

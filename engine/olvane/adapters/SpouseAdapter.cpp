@@ -17,8 +17,7 @@ SpouseAdapter::SpouseAdapter(int spouseKey, bool isPreferred, bool isAlive, std:
       idText(std::move(hostId)),
       hostOrder(placeInList) {}
 
-bool SpouseAdapter::operator<(const SpouseAdapter& other) const {
-    if (hostOrder >= 1 && other.hostOrder >= 1) return hostOrder < other.hostOrder;
+bool SpouseAdapter::isLessWithoutPlaces(const SpouseAdapter& other) const {
     if (preferred != other.preferred) return preferred;
     if (alive != other.alive) return alive;
     if (date != other.date) return other.date < date;

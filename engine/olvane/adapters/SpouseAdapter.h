@@ -26,7 +26,13 @@ struct OLVANE_API SpouseAdapter {
     // The host's order where both records have a place. Records without one: the preferred spouse first, then
     // the living, then the later date, then the greater id text. Note that texts run backwards here and
     // forwards for children.
-    bool operator<(const SpouseAdapter& other) const;
+    bool operator<(const SpouseAdapter& other) const {
+        if (hostOrder >= 1 && other.hostOrder >= 1) return hostOrder < other.hostOrder;
+        return isLessWithoutPlaces(other);
+    }
+
+private:
+    bool isLessWithoutPlaces(const SpouseAdapter& other) const;
 };
 
 typedef std::set<SpouseAdapter, std::less<SpouseAdapter>, olvane::ArenaAllocator<SpouseAdapter>> SpouseSet;

@@ -90,7 +90,7 @@ bool someAreHidden(const Records& records, int drawnUnderPerson, const KeySet& s
 
 bool TreeViewFamilyLayouter::hasHiddenChildren(TreeViewPerson& person) {
     const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
-    return someAreHidden(children, person.getAllChildrenCount(), shownKeys);
+    return someAreHidden(children, countOfAllChildren(person), shownKeys);
 }
 
 bool TreeViewFamilyLayouter::hasHiddenSpouses(TreeViewPerson& person) {

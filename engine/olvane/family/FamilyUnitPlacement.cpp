@@ -13,6 +13,7 @@
 // Each person is placed once, children before the next spouse, and nothing is moved afterwards.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/graph/WholePoint.h>
 
 #include <algorithm>
@@ -21,7 +22,7 @@ namespace SharedTreeViewer {
 
 void TreeViewFamilyLayouter::layoutFamilyUnitOfProximalPerson(TreeViewPerson& person, float x, float y) {
     const int spouseCount = person.getSpouseCount();
-    const bool hasUnknownChildren = person.getChildrenWithNoOtherParentCount() > 0;
+    const bool hasUnknownChildren = countOfChildren(person, TreeViewPerson::kNoKey) > 0;
     const int offset = getLineOffset(spouseCount, person.gender);
     if (spouseCount == 0) {
         layoutUnknownChildrenAndPerson(person, x, y);
@@ -144,6 +145,7 @@ float TreeViewFamilyLayouter::layoutChildrenOfParents(const Iterator& children, 
 }
 
 float TreeViewFamilyLayouter::layoutUnknownChildren(TreeViewPerson& person, float x, float y) {
+    if (countOfChildren(person, TreeViewPerson::kNoKey) == 0) return x;
     const float childY = y + treeSize.nodeHeight + treeSize.vertPadding;
     return layoutChildrenOfParents(person.getChildrenIterator(TreeViewPerson::kNoKey), childY, x);
 }

@@ -12,6 +12,8 @@
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
 
+#include <olvane/graph/PersonWalksInternal.h>
+
 namespace SharedTreeViewer {
 
 float TreeViewFamilyLayouter::horzPaddingForNodesCount(int count) const {
@@ -31,7 +33,7 @@ void TreeViewFamilyLayouter::calculateLayoutWidthForDescendantsOfProximalPerson(
 
 void TreeViewFamilyLayouter::measureSpouse(TreeViewPerson& person, TreeViewPerson& spouse) {
     spouse.isProximalPerson = false;
-    if (person.getChildrenWithSpouseCount(spouse.personId) != 0) {
+    if (countOfChildren(person, spouse.personId) != 0) {
         measureSpouseWithSharedChildren(person, spouse);
     } else {
         measureSpouseWithoutSharedChildren(spouse);
@@ -42,18 +44,18 @@ void TreeViewFamilyLayouter::measureSpouse(TreeViewPerson& person, TreeViewPerso
 void TreeViewFamilyLayouter::measureSpouseWithSharedChildren(TreeViewPerson& person, TreeViewPerson& spouse) {
     const float shared = sharedChildrenWidth(person, spouse);
     const float step = addWidthsForStepChildrenFromSpouse(spouse);
-    const int stepCount = spouse.getChildrenWithNoOtherParentCount();
+    const int stepCount = countOfChildren(spouse, TreeViewPerson::kNoKey);
     const float stepGaps = stepCount > 0 ? static_cast<float>(stepCount) * treeSize.horzPadding : 0.0f;
-    const int sharedCount = person.getChildrenWithSpouseCount(spouse.personId);
+    const int sharedCount = countOfChildren(person, spouse.personId);
     spouse.layoutWidth = (step + stepGaps) + (horzPaddingForNodesCount(sharedCount) + shared);
 }
 
 // A lone childless child gets the width of a couple, so that it comes out under the middle of the pair.
 float TreeViewFamilyLayouter::sharedChildrenWidth(TreeViewPerson& person, TreeViewPerson& spouse) {
-    const bool loneChild = person.getChildrenWithSpouseCount(spouse.personId) == 1 &&
-                           spouse.getChildrenWithNoOtherParentCount() == 0;
+    const bool loneChild =
+        countOfChildren(person, spouse.personId) == 1 && countOfChildren(spouse, TreeViewPerson::kNoKey) == 0;
     float shared = 0.0f;
-    for (TreeViewPerson& child : person.childrenUnder(spouse.personId)) {
+    for (TreeViewPerson& child : person.childrenBy(spouse.personId)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         shared = shared + familyUnitWidthForProximalPerson(child);
         if (loneChild && shared == treeSize.nodeWidth) {
@@ -66,13 +68,13 @@ float TreeViewFamilyLayouter::sharedChildrenWidth(TreeViewPerson& person, TreeVi
 
 void TreeViewFamilyLayouter::measureSpouseWithoutSharedChildren(TreeViewPerson& spouse) {
     const float step = addWidthsForStepChildrenFromSpouse(spouse);
-    const float width = step + horzPaddingForNodesCount(spouse.getChildrenWithNoOtherParentCount());
+    const float width = step + horzPaddingForNodesCount(countOfChildren(spouse, TreeViewPerson::kNoKey));
     spouse.layoutWidth = couplesWidth() > width ? couplesWidth() : width;
 }
 
 float TreeViewFamilyLayouter::addWidthsForStepChildrenFromSpouse(TreeViewPerson& spouse) {
     float sum = 0.0f;
-    for (TreeViewPerson& child : spouse.childrenUnder(TreeViewPerson::kNoKey)) {
+    for (TreeViewPerson& child : spouse.childrenBy(TreeViewPerson::kNoKey)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         sum = sum + child.layoutWidth;
     }
@@ -81,7 +83,7 @@ float TreeViewFamilyLayouter::addWidthsForStepChildrenFromSpouse(TreeViewPerson&
 
 float TreeViewFamilyLayouter::unknownChildrenWidth(TreeViewPerson& person) {
     float unknown = 0.0f;
-    for (TreeViewPerson& child : person.childrenUnder(TreeViewPerson::kNoKey)) {
+    for (TreeViewPerson& child : person.childrenBy(TreeViewPerson::kNoKey)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         unknown = unknown + child.layoutWidth;
         for (const TreeViewPerson& spouse : child.spouses) {
@@ -89,13 +91,13 @@ float TreeViewFamilyLayouter::unknownChildrenWidth(TreeViewPerson& person) {
             unknown = unknown + treeSize.horzPadding;
         }
     }
-    return unknown + horzPaddingForNodesCount(person.getChildrenWithNoOtherParentCount());
+    return unknown + horzPaddingForNodesCount(countOfChildren(person, TreeViewPerson::kNoKey));
 }
 
 // Reads stored widths alone and must stay free of recursion: it is asked for each child on each level.
 float TreeViewFamilyLayouter::familyUnitWidthForProximalPerson(TreeViewPerson& person) {
     const int spouseCount = person.getSpouseCount();
-    if (person.getChildrenWithNoOtherParentCount() != 0) {
+    if (countOfChildren(person, TreeViewPerson::kNoKey) != 0) {
         float total = person.layoutWidth;
         for (const TreeViewPerson& spouse : person.spouses) total = total + spouse.layoutWidth;
         const float gaps = spouseCount >= 1 ? static_cast<float>(spouseCount) * treeSize.horzPadding : 0.0f;

@@ -60,7 +60,9 @@ void TreeViewPerson::greatGrandparentsIterator(const Visitor& visitor) {
 }
 
 void TreeViewPerson::allChildrenIterator(bool includeBastards, const Visitor& visitor) {
-    visitAllChildren(*this, includeBastards, visitor);
+    visitListsOfChildren(*this, includeBastards, [&visitor](TreeViewPerson& parent, int key) {
+        parent.childrenIterator(key, visitor);
+    });
 }
 
 void TreeViewPerson::allChildrenWithSpouseIterator(TreeViewPerson& spouse, const Visitor& visitor) {

@@ -5,31 +5,49 @@
 
 #include <olvane/graph/TreeViewPerson.h>
 
-// The walks that have a rule, for any callable: the layouters walk the graph over and over, and a callable
-// that the compiler sees through costs next to nothing there. Plain walks are loops over a person's lists.
+// The walks that have a rule, for any callable, and the counts: the layouters walk the graph over and over,
+// and a callable that the compiler sees through costs next to nothing there. Unlike a person's own walks and
+// counts, these leave no empty list under a key that is missing. Plain walks are loops over a person's lists.
 
-// The order of TreeViewPerson::allChildrenIterator.
-template <class Visit>
-void visitAllChildren(TreeViewPerson& person, bool includeBastards, const Visit& visit) {
-    const auto visitChildrenOf = [&visit](TreeViewPerson& parent, int key) {
-        for (TreeViewPerson& child : parent.childrenUnder(key)) visit(child);
-    };
-    if (person.gender) visitChildrenOf(person, TreeViewPerson::kNoKey);
+// The lists of children in the order of TreeViewPerson::allChildrenIterator: visit is told whose list, and the
+// key of the other parent.
+template <class VisitList>
+void visitListsOfChildren(TreeViewPerson& person, bool includeBastards, const VisitList& visit) {
+    if (person.gender) visit(person, TreeViewPerson::kNoKey);
     for (TreeViewPerson& spouse : person.spouses) {
-        if (person.gender) visitChildrenOf(person, spouse.personId);
-        if (includeBastards) visitChildrenOf(spouse, TreeViewPerson::kNoKey);
-        if (!person.gender) visitChildrenOf(person, spouse.personId);
+        if (person.gender) visit(person, spouse.personId);
+        if (includeBastards) visit(spouse, TreeViewPerson::kNoKey);
+        if (!person.gender) visit(person, spouse.personId);
     }
-    if (!person.gender) visitChildrenOf(person, TreeViewPerson::kNoKey);
+    if (!person.gender) visit(person, TreeViewPerson::kNoKey);
 }
 
-// The order of TreeViewPerson::childAndSpouseIterator.
+// The children themselves.
+template <class Visit>
+void visitAllChildren(TreeViewPerson& person, bool includeBastards, const Visit& visit) {
+    visitListsOfChildren(person, includeBastards, [&visit](TreeViewPerson& parent, int key) {
+        for (TreeViewPerson& child : parent.childrenBy(key)) visit(child);
+    });
+}
+
+// The order of TreeViewPerson::childAndSpouseIterator: each child with its other parent, or with the person.
 template <class VisitPair>
 void visitChildrenAndSpouses(TreeViewPerson& person, const VisitPair& visit) {
     const auto visitChildrenWith = [&visit, &person](int key, TreeViewPerson& other) {
-        for (TreeViewPerson& child : person.childrenUnder(key)) visit(child, other);
+        for (TreeViewPerson& child : person.childrenBy(key)) visit(child, other);
     };
     if (person.gender) visitChildrenWith(TreeViewPerson::kNoKey, person);
     for (TreeViewPerson& spouse : person.spouses) visitChildrenWith(spouse.personId, spouse);
     if (!person.gender) visitChildrenWith(TreeViewPerson::kNoKey, person);
+}
+
+inline int countOfChildren(TreeViewPerson& person, int key) {
+    return static_cast<int>(person.childrenBy(key).size());
+}
+
+// As TreeViewPerson::getAllChildrenCount.
+inline int countOfAllChildren(TreeViewPerson& person) {
+    int count = countOfChildren(person, TreeViewPerson::kNoKey);
+    for (const TreeViewPerson& spouse : person.spouses) count += countOfChildren(person, spouse.personId);
+    return count;
 }

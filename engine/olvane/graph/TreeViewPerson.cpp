@@ -91,7 +91,7 @@ void TreeViewPerson::expectChildrenWithSpouse(int spouseId, std::size_t count) {
     list.reserve(list.size() + count);
 }
 
-TreeViewPerson::Persons& TreeViewPerson::addListOfChildren(int key) {
+TreeViewPerson::Persons& TreeViewPerson::childrenUnder(int key) {
     return children.try_emplace(key, arena()).first->second;
 }
 

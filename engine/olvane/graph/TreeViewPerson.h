@@ -9,6 +9,7 @@
 
 #include <cstddef>
 #include <functional>
+#include <span>
 #include <utility>
 #include <vector>
 
@@ -101,10 +102,11 @@ public:
     TreeViewPerson& getPreferredMother();
     TreeViewPerson& getPreferredSpouse();
 
-    // The children by that other parent. Leaves an empty list under a key that is missing.
-    Persons& childrenUnder(int key) {
+    // The children by that other parent, where they lie. Leaves no list under a key that is missing.
+    std::span<TreeViewPerson> childrenBy(int key) {
         const auto entry = children.find(key);
-        return entry != children.end() ? entry->second : addListOfChildren(key);
+        if (entry == children.end()) return {};
+        return {entry->second.data(), entry->second.size()};
     }
 
     // --- Walks. The order of a visit is the order on the page. None skips a person, asks for hasBeenVisited,
@@ -194,8 +196,8 @@ public:
 
 private:
     olvane::Arena* arena() const { return parents.get_allocator().arena(); }
-    Persons& addListOfChildren(int key);
-    Segments& linesTo(int spouseKey);  // makes the list where there is none
+    Persons& childrenUnder(int key);  // both make the list where there is none
+    Segments& linesTo(int spouseKey);
 
     bool hasBeenVisited_ = false;  // mark of the traversals that enter a node once
 };

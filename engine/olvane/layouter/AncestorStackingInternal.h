@@ -11,10 +11,9 @@ namespace SharedTreeViewer {
 // A partner of an ancestral couple has a host spouse other than the other partner.
 inline void flagPartnerWithAnotherSpouse(const DataAdapter& data, TreeViewPerson& partner,
                                          const TreeViewPerson& other) {
-    const TreeViewPerson::Iterator hostSpouses = partner.getNonDisplayedSpouseIterator(data.getSpouses);
-    hostSpouses([&](TreeViewPerson& spouse) {
+    for (const TreeViewPerson& spouse : partner.getNonDisplayedSpouses(data.getSpouses)) {
         if (spouse.personId != other.personId) partner.hasNonDisplayedRelationships = true;
-    });
+    }
 }
 
 // Climbs the preferred ancestors of a person, the father's line first, marks each as visited and collects it,
