@@ -43,7 +43,10 @@ async function bundledScript() {
 }
 
 async function minifiedStyle() {
-    const { code } = await transform(await readFile(here("src/page.css"), "utf8"), { loader: "css", minify: true });
+    const { code } = await transform(await readFile(here("src/page.css"), "utf8"), {
+        loader: "css",
+        minify: true,
+    });
     return code.trim();
 }
 
@@ -68,4 +71,6 @@ const parts = { policy: policyOf(script, style), style, script, engine };
 const template = await readFile(here("src/page.html"), "utf8");
 const page = template.replace(/\{\{(\w+)\}\}/g, (_, name) => parts[name]);
 await writeFile(values.out, page);
-console.log(`${values.out}: ${page.length} characters (script ${script.length}, style ${style.length}, engine ${engine.length})`);
+console.log(
+    `${values.out}: ${page.length} characters (script ${script.length}, style ${style.length}, engine ${engine.length})`,
+);

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The page as a whole: holds the family that is open and the state of the view, and passes between the parts what a
-// person does. Every road to another picture leads through travel(): a click, a key, the search, a link, the
-// browser's buttons.
+// The page as a whole: holds the family that is open and the state of the view, and passes between the parts
+// what a person does. Every road to another picture leads through travel(): a click, a key, the search, a
+// link, the browser's buttons.
 
 import type { Diagnostic, Olvane, Person } from "olvane";
 import { ArchiveError, gedcomInArchive, isArchive } from "./engine/archive";
@@ -31,7 +31,16 @@ import { boxTowards, type Direction } from "./view/kinMoves";
 import { OpenFamily } from "./view/OpenFamily";
 import type { Box, Picture } from "./view/Picture";
 import { PictureDress } from "./view/PictureDress";
-import { addressOf, clampGenerations, kUsualGenerations, readAddress, type RelativeName, sameState, type ViewName, type ViewState } from "./view/ViewState";
+import {
+    addressOf,
+    clampGenerations,
+    kUsualGenerations,
+    readAddress,
+    type RelativeName,
+    sameState,
+    type ViewName,
+    type ViewState,
+} from "./view/ViewState";
 
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
@@ -164,7 +173,8 @@ export class App implements ChromeActions {
 
     private refuse(name: string, error: unknown): void {
         const { errors } = this.ui;
-        const text = error instanceof ArchiveError ? errors.archive : errors.notGedcom("\u2068" + name + "\u2069");
+        const text =
+            error instanceof ArchiveError ? errors.archive : errors.notGedcom("\u2068" + name + "\u2069");
         const detail = error instanceof Error && !(error instanceof ArchiveError) ? error.message : "";
         this.notices.fail(text, [detail, errors.hint]);
     }
@@ -227,10 +237,15 @@ export class App implements ChromeActions {
     }
 
     private newDress(family: OpenFamily, picture: Picture): PictureDress {
-        return new PictureDress(family, picture, { messages: this.messages, ui: this.ui, kinshipInBoxes: this.kinshipInBoxes });
+        return new PictureDress(family, picture, {
+            messages: this.messages,
+            ui: this.ui,
+            kinshipInBoxes: this.kinshipInBoxes,
+        });
     }
 
-    // In a large family the boxes come first; what is written into them of kinship follows when there is time.
+    // In a large family the boxes come first; what is written into them of kinship follows when there is
+    // time.
     private learnKinships(): void {
         clearTimeout(this.kinshipTimer);
         if (this.dress?.kinshipKnown) return;
@@ -323,7 +338,9 @@ export class App implements ChromeActions {
         pngOf(whole).then(
             ({ blob, part }) => {
                 saveFile(name, blob);
-                this.notices.tell(part < 1 ? this.ui.savedSmaller(name, Math.round(part * 100)) : this.ui.saved(name));
+                this.notices.tell(
+                    part < 1 ? this.ui.savedSmaller(name, Math.round(part * 100)) : this.ui.saved(name),
+                );
             },
             () => this.notices.fail(this.ui.pictureFailed, []),
         );
@@ -443,7 +460,14 @@ export class App implements ChromeActions {
         }
         chrome.corner.insertBefore(this.overview.element, chrome.corner.lastChild);
         stage.replaceChildren(this.hint, this.surface, chrome.corner, this.tooltip.element);
-        this.root.replaceChildren(chrome.bar, stage, panel.element, chrome.keys, chrome.diagnostics, ...always);
+        this.root.replaceChildren(
+            chrome.bar,
+            stage,
+            panel.element,
+            chrome.keys,
+            chrome.diagnostics,
+            ...always,
+        );
         chrome.showFamily(family.title, this.ui.personCount(family.persons.length));
         chrome.showDiagnostics(this.lastProblems, family.persons.length);
         this.showPanelState();
@@ -521,13 +545,17 @@ export class App implements ChromeActions {
     }
 
     private whole(theme: string): WholePicture | null {
-        return this.picture && this.dress ? wholePicture(this.picture, this.dress, this.pictureTitle(), theme) : null;
+        return this.picture && this.dress
+            ? wholePicture(this.picture, this.dress, this.pictureTitle(), theme)
+            : null;
     }
 
     private languageChooser(): HTMLElement {
         const select = html("select", { id: "language", "aria-label": this.ui.languageLabel });
         for (const { language, languageName } of uiLanguages) {
-            select.append(html("option", { value: language, selected: language === this.ui.language }, languageName));
+            select.append(
+                html("option", { value: language, selected: language === this.ui.language }, languageName),
+            );
         }
         select.addEventListener("change", () => this.setLanguage(select.value));
         return select;
@@ -538,4 +566,3 @@ export class App implements ChromeActions {
 function pause(): Promise<void> {
     return new Promise((done) => setTimeout(done, 0));
 }
-

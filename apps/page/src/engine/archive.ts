@@ -30,7 +30,8 @@ export function isArchive(bytes: Uint8Array): boolean {
 export async function gedcomInArchive(archive: Uint8Array<ArrayBuffer>): Promise<Uint8Array<ArrayBuffer>> {
     const entries = entriesOf(archive);
     const chosen =
-        entries.find((entry) => /(^|\/)gedcom\.ged$/i.test(entry.name)) ?? entries.find((entry) => /\.ged$/i.test(entry.name));
+        entries.find((entry) => /(^|\/)gedcom\.ged$/i.test(entry.name)) ??
+        entries.find((entry) => /\.ged$/i.test(entry.name));
     if (!chosen) throw new ArchiveError("no .ged");
     try {
         return await contentOf(archive, chosen);
@@ -53,7 +54,8 @@ function entriesOf(archive: Uint8Array): Entry[] {
     const entries: Entry[] = [];
     let at = view.getUint32(end + 16, true);
     for (let left = view.getUint16(end + 10, true); left > 0; --left) {
-        if (at + 46 > view.byteLength || view.getUint32(at, true) !== kEntry) throw new ArchiveError("damaged");
+        if (at + 46 > view.byteLength || view.getUint32(at, true) !== kEntry)
+            throw new ArchiveError("damaged");
         const nameSize = view.getUint16(at + 28, true);
         entries.push({
             name: new TextDecoder().decode(archive.subarray(at + 46, at + 46 + nameSize)),
@@ -69,20 +71,25 @@ function entriesOf(archive: Uint8Array): Entry[] {
 
 function endOf(view: DataView): number {
     const lowest = Math.max(0, view.byteLength - kEndSize - kMostComment);
-    for (let at = view.byteLength - kEndSize; at >= lowest; --at) if (view.getUint32(at, true) === kEnd) return at;
+    for (let at = view.byteLength - kEndSize; at >= lowest; --at)
+        if (view.getUint32(at, true) === kEnd) return at;
     throw new ArchiveError("no archive");
 }
 
 async function contentOf(archive: Uint8Array<ArrayBuffer>, entry: Entry): Promise<Uint8Array<ArrayBuffer>> {
     const view = new DataView(archive.buffer, archive.byteOffset, archive.byteLength);
-    const start = entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
+    const start =
+        entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
     const packed = archive.slice(start, start + entry.packedSize);
     if (entry.method === 0) return packed;
     if (entry.method !== 8) throw new ArchiveError("packed in a way that is not known");
     return inflate(packed, "deflate-raw");
 }
 
-async function inflate(bytes: Uint8Array<ArrayBuffer>, format: CompressionFormat): Promise<Uint8Array<ArrayBuffer>> {
+async function inflate(
+    bytes: Uint8Array<ArrayBuffer>,
+    format: CompressionFormat,
+): Promise<Uint8Array<ArrayBuffer>> {
     const reader = new Blob([bytes]).stream().pipeThrough(new DecompressionStream(format)).getReader();
     const parts: Uint8Array[] = [];
     let size = 0;

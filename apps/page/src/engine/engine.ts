@@ -24,7 +24,9 @@ export async function startEngine(): Promise<Olvane> {
 export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
     const text = document.getElementById("olvane-family")?.textContent;
     if (!text) return null;
-    const told = JSON.parse(text) as Partial<Record<"name" | "title" | "focus" | "view" | "gzip", unknown>> & { livingHidden?: unknown };
+    const told = JSON.parse(text) as Partial<
+        Record<"name" | "title" | "focus" | "view" | "gzip", unknown>
+    > & { livingHidden?: unknown };
     return {
         name: String(told.name ?? "family.ged"),
         title: String(told.title ?? ""),

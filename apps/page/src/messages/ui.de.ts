@@ -57,7 +57,8 @@ export const uiGerman: UiMessages = {
     savePng: "Als PNG sichern",
     print: "Drucken…",
     saved: (name) => `Gesichert als ${name}.`,
-    savedSmaller: (name, percent) => `Gesichert als ${name}, in ${percent} % der Größe: größer zeichnen Browser nicht. SVG hat keine Grenze.`,
+    savedSmaller: (name, percent) =>
+        `Gesichert als ${name}, in ${percent} % der Größe: größer zeichnen Browser nicht. SVG hat keine Grenze.`,
     pictureFailed: "Das Bild ließ sich nicht erzeugen. Vielleicht geht es als SVG.",
     keys: "Tasten",
     keyList: [
@@ -92,7 +93,11 @@ export const uiGerman: UiMessages = {
     missingMother: "Mutter unbekannt",
     missingOf: (what, child) => `${what} (zu ${child})`,
     hiddenCount: (n) =>
-        n === 0 ? "weitere Verwandte nicht gezeigt" : n === 1 ? "1 weiterer Verwandter nicht gezeigt" : `${n} weitere Verwandte nicht gezeigt`,
+        n === 0
+            ? "weitere Verwandte nicht gezeigt"
+            : n === 1
+              ? "1 weiterer Verwandter nicht gezeigt"
+              : `${n} weitere Verwandte nicht gezeigt`,
     severalBoxes: (n) => `steht an ${n} Stellen dieses Bildes`,
     nextBox: "Nächste Stelle",
     focusNow: (name, boxes) => `${name} steht jetzt in der Mitte. ${boxes} Kästen sind zu sehen.`,
@@ -135,7 +140,8 @@ export const uiGerman: UiMessages = {
         layout: "Dieses Bild ließ sich nicht anordnen. Weniger Generationen oder Verwandte helfen vielleicht.",
         dismiss: "Schließen",
     },
-    firstHint: "Ein Klick stellt eine Person in die Mitte ihrer Familie. Ziehen verschiebt, das Mausrad vergrößert.",
+    firstHint:
+        "Ein Klick stellt eine Person in die Mitte ihrer Familie. Ziehen verschiebt, das Mausrad vergrößert.",
     livingHidden: "Lebende Personen sind in dieser Datei ausgelassen.",
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),
 };

@@ -57,7 +57,8 @@ export const uiEnglish: UiMessages = {
     savePng: "Save as PNG",
     print: "Print…",
     saved: (name) => `Saved as ${name}.`,
-    savedSmaller: (name, percent) => `Saved as ${name}, at ${percent} % of its size: browsers draw no larger one. SVG has no such limit.`,
+    savedSmaller: (name, percent) =>
+        `Saved as ${name}, at ${percent} % of its size: browsers draw no larger one. SVG has no such limit.`,
     pictureFailed: "The picture could not be made. SVG may work instead.",
     keys: "Keys",
     keyList: [
@@ -91,7 +92,12 @@ export const uiEnglish: UiMessages = {
     missingFather: "Unknown father",
     missingMother: "Unknown mother",
     missingOf: (what, child) => `${what} of ${child}`,
-    hiddenCount: (n) => (n === 0 ? "more relatives not shown" : n === 1 ? "1 more relative not shown" : `${n} more relatives not shown`),
+    hiddenCount: (n) =>
+        n === 0
+            ? "more relatives not shown"
+            : n === 1
+              ? "1 more relative not shown"
+              : `${n} more relatives not shown`,
     severalBoxes: (n) => `stands in ${n} places of this picture`,
     nextBox: "Next place",
     focusNow: (name, boxes) => `${name} is now the focus. ${boxes} boxes are shown.`,

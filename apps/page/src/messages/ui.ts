@@ -37,7 +37,12 @@ export interface UiMessages {
     readonly more: string;
     readonly look: string;
     readonly theme: string;
-    readonly themes: { readonly auto: string; readonly light: string; readonly dark: string; readonly contrast: string };
+    readonly themes: {
+        readonly auto: string;
+        readonly light: string;
+        readonly dark: string;
+        readonly contrast: string;
+    };
     readonly languageLabel: string;
     readonly kinshipInBoxes: string;
     readonly file: string;

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The whole picture as a drawing that stands by itself: colours and fonts as attributes, nothing that only the page
-// understands.
+// The whole picture as a drawing that stands by itself: colours and fonts as attributes, nothing that only
+// the page understands.
 
 import { drawBox, handleOf } from "../scene/boxArt";
 import { type Dress, linePaths } from "../scene/Scene";
@@ -11,7 +11,17 @@ import { svg } from "../ui/dom";
 import type { Picture } from "../view/Picture";
 
 const kMargin = 24; // points
-const kLooks = ["fill", "stroke", "stroke-width", "stroke-dasharray", "font-size", "font-weight", "text-anchor", "opacity", "unicode-bidi"];
+const kLooks = [
+    "fill",
+    "stroke",
+    "stroke-width",
+    "stroke-dasharray",
+    "font-size",
+    "font-weight",
+    "text-anchor",
+    "opacity",
+    "unicode-bidi",
+];
 const kUsual: Readonly<Record<string, string>> = {
     stroke: "none",
     "stroke-dasharray": "none",
@@ -19,7 +29,15 @@ const kUsual: Readonly<Record<string, string>> = {
     "text-anchor": "start",
     "unicode-bidi": "normal",
 };
-const kPageOnly = ["tabindex", "aria-current", "aria-hidden", "data-person-id", "data-xref", "data-box", "class"];
+const kPageOnly = [
+    "tabindex",
+    "aria-current",
+    "aria-hidden",
+    "data-person-id",
+    "data-xref",
+    "data-box",
+    "class",
+];
 
 export interface WholePicture {
     readonly svg: SVGSVGElement;
@@ -65,7 +83,11 @@ export function wholePicture(picture: Picture, dress: Dress, title: string, them
 // As a file: with its declaration, and without what XML forbids.
 export function svgText(drawing: SVGSVGElement): string {
     const text = new XMLSerializer().serializeToString(drawing);
-    return '<?xml version="1.0" encoding="UTF-8"?>\n' + text.replace(/[^\t\n\r\u0020-\ud7ff\ud800-\udfff\ue000-\ufffd]/g, "\ufffd") + "\n";
+    return (
+        '<?xml version="1.0" encoding="UTF-8"?>\n' +
+        text.replace(/[^\t\n\r\u0020-\ud7ff\ud800-\udfff\ue000-\ufffd]/g, "\ufffd") +
+        "\n"
+    );
 }
 
 // Asks the browser once for each kind of element how the style sheet has it look.
@@ -89,13 +111,21 @@ function resolveLooks(drawing: SVGSVGElement, theme: string): void {
 
 function kindOf(element: Element): string {
     const parents = [element, element.parentElement, element.parentElement?.parentElement];
-    return element.tagName + parents.map((one) => "/" + (one?.getAttribute("class") ?? "")).join("") + element.hasAttribute("font-size");
+    return (
+        element.tagName +
+        parents.map((one) => "/" + (one?.getAttribute("class") ?? "")).join("") +
+        element.hasAttribute("font-size")
+    );
 }
 
 function looksOf(element: Element): (readonly [string, string])[] {
     const isGroup = element.tagName === "g";
     const style = getComputedStyle(element);
-    const names = isGroup ? ["opacity"] : element.tagName === "text" ? kLooks : kLooks.filter((name) => !/font|anchor|bidi/.test(name));
+    const names = isGroup
+        ? ["opacity"]
+        : element.tagName === "text"
+          ? kLooks
+          : kLooks.filter((name) => !/font|anchor|bidi/.test(name));
     return names
         .map((name) => [name, style.getPropertyValue(name)] as const)
         .filter(([name, value]) => value !== "" && value !== kUsual[name])

@@ -31,8 +31,15 @@ export interface Pixels {
 
 export async function pngOf(whole: WholePicture): Promise<Pixels> {
     const { width, height } = whole;
-    const most = Math.min(kSharpness, kMostSide / Math.max(width, height), Math.sqrt(kMostPixels / (width * height)));
-    const canvas = html("canvas", { width: Math.max(1, Math.floor(width * most)), height: Math.max(1, Math.floor(height * most)) });
+    const most = Math.min(
+        kSharpness,
+        kMostSide / Math.max(width, height),
+        Math.sqrt(kMostPixels / (width * height)),
+    );
+    const canvas = html("canvas", {
+        width: Math.max(1, Math.floor(width * most)),
+        height: Math.max(1, Math.floor(height * most)),
+    });
     const pen = canvas.getContext("2d");
     if (!pen) throw new Error("no canvas");
     pen.drawImage(await imageOf(svgBlob(whole)), 0, 0, canvas.width, canvas.height);
@@ -55,6 +62,11 @@ async function imageOf(blob: Blob): Promise<HTMLImageElement> {
 
 // "darwin-wedgwood - Charles Darwin"; without what file systems refuse.
 export function fileNameOf(...parts: string[]): string {
-    const plain = parts.map((part) => part.replace(/[\\/:*?"<>|\p{Cc}\p{Cf}]+/gu, " ").replace(/\s+/g, " ").trim());
+    const plain = parts.map((part) =>
+        part
+            .replace(/[\\/:*?"<>|\p{Cc}\p{Cf}]+/gu, " ")
+            .replace(/\s+/g, " ")
+            .trim(),
+    );
     return plain.filter(Boolean).join(" - ").slice(0, 100) || "family";
 }

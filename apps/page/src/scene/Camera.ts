@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Where the picture stands on the screen: moved by hand, wheel, pinch and keys, or travelling to a place of its own.
+// Where the picture stands on the screen: moved by hand, wheel, pinch and keys, or travelling to a place of
+// its own.
 
 import { select } from "d3-selection";
 import { type D3ZoomEvent, zoom, zoomIdentity, type ZoomTransform } from "d3-zoom";
@@ -43,7 +44,10 @@ export class Camera {
         this.selection = select<SVGSVGElement, unknown>(surface);
         this.behaviour
             .scaleExtent([kLeastZoom, kMostZoom])
-            .extent(() => [[0, 0], [this.size.width, this.size.height]])
+            .extent(() => [
+                [0, 0],
+                [this.size.width, this.size.height],
+            ])
             .clickDistance(6)
             .on("zoom", (event: D3ZoomEvent<SVGSVGElement, unknown>) => {
                 if (event.sourceEvent) this.stop();
@@ -58,7 +62,10 @@ export class Camera {
 
     // Asked for in every frame, so it is measured only when it has changed.
     get size(): { width: number; height: number } {
-        return (this.measured ??= { width: this.surface.clientWidth || 1, height: this.surface.clientHeight || 1 });
+        return (this.measured ??= {
+            width: this.surface.clientWidth || 1,
+            height: this.surface.clientHeight || 1,
+        });
     }
 
     resized(): void {
@@ -100,7 +107,10 @@ export class Camera {
         const { k, x, y } = this.placing;
         const next = Math.min(kMostZoom, Math.max(kLeastZoom, k * factor));
         const ratio = next / k;
-        this.travelTo({ k: next, x: width / 2 - (width / 2 - x) * ratio, y: height / 2 - (height / 2 - y) * ratio }, 180);
+        this.travelTo(
+            { k: next, x: width / 2 - (width / 2 - x) * ratio, y: height / 2 - (height / 2 - y) * ratio },
+            180,
+        );
     }
 
     panBy(dx: number, dy: number): void {
@@ -115,21 +125,31 @@ export class Camera {
         const room = (size: number) => Math.max(40, size - 2 * kFitMargin);
         const k = Math.max(
             kLeastZoom,
-            Math.min(mostZoom, room(width - aside) / (area.right - area.left), room(height - kCornerHeight) / (area.bottom - area.top)),
+            Math.min(
+                mostZoom,
+                room(width - aside) / (area.right - area.left),
+                room(height - kCornerHeight) / (area.bottom - area.top),
+            ),
         );
-        const { x, y } = this.centring({ x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 }, k);
+        const { x, y } = this.centring(
+            { x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 },
+            k,
+        );
         return { k, x: x - aside / 2, y: y - kCornerHeight / 2 };
     }
 
-    // Where a picture begins: whole if it can be read so, else readable, with its middle in the window's middle and all
-    // of its height if there is room.
+    // Where a picture begins: whole if it can be read so, else readable, with its middle in the window's
+    // middle and all of its height if there is room.
     opening(area: Rectangle, middle: Point): Placing {
         const whole = this.fitting(area);
         if (whole.k >= kReadable) return whole;
         const { height } = this.size;
         const tall = (height - 2 * kFitMargin - kCornerHeight) / (area.bottom - area.top);
         if (tall < kReadable) return this.centring(middle, kUsualZoom);
-        const { k, x, y } = this.centring({ x: middle.x, y: (area.top + area.bottom) / 2 }, Math.min(1, tall));
+        const { k, x, y } = this.centring(
+            { x: middle.x, y: (area.top + area.bottom) / 2 },
+            Math.min(1, tall),
+        );
         return { k, x, y: y - kCornerHeight / 2 };
     }
 
@@ -138,7 +158,8 @@ export class Camera {
         return { k, x: width / 2 - point.x * k, y: height / 2 - point.y * k };
     }
 
-    // The least move that brings all of an area into the window, crosswise and upwards each where there is room for it.
+    // The least move that brings all of an area into the window, crosswise and upwards each where there is
+    // room for it.
     includingWhole(area: Rectangle, from: Placing): Placing {
         const { width, height } = this.size;
         const { k } = from;
@@ -169,7 +190,12 @@ export function eased(part: number): number {
 }
 
 // Zooms evenly, and keeps the middle of the window on a straight way.
-export function between(a: Placing, b: Placing, part: number, { width, height }: { width: number; height: number }): Placing {
+export function between(
+    a: Placing,
+    b: Placing,
+    part: number,
+    { width, height }: { width: number; height: number },
+): Placing {
     const k = a.k * (b.k / a.k) ** part;
     const middle = (from: number, to: number, size: number) => {
         const start = (size / 2 - from) / a.k;

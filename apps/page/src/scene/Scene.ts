@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The picture on the screen. Only what is in sight has elements, with some room around it, so that panning moves one
-// group and nothing else. Where too many boxes to be read are in sight they become a crowd: one path a colour.
+// The picture on the screen. Only what is in sight has elements, with some room around it, so that panning
+// moves one group and nothing else. Where too many boxes to be read are in sight they become a crowd: one
+// path a colour.
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
@@ -68,8 +69,8 @@ export class Scene {
         this.listen();
     }
 
-    // Draws another picture. Boxes of the same persons glide from where they stood, while the anchor, a box of the
-    // picture so far, hands its place on the screen to the new focus.
+    // Draws another picture. Boxes of the same persons glide from where they stood, while the anchor, a box
+    // of the picture so far, hands its place on the screen to the new focus.
     show(picture: Picture, dress: Dress, anchor: Box | null): void {
         const before = this.picture;
         const hadKeys = this.surface.contains(document.activeElement);
@@ -92,7 +93,8 @@ export class Scene {
 
     // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
     redraw(): void {
-        for (const [box, element] of this.elements) repaintBox(element, this.dress.lookOf(box), this.picture!.sizes);
+        for (const [box, element] of this.elements)
+            repaintBox(element, this.dress.lookOf(box), this.picture!.sizes);
     }
 
     dressAnew(dress: Dress): void {
@@ -141,7 +143,8 @@ export class Scene {
 
     // Marks all the boxes of one person, when one of several is pointed at.
     markTwins(person: number): void {
-        for (const [box, element] of this.elements) element.classList.toggle("twin-lit", person > 0 && box.person === person);
+        for (const [box, element] of this.elements)
+            element.classList.toggle("twin-lit", person > 0 && box.person === person);
     }
 
     private begin(picture: Picture): void {
@@ -182,8 +185,8 @@ export class Scene {
         return this.camera.opening(picture.bounds, middleOf(picture.areaOf(picture.focusBox)));
     }
 
-    // Near to where it starts: only so far that the focus stands well in the window, and the whole picture where the
-    // zoom of the moment has room for it.
+    // Near to where it starts: only so far that the focus stands well in the window, and the whole picture
+    // where the zoom of the moment has room for it.
     private comfortable(picture: Picture, start: Placing, otherView: boolean): Placing {
         if (otherView) return this.opening(picture);
         const near = this.camera.including(picture.areaOf(picture.focusBox), 0.3, start);
@@ -195,7 +198,8 @@ export class Scene {
         for (const [box, element] of oldElements) {
             if (picture.boxOfKey(box.key)) continue;
             for (const name of ["data-person-id", "data-xref", "data-box"]) element.removeAttribute(name);
-            for (const name of ["role", "tabindex", "aria-label", "aria-current"]) handleOf(element).removeAttribute(name);
+            for (const name of ["role", "tabindex", "aria-label", "aria-current"])
+                handleOf(element).removeAttribute(name);
             element.setAttribute("transform", `translate(${box.x + shift.x} ${box.y + shift.y})`);
             gone.push(element);
         }
@@ -204,8 +208,13 @@ export class Scene {
     }
 
     private fadeNewcomers(before: Picture): void {
-        for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) element.classList.add("late");
-        const lines = svg("g", { class: "lines later", "aria-hidden": "true", "stroke-width": this.lines.getAttribute("stroke-width") });
+        for (const [box, element] of this.elements)
+            if (!before.boxOfKey(box.key)) element.classList.add("late");
+        const lines = svg("g", {
+            class: "lines later",
+            "aria-hidden": "true",
+            "stroke-width": this.lines.getAttribute("stroke-width"),
+        });
         lines.append(...this.lines.childNodes);
         this.lines.replaceWith(lines);
         this.lines = lines;
@@ -239,7 +248,10 @@ export class Scene {
 
     private cameraMoved(placing: Placing): void {
         const { k, x, y } = placing;
-        this.world.setAttribute("transform", `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`);
+        this.world.setAttribute(
+            "transform",
+            `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`,
+        );
         if (this.picture) this.update();
         this.thickenLines();
         this.events.moved(placing);
@@ -251,9 +263,15 @@ export class Scene {
         if (!picture) return;
         const sight = this.camera.window();
         const needed = alsoWindow ? unionOf(sight, alsoWindow) : sight;
-        const crowded = picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
+        const crowded =
+            picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
         const far = this.drawn && this.drawn.right - this.drawn.left > 6 * (sight.right - sight.left);
-        if (this.drawn && crowded === this.crowded && !far && encloses(this.drawn, clipped(needed, this.drawn, picture.bounds))) {
+        if (
+            this.drawn &&
+            crowded === this.crowded &&
+            !far &&
+            encloses(this.drawn, clipped(needed, this.drawn, picture.bounds))
+        ) {
             this.keepAlways(picture);
             return;
         }
@@ -296,7 +314,8 @@ export class Scene {
         for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box, picture));
         this.boxLayer.append(added);
         const focus = this.elements.get(picture.focusBox);
-        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(document.activeElement)) this.boxLayer.append(focus);
+        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(document.activeElement))
+            this.boxLayer.append(focus);
     }
 
     private keepAlways(picture: Picture): void {
@@ -376,7 +395,9 @@ export function linePaths(segments: readonly Segment[], dress: Dress): SVGPathEl
         const style = dress.styleOf(segment);
         paths.set(style, paths.get(style) + `M${x1} ${y1}L${x2} ${y2}`);
     }
-    return [...paths].filter(([, d]) => d !== "").map(([style, d]) => svg("path", { class: "line " + style, d }));
+    return [...paths]
+        .filter(([, d]) => d !== "")
+        .map(([style, d]) => svg("path", { class: "line " + style, d }));
 }
 
 function middleOf(area: Rectangle): Point {
@@ -392,7 +413,8 @@ function unionOf(a: Rectangle, b: Rectangle): Rectangle {
     };
 }
 
-// Nothing stands outside of the picture's bounds, so a window that only reaches beyond them needs nothing new.
+// Nothing stands outside of the picture's bounds, so a window that only reaches beyond them needs nothing
+// new.
 function clipped(window: Rectangle, drawn: Rectangle, bounds: Rectangle): Rectangle {
     const left = Math.max(window.left, bounds.left);
     const top = Math.max(window.top, bounds.top);

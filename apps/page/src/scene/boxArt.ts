@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Draws one box. A tall box has the silhouette on top and centred lines below it; a wide one has it at the left and
-// lines beside it. Sex is told by corners and silhouette as well as by colour. Colours come from the page's themes.
+// Draws one box. A tall box has the silhouette on top and centred lines below it; a wide one has it at the
+// left and lines beside it. Sex is told by corners and silhouette as well as by colour. Colours come from the
+// page's themes.
 
 import type { Sex, Sizes } from "olvane";
 import { svg } from "../ui/dom";
@@ -44,7 +45,12 @@ export const kSilhouettes: Record<Sex, string> = {
 const kCorners: Record<Sex, number> = { male: 3, female: 16, other: 8 };
 
 export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
-    const classes = ["box", look.person ? look.sex : "missing", look.isFocus && "focus", look.repeated && "repeated"];
+    const classes = [
+        "box",
+        look.person ? look.sex : "missing",
+        look.isFocus && "focus",
+        look.repeated && "repeated",
+    ];
     const box = svg("g", {
         class: classes.filter(Boolean).join(" "),
         "data-person-id": look.person || null,
@@ -76,7 +82,14 @@ export function handleOf(box: SVGGElement): SVGRectElement {
 function appendFrame(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
     const rx = kCorners[look.sex];
     box.append(
-        svg("rect", { class: "ring", x: -5, y: -5, width: nodeWidth + 10, height: nodeHeight + 10, rx: rx + 5 }),
+        svg("rect", {
+            class: "ring",
+            x: -5,
+            y: -5,
+            width: nodeWidth + 10,
+            height: nodeHeight + 10,
+            rx: rx + 5,
+        }),
         svg("rect", {
             class: "frame",
             width: nodeWidth,
@@ -102,7 +115,9 @@ function appendTallText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
 
     box.append(figure(look, middle - 12, 8));
-    name.lines.forEach((line, i) => box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)));
+    name.lines.forEach((line, i) =>
+        box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
+    );
     if (look.years) box.append(text("years", middle, yearsY, fitLine(look.years, kYearsSize, 400, room)));
     if (look.kinship) box.append(text("kin", middle, lastLine, fitLine(look.kinship, kKinSize, 400, room)));
 }
@@ -120,10 +135,14 @@ function appendWideText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight
     const x = look.rightToLeft ? right : left;
 
     box.append(figure(look, 9, (nodeHeight - 22) / 2));
-    name.lines.forEach((line, i) => box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)));
+    name.lines.forEach((line, i) =>
+        box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)),
+    );
     lower.forEach((line, i) => {
         const y = firstY + name.lines.length * pitch + i * 14;
-        box.append(text(line === look.kinship ? "kin" : "years", left, y, fitLine(line, kYearsSize, 400, room)));
+        box.append(
+            text(line === look.kinship ? "kin" : "years", left, y, fitLine(line, kYearsSize, 400, room)),
+        );
     });
     box.classList.add("wide");
 }
@@ -136,12 +155,28 @@ function lowerLines(look: BoxLook, room: number): string[] {
 }
 
 function figure(look: BoxLook, x: number, y: number): SVGElement {
-    if (look.person) return svg("path", { class: "figure", d: kSilhouettes[look.sex], transform: `translate(${x} ${y}) scale(${kFigureScale})` });
+    if (look.person)
+        return svg("path", {
+            class: "figure",
+            d: kSilhouettes[look.sex],
+            transform: `translate(${x} ${y}) scale(${kFigureScale})`,
+        });
     return text("unknown", x + 12, y + 19, "?");
 }
 
-function text(className: string, x: number, y: number, content: string, rightToLeft = false, size?: number): SVGTextElement {
-    const line = svg("text", { class: className, x, y: Math.round(y * 10) / 10, "font-size": size, "aria-hidden": "true" }, content);
+function text(
+    className: string,
+    x: number,
+    y: number,
+    content: string,
+    rightToLeft = false,
+    size?: number,
+): SVGTextElement {
+    const line = svg(
+        "text",
+        { class: className, x, y: Math.round(y * 10) / 10, "font-size": size, "aria-hidden": "true" },
+        content,
+    );
     if (rightToLeft) line.setAttribute("direction", "rtl");
     return line;
 }
@@ -150,7 +185,11 @@ function text(className: string, x: number, y: number, content: string, rightToL
 function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): void {
     const label = hidden > 0 ? "+" + hidden : "+";
     const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
-    const badge = svg("g", { class: "badge", "aria-hidden": "true", transform: `translate(${nodeWidth - width + 8} -9)` });
+    const badge = svg("g", {
+        class: "badge",
+        "aria-hidden": "true",
+        transform: `translate(${nodeWidth - width + 8} -9)`,
+    });
     badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
 }
@@ -158,7 +197,11 @@ function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): vo
 function appendTwinMark(box: SVGGElement): void {
     const d = "M-.5 3.5h8v8h-8zM3.5 3.5v-4h8v8h-4";
     box.append(
-        svg("g", { class: "twin", transform: "translate(0 -1)" },
-            svg("rect", { x: -5, y: -5, width: 21, height: 21, rx: 6 }), svg("path", { d })),
+        svg(
+            "g",
+            { class: "twin", transform: "translate(0 -1)" },
+            svg("rect", { x: -5, y: -5, width: 21, height: 21, rx: 6 }),
+            svg("path", { d }),
+        ),
     );
 }

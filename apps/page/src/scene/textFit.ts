@@ -1,10 +1,11 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Fits names into boxes. A name takes the largest of a few sizes in which no word is cut; before anything is cut,
-// given names in the middle become initials. Widths are measured and remembered.
+// Fits names into boxes. A name takes the largest of a few sizes in which no word is cut; before anything is
+// cut, given names in the middle become initials. Widths are measured and remembered.
 
-export const kFontFamily = "system-ui, -apple-system, 'Segoe UI', Roboto, 'Noto Sans', 'DejaVu Sans', sans-serif";
+export const kFontFamily =
+    "system-ui, -apple-system, 'Segoe UI', Roboto, 'Noto Sans', 'DejaVu Sans', sans-serif";
 
 const kNameSizes = [13, 12, 11]; // px
 const kUsualLines = 2; // a third one costs a size
@@ -37,7 +38,12 @@ export function textWidth(text: string, size: number, weight: number): number {
 export function fitName(parts: readonly string[], width: number, mostLines: number): FittedName {
     const words = parts.map(wordsOf).filter((part) => part.length > 0);
     for (const size of kNameSizes) {
-        const lines = wrapWhole(words, size, width, size === kNameSizes[0] ? Math.min(kUsualLines, mostLines) : mostLines);
+        const lines = wrapWhole(
+            words,
+            size,
+            width,
+            size === kNameSizes[0] ? Math.min(kUsualLines, mostLines) : mostLines,
+        );
         if (lines) return { lines, size };
     }
     const short = words.map(abbreviated);
@@ -57,7 +63,8 @@ export function fitLine(text: string, size: number, weight: number, width: numbe
     let high = letters.length;
     while (low < high) {
         const middle = (low + high + 1) >> 1;
-        if (textWidth(letters.slice(0, middle).join("").trimEnd() + kEllipsis, size, weight) <= width) low = middle;
+        if (textWidth(letters.slice(0, middle).join("").trimEnd() + kEllipsis, size, weight) <= width)
+            low = middle;
         else high = middle - 1;
     }
     return letters.slice(0, low).join("").trimEnd() + kEllipsis;
@@ -80,7 +87,8 @@ function wrap(words: readonly string[], size: number, width: number): string[] {
     const lines: string[] = [];
     for (const word of words) {
         const last = lines.at(-1);
-        if (last !== undefined && textWidth(last + " " + word, size, 600) <= width) lines[lines.length - 1] = last + " " + word;
+        if (last !== undefined && textWidth(last + " " + word, size, 600) <= width)
+            lines[lines.length - 1] = last + " " + word;
         else lines.push(word);
     }
     return lines;

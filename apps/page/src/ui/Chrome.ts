@@ -1,12 +1,19 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The bar at the top with its two panels, the buttons that float over the picture, the legend, and the dialogs. All
-// of it is made anew when the language changes.
+// The bar at the top with its two panels, the buttons that float over the picture, the legend, and the
+// dialogs. All of it is made anew when the language changes.
 
 import type { Diagnostic } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
-import { kLeastGenerations, kMostGenerations, kRelativeNames, type RelativeName, type ViewName, type ViewState } from "../view/ViewState";
+import {
+    kLeastGenerations,
+    kMostGenerations,
+    kRelativeNames,
+    type RelativeName,
+    type ViewName,
+    type ViewState,
+} from "../view/ViewState";
 import { html, onClick } from "./dom";
 import { icon, type IconName, silhouette } from "./icons";
 import { Popover } from "./Popover";
@@ -70,14 +77,26 @@ export class Chrome {
             pedigree: this.viewButton("pedigree", ui.views.pedigree),
             panel: this.iconButton("panel-button", "panel", ui.panel.toggle, () => actions.togglePanel()),
         };
-        this.fewer = this.iconButton("generations-fewer", "minus", ui.fewer, () => actions.setGenerations(this.shownGenerations - 1));
-        this.more = this.iconButton("generations-more", "plus", ui.more, () => actions.setGenerations(this.shownGenerations + 1));
+        this.fewer = this.iconButton("generations-fewer", "minus", ui.fewer, () =>
+            actions.setGenerations(this.shownGenerations - 1),
+        );
+        this.more = this.iconButton("generations-more", "plus", ui.more, () =>
+            actions.setGenerations(this.shownGenerations + 1),
+        );
         this.keys = this.keyDialog();
         this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
-        this.diagnosticsButton = this.iconButton("diagnostics-button", "warning", "", () => this.diagnostics.showModal());
+        this.diagnosticsButton = this.iconButton("diagnostics-button", "warning", "", () =>
+            this.diagnostics.showModal(),
+        );
         this.diagnosticsButton.hidden = true;
-        this.options = new Popover(this.iconButton("options-button", "options", ui.options, () => {}), this.optionsPanel(looks));
-        this.files = new Popover(this.iconButton("file-button", "file", ui.file, () => {}), this.filePanel());
+        this.options = new Popover(
+            this.iconButton("options-button", "options", ui.options, () => {}),
+            this.optionsPanel(looks),
+        );
+        this.files = new Popover(
+            this.iconButton("file-button", "file", ui.file, () => {}),
+            this.filePanel(),
+        );
         this.bar = this.barElement();
         this.corner = html("div", { class: "corner" }, this.legend(), this.zoomButtons());
     }
@@ -114,7 +133,8 @@ export class Chrome {
         this.diagnosticsButton.setAttribute("aria-label", label);
         this.diagnosticsButton.title = label;
         const items = found.slice(0, kMostDiagnostics).map((one) => this.diagnosticItem(one));
-        if (found.length > kMostDiagnostics) items.push(html("li", {}, ui.diagnostics.furtherOnes(found.length - kMostDiagnostics)));
+        if (found.length > kMostDiagnostics)
+            items.push(html("li", {}, ui.diagnostics.furtherOnes(found.length - kMostDiagnostics)));
         this.diagnostics.replaceChildren(
             this.dialogHead("diagnostics-title", ui.diagnostics.title, this.diagnostics),
             html("p", { class: "quiet" }, ui.diagnostics.summary(persons, found.length)),
@@ -145,7 +165,14 @@ export class Chrome {
             this.search.element,
             group("segments", ui.views.label, buttons.family, buttons.pedigree),
             group("buttons travel", ui.back + ", " + ui.forward, buttons.back, buttons.forward),
-            html("div", { class: "buttons" }, this.diagnosticsButton, this.options.element, this.files.element, buttons.panel),
+            html(
+                "div",
+                { class: "buttons" },
+                this.diagnosticsButton,
+                this.options.element,
+                this.files.element,
+                buttons.panel,
+            ),
         );
     }
 
@@ -167,7 +194,9 @@ export class Chrome {
         for (const name of kRelativeNames) {
             const input = this.checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
             this.switches.set(name, input);
-            relatives.append(html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])));
+            relatives.append(
+                html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])),
+            );
         }
         const kinship = this.checkbox("kinship-in-boxes", (checked) => actions.setKinshipInBoxes(checked));
         kinship.checked = looks.kinshipInBoxes;
@@ -184,10 +213,18 @@ export class Chrome {
             { id: "options-panel", class: "sheet", role: "region", "aria-label": ui.options },
             relatives,
             generations,
-            html("fieldset", {}, html("legend", {}, ui.look),
+            html(
+                "fieldset",
+                {},
+                html("legend", {}, ui.look),
                 html("label", { class: "switch" }, kinship, html("span", {}, ui.kinshipInBoxes)),
-                this.choice("theme", ui.theme, themes, looks.theme, (theme) => actions.setTheme(theme as ThemeChoice)),
-                this.choice("language", ui.languageLabel, languages, ui.language, (language) => actions.setLanguage(language))),
+                this.choice("theme", ui.theme, themes, looks.theme, (theme) =>
+                    actions.setTheme(theme as ThemeChoice),
+                ),
+                this.choice("language", ui.languageLabel, languages, ui.language, (language) =>
+                    actions.setLanguage(language),
+                ),
+            ),
         );
     }
 
@@ -217,7 +254,8 @@ export class Chrome {
         const { ui } = this;
         const dialog = html("dialog", { id: "keys", "aria-labelledby": "keys-title" });
         const list = html("dl", { class: "keys" });
-        for (const [key, meaning] of ui.keyList) list.append(html("div", {}, html("dt", {}, html("kbd", {}, key)), html("dd", {}, meaning)));
+        for (const [key, meaning] of ui.keyList)
+            list.append(html("div", {}, html("dt", {}, html("kbd", {}, key)), html("dd", {}, meaning)));
         dialog.append(this.dialogHead("keys-title", ui.keys, dialog), list);
         return dialog;
     }
@@ -231,7 +269,8 @@ export class Chrome {
         const { ui } = this;
         const items = ui.legendItems;
         const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
-        const sign = (className: string, content: Element | string = "") => html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
+        const sign = (className: string, content: Element | string = "") =>
+            html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
         const list = html(
             "ul",
             {},
@@ -249,13 +288,22 @@ export class Chrome {
     }
 
     private iconButton(id: string, name: IconName, label: string, action: () => void): HTMLButtonElement {
-        const button = html("button", { id, type: "button", class: "icon-button", "aria-label": label, title: label }, icon(name));
+        const button = html(
+            "button",
+            { id, type: "button", class: "icon-button", "aria-label": label, title: label },
+            icon(name),
+        );
         onClick(button, action);
         return button;
     }
 
     private viewButton(view: ViewName, label: string): HTMLButtonElement {
-        const button = html("button", { id: "view-" + view, type: "button", "aria-pressed": "false", "aria-label": label }, icon(view), html("span", {}, label));
+        const button = html(
+            "button",
+            { id: "view-" + view, type: "button", "aria-pressed": "false", "aria-label": label },
+            icon(view),
+            html("span", {}, label),
+        );
         onClick(button, () => this.actions.setView(view));
         return button;
     }
@@ -274,7 +322,8 @@ export class Chrome {
         action: (value: string) => void,
     ): HTMLElement {
         const select = html("select", { id });
-        for (const [value, text] of choices) select.append(html("option", { value, selected: value === chosen }, text));
+        for (const [value, text] of choices)
+            select.append(html("option", { value, selected: value === chosen }, text));
         select.addEventListener("change", () => action(select.value));
         return html("label", { class: "row" }, html("span", {}, label), select);
     }

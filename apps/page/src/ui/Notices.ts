@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Short messages at the lower edge. What went well goes away by itself; what went wrong stays until dismissed.
+// Short messages at the lower edge. What went well goes away by itself; what went wrong stays until
+// dismissed.
 
 import { html, onClick } from "./dom";
 import { icon } from "./icons";
@@ -35,9 +36,20 @@ export class Notices {
     }
 
     private add(className: string, role: string, text: string, details: readonly string[]): HTMLElement {
-        const lines = details.filter((detail) => detail !== "").map((detail) => html("span", { dir: "auto" }, detail));
-        const dismiss = html("button", { type: "button", class: "icon-button", "aria-label": this.dismissLabel }, icon("close"));
-        const notice = html("div", { class: "notice " + className, role }, html("p", {}, html("strong", {}, text), ...lines), dismiss);
+        const lines = details
+            .filter((detail) => detail !== "")
+            .map((detail) => html("span", { dir: "auto" }, detail));
+        const dismiss = html(
+            "button",
+            { type: "button", class: "icon-button", "aria-label": this.dismissLabel },
+            icon("close"),
+        );
+        const notice = html(
+            "div",
+            { class: "notice " + className, role },
+            html("p", {}, html("strong", {}, text), ...lines),
+            dismiss,
+        );
         onClick(dismiss, () => notice.remove());
         this.element.replaceChildren(notice);
         return notice;

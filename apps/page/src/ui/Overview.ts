@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The whole picture in small, with a frame around what the window shows: where one is, and a way to the rest. Shown
-// only while there is a rest. The keys have other ways, so it is for the mouse alone.
+// The whole picture in small, with a frame around what the window shows: where one is, and a way to the rest.
+// Shown only while there is a rest. The keys have other ways, so it is for the mouse alone.
 
 import type { Camera } from "../scene/Camera";
 import { crowdPaths, type Dress } from "../scene/Scene";
@@ -33,7 +33,8 @@ export class Overview {
             this.go(event, 260);
         });
         this.drawing.addEventListener("pointermove", (event) => held && this.go(event, 0));
-        for (const end of ["pointerup", "pointercancel"]) this.drawing.addEventListener(end, () => (held = false));
+        for (const end of ["pointerup", "pointercancel"])
+            this.drawing.addEventListener(end, () => (held = false));
     }
 
     show(picture: Picture, dress: Dress): void {
@@ -50,7 +51,12 @@ export class Overview {
             width: Math.round((right - left) * this.scale),
             height: Math.round(height),
         });
-        const dot = svg("circle", { class: "focus-dot", cx: (focus.left + focus.right) / 2, cy: (focus.top + focus.bottom) / 2, r: mark });
+        const dot = svg("circle", {
+            class: "focus-dot",
+            cx: (focus.left + focus.right) / 2,
+            cy: (focus.top + focus.bottom) / 2,
+            r: mark,
+        });
         this.drawing.replaceChildren(...crowdPaths(picture, dress), dot, this.frame);
         this.follow();
     }

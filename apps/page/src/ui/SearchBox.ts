@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Finds persons by name and year while one types. The keys stay in the field; the list below is walked with arrows.
+// Finds persons by name and year while one types. The keys stay in the field; the list below is walked with
+// arrows.
 
 import type { Person } from "olvane";
 import type { UiMessages } from "../messages/ui";
@@ -44,9 +45,21 @@ export class SearchBox {
             spellcheck: "false",
             enterkeyhint: "search",
         });
-        this.list = html("ul", { id: "search-list", role: "listbox", "aria-label": messages.search.label, hidden: true });
+        this.list = html("ul", {
+            id: "search-list",
+            role: "listbox",
+            "aria-label": messages.search.label,
+            hidden: true,
+        });
         this.status = html("div", { class: "unseen", role: "status" });
-        this.element = html("div", { class: "search", role: "search" }, icon("search"), this.input, this.list, this.status);
+        this.element = html(
+            "div",
+            { class: "search", role: "search" },
+            icon("search"),
+            this.input,
+            this.list,
+            this.status,
+        );
         this.listen();
     }
 
@@ -91,7 +104,8 @@ export class SearchBox {
             option.setAttribute("aria-selected", String(isCurrent));
             if (isCurrent) option.scrollIntoView({ block: "nearest" });
         });
-        if (index >= 0 && this.found.length > 0) this.input.setAttribute("aria-activedescendant", "found-" + index);
+        if (index >= 0 && this.found.length > 0)
+            this.input.setAttribute("aria-activedescendant", "found-" + index);
         else this.input.removeAttribute("aria-activedescendant");
     }
 
@@ -101,7 +115,10 @@ export class SearchBox {
         this.found = this.source.find(text, kMostFound);
         const { search } = this.messages;
         this.list.replaceChildren(...this.found.map((person, i) => this.option(person, i)));
-        if (this.found.length === 0) this.list.append(html("li", { class: "none", role: "option", "aria-disabled": "true" }, search.none));
+        if (this.found.length === 0)
+            this.list.append(
+                html("li", { class: "none", role: "option", "aria-disabled": "true" }, search.none),
+            );
         this.list.hidden = false;
         this.input.setAttribute("aria-expanded", "true");
         this.status.textContent = this.found.length > 0 ? search.count(this.found.length) : search.none;
@@ -114,7 +131,12 @@ export class SearchBox {
             "li",
             { id: "found-" + index, role: "option", "data-person-id": person.id },
             silhouette(person.sex),
-            html("span", { class: "who" }, isolated(source.nameOf(person)), html("span", { class: "kin" }, source.kinshipOf(person))),
+            html(
+                "span",
+                { class: "who" },
+                isolated(source.nameOf(person)),
+                html("span", { class: "kin" }, source.kinshipOf(person)),
+            ),
             html("span", { class: "years" }, source.yearsOf(person)),
         );
         onClick(option, () => this.choose(person));

@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What the file tells of one person: who that is to the focus, facts with dates and places, and the relatives, each a
-// link. On a narrow window it is a sheet at the lower edge that shows the name until it is drawn up.
+// What the file tells of one person: who that is to the focus, facts with dates and places, and the
+// relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
+// drawn up.
 
 import type { Fact, Family, Person } from "olvane";
 import { factLabel, type Messages } from "../messages";
@@ -13,7 +14,23 @@ import { html, isolated, onClick } from "./dom";
 import { icon, silhouette } from "./icons";
 
 // Told by the panel in other ways, or of no use to a reader.
-const kUntold = new Set(["NAME", "SEX", "FAMC", "FAMS", "HUSB", "WIFE", "CHIL", "CHAN", "CREA", "RIN", "UID", "_UID", "OBJE", "SUBM", "EXID"]);
+const kUntold = new Set([
+    "NAME",
+    "SEX",
+    "FAMC",
+    "FAMS",
+    "HUSB",
+    "WIFE",
+    "CHIL",
+    "CHAN",
+    "CREA",
+    "RIN",
+    "UID",
+    "_UID",
+    "OBJE",
+    "SUBM",
+    "EXID",
+]);
 
 const kMostListed = 24; // relatives of a kind, until all are asked for
 
@@ -34,7 +51,8 @@ export class SidePanel {
     readonly element: HTMLElement;
     private readonly body = html("div", { class: "panel-body" });
     private readonly handle: HTMLButtonElement;
-    // Known without asking: a question, or a scroll that changes nothing, has the browser lay out the whole page.
+    // Known without asking: a question, or a scroll that changes nothing, has the browser lay out the whole
+    // page.
     private isScrolled = false;
 
     constructor(
@@ -42,9 +60,19 @@ export class SidePanel {
         private readonly ui: UiMessages,
         private readonly events: PanelEvents,
     ) {
-        this.handle = html("button", { class: "handle", type: "button", "aria-label": ui.panel.toggle, "aria-expanded": "false" }, icon("up"));
-        this.element = html("aside", { id: "side-panel", "aria-label": ui.panel.label, tabindex: -1 }, this.handle, this.body);
-        for (const part of [this.element, this.body]) part.addEventListener("scroll", () => (this.isScrolled = true));
+        this.handle = html(
+            "button",
+            { class: "handle", type: "button", "aria-label": ui.panel.toggle, "aria-expanded": "false" },
+            icon("up"),
+        );
+        this.element = html(
+            "aside",
+            { id: "side-panel", "aria-label": ui.panel.label, tabindex: -1 },
+            this.handle,
+            this.body,
+        );
+        for (const part of [this.element, this.body])
+            part.addEventListener("scroll", () => (this.isScrolled = true));
         onClick(this.handle, () => this.draw(!this.element.classList.contains("drawn")));
     }
 
@@ -60,7 +88,9 @@ export class SidePanel {
             this.facts(person, family),
             this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
             this.couples(person, family),
-            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) => this.link(family.person(id))),
+            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) =>
+                this.link(family.person(id)),
+            ),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));
         if (this.isScrolled) [this.element, this.body].forEach((part) => part.scrollTo(0, 0));
@@ -81,7 +111,8 @@ export class SidePanel {
             html("p", { class: "years" }, yearsOf(person, this.messages)),
             html("p", { class: "kinship" }, isFocus ? this.ui.inFocus : relation),
         );
-        if (!isFocus) header.append(this.button("make-focus", this.ui.makeFocus, () => this.events.choose(person.id)));
+        if (!isFocus)
+            header.append(this.button("make-focus", this.ui.makeFocus, () => this.events.choose(person.id)));
         if (boxes > 1) {
             header.append(
                 html("p", { class: "places" }, this.ui.severalBoxes(boxes) + " "),
@@ -100,8 +131,14 @@ export class SidePanel {
     private facts(person: Person, family: OpenFamily): HTMLElement {
         const list = html("dl", {});
         const others = person.names.slice(1).filter((name) => name !== person.name);
-        if (others.length > 0) this.appendFact(list, this.ui.panel.otherNames, others.map((name) => isolated(name)));
-        for (const fact of family.file.factsOfPerson(person.id)) if (!kUntold.has(fact.tag)) this.appendFactOf(list, fact);
+        if (others.length > 0)
+            this.appendFact(
+                list,
+                this.ui.panel.otherNames,
+                others.map((name) => isolated(name)),
+            );
+        for (const fact of family.file.factsOfPerson(person.id))
+            if (!kUntold.has(fact.tag)) this.appendFactOf(list, fact);
         return html(
             "section",
             { class: "facts" },
@@ -121,7 +158,14 @@ export class SidePanel {
     }
 
     private appendFact(list: HTMLElement, label: string, parts: readonly HTMLElement[]): void {
-        list.append(html("div", {}, html("dt", {}, label), html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"]))));
+        list.append(
+            html(
+                "div",
+                {},
+                html("dt", {}, label),
+                html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"])),
+            ),
+        );
     }
 
     private parents(person: Person, family: OpenFamily): HTMLElement[] {
@@ -152,7 +196,9 @@ export class SidePanel {
     }
 
     private couples(person: Person, family: OpenFamily): HTMLElement | null {
-        const couples = person.coupleFamilies.map((id) => family.families[id - 1]).filter((couple) => couple !== undefined);
+        const couples = person.coupleFamilies
+            .map((id) => family.families[id - 1])
+            .filter((couple) => couple !== undefined);
         if (couples.length === 0) return null;
         const section = html("section", { class: "couples" }, html("h3", {}, this.ui.panel.partners));
         for (const couple of couples) section.append(this.couple(person, couple, family));
@@ -162,26 +208,36 @@ export class SidePanel {
     private couple(person: Person, couple: Family, family: OpenFamily): HTMLElement {
         const partner = couple.husband === person.id ? couple.wife : couple.husband;
         const facts = html("dl", {});
-        for (const fact of family.file.factsOfFamily(couple.id)) if (!kUntold.has(fact.tag)) this.appendFactOf(facts, fact);
+        for (const fact of family.file.factsOfFamily(couple.id))
+            if (!kUntold.has(fact.tag)) this.appendFactOf(facts, fact);
         const children = this.list(couple.children, (id) => this.link(family.person(id)));
         children.className = "children";
         children.setAttribute("aria-label", this.ui.panel.children);
         return html(
             "div",
             { class: "couple" },
-            partner ? this.link(family.person(partner)) : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
+            partner
+                ? this.link(family.person(partner))
+                : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
             facts.childElementCount > 0 && facts,
             couple.children.length > 0 && children,
         );
     }
 
-    private people<Thing>(title: string, things: readonly Thing[], linkOf: (thing: Thing) => HTMLElement): HTMLElement | null {
-        return things.length > 0 ? html("section", {}, html("h3", {}, title), this.list(things, linkOf)) : null;
+    private people<Thing>(
+        title: string,
+        things: readonly Thing[],
+        linkOf: (thing: Thing) => HTMLElement,
+    ): HTMLElement | null {
+        return things.length > 0
+            ? html("section", {}, html("h3", {}, title), this.list(things, linkOf))
+            : null;
     }
 
     private list<Thing>(things: readonly Thing[], linkOf: (thing: Thing) => HTMLElement): HTMLElement {
         const list = html("ul", {});
-        const add = (some: readonly Thing[]) => list.append(...some.map((thing) => html("li", {}, linkOf(thing))));
+        const add = (some: readonly Thing[]) =>
+            list.append(...some.map((thing) => html("li", {}, linkOf(thing))));
         const isLong = things.length > kMostListed + 1;
         add(isLong ? things.slice(0, kMostListed) : things);
         if (!isLong) return list;
@@ -203,7 +259,11 @@ export class SidePanel {
             { class: "relative", href: this.events.addressOf(person.id), "data-person-id": person.id },
             silhouette(person.sex),
             html("bdi", { class: "name" }, nameOf(person, this.messages)),
-            html("span", { class: "years" }, [yearsOf(person, this.messages), note].filter(Boolean).join(", ")),
+            html(
+                "span",
+                { class: "years" },
+                [yearsOf(person, this.messages), note].filter(Boolean).join(", "),
+            ),
         );
         onClick(link, (event) => {
             if (event.ctrlKey || event.metaKey || event.shiftKey) return;

@@ -6,7 +6,13 @@
 import { html } from "./dom";
 
 export function fileInput(take: (file: File) => void): HTMLInputElement {
-    const input = html("input", { id: "file-input", type: "file", accept: ".ged,.gdz,.gedcom,.zip", "aria-hidden": "true", tabindex: -1 });
+    const input = html("input", {
+        id: "file-input",
+        type: "file",
+        accept: ".ged,.gdz,.gedcom,.zip",
+        "aria-hidden": "true",
+        tabindex: -1,
+    });
     input.addEventListener("change", () => {
         const file = input.files?.[0];
         // The same file may be chosen again after it was repaired.

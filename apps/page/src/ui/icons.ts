@@ -30,13 +30,23 @@ const kPaths = {
 export type IconName = keyof typeof kPaths;
 
 export function icon(name: IconName): SVGSVGElement {
-    const picture = svg("svg", { class: "icon", viewBox: "0 0 24 24", "aria-hidden": "true", focusable: "false" });
+    const picture = svg("svg", {
+        class: "icon",
+        viewBox: "0 0 24 24",
+        "aria-hidden": "true",
+        focusable: "false",
+    });
     picture.append(svg("path", { d: kPaths[name] }));
     return picture;
 }
 
 export function silhouette(sex: Sex): SVGSVGElement {
-    const picture = svg("svg", { class: "silhouette " + sex, viewBox: "0 0 44 42", "aria-hidden": "true", focusable: "false" });
+    const picture = svg("svg", {
+        class: "silhouette " + sex,
+        viewBox: "0 0 44 42",
+        "aria-hidden": "true",
+        focusable: "false",
+    });
     picture.append(svg("path", { d: kSilhouettes[sex] }));
     return picture;
 }

@@ -17,7 +17,8 @@ export class Theme {
     constructor() {
         const known = recall("theme");
         this.choice = kThemeChoices.find((choice) => choice === known) ?? "auto";
-        for (const query of [kDark, kContrast]) matchMedia(query).addEventListener("change", () => this.wear());
+        for (const query of [kDark, kContrast])
+            matchMedia(query).addEventListener("change", () => this.wear());
         this.wear();
     }
 

@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The way through the family so far, kept in the browser's own history: its buttons, and ours, go back and forward.
+// The way through the family so far, kept in the browser's own history: its buttons, and ours, go back and
+// forward.
 
 interface Step {
     readonly olvane: number;
@@ -24,7 +25,8 @@ export class Journey {
         return this.step < this.last;
     }
 
-    // The address that the way begins at; nothing lies before it but what was there before the page was loaded again.
+    // The address that the way begins at; nothing lies before it but what was there before the page was
+    // loaded again.
     begin(address: string): void {
         this.step = this.last = stepOf(history.state) ?? 0;
         this.write("replaceState", address);

@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// One layout, made ready for drawing: boxes and line pieces with a grid over each, and what a walk from box to box
-// must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an upper-left corner.
+// One layout, made ready for drawing: boxes and line pieces with a grid over each, and what a walk from box
+// to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
+// upper-left corner.
 
 import type { LayoutRecord, Segment, Sizes } from "olvane";
 import { type Rectangle, SpatialGrid } from "./SpatialGrid";
@@ -22,7 +23,8 @@ export interface Box {
     readonly hasHiddenRelatives: boolean;
 }
 
-// Boxes wide enough for most names, and rows far enough apart for the lines between them to be told from another.
+// Boxes wide enough for most names, and rows far enough apart for the lines between them to be told from
+// another.
 export const kFamilySizes: Sizes = {
     nodeWidth: 118,
     nodeHeight: 104,
@@ -68,12 +70,20 @@ export class Picture {
         this.segments = distinctSegments(records);
         this.boxGrid = new SpatialGrid(this.boxes.map((box) => this.areaOf(box)));
         this.lineGrid = new SpatialGrid(this.segments.map(areaOfSegment));
-        this.bounds = boundsOf([...this.boxes.map((box) => this.areaOf(box)), ...this.segments.map(areaOfSegment)]);
+        this.bounds = boundsOf([
+            ...this.boxes.map((box) => this.areaOf(box)),
+            ...this.segments.map(areaOfSegment),
+        ]);
         this.focusBox = this.byPerson.get(focus)?.[0] ?? this.boxes[0]!;
     }
 
     areaOf(box: Box): Rectangle {
-        return { left: box.x, top: box.y, right: box.x + this.sizes.nodeWidth, bottom: box.y + this.sizes.nodeHeight };
+        return {
+            left: box.x,
+            top: box.y,
+            right: box.x + this.sizes.nodeWidth,
+            bottom: box.y + this.sizes.nodeHeight,
+        };
     }
 
     boxesWithin(window: Rectangle): Box[] {
@@ -127,7 +137,12 @@ function distinctSegments(records: readonly LayoutRecord[]): Segment[] {
 }
 
 function areaOfSegment({ x1, y1, x2, y2 }: Segment): Rectangle {
-    return { left: Math.min(x1, x2), top: Math.min(y1, y2), right: Math.max(x1, x2), bottom: Math.max(y1, y2) };
+    return {
+        left: Math.min(x1, x2),
+        top: Math.min(y1, y2),
+        right: Math.max(x1, x2),
+        bottom: Math.max(y1, y2),
+    };
 }
 
 function boundsOf(areas: readonly Rectangle[]): Rectangle {

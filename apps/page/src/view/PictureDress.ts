@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What stands in each box and what is read out for it. Kinship is told only once it is known, since a search through
-// a large family must not hold up the picture.
+// What stands in each box and what is read out for it. Kinship is told only once it is known, since a search
+// through a large family must not hold up the picture.
 
 import type { Person, Segment, Sex } from "olvane";
 import { kinshipText, nearKinshipText } from "../kinship";
@@ -45,12 +45,15 @@ export class PictureDress implements Dress {
     kinshipOf(id: number): string {
         if (id === this.picture.focus) return "";
         const kinship = this.family.kinshipsTo(this.picture.focus).get(id);
-        return kinship ? kinshipText(kinship, this.family.person(id)?.sex ?? "other", this.wording.messages) : "";
+        return kinship
+            ? kinshipText(kinship, this.family.person(id)?.sex ?? "other", this.wording.messages)
+            : "";
     }
 
     // As kinshipOf, without the words that say by which side.
     shortKinshipOf(id: number): string {
-        const kinship = id === this.picture.focus ? undefined : this.family.kinshipsTo(this.picture.focus).get(id);
+        const kinship =
+            id === this.picture.focus ? undefined : this.family.kinshipsTo(this.picture.focus).get(id);
         if (!kinship) return "";
         const sex = this.family.person(id)?.sex ?? "other";
         return nearKinshipText(kinship, sex, this.wording.messages);
@@ -85,7 +88,11 @@ export class PictureDress implements Dress {
             nameParts: nameParts(person, messages),
             rightToLeft: directionOf(person.name) === "rtl",
             years: shortYears(person),
-            kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
+            kinship: this.wording.kinshipInBoxes
+                ? this.kinshipKnown
+                    ? this.shortKinshipOf(person.id)
+                    : ""
+                : null,
             hidden,
             repeated: boxes > 1,
             isFocus,
@@ -117,7 +124,8 @@ export class PictureDress implements Dress {
 export function shortYears(person: Person): string {
     const birth = person.birth?.year ? person.birth.shown : "";
     const death = person.death?.year ? person.death.shown : "";
-    if (birth && death) return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
+    if (birth && death)
+        return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
     if (death) return "\u2020 " + death;
     return [birth && "* " + birth, person.dead && "\u2020"].filter(Boolean).join("  ");
 }

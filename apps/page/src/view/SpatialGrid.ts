@@ -25,7 +25,8 @@ export class SpatialGrid {
     // Indices in rising order, each one once.
     within(window: Rectangle): number[] {
         const touching = (index: number) => touches(this.things[index]!, window);
-        if (squareCount(window) > kMostSquares) return this.things.flatMap((thing, i) => (touches(thing, window) ? [i] : []));
+        if (squareCount(window) > kMostSquares)
+            return this.things.flatMap((thing, i) => (touches(thing, window) ? [i] : []));
         const found = new Set<number>(this.large.filter(touching));
         forEachSquare(window, (key) => {
             for (const index of this.squares.get(key) ?? []) if (touching(index)) found.add(index);
@@ -51,7 +52,12 @@ export function touches(a: Rectangle, b: Rectangle): boolean {
 }
 
 export function encloses(outer: Rectangle, inner: Rectangle): boolean {
-    return outer.left <= inner.left && outer.top <= inner.top && outer.right >= inner.right && outer.bottom >= inner.bottom;
+    return (
+        outer.left <= inner.left &&
+        outer.top <= inner.top &&
+        outer.right >= inner.right &&
+        outer.bottom >= inner.bottom
+    );
 }
 
 export function grown(r: Rectangle, dx: number, dy: number): Rectangle {

@@ -36,7 +36,10 @@ export const kMostGenerations = 10;
 export const kUsualGenerations = 5;
 
 export function shownBits(state: ViewState): number {
-    return kRelativeNames.reduce((bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]), 0);
+    return kRelativeNames.reduce(
+        (bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]),
+        0,
+    );
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
@@ -64,9 +67,12 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
 // Whatever an address does not tell, or tells wrongly, is as in the state that it is read into.
 export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {
     const parts = new URLSearchParams(address.replace(/^#/, ""));
-    if (![...parts.keys()].some((key) => ["person", "number", "view", "generations", "hide"].includes(key))) return usual;
+    if (![...parts.keys()].some((key) => ["person", "number", "view", "generations", "hide"].includes(key)))
+        return usual;
     const view = parts.get("view");
-    const hidden = (parts.get("hide") ?? "").split(",").filter((name): name is RelativeName => name in kRelatives);
+    const hidden = (parts.get("hide") ?? "")
+        .split(",")
+        .filter((name): name is RelativeName => name in kRelatives);
     return {
         focus: focusIn(parts, persons) || usual.focus,
         view: view === "pedigree" ? "pedigree" : "family",

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Where an arrow key leads: to the nearest relative of the right kind whose box lies that way, and where there is
-// none, to the box that lies most nearly that way.
+// Where an arrow key leads: to the nearest relative of the right kind whose box lies that way, and where
+// there is none, to the box that lies most nearly that way.
 
 import type { OpenFamily } from "./OpenFamily";
 import type { Box, Picture } from "./Picture";
@@ -11,11 +11,18 @@ export type Direction = "up" | "down" | "left" | "right";
 
 const kStraying = 2.2; // how much worse a step aside is than one ahead
 
-export function boxTowards(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box | null {
+export function boxTowards(
+    from: Box,
+    direction: Direction,
+    picture: Picture,
+    family: OpenFamily,
+): Box | null {
     const ahead = (box: Box) => box !== from && distanceAhead(from, box, direction) > 0;
     const kin = kinBoxes(from, direction, picture, family).filter(ahead);
     const others = picture.boxes.filter(ahead);
-    return nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture));
+    return (
+        nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture))
+    );
 }
 
 // Parents are above in the family view, and at the right in the pedigree, which lies on its side.
@@ -24,17 +31,27 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
     if (from.child && direction === toChildren) return [...picture.boxesOf(from.child)];
     const person = family.person(from.person);
     if (!person) return [];
-    const kin = direction === toParents ? [person.father, person.mother] : direction === toChildren ? person.children : [];
+    const kin =
+        direction === toParents
+            ? [person.father, person.mother]
+            : direction === toChildren
+              ? person.children
+              : [];
     const missing =
-        direction === toParents ? picture.boxes.filter((box) => box.child === person.id && person.id > 0) : [];
+        direction === toParents
+            ? picture.boxes.filter((box) => box.child === person.id && person.id > 0)
+            : [];
     return [...kin.flatMap((id) => picture.boxesOf(id)), ...missing];
 }
 
-// Along a generation only the generation itself counts; from one to another also what lies not quite straight ahead.
+// Along a generation only the generation itself counts; from one to another also what lies not quite straight
+// ahead.
 function inLine(from: Box, direction: Direction, boxes: readonly Box[], picture: Picture): Box[] {
     const alongGeneration = (direction === "left" || direction === "right") === (picture.view === "family");
     const slope = alongGeneration ? 0.2 : 1.8;
-    return boxes.filter((box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope);
+    return boxes.filter(
+        (box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope,
+    );
 }
 
 function nearest(from: Box, direction: Direction, boxes: readonly Box[]): Box | null {

@@ -1,9 +1,10 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Which lines of a family view tell more than that two boxes belong together: a marriage that ended, and a child who
-// came to its parents otherwise than by birth. A piece is known by what it touches: a marriage runs from the right
-// edge of one box to the left edge of another, and a child's own piece ends in the middle of its upper edge.
+// Which lines of a family view tell more than that two boxes belong together: a marriage that ended, and a
+// child who came to its parents otherwise than by birth. A piece is known by what it touches: a marriage runs
+// from the right edge of one box to the left edge of another, and a child's own piece ends in the middle of
+// its upper edge.
 
 import type { Person, Segment } from "olvane";
 import type { OpenFamily } from "./OpenFamily";
@@ -18,7 +19,8 @@ export function lineStylesOf(picture: Picture, family: OpenFamily): ReadonlyMap<
     if (picture.view !== "family") return styles;
     for (const segment of picture.segments) {
         if (isMarriage(segment) && isDivorce(segment, picture, family)) styles.set(segment, "divorced");
-        else if (segment.x1 === segment.x2 && isAdoption(segment, picture, family)) styles.set(segment, "adopted");
+        else if (segment.x1 === segment.x2 && isAdoption(segment, picture, family))
+            styles.set(segment, "adopted");
     }
     return styles;
 }
