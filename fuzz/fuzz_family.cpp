@@ -173,7 +173,8 @@ void followGenerationEdges(const ViewerGlue& glue, TreeViewPerson& person) {
 void chainSegments(const TreeViewPerson& person) {
     constexpr std::size_t kMostChained = 40;
     if (person.lineSegments.size() > kMostChained) return;
-    for (TreeLine& line : TreeLine::TreeLinesFromLineSegments(person.lineSegments)) {
+    const std::vector<TreeLineSegment> segments(person.lineSegments.begin(), person.lineSegments.end());
+    for (TreeLine& line : TreeLine::TreeLinesFromLineSegments(segments)) {
         HOLDS(line.points().size() >= 2);
         line.length();
     }
