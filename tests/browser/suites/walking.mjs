@@ -240,6 +240,22 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("the picture in small leads to its far ends, and is gone while everything is in sight", async () => {
+        const visit = await visitDarwins();
+        const { page } = visit;
+        await visit.dismiss();
+        const before = await visit.placing();
+        const { x, y, width, height } = await page.locator(".overview svg").boundingBox();
+        await page.mouse.click(x + width - 4, y + height / 2);
+        await visit.still();
+        const after = await visit.placing();
+        assert.ok(after.x < before.x - 500, "the right end has come into sight");
+        assert.equal(after.k, before.k);
+        await visit.fit();
+        assert.ok(!(await page.isVisible(".overview")));
+        await visit.end();
+    });
+
     test("two fingers pinch", async () => {
         const visit = await visitDarwins("#person=I1", { hasTouch: true });
         const session = await visit.context.newCDPSession(visit.page);
