@@ -11,9 +11,8 @@ import type { EmbeddedFamily } from "./engine/engine";
 import { type Messages, messagesFor } from "./messages";
 import { type UiMessages, uiMessagesFor } from "./messages/ui";
 import { nameOf, yearsOf } from "./names";
-import { wholePicture, type WholePicture } from "./output/pictureSvg";
-import { PrintSheet } from "./output/printing";
-import { fileNameOf, pngOf, saveFile, svgBlob } from "./output/saving";
+import { PictureOutput, type Subject } from "./output/PictureOutput";
+import { fileNameOf } from "./output/saving";
 import { Scene } from "./scene/Scene";
 import { Chrome, type ChromeActions } from "./ui/Chrome";
 import { html, recall, remember, svg } from "./ui/dom";
@@ -45,8 +44,6 @@ import {
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
-class EmptyFamilyError extends Error {}
-
 export class App implements ChromeActions {
     private messages: Messages;
     private ui: UiMessages;
@@ -76,7 +73,7 @@ export class App implements ChromeActions {
     private readonly scene: Scene;
     private readonly overview: Overview;
     private readonly journey = new Journey((address) => this.arriveAt(address));
-    private readonly sheet = new PrintSheet(() => this.whole("print"));
+    private readonly output = new PictureOutput(() => this.subject(), this.notices);
 
     constructor(
         private readonly root: HTMLElement,
@@ -133,10 +130,6 @@ export class App implements ChromeActions {
         if (file.persons.length === 0) {
             file.close();
             throw new Error(this.ui.errors.noPersons);
-        }
-        if (file.persons.length === 0) {
-            file.close();
-            throw new EmptyFamilyError(this.ui.errors.noPersons);
         }
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
@@ -324,26 +317,11 @@ export class App implements ChromeActions {
     }
 
     saveSvg(): void {
-        const whole = this.whole(document.documentElement.dataset["theme"] ?? "light");
-        if (!whole) return;
-        const name = this.pictureName() + ".svg";
-        saveFile(name, svgBlob(whole));
-        this.notices.tell(this.ui.saved(name));
+        this.output.saveSvg(this.ui);
     }
 
     savePng(): void {
-        const whole = this.whole(document.documentElement.dataset["theme"] ?? "light");
-        if (!whole) return;
-        const name = this.pictureName() + ".png";
-        pngOf(whole).then(
-            ({ blob, part }) => {
-                saveFile(name, blob);
-                this.notices.tell(
-                    part < 1 ? this.ui.savedSmaller(name, Math.round(part * 100)) : this.ui.saved(name),
-                );
-            },
-            () => this.notices.fail(this.ui.pictureFailed, []),
-        );
+        void this.output.savePng(this.ui);
     }
 
     print(): void {
@@ -452,7 +430,7 @@ export class App implements ChromeActions {
 
     private arrange(): void {
         const { family, chrome, panel, stage } = this;
-        const always = [this.live, this.notices.element, this.cover, this.input, this.sheet.element];
+        const always = [this.live, this.notices.element, this.cover, this.input, this.output.sheet.element];
         this.root.classList.toggle("empty", !family);
         if (!family) {
             this.root.replaceChildren(this.welcome.element, ...always);
@@ -539,15 +517,16 @@ export class App implements ChromeActions {
         return focus ? this.ui.treeLabel(this.nameOf(focus), this.ui.views[this.state!.view]) : "";
     }
 
-    private pictureName(): string {
-        const focus = this.family?.person(this.state?.focus ?? 0);
-        return fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), focus ? this.nameOf(focus) : "");
-    }
-
-    private whole(theme: string): WholePicture | null {
-        return this.picture && this.dress
-            ? wholePicture(this.picture, this.dress, this.pictureTitle(), theme)
-            : null;
+    private subject(): Subject | null {
+        const { picture, dress, state } = this;
+        const focus = this.family?.person(state?.focus ?? 0);
+        if (!picture || !dress || !focus) return null;
+        return {
+            picture,
+            dress,
+            title: this.pictureTitle(),
+            name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)),
+        };
     }
 
     private languageChooser(): HTMLElement {

@@ -8,7 +8,6 @@ import type { UiMessages } from "./ui";
 export const uiGerman: UiMessages = {
     language: "de",
     languageName: "Deutsch",
-    appTitle: "Olvane",
     welcome: {
         title: "Die ganze Familie auf einen Blick",
         text: "Eine GEDCOM-Datei öffnen und darin spazieren gehen: Eltern, Kinder, Cousinen und Angeheiratete in einem Bild.",
@@ -88,7 +87,6 @@ export const uiGerman: UiMessages = {
     },
     treeLabel: (name, view) => `${view}: ${name}`,
     treeHint: "Pfeiltasten gehen von Verwandten zu Verwandten. Enter stellt eine Person in die Mitte.",
-    living: "Lebend",
     missingFather: "Vater unbekannt",
     missingMother: "Mutter unbekannt",
     missingOf: (what, child) => `${what} (zu ${child})`,
@@ -117,8 +115,6 @@ export const uiGerman: UiMessages = {
         allOf: (n) => `Alle ${n} zeigen`,
         noFacts: "Mehr steht nicht in der Datei.",
         unknownPartner: "Partner unbekannt",
-        married: "verheiratet",
-        divorced: "geschieden",
     },
     pedigrees: { adopted: "adoptiert", foster: "Pflegekind", sealing: "gesiegelt" },
     diagnostics: {

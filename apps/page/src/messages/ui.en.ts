@@ -8,7 +8,6 @@ import type { UiMessages } from "./ui";
 export const uiEnglish: UiMessages = {
     language: "en",
     languageName: "English",
-    appTitle: "Olvane",
     welcome: {
         title: "See your family around you",
         text: "Open a GEDCOM file and walk through it: parents, children, cousins and in-laws in one picture.",
@@ -88,7 +87,6 @@ export const uiEnglish: UiMessages = {
     },
     treeLabel: (name, view) => `${view} of ${name}`,
     treeHint: "Arrow keys move between relatives. Enter makes a person the focus.",
-    living: "Living",
     missingFather: "Unknown father",
     missingMother: "Unknown mother",
     missingOf: (what, child) => `${what} of ${child}`,
@@ -117,8 +115,6 @@ export const uiEnglish: UiMessages = {
         allOf: (n) => `Show all ${n}`,
         noFacts: "The file tells nothing more.",
         unknownPartner: "Unknown partner",
-        married: "married",
-        divorced: "divorced",
     },
     pedigrees: { adopted: "adopted", foster: "foster child", sealing: "sealed" },
     diagnostics: {

@@ -10,7 +10,6 @@ import { uiEnglish } from "./ui.en";
 export interface UiMessages {
     readonly language: string;
     readonly languageName: string;
-    readonly appTitle: string;
     readonly welcome: {
         readonly title: string;
         readonly text: string;
@@ -70,7 +69,6 @@ export interface UiMessages {
     };
     readonly treeLabel: (name: string, view: string) => string;
     readonly treeHint: string;
-    readonly living: string;
     readonly missingFather: string;
     readonly missingMother: string;
     readonly missingOf: (what: string, child: string) => string;
@@ -94,8 +92,6 @@ export interface UiMessages {
         readonly allOf: (n: number) => string;
         readonly noFacts: string;
         readonly unknownPartner: string;
-        readonly married: string;
-        readonly divorced: string;
     };
     readonly pedigrees: { readonly adopted: string; readonly foster: string; readonly sealing: string };
     readonly diagnostics: {

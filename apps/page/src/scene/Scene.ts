@@ -354,9 +354,14 @@ export class Scene {
             const box = this.boxAt(event.target);
             if (box?.person) events.chosen(box);
         });
+        // A box that is pressed gets the keys, but the picture must hold still until it is known whether that is a
+        // click or the beginning of a drag.
+        let pressed = false;
+        surface.addEventListener("pointerdown", () => (pressed = true), { capture: true });
+        for (const end of ["pointerup", "pointercancel"]) addEventListener(end, () => (pressed = false), true);
         surface.addEventListener("focusin", (event) => {
             const box = this.boxAt(event.target);
-            if (box && box !== this.activeBox) this.activate(box);
+            if (box && box !== this.activeBox && !pressed) this.activate(box);
         });
         surface.addEventListener("pointerover", (event) => {
             if (event.pointerType === "touch") return;
