@@ -18,9 +18,9 @@ namespace {
 constexpr double kMostBytes = 2048;
 
 // A tenth above what a layout of a thousand persons needs.
-constexpr double kMostAllocationsOfDescendants = 3.9;
-constexpr double kMostAllocationsOfKin = 4.4;
-constexpr double kMostAllocationsOfAncestors = 2.9;
+constexpr double kMostAllocationsOfDescendants = 2.6;
+constexpr double kMostAllocationsOfKin = 2.8;
+constexpr double kMostAllocationsOfAncestors = 1.8;
 
 struct MemoryForEachPerson {
     double bytes;
