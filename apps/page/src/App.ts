@@ -154,7 +154,8 @@ export class App implements ChromeActions {
         performance.measure("olvane-open", { start });
         this.greet(family);
         if (file.diagnostics.some((one) => one.severity === "error")) {
-            this.notices.warn(this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length));
+            const summary = this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length);
+            this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.diagnostics.showModal());
         }
     }
 

@@ -118,6 +118,7 @@ export const uiGerman: UiMessages = {
     },
     pedigrees: { adopted: "adoptiert", foster: "Pflegekind", sealing: "gesiegelt" },
     diagnostics: {
+        show: "Zeigen",
         title: "Anmerkungen zur Datei",
         button: (n) => (n === 1 ? "1 Anmerkung zur Datei" : `${n} Anmerkungen zur Datei`),
         summary: (persons, problems) =>

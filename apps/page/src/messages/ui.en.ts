@@ -118,6 +118,7 @@ export const uiEnglish: UiMessages = {
     },
     pedigrees: { adopted: "adopted", foster: "foster child", sealing: "sealed" },
     diagnostics: {
+        show: "Show",
         title: "Remarks on the file",
         button: (n) => (n === 1 ? "1 remark on the file" : `${n} remarks on the file`),
         summary: (persons, problems) =>

@@ -95,6 +95,7 @@ export interface UiMessages {
     };
     readonly pedigrees: { readonly adopted: string; readonly foster: string; readonly sealing: string };
     readonly diagnostics: {
+        readonly show: string;
         readonly title: string;
         readonly button: (n: number) => string;
         readonly summary: (persons: number, problems: number) => string;

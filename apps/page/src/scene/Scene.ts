@@ -358,7 +358,8 @@ export class Scene {
         // click or the beginning of a drag.
         let pressed = false;
         surface.addEventListener("pointerdown", () => (pressed = true), { capture: true });
-        for (const end of ["pointerup", "pointercancel"]) addEventListener(end, () => (pressed = false), true);
+        for (const end of ["pointerup", "pointercancel"])
+            addEventListener(end, () => (pressed = false), true);
         surface.addEventListener("focusin", (event) => {
             const box = this.boxAt(event.target);
             if (box && box !== this.activeBox && !pressed) this.activate(box);

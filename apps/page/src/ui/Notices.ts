@@ -22,8 +22,15 @@ export class Notices {
         setTimeout(() => notice.remove(), kTime);
     }
 
-    warn(text: string): void {
+    // With a button that leads to more.
+    warn(text: string, label: string, action: () => void): void {
         const notice = this.add("warned", "status", text, []);
+        const button = html("button", { type: "button", class: "plain" }, label);
+        onClick(button, () => {
+            notice.remove();
+            action();
+        });
+        notice.lastElementChild!.before(button);
         setTimeout(() => notice.remove(), 2 * kTime);
     }
 
