@@ -69,6 +69,7 @@ describe("looks", kTwoAtOnce, () => {
         const wears = (theme) => page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
         const paper = () => page.evaluate(() => getComputedStyle(document.querySelector("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
         await wears("dark");
+        await visit.stand("I2");
         await photograph(visit, "dark");
         const dark = await paper();
         await page.emulateMedia({ colorScheme: "light" });
