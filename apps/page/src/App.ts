@@ -42,6 +42,9 @@ import {
 } from "./view/ViewState";
 
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
+const kWarmUps = 8;
+const kWarmUpPause = 120; // ms
+const kWarmEnough = 12; // ms; what takes less needs no warming
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
 export class App implements ChromeActions {
@@ -153,10 +156,23 @@ export class App implements ChromeActions {
         this.arrive(state, null);
         performance.measure("olvane-open", { start });
         this.greet(family);
+        this.warmUp(family, state);
         if (file.diagnostics.some((one) => one.severity === "error")) {
             const summary = this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length);
             this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.diagnostics.showModal());
         }
+    }
+
+    // Browsers compile well only what has run for a while, so a large picture is laid out a few times more while
+    // nobody waits for it. The first click then is as quick as those after it.
+    private warmUp(family: OpenFamily, state: ViewState, times = kWarmUps): void {
+        setTimeout(() => {
+            if (this.family !== family || !this.picture) return;
+            const start = performance.now();
+            family.picture(state);
+            const isSlow = performance.now() - start > kWarmEnough;
+            if (isSlow && times > 1) this.warmUp(family, state, times - 1);
+        }, kWarmUpPause);
     }
 
     private greet(family: OpenFamily): void {

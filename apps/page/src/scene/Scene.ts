@@ -11,7 +11,7 @@ import type { Segment, Sex } from "olvane";
 import { prefersStillness, svg } from "../ui/dom";
 import type { Box, Picture } from "../view/Picture";
 import { kLineStyles, type LineStyle } from "../view/lineStyles";
-import { encloses, grown, type Rectangle } from "../view/SpatialGrid";
+import { encloses, grown, type Rectangle, touches } from "../view/SpatialGrid";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, type Placing, type Point } from "./Camera";
 
@@ -158,27 +158,29 @@ export class Scene {
         const newCentre = middleOf(picture.areaOf(picture.focusBox));
         const shift = { x: newCentre.x - oldCentre.x, y: newCentre.y - oldCentre.y };
         const start = { k, x: x - shift.x * k, y: y - shift.y * k };
-        this.camera.place(start);
         const target = this.comfortable(picture, start, before.view !== picture.view);
-
         if (prefersStillness()) {
             this.ghosts.replaceChildren();
             this.camera.place(target);
-            this.update();
             return;
         }
+
         const from = new Map<string, Point>();
         for (const box of before.boxes) from.set(box.key, { x: box.x + shift.x, y: box.y + shift.y });
         from.set(picture.focusBox.key, {
             x: oldCentre.x + shift.x - picture.sizes.nodeWidth / 2,
             y: oldCentre.y + shift.y - picture.sizes.nodeHeight / 2,
         });
-        this.leaveGhosts(picture, shift, oldElements);
         this.glide = { start: performance.now(), from };
+        // Whoever was found far away is not travelled to: the way would show, and draw, all that lies between.
+        const wasInSight = touches(before.areaOf(held), this.camera.window());
+        if (wasInSight) this.leaveGhosts(picture, shift, oldElements);
+        else this.ghosts.replaceChildren();
+        this.camera.place(wasInSight ? start : target);
         this.update(this.camera.window(target));
         this.fadeNewcomers(before);
         this.step(performance.now());
-        this.camera.travelTo(target, kGlideTime);
+        if (wasInSight) this.camera.travelTo(target, kGlideTime);
     }
 
     private opening(picture: Picture): Placing {
