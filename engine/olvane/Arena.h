@@ -65,14 +65,14 @@ public:
     ArenaAllocator(const ArenaAllocator<Other>& other) : arena_(other.arena()) {}
 
     T* allocate(std::size_t count) {
-        if (arena_ == nullptr) return static_cast<T*>(::operator new(count * sizeof(T)));
-        return static_cast<T*>(arena_->take(count * sizeof(T)));
+        if (arena_ == nullptr) return static_cast<T*>(::operator new(bytesOf(count)));
+        return static_cast<T*>(arena_->take(bytesOf(count)));
     }
     void deallocate(T* piece, std::size_t count) noexcept {
         if (arena_ == nullptr) {
             ::operator delete(piece);
         } else {
-            arena_->giveBack(piece, count * sizeof(T));
+            arena_->giveBack(piece, bytesOf(count));
         }
     }
     ArenaAllocator select_on_container_copy_construction() const { return ArenaAllocator(); }
@@ -85,6 +85,9 @@ public:
     }
 
 private:
+    // Lists of pointers lie in arenas too. NOLINTNEXTLINE(bugprone-sizeof-expression)
+    static constexpr std::size_t bytesOf(std::size_t count) { return count * sizeof(T); }
+
     Arena* arena_ = nullptr;
 };
 

@@ -16,8 +16,10 @@
 // A polyline that grows at either end. A plain value: a copy is a deep copy.
 //
 // Units: points. Ends meet only when both coordinates are exactly equal.
+// Holds: nothing is allocated when a line moves.
 // Fails: the operations that need points on the line (first, last, frontLineSegment, backLineSegment) throw
 //        std::out_of_range on a line that is too short.
+// NOLINTNEXTLINE(bugprone-exception-escape)
 class OLVANE_API TreeLine {
 public:
     TreeLine() = default;
