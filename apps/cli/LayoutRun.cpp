@@ -6,6 +6,7 @@
 
 #include <cli/LayoutRun.h>
 
+#include <cstddef>
 #include <memory>
 
 #include <olvane/boundary/LayoutPieces.h>
@@ -14,11 +15,16 @@
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 #include <olvane/source/GedcomDataSource.h>
 
+#include <cli/LimitedDataSource.h>
+
 namespace olvane::cli {
 
 namespace {
 
 constexpr int kPedigreeStackDepth = 4;  // as the family view's own
+
+// A thousand times what charts of real families ask for. A layout at the limit takes about a gigabyte.
+constexpr std::size_t kMostRelatives = 5000000;
 
 SharedTreeViewer::OptionMap optionsOf(const LayoutRequest& request) {
     SharedTreeViewer::OptionMap options;
@@ -52,8 +58,9 @@ TreeSize sizeOf(BoxForm boxes) {
 
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
     ViewerGlue glue;
+    gedcom::GedcomDataSource people(data);
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source =
-        std::make_shared<gedcom::GedcomDataSource>(data);
+        std::make_shared<LimitedDataSource>(people, kMostRelatives);
     const HostCallbacks callbacks(glue, source);
     resetAddParentId();
     DataAdapter adapter = callbacks.dataAdapter();

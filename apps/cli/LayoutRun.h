@@ -28,7 +28,8 @@ struct LayoutRequest {
 TreeSize sizeOf(BoxForm boxes);
 
 // The result text of one layout. Safe to call on several threads with the same data.
-// Fails: passes on what the engine throws; an id that is no person throws std::out_of_range.
+// Fails: std::length_error, with a sentence for the user, where the layout asks for more than 5 million relatives;
+//        passes on what the engine throws; an id that is no person throws std::out_of_range.
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
 
 }  // namespace olvane::cli
