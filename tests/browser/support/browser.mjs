@@ -20,7 +20,7 @@ const kArguments = [
     "--disable-component-update",
     "--disable-sync",
 ];
-const kPatience = 8000; // ms, for what should be there at once
+const kPatience = 20_000; // ms, for what should be there at once
 const kWindow = { width: 1280, height: 800 };
 
 const folder = mkdtempSync(join(tmpdir(), "olvane-browser-"));
