@@ -117,7 +117,7 @@ export class HostError extends LayoutError {
     readonly cause: unknown;
 }
 
-/** A file that is no GEDCOM file, or holds no person. */
+/** A file that is no GEDCOM file. */
 export class GedcomError extends Error {}
 
 export type Sex = "male" | "female" | "other";
