@@ -48,6 +48,17 @@ TEST(PersonKeys, anyTextReceivesOneAndIsKeptAsItIs) {
     EXPECT_EQ("017", glue.personOfKey(3));
 }
 
+TEST(PersonKeys, stayTheSameWhileManyOthersCome) {
+    constexpr int kCount = 5000;
+    ViewerGlue glue;
+    for (int id = 0; id < kCount; ++id) ASSERT_EQ(id, glue.keyOfNumber(id * 7 - kCount));
+    for (int id = 0; id < kCount; ++id) {
+        ASSERT_EQ(id, glue.getKeyFromPerson(std::to_string(id * 7 - kCount)));
+        ASSERT_EQ(id * 7 - kCount, glue.numberOfKey(id));
+    }
+    EXPECT_EQ(kCount, glue.keyOfNumber(kCount * 7));
+}
+
 TEST(PersonKeys, bothTablesMirrorEachOther) {
     ViewerGlue glue;
     for (const char* text : {"17", "-1", "42", "-2", "17"}) glue.getKeyFromPerson(text);
@@ -118,6 +129,35 @@ TEST(AddNodeRecords, startAsAMissingMotherOfNobody) {
     EXPECT_EQ("", record.addNodeText);
     EXPECT_EQ("", record.childText);
     EXPECT_EQ("", record.otherParentText);
+}
+
+TEST(AddNodeRecords, ofATextThatIsNoNumberAreFoundByIt) {
+    ViewerGlue glue;
+    EXPECT_EQ(kUnknownKeyFailure, failureOf<std::out_of_range>([&glue] { glue.getAddNodeValue("abc"); }));
+    glue.addAddNodeValue("abc", true, "17", "42");
+    EXPECT_EQ("17", glue.getAddNodeValue("abc").childText);
+    const int key = glue.getKeyFromPerson("abc");
+    EXPECT_TRUE(glue.addNodeIsMale(key));
+    EXPECT_EQ("17", glue.childTextOfAddNode(key));
+    EXPECT_EQ("42", glue.getAddNodeValue("abc").otherParentText);
+    EXPECT_EQ(1u, glue.addNodes.size());
+}
+
+TEST(AddNodeRecords, firstOneStandsWhetherItCameByTextOrByKey) {
+    ViewerGlue glue;
+    const int byText = glue.getKeyFromPerson("abc");
+    const int byKey = glue.getKeyFromPerson("def");
+    const int child = glue.getKeyFromPerson("17");
+    glue.addAddNodeValue("abc", true, "17", "42");
+    glue.addAddNode(byText, false, child, child);
+    glue.addAddNode(byKey, false, child, byText);
+    glue.addAddNodeValue("def", true, "1", "2");
+    EXPECT_TRUE(glue.addNodeIsMale(byText));
+    EXPECT_FALSE(glue.addNodeIsMale(byKey));
+    EXPECT_EQ("42", glue.getAddNodeValue("abc").otherParentText);
+    EXPECT_EQ("abc", glue.getAddNodeValue("def").otherParentText);
+    EXPECT_EQ("17", glue.getAddNodeValue("def").childText);
+    EXPECT_EQ(2u, glue.addNodes.size());
 }
 
 }  // namespace
