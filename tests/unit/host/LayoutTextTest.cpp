@@ -22,6 +22,11 @@ TEST(LayoutText, emptyTextHoldsNobody) {
     EXPECT_TRUE(readLayoutText("").empty());
 }
 
+TEST(LayoutText, recordThatNobodyFilledHasNothing) {
+    EXPECT_EQ(LayoutRecord{}, (LayoutRecord{0, 0, 0, false, {}, std::nullopt}));
+    EXPECT_EQ(writeLayoutText({LayoutRecord{}}), "0:0:0:0:;");
+}
+
 TEST(LayoutText, everyFieldOfARecordIsRead) {
     const std::vector<LayoutRecord> records = readLayoutText(kFourPersons);
     ASSERT_EQ(records.size(), 4u);
