@@ -94,6 +94,28 @@ TEST(DateToText, utf8DateKeepsItsFirstCharacterWhole) {
                                                  "1"));
 }
 
+// Of a number that Unicode has, in as few bytes as it takes.
+std::string utf8Of(unsigned number) {
+    const auto byte = [](unsigned value) { return static_cast<char>(static_cast<unsigned char>(value)); };
+    const auto low = [byte, number](unsigned shift) { return byte(0x80 | (number >> shift & 0x3F)); };
+    if (number < 0x80) return {byte(number)};
+    if (number < 0x800) return {byte(0xC0 | number >> 6), low(0)};
+    if (number < 0x10000) return {byte(0xE0 | number >> 12), low(6), low(0)};
+    return {byte(0xF0 | number >> 18), low(12), low(6), low(0)};
+}
+
+TEST(DateToText, everyCharacterOfUnicodeIsKeptWhole) {
+    constexpr unsigned kEnd = 0x110000;
+    constexpr unsigned kLastByteValues = 0x40;  // the first and the last of each are tried
+    for (unsigned first = kLastByteValues; first < kEnd; first += kLastByteValues) {
+        if (first >= 0xD800 && first < 0xE000) continue;  // halves of pairs
+        for (const unsigned number : {first, first + kLastByteValues - 1}) {
+            const std::string character = utf8Of(number);
+            ASSERT_EQ(character, stringToString(character + "1")) << number;
+        }
+    }
+}
+
 TEST(DateToText, datesOfOneFirstCharacterAreTheSameAndOthersAreNot) {
     EXPECT_EQ(stringToString("1850"), stringToString("1911"));
     EXPECT_EQ(stringToString("\xC3\xA9"

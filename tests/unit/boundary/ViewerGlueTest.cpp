@@ -3,8 +3,10 @@
 
 // Keys by first sight and the records of add-nodes, without any data source.
 
+#include <cstdint>
 #include <stdexcept>
 #include <string>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -57,6 +59,22 @@ TEST(PersonKeys, stayTheSameWhileManyOthersCome) {
         ASSERT_EQ(id * 7 - kCount, glue.numberOfKey(id));
     }
     EXPECT_EQ(kCount, glue.keyOfNumber(kCount * 7));
+}
+
+// A table half full, with every second place taken: whoever looks for a place must find one of the others.
+TEST(PersonKeys, ofNumbersThatFallOnEverySecondPlaceAreFound) {
+    const auto fallsOnAnEvenPlace = [](int id) {
+        return ((static_cast<std::uint32_t>(id) * std::uint64_t{0x9E3779B97F4A7C15}) >> 32) % 2 == 0;
+    };
+    std::vector<int> ids;
+    for (int id = 1; ids.size() < 1000; ++id) {
+        if (fallsOnAnEvenPlace(id)) ids.push_back(id);
+    }
+    ViewerGlue glue;
+    int key = 0;
+    for (const int id : ids) ASSERT_EQ(key++, glue.keyOfNumber(id));
+    key = 0;
+    for (const int id : ids) ASSERT_EQ(key++, glue.keyOfNumber(id));
 }
 
 TEST(PersonKeys, bothTablesMirrorEachOther) {
