@@ -14,8 +14,7 @@
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 #include <olvane/source/GedcomDataSource.h>
-
-#include <cli/LimitedDataSource.h>
+#include <olvane/source/LimitedDataSource.h>
 
 namespace olvane::cli {
 
@@ -60,7 +59,7 @@ std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, c
     ViewerGlue glue;
     gedcom::GedcomDataSource people(data);
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source =
-        std::make_shared<LimitedDataSource>(people, kMostRelatives);
+        std::make_shared<gedcom::LimitedDataSource>(people, kMostRelatives);
     const HostCallbacks callbacks(glue, source);
     resetAddParentId();
     DataAdapter adapter = callbacks.dataAdapter();

@@ -4,7 +4,7 @@
 // A GEDCOM file that the module has read. Persons and families come over once, as one JSON text of arrays; facts
 // when they are asked for.
 
-import { GedcomError } from "./errors.mjs";
+import { GedcomError, LayoutError } from "./errors.mjs";
 import { runLayout } from "./layout.mjs";
 
 const SEXES = ["male", "female", "other"];
@@ -106,9 +106,19 @@ export class GedcomFile {
 
     #run(focus, options) {
         const file = this.#opened();
-        return runLayout(this.#instance, null, options, (view) =>
-            this.#instance.exports.gedcom_layout(file, view, focus),
-        );
+        if (this.persons[focus - 1] === undefined) {
+            throw new LayoutError("invalidPerson", `${this.name}: there is no person ${focus}`, "", []);
+        }
+        try {
+            return runLayout(this.#instance, null, options, (view) =>
+                this.#instance.exports.gedcom_layout(file, view, focus),
+            );
+        } catch (error) {
+            // A file answers every question; it only ends a layout that asks for too much.
+            if (error.status !== "hostFailed") throw error;
+            const message = "the layout is too large: it asks for more than a million relatives";
+            throw new LayoutError("tooLarge", message, error.text, error.records);
+        }
     }
 
     #told(question, ...values) {

@@ -107,7 +107,8 @@ export class LayoutError extends Error {
         | "hostFailed"
         | "layoutFailed"
         | "outOfMemory"
-        | "nestedCall";
+        | "nestedCall"
+        | "tooLarge";
     readonly text: string;
     readonly records: readonly LayoutRecord[];
 }
@@ -210,7 +211,7 @@ export class GedcomFile {
     /** Everything that the file tells of a person, in its order. */
     factsOfPerson(id: number): readonly Fact[];
     factsOfFamily(id: number): readonly Fact[];
-    /** As Olvane.layout, with the file as the host. */
+    /** As Olvane.layout, with the file as the host. Asks for a million relatives at most, and else is tooLarge. */
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;
     /** Gives the memory back; nothing can be asked afterwards but what was read out before. */

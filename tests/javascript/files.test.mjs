@@ -160,7 +160,35 @@ test("a closed file gives no more answers", () => {
 
 test("a person outside the file is refused", () => {
     const file = olvane.readGedcom(bytesOf(couple));
-    assert.throws(() => file.layout(4), { name: "LayoutError" });
+    assert.throws(() => file.layout(4), { name: "LayoutError", status: "invalidPerson" });
+    assert.throws(() => file.layout(0), { name: "LayoutError", status: "invalidPerson" });
     assert.throws(() => file.factsOfPerson(4), GedcomError);
     assert.throws(() => file.factsOfFamily(2), GedcomError);
+});
+
+test("a layout that grows without measure is ended in words", () => {
+    const count = 60;
+    const persons = Array.from({ length: count }, (_, i) => i + 1);
+    const couples = persons.filter((id) => id % 2 === 1).flatMap((man) =>
+        persons.filter((id) => id % 2 === 0).map((wife) => [man, wife]),
+    );
+    const links = (id) =>
+        couples
+            .map(([man, wife], i) => (man === id || wife === id ? `1 FAMS @F${i}@\n1 FAMC @F${i}@\n` : `1 FAMC @F${i}@\n`))
+            .join("");
+    const text =
+        "0 HEAD\n1 CHAR UTF-8\n" +
+        persons.map((id) => `0 @I${id}@ INDI\n1 SEX ${id % 2 ? "M" : "F"}\n${links(id)}`).join("") +
+        couples
+            .map(
+                ([man, wife], i) =>
+                    `0 @F${i}@ FAM\n1 HUSB @I${man}@\n1 WIFE @I${wife}@\n` +
+                    persons.map((id) => `1 CHIL @I${id}@\n`).join(""),
+            )
+            .join("") +
+        "0 TRLR\n";
+    const file = olvane.readGedcom(bytesOf(text));
+    assert.throws(() => file.layout(1), { name: "LayoutError", status: "tooLarge" });
+    file.close();
+    assert.ok(olvane.readGedcom(bytesOf(couple)).layout(1).length > 0, "the next request is unaffected");
 });

@@ -41,6 +41,7 @@ import {
     type ViewState,
 } from "./view/ViewState";
 
+const kMostBytes = 128 * 2 ** 20; // of a file
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
 const kWarmUps = 8;
 const kWarmUpPause = 120; // ms
@@ -119,6 +120,7 @@ export class App implements ChromeActions {
         this.welcome.showReading(file.name);
         await pause();
         try {
+            if (file.size > kMostBytes) throw new Error(this.ui.errors.tooLarge);
             const bytes = new Uint8Array(await file.arrayBuffer());
             this.open(isArchive(bytes) ? await gedcomInArchive(bytes) : bytes, file.name, null);
         } catch (error) {

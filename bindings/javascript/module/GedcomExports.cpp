@@ -12,6 +12,8 @@
 #include <string_view>
 
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/LimitedDataSource.h>
 
 #include "GedcomHost.h"
 #include "JsonText.h"
@@ -28,6 +30,9 @@ struct OpenFile {
     gedcom::GedcomData data;
     gedcom::GedcomDataSource source;
 };
+
+// Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for so many.
+constexpr std::size_t kMostRelatives = 1000000;
 
 // What the last call had to say: a table, facts, or why a file was refused.
 std::string lastText;
@@ -199,8 +204,8 @@ OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFil
 }
 
 OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {
-    return js::layoutAnswer(js::hostOfFile(file->source), static_cast<js::View>(view), focus,
-                            js::nextOptions());
+    gedcom::LimitedDataSource limited(file->source, js::kMostRelatives);
+    return js::layoutAnswer(js::hostOfSource(limited), static_cast<js::View>(view), focus, js::nextOptions());
 }
 
 OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {

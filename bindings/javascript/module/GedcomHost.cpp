@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A file's answers as callbacks. What the data source throws is caught where callbacks are called.
+// A data source's answers as callbacks. What the data source throws is caught where callbacks are called.
 
 #include "GedcomHost.h"
 
@@ -11,10 +11,8 @@
 namespace olvane::js {
 namespace {
 
-using gedcom::GedcomDataSource;
-
-GedcomDataSource& sourceOf(void* context) {
-    return *static_cast<GedcomDataSource*>(context);
+OlvaneViewerManagerWrapProtocol& sourceOf(void* context) {
+    return *static_cast<OlvaneViewerManagerWrapProtocol*>(context);
 }
 
 int fatherOf(void* context, std::int64_t person, std::int64_t* parent) {
@@ -58,7 +56,7 @@ int sexOf(void* context, std::int64_t person, std::int32_t* sex) {
 
 }  // namespace
 
-olvane_host hostOfFile(GedcomDataSource& source) {
+olvane_host hostOfSource(OlvaneViewerManagerWrapProtocol& source) {
     return {&source, fatherOf, motherOf, spousesOf, childrenOf, isPreferredSpouse, isDead, dateOf, sexOf};
 }
 

@@ -5,11 +5,11 @@
 
 #include <olvane.h>
 
-#include <olvane/source/GedcomDataSource.h>
+#include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 
 namespace olvane::js {
 
-// A GEDCOM file as a host of the C interface. source outlives what is returned.
-olvane_host hostOfFile(gedcom::GedcomDataSource& source);
+// A data source as a host of the C interface. It outlives what is returned.
+olvane_host hostOfSource(OlvaneViewerManagerWrapProtocol& source);
 
 }  // namespace olvane::js

@@ -131,6 +131,7 @@ export const uiGerman: UiMessages = {
         notGedcom: (name) => `${name} ließ sich nicht als Familiendatei lesen.`,
         hint: "Eine GEDCOM-Datei beginnt mit der Zeile „0 HEAD“. Die meisten Ahnenprogramme schreiben eine unter Export.",
         noPersons: "Sie enthält keine Person.",
+        tooLarge: "Sie ist größer als 128 MiB; so viel fasst eine Seite nicht.",
         tooNew: "Dieser Browser ist zu alt für die Seite: er kann das Rechenwerk nicht auspacken.",
         archive: "Das Archiv enthält keine gedcom.ged oder ist beschädigt.",
         engine: "Das Rechenwerk ließ sich nicht starten.",

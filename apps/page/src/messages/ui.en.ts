@@ -131,6 +131,7 @@ export const uiEnglish: UiMessages = {
         notGedcom: (name) => `${name} could not be read as a family file.`,
         hint: "A GEDCOM file begins with the line “0 HEAD”. Most genealogy programs write one under Export.",
         noPersons: "It holds no person.",
+        tooLarge: "It is larger than 128 MiB, which is more than a page can hold.",
         tooNew: "This browser is too old for the page: it cannot unpack the engine.",
         archive: "The archive holds no gedcom.ged, or is damaged.",
         engine: "The engine could not be started.",

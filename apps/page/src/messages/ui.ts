@@ -107,6 +107,7 @@ export interface UiMessages {
         readonly notGedcom: (name: string) => string;
         readonly hint: string;
         readonly noPersons: string;
+        readonly tooLarge: string;
         readonly tooNew: string;
         readonly archive: string;
         readonly engine: string;

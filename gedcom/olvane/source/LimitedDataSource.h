@@ -10,7 +10,7 @@
 
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 
-namespace olvane::cli {
+namespace olvane::gedcom {
 
 // A data source that ends a layout which grows without measure: it counts the relatives that it tells, each time that
 // they are asked for.
@@ -39,4 +39,4 @@ private:
     std::size_t toldRelatives_ = 0;
 };
 
-}  // namespace olvane::cli
+}  // namespace olvane::gedcom

@@ -4,11 +4,11 @@
 // Passes every question on, and counts the relatives in the answers. They are what a layout's time and memory grow
 // with, long before there is anything of it to measure.
 
-#include <cli/LimitedDataSource.h>
+#include <olvane/source/LimitedDataSource.h>
 
 #include <stdexcept>
 
-namespace olvane::cli {
+namespace olvane::gedcom {
 
 std::int64_t LimitedDataSource::fatherForPersonWithID(std::int64_t personId) {
     count(1);
@@ -52,8 +52,8 @@ void LimitedDataSource::count(std::size_t relatives) {
     toldRelatives_ += relatives;
     if (toldRelatives_ <= mostRelatives_) return;
     throw std::length_error("the layout is too large: more than " + std::to_string(mostRelatives_ / 1000000) +
-                            " million relatives are asked for; choose another focus, or leave some out "
-                            "(--no-..., --generations)");
+                            " million relatives are asked for; choose another focus, or leave relatives or "
+                            "generations out");
 }
 
-}  // namespace olvane::cli
+}  // namespace olvane::gedcom
