@@ -3,7 +3,8 @@
 
 // Bounds on the memory of a layout with its result text: bytes at the peak and allocations, for each displayed
 // person. Both count the same on every machine with one standard library, so a bound that is passed was passed
-// by a change. Small families share what every layout needs at least, so the bounds begin at a thousand persons.
+// by a change. Small families share what every layout needs at least, so allocations are held from a thousand
+// persons on.
 
 #include <gtest/gtest.h>
 
@@ -45,6 +46,18 @@ TEST(CountedMemory, countsWhatIsHeldAndNotWhatWasReturned) {
     EXPECT_EQ(count.allocations, 2u);
     EXPECT_GE(count.peakBytes, 5000u);
     EXPECT_LT(count.peakBytes, 6000u);
+}
+
+TEST(LayoutMemory, thirtyPersonsTakeNoMoreThanTwoKibibytesEach) {
+    EXPECT_LE(memoryOf({"desc", 30}).bytes, kMostBytes);
+    EXPECT_LE(memoryOf({"ego", 30}).bytes, kMostBytes);
+    EXPECT_LE(memoryOf({"ped", 4}).bytes, kMostBytes);
+}
+
+TEST(LayoutMemory, aHundredPersonsTakeNoMoreThanTwoKibibytesEach) {
+    EXPECT_LE(memoryOf({"desc", 100}).bytes, kMostBytes);
+    EXPECT_LE(memoryOf({"ego", 100}).bytes, kMostBytes);
+    EXPECT_LE(memoryOf({"ped", 6}).bytes, kMostBytes);
 }
 
 TEST(LayoutMemory, aThousandPersonsTakeNoMoreThanTwoKibibytesEach) {

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Blocks and the pieces cut from them. Blocks grow with what has been taken so far, so that a small picture
-// takes little and a large one asks the system seldom; their length is capped, since the last one is never
-// full.
+// Blocks and the pieces cut from them. Blocks grow with half of what has been taken so far, so that a small
+// picture takes little and a large one asks the system seldom; their length is capped, since the last one is
+// never full.
 
 #include <olvane/Arena.h>
 
@@ -27,7 +27,7 @@ namespace olvane {
 namespace {
 
 constexpr bool kEachPieceAlone = OLVANE_EACH_PIECE_ALONE != 0;
-constexpr std::size_t kFirstBlock = std::size_t{4} << 10;
+constexpr std::size_t kFirstBlock = std::size_t{8} << 10;
 constexpr std::size_t kLargestBlock = std::size_t{64} << 10;
 
 }  // namespace
@@ -68,7 +68,7 @@ void Arena::giveBack(void* piece, std::size_t bytes) noexcept {
 // A piece that would fill a block nearly alone gets one of its own, and the rest of the newest block stays in
 // use.
 void* Arena::cutFromNewBlock(std::size_t size) {
-    const std::size_t usual = std::clamp(taken_, kFirstBlock, kLargestBlock) - kGranule;
+    const std::size_t usual = std::clamp(taken_ / 2, kFirstBlock, kLargestBlock) - kGranule;
     if (size > usual / 2) return addBlock(size);
     char* const piece = addBlock(usual);
     place_ = piece + size;
@@ -78,7 +78,6 @@ void* Arena::cutFromNewBlock(std::size_t size) {
 
 // The first granule of a block is the link to the one before it.
 char* Arena::addBlock(std::size_t size) {
-    if (size > static_cast<std::size_t>(-1) - kGranule) throw std::bad_alloc();
     void* const block = ::operator new(size + kGranule);
     blocks_ = new (block) Link{blocks_};
     taken_ += size + kGranule;

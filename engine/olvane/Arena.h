@@ -15,7 +15,7 @@ namespace olvane {
 // once, when the arena does; pieces returned before that are handed out again, by size.
 //
 // Units: bytes. A piece is aligned for every fundamental type.
-// Holds: the arena outlives whatever lies in it.
+// Holds: the arena outlives whatever lies in it; no piece is longer than PTRDIFF_MAX, as containers see to.
 // Fails: take throws std::bad_alloc and changes nothing.
 class OLVANE_API Arena {
 public:
