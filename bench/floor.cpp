@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "Floor.h"
+#include "KeptMemory.h"
 #include "MadeLayout.h"
 
 namespace {
@@ -51,6 +52,7 @@ void layOutAndFloor(benchmark::State& state, const std::string& shape) {
 }  // namespace
 
 int main(int argc, char** argv) {
+    bench::keepFreedMemory();
     for (const bench::LayoutName& name : bench::layoutsOfTheTables()) {
         benchmark::RegisterBenchmark((std::string("floor/") + name.shape).c_str(), layOutAndFloor, name.shape)
             ->Arg(name.size)

@@ -11,6 +11,7 @@
 #include <string>
 #include <utility>
 
+#include "KeptMemory.h"
 #include "MadeLayout.h"
 
 namespace {
@@ -46,6 +47,7 @@ void registerGrowth() {
 }  // namespace
 
 int main(int argc, char** argv) {
+    bench::keepFreedMemory();
     registerTimes();
     registerGrowth();
     benchmark::Initialize(&argc, argv);

@@ -11,6 +11,7 @@
 #include <iostream>
 #include <string>
 
+#include "KeptMemory.h"
 #include "MadeLayout.h"
 
 namespace {
@@ -33,6 +34,7 @@ void serve(const bench::MadeLayout& layout) {
 }  // namespace
 
 int main(int argc, char** argv) {
+    bench::keepFreedMemory();
     if (argc != 3) {
         std::cerr << "usage: serve_layouts desc|ego|ped SIZE\n";
         return 2;

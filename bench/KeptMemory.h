@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#if defined(__GLIBC__)
+#include <malloc.h>
+#endif
+
+namespace bench {
+
+// Has this program keep what it frees, as Node does for the peers. glibc would give the end of the heap back to the
+// system after a layout and take it again, page by page, in the next.
+inline void keepFreedMemory() {
+#if defined(__GLIBC__)
+    constexpr int kMoreThanAnyLayout = 1 << 30;  // bytes
+    constexpr int kMostThatGlibcTakes = 32 << 20;
+    mallopt(M_TRIM_THRESHOLD, kMoreThanAnyLayout);
+    mallopt(M_MMAP_THRESHOLD, kMostThatGlibcTakes);
+#endif
+}
+
+}  // namespace bench
