@@ -5,15 +5,15 @@
 
 #include <olvane/boundary/HostText.h>
 
-#include <charconv>
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
 
+#include <olvane/boundary/DecimalInternal.h>
+
 std::string intToString(int value) {
-    char digits[12];
-    const auto end = std::to_chars(digits, digits + sizeof digits, value).ptr;
-    return std::string(digits, end);
+    char digits[olvane::kLongestDecimal];
+    return std::string(digits, olvane::writeDecimal(digits, value));
 }
 
 int stringToInt(std::string text) {
@@ -59,7 +59,7 @@ std::size_t lengthOfFirstCharacter(const std::string& text) {
 }  // namespace
 
 std::string stringToString(std::string text) {
-    const bool isNothing = text.empty() || text.front() == '\0';
-    text.resize(isNothing ? 0 : lengthOfFirstCharacter(text));
+    if (text.empty()) return text;
+    text.resize(text.front() == '\0' ? 0 : lengthOfFirstCharacter(text));
     return text;
 }

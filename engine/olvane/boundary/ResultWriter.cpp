@@ -12,10 +12,11 @@
 
 #include <olvane/boundary/LayoutPieces.h>
 
+#include <olvane/boundary/DecimalInternal.h>
 #include <olvane/graph/WholePoint.h>
 
-#include <charconv>
 #include <cstddef>
+#include <cstring>
 
 namespace olvane {
 
@@ -29,52 +30,68 @@ void updateBounds(ResultBounds& bounds, int x, int y) {
     if (bounds.maxY < y || bounds.maxY == 0) bounds.maxY = y;
 }
 
-// Four numbers and what stands behind them, put together here and appended at once.
+// Text put together here and appended in few pieces.
 class Piece {
 public:
+    explicit Piece(std::string& text) : text_(text) {}
+
     void add(int value, char separator) {
-        char* const place = room_ + length_;
-        char* const end = std::to_chars(place, place + kLongestNumber, value).ptr;
-        *end = separator;
-        length_ = static_cast<std::size_t>(end - room_) + 1;
+        end_ = writeDecimal(end_, value);
+        *end_++ = separator;
     }
-    void clear() { length_ = 0; }
-    void appendTo(std::string& text) const { text.append(room_, length_); }
+
+    void add(const TreeLineSegment& segment) {
+        makeRoom();
+        char* const start = end_;
+        add(wholePoint(segment.x1), ',');
+        add(wholePoint(segment.y1), ',');
+        add(wholePoint(segment.x2), ',');
+        add(wholePoint(segment.y2), '|');
+        length_ = static_cast<std::size_t>(end_ - start);
+    }
+    // The segment that was added last, once more.
+    void repeatSegment() {
+        makeRoom();
+        std::memcpy(end_, end_ - length_, length_);
+        end_ += length_;
+    }
+
+    void flush() {
+        text_.append(room_, static_cast<std::size_t>(end_ - room_));
+        end_ = room_;
+    }
 
 private:
-    static constexpr std::size_t kLongestNumber = 11;
+    static constexpr std::size_t kLongestSegment = 4 * (kLongestDecimal + 1);
 
-    char room_[4 * (kLongestNumber + 1)];
-    std::size_t length_ = 0;
+    // The last segment stays where it can be copied from.
+    void makeRoom() {
+        if (end_ <= room_ + sizeof room_ - kLongestSegment) return;
+        char last[kLongestSegment];
+        std::memcpy(last, end_ - length_, length_);
+        end_ -= length_;
+        flush();
+        std::memcpy(end_, last, length_);
+        end_ += length_;
+    }
+
+    std::string& text_;
+    char room_[10 * kLongestSegment];
+    char* end_ = room_;
+    std::size_t length_ = 0;  // of the last segment
 };
 
-void appendPlaceAndFlag(std::string& text, const std::string& personText, int x, int y, bool flag) {
-    text += personText;
-    text += ':';
-    Piece piece;
-    piece.add(x, ':');
-    piece.add(y, ':');
-    piece.add(flag ? 1 : 0, ':');
-    piece.appendTo(text);
-}
-
-void rewrite(Piece& piece, const TreeLineSegment& segment) {
-    piece.clear();
-    piece.add(wholePoint(segment.x1), ',');
-    piece.add(wholePoint(segment.y1), ',');
-    piece.add(wholePoint(segment.x2), ',');
-    piece.add(wholePoint(segment.y2), '|');
-}
-
 // Each child of a couple leaves the same drop, one behind the other, so the last piece often serves again.
-void appendSegments(std::string& text, const TreeViewPerson& person) {
+void addSegments(Piece& piece, const TreeViewPerson& person) {
     const TreeLineSegment* last = nullptr;
-    Piece piece;
     for (const TreeLineSegment& segment : person.lineSegments) {
         const bool isRepeated = last != nullptr && last->firstEnd() == segment.firstEnd() &&
                                 last->secondEnd() == segment.secondEnd();
-        if (!isRepeated) rewrite(piece, segment);
-        piece.appendTo(text);
+        if (isRepeated) {
+            piece.repeatSegment();
+        } else {
+            piece.add(segment);
+        }
         last = &segment;
     }
 }
@@ -91,8 +108,14 @@ void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text
     const int x = wholePoint(person.getNodeCenter().x);
     const int y = wholePoint(person.getNodeCenter().y);
     updateBounds(bounds, x, y);
-    appendPlaceAndFlag(text, personText, x, y, person.hasNonDisplayedRelationships);
-    appendSegments(text, person);
+    text += personText;
+    text += ':';
+    Piece piece(text);
+    piece.add(x, ':');
+    piece.add(y, ':');
+    piece.add(person.hasNonDisplayedRelationships ? 1 : 0, ':');
+    addSegments(piece, person);
+    piece.flush();
     if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, person.personId);
     text += ';';
 }

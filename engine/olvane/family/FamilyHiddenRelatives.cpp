@@ -13,6 +13,7 @@
 #include <olvane/layouter/HiddenRelativesInternal.h>
 
 #include <algorithm>
+#include <utility>
 
 namespace SharedTreeViewer {
 
@@ -25,6 +26,7 @@ void TreeViewFamilyLayouter::flagNonDisplayedRelationships(TreeViewPerson& focus
     flagNonDisplayedRelationshipsForSpouses(focus, false);
     collectShownPersons();
     for (TreeViewPerson* person : stackedPersons) flagAgainstWholeDisplay(*person);
+    everybody = std::move(stackedPersons);
     stackedPersons.clear();
     shownKeys.clear();
 }

@@ -13,9 +13,7 @@ template <class Visit>
 void visitGraph(TreeViewPerson& person, const Visit& visit) {
     visit(person);
     const auto goOn = [&visit](TreeViewPerson& relative) { visitGraph(relative, visit); };
-    for (TreeViewPerson& parent : person.parents) goOn(parent);
-    for (TreeViewPerson& spouse : person.spouses) goOn(spouse);
-    visitAllChildren(person, false, goOn);
+    visitParentsSpousesAndChildren(person, goOn);
     for (TreeViewPerson& sibling : person.siblings) {
         if (sibling.personId != person.personId) goOn(sibling);
     }

@@ -12,6 +12,8 @@
 
 #include <olvane/family/FamilyOptions.h>
 
+#include <utility>
+
 namespace SharedTreeViewer {
 
 TreeViewFamilyLayouter::TreeViewFamilyLayouter(DataAdapter* data, int focusKey, int isMale,
@@ -130,7 +132,7 @@ void TreeViewFamilyLayouter::placeGreatGrandparents() {
 }
 
 void TreeViewFamilyLayouter::drawLines() {
-    const std::vector<TreeViewPerson*> persons = everyPerson();
+    const std::vector<TreeViewPerson*> persons = std::move(everybody);
     for (TreeViewPerson* person : persons) addSpouseLinesToPerson(*person);
     for (TreeViewPerson* person : persons) addLinesToPerson(*person);
 }

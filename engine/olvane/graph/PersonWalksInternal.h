@@ -30,6 +30,14 @@ void visitAllChildren(TreeViewPerson& person, bool includeBastards, const Visit&
     });
 }
 
+// Those who come behind a person in the order of the result, but for siblings.
+template <class Visit>
+void visitParentsSpousesAndChildren(TreeViewPerson& person, const Visit& visit) {
+    for (TreeViewPerson& parent : person.parents) visit(parent);
+    for (TreeViewPerson& spouse : person.spouses) visit(spouse);
+    visitAllChildren(person, false, visit);
+}
+
 // The order of TreeViewPerson::childAndSpouseIterator: each child with its other parent, or with the person.
 template <class VisitPair>
 void visitChildrenAndSpouses(TreeViewPerson& person, const VisitPair& visit) {

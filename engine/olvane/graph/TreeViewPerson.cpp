@@ -45,6 +45,7 @@ TreeViewPerson& TreeViewPerson::addParent(int id, bool male) {
 }
 
 void TreeViewPerson::setParents(int fatherId, int motherId) {
+    parents.reserve(parents.size() + 2);
     setParentsFatherOnly(fatherId);
     setParentsMotherOnly(motherId);
 }

@@ -189,7 +189,7 @@ void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, Tr
 }
 
 // The mixed cases look redundant and are kept: sexes that contradict each other in the data (a man listed as
-// a mother) come through here, and a child would vanish from its couple without them. So is the first test
+// a mother) come through here, and a child would vanish from its couple without them. So is the last test
 // over the whole record of the admitted: a child of whom nobody stands on the chart yet is let through,
 // whoever asks.
 bool TreeViewLayouter::checkIfPrefferedParent(TreeViewPerson& person, int& child, int& other) {
@@ -197,10 +197,10 @@ bool TreeViewLayouter::checkIfPrefferedParent(TreeViewPerson& person, int& child
     int mother = TreeViewPerson::kNoKey;
     dataAdapter->getParents(child, father, mother);
     const int self = person.personId;
-    if (!isAdmitted(father) && !isAdmitted(mother) && !isAdmitted(child)) return true;
     if (self == father && other == mother) return true;
     if ((self == father || self == mother) && other == father) return true;
-    return self == mother && other == mother;
+    if (self == mother && other == mother) return true;
+    return !isAdmitted(father) && !isAdmitted(mother) && !isAdmitted(child);
 }
 
 // The person comes in among its own siblings: its place in the list is how the row later finds where it

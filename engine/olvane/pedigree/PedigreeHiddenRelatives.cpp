@@ -44,13 +44,13 @@ void TreeViewPedigreeLayouter::flagChildren(TreeViewPerson& focus) {
 
 // Never takes a flag back: a parent with no other child keeps the one it has.
 void TreeViewPedigreeLayouter::checkParentsForOtherChildren(TreeViewPerson& person) {
-    person.parentsIterator([&](TreeViewPerson& parent) {
+    for (TreeViewPerson& parent : person.parents) {
         const ChildrenSet& children = parent.getAllChildrenVector(dataAdapter->getChildren);
         const bool hasAnother =
             std::any_of(children.begin(), children.end(),
                         [&](const ChildrenAdapter& record) { return record.key != person.personId; });
         if (hasAnother) parent.hasNonDisplayedRelationships = true;
-    });
+    }
 }
 
 // The children are asked for even where the flag stands already: each node asks once, and later looks rest on

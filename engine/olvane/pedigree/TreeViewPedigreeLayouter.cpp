@@ -7,6 +7,7 @@
 
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
+#include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/graph/WholePoint.h>
 #include <olvane/layouter/AncestorStackingInternal.h>
 
@@ -90,10 +91,8 @@ void TreeViewPedigreeLayouter::graphIterator(const Visitor& visitor) {
 
 void TreeViewPedigreeLayouter::graphIteratorHelper(TreeViewPerson& person, const Visitor& visitor) {
     visitor(person);
-    const Visitor goOn = [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); };
-    person.parentsIterator(goOn);
-    person.spouseIterator(goOn);
-    person.allChildrenIterator(false, goOn);
+    visitParentsSpousesAndChildren(
+        person, [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); });
 }
 
 void TreeViewPedigreeLayouter::iterateDirectLineFromFocusPerson(const DirectLineVisitor& visitor) {
