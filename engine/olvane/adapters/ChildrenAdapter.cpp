@@ -7,13 +7,6 @@
 #include <olvane/adapters/ChildrenAdapter.h>
 
 #include <cstring>
-#include <utility>
-
-ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string hostId, int placeInList)
-    : key(childKey), date(std::move(dateText)), idText(std::move(hostId)), hostOrder(placeInList) {}
-
-ChildrenAdapter::ChildrenAdapter(int childKey, std::string dateText, std::string hostId)
-    : ChildrenAdapter(childKey, std::move(dateText), std::move(hostId), 0) {}
 
 bool ChildrenAdapter::isLessWithoutPlaces(const ChildrenAdapter& other) const {
     if (date != other.date) return date < other.date;

@@ -6,17 +6,6 @@
 
 #include <olvane/adapters/SpouseAdapter.h>
 
-#include <utility>
-
-SpouseAdapter::SpouseAdapter(int spouseKey, bool isPreferred, bool isAlive, std::string dateText,
-                             std::string hostId, int placeInList)
-    : key(spouseKey),
-      preferred(isPreferred),
-      alive(isAlive),
-      date(std::move(dateText)),
-      idText(std::move(hostId)),
-      hostOrder(placeInList) {}
-
 bool SpouseAdapter::isLessWithoutPlaces(const SpouseAdapter& other) const {
     if (preferred != other.preferred) return preferred;
     if (alive != other.alive) return alive;

@@ -6,6 +6,7 @@
 #include <functional>
 #include <set>
 #include <string>
+#include <utility>
 
 #include <olvane/Arena.h>
 #include <olvane/Export.h>
@@ -21,7 +22,13 @@ struct OLVANE_API SpouseAdapter {
     int hostOrder;       // place in the host's list, counted from 1; 0 without a place
 
     SpouseAdapter(int spouseKey, bool isPreferred, bool isAlive, std::string dateText, std::string hostId,
-                  int placeInList);
+                  int placeInList)
+        : key(spouseKey),
+          preferred(isPreferred),
+          alive(isAlive),
+          date(std::move(dateText)),
+          idText(std::move(hostId)),
+          hostOrder(placeInList) {}
 
     // The host's order where both records have a place. Records without one: the preferred spouse first, then
     // the living, then the later date, then the greater id text. Note that texts run backwards here and

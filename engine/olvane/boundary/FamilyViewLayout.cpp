@@ -47,11 +47,10 @@ std::string FamilyViewLayout(std::string personText,
     olvane::resetAddParentId();
     olvane::guarded([&] {
         DataAdapter adapter = callbacks.dataAdapter();
-        const SharedTreeViewer::OptionMap options = familyOptions();
         const int focusKey = glue.getKeyFromPerson(personText);
         const int isMale = adapter.isMale(focusKey) ? 1 : 0;
         const TreeSize treeSize = olvane::familyTreeSize();
-        SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, options, treeSize);
+        SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, familyOptions(), treeSize);
         layouter.layoutForFocusNID();
         olvane::ResultBounds bounds;
         layouter.graphIterator(olvane::resultWriter(glue, bounds, text));

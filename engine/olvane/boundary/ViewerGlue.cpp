@@ -17,7 +17,8 @@
 
 namespace {
 
-constexpr std::size_t kFirstSlots = 64;
+constexpr std::size_t kFirstSlots = 128;    // at most half of them full
+constexpr std::size_t kFirstAddNodes = 32;
 
 std::size_t scattered(int number) {
     const std::uint64_t product = static_cast<std::uint32_t>(number) * std::uint64_t{0x9E3779B97F4A7C15};
@@ -39,7 +40,9 @@ ViewerGlue::ViewerGlue()
     : keyToPerson(*this, &ViewerGlue::fillKeyToPerson),
       personToKey(*this, &ViewerGlue::fillPersonToKey),
       addNodes(*this, &ViewerGlue::fillAddNodes),
-      slots_(kFirstSlots) {}
+      slots_(kFirstSlots) {
+    entries_.reserve(kFirstSlots / 2);
+}
 
 int ViewerGlue::getKeyFromPerson(std::string personText) {
     const int number = stringToInt(personText);
@@ -100,6 +103,7 @@ void ViewerGlue::addAddNodeValue(const std::string& addNodeText, bool male, cons
 void ViewerGlue::addAddNode(int key, bool male, int childKey, int otherParentKey) {
     if (recordOfKey(key) != nullptr) return;
     if (!toldRecords_.empty() && toldRecords_.count(personOfKey(key)) != 0) return;
+    if (records_.empty()) records_.reserve(kFirstAddNodes);
     records_.push_back(AddNodeRecord{key, childKey, otherParentKey, male});
     entries_[static_cast<std::size_t>(key)].addNode = static_cast<int>(records_.size()) - 1;
 }

@@ -106,11 +106,12 @@ TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPe
                                                     TreeViewPerson& child) const {
     const TreePoint at = child.getNodeCenter();
     const float stemX = cutToWholePoint(at.x + treeSize.nodeWidth * 0.5f);
-    LineCourse course;
+    TreeLine line;
+    LineCourse course(line);
     course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
     course.draw(child, stemX, drop.busY, drop.x, drop.busY);
     course.draw(child, stemX, at.y, stemX, drop.busY);
-    return course.takeLine();
+    return line;
 }
 
 // From a father's mid-height, in the gap at his right, down to the bus of a couple's children.

@@ -17,8 +17,8 @@
 namespace SharedTreeViewer {
 
 TreeViewFamilyLayouter::TreeViewFamilyLayouter(DataAdapter* data, int focusKey, int isMale,
-                                               const OptionMap& optionValues, const TreeSize& sizes)
-    : TreeViewLayouter(data, focusKey, isMale, optionValues, sizes) {}
+                                               OptionMap optionValues, const TreeSize& sizes)
+    : TreeViewLayouter(data, focusKey, isMale, std::move(optionValues), sizes) {}
 
 void TreeViewFamilyLayouter::layoutForFocusNID() {
     readOptions();
@@ -37,15 +37,23 @@ void TreeViewFamilyLayouter::layoutForFocusNID() {
     drawLines();
 }
 
+// Requests set one option, so the few that are set are looked up among the eight that are read.
 void TreeViewFamilyLayouter::readOptions() {
-    show.auntsUncles = boolOptionForKey(kTreeViewFamShowAuntsUnclesKey, true);
-    show.cousins = boolOptionForKey(kTreeViewFamShowCousinsKey, true);
-    show.siblings = boolOptionForKey(kTreeViewFamShowSiblingsKey, true);
-    show.siblingSpouses = boolOptionForKey(kTreeViewFamShowSiblingSpousesKey, true);
-    show.niecesNephews = boolOptionForKey(kTreeViewFamShowNeicesNephewsKey, true);
-    show.grandchildren = boolOptionForKey(kTreeViewFamShowGrandchildrenKey, true);
-    show.greatGrandparents = boolOptionForKey(kTreeViewFamShowGreatGrandparentsKey, true);
-    show.spousesOfChildren = boolOptionForKey(kTreeViewFamShowSpousesOfChildrenKey, true);
+    const std::pair<const std::string&, bool&> read[] = {
+        {kTreeViewFamShowAuntsUnclesKey, show.auntsUncles},
+        {kTreeViewFamShowCousinsKey, show.cousins},
+        {kTreeViewFamShowSiblingsKey, show.siblings},
+        {kTreeViewFamShowSiblingSpousesKey, show.siblingSpouses},
+        {kTreeViewFamShowNeicesNephewsKey, show.niecesNephews},
+        {kTreeViewFamShowGrandchildrenKey, show.grandchildren},
+        {kTreeViewFamShowGreatGrandparentsKey, show.greatGrandparents},
+        {kTreeViewFamShowSpousesOfChildrenKey, show.spousesOfChildren},
+    };
+    for (const auto& [key, value] : options) {
+        for (const auto& [readKey, shown] : read) {
+            if (key == readKey) shown = value;
+        }
+    }
 }
 
 void TreeViewFamilyLayouter::addFocusFamily() {

@@ -26,7 +26,7 @@ namespace SharedTreeViewer {
 // once, then graphIterator.
 class OLVANE_API TreeViewFamilyLayouter final : public TreeViewLayouter {
 public:
-    TreeViewFamilyLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
+    TreeViewFamilyLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                            const TreeSize& sizes);
 
     void layoutForFocusNID() override;

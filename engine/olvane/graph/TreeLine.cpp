@@ -17,27 +17,13 @@ TreeLine::TreeLine(std::initializer_list<TreePoint> points) : points_(points.beg
 
 TreeLine::TreeLine(TreeLineSegment segment) : points_{segment.firstEnd(), segment.secondEnd()} {}
 
-void TreeLine::pushPointBack(TreePoint point) {
-    points_.push_back(point);
-    lengthIsCached = false;
-}
-
 void TreeLine::pushPointFront(TreePoint point) {
     points_.insert(points_.begin(), point);
     lengthIsCached = false;
 }
 
-const TreePoint& TreeLine::pointAt(std::size_t place) const {
-    if (place >= points_.size()) throw std::out_of_range("the line is too short");
-    return points_[place];
-}
-
-TreePoint TreeLine::first() const {
-    return pointAt(0);
-}
-
-TreePoint TreeLine::last() const {
-    return pointAt(points_.size() - 1);
+void TreeLine::failAsTooShort() {
+    throw std::out_of_range("the line is too short");
 }
 
 TreeLineSegment TreeLine::frontLineSegment() const {
@@ -60,23 +46,6 @@ bool TreeLine::addLineSegmentFront(TreeLineSegment segment) {
     }
     if (segment.secondEnd() == first()) {
         pushPointFront(segment.firstEnd());
-        return true;
-    }
-    return false;
-}
-
-bool TreeLine::addLineSegmentBack(TreeLineSegment segment) {
-    if (points_.empty()) {
-        pushPointBack(segment.firstEnd());
-        pushPointBack(segment.secondEnd());
-        return true;
-    }
-    if (segment.firstEnd() == last()) {
-        pushPointBack(segment.secondEnd());
-        return true;
-    }
-    if (segment.secondEnd() == last()) {
-        pushPointBack(segment.firstEnd());
         return true;
     }
     return false;

@@ -27,11 +27,14 @@ public:
     explicit TreeLine(std::initializer_list<TreePoint> points);
     explicit TreeLine(TreeLineSegment segment);  // two points: the first end, then the second
 
-    void pushPointBack(TreePoint point);
+    void pushPointBack(TreePoint point) {
+        points_.push_back(point);
+        lengthIsCached = false;
+    }
     void pushPointFront(TreePoint point);
 
-    TreePoint first() const;
-    TreePoint last() const;
+    TreePoint first() const { return pointAt(0); }
+    TreePoint last() const { return pointAt(points_.size() - 1); }
 
     // The segment from the first point to the second.
     TreeLineSegment frontLineSegment() const;
@@ -43,7 +46,22 @@ public:
     // Joins a segment by whichever of its ends lies on the first (or last) point; the first end is tried
     // first. False, and no change, when neither end does. Any segment joins an empty line.
     bool addLineSegmentFront(TreeLineSegment segment);
-    bool addLineSegmentBack(TreeLineSegment segment);
+    bool addLineSegmentBack(TreeLineSegment segment) {
+        if (points_.empty()) {
+            pushPointBack(segment.firstEnd());
+            pushPointBack(segment.secondEnd());
+            return true;
+        }
+        if (segment.firstEnd() == last()) {
+            pushPointBack(segment.secondEnd());
+            return true;
+        }
+        if (segment.secondEnd() == last()) {
+            pushPointBack(segment.firstEnd());
+            return true;
+        }
+        return false;
+    }
 
     // The sum of the distances of all later points from the FIRST point, not from the point before: for three
     // or more points this is not the length of the polyline. (0,0) (10,0) (10,10) gives 10 + 14.142136. Hosts
@@ -60,7 +78,11 @@ public:
     std::vector<TreePoint> points() const { return std::vector<TreePoint>(points_.begin(), points_.end()); }
 
 private:
-    const TreePoint& pointAt(std::size_t place) const;
+    const TreePoint& pointAt(std::size_t place) const {
+        if (place >= points_.size()) failAsTooShort();
+        return points_[place];
+    }
+    [[noreturn]] static void failAsTooShort();
 
     static constexpr int kUsualPoints = 4;  // of a drop, a bus and a stem
 

@@ -12,7 +12,8 @@
 // Nothing in the engine reads an edge back: edges are there for hosts that walk the finished graph.
 class OLVANE_API TreeViewEdge {
 public:
-    explicit TreeViewEdge(TreeLine line) : line_(std::move(line)) {}
+    explicit TreeViewEdge(const TreeLine& line) : line_(line) {}
+    explicit TreeViewEdge(TreeLine&& line) : line_(std::move(line)) {}
     TreeViewEdge(const TreeViewEdge&) = default;
     TreeViewEdge& operator=(const TreeViewEdge&) = default;
     virtual ~TreeViewEdge();

@@ -3,8 +3,6 @@
 
 #pragma once
 
-#include <utility>
-
 #include <olvane/graph/TreeLine.h>
 #include <olvane/graph/TreeViewPerson.h>
 
@@ -14,16 +12,15 @@ namespace SharedTreeViewer {
 // who holds it, which reach the host, and to the course that an edge keeps. Pieces are not deduplicated.
 class LineCourse {
 public:
+    explicit LineCourse(TreeLine& line) : line_(line) {}
+
     void draw(TreeViewPerson& holder, float x1, float y1, float x2, float y2) {
         holder.addLineSegment(x1, y1, x2, y2, false);
         line_.addLineSegmentBack(TreeLineSegment{x1, y1, x2, y2, false});
     }
 
-    // The course, given away: nothing is drawn on it any more.
-    TreeLine takeLine() { return std::move(line_); }
-
 private:
-    TreeLine line_;
+    TreeLine& line_;
 };
 
 }  // namespace SharedTreeViewer

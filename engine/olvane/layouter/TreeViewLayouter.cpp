@@ -6,16 +6,18 @@
 
 #include <olvane/layouter/TreeViewLayouter.h>
 
+#include <utility>
+
 #ifdef __FAST_MATH__
 #error "Results are exact to the last bit: the engine must not be compiled with -ffast-math."
 #endif
 
 namespace SharedTreeViewer {
 
-TreeViewLayouter::TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
+TreeViewLayouter::TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                                    const TreeSize& sizes)
     : focusPerson(focusKey, &memory),
-      options(optionValues),
+      options(std::move(optionValues)),
       dataAdapter(data),
       treeSize(sizes),
       shownPersons(&memory) {

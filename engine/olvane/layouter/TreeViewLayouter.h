@@ -38,8 +38,8 @@ public:
     typedef TreeViewPerson::Visitor Visitor;
     typedef TreeViewPerson::Iterator Iterator;
 
-    // isMale: not 0 for a male focus. Options and sizes are copied.
-    TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
+    // isMale: not 0 for a male focus.
+    TreeViewLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                      const TreeSize& sizes);
     TreeViewLayouter(const TreeViewLayouter&) = delete;
     TreeViewLayouter& operator=(const TreeViewLayouter&) = delete;

@@ -23,6 +23,7 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <utility>
 
 namespace SharedTreeViewer {
 
@@ -67,20 +68,21 @@ void TreeViewPedigreeLayouter::addPedigreeSpouseLine(TreeViewPerson& focus, Tree
 void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeViewPerson& child,
                                                     TreeViewPerson& spouse) {
     const TreePoint at = spouse.getNodeCenter();
-    LineCourse course;
+    TreeLine line;
+    LineCourse course(line);
     if (spouse.personId == focus.personId) {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
         course.draw(spouse, at.x, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
         focus.addGenerationEdge(
-            boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &child, &focus));
+            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &focus));
     } else {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;
         course.draw(spouse, lineX, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
         TreeViewSpouseEdge* const couple = spouse.spouseEdge(&focus, TreeLine());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &child, couple));
+        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, couple));
     }
 }
 
@@ -125,11 +127,12 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
     const float middleX = cutToWholePoint((fatherAt.x + own.x + treeSize.nodeWidth) * 0.5f);
     const float ownY = cutToWholePoint(own.y + treeSize.nodeHeight * 0.5f);
     const float ownRight = cutToWholePoint(own.x + treeSize.nodeWidth);
-    LineCourse course;
+    TreeLine line;
+    LineCourse course(line);
     course.draw(person, x, middleY, middleX, middleY);
     course.draw(person, middleX, middleY, middleX, ownY);
     course.draw(person, middleX, ownY, ownRight, ownY);
-    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &person, couple));
+    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, couple));
     addParentLinesForPerson(father);
     addParentLinesForPerson(mother);
 }
@@ -142,11 +145,12 @@ void TreeViewPedigreeLayouter::addSingleParentLines(TreeViewPerson& person, Tree
     const float parentX = cutToWholePoint(parentAt.x);
     const float stubX = cutToWholePoint(treeSize.horzPadding * -0.25 + parentX);
     const float ownY = cutToWholePoint(own.y + treeSize.nodeHeight * 0.5f);
-    LineCourse course;
+    TreeLine line;
+    LineCourse course(line);
     course.draw(parent, parentX, parentY, stubX, parentY);
     course.draw(person, stubX, ownY, stubX, parentY);
     course.draw(person, own.x + treeSize.nodeWidth, ownY, stubX, ownY);
-    parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(course.takeLine(), &person, &parent));
+    parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, &parent));
     addParentLinesForPerson(parent);
 }
 

@@ -13,13 +13,14 @@
 
 #include <cmath>
 #include <cstdint>
+#include <utility>
 
 namespace SharedTreeViewer {
 
 TreeViewPedigreeLayouter::TreeViewPedigreeLayouter(DataAdapter* data, int focusKey, int isMale,
-                                                   const OptionMap& optionValues, const TreeSize& sizes,
+                                                   OptionMap optionValues, const TreeSize& sizes,
                                                    int generations, int stackDepth)
-    : TreeViewLayouter(data, focusKey, isMale, optionValues, sizes),
+    : TreeViewLayouter(data, focusKey, isMale, std::move(optionValues), sizes),
       maxGenerations(generations),
       maxStackDepth(stackDepth) {}
 

@@ -28,7 +28,7 @@ namespace SharedTreeViewer {
 // once, then graphIterator.
 class OLVANE_API TreeViewPedigreeLayouter final : public TreeViewLayouter {
 public:
-    TreeViewPedigreeLayouter(DataAdapter* data, int focusKey, int isMale, const OptionMap& optionValues,
+    TreeViewPedigreeLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                              const TreeSize& sizes, int generations, int stackDepth);
 
     void layoutForFocusNID() override;
