@@ -11,15 +11,25 @@
 #include <cstddef>
 #include <stdexcept>
 
-TreeLine::TreeLine(const std::vector<TreePoint>& points) : points_(points.begin(), points.end()) {}
+TreeLine::TreeLine(const std::vector<TreePoint>& points) {
+    for (const TreePoint& point : points) pushPointBack(point);
+}
 
-TreeLine::TreeLine(std::initializer_list<TreePoint> points) : points_(points.begin(), points.end()) {}
+TreeLine::TreeLine(std::initializer_list<TreePoint> points) {
+    for (const TreePoint& point : points) pushPointBack(point);
+}
 
-TreeLine::TreeLine(TreeLineSegment segment) : points_{segment.firstEnd(), segment.secondEnd()} {}
+TreeLine::TreeLine(TreeLineSegment segment) : TreeLine({segment.firstEnd(), segment.secondEnd()}) {}
+
+void TreeLine::pushFarPointBack(TreePoint point) {
+    if (far_.empty()) far_.assign(near_, near_ + kUsualPoints);
+    far_.push_back(point);
+}
 
 void TreeLine::pushPointFront(TreePoint point) {
-    points_.insert(points_.begin(), point);
-    lengthIsCached = false;
+    std::vector<TreePoint> points = this->points();
+    points.insert(points.begin(), point);
+    *this = TreeLine(points);
 }
 
 void TreeLine::failAsTooShort() {
@@ -33,13 +43,13 @@ TreeLineSegment TreeLine::frontLineSegment() const {
 }
 
 TreeLineSegment TreeLine::backLineSegment() const {
-    const TreePoint from = pointAt(points_.size() - 1);
-    const TreePoint to = pointAt(points_.size() - 2);
+    const TreePoint from = pointAt(all().size() - 1);
+    const TreePoint to = pointAt(all().size() - 2);
     return TreeLineSegment{from.x, from.y, to.x, to.y, false};
 }
 
 bool TreeLine::addLineSegmentFront(TreeLineSegment segment) {
-    if (points_.empty()) return addLineSegmentBack(segment);
+    if (nearCount_ == 0) return addLineSegmentBack(segment);
     if (segment.firstEnd() == first()) {
         pushPointFront(segment.secondEnd());
         return true;
@@ -54,9 +64,10 @@ bool TreeLine::addLineSegmentFront(TreeLineSegment segment) {
 float TreeLine::length() {
     if (lengthIsCached) return cachedLength;
     cachedLength = 0.0f;
-    for (std::size_t i = 1; i < points_.size(); ++i) {
-        const float dx = points_[i].x - points_[0].x;
-        const float dy = points_[i].y - points_[0].y;
+    const std::span<const TreePoint> points = all();
+    for (std::size_t i = 1; i < points.size(); ++i) {
+        const float dx = points[i].x - points[0].x;
+        const float dy = points[i].y - points[0].y;
         cachedLength += std::sqrt(dx * dx + dy * dy);
     }
     lengthIsCached = true;

@@ -3,10 +3,10 @@
 
 #pragma once
 
-#include <boost/container/small_vector.hpp>
-
 #include <cstddef>
+#include <cstdint>
 #include <initializer_list>
+#include <span>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -28,13 +28,15 @@ public:
     explicit TreeLine(TreeLineSegment segment);  // two points: the first end, then the second
 
     void pushPointBack(TreePoint point) {
-        points_.push_back(point);
         lengthIsCached = false;
+        if (nearCount_ == kUsualPoints) return pushFarPointBack(point);
+        near_[nearCount_] = point;
+        ++nearCount_;
     }
     void pushPointFront(TreePoint point);
 
     TreePoint first() const { return pointAt(0); }
-    TreePoint last() const { return pointAt(points_.size() - 1); }
+    TreePoint last() const { return pointAt(all().size() - 1); }
 
     // The segment from the first point to the second.
     TreeLineSegment frontLineSegment() const;
@@ -47,7 +49,7 @@ public:
     // first. False, and no change, when neither end does. Any segment joins an empty line.
     bool addLineSegmentFront(TreeLineSegment segment);
     bool addLineSegmentBack(TreeLineSegment segment) {
-        if (points_.empty()) {
+        if (nearCount_ == 0) {
             pushPointBack(segment.firstEnd());
             pushPointBack(segment.secondEnd());
             return true;
@@ -75,18 +77,27 @@ public:
     // Fails: std::logic_error when a chosen segment does not join; ordinary numbers cannot bring that about.
     static std::vector<TreeLine> TreeLinesFromLineSegments(std::vector<TreeLineSegment> segments);
 
-    std::vector<TreePoint> points() const { return std::vector<TreePoint>(points_.begin(), points_.end()); }
+    std::vector<TreePoint> points() const { return std::vector<TreePoint>(all().begin(), all().end()); }
 
 private:
     const TreePoint& pointAt(std::size_t place) const {
-        if (place >= points_.size()) failAsTooShort();
-        return points_[place];
+        const std::span<const TreePoint> points = all();
+        if (place >= points.size()) failAsTooShort();
+        return points[place];
     }
+    std::span<const TreePoint> all() const {
+        if (!far_.empty()) return far_;
+        return {near_, nearCount_};
+    }
+    void pushFarPointBack(TreePoint point);
     [[noreturn]] static void failAsTooShort();
 
-    static constexpr int kUsualPoints = 4;  // of a drop, a bus and a stem
+    static constexpr std::uint8_t kUsualPoints = 4;  // of a drop, a bus and a stem
 
-    boost::container::small_vector<TreePoint, kUsualPoints> points_;
+    // A line that is moved away keeps the points in near_, so it stays whole whatever it had.
+    TreePoint near_[kUsualPoints];
+    std::vector<TreePoint> far_;  // all points, where near_ is too short for them
     float cachedLength = 0.0f;
+    std::uint8_t nearCount_ = 0;
     bool lengthIsCached = false;
 };
