@@ -164,10 +164,24 @@ TEST_F(ResultText, firstPersonSetsAllFourBounds) {
 
 TEST_F(ResultText, boundsGrowWithEachPerson) {
     writeAt("17", 10.0f, 20.0f);
+    expectBounds(bounds, 10, 20, 10, 20);
     writeAt("18", -5.0f, 30.0f);
     expectBounds(bounds, -5, 20, 10, 30);
     writeAt("19", 7.0f, 25.0f);
     expectBounds(bounds, -5, 20, 10, 30);
+    writeAt("20", -9.0f, 3.0f);
+    expectBounds(bounds, -9, 3, 10, 30);
+    writeAt("21", 11.0f, 31.0f);
+    expectBounds(bounds, -9, 3, 11, 31);
+}
+
+TEST_F(ResultText, boundsBelowAndAtOneAreSetLikeAnyOther) {
+    writeAt("17", 1.0f, 1.0f);
+    expectBounds(bounds, 1, 1, 1, 1);
+    writeAt("18", 5.0f, 5.0f);
+    expectBounds(bounds, 1, 1, 5, 5);
+    writeAt("19", -3.0f, -3.0f);
+    expectBounds(bounds, -3, -3, 5, 5);
 }
 
 TEST_F(ResultText, boundThatHasReachedZeroIsTakenForUnset) {

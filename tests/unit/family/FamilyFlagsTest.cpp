@@ -144,6 +144,17 @@ TEST_F(FamilyFlags, equalCountsOfChildrenAreTakenForTheSameChildren) {
     EXPECT_TRUE(flagOf(focus)) << "now 6 is looked for and stands nowhere";
 }
 
+TEST_F(FamilyFlags, childrenWithASpouseCountAmongThoseDrawn) {
+    focus.addSpouse(2, kFemale);
+    focus.addChildWithNoOtherSpouse(5, kMale);
+    focus.addChildWithSpouse(7, 2, kMale);
+    data.spouses[0] = {2};
+    data.spouses[2] = {0};
+    data.children[0] = {6, 8};
+    flagAll();
+    EXPECT_FALSE(flagOf(focus));
+}
+
 TEST_F(FamilyFlags, equalCountsOfSpousesAreTakenForTheSameSpouses) {
     focus.addSpouse(5, kFemale);
     data.spouses[0] = {6};

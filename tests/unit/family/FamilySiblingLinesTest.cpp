@@ -181,6 +181,7 @@ TEST_F(FamilySiblingLines, parentsEdgeRunsFromTheFatherWhenTheBoxesTouch) {
     addBothParents();
     place(mother(), 55.0f, 0.0f);
     EXPECT_EQ((Course{{55, 40}, {42.5f, 40}, {55, 40}}), parentsCourse());
+    EXPECT_FALSE(data.wasAsked("getSpouses 1"));
 }
 
 TEST_F(FamilySiblingLines, parentsEdgeRunsFromTheMotherWhenTheFatherHasNoSpouses) {

@@ -28,6 +28,15 @@ TreeLineSegment segment(float x1, float y1, float x2, float y2) {
     return TreeLineSegment{x1, y1, x2, y2, false};
 }
 
+TEST(TreeLineSegment, isAPointAtTheOriginAndNoSpouseLineUntilItIsFilled) {
+    const TreeLineSegment segment;
+    EXPECT_EQ(0.0f, segment.x1);
+    EXPECT_EQ(0.0f, segment.y1);
+    EXPECT_EQ(0.0f, segment.x2);
+    EXPECT_EQ(0.0f, segment.y2);
+    EXPECT_FALSE(segment.isSpouseLine);
+}
+
 // --- Directions.
 
 struct DirectionRow {

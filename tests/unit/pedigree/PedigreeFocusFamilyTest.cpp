@@ -192,6 +192,14 @@ TEST_F(PedigreeFocusFamily, childThatHangsThereAlreadyIsEnteredAsShown) {
     EXPECT_EQ((Heights{-80}), childHeights(-1));
 }
 
+// The record of who is shown goes by the nodes that hang there, not by who was given a place.
+TEST_F(PedigreeFocusFamily, childOfASpouseAloneIsEnteredWhereItHangsThere) {
+    tellOfWife(1, {5});
+    focus.addSpouse(2, views::kFemale).addChildWithNoOtherSpouse(9, views::kMale);
+    setOut();
+    EXPECT_EQ(1u, layouter.shownPersons.count(9));
+}
+
 TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
     tellOfWife(1, {5});
     data.children[1].push_back(8);
