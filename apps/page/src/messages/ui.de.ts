@@ -139,7 +139,7 @@ export const uiGerman: UiMessages = {
         dismiss: "Schließen",
     },
     firstHint:
-        "Ein Klick stellt eine Person in die Mitte ihrer Familie. Ziehen verschiebt, das Mausrad vergrößert.",
+        "Wer angeklickt oder angetippt wird, steht im Mittelpunkt. Ziehen verschiebt; Mausrad oder zwei Finger vergrößern.",
     livingHidden: "Lebende Personen sind in dieser Datei ausgelassen.",
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),
 };

@@ -138,7 +138,7 @@ export const uiEnglish: UiMessages = {
         layout: "This picture could not be laid out. Try fewer generations or relatives.",
         dismiss: "Dismiss",
     },
-    firstHint: "Click a person to stand among that family. Drag to move, turn the wheel to zoom.",
+    firstHint: "Click or tap a person to stand among that family. Drag to move; turn the wheel or pinch to zoom.",
     livingHidden: "Living persons are left out of this file.",
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),
 };
