@@ -6,7 +6,7 @@
 #include <functional>
 #include <set>
 #include <string>
-#include <utility>
+#include <string_view>
 
 #include <olvane/Arena.h>
 #include <olvane/Export.h>
@@ -20,10 +20,10 @@ struct OLVANE_API ChildrenAdapter {
     std::string sortText;  // nothing fills it; always empty in the sets that the engine makes
     int hostOrder;         // place in the host's list, counted from 1; 0 for the child of an add-node
 
-    ChildrenAdapter(int childKey, std::string dateText, std::string hostId, int placeInList)
-        : key(childKey), date(std::move(dateText)), idText(std::move(hostId)), hostOrder(placeInList) {}
-    ChildrenAdapter(int childKey, std::string dateText, std::string hostId)  // without a place
-        : ChildrenAdapter(childKey, std::move(dateText), std::move(hostId), 0) {}
+    ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId, int placeInList)
+        : key(childKey), date(dateText), idText(hostId), hostOrder(placeInList) {}
+    ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId)  // without a place
+        : ChildrenAdapter(childKey, dateText, hostId, 0) {}
 
     // By KEY where both records have a place, not by the place: a child met earlier in the request stands
     // ahead of its siblings, and the focus, whose key is 0, ahead of all of them. Otherwise the earlier date

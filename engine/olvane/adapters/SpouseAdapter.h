@@ -6,7 +6,7 @@
 #include <functional>
 #include <set>
 #include <string>
-#include <utility>
+#include <string_view>
 
 #include <olvane/Arena.h>
 #include <olvane/Export.h>
@@ -21,13 +21,13 @@ struct OLVANE_API SpouseAdapter {
     std::string idText;  // the host's id as text
     int hostOrder;       // place in the host's list, counted from 1; 0 without a place
 
-    SpouseAdapter(int spouseKey, bool isPreferred, bool isAlive, std::string dateText, std::string hostId,
-                  int placeInList)
+    SpouseAdapter(int spouseKey, bool isPreferred, bool isAlive, std::string_view dateText,
+                  std::string_view hostId, int placeInList)
         : key(spouseKey),
           preferred(isPreferred),
           alive(isAlive),
-          date(std::move(dateText)),
-          idText(std::move(hostId)),
+          date(dateText),
+          idText(hostId),
           hostOrder(placeInList) {}
 
     // The host's order where both records have a place. Records without one: the preferred spouse first, then

@@ -18,7 +18,7 @@
 
 #include <cstdint>
 #include <stdexcept>
-#include <utility>
+#include <string_view>
 
 namespace {
 
@@ -73,9 +73,10 @@ void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, Spou
         const int spouseKey = glue.keyOfNumber(spouseId);
         const bool preferred = host(manager).isPreferredSpouse(id, spouseId);
         const bool alive = !host(manager).isPersonDead(spouseId);
-        std::string date = stringToString(host(manager).dateForPersonWithID(spouseId, false));
-        spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, std::move(date),
-                             glue.personOfKey(spouseKey), ++place);
+        const std::string date = host(manager).dateForPersonWithID(spouseId, false);
+        ViewerGlue::NumberRoom room;
+        spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, firstCharacterOf(date),
+                             glue.textOfKey(spouseKey, room), ++place);
     }
 }
 
@@ -98,13 +99,14 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
     int place = 0;
     for (const std::int64_t entry : host(manager).childrenForPersonWithID(id)) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
-        std::string date = stringToString(host(manager).dateForPersonWithID(lowBits(entry), true));
+        const std::string date = host(manager).dateForPersonWithID(lowBits(entry), true);
+        ViewerGlue::NumberRoom room;
+        const std::string_view text = glue.textOfKey(childKey, room);
         ++place;
         if (endFirst) {
-            children.emplace_hint(children.end(), childKey, std::move(date), glue.personOfKey(childKey),
-                                  place);
+            children.emplace_hint(children.end(), childKey, firstCharacterOf(date), text, place);
         } else {
-            children.emplace(childKey, std::move(date), glue.personOfKey(childKey), place);
+            children.emplace(childKey, firstCharacterOf(date), text, place);
         }
     }
 }

@@ -44,8 +44,8 @@ Utf8Form formOfLead(unsigned char lead) {
 }
 
 // 1 where no well-formed character begins the text, which is not empty.
-std::size_t lengthOfFirstCharacter(const std::string& text) {
-    const auto byteAt = [&text](std::size_t i) { return static_cast<unsigned char>(text[i]); };
+std::size_t lengthOfFirstCharacter(std::string_view text) {
+    const auto byteAt = [text](std::size_t i) { return static_cast<unsigned char>(text[i]); };
     const Utf8Form form = formOfLead(byteAt(0));
     if (form.length > text.size()) return 1;
     for (std::size_t i = 1; i < form.length; ++i) {
@@ -59,7 +59,10 @@ std::size_t lengthOfFirstCharacter(const std::string& text) {
 }  // namespace
 
 std::string stringToString(std::string text) {
-    if (text.empty()) return text;
-    text.resize(text.front() == '\0' ? 0 : lengthOfFirstCharacter(text));
-    return text;
+    return std::string(firstCharacterOf(text));
+}
+
+std::string_view firstCharacterOf(std::string_view text) {
+    const bool isNothing = text.empty() || text.front() == '\0';
+    return text.substr(0, isNothing ? 0 : lengthOfFirstCharacter(text));
 }

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 
 #include <olvane/Export.h>
 
@@ -19,3 +20,5 @@ OLVANE_API int stringToInt(std::string text);
 // what has been one record in every chart so far. The first byte where the text does not begin with a
 // well-formed UTF-8 character.
 OLVANE_API std::string stringToString(std::string text);
+// The same, as a part of the text.
+OLVANE_API std::string_view firstCharacterOf(std::string_view text);

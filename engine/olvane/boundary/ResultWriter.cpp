@@ -17,6 +17,7 @@
 
 #include <cstddef>
 #include <cstring>
+#include <string_view>
 
 namespace olvane {
 
@@ -30,23 +31,36 @@ void updateBounds(ResultBounds& bounds, int x, int y) {
     if (bounds.maxY < y || bounds.maxY == 0) bounds.maxY = y;
 }
 
+char* write(char* place, int value, char separator) {
+    char* const end = writeDecimal(place, value);
+    *end = separator;
+    return end + 1;
+}
+
 // Text put together here and appended in few pieces.
 class Piece {
 public:
     explicit Piece(std::string& text) : text_(text) {}
 
-    void add(int value, char separator) {
-        end_ = writeDecimal(end_, value);
-        *end_++ = separator;
+    void addPersonPlaceAndFlag(std::string_view person, int x, int y, bool flag) {
+        if (person.size() > kLongestDecimal) {
+            text_ += person;
+        } else {
+            end_ += person.copy(end_, kLongestDecimal);
+        }
+        *end_++ = ':';
+        end_ = write(end_, x, ':');
+        end_ = write(end_, y, ':');
+        end_ = write(end_, flag ? 1 : 0, ':');
     }
 
     void add(const TreeLineSegment& segment) {
         makeRoom();
         char* const start = end_;
-        add(wholePoint(segment.x1), ',');
-        add(wholePoint(segment.y1), ',');
-        add(wholePoint(segment.x2), ',');
-        add(wholePoint(segment.y2), '|');
+        char* place = write(start, wholePoint(segment.x1), ',');
+        place = write(place, wholePoint(segment.y1), ',');
+        place = write(place, wholePoint(segment.x2), ',');
+        end_ = write(place, wholePoint(segment.y2), '|');
         length_ = static_cast<std::size_t>(end_ - start);
     }
     // The segment that was added last, once more.
@@ -67,11 +81,10 @@ private:
     // The last segment stays where it can be copied from.
     void makeRoom() {
         if (end_ <= room_ + sizeof room_ - kLongestSegment) return;
-        char last[kLongestSegment];
-        std::memcpy(last, end_ - length_, length_);
         end_ -= length_;
+        const char* const last = end_;
         flush();
-        std::memcpy(end_, last, length_);
+        std::memmove(room_, last, length_);
         end_ += length_;
     }
 
@@ -104,16 +117,13 @@ void appendSexAndChild(std::string& text, const ViewerGlue& glue, int key) {
 }
 
 void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text, TreeViewPerson& person) {
-    const std::string personText = glue.personOfKey(person.personId);
+    ViewerGlue::NumberRoom room;
+    const std::string_view personText = glue.textOfKey(person.personId, room);
     const int x = wholePoint(person.getNodeCenter().x);
     const int y = wholePoint(person.getNodeCenter().y);
     updateBounds(bounds, x, y);
-    text += personText;
-    text += ':';
     Piece piece(text);
-    piece.add(x, ':');
-    piece.add(y, ':');
-    piece.add(person.hasNonDisplayedRelationships ? 1 : 0, ':');
+    piece.addPersonPlaceAndFlag(personText, x, y, person.hasNonDisplayedRelationships);
     addSegments(piece, person);
     piece.flush();
     if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, person.personId);

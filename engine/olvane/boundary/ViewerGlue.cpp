@@ -10,6 +10,7 @@
 
 #include <olvane/boundary/ViewerGlue.h>
 
+#include <olvane/boundary/DecimalInternal.h>
 #include <olvane/boundary/HostText.h>
 
 #include <cstdint>
@@ -17,7 +18,7 @@
 
 namespace {
 
-constexpr std::size_t kFirstSlots = 128;    // at most half of them full
+constexpr std::size_t kFirstSlots = 128;  // at most half of them full
 constexpr std::size_t kFirstAddNodes = 32;
 
 std::size_t scattered(int number) {
@@ -81,8 +82,15 @@ void ViewerGlue::growSlots() {
 }
 
 std::string ViewerGlue::personOfKey(int key) const {
+    NumberRoom room;
+    return std::string(textOfKey(key, room));
+}
+
+std::string_view ViewerGlue::textOfKey(int key, NumberRoom& room) const {
+    static_assert(sizeof room >= olvane::kLongestDecimal);
     const KeyEntry& entry = entryOfKey(key);
-    return entry.oddText != nullptr ? *entry.oddText : intToString(entry.number);
+    if (entry.oddText != nullptr) return *entry.oddText;
+    return std::string_view(room, static_cast<std::size_t>(olvane::writeDecimal(room, entry.number) - room));
 }
 
 // kNone for a text that has no key.

@@ -7,6 +7,7 @@
 
 #include <cstddef>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -73,6 +74,9 @@ public:
 
     // The id text under a key, and the number that it says (0 for none).
     std::string personOfKey(int key) const;
+    // The same text where it lies, or written into the room, which must outlive what is returned.
+    typedef char NumberRoom[11];
+    std::string_view textOfKey(int key, NumberRoom& room) const;
     int numberOfKey(int key) const { return entryOfKey(key).number; }
 
     // The first record of an add-node stands; a later one for the same text is dropped.
