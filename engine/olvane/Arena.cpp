@@ -40,20 +40,9 @@ Arena::~Arena() {
     }
 }
 
-void* Arena::take(std::size_t bytes) {
-    if (kEachPieceAlone) return ::operator new(bytes);
-    const std::size_t granules = granulesOf(bytes);
-    if (granules < kReusedSizes && returned_[granules] != nullptr) {
-        Link* const piece = returned_[granules];
-        returned_[granules] = piece->next;
-        return piece;
-    }
-    const std::size_t size = granules * kGranule;
-    if (size > left_) return cutFromNewBlock(size);
-    char* const piece = place_;
-    place_ += size;
-    left_ -= size;
-    return piece;
+void* Arena::takeAnew(std::size_t bytes) {
+    if (kEachPieceAlone) return ::operator new(bytes);  // every time, since no block is ever added
+    return cutFromNewBlock(granulesOf(bytes) * kGranule);
 }
 
 void Arena::giveBack(void* piece, std::size_t bytes) noexcept {

@@ -24,7 +24,20 @@ public:
     Arena& operator=(const Arena&) = delete;
     ~Arena();
 
-    void* take(std::size_t bytes);
+    void* take(std::size_t bytes) {
+        const std::size_t granules = granulesOf(bytes);
+        if (granules < kReusedSizes && returned_[granules] != nullptr) {
+            Link* const piece = returned_[granules];
+            returned_[granules] = piece->next;
+            return piece;
+        }
+        const std::size_t size = granules * kGranule;
+        if (size > left_) return takeAnew(bytes);
+        char* const piece = place_;
+        place_ += size;
+        left_ -= size;
+        return piece;
+    }
     // The size must be the one that was asked for.
     void giveBack(void* piece, std::size_t bytes) noexcept;
 
@@ -38,6 +51,7 @@ private:
     static std::size_t granulesOf(std::size_t bytes) {
         return bytes == 0 ? 1 : (bytes + kGranule - 1) / kGranule;
     }
+    void* takeAnew(std::size_t bytes);  // where nothing that was returned and no rest of a block serves
     void* cutFromNewBlock(std::size_t size);
     char* addBlock(std::size_t size);
 

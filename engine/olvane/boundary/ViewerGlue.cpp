@@ -18,7 +18,7 @@
 
 namespace {
 
-constexpr std::size_t kFirstSlots = 128;  // at most half of them full
+constexpr std::size_t kFirstSlots = 256;  // at most half of them full
 constexpr std::size_t kFirstAddNodes = 32;
 
 std::size_t scattered(int number) {

@@ -30,8 +30,8 @@ void TreeViewPerson::addUnownedSpouseEdge(TreeViewSpouseEdge* edge, int spouseKe
     unownedSpouseEdges[spouseKey] = edge;
 }
 
-void TreeViewPerson::addGenerationEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge) {
-    generationEdges.push_back(edge);
+void TreeViewPerson::addGenerationEdge(boost::shared_ptr<TreeViewGenerationEdge> edge) {
+    generationEdges.push_back(std::move(edge));
 }
 
 void TreeViewPerson::generationEdgeIterator(GenerationEdgeVisitor visitor) {

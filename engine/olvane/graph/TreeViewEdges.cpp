@@ -43,9 +43,9 @@ TreeViewSpouseEdge::TreeViewSpouseEdge(TreeLine line, TreeViewPerson* first, Tre
 
 TreeViewSpouseEdge::~TreeViewSpouseEdge() = default;
 
-void TreeViewSpouseEdge::addChildEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge) {
+void TreeViewSpouseEdge::addChildEdge(boost::shared_ptr<TreeViewGenerationEdge> edge) {
     if (childEdges.empty()) childEdges.reserve(kUsualChildren);
-    childEdges.push_back(edge);
+    childEdges.push_back(std::move(edge));
 }
 
 void TreeViewSpouseEdge::insertChildEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge,

@@ -86,10 +86,10 @@ TreeViewPerson& TreeViewPerson::addChildWithNoOtherSpouse(int childId, bool male
     return addChildWithSpouse(childId, kNoKey, male);
 }
 
-void TreeViewPerson::expectChildrenWithSpouse(int spouseId, std::size_t count) {
-    if (count == 0) return;
+TreeViewPerson::Persons& TreeViewPerson::childrenWithSpouse(int spouseId, std::size_t more) {
     Persons& list = childrenUnder(spouseId);
-    list.reserve(list.size() + count);
+    list.reserve(list.size() + more);
+    return list;
 }
 
 TreeViewPerson::Persons& TreeViewPerson::childrenUnder(int key) {

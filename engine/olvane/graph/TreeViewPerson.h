@@ -86,8 +86,8 @@ public:
     TreeViewPerson& addNonDisplayedSpouse(int id);
     TreeViewPerson& addChildWithSpouse(int childId, int spouseId, bool male);
     TreeViewPerson& addChildWithNoOtherSpouse(int childId, bool male);
-    // Room for so many more children under that key, where any are to come.
-    void expectChildrenWithSpouse(int spouseId, std::size_t count);
+    // The list under that key, with room for so many more children.
+    Persons& childrenWithSpouse(int spouseId, std::size_t more);
 
     // --- Plain reads and writes.
     void setGender(bool male) { gender = male; }
@@ -157,7 +157,7 @@ public:
     // the one given is dropped. The person on whom it was first asked owns the edge.
     TreeViewSpouseEdge* spouseEdge(TreeViewPerson* spouse, TreeLine line);
     void addUnownedSpouseEdge(TreeViewSpouseEdge* edge, int spouseKey);
-    void addGenerationEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge);
+    void addGenerationEdge(boost::shared_ptr<TreeViewGenerationEdge> edge);
     void generationEdgeIterator(GenerationEdgeVisitor visitor);
     void spouseEdgeIterator(const SpouseEdgeVisitor& visitor);  // owned edges alone, by ascending key
 

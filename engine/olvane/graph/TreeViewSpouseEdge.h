@@ -27,7 +27,7 @@ public:
     TreeViewSpouseEdge(TreeLine line, TreeViewPerson* first, TreeViewPerson* second, ChildEdges edges);
     ~TreeViewSpouseEdge() override;
 
-    void addChildEdge(const boost::shared_ptr<TreeViewGenerationEdge>& edge);
+    void addChildEdge(boost::shared_ptr<TreeViewGenerationEdge> edge);
 
     // Appends, whatever the position: exactly what addChildEdge does. Hosts number a couple's children by
     // this list, and an honoured position would renumber those already handed out.

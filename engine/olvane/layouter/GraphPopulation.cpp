@@ -140,10 +140,11 @@ void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterat
 }
 
 void TreeViewLayouter::addLoneChildren(TreeViewPerson& person, const Records& alone) {
-    person.expectChildrenWithSpouse(TreeViewPerson::kNoKey, alone.size());
+    if (alone.empty()) return;
+    TreeViewPerson::Persons& list = person.childrenWithSpouse(TreeViewPerson::kNoKey, alone.size());
     for (const ChildrenAdapter* record : alone) {
         admit(record->key);
-        person.addChildWithNoOtherSpouse(record->key, dataAdapter->isMale(record->key));
+        person.addChild(record->key, list, dataAdapter->isMale(record->key));
     }
 }
 
@@ -177,14 +178,15 @@ void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, Tr
     if (children.empty()) return;
     const ChildrenSet& spousesChildren = spouse.getAllChildrenVector(dataAdapter->getChildren);
     const Records common = commonRecords(children, spousesChildren, &memory);
-    person.expectChildrenWithSpouse(spouse.personId, common.size());
+    if (common.empty()) return;
+    TreeViewPerson::Persons& list = person.childrenWithSpouse(spouse.personId, common.size());
     for (const ChildrenAdapter* record : common) {
         int child = record->key;
         int other = spouse.personId;
         if (!checkIfPrefferedParent(person, child, other)) continue;
         admit(child);
         const bool male = dataAdapter->isMale(child);
-        person.addChildWithSpouse(child, spouse.personId, male);
+        person.addChild(child, list, male);
     }
 }
 
