@@ -50,7 +50,8 @@ std::string FamilyViewLayout(std::string personText,
         const int focusKey = glue.getKeyFromPerson(personText);
         const int isMale = adapter.isMale(focusKey) ? 1 : 0;
         const TreeSize treeSize = olvane::familyTreeSize();
-        SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, familyOptions(), treeSize);
+        SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, familyOptions(),
+                                                          treeSize);
         layouter.layoutForFocusNID();
         olvane::ResultBounds bounds;
         layouter.graphIterator(olvane::resultWriter(glue, bounds, text));

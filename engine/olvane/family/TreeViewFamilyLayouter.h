@@ -164,8 +164,8 @@ private:
         bool spousesOfChildren = true;
     };
     Options show;
-    float rightEdge = 0.0f;  // of what the last placement of siblings reached
-    KeySet shownKeys;        // the keys of stackedPersons while the whole display is in it
+    float rightEdge = 0.0f;                  // of what the last placement of siblings reached
+    KeySet shownKeys;                        // the keys of stackedPersons while the whole display is in it
     std::vector<TreeViewPerson*> everybody;  // the whole display, from the flags to the lines
 };
 

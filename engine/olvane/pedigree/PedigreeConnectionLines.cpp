@@ -74,8 +74,7 @@ void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeV
         const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
         course.draw(spouse, at.x, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
-        focus.addGenerationEdge(
-            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &focus));
+        focus.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &focus));
     } else {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;

@@ -92,8 +92,8 @@ void TreeViewPedigreeLayouter::graphIterator(const Visitor& visitor) {
 
 void TreeViewPedigreeLayouter::graphIteratorHelper(TreeViewPerson& person, const Visitor& visitor) {
     visitor(person);
-    visitParentsSpousesAndChildren(
-        person, [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); });
+    visitParentsSpousesAndChildren(person,
+                                   [&](TreeViewPerson& relative) { graphIteratorHelper(relative, visitor); });
 }
 
 void TreeViewPedigreeLayouter::iterateDirectLineFromFocusPerson(const DirectLineVisitor& visitor) {
