@@ -37,6 +37,7 @@ import {
     readAddress,
     type RelativeName,
     sameState,
+    strangerIn,
     type ViewName,
     type ViewState,
 } from "./view/ViewState";
@@ -134,7 +135,7 @@ export class App implements ChromeActions {
         const file = this.engine.readGedcom(bytes, name);
         if (file.persons.length === 0) {
             file.close();
-            throw new Error(this.ui.errors.noPersons);
+            throw new NoPersonsError();
         }
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
@@ -153,11 +154,13 @@ export class App implements ChromeActions {
             generations: kUsualGenerations,
             hidden: new Set(),
         };
-        const state = embedded ? readAddress(location.hash, family.persons, usual) : usual;
-        this.journey.begin(addressOf(state, family.persons));
+        const address = embedded ? location.hash : "";
+        const state = readAddress(address, family.persons, usual);
+        this.journey.begin(addressOf(state, family.persons), embedded !== null);
         this.arrive(state, null);
         performance.measure("olvane-open", { start });
         this.greet(family);
+        this.nameStranger(address);
         this.warmUp(family, state);
         if (file.diagnostics.some((one) => one.severity === "error")) {
             const summary = this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length);
@@ -183,12 +186,19 @@ export class App implements ChromeActions {
         if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
     }
 
+    private nameStranger(address: string): boolean {
+        const link = strangerIn(address, this.family!.persons);
+        if (link) this.notices.fail(this.ui.errors.stranger("\u2068" + link + "\u2069"), []);
+        return link !== "";
+    }
+
     private refuse(name: string, error: unknown): void {
         const { errors } = this.ui;
-        const text =
-            error instanceof ArchiveError ? errors.archive : errors.notGedcom("\u2068" + name + "\u2069");
-        const detail = error instanceof Error && !(error instanceof ArchiveError) ? error.message : "";
-        this.notices.fail(text, [detail, errors.hint]);
+        const file = "\u2068" + name + "\u2069";
+        if (error instanceof ArchiveError) return this.notices.fail(errors.archive, []);
+        if (error instanceof NoPersonsError) return this.notices.fail(errors.noPersons(file), []);
+        const detail = error instanceof Error ? error.message : "";
+        this.notices.fail(errors.notGedcom(file), [detail, errors.hint]);
     }
 
     // --- the way through the family ---
@@ -214,6 +224,7 @@ export class App implements ChromeActions {
         if (!this.family || !this.state) return;
         const state = readAddress(address, this.family.persons, this.state);
         if (!sameState(state, this.state)) this.arrive(state, null);
+        if (this.nameStranger(address)) this.journey.replace(addressOf(this.state, this.family.persons));
         this.showState();
     }
 
@@ -435,7 +446,7 @@ export class App implements ChromeActions {
         document.documentElement.lang = ui.language;
         this.chrome = new Chrome(ui, this, { theme: this.theme.choice, kinshipInBoxes: this.kinshipInBoxes });
         this.panel = new SidePanel(this.messages, ui, {
-            choose: (person) => this.focusOn(person, this.picture?.boxesOf(person)[0] ?? null),
+            choose: (person) => this.choose(this.family!.person(person)!),
             nextBox: (person) => this.nextBox(person),
             addressOf: (person) => addressOf({ ...this.state!, focus: person }, this.family!.persons),
         });
@@ -559,6 +570,9 @@ export class App implements ChromeActions {
         return select;
     }
 }
+
+// What was read is GEDCOM, with nobody in it.
+class NoPersonsError extends Error {}
 
 // Lets the browser show what was said so far.
 function pause(): Promise<void> {

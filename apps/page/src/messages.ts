@@ -45,12 +45,15 @@ export interface KinshipWords {
     both(near: string, far: string): string;
 }
 
+/** Of a date, or of a time that lasted. */
+export type DateMark = GedcomDate["mark"] | "since" | "until" | "lasting";
+
 /** Dates that were read; months count from 1, and years before Christ are negative. */
 export interface DateWords {
     /** "12 February 1809", "February 1809", "1809"; 0 for a month or day that is not given. */
     day(year: number, month: number, day: number): string;
-    /** Puts the mark of a date before its text: "about 1809", "between 1809 and 1811". */
-    marked(mark: GedcomDate["mark"], first: string, last: string): string;
+    /** Puts the mark of a date before its text: "about 1809", "between 1809 and 1811", "until 1811". */
+    marked(mark: DateMark, first: string, last: string): string;
     /** "born about 1809" */
     born(date: string): string;
     died(date: string): string;

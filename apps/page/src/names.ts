@@ -4,7 +4,7 @@
 // Names and dates of a person as words on the page.
 
 import type { GedcomDate, Person } from "olvane";
-import type { Messages } from "./messages";
+import type { DateMark, Messages } from "./messages";
 
 export type Direction = "ltr" | "rtl";
 
@@ -13,9 +13,9 @@ export function nameOf(person: Person, messages: Messages): string {
     return person.name || messages.unknownName;
 }
 
-/** "12 February 1809", "before 1820"; what the file says where the date could not be read. */
+/** "12 February 1809", "before 1820", "from 1809 to 1811"; the file's own words where the date was not read. */
 export function dateText(date: GedcomDate, messages: Messages): string {
-    return textOf(date, date.month, date.day, messages);
+    return textOf(date, date.month, date.day, lastingMarkOf(date), messages);
 }
 
 /** "1809–1882", "about 1809 – 1882", "born 1809", "died 1882"; empty where neither year is known. */
@@ -31,16 +31,25 @@ export function yearsOf(person: Person, messages: Messages): string {
 }
 
 function yearText(date: GedcomDate | null, messages: Messages): string {
-    return date && date.year !== 0 ? textOf(date, 0, 0, messages) : "";
+    return date && date.year !== 0 ? textOf(date, 0, 0, date.mark, messages) : "";
+}
+
+// GEDCOM writes FROM and TO of what lasted; as dates they mean no more than AFT, BEF and BET do.
+const kLasting = /^\s*(FROM|TO)\b/i;
+
+function lastingMarkOf({ mark, written }: GedcomDate): DateMark {
+    if (!kLasting.test(written)) return mark;
+    if (mark === "between") return "lasting";
+    return mark === "after" ? "since" : mark === "before" ? "until" : mark;
 }
 
 // Of the end of a range nothing but the year is known, so a range is one of years.
-function textOf(date: GedcomDate, month: number, day: number, messages: Messages): string {
+function textOf(date: GedcomDate, month: number, day: number, mark: DateMark, messages: Messages): string {
     if (date.year === 0) return date.written;
     const { dates } = messages;
-    if (date.mark !== "between") return dates.marked(date.mark, dates.day(date.year, month, day), "");
+    if (date.mark !== "between") return dates.marked(mark, dates.day(date.year, month, day), "");
     if (date.lastYear === 0 || date.lastYear === date.year) return dates.day(date.year, 0, 0);
-    return dates.marked("between", dates.day(date.year, 0, 0), dates.day(date.lastYear, 0, 0));
+    return dates.marked(mark, dates.day(date.year, 0, 0), dates.day(date.lastYear, 0, 0));
 }
 
 // Hebrew, Arabic, Syriac, Thaana, N'Ko and their neighbours, the forms for printing, the old scripts of the east,

@@ -31,6 +31,50 @@ describe("looks", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("on a phone that lies down the legend fits, and can be closed again", async () => {
+        const visit = await visitDarwins("#person=I1", { ...kPhone, viewport: { width: 640, height: 360 } });
+        await visit.dismiss();
+        assert.deepEqual(await unreachable(visit), []);
+        await visit.page.tap("#legend summary");
+        assert.ok(await visit.page.isVisible("#legend ul"));
+        assert.deepEqual(await unreachable(visit), []);
+        await visit.page.tap("#legend summary");
+        assert.ok(!(await visit.page.isVisible("#legend ul")));
+        await visit.end();
+    });
+
+    test("a file to be dropped is asked for only where one can be dropped", async () => {
+        for (const [settings, asked] of [[{}, true], [kPhone, false]]) {
+            const visit = await visitEmpty(settings);
+            assert.equal(await visit.page.isVisible("#drop-zone .drop"), asked);
+            assert.ok(await visit.page.isVisible("#choose-file"));
+            await visit.end();
+        }
+    });
+
+    test("in the system's own colours, what is on differs from what is off", async () => {
+        for (const colorScheme of ["light", "dark"]) {
+            const visit = await visitDarwins("#person=I1&hide=cousins", { forcedColors: "active", colorScheme });
+            const { page } = visit;
+            const fill = (selector) => page.evaluate((one) => getComputedStyle(document.querySelector(one)).backgroundColor, selector);
+            assert.notEqual(await fill("#view-family"), await fill("#view-pedigree"));
+            await page.click("#options-button");
+            assert.notEqual(await fill("#show-siblings"), await fill("#show-cousins"));
+            await page.fill("#search", "emma");
+            assert.notEqual(await fill("#found-0"), await fill("#found-1"));
+            const [text, paper] = await page.evaluate(() => {
+                const styleOf = (selector) => getComputedStyle(document.querySelector(selector));
+                const canvas = document.createElement("div");
+                canvas.style.cssText = "color: CanvasText; background: Canvas";
+                document.body.append(canvas);
+                const { color, backgroundColor } = getComputedStyle(canvas);
+                return [styleOf("#tree .name").fill === color, styleOf("#tree").backgroundColor === backgroundColor];
+            });
+            assert.ok(text && paper, "the picture is drawn in them, too");
+            await visit.end();
+        }
+    });
+
     test("on a phone everything can be reached, and the panel is a sheet", async () => {
         const visit = await visitDarwins("#person=I1", kPhone);
         const { page } = visit;

@@ -35,6 +35,30 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("the way through one family does not lead into the next", async () => {
+        const visit = await visitEmpty();
+        await visit.drop("darwin-wedgwood.ged", kDarwins);
+        await visit.untilFamily();
+        await visit.goTo("Emma Wedgwood 1808");
+        await visit.goTo("Ralph Vaughan Williams");
+        const small = "0 HEAD\n0 @I2@ INDI\n1 NAME Ada /Two/\n0 @I90@ INDI\n1 NAME Ben /Ninety/\n0 @I1@ INDI\n1 NAME Cid /One/\n0 TRLR\n";
+        await visit.drop("small.ged", small);
+        await visit.page.waitForFunction(() => document.title === "small");
+        await visit.still();
+        assert.equal(await visit.focus(), "I2");
+        assert.ok(await visit.page.isDisabled("#back"));
+        await visit.page.goBack();
+        await visit.still();
+        assert.equal(await visit.focus(), "I2", "the browser's button led to Emma, who has the same record");
+        assert.equal(await visit.hash(), "#person=I2");
+        await visit.goTo("Cid");
+        await visit.click("#back");
+        assert.equal(await visit.focus(), "I2");
+        await visit.click("#forward");
+        assert.equal(await visit.focus(), "I1");
+        await visit.end();
+    });
+
     test("a file over the page is invited to fall, and one that leaves is not", async () => {
         const visit = await visitEmpty();
         const drag = (type) =>
@@ -68,6 +92,9 @@ describe("opening", kTwoAtOnce, () => {
         assert.ok(await visit.page.isVisible("#choose-file"));
         await visit.drop("empty.ged", "0 HEAD\n0 TRLR\n");
         await visit.page.waitForFunction(() => /empty\.ged/.test(document.querySelector("#notices").textContent));
+        const told = await visit.page.innerText("#notices");
+        assert.match(told, /holds no person/);
+        assert.doesNotMatch(told, /could not be read|0 HEAD/, "it is GEDCOM, and was read");
         await visit.drop("broken.gdz", Buffer.from("PK\u0003\u0004 not an archive"));
         await visit.page.waitForFunction(() => /archive/i.test(document.querySelector("#notices").textContent));
         await visit.end();
@@ -103,6 +130,20 @@ describe("opening", kTwoAtOnce, () => {
             assert.ok(await visit.focus());
             await visit.end();
         }
+    });
+
+    test("a link to a person who is not in the file says so, and the address is put right", async () => {
+        const visit = await visitDarwins("#person=I9999&view=pedigree");
+        const told = () => visit.page.innerText('#notices [role="alert"]');
+        assert.match(await told(), /I9999.*not in this file/);
+        const here = await visit.focus();
+        assert.equal(await visit.hash(), `#person=${here}&view=pedigree`);
+        await visit.page.evaluate(() => (location.hash = "#person=NOBODY"));
+        await visit.page.waitForFunction(() => /NOBODY/.test(document.querySelector("#notices").textContent));
+        await visit.still();
+        assert.equal(await visit.focus(), here);
+        assert.equal(await visit.hash(), `#person=${here}`);
+        await visit.end();
     });
 });
 

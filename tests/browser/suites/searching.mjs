@@ -52,6 +52,32 @@ describe("searching", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("Enter in an emptied field leads to nobody, whoever was found before", async () => {
+        const visit = await visitDarwins();
+        await visit.page.fill("#search", "erasmus");
+        assert.ok((await found(visit)).length > 0);
+        await visit.goTo("");
+        assert.equal(await visit.focus(), "I1");
+        await visit.page.fill("#search", "emma wedgwood 1808");
+        await visit.page.press("#search", "Escape");
+        await visit.press("Enter");
+        assert.equal(await visit.focus(), "I2", "a list that was closed opens for what stands in the field");
+        await visit.end();
+    });
+
+    test("keys that compose a word choose nobody", async () => {
+        const visit = await visitDarwins();
+        await visit.page.fill("#search", "emma");
+        await visit.page.evaluate(() => {
+            const composing = { key: "Enter", isComposing: true, bubbles: true, cancelable: true };
+            document.getElementById("search").dispatchEvent(new KeyboardEvent("keydown", composing));
+        });
+        await visit.still();
+        assert.equal(await visit.focus(), "I1");
+        assert.equal(await visit.page.inputValue("#search"), "emma");
+        await visit.end();
+    });
+
     test("nobody found is said, and Escape closes the list", async () => {
         const visit = await visitDarwins();
         await visit.page.fill("#search", "zzz");

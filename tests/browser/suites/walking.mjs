@@ -176,6 +176,31 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("whoever is chosen in the panel has the keys, too", async () => {
+        const visit = await visitDarwins();
+        await visit.page.focus('#side-panel a[href*="person=I12"]');
+        await visit.press("Enter");
+        assert.equal(await visit.focus(), "I12");
+        assert.equal(await visit.keysOn(), "I12");
+        await visit.end();
+    });
+
+    test("a button that has come to its end hands the keys to the other", async () => {
+        const visit = await visitDarwins();
+        const holder = () => visit.page.evaluate(() => document.activeElement.id);
+        await visit.goTo("Emma Wedgwood 1808");
+        await visit.page.focus("#back");
+        await visit.press("Enter");
+        await visit.page.waitForFunction(() => document.getElementById("back").disabled);
+        assert.equal(await holder(), "forward");
+        await visit.click("#options-button");
+        await visit.page.focus("#generations-fewer");
+        for (let i = 0; i < 3; ++i) await visit.press("Enter");
+        assert.equal(await visit.page.innerText("#generations"), "2");
+        assert.equal(await holder(), "generations-more");
+        await visit.end();
+    });
+
     test("each box is read out with name, years and kinship", async () => {
         const visit = await visitDarwins();
         await visit.fit();
@@ -237,6 +262,17 @@ describe("walking", kTwoAtOnce, () => {
         await visit.press("Shift+ArrowLeft");
         await visit.press("0");
         assert.ok(Math.abs((await visit.placing()).k - fitted.k) < 0.001);
+        await visit.end();
+    });
+
+    test("quick clicks on a zoom button add up", async () => {
+        const visit = await visitDarwins("#person=I1", { reducedMotion: "no-preference" });
+        const before = await visit.placing();
+        await visit.page.evaluate(() => {
+            for (let i = 0; i < 3; ++i) document.getElementById("zoom-in").click();
+        });
+        await visit.still();
+        assert.ok(Math.abs((await visit.placing()).k / before.k - 1.35 ** 3) < 0.01);
         await visit.end();
     });
 

@@ -3,8 +3,7 @@
 
 // The German table.
 
-import type { GedcomDate } from "olvane";
-import type { Messages } from "../messages";
+import type { DateMark, Messages } from "../messages";
 import { germanKinship } from "./kinship.de";
 
 const kMonths = [
@@ -36,13 +35,16 @@ export const german: Messages = {
             if (!monthText) return yearText(year);
             return `${day > 0 ? `${day}. ` : ""}${monthText} ${yearText(year)}`;
         },
-        marked(mark: GedcomDate["mark"], first: string, last: string): string {
-            const texts: Record<GedcomDate["mark"], string> = {
+        marked(mark: DateMark, first: string, last: string): string {
+            const texts: Record<DateMark, string> = {
                 exact: first,
                 about: `um ${first}`,
                 before: `vor ${first}`,
                 after: `nach ${first}`,
                 between: `zwischen ${first} und ${last}`,
+                since: `ab ${first}`,
+                until: `bis ${first}`,
+                lasting: `von ${first} bis ${last}`,
             };
             return texts[mark];
         },

@@ -3,8 +3,7 @@
 
 // The English table.
 
-import type { GedcomDate } from "olvane";
-import type { Messages } from "../messages";
+import type { DateMark, Messages } from "../messages";
 import { englishKinship } from "./kinship.en";
 
 const kMonths = [
@@ -36,13 +35,16 @@ export const english: Messages = {
             if (!monthText) return yearText(year);
             return `${day > 0 ? `${day} ` : ""}${monthText} ${yearText(year)}`;
         },
-        marked(mark: GedcomDate["mark"], first: string, last: string): string {
-            const texts: Record<GedcomDate["mark"], string> = {
+        marked(mark: DateMark, first: string, last: string): string {
+            const texts: Record<DateMark, string> = {
                 exact: first,
                 about: `about ${first}`,
                 before: `before ${first}`,
                 after: `after ${first}`,
                 between: `between ${first} and ${last}`,
+                since: `from ${first}`,
+                until: `until ${first}`,
+                lasting: `from ${first} to ${last}`,
             };
             return texts[mark];
         },

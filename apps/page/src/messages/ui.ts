@@ -24,6 +24,7 @@ export interface UiMessages {
     readonly views: { readonly label: string; readonly family: string; readonly pedigree: string };
     readonly back: string;
     readonly forward: string;
+    readonly zoom: string;
     readonly zoomIn: string;
     readonly zoomOut: string;
     readonly fit: string;
@@ -106,7 +107,8 @@ export interface UiMessages {
     readonly errors: {
         readonly notGedcom: (name: string) => string;
         readonly hint: string;
-        readonly noPersons: string;
+        readonly noPersons: (name: string) => string;
+        readonly stranger: (link: string) => string;
         readonly tooLarge: string;
         readonly tooNew: string;
         readonly archive: string;

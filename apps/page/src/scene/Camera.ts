@@ -36,6 +36,7 @@ export class Camera {
     private readonly selection;
     private measured: { width: number; height: number } | null = null;
     private travel = 0; // the frame that is asked for; 0 at rest
+    private aim: Placing | null = null; // of the travel
 
     constructor(
         private readonly surface: SVGSVGElement,
@@ -89,9 +90,11 @@ export class Camera {
         if (prefersStillness()) return this.jump(target);
         const from = this.placing;
         const start = performance.now();
+        this.aim = target;
         const step = (now: number) => {
             const part = Math.min(1, Math.max(0, now - start) / time);
             this.travel = part < 1 ? requestAnimationFrame(step) : 0;
+            if (part === 1) this.aim = null;
             this.jump(between(from, target, eased(part), this.size));
         };
         this.travel = requestAnimationFrame(step);
@@ -100,11 +103,13 @@ export class Camera {
     stop(): void {
         cancelAnimationFrame(this.travel);
         this.travel = 0;
+        this.aim = null;
     }
 
     zoomBy(factor: number): void {
         const { width, height } = this.size;
-        const { k, x, y } = this.placing;
+        // Quick clicks add up, however far the picture has come.
+        const { k, x, y } = this.aim ?? this.placing;
         const next = Math.min(kMostZoom, Math.max(kLeastZoom, k * factor));
         const ratio = next / k;
         this.travelTo(

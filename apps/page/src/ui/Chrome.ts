@@ -107,8 +107,7 @@ export class Chrome {
 
     showState(state: ViewState, canGoBack: boolean, canGoForward: boolean): void {
         const { back, forward, family, pedigree } = this.buttons;
-        back.disabled = !canGoBack;
-        forward.disabled = !canGoForward;
+        enable([back, canGoBack], [forward, canGoForward]);
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
@@ -118,8 +117,10 @@ export class Chrome {
         this.disable("niecesNephews", state.hidden.has("siblings"));
         this.shownGenerations = state.generations;
         this.generations.textContent = String(state.generations);
-        this.fewer.disabled = state.generations <= kLeastGenerations;
-        this.more.disabled = state.generations >= kMostGenerations;
+        enable(
+            [this.fewer, state.generations > kLeastGenerations],
+            [this.more, state.generations < kMostGenerations],
+        );
     }
 
     showPanelState(open: boolean): void {
@@ -180,7 +181,7 @@ export class Chrome {
         const { ui, actions } = this;
         return html(
             "div",
-            { class: "zoom", role: "group", "aria-label": ui.fit },
+            { class: "zoom", role: "group", "aria-label": ui.zoom },
             this.iconButton("zoom-in", "plus", ui.zoomIn, () => actions.zoomIn()),
             this.iconButton("zoom-out", "minus", ui.zoomOut, () => actions.zoomOut()),
             this.iconButton("fit", "fit", ui.fit, () => actions.fit()),
@@ -273,7 +274,7 @@ export class Chrome {
             html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
         const list = html(
             "ul",
-            {},
+            { tabindex: 0, "aria-label": ui.legend },
             row(sign("male", silhouette("male")), items.male),
             row(sign("female", silhouette("female")), items.female),
             row(sign("other", silhouette("other")), items.other),
@@ -332,4 +333,14 @@ export class Chrome {
         const input = this.switches.get(name);
         if (input) input.disabled = disabled;
     }
+}
+
+type Enabling = readonly [button: HTMLButtonElement, enabled: boolean];
+
+// Of two that lead opposite ways. A button that has come to its end hands the keys to the other.
+function enable(one: Enabling, other: Enabling): void {
+    const holder = document.activeElement;
+    for (const [button, enabled] of [one, other]) button.disabled = !enabled;
+    if (holder === one[0] && !one[1]) other[0].focus();
+    else if (holder === other[0] && !other[1]) one[0].focus();
 }

@@ -72,7 +72,8 @@ export class SearchBox {
         });
         input.addEventListener("blur", () => this.close());
         input.addEventListener("keydown", (event) => {
-            if (this.key(event.key)) event.preventDefault();
+            // While a word is being composed, the keys are the composer's.
+            if (!event.isComposing && this.key(event.key)) event.preventDefault();
             // Keys of the field are no keys of the picture.
             event.stopPropagation();
         });
@@ -83,7 +84,10 @@ export class SearchBox {
     private key(name: string): boolean {
         if (name === "ArrowDown") return this.move(1);
         if (name === "ArrowUp") return this.move(-1);
-        if (name === "Enter") return this.choose(this.found[Math.max(0, this.current)]);
+        if (name === "Enter") {
+            if (this.list.hidden) this.look();
+            return this.choose(this.found[Math.max(0, this.current)]);
+        }
         if (name !== "Escape") return false;
         if (this.list.hidden) this.input.value = "";
         this.close();
@@ -153,6 +157,7 @@ export class SearchBox {
 
     private close(): void {
         this.list.hidden = true;
+        this.found = [];
         this.current = -1;
         this.input.setAttribute("aria-expanded", "false");
         this.input.removeAttribute("aria-activedescendant");

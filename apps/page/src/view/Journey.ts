@@ -6,11 +6,17 @@
 
 interface Step {
     readonly olvane: number;
+    readonly family: number;
 }
+
+const kOwnFamily = 0; // that the page itself holds; one opened later has the time of its opening
 
 export class Journey {
     private step = 0;
     private last = 0;
+    private first = 0;
+    private family = kOwnFamily;
+    private address = "";
 
     // goTo is told an address that the browser went to.
     constructor(private readonly goTo: (address: string) => void) {
@@ -18,17 +24,20 @@ export class Journey {
     }
 
     get canGoBack(): boolean {
-        return this.step > 0;
+        return this.step > this.first;
     }
 
     get canGoForward(): boolean {
         return this.step < this.last;
     }
 
-    // The address that the way begins at; nothing lies before it but what was there before the page was
-    // loaded again.
-    begin(address: string): void {
-        this.step = this.last = stepOf(history.state) ?? 0;
+    // The address that the way begins at. Before it lies at most what was there before the page, with a family
+    // of its own, was loaded again: the way through another family does not lead into this one.
+    begin(address: string, isOwnFamily: boolean): void {
+        const here = stepOf(history.state);
+        this.family = isOwnFamily ? kOwnFamily : Date.now();
+        this.step = this.last = here?.olvane ?? 0;
+        this.first = isOwnFamily && here?.family === kOwnFamily ? 0 : this.step;
         this.write("replaceState", address);
     }
 
@@ -51,26 +60,30 @@ export class Journey {
     }
 
     private write(how: "pushState" | "replaceState", address: string): void {
+        this.address = address;
         try {
-            history[how]({ olvane: this.step } satisfies Step, "", address);
+            history[how]({ olvane: this.step, family: this.family } satisfies Step, "", address);
         } catch {
             // Some browsers allow no history in a file that lies on disk; all else goes on without it.
         }
     }
 
-    // An address typed by hand has no step of ours and comes behind the one before.
+    // An address typed by hand has no step of ours and comes behind the one before. One of a family that was
+    // open before names persons of that family, so there everything stays as it is.
     private arrived(state: unknown): void {
         const step = stepOf(state);
-        if (step !== null) this.step = step;
-        else {
+        if (step) {
+            this.step = step.olvane;
+            this.first = Math.min(this.first, this.step);
+            this.write("replaceState", step.family === this.family ? location.hash : this.address);
+        } else {
             this.last = ++this.step;
             this.write("replaceState", location.hash);
         }
-        this.goTo(location.hash);
+        this.goTo(this.address);
     }
 }
 
-function stepOf(state: unknown): number | null {
-    const step = (state as Step | null)?.olvane;
-    return typeof step === "number" ? step : null;
+function stepOf(state: unknown): Step | null {
+    return typeof (state as Step | null)?.olvane === "number" ? (state as Step) : null;
 }

@@ -81,6 +81,12 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
     };
 }
 
+// The person whom an address names and the file does not hold; empty where there is none.
+export function strangerIn(address: string, persons: readonly Person[]): string {
+    const parts = new URLSearchParams(address.replace(/^#/, ""));
+    return focusIn(parts, persons) ? "" : (parts.get("person") ?? parts.get("number") ?? "");
+}
+
 export function clampGenerations(generations: number): number {
     if (!Number.isFinite(generations)) return kUsualGenerations;
     return Math.min(kMostGenerations, Math.max(kLeastGenerations, Math.round(generations)));
