@@ -339,7 +339,7 @@ export class App implements ChromeActions {
     }
 
     home(): void {
-        if (this.picture) this.scene.activate(this.picture.focusBox);
+        this.scene.home();
     }
 
     openFile(): void {
@@ -399,6 +399,7 @@ export class App implements ChromeActions {
     escape(): void {
         this.tooltip.hide();
         this.notices.clear();
+        this.chrome.closeLegend();
         this.panel.draw(false);
     }
 

@@ -40,6 +40,11 @@ describe("looks", kTwoAtOnce, () => {
         assert.deepEqual(await unreachable(visit), []);
         await visit.page.tap("#legend summary");
         assert.ok(!(await visit.page.isVisible("#legend ul")));
+        await visit.page.tap("#legend summary");
+        await visit.page.focus("#legend ul");
+        await visit.press("Escape");
+        assert.ok(!(await visit.page.isVisible("#legend ul")));
+        assert.equal(await visit.page.evaluate(() => document.activeElement.tagName), "SUMMARY");
         await visit.end();
     });
 

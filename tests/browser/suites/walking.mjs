@@ -265,6 +265,35 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("the way back to the focus leads near enough to read it", async () => {
+        const visit = await visitDarwins();
+        await visit.fit();
+        const far = await visit.placing();
+        await visit.click("#home");
+        assert.ok((await visit.placing()).k > 2 * far.k);
+        assert.equal(await visit.keysOn(), "I1");
+        const { x, y } = await visit.middleOf("I1");
+        assert.ok(x > 0 && x < 940 && y > 56 && y < 800, `${x} ${y}`);
+        await visit.end();
+    });
+
+    test("a window of another size has the same in its middle", async () => {
+        const visit = await visitDarwins();
+        const middle = async () => {
+            const stage = await visit.page.locator("#tree").boundingBox();
+            const focus = await visit.middleOf("I1");
+            return [focus.x - stage.x - stage.width / 2, focus.y - stage.y - stage.height / 2];
+        };
+        const [x, y] = await middle();
+        for (const size of [{ width: 1100, height: 500 }, { width: 500, height: 900 }, { width: 1280, height: 800 }]) {
+            await visit.page.setViewportSize(size);
+            await visit.still();
+            const [newX, newY] = await middle();
+            assert.ok(Math.abs(newX - x) < 2 && Math.abs(newY - y) < 2, `${size.width}: ${newX - x}, ${newY - y}`);
+        }
+        await visit.end();
+    });
+
     test("quick clicks on a zoom button add up", async () => {
         const visit = await visitDarwins("#person=I1", { reducedMotion: "no-preference" });
         const before = await visit.placing();

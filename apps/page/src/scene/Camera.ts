@@ -28,7 +28,7 @@ const kTravelTime = 420; // ms
 const kButtonsWidth = 64; // px, of the buttons over the right edge
 const kCornerHeight = 36; // px that the legend and its neighbours take beyond the margin
 const kWideWindow = 700; // px; a narrower one has no room to leave for them
-const kReadable = 0.6; // the least zoom at which names are read with ease
+export const kReadable = 0.6; // the least zoom at which names are read with ease
 const kUsualZoom = 0.85;
 
 export class Camera {
@@ -69,8 +69,14 @@ export class Camera {
         });
     }
 
+    // What stood in the middle of the window stays there.
     resized(): void {
+        const before = this.measured;
         this.measured = null;
+        const { width, height } = this.size;
+        if (!before || (before.width === width && before.height === height)) return;
+        const { k, x, y } = this.aim ?? this.placing;
+        this.place({ k, x: x + (width - before.width) / 2, y: y + (height - before.height) / 2 });
     }
 
     // What is in sight, in world points.

@@ -13,7 +13,7 @@ import type { Box, Picture } from "../view/Picture";
 import { kLineStyles, type LineStyle } from "../view/lineStyles";
 import { encloses, grown, type Rectangle, touches } from "../view/SpatialGrid";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
-import { Camera, eased, type Placing, type Point } from "./Camera";
+import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 
 const kMostReadable = 420; // boxes in sight
 const kGlideTime = 520; // ms
@@ -112,6 +112,13 @@ export class Scene {
 
     fit(): void {
         if (this.picture) this.camera.travelTo(this.camera.fitting(this.picture.bounds));
+    }
+
+    // To the focus, and near enough to read.
+    home(): void {
+        if (!this.picture) return;
+        this.activate(this.picture.focusBox);
+        if (this.camera.placing.k < kReadable) this.camera.travelTo(this.opening(this.picture));
     }
 
     get active(): Box | null {

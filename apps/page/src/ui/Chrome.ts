@@ -62,6 +62,7 @@ export class Chrome {
     private readonly more: HTMLButtonElement;
     private readonly options: Popover;
     private readonly files: Popover;
+    private readonly legend: HTMLDetailsElement;
     private shownGenerations = 0;
 
     constructor(
@@ -98,7 +99,8 @@ export class Chrome {
             this.filePanel(),
         );
         this.bar = this.barElement();
-        this.corner = html("div", { class: "corner" }, this.legend(), this.zoomButtons());
+        this.legend = this.legendPanel();
+        this.corner = html("div", { class: "corner" }, this.legend, this.zoomButtons());
     }
 
     showFamily(title: string, persons: string): void {
@@ -125,6 +127,11 @@ export class Chrome {
 
     showPanelState(open: boolean): void {
         this.buttons.panel.setAttribute("aria-pressed", String(open));
+    }
+
+    closeLegend(): void {
+        if (this.legend.contains(document.activeElement)) this.legend.querySelector("summary")!.focus();
+        this.legend.open = false;
     }
 
     showDiagnostics(found: readonly Diagnostic[], persons: number): void {
@@ -266,7 +273,7 @@ export class Chrome {
         return html("div", { class: "dialog-head" }, html("h2", { id }, title), close);
     }
 
-    private legend(): HTMLElement {
+    private legendPanel(): HTMLDetailsElement {
         const { ui } = this;
         const items = ui.legendItems;
         const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
