@@ -22,6 +22,12 @@ TEST(NumberToText, isPlainDecimalWithALeadingMinusAlone) {
     EXPECT_EQ("-2147483648", intToString(std::numeric_limits<int>::min()));
 }
 
+TEST(NumberToText, writesEveryNumberOfUpToFiveDigitsPlainly) {
+    for (int number = -100001; number <= 100001; ++number) {
+        ASSERT_EQ(std::to_string(number), intToString(number));
+    }
+}
+
 struct TextAndNumber {
     const char* text;
     int number;

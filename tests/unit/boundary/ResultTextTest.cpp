@@ -67,6 +67,39 @@ TEST_F(ResultText, segmentsAreCutTowardZeroInAllFourNumbers) {
     EXPECT_EQ("17:0:0:0:-72,72,0,0|;", text);
 }
 
+// -2147483648 is the longest number; each segment here differs from the one before it.
+TEST_F(ResultText, anyNumberOfTheLongestSegmentsIsWritten) {
+    TreeViewPerson person = personAt("-2147483647", -3.0e9f, -3.0e9f);
+    std::string expected = "-2147483647:-2147483648:-2147483648:0:";
+    glue.addAddNodeValue("-2147483647", true, "17", "-2");
+    for (int i = 0; i < 60; ++i) {
+        const float y = i % 2 == 0 ? -3.0e9f : 3.0e9f;
+        person.addLineSegment(-3.0e9f, y, -3.0e9f, -3.0e9f, false);
+        expected += i % 2 == 0 ? "-2147483648,-2147483648,-2147483648,-2147483648|"
+                               : "-2147483648,2147483647,-2147483648,-2147483648|";
+    }
+    write(person);
+    EXPECT_EQ(expected + ":M:17;", text);
+}
+
+TEST_F(ResultText, segmentIsRepeatedWhereverItStandsInALongList) {
+    for (int before = 0; before < 60; ++before) {
+        TreeViewPerson person = personAt("17", 0.0f, 0.0f);
+        std::string expected = "17:0:0:0:";
+        for (int i = 0; i < before; ++i) {
+            person.addLineSegment(static_cast<float>(i), 1000000.0f, -1000000.0f, -1000000.0f, false);
+            expected += std::to_string(i) + ",1000000,-1000000,-1000000|";
+        }
+        for (int i = 0; i < 40; ++i) {
+            person.addLineSegment(-3.0e9f, 7.0f, 3.0e9f, 7.0f, false);
+            expected += "-2147483648,7,2147483647,7|";
+        }
+        text.clear();
+        write(person);
+        EXPECT_EQ(expected + ";", text) << before;
+    }
+}
+
 TEST_F(ResultText, numbersThatNoIntHoldsBecomeTheNearestAndNotANumberBecomesZero) {
     writeAt("17", 3.0e9f, -3.0e9f);
     writeAt("17", std::numeric_limits<float>::infinity(), -std::numeric_limits<float>::infinity());
