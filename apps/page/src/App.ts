@@ -164,7 +164,7 @@ export class App implements ChromeActions {
         this.warmUp(family, state);
         if (file.diagnostics.some((one) => one.severity === "error")) {
             const summary = this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length);
-            this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.diagnostics.showModal());
+            this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.openDiagnostics());
         }
     }
 

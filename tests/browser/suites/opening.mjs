@@ -105,6 +105,10 @@ describe("opening", kTwoAtOnce, () => {
         await visit.drop("broken.ged", brokenFamily());
         await visit.untilFamily();
         assert.deepEqual(await visit.shown(), ["I1", "I2", "I3"]);
+        await visit.page.click("#notices .warned .plain");
+        assert.ok(await visit.page.isVisible("#diagnostics"));
+        await visit.page.keyboard.press("Escape");
+        assert.equal(await visit.page.evaluate(() => document.activeElement.id), "diagnostics-button");
         await visit.page.click("#diagnostics-button");
         assert.ok(await visit.page.isVisible("#diagnostics"));
         const told = await visit.page.innerText("#diagnostics");

@@ -87,7 +87,7 @@ export class Chrome {
         this.keys = this.keyDialog();
         this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
         this.diagnosticsButton = this.iconButton("diagnostics-button", "warning", "", () =>
-            this.diagnostics.showModal(),
+            this.openDiagnostics(),
         );
         this.diagnosticsButton.hidden = true;
         this.options = new Popover(
@@ -148,6 +148,12 @@ export class Chrome {
             html("p", { class: "quiet" }, ui.diagnostics.summary(persons, found.length)),
             html("ul", { class: "diagnostics", tabindex: 0, "aria-label": label }, ...items),
         );
+    }
+
+    // When the dialog is closed, the keys are on the button that opens it again.
+    openDiagnostics(): void {
+        this.diagnosticsButton.focus();
+        this.diagnostics.showModal();
     }
 
     private diagnosticItem({ line, severity, message, hint }: Diagnostic): HTMLLIElement {
