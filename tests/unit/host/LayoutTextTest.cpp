@@ -25,6 +25,7 @@ TEST(LayoutText, emptyTextHoldsNobody) {
 TEST(LayoutText, recordThatNobodyFilledHasNothing) {
     EXPECT_EQ(LayoutRecord{}, (LayoutRecord{0, 0, 0, false, {}, std::nullopt}));
     EXPECT_EQ(AddNodeSuffix{}, (AddNodeSuffix{false, 0}));
+    EXPECT_EQ(LayoutSegment{}, (LayoutSegment{0, 0, 0, 0}));
     EXPECT_EQ(writeLayoutText({LayoutRecord{}}), "0:0:0:0:;");
 }
 
