@@ -4,7 +4,7 @@
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
-import { rightToLeftFamily } from "../support/families.mjs";
+import { brokenFamily, rightToLeftFamily } from "../support/families.mjs";
 
 const kPhone = { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true, deviceScaleFactor: 2 };
 
@@ -78,6 +78,18 @@ describe("looks", kTwoAtOnce, () => {
             assert.ok(text && paper, "the picture is drawn in them, too");
             await visit.end();
         }
+    });
+
+    test("on the narrowest phone the bar has two rows, and a long name leaves room for the years", async () => {
+        const long = brokenFamily().replace("Ada", "Ada Augusta Wilhelmina Theodora Philippa").replace("7 DATE far too deep", "1 BIRT\n2 DATE 1815");
+        const settings = { ...kPhone, viewport: { width: 320, height: 568 } };
+        const visit = await visitFamily(long, { name: "long.ged", focus: "I1" }, settings);
+        await visit.page.waitForSelector("#diagnostics-button", { state: "visible" });
+        const boxOf = (selector) => visit.page.locator(selector).boundingBox();
+        assert.ok((await boxOf(".bar")).height < 120);
+        const years = await boxOf("#side-panel header .years");
+        assert.ok(years.height > 0 && years.y + years.height <= 568);
+        await visit.end();
     });
 
     test("on a phone everything can be reached, and the panel is a sheet", async () => {

@@ -80,7 +80,7 @@ export const uiGerman: UiMessages = {
         female: "Frau",
         other: "Geschlecht unbekannt",
         focus: "Hauptperson des Bildes",
-        hidden: "Nicht gezeigte Verwandte: anklicken",
+        hidden: "Nicht gezeigte Verwandte: antippen oder klicken",
         missing: "Elternteil unbekannt",
         divorced: "Geschieden",
         adopted: "Adoptiert oder Pflegekind",
