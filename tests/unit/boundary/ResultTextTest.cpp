@@ -67,6 +67,12 @@ TEST_F(ResultText, segmentsAreCutTowardZeroInAllFourNumbers) {
     EXPECT_EQ("17:0:0:0:-72,72,0,0|;", text);
 }
 
+TEST_F(ResultText, idTextThatIsLongerThanAnyNumberIsWrittenWhole) {
+    writeAt("00000000000000000017", 1.0f, 2.0f);
+    writeAt("00000000018", 3.0f, 4.0f);
+    EXPECT_EQ("00000000000000000017:1:2:0:;00000000018:3:4:0:;", text);
+}
+
 // -2147483648 is the longest number; each segment here differs from the one before it.
 TEST_F(ResultText, anyNumberOfTheLongestSegmentsIsWritten) {
     TreeViewPerson person = personAt("-2147483647", -3.0e9f, -3.0e9f);

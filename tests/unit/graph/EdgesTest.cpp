@@ -49,6 +49,13 @@ protected:
     TreeViewPerson secondChild{4};
 };
 
+TEST(Edge, keepsACopyOfTheLineThatItIsMadeFrom) {
+    TreeLine line = lineFrom(1.0f, 2.0f);
+    const TreeViewEdge edge(line);
+    line.pushPointBack(TreePoint{9.0f, 9.0f});
+    EXPECT_EQ((std::vector<TreePoint>{{1.0f, 2.0f}, {11.0f, 2.0f}}), edge.line().points());
+}
+
 TEST_F(CouplesEdge, isMadeOnceAndKeepsItsFirstLine) {
     TreeViewSpouseEdge* const first = man.spouseEdge(&woman, lineFrom(1.0f, 2.0f));
     EXPECT_EQ(first, woman.spouseEdge(&man, lineFrom(8.0f, 9.0f)));
