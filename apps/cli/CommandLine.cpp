@@ -298,7 +298,7 @@ private:
         addViewAlone(*page_, pageOptions_.view);
         page_
             ->add_option("--title", pageOptions_.title,
-                         "Title of the page; made of the focus's name when not given")
+                         "Title of the page; made of the name of --focus when not given")
             ->type_name("TEXT");
         addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year);
         needsFile(focus);
