@@ -22,7 +22,8 @@ struct OLVANE_API ChildrenAdapter {
 
     ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId, int placeInList)
         : key(childKey), date(dateText), idText(hostId), hostOrder(placeInList) {}
-    ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId)  // without a place
+    // Without a place: hostOrder 0.
+    ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId)
         : ChildrenAdapter(childKey, dateText, hostId, 0) {}
 
     // By KEY where both records have a place, not by the place: a child met earlier in the request stands
