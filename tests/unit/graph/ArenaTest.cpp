@@ -71,7 +71,8 @@ TEST(Arena, noPieceReachesIntoAnother) {
     Arena arena;
     Pieces pieces(arena);
     for (std::size_t bytes = 1; bytes < 3000; bytes += 7) pieces.take(bytes);
-    for (const std::size_t bytes : {4079U, 4080U, 4081U, 8175U, 8176U, 8177U, 70000U, 1U, 200000U}) pieces.take(bytes);
+    for (const std::size_t bytes : {4079U, 4080U, 4081U, 8175U, 8176U, 8177U, 70000U, 1U, 200000U})
+        pieces.take(bytes);
     pieces.fill();
     EXPECT_EQ(pieces.disturbed(), 0u);
 }
