@@ -72,7 +72,7 @@ export class App implements ChromeActions {
     private readonly live = html("div", { id: "live", class: "unseen", "aria-live": "polite" });
     private readonly stage = html("main", { class: "stage" });
     private readonly cover = html("div", { class: "cover", hidden: true });
-    private readonly input = fileInput((file) => void this.openDropped(file));
+    private readonly input = fileInput((file) => void this.openDropped([file]));
     private readonly surface = svg("svg", { id: "tree", role: "application" });
     private readonly hint = html("p", { id: "tree-hint", class: "unseen" });
     private readonly scene: Scene;
@@ -97,7 +97,7 @@ export class App implements ChromeActions {
             },
         });
         this.overview = new Overview(this.scene.camera);
-        takeDrops(this.cover, (file) => void this.openDropped(file));
+        takeDrops(this.cover, (files) => void this.openDropped(files));
         addEventListener("keydown", (event) => this.key(event));
         new ResizeObserver(() => {
             this.scene.resized();
@@ -116,7 +116,9 @@ export class App implements ChromeActions {
         }
     }
 
-    async openDropped(file: File): Promise<void> {
+    // One family at a time: of several files the first is opened, and the page says so.
+    async openDropped([file, ...others]: readonly File[]): Promise<void> {
+        if (!file) return;
         this.notices.clear();
         this.welcome.showReading(file.name);
         await pause();
@@ -124,6 +126,7 @@ export class App implements ChromeActions {
             if (file.size > kMostBytes) throw new Error(this.ui.errors.tooLarge);
             const bytes = new Uint8Array(await file.arrayBuffer());
             this.open(isArchive(bytes) ? await gedcomInArchive(bytes) : bytes, file.name, null);
+            if (others.length > 0) this.notices.tell(this.ui.firstOfFiles("\u2068" + file.name + "\u2069"));
         } catch (error) {
             this.refuse(file.name, error);
         }
@@ -137,6 +140,9 @@ export class App implements ChromeActions {
             file.close();
             throw new NoPersonsError();
         }
+        // Of an empty page only a link as it was followed is meant for the first file; what we wrote named
+        // persons of another.
+        const isLinked = embedded !== null || (this.family === null && history.state === null);
         const title = embedded?.title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "");
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
         this.family?.close();
@@ -154,7 +160,7 @@ export class App implements ChromeActions {
             generations: kUsualGenerations,
             hidden: new Set(),
         };
-        const address = embedded ? location.hash : "";
+        const address = isLinked ? location.hash : "";
         const state = readAddress(address, family.persons, usual);
         this.journey.begin(addressOf(state, family.persons), embedded !== null);
         this.arrive(state, null);

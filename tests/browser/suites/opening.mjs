@@ -35,6 +35,34 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("of several files that are dropped the first opens, and the page says which", async () => {
+        const visit = await visitEmpty();
+        const other = "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 TRLR\n";
+        await visit.dropAll([["darwin-wedgwood.ged", kDarwins], ["small.ged", other]]);
+        await visit.untilFamily();
+        assert.equal(await visit.page.title(), "darwin-wedgwood");
+        assert.match(await visit.page.innerText("#notices"), /Of the files .*darwin-wedgwood\.ged.* was opened/);
+        await visit.end();
+    });
+
+    test("a link to a person of a file that is still to come finds that person in it", async () => {
+        const visit = await visitEmpty({}, "#person=I5&view=pedigree");
+        await visit.drop("darwin-wedgwood.ged", kDarwins);
+        await visit.untilFamily();
+        assert.equal(await visit.focus(), "I5");
+        assert.equal(await visit.hash(), "#person=I5&view=pedigree");
+        await visit.drop("small.ged", "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 @I5@ INDI\n1 NAME Ben /Five/\n0 TRLR\n");
+        await visit.page.waitForFunction(() => document.title === "small");
+        await visit.still();
+        assert.equal(await visit.focus(), "A", "the link named a person of the first file");
+        await visit.page.reload();
+        await visit.drop("darwin-wedgwood.ged", kDarwins);
+        await visit.untilFamily();
+        assert.notEqual(await visit.hash(), "#person=A", "the address was that of another file");
+        assert.ok(!(await visit.page.isVisible('#notices [role="alert"]')), "nobody followed a link");
+        await visit.end();
+    });
+
     test("the way through one family does not lead into the next", async () => {
         const visit = await visitEmpty();
         await visit.drop("darwin-wedgwood.ged", kDarwins);

@@ -85,14 +85,20 @@ export class Visit {
 
     /** Drags a file over the page and lets it fall. */
     async drop(name, bytes) {
+        await this.dropAll([[name, bytes]]);
+    }
+
+    async dropAll(files) {
         const data = await this.page.evaluateHandle(
-            ([name, base64]) => {
+            (files) => {
                 const transfer = new DataTransfer();
-                const bytes = Uint8Array.from(atob(base64), (letter) => letter.charCodeAt(0));
-                transfer.items.add(new File([bytes], name));
+                for (const [name, base64] of files) {
+                    const bytes = Uint8Array.from(atob(base64), (letter) => letter.charCodeAt(0));
+                    transfer.items.add(new File([bytes], name));
+                }
                 return transfer;
             },
-            [name, Buffer.from(bytes).toString("base64")],
+            files.map(([name, bytes]) => [name, Buffer.from(bytes).toString("base64")]),
         );
         await this.page.dispatchEvent("body", "dragover", { dataTransfer: data });
         await this.page.dispatchEvent("body", "drop", { dataTransfer: data });

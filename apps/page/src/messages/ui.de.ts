@@ -143,5 +143,6 @@ export const uiGerman: UiMessages = {
     firstHint:
         "Wer angeklickt oder angetippt wird, steht im Mittelpunkt. Ziehen verschiebt; Mausrad oder zwei Finger vergrößern.",
     livingHidden: "Lebende Personen sind in dieser Datei ausgelassen.",
+    firstOfFiles: (name) => `Von den abgelegten Dateien wurde ${name} geöffnet.`,
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),
 };

@@ -142,5 +142,6 @@ export const uiEnglish: UiMessages = {
     },
     firstHint: "Click or tap a person to stand among that family. Drag to move; turn the wheel or pinch to zoom.",
     livingHidden: "Living persons are left out of this file.",
+    firstOfFiles: (name) => `Of the files that were dropped, ${name} was opened.`,
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),
 };

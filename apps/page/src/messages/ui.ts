@@ -118,6 +118,7 @@ export interface UiMessages {
     };
     readonly firstHint: string;
     readonly livingHidden: string;
+    readonly firstOfFiles: (name: string) => string;
     readonly personCount: (n: number) => string;
 }
 

@@ -22,7 +22,7 @@ export function fileInput(take: (file: File) => void): HTMLInputElement {
     return input;
 }
 
-export function takeDrops(cover: HTMLElement, take: (file: File) => void): void {
+export function takeDrops(cover: HTMLElement, take: (files: readonly File[]) => void): void {
     const holdsFiles = (event: DragEvent) => event.dataTransfer?.types.includes("Files") ?? false;
     addEventListener("dragover", (event) => {
         if (!holdsFiles(event)) return;
@@ -35,9 +35,9 @@ export function takeDrops(cover: HTMLElement, take: (file: File) => void): void 
     });
     addEventListener("drop", (event) => {
         cover.hidden = true;
-        const file = event.dataTransfer?.files[0];
-        if (!file) return;
+        const files = [...(event.dataTransfer?.files ?? [])];
+        if (files.length === 0) return;
         event.preventDefault();
-        take(file);
+        take(files);
     });
 }
