@@ -204,7 +204,7 @@ export class App implements ChromeActions {
         if (error instanceof ArchiveError) return this.notices.fail(errors.archive, []);
         if (error instanceof NoPersonsError) return this.notices.fail(errors.noPersons(file), []);
         const detail = error instanceof Error ? error.message : "";
-        this.notices.fail(errors.notGedcom(file), [detail, errors.hint]);
+        this.notices.fail(errors.notGedcom(file), [this.ui.diagnostics.remark(detail), errors.hint]);
     }
 
     // --- the way through the family ---

@@ -149,6 +149,30 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("the remarks on a broken file are said in the reader's own language", async () => {
+        const remarksIn = async (locale) => {
+            const visit = await visitEmpty({ locale });
+            await visit.drop("broken.ged", brokenFamily());
+            await visit.untilFamily();
+            const remarks = await visit.page.locator("#diagnostics :is(.message, .hint)").allTextContents();
+            await visit.end();
+            return remarks;
+        };
+        const english = await remarksIn("en");
+        const german = await remarksIn("de");
+        assert.equal(german.length, english.length);
+        assert.ok(german.includes("keine Zeile mit Ebene und Schlüsselwort (this is no line at all)"), german.join("; "));
+        assert.deepEqual(german.filter((remark) => english.includes(remark)), [], "still in English");
+    });
+
+    test("why a file is refused is said in the reader's own language", async () => {
+        const visit = await visitEmpty({ locale: "de" });
+        await visit.drop("leer.ged", "");
+        await visit.page.waitForSelector('#notices [role="alert"]');
+        assert.match(await visit.page.innerText("#notices"), /leer\.ged: ist leer/);
+        await visit.end();
+    });
+
     test("a family in the page opens by itself at the person of the address", async () => {
         const visit = await visitDarwins("#person=I5");
         assert.equal(await visit.focus(), "I5");

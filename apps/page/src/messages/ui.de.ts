@@ -3,6 +3,8 @@
 
 // German.
 
+import { translatorOf } from "./remarks";
+import { germanRemarks } from "./remarks.de";
 import type { UiMessages } from "./ui";
 
 export const uiGerman: UiMessages = {
@@ -127,6 +129,7 @@ export const uiGerman: UiMessages = {
         line: (n) => `Zeile ${n}`,
         severities: { error: "Fehler", warning: "Warnung", note: "Hinweis" },
         furtherOnes: (n) => `und ${n} weitere`,
+        remark: translatorOf(germanRemarks),
     },
     errors: {
         notGedcom: (name) => `${name} ließ sich nicht als Familiendatei lesen.`,

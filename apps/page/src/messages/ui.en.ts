@@ -127,6 +127,7 @@ export const uiEnglish: UiMessages = {
         line: (n) => `line ${n}`,
         severities: { error: "Error", warning: "Warning", note: "Note" },
         furtherOnes: (n) => `and ${n} more`,
+        remark: (english) => english,
     },
     errors: {
         notGedcom: (name) => `${name} could not be read as a family file.`,

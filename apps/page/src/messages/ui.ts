@@ -103,6 +103,8 @@ export interface UiMessages {
         readonly line: (n: number) => string;
         readonly severities: { readonly error: string; readonly warning: string; readonly note: string };
         readonly furtherOnes: (n: number) => string;
+        /** A remark of the reader, which speaks English. */
+        readonly remark: (english: string) => string;
     };
     readonly errors: {
         readonly notGedcom: (name: string) => string;

@@ -163,8 +163,8 @@ export class Chrome {
             { class: severity },
             html("span", { class: "severity" }, diagnostics.severities[severity]),
             line > 0 && html("span", { class: "line" }, diagnostics.line(line)),
-            html("span", { class: "message", dir: "auto" }, message),
-            Boolean(hint) && html("span", { class: "hint", dir: "auto" }, hint),
+            html("span", { class: "message", dir: "auto" }, diagnostics.remark(message)),
+            Boolean(hint) && html("span", { class: "hint", dir: "auto" }, diagnostics.remark(hint)),
         );
     }
 
