@@ -92,8 +92,7 @@ public:
 
     std::string dateForPersonWithID(std::int64_t personId, bool isBirth) override {
         olvane_date date;
-        ask([&] { return host_.date_of(host_.context, personId, isBirth ? 1 : 0, &date); });
-        if (date.lacksMemory) throw std::bad_alloc();
+        askInto(date, [&] { return host_.date_of(host_.context, personId, isBirth ? 1 : 0, &date); });
         return std::move(date.text);
     }
 
@@ -119,6 +118,17 @@ private:
         if (code != 0) throw HostFailure{code};
     }
 
+    // For the opaque answers. One that found no memory is why the callback failed, if it did.
+    template <class OpaqueAnswer, class Question>
+    static void askInto(const OpaqueAnswer& answer, Question question) {
+        try {
+            ask(question);
+        } catch (const HostFailure&) {
+            if (!answer.lacksMemory) throw;
+        }
+        if (answer.lacksMemory) throw std::bad_alloc();
+    }
+
     std::int64_t parentFrom(ParentCallback callback, std::int64_t personId) const {
         std::int64_t parent = kPersonNotFound;
         ask([&] { return callback(host_.context, personId, &parent); });
@@ -127,8 +137,7 @@ private:
 
     std::vector<std::int64_t> listFrom(ListCallback callback, std::int64_t personId) const {
         olvane_person_list list;
-        ask([&] { return callback(host_.context, personId, &list); });
-        if (list.lacksMemory) throw std::bad_alloc();
+        askInto(list, [&] { return callback(host_.context, personId, &list); });
         return std::move(list.ids);
     }
 

@@ -40,7 +40,8 @@ typedef enum olvane_status {
     OLVANE_INVALID_ARGUMENT = 1, /* a null pointer, a missing callback, or an option out of its range */
     OLVANE_INVALID_PERSON = 2,   /* the low 32 bits of the focus's id say no number of 1 or more */
     OLVANE_HOST_FAILED = 3,      /* a callback reported failure; the layout holds what came before */
-    OLVANE_LAYOUT_FAILED = 4, /* the family's data leave no picture, such as a relative with an id below 1 */
+    OLVANE_LAYOUT_FAILED =
+        4, /* the family's data leave no picture: some relatives with an id below 1 do that */
     OLVANE_OUT_OF_MEMORY = 5,
     OLVANE_NESTED_CALL = 6 /* asked for by a callback of a layout that is still running on this thread */
 } olvane_status;
@@ -53,7 +54,7 @@ OLVANE_C_API const char* olvane_version(void);
 
 /* ---- The host's data ----------------------------------------------------------------------------------- */
 
-/* The answer for a parent whom the host does not know. */
+/* The answer for a parent whom the host does not know; it stands there when the callback begins. 0 and -1 are not. */
 #define OLVANE_PERSON_NOT_FOUND INT64_MAX
 
 /* Answers of a callback that are no plain numbers. Both start empty and live only within the callback. */
@@ -72,11 +73,16 @@ OLVANE_C_API olvane_status olvane_date_set(olvane_date* date, const char* text);
  *
  * Units: ids are the host's own, 1 and more for real persons; only their low 32 bits count. A callback is
  *     never asked about an id below 1.
+ * Nobody: an unknown parent is OLVANE_PERSON_NOT_FOUND, and lists hold known persons alone. An answer below 1
+ *     is not refused: it may be drawn as a box too many, be taken for an add-node of the engine's own, or end
+ *     the layout with OLVANE_LAYOUT_FAILED.
  * Holds: all eight are set. They are asked many times for the same person, since no answer is kept, and must
  *     agree with themselves within one layout. They may contradict each other: the layout takes them as told.
  * Fails: a callback returns 0, or any other number to report a failure. The layout then ends with what it
  *     has, with OLVANE_HOST_FAILED, and keeps the number for olvane_layout_host_code. A C++ callback that
- *     throws has failed with the number -1. A callback must not leave by longjmp.
+ *     throws has failed with the number -1, and nothing tells it from one that returned -1. A callback must
+ *     not leave by longjmp. Where the list or the date of a callback has found no memory, the layout ends with
+ *     OLVANE_OUT_OF_MEMORY, whatever the callback returns.
  */
 typedef struct olvane_host {
     void* context; /* handed to every callback, and otherwise left alone */
@@ -109,10 +115,12 @@ typedef struct olvane_host {
 #define OLVANE_SHOW_SPOUSES_OF_CHILDREN 0x80u
 #define OLVANE_SHOW_ALL 0xFFu
 
-/* A layout takes a few hundred bytes of stack for each generation; so many fit in any thread's. */
+/* A pedigree takes a few hundred bytes of stack for each generation: 1000 need half a megabyte of stack. */
 #define OLVANE_MOST_GENERATIONS 1000
 
-/* The sizes of the drawing, in points. All are finite. */
+/* The sizes of the drawing, in points. All are finite, else OLVANE_INVALID_ARGUMENT. Nothing more is asked:
+   with 0 and negative sizes boxes overlap or run the other way, and a place beyond 32 bits stands at INT32_MAX
+   or INT32_MIN. */
 typedef struct olvane_sizes {
     float node_width;       /* of one person's box */
     float node_height;      /* of one person's box */

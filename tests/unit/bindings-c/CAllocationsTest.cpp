@@ -42,8 +42,31 @@ olvane_host bareHost() {
     return host;
 }
 
-TEST(CMemory, thatRunsOutAnywhereIsAStatus) {
-    const olvane_host host = bareHost();
+// The same, but it looks, and reports a failure as its own.
+olvane_host lookingHost() {
+    olvane_host host = bareHost();
+    host.spouses_of = [](void*, std::int64_t person, olvane_person_list* spouses) {
+        const std::int64_t spouse = person == 17 ? 42 : 17;
+        if (person != 17 && person != 42) return 0;
+        return olvane_person_list_append(spouses, &spouse, 1) == OLVANE_OK ? 0 : 1;
+    };
+    host.children_of = [](void*, std::int64_t person, olvane_person_list* children) {
+        const std::int64_t child = 5;
+        if (person != 17 && person != 42) return 0;
+        return olvane_person_list_append(children, &child, 1) == OLVANE_OK ? 0 : 1;
+    };
+    host.date_of = [](void*, std::int64_t, int, olvane_date* date) {
+        const char* const text = "a date that is too long to lie within its own text";
+        return olvane_date_set(date, text) == OLVANE_OK ? 0 : 1;
+    };
+    return host;
+}
+
+// Whether the host looks.
+class CMemory : public testing::TestWithParam<bool> {};
+
+TEST_P(CMemory, thatRunsOutAnywhereIsAStatus) {
+    const olvane_host host = GetParam() ? lookingHost() : bareHost();
     const std::int64_t before = unit::allocationsMade();
     const unit::Answer whole = unit::familyOf(host, 17);
     const std::int64_t needed = unit::allocationsMade() - before;
@@ -64,5 +87,8 @@ TEST(CMemory, thatRunsOutAnywhereIsAStatus) {
     }
     EXPECT_EQ(expected, unit::familyOf(host, 17).text());
 }
+
+INSTANTIATE_TEST_SUITE_P(Hosts, CMemory, testing::Bool(),
+                         [](const auto& tested) { return tested.param ? "looking" : "heedless"; });
 
 }  // namespace

@@ -12,6 +12,8 @@
 #include <thread>
 #include <vector>
 
+#include <pthread.h>
+
 #include <gtest/gtest.h>
 
 #include <olvane/family/FamilyOptions.h>
@@ -172,6 +174,45 @@ TEST(COptions, outOfTheirRangeAreRefused) {
               }));
 }
 
+TEST(COptions, takeAnyFiniteSize) {
+    CallbackHost host(family("17+42: 5"));
+    olvane_options options;
+    olvane_options_default(&options);
+    for (const float width : {0.0f, -55.0f, 3e38f}) {
+        options.sizes.node_width = width;
+        const Answer answer = familyOf(host.callbacks(), 17, &options);
+        EXPECT_EQ(OLVANE_OK, answer.status) << width;
+        std::int32_t right = std::numeric_limits<std::int32_t>::min();
+        for (const olvane_record& record : answer.records()) right = std::max(right, record.x);
+        EXPECT_EQ(width == 3e38f, right == std::numeric_limits<std::int32_t>::max()) << right;
+    }
+}
+
+// What happens to a host that answers a number below 1 where it knows nobody, as the header tells.
+TEST(CNobody, isNotANumberBelow1) {
+    const auto answerWithFather = [](std::int64_t father) {
+        CaseFile told = family("17");
+        told.fathers[17] = father;
+        return layoutOf(told);
+    };
+    const auto kindsOf = [](const Answer& answer, std::int64_t id) {
+        std::vector<olvane_record_kind> kinds;
+        for (const olvane_record& record : answer.records()) {
+            if (record.id == id) kinds.push_back(record.kind);
+        }
+        return kinds;
+    };
+    const Answer nobody = answerWithFather(OLVANE_PERSON_NOT_FOUND);
+    EXPECT_EQ(layoutOf(family("17")).text(), nobody.text());
+    const Answer zero = answerWithFather(0);
+    EXPECT_EQ(OLVANE_OK, zero.status);
+    EXPECT_EQ(std::vector<olvane_record_kind>{OLVANE_PERSON}, kindsOf(zero, 0));
+    const Answer addNode = answerWithFather(-1);
+    EXPECT_EQ(OLVANE_OK, addNode.status);
+    EXPECT_EQ(2u, kindsOf(addNode, -1).size());
+    EXPECT_EQ(OLVANE_LAYOUT_FAILED, answerWithFather(-5).status);
+}
+
 TEST(CFailures, ofAnyCallbackAtAnyTimeAreReported) {
     CallbackHost sound(family(kThreeGenerations));
     ASSERT_EQ(OLVANE_OK, familyOf(sound.callbacks(), 17).status);
@@ -318,6 +359,37 @@ TEST(CThreads, layOutTheirOwnFamiliesAtOnce) {
     second.join();
     EXPECT_EQ(0, differences);
 }
+
+#ifdef OLVANE_FRAMES_ARE_PLAIN
+// A line of fathers, as long as a pedigree may be.
+void* layOutMostGenerations(void* status) {
+    CaseFile told;
+    told.focus = 1;
+    for (std::int64_t person = 1; person < OLVANE_MOST_GENERATIONS; ++person) {
+        told.fathers[person] = person + 1;
+        told.children[person + 1] = {person};
+    }
+    CallbackHost host(told);
+    olvane_options options;
+    olvane_options_default(&options);
+    options.generations = OLVANE_MOST_GENERATIONS;
+    options.flag_depth = OLVANE_MOST_GENERATIONS;
+    *static_cast<olvane_status*>(status) = pedigreeOf(host.callbacks(), 1, &options).status;
+    return nullptr;
+}
+
+TEST(CThreads, withHalfAMegabyteOfStackHoldMostGenerations) {
+    pthread_attr_t attributes;
+    ASSERT_EQ(0, pthread_attr_init(&attributes));
+    ASSERT_EQ(0, pthread_attr_setstacksize(&attributes, std::size_t{512} * 1024));
+    pthread_t thread;
+    olvane_status status = OLVANE_LAYOUT_FAILED;
+    ASSERT_EQ(0, pthread_create(&thread, &attributes, layOutMostGenerations, &status));
+    ASSERT_EQ(0, pthread_join(thread, nullptr));
+    EXPECT_EQ(OLVANE_OK, status);
+    pthread_attr_destroy(&attributes);
+}
+#endif
 
 TEST(CVersion, hasThreeNumbers) {
     EXPECT_EQ(std::string(OLVANE_EXPECTED_VERSION), olvane_version());
