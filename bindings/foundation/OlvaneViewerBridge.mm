@@ -21,16 +21,22 @@ namespace {
 
 typedef id<OlvaneViewerManagerWrapProtocol> Host;
 
+// The list is asked for its count at each place anew, so one that changes while it is read is read to its
+// present end. All entries are read before the first question about one of them, since the engine takes a list
+// as a whole: a host must not change a list when it is asked for a date.
 std::vector<std::int64_t> idsOf(NSArray* list) {
     std::vector<std::int64_t> ids;
-    const NSUInteger count = [list count];
-    for (NSUInteger i = 0; i < count; ++i) ids.push_back([[list objectAtIndex:i] integerValue]);
+    for (NSUInteger i = 0; i < [list count]; ++i) ids.push_back([[list objectAtIndex:i] integerValue]);
     return ids;
 }
 
 // The bytes of the 16-bit form up to the first zero byte, which ends a date of ASCII characters behind its
 // first one. Deliberately narrow: longer texts would tell records apart that have been one in every chart so
-// far.
+// far. A first character whose low byte is zero, such as U+4E00, makes an empty date.
+//
+// The engine cuts these bytes again, to what it takes for their first character in UTF-8. That changes no
+// layout: dates are compared only where one of the two records is of an add-node's child, and its date is empty.
+// So all that counts is whether there are any bytes.
 std::string narrowDate(NSString* date) {
     const char* bytes = [date cStringUsingEncoding:NSUnicodeStringEncoding];
     if (!bytes) throw std::invalid_argument("no date");

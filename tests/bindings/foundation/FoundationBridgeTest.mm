@@ -8,8 +8,10 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include <support/CaseRun.h>
 #include <support/FamilyMaker.h>
@@ -47,7 +49,6 @@ protected:
         CaseFile told = family("2f: 17 18");
         told.focus = 17;
         told.births[17] = date;
-        EXPECT_EQ(support::layoutText(told), familyOf(told)) << date;
         return familyOf(told);
     }
 
@@ -68,6 +69,31 @@ TEST_F(FoundationBridge, givesTheTextOfTheEngineForManyFamilies) {
         const CaseFile told = maker.any();
         ASSERT_EQ(support::layoutText(told), familyOf(told)) << support::formatCase(told);
     }
+}
+
+TEST_F(FoundationBridge, asksTheSameQuestionsAsTheEngine) {
+    CaseFile told = family(kThreeGenerations);
+    told.births = {{5, "1850"}, {6, "1848"}, {17, "1820"}, {18, "1818"}};
+    told.dates = {{4, "1815"}, {42, "1846"}};
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(told);
+    ASSERT_EQ(support::layoutText(told), valuesOf(host, 17));
+    std::vector<std::string> calls = support::runCase(told, false, true);
+    calls.erase(calls.begin());  // the text
+    EXPECT_EQ(calls, [host trace]);
+    EXPECT_LT(0, std::count(calls.begin(), calls.end(), "call isPreferredSpouse 4 3"));
+}
+
+TEST_F(FoundationBridge, readsTheCountOfAListAtEachPlaceAnew) {
+    EXPECT_EQ(familyOf(family("17+42: 5 6")),
+              valuesOf(hostOf<ShrinkingListHost>(family("17+42: 5 6 7")), 17));
+}
+
+TEST_F(FoundationBridge, leavesNothingOfAHostsAnswersBehind) {
+    BareListHost* host = hostOf<BareListHost>(family(kThreeGenerations));
+    OlvaneViewerBridge* bridge = [[[OlvaneViewerBridge alloc] initWithManagerWrap:host] autorelease];
+    const int before = [BareListHost listsAlive];
+    EXPECT_LT(0u, [[bridge valuesForPersonId:17] length]);
+    EXPECT_EQ(before, [BareListHost listsAlive]);
 }
 
 TEST_F(FoundationBridge, takesANilListForAnEmptyOne) {
@@ -91,6 +117,29 @@ TEST_F(FoundationBridge, endsALayoutWhereTheHostRaises) {
     EXPECT_NE("", familyOf(family(kThreeGenerations)));
 }
 
+TEST_F(FoundationBridge, endsALayoutWhereAListRaises) {
+    EXPECT_EQ("", valuesOf(hostOf<RaisingListHost>(family("17+42: 5")), 17));
+    EXPECT_EQ(familyOf(family("17+42")), valuesOf(hostOf<RaisingListHost>(family("17+42")), 17));
+}
+
+TEST_F(FoundationBridge, endsALayoutWhereAListHoldsNoNumber) {
+    EXPECT_EQ("", valuesOf(hostOf<NullListHost>(family("17+42: 5")), 17));
+    EXPECT_EQ(familyOf(family("17+42")), valuesOf(hostOf<NullListHost>(family("17+42")), 17));
+}
+
+TEST_F(FoundationBridge, endsALayoutWhereTheHostThrowsAnyObject) {
+    EXPECT_EQ("", valuesOf(hostOf<ThrowingHost>(family("17+42")), 17));
+}
+
+TEST_F(FoundationBridge, takesNoHostForOneThatAnswers0) {
+    CaseFile told;
+    told.focus = 17;
+    told.fathers[17] = 0;
+    told.mothers[17] = 0;
+    EXPECT_EQ(familyOf(told), valuesOf(nil, 17));
+    EXPECT_NE(std::string::npos, valuesOf(nil, 17).find(";0:"));
+}
+
 TEST_F(FoundationBridge, endsALayoutAtANilDate) {
     EXPECT_EQ("", valuesOf(hostOf<NilDateHost>(family("17+42")), 17));
     EXPECT_NE("", valuesOf(hostOf<NilDateHost>(family("17")), 17));
@@ -100,7 +149,15 @@ TEST_F(FoundationBridge, tellsAnEmptyDateFromAnyOther) {
     const std::string dated = textWithBirth("1850");
     EXPECT_NE(dated, textWithBirth(""));
     EXPECT_EQ(dated, textWithBirth("2"));
-    EXPECT_EQ(dated, textWithBirth("\xC3\xA9t\xC3\xA9 1850"));
+    EXPECT_EQ(dated, textWithBirth("\u00E9t\u00E9 1850"));
+    EXPECT_EQ(dated, textWithBirth("\u4E01 1850"));
+    EXPECT_EQ(dated, textWithBirth("\u5F01 1850"));
+}
+
+TEST_F(FoundationBridge, takesADateForEmptyWhoseFirstCharacterEndsInAZeroByte) {
+    EXPECT_EQ(textWithBirth(""), textWithBirth("\u0100 1850"));
+    EXPECT_EQ(textWithBirth(""), textWithBirth("\u4E00 1850"));
+    EXPECT_NE(textWithBirth(""), textWithBirth("\u00E9t\u00E9 1850"));
 }
 
 TEST_F(FoundationBridge, countsTheLow32BitsOfAnId) {

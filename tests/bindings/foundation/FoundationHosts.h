@@ -5,6 +5,9 @@
 
 #import <olvane/foundation/OlvaneViewerManagerWrapProtocol.h>
 
+#include <string>
+#include <vector>
+
 #include <support/CaseFile.h>
 
 // A case's data source as a host on Foundation has it. Where the case says that a call throws, it raises an
@@ -14,6 +17,8 @@
 }
 - (id)initWithCase:(const support::CaseFile&)told;
 + (int)alive;
+// The questions so far, in the form of the engine's own traces.
+- (const std::vector<std::string>&)trace;
 @end
 
 // The same, with nil for every empty list.
@@ -26,4 +31,22 @@
 
 // The same, with lists that know count and objectAtIndex: alone, of numbers that know integerValue alone.
 @interface BareListHost : CaseFoundationHost
+// How many of its lists live.
++ (int)listsAlive;
+@end
+
+// The same, with lists of children that lose their last entry when the first one is read.
+@interface ShrinkingListHost : CaseFoundationHost
+@end
+
+// The same, with lists of children that raise at each look at an entry.
+@interface RaisingListHost : CaseFoundationHost
+@end
+
+// The same, with lists of children that hold NSNull.
+@interface NullListHost : CaseFoundationHost
+@end
+
+// The same, throwing an object that is no NSException where it is asked for children.
+@interface ThrowingHost : CaseFoundationHost
 @end

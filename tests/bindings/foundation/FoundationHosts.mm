@@ -11,6 +11,7 @@
 namespace {
 
 int livingHosts = 0;
+int livingLists = 0;
 
 // An exception of C++ becomes the one that a host on Foundation would raise. It's raised outside of the
 // handler: the two kinds don't mix. (A closure in a method does not find its instance variables with GCC, so
@@ -48,7 +49,7 @@ NSString* textOf(const std::string& date) {
 - (id)initWithCase:(const support::CaseFile&)told {
     self = [super init];
     if (self) {
-        _source = new support::CaseHost(told);
+        _source = new support::CaseHost(told, true);
         ++livingHosts;
     }
     return self;
@@ -58,6 +59,10 @@ NSString* textOf(const std::string& date) {
     delete _source;
     --livingHosts;
     [super dealloc];
+}
+
+- (const std::vector<std::string>&)trace {
+    return _source->trace();
 }
 
 - (int64_t)fatherForPersonWithID:(int64_t)personId {
@@ -160,13 +165,15 @@ NSString* textOf(const std::string& date) {
 @implementation BareList
 
 + (NSArray*)listOf:(NSArray*)numbers {
-    BareList* list = [[[BareList alloc] init] autorelease];
+    BareList* list = [[[self alloc] init] autorelease];
     list->_numbers = [numbers retain];
+    ++livingLists;
     return (NSArray*)list;
 }
 
 - (void)dealloc {
     [_numbers release];
+    --livingLists;
     [super dealloc];
 }
 
@@ -182,12 +189,82 @@ NSString* textOf(const std::string& date) {
 
 @implementation BareListHost
 
++ (int)listsAlive {
+    return livingLists;
+}
+
 - (NSArray*)spousesForPersonWithID:(int64_t)personId {
     return [BareList listOf:[super spousesForPersonWithID:personId]];
 }
 
 - (NSArray*)childrenForPersonWithID:(int64_t)personId {
     return [BareList listOf:[super childrenForPersonWithID:personId]];
+}
+
+@end
+
+@interface ShrinkingList : BareList {
+    NSUInteger _lost;
+}
+@end
+
+@implementation ShrinkingList
+
+- (NSUInteger)count {
+    return [super count] - _lost;
+}
+
+- (id)objectAtIndex:(NSUInteger)index {
+    if (index == 0) _lost = 1;
+    return [super objectAtIndex:index];
+}
+
+@end
+
+@implementation ShrinkingListHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    return [ShrinkingList listOf:[super childrenForPersonWithID:personId]];
+}
+
+@end
+
+@interface RaisingList : BareList
+@end
+
+@implementation RaisingList
+
+- (id)objectAtIndex:(NSUInteger)index {
+    [NSException raise:NSRangeException format:@"no entry %lu", static_cast<unsigned long>(index)];
+    return nil;
+}
+
+@end
+
+@implementation RaisingListHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    return [RaisingList listOf:[super childrenForPersonWithID:personId]];
+}
+
+@end
+
+@implementation NullListHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    const NSUInteger count = [[super childrenForPersonWithID:personId] count];
+    NSMutableArray* list = [NSMutableArray array];
+    for (NSUInteger i = 0; i < count; ++i) [list addObject:[NSNull null]];
+    return list;
+}
+
+@end
+
+@implementation ThrowingHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    (void)personId;
+    @throw @"the data base is closed";
 }
 
 @end

@@ -15,6 +15,8 @@
     id<OlvaneViewerManagerWrapProtocol> _manager;
 }
 
+// A data source of nil, as after a plain init, is not refused: it answers 0 to everything, so the picture has two
+// parents with the number 0.
 - (id)initWithManagerWrap:(id<OlvaneViewerManagerWrapProtocol>)manager;
 
 // The family view around that person as one line of text, which the caller does not own. Only the low 32 bits
