@@ -13,8 +13,14 @@ install(EXPORT olvaneTargets NAMESPACE olvane:: DESTINATION ${CMAKE_INSTALL_LIBD
 
 configure_package_config_file(cmake/olvaneConfig.cmake.in ${CMAKE_CURRENT_BINARY_DIR}/olvaneConfig.cmake
   INSTALL_DESTINATION ${CMAKE_INSTALL_LIBDIR}/cmake/olvane)
+# By the rules of semantic versions, 0.2 may break what 0.1 promised.
+if(PROJECT_VERSION_MAJOR EQUAL 0)
+  set(compatible_with SameMinorVersion)
+else()
+  set(compatible_with SameMajorVersion)
+endif()
 write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/olvaneConfigVersion.cmake
-  COMPATIBILITY SameMajorVersion)
+  COMPATIBILITY ${compatible_with})
 install(FILES ${CMAKE_CURRENT_BINARY_DIR}/olvaneConfig.cmake ${CMAKE_CURRENT_BINARY_DIR}/olvaneConfigVersion.cmake
   DESTINATION ${CMAKE_INSTALL_LIBDIR}/cmake/olvane)
 
