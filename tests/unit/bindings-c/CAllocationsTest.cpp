@@ -3,15 +3,20 @@
 
 // Memory that runs out at any moment of a call is a status, and nothing is lost with it.
 
+#include <algorithm>
+#include <cstdint>
+#include <functional>
+#include <set>
+#include <string>
+
 #include <gtest/gtest.h>
 
-#include <support/FamilyText.h>
 #include <unit/bindings-c/CallbackHost.h>
 #include <unit/boundary/AllocationCountdown.h>
+#include <unit/boundary/DisturbedRequests.h>
 
 namespace {
 
-using support::family;
 using unit::CallbackHost;
 
 // A host that allocates nothing of its own, so that every allocation is the library's.
@@ -62,30 +67,60 @@ olvane_host lookingHost() {
     return host;
 }
 
-// Whether the host looks.
-class CMemory : public testing::TestWithParam<bool> {};
+typedef std::function<unit::Answer()> Layout;
 
-TEST_P(CMemory, thatRunsOutAnywhereIsAStatus) {
-    const olvane_host host = GetParam() ? lookingHost() : bareHost();
+std::string textOf(const Layout& layOut) {
+    const unit::Answer answer = layOut();
+    EXPECT_EQ(OLVANE_OK, answer.status);
+    return answer.text();
+}
+
+// Each allocation of a request fails in turn; behind each failure the request is whole again. Where the host's own
+// answers allocate as well, it may be the host that fails.
+void expectAStatusWhereverMemoryRunsOut(const Layout& layOut,
+                                        const std::set<olvane_status>& expectedStatuses) {
+    const std::string expected = textOf(layOut);
     const std::int64_t before = unit::allocationsMade();
-    const unit::Answer whole = unit::familyOf(host, 17);
+    layOut();
     const std::int64_t needed = unit::allocationsMade() - before;
-    ASSERT_EQ(OLVANE_OK, whole.status);
     ASSERT_GT(needed, 20);
-    const std::string expected = whole.text();
     for (std::int64_t n = 1; n <= needed; ++n) {
         const std::int64_t outstanding = unit::allocationsOutstanding();
-        olvane_layout* layout = nullptr;
         olvane_status status = OLVANE_OK;
         {
             const unit::AllocationFailure failure(n);
-            status = olvane_layout_family(&host, 17, nullptr, &layout);
+            status = layOut().status;
         }
-        EXPECT_EQ(OLVANE_OUT_OF_MEMORY, status) << n;
-        olvane_layout_free(layout);
         EXPECT_EQ(outstanding, unit::allocationsOutstanding()) << n;
+        EXPECT_EQ(1u, expectedStatuses.count(status)) << n << ": " << olvane_status_text(status);
+        ASSERT_EQ(expected, textOf(layOut)) << "behind a failure of allocation " << n;
     }
-    EXPECT_EQ(expected, unit::familyOf(host, 17).text());
+}
+
+// Whether the host looks.
+class CMemory : public testing::TestWithParam<bool> {};
+
+TEST_P(CMemory, thatRunsOutAnywhereIsAStatusInBothViews) {
+    const olvane_host host = GetParam() ? lookingHost() : bareHost();
+    expectAStatusWhereverMemoryRunsOut([&host] { return unit::familyOf(host, 17); }, {OLVANE_OUT_OF_MEMORY});
+    expectAStatusWhereverMemoryRunsOut([&host] { return unit::pedigreeOf(host, 17); },
+                                       {OLVANE_OUT_OF_MEMORY});
+}
+
+TEST(CMemoryOfGoldenCases, thatRunsOutAnywhereIsAStatus) {
+    for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
+        SCOPED_TRACE(request.name);
+        CallbackHost host(request.told);
+        const olvane_host callbacks = host.callbacks();
+        olvane_options options;
+        olvane_options_default(&options);
+        options.generations = std::max(1, request.told.maxGenerations);
+        options.flag_depth = request.told.maxStackDepth;
+        const auto view =
+            request.told.view == support::CaseView::pedigree ? unit::pedigreeOf : unit::familyOf;
+        expectAStatusWhereverMemoryRunsOut([&] { return view(callbacks, request.told.focus, &options); },
+                                           {OLVANE_OUT_OF_MEMORY, OLVANE_HOST_FAILED});
+    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Hosts, CMemory, testing::Bool(),

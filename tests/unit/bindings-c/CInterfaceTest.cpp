@@ -21,6 +21,7 @@
 #include <support/FamilyMaker.h>
 #include <support/FamilyText.h>
 #include <unit/bindings-c/CallbackHost.h>
+#include <unit/boundary/DisturbedRequests.h>
 
 namespace {
 
@@ -213,21 +214,37 @@ TEST(CNobody, isNotANumberBelow1) {
     EXPECT_EQ(OLVANE_LAYOUT_FAILED, answerWithFather(-5).status);
 }
 
-TEST(CFailures, ofAnyCallbackAtAnyTimeAreReported) {
-    CallbackHost sound(family(kThreeGenerations));
-    ASSERT_EQ(OLVANE_OK, familyOf(sound.callbacks(), 17).status);
-    for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
-        const auto operation = static_cast<support::HostOperation>(i);
-        const std::int64_t calls = sound.source.callCount(operation);
-        ASSERT_GT(calls, 0);
-        for (const std::int64_t nth : {std::int64_t{1}, (calls + 1) / 2, calls}) {
-            CaseFile told = family(kThreeGenerations);
-            told.failures[operation].insert(nth);
-            const Answer answer = layoutOf(told);
-            EXPECT_EQ(OLVANE_HOST_FAILED, answer.status);
-            EXPECT_EQ(unit::kHostCode, answer.hostCode());
-            EXPECT_EQ(support::layoutText(told), answer.text());
-        }
+// Lets each call of a request fail in turn; behind each failure the request is whole again. The number of calls.
+std::size_t letEveryCallFail(const CaseFile& told) {
+    std::vector<std::string> calls = support::runCase(told, false, true);
+    calls.erase(calls.begin());  // the text
+    for (std::string& call : calls) call.erase(0, std::string("call ").size());
+    const std::string whole = support::layoutText(told);
+    for (std::size_t n = 0; n < calls.size(); ++n) {
+        const CaseFile failing = unit::failingAt(told, calls, n);
+        const Answer answer = layoutOf(failing);
+        EXPECT_EQ(OLVANE_HOST_FAILED, answer.status) << calls[n];
+        EXPECT_EQ(unit::kHostCode, answer.hostCode()) << calls[n];
+        EXPECT_EQ(support::layoutText(failing), answer.text()) << calls[n];
+        const Answer again = layoutOf(told);
+        EXPECT_EQ(OLVANE_OK, again.status) << "behind " << calls[n];
+        EXPECT_EQ(whole, again.text()) << "behind " << calls[n];
+    }
+    return calls.size();
+}
+
+TEST(CFailures, ofAnyCallbackAtAnyTimeAreReportedInBothViews) {
+    CaseFile told = family(kThreeGenerations);
+    EXPECT_LT(60u, letEveryCallFail(told));
+    told.view = CaseView::pedigree;
+    told.maxGenerations = 4;
+    EXPECT_LT(20u, letEveryCallFail(told));
+}
+
+TEST(CFailures, ofAnyCallbackAtAnyTimeOfGoldenCasesAreReported) {
+    for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
+        SCOPED_TRACE(request.name);
+        EXPECT_LT(10u, letEveryCallFail(request.told));
     }
 }
 

@@ -5,6 +5,7 @@
 // far comes back; before and behind it std::bad_alloc reaches the caller. Nothing is ever left behind.
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <new>
 #include <string>
@@ -14,6 +15,7 @@
 #include <olvane/boundary/FamilyViewLayout.h>
 #include <support/FamilyText.h>
 #include <unit/boundary/AllocationCountdown.h>
+#include <unit/boundary/DisturbedRequests.h>
 #include <unit/boundary/Request.h>
 
 namespace {
@@ -25,6 +27,7 @@ using unit::allocationsMade;
 using unit::allocationsOutstanding;
 
 typedef std::shared_ptr<OlvaneViewerManagerWrapProtocol> Source;
+typedef std::function<std::string()> Layout;
 
 struct Attempt {
     std::string text;
@@ -33,7 +36,7 @@ struct Attempt {
     std::int64_t leftBehind = 0;  // beside the text
 };
 
-Attempt layOutWithFailureAt(std::int64_t n, const Source& source) {
+Attempt layOutWithFailureAt(std::int64_t n, const Layout& layOut) {
     Attempt attempt;
     const std::int64_t madeBefore = allocationsMade();
     const std::int64_t outstandingBefore = allocationsOutstanding();
@@ -41,7 +44,7 @@ Attempt layOutWithFailureAt(std::int64_t n, const Source& source) {
         std::string text;
         try {
             const AllocationFailure failure(n);
-            text = FamilyViewLayout("17", source);
+            text = layOut();
         } catch (const std::bad_alloc&) {
             attempt.passedOn = true;
         }
@@ -62,25 +65,33 @@ std::int64_t allocationsBeforeTheGuard(const Source& source) {
     return allocationsMade() - before;
 }
 
-void expectEveryAllocationMayFail(const CaseFile& told) {
-    const Source source = std::make_shared<support::CaseManager>(told);
-    const Attempt whole = layOutWithFailureAt(0, source);
+// The first ones, so many as are told, and the last one, which makes the returned text, lie outside the guard.
+void expectEveryAllocationMayFail(const Layout& layOut, std::int64_t before) {
+    const Attempt whole = layOutWithFailureAt(0, layOut);
     ASSERT_LT(100u, whole.text.size());
     ASSERT_EQ(0, whole.leftBehind);
-    const std::int64_t before = allocationsBeforeTheGuard(source);
     int cutTexts = 0;
     for (std::int64_t n = 1; n <= whole.allocations; ++n) {
-        const Attempt attempt = layOutWithFailureAt(n, source);
-        const bool isOutside = n <= before || n == whole.allocations;  // the last one makes the returned text
+        const Attempt attempt = layOutWithFailureAt(n, layOut);
+        const bool isOutside = n <= before || n == whole.allocations;
         EXPECT_EQ(isOutside, attempt.passedOn) << "allocation " << n << " of " << whole.allocations;
         EXPECT_EQ(0, attempt.leftBehind) << "allocation " << n;
         EXPECT_EQ(whole.text.substr(0, attempt.text.size()), attempt.text) << "allocation " << n;
         EXPECT_LT(attempt.text.size(), whole.text.size()) << "allocation " << n;
-        EXPECT_EQ(1, source.use_count());
         cutTexts += attempt.text.empty() ? 0 : 1;
+        ASSERT_EQ(whole.text, layOut()) << "behind a failure of allocation " << n;
     }
     EXPECT_LT(0, cutTexts);  // some failed while records were written
-    EXPECT_EQ(whole.text, layOutWithFailureAt(0, source).text);
+}
+
+void expectEveryAllocationMayFail(const CaseFile& told) {
+    const Source source = std::make_shared<support::CaseManager>(told);
+    const Layout layOut = [&source] {
+        std::string text = FamilyViewLayout("17", source);
+        EXPECT_EQ(1, source.use_count());
+        return text;
+    };
+    expectEveryAllocationMayFail(layOut, allocationsBeforeTheGuard(source));
 }
 
 TEST(MemoryRunsOut, atAnyAllocationOfASmallFamilyAPrefixComesBackAndNothingLeaks) {
@@ -93,10 +104,21 @@ TEST(MemoryRunsOut, atAnyAllocationOfAFamilyWithSiblingsStepChildrenAndUnknownPa
     expectEveryAllocationMayFail(told);
 }
 
+TEST(MemoryRunsOut, atAnyAllocationOfGoldenCasesOfBothViewsAPrefixComesBackAndNothingLeaks) {
+    for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
+        SCOPED_TRACE(request.name);
+        const std::int64_t atFirst = allocationsMade();
+        const Source source = std::make_shared<support::CaseManager>(support::borrowed(request.told));
+        const std::int64_t before = allocationsMade() - atFirst + allocationsBeforeTheGuard(source);
+        expectEveryAllocationMayFail([&request] { return support::layoutText(request.told); }, before);
+    }
+}
+
 TEST(MemoryRunsOut, forTheReturnedTextBehindTheLayoutTheFailurePassesOn) {
     const Source source = std::make_shared<support::CaseManager>(family("17"));
-    const std::int64_t all = layOutWithFailureAt(0, source).allocations;
-    const Attempt attempt = layOutWithFailureAt(all, source);
+    const Layout layOut = [&source] { return FamilyViewLayout("17", source); };
+    const std::int64_t all = layOutWithFailureAt(0, layOut).allocations;
+    const Attempt attempt = layOutWithFailureAt(all, layOut);
     EXPECT_TRUE(attempt.passedOn);
     EXPECT_EQ(0, attempt.leftBehind);
 }

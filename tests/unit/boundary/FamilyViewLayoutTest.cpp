@@ -16,6 +16,7 @@
 #include <olvane/boundary/OlvaneViewerBridge.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <support/FamilyText.h>
+#include <unit/boundary/DisturbedRequests.h>
 #include <unit/boundary/Request.h>
 
 namespace {
@@ -24,6 +25,7 @@ using support::CaseFile;
 using support::CaseManager;
 using support::family;
 using unit::Calls;
+using unit::failingAt;
 using unit::Request;
 
 std::string layOut(const std::string& personText, const CaseFile& told) {
@@ -202,19 +204,6 @@ TEST(Layouts, spouseOfAnIdBelowOneEndsTheLayoutWithNothingWritten) {
 
 // --- Hosts that fail.
 
-// The case again, with its n-th call of all failing. Calls are those of an unhurt request.
-CaseFile failingAt(const CaseFile& told, const Calls& calls, std::size_t n) {
-    const auto operationOf = [&](std::size_t i) { return calls[i].substr(0, calls[i].find(' ')); };
-    std::int64_t count = 0;
-    for (std::size_t i = 0; i <= n; ++i) count += operationOf(i) == operationOf(n) ? 1 : 0;
-    CaseFile failing = told;
-    for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
-        const auto operation = static_cast<support::HostOperation>(i);
-        if (support::operationName(operation) == operationOf(n)) failing.failures[operation] = {count};
-    }
-    return failing;
-}
-
 // All questions come before the first record, so that nothing is written yet, whichever of them fails.
 void expectEmptyTextWhicheverCallFails(const CaseFile& told) {
     Request unhurt(told);
@@ -228,8 +217,8 @@ void expectEmptyTextWhicheverCallFails(const CaseFile& told) {
         EXPECT_EQ(Calls(calls.begin(), calls.begin() + static_cast<std::ptrdiff_t>(n) + 1),
                   request.newCalls());
         EXPECT_EQ(2, request.source.use_count());  // the request's own two references
+        ASSERT_EQ(whole, layOut("17", told)) << "behind a failure of call " << n;
     }
-    EXPECT_EQ(whole, layOut("17", told));
 }
 
 TEST(FailingHost, leavesTheEmptyTextAtEveryCallAndIsNotAskedAgain) {
@@ -241,6 +230,32 @@ TEST(FailingHost, leavesTheEmptyTextAtEveryCallOfAFamilyWithUnknownParentsAndRem
         family("17+42: 5 6f; 17+43: 7; 42f: 8; 3+4: 17 18 19f; 3: 20; 4f: 21; 1+2: 3 22; 5+50: 51");
     told.births[17] = "1850";
     expectEmptyTextWhicheverCallFails(told);
+}
+
+// The same for a case of any view: its calls up to the one that fails, no text, and the next request is whole.
+void expectNoTextWhicheverCallFails(const CaseFile& told) {
+    const Calls whole = support::runCase(told, false, true);
+    ASSERT_NE("text ", whole.front());
+    ASSERT_LT(15u, whole.size());
+    Calls calls;
+    for (std::size_t i = 1; i < whole.size(); ++i)
+        calls.push_back(whole[i].substr(std::string("call ").size()));
+    for (std::size_t n = 0; n < calls.size(); ++n) {
+        Calls expected(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(n) + 2);
+        expected.front() = "text ";
+        EXPECT_EQ(expected, support::runCase(failingAt(told, calls, n), false, true)) << "call " << n;
+        ASSERT_EQ(whole, support::runCase(told, false, true)) << "behind a failure of call " << n;
+    }
+}
+
+TEST(FailingHost, leavesTheEmptyTextAtEveryCallOfGoldenCasesOfBothViews) {
+    int pedigrees = 0;
+    for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
+        SCOPED_TRACE(request.name);
+        expectNoTextWhicheverCallFails(request.told);
+        pedigrees += request.told.view == support::CaseView::pedigree ? 1 : 0;
+    }
+    EXPECT_LT(1, pedigrees);
 }
 
 // Throws what is not even a standard exception.

@@ -4,10 +4,15 @@
 // The reader of result texts: what it gives, where it stops, and what it says there.
 
 #include <gtest/gtest.h>
+#include <sys/mman.h>
+#include <unistd.h>
 
+#include <algorithm>
 #include <cstdint>
 #include <limits>
+#include <stdexcept>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include <olvane/host/LayoutText.h>
@@ -118,6 +123,48 @@ TEST(LayoutText, recordCutBehindItsSegmentsIsLeftOut) {
     EXPECT_EQ(reading.records.size(), 1u);
     ASSERT_TRUE(reading.cut.has_value());
     EXPECT_EQ(reading.cut->position(), 20u);
+}
+
+// A reading of part of a text, at the end of memory that may be read: a byte behind it ends the program.
+class TextBeforeNothing {
+public:
+    explicit TextBeforeNothing(std::string_view text)
+        : pageSize_(static_cast<std::size_t>(sysconf(_SC_PAGESIZE))),
+          pages_(mmap(nullptr, 2 * pageSize_, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0)) {
+        if (pages_ == MAP_FAILED || text.size() > pageSize_) throw std::runtime_error("no page for the text");
+        char* const end = static_cast<char*>(pages_) + pageSize_;
+        mprotect(end, pageSize_, PROT_NONE);
+        text_ = std::string_view(std::copy(text.begin(), text.end(), end - text.size()) - text.size(),
+                                 text.size());
+    }
+    ~TextBeforeNothing() { munmap(pages_, 2 * pageSize_); }
+    TextBeforeNothing(const TextBeforeNothing&) = delete;
+    TextBeforeNothing& operator=(const TextBeforeNothing&) = delete;
+
+    std::string_view text() const { return text_; }
+
+private:
+    std::size_t pageSize_;
+    void* pages_;
+    std::string_view text_;
+};
+
+TEST(LayoutText, viewThatIsCutInsideANumberEndsThere) {
+    const std::string whole = "17:27:0:0:;5:123456";
+    const LayoutReading reading = readWholeRecords(std::string_view(whole).substr(0, 15));
+    EXPECT_EQ(reading.records.size(), 1u);
+    ASSERT_TRUE(reading.cut.has_value());
+    EXPECT_EQ(reading.cut->position(), 15u);
+    EXPECT_EQ(reading.cut->reason(), "expected ':', found the end");
+}
+
+TEST(LayoutText, nothingBehindTheTextIsLookedAt) {
+    for (std::size_t length = 0; length <= kFourPersons.size(); ++length) {
+        const std::string cutText = kFourPersons.substr(0, length);
+        const TextBeforeNothing atTheEdge(cutText);
+        const LayoutReading reading = readWholeRecords(atTheEdge.text());
+        EXPECT_EQ(reading.records, readWholeRecords(cutText).records) << "cut at " << length;
+    }
 }
 
 }  // namespace
