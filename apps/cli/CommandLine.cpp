@@ -298,7 +298,7 @@ private:
         addViewAlone(*page_, pageOptions_.view);
         page_
             ->add_option("--title", pageOptions_.title,
-                         "Title of the page; made of the name of --focus when not given")
+                         "Title of the page; the name of --focus when not given, or that of the file")
             ->type_name("TEXT");
         addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year);
         needsFile(focus);

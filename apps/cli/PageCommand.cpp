@@ -40,11 +40,18 @@ std::string fileNameOf(const std::string& path) {
     return path.substr(path.find_last_of('/') + 1);
 }
 
+std::string withoutEnding(const std::string& name) {
+    const std::size_t dot = name.find_last_of('.');
+    return dot == std::string::npos || dot == 0 ? name : name.substr(0, dot);
+}
+
+// No word of any language: the page speaks its reader's own.
 std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus,
                     const gedcom::WriteOptions& hiding) {
-    if (focus == 0 || (!hiding.hidden.empty() && hiding.hidden[focus - 1])) return "Family tree";
+    const std::string fileTitle = withoutEnding(fileNameOf(data.file()));
+    if (focus == 0 || (!hiding.hidden.empty() && hiding.hidden[focus - 1])) return fileTitle;
     const std::string name = gedcom::displayName(data.firstName(focus));
-    return name.empty() ? "Family tree" : "Family of " + name;
+    return name.empty() ? fileTitle : name;
 }
 
 // By what the page finds the person again: the text is read there, and its persons are those of the data.
@@ -67,6 +74,8 @@ PageFamily familyOf(const PageOptions& options) {
     family.focus = focusOf(focus);
     family.view = options.view == View::pedigree ? "pedigree" : "family";
     family.livingHidden = options.hideLiving;
+    // They quote the file, and so may name whom the page does not.
+    if (!options.hideLiving) family.remarks = data.diagnostics();
     return family;
 }
 

@@ -60,6 +60,17 @@ std::string asMarkup(std::string text) {
     return replacedAll(replacedAll(std::move(text), "&", "&amp;"), "<", "&lt;");
 }
 
+nlohmann::ordered_json remarksOf(const PageFamily& family) {
+    nlohmann::ordered_json remarks = nlohmann::ordered_json::array();
+    for (const gedcom::Diagnostic& remark : family.remarks) {
+        remarks.push_back({{"line", remark.line},
+                           {"severity", gedcom::severityName(remark.severity)},
+                           {"message", remark.what},
+                           {"hint", remark.done}});
+    }
+    return remarks;
+}
+
 // Nothing in it can end the element.
 std::string familyBlock(const PageFamily& family) {
     const nlohmann::ordered_json json = {
@@ -68,6 +79,7 @@ std::string familyBlock(const PageFamily& family) {
         {"focus", family.focus},
         {"view", family.view},
         {"livingHidden", family.livingHidden},
+        {"remarks", remarksOf(family)},
         {"gzip", base64(gzipped(family.gedcom))},
     };
     const std::string text = json.dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);

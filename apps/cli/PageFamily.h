@@ -5,6 +5,9 @@
 
 #include <string>
 #include <string_view>
+#include <vector>
+
+#include <olvane/gedcom/GedcomDiagnostic.h>
 
 namespace olvane::cli {
 
@@ -16,6 +19,8 @@ struct PageFamily {
     std::string view;    // "family" or "pedigree"
     std::string gedcom;  // UTF-8
     bool livingHidden = false;
+    // On the file that the text was made of, with its line numbers.
+    std::vector<gedcom::Diagnostic> remarks;
 };
 
 // The page with the family in it.

@@ -5,8 +5,8 @@
 // what a person does. Every road to another picture leads through travel(): a click, a key, the search, a
 // link, the browser's buttons.
 
-import type { Diagnostic, Olvane, Person } from "olvane";
-import { ArchiveError, gedcomInArchive, isArchive } from "./engine/archive";
+import { type Diagnostic, LayoutError, type Olvane, type Person } from "olvane";
+import { ArchiveError, gedcomInArchive, isArchive, TooLargeError } from "./engine/archive";
 import type { EmbeddedFamily } from "./engine/engine";
 import { type Messages, messagesFor } from "./messages";
 import { type UiMessages, uiMessagesFor } from "./messages/ui";
@@ -123,9 +123,9 @@ export class App implements ChromeActions {
         this.welcome.showReading(file.name);
         await pause();
         try {
-            if (file.size > kMostBytes) throw new Error(this.ui.errors.tooLarge);
+            if (file.size > kMostBytes) throw new TooLargeError();
             const bytes = new Uint8Array(await file.arrayBuffer());
-            this.open(isArchive(bytes) ? await gedcomInArchive(bytes) : bytes, file.name, null);
+            this.open(isArchive(bytes) ? await gedcomInArchive(bytes, kMostBytes) : bytes, file.name, null);
             if (others.length > 0) this.notices.tell(this.ui.firstOfFiles("\u2068" + file.name + "\u2069"));
         } catch (error) {
             this.refuse(file.name, error);
@@ -148,14 +148,14 @@ export class App implements ChromeActions {
         this.family?.close();
         this.family = family;
         this.fileName = name;
-        this.lastProblems = file.diagnostics;
+        this.lastProblems = embedded?.remarks ?? file.diagnostics;
         this.picture = null;
         this.scene.clear();
         this.overview.clear();
         document.title = title;
         this.arrange();
         const usual: ViewState = {
-            focus: family.personOfXref(embedded?.focus ?? "")?.id ?? family.bestFocus(),
+            focus: family.person(embedded?.focus ?? 0)?.id ?? family.bestFocus(),
             view: embedded?.view === "pedigree" ? "pedigree" : "family",
             generations: kUsualGenerations,
             hidden: new Set(),
@@ -163,12 +163,14 @@ export class App implements ChromeActions {
         const address = isLinked ? location.hash : "";
         const state = readAddress(address, family.persons, usual);
         this.journey.begin(addressOf(state, family.persons), embedded !== null);
-        this.arrive(state, null);
+        // Where this picture cannot be had, others can: the search leads to them.
+        if (!this.arrive(state, null)) this.state = state;
         performance.measure("olvane-open", { start });
         this.greet(family);
         this.nameStranger(address);
         this.warmUp(family, state);
-        if (file.diagnostics.some((one) => one.severity === "error")) {
+        // Who was sent a page cannot mend the file behind it.
+        if (!embedded && file.diagnostics.some((one) => one.severity === "error")) {
             const summary = this.ui.diagnostics.summary(family.persons.length, file.diagnostics.length);
             this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.openDiagnostics());
         }
@@ -192,15 +194,15 @@ export class App implements ChromeActions {
         if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
     }
 
-    private nameStranger(address: string): boolean {
+    private nameStranger(address: string): void {
         const link = strangerIn(address, this.family!.persons);
         if (link) this.notices.fail(this.ui.errors.stranger("\u2068" + link + "\u2069"), []);
-        return link !== "";
     }
 
     private refuse(name: string, error: unknown): void {
         const { errors } = this.ui;
         const file = "\u2068" + name + "\u2069";
+        if (error instanceof TooLargeError) return this.notices.fail(errors.notGedcom(file), [errors.tooLarge]);
         if (error instanceof ArchiveError) return this.notices.fail(errors.archive, []);
         if (error instanceof NoPersonsError) return this.notices.fail(errors.noPersons(file), []);
         const detail = error instanceof Error ? error.message : "";
@@ -230,7 +232,9 @@ export class App implements ChromeActions {
         if (!this.family || !this.state) return;
         const state = readAddress(address, this.family.persons, this.state);
         if (!sameState(state, this.state)) this.arrive(state, null);
-        if (this.nameStranger(address)) this.journey.replace(addressOf(this.state, this.family.persons));
+        this.nameStranger(address);
+        const shown = addressOf(this.state, this.family.persons);
+        if (address !== shown) this.journey.replace(shown);
         this.showState();
     }
 
@@ -242,8 +246,9 @@ export class App implements ChromeActions {
         let picture: Picture;
         try {
             picture = family.picture(state);
-        } catch {
-            this.notices.fail(this.ui.errors.layout, []);
+        } catch (error) {
+            const isTooLarge = error instanceof LayoutError && error.status === "tooLarge";
+            this.notices.fail(isTooLarge ? this.ui.errors.pictureTooLarge : this.ui.errors.layout, []);
             return false;
         }
         const isNewFocus = this.state?.focus !== state.focus;

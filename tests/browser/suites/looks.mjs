@@ -83,7 +83,7 @@ describe("looks", kTwoAtOnce, () => {
     test("on the narrowest phone the bar has two rows, and a long name leaves room for the years", async () => {
         const long = brokenFamily().replace("Ada", "Ada Augusta Wilhelmina Theodora Philippa").replace("7 DATE far too deep", "1 BIRT\n2 DATE 1815");
         const settings = { ...kPhone, viewport: { width: 320, height: 568 } };
-        const visit = await visitFamily(long, { name: "long.ged", focus: "I1" }, settings);
+        const visit = await visitFamily(long, { name: "long.ged", focus: "1" }, settings);
         await visit.page.waitForSelector("#diagnostics-button", { state: "visible" });
         const boxOf = (selector) => visit.page.locator(selector).boundingBox();
         assert.ok((await boxOf(".bar")).height < 120);

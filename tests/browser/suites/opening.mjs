@@ -2,12 +2,14 @@
 // SPDX-License-Identifier: MIT
 
 import assert from "node:assert/strict";
+import { execFileSync } from "node:child_process";
 import { deflateRawSync } from "node:zlib";
 import { describe, test } from "node:test";
-import { kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty } from "../support/browser.mjs";
-import { brokenFamily } from "../support/families.mjs";
+import { fileFor, kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty, visitFile } from "../support/browser.mjs";
+import { brokenFamily, hugeHousehold } from "../support/families.mjs";
 
 const kDarwins = sample("darwin-wedgwood.ged");
+const command = process.env.OLVANE_COMMAND;
 
 describe("opening", kTwoAtOnce, () => {
     test("without a family the page invites one in", async () => {
@@ -146,6 +148,52 @@ describe("opening", kTwoAtOnce, () => {
         await photograph(visit, "diagnostics");
         await visit.page.keyboard.press("Escape");
         assert.ok(!(await visit.page.isVisible("#diagnostics")));
+        await visit.end();
+    });
+
+    test("a page opens at the person that the command was told, and speaks of the file that it was given", { skip: command ? false : "no olvane command was given" }, async () => {
+        const file = fileFor("some.family.ged", "0 HEAD\n0 @3@ INDI\n1 NAME Abe /First/\nno line\n0 @2@ INDI\n1 NAME Bea /Second/\n0 @1@ INDI\n1 NAME Cid /Third/\n0 TRLR\n");
+        const page = fileFor("told.html", "");
+        execFileSync(command, ["page", file, "--focus", "Second", "-o", page], { stdio: "ignore" });
+        const visit = await visitFile(page);
+        await visit.untilFamily();
+        assert.equal(await visit.focus(), "2");
+        assert.equal(await visit.page.title(), "Bea Second");
+        assert.match(await visit.page.textContent("#diagnostics"), /line 4.*no line/);
+        assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can mend the file");
+        await visit.end();
+        execFileSync(command, ["page", file, "-o", page], { stdio: "ignore" });
+        const untold = await visitFile(page);
+        await untold.untilFamily();
+        assert.equal(await untold.page.title(), "some.family");
+        await untold.end();
+    });
+
+    test("a picture that asks for too much is refused in words, and others can be had", async () => {
+        const visit = await visitEmpty({}, "#person=MAN");
+        await visit.drop("many.ged", hugeHousehold());
+        await visit.page.waitForSelector('#notices [role="alert"]');
+        assert.match(await visit.page.innerText("#notices"), /more than a million relatives/);
+        await visit.goTo("Lone Stranger");
+        assert.equal(await visit.focus(), "LONE");
+        await visit.end();
+    });
+
+    test("an archive that holds more than a page can is refused in words", async () => {
+        const visit = await visitEmpty();
+        await visit.drop("bomb.gdz", archiveOf("gedcom.ged", Buffer.alloc(129 * 2 ** 20, "0 HEAD\n")));
+        await visit.page.waitForSelector('#notices [role="alert"]');
+        assert.match(await visit.page.innerText("#notices"), /bomb\.gdz.*larger than 128 MiB/s);
+        assert.ok(await visit.page.isVisible("#choose-file"));
+        await visit.end();
+    });
+
+    test("an address is put right that asks for too much, or has other letters", async () => {
+        const visit = await visitDarwins("#person=I1");
+        await visit.page.evaluate(() => (location.hash = "#person=i5&view=pedigree&generations=99"));
+        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I5");
+        await visit.still();
+        assert.equal(await visit.hash(), "#person=I5&view=pedigree&generations=10");
         await visit.end();
     });
 

@@ -51,6 +51,23 @@ describe("options", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("what a view does not have cannot be switched", async () => {
+        const visit = await visitDarwins();
+        await visit.click("#options-button");
+        assert.ok(await visit.page.isDisabled("#generations-more"));
+        await visit.page.keyboard.press("Escape");
+        await visit.click("#view-pedigree");
+        await visit.click("#options-button");
+        for (const [name] of kSwitches) assert.ok(await visit.page.isDisabled(`#show-${name}`), name);
+        assert.ok(await visit.page.isEnabled("#generations-more"));
+        await visit.page.keyboard.press("Escape");
+        await visit.page.click("#legend summary");
+        assert.ok(await visit.page.isHidden("#legend .sign.divorced"));
+        await visit.click("#view-family");
+        assert.ok(await visit.page.isVisible("#legend .sign.divorced"));
+        await visit.end();
+    });
+
     test("generations of the pedigree are counted up and down between their bounds", async () => {
         const visit = await visitDarwins("#person=I90&view=pedigree");
         await visit.click("#options-button");

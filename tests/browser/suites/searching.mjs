@@ -23,6 +23,18 @@ describe("searching", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("a list that is not the whole says so", async () => {
+        const visit = await visitDarwins();
+        await visit.page.fill("#search", "darwin");
+        assert.equal((await found(visit)).length, 30);
+        assert.match(await visit.page.innerText("#search-list li:last-child"), /the first 30; type on/);
+        await visit.page.press("#search", "ArrowUp");
+        assert.equal(await visit.page.getAttribute("#search", "aria-activedescendant"), "found-29");
+        await visit.page.fill("#search", "erasmus darwin 1731");
+        assert.doesNotMatch(await visit.page.innerText("#search-list"), /type on/);
+        await visit.end();
+    });
+
     test("a year tells persons of one name apart", async () => {
         const visit = await visitDarwins();
         await visit.page.fill("#search", "erasmus darwin 1731");

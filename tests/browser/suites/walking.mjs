@@ -193,11 +193,38 @@ describe("walking", kTwoAtOnce, () => {
         await visit.press("Enter");
         await visit.page.waitForFunction(() => document.getElementById("back").disabled);
         assert.equal(await holder(), "forward");
+        await visit.click("#view-pedigree");
         await visit.click("#options-button");
         await visit.page.focus("#generations-fewer");
         for (let i = 0; i < 3; ++i) await visit.press("Enter");
         assert.equal(await visit.page.innerText("#generations"), "2");
         assert.equal(await holder(), "generations-more");
+        await visit.end();
+    });
+
+    test("Alt and the arrows go back and forward", async () => {
+        const visit = await visitDarwins();
+        await visit.goTo("Emma Wedgwood 1808");
+        await visit.press("Alt+ArrowLeft");
+        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I1");
+        await visit.press("Alt+ArrowRight");
+        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I2");
+        await visit.end();
+    });
+
+    test("in the pedigree exactly those who have relatives out of the picture have a mark", async () => {
+        const visit = await visitDarwins("#person=I1&view=pedigree&generations=3");
+        await visit.fit();
+        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) => boxes.map((box) => [box.dataset.xref, box.querySelector(".badge text").textContent]));
+        const counts = Object.fromEntries(marked);
+        assert.deepEqual(counts, {
+            // Children and their spouses' children; Emma's parents are not Charles's.
+            ...{ I2: "+2", I107: "+1", I111: "+1", I113: "+5", I116: "+5", I120: "+2", I123: "+4" },
+            // The father has five more children; the mother the same five.
+            ...{ I12: "+5", I55: "+5" },
+            // In the last column parents are out of the picture, too.
+            ...{ I5: "+17", I6: "+6", I52: "+9", I54: "+8" },
+        });
         await visit.end();
     });
 

@@ -123,3 +123,17 @@ export function livingFamily() {
         "0 @F2@ FAM", "1 HUSB @I3@", "1 WIFE @I4@", "1 MARR", "2 DATE 15 JUL 2021", "2 PLAC Niemandshausen",
     );
 }
+
+/** A man with a thousand wives and five children by each, which asks for more relatives than any picture may; and
+ *  somebody beside him. */
+export function hugeHousehold() {
+    const wives = Array.from({ length: 1000 }, (_, i) => i);
+    const children = [0, 1, 2, 3, 4];
+    const lines = ["0 HEAD", "0 @MAN@ INDI", "1 NAME Harald /Many/", "1 SEX M", ...wives.map((i) => `1 FAMS @F${i}@`)];
+    for (const i of wives) {
+        lines.push(`0 @W${i}@ INDI`, `1 NAME Wife /${i}/`, "1 SEX F", `1 FAMS @F${i}@`);
+        for (const k of children) lines.push(`0 @C${i}x${k}@ INDI`, `1 NAME Child /${i}/`, `1 FAMC @F${i}@`);
+        lines.push(`0 @F${i}@ FAM`, "1 HUSB @MAN@", `1 WIFE @W${i}@`, ...children.map((k) => `1 CHIL @C${i}x${k}@`));
+    }
+    return [...lines, "0 @LONE@ INDI", "1 NAME Lone /Stranger/", "0 TRLR"].join("\n");
+}

@@ -11,6 +11,8 @@ const kMostUnpacked = 1 << 30; // bytes; more is taken for an attack
 
 export class ArchiveError extends Error {}
 
+export class TooLargeError extends Error {}
+
 export function bytesOfBase64(text: string): Uint8Array<ArrayBuffer> {
     const binary = atob(text.trim());
     const bytes = new Uint8Array(binary.length);
@@ -26,16 +28,21 @@ export function isArchive(bytes: Uint8Array): boolean {
     return bytes[0] === 0x50 && bytes[1] === 0x4b && (bytes[2] === 3 || bytes[2] === 5);
 }
 
-// The GEDCOM file of a GEDZIP archive: gedcom.ged, or else the only file that ends in .ged.
-export async function gedcomInArchive(archive: Uint8Array<ArrayBuffer>): Promise<Uint8Array<ArrayBuffer>> {
+// The GEDCOM file of a GEDZIP archive: gedcom.ged, or else the only file that ends in .ged. At most so many bytes
+// come out of it.
+export async function gedcomInArchive(
+    archive: Uint8Array<ArrayBuffer>,
+    most: number,
+): Promise<Uint8Array<ArrayBuffer>> {
     const entries = entriesOf(archive);
     const chosen =
         entries.find((entry) => /(^|\/)gedcom\.ged$/i.test(entry.name)) ??
         entries.find((entry) => /\.ged$/i.test(entry.name));
     if (!chosen) throw new ArchiveError("no .ged");
     try {
-        return await contentOf(archive, chosen);
+        return await contentOf(archive, chosen, most);
     } catch (error) {
+        if (error instanceof TooLargeError) throw error;
         throw new ArchiveError("damaged", { cause: error });
     }
 }
@@ -76,19 +83,24 @@ function endOf(view: DataView): number {
     throw new ArchiveError("no archive");
 }
 
-async function contentOf(archive: Uint8Array<ArrayBuffer>, entry: Entry): Promise<Uint8Array<ArrayBuffer>> {
+async function contentOf(
+    archive: Uint8Array<ArrayBuffer>,
+    entry: Entry,
+    most: number,
+): Promise<Uint8Array<ArrayBuffer>> {
     const view = new DataView(archive.buffer, archive.byteOffset, archive.byteLength);
     const start =
         entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
     const packed = archive.slice(start, start + entry.packedSize);
     if (entry.method === 0) return packed;
     if (entry.method !== 8) throw new ArchiveError("packed in a way that is not known");
-    return inflate(packed, "deflate-raw");
+    return inflate(packed, "deflate-raw", most);
 }
 
 async function inflate(
     bytes: Uint8Array<ArrayBuffer>,
     format: CompressionFormat,
+    most = kMostUnpacked,
 ): Promise<Uint8Array<ArrayBuffer>> {
     const reader = new Blob([bytes]).stream().pipeThrough(new DecompressionStream(format)).getReader();
     const parts: Uint8Array[] = [];
@@ -96,7 +108,7 @@ async function inflate(
     for (let next = await reader.read(); !next.done; next = await reader.read()) {
         parts.push(next.value);
         size += next.value.length;
-        if (size > kMostUnpacked) throw new ArchiveError("too large");
+        if (size > most) throw new TooLargeError();
     }
     const whole = new Uint8Array(size);
     let at = 0;

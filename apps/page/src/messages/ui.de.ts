@@ -24,6 +24,7 @@ export const uiGerman: UiMessages = {
         label: "Person suchen",
         none: "Niemand gefunden",
         count: (n) => (n === 1 ? "1 Person gefunden" : `${n} Personen gefunden`),
+        first: (n) => `die ersten ${n}; weitertippen führt zu anderen`,
     },
     views: { label: "Ansicht", family: "Familie", pedigree: "Ahnen" },
     back: "Zurück",
@@ -136,6 +137,8 @@ export const uiGerman: UiMessages = {
         hint: "Eine GEDCOM-Datei beginnt mit der Zeile „0 HEAD“. Die meisten Ahnenprogramme schreiben eine unter Export.",
         noPersons: (name) => `${name} enthält keine Person.`,
         stranger: (link) => `Der Link führt zu ${link}: Diese Person steht nicht in der Datei.`,
+        pictureTooLarge:
+            "Dieses Bild fragt nach mehr als einer Million Verwandten; so viel fasst eine Seite nicht. Eine andere Person oder weniger Verwandte helfen.",
         tooLarge: "Sie ist größer als 128 MiB; so viel fasst eine Seite nicht.",
         tooNew: "Dieser Browser ist zu alt für die Seite: er kann das Rechenwerk nicht auspacken.",
         archive: "Das Archiv enthält keine gedcom.ged oder ist beschädigt.",
@@ -145,7 +148,7 @@ export const uiGerman: UiMessages = {
     },
     firstHint:
         "Wer angeklickt oder angetippt wird, steht im Mittelpunkt. Ziehen verschiebt; Mausrad oder zwei Finger vergrößern.",
-    livingHidden: "Lebende Personen sind in dieser Datei ausgelassen.",
+    livingHidden: "Namen und Daten lebender Personen sind ausgelassen.",
     firstOfFiles: (name) => `Von den abgelegten Dateien wurde ${name} geöffnet.`,
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),
 };

@@ -22,6 +22,7 @@ export const uiEnglish: UiMessages = {
         label: "Find a person",
         none: "Nobody found",
         count: (n) => (n === 1 ? "1 person found" : `${n} persons found`),
+        first: (n) => `the first ${n}; type on to find others`,
     },
     views: { label: "View", family: "Family", pedigree: "Pedigree" },
     back: "Back",
@@ -134,6 +135,8 @@ export const uiEnglish: UiMessages = {
         hint: "A GEDCOM file begins with the line “0 HEAD”. Most genealogy programs write one under Export.",
         noPersons: (name) => `${name} holds no person.`,
         stranger: (link) => `The link leads to ${link}, a person who is not in this file.`,
+        pictureTooLarge:
+            "This picture asks for more than a million relatives, which is more than a page can hold. Try another person, or show fewer relatives.",
         tooLarge: "It is larger than 128 MiB, which is more than a page can hold.",
         tooNew: "This browser is too old for the page: it cannot unpack the engine.",
         archive: "The archive holds no gedcom.ged, or is damaged.",
@@ -142,7 +145,7 @@ export const uiEnglish: UiMessages = {
         dismiss: "Dismiss",
     },
     firstHint: "Click or tap a person to stand among that family. Drag to move; turn the wheel or pinch to zoom.",
-    livingHidden: "Living persons are left out of this file.",
+    livingHidden: "The names and dates of living persons are left out.",
     firstOfFiles: (name) => `Of the files that were dropped, ${name} was opened.`,
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),
 };

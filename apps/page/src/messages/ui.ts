@@ -20,7 +20,12 @@ export interface UiMessages {
         readonly dropNow: string;
         readonly reading: (name: string) => string;
     };
-    readonly search: { readonly label: string; readonly none: string; readonly count: (n: number) => string };
+    readonly search: {
+        readonly label: string;
+        readonly none: string;
+        readonly count: (n: number) => string;
+        readonly first: (n: number) => string;
+    };
     readonly views: { readonly label: string; readonly family: string; readonly pedigree: string };
     readonly back: string;
     readonly forward: string;
@@ -112,6 +117,7 @@ export interface UiMessages {
         readonly noPersons: (name: string) => string;
         readonly stranger: (link: string) => string;
         readonly tooLarge: string;
+        readonly pictureTooLarge: string;
         readonly tooNew: string;
         readonly archive: string;
         readonly engine: string;

@@ -43,6 +43,7 @@ export interface WholePicture {
     readonly svg: SVGSVGElement;
     readonly width: number; // points
     readonly height: number;
+    readonly title: string;
 }
 
 // theme is the name of a set of colours in the style sheet.
@@ -77,7 +78,7 @@ export function wholePicture(picture: Picture, dress: Dress, title: string, them
         drawing.append(element);
     }
     resolveLooks(drawing, theme);
-    return { svg: drawing, width, height };
+    return { svg: drawing, width, height, title };
 }
 
 // As a file: with its declaration, and without what XML forbids.

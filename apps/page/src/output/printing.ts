@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Puts the whole picture on one sheet of paper, lying or standing as suits it, in colours made for paper.
+// Puts the whole picture on one sheet of paper under its title, lying or standing as suits it, in colours made
+// for paper.
 
 import { html } from "../ui/dom";
 import type { WholePicture } from "./pictureSvg";
@@ -19,10 +20,10 @@ export class PrintSheet {
     private fill(whole: WholePicture | null): void {
         this.empty();
         if (!whole) return;
-        const { svg, width, height } = whole;
+        const { svg, width, height, title } = whole;
         svg.setAttribute("width", "100%");
         svg.setAttribute("height", "100%");
-        this.element.append(svg);
+        this.element.append(html("p", { dir: "auto" }, title), svg);
         this.orientation = new CSSStyleSheet();
         this.orientation.insertRule(
             `@page { size: ${width > height ? "landscape" : "portrait"}; margin: 10mm; }`,

@@ -156,12 +156,23 @@ export class Camera {
         if (whole.k >= kReadable) return whole;
         const { height } = this.size;
         const tall = (height - 2 * kFitMargin - kCornerHeight) / (area.bottom - area.top);
-        if (tall < kReadable) return this.centring(middle, kUsualZoom);
+        if (tall < kReadable) return this.usingRoom(area, this.centring(middle, kUsualZoom));
         const { k, x, y } = this.centring(
             { x: middle.x, y: (area.top + area.bottom) / 2 },
             Math.min(1, tall),
         );
-        return { k, x, y: y - kCornerHeight / 2 };
+        return this.usingRoom(area, { k, x, y: y - kCornerHeight / 2 });
+    }
+
+    // Room beside the picture goes to what lies out of sight on the other side.
+    private usingRoom({ left, top, right, bottom }: Rectangle, from: Placing): Placing {
+        const { width, height } = this.size;
+        const { k, x, y } = from;
+        return {
+            k,
+            x: x + shiftIntoRoom(left * k + x, width - right * k - x),
+            y: y + shiftIntoRoom(top * k + y, height - kCornerHeight - bottom * k - y),
+        };
     }
 
     centring(point: Point, k: number): Placing {
@@ -215,6 +226,14 @@ export function between(
         return size / 2 - (start + (end - start) * share) * k;
     };
     return { k, x: middle(a.x, b.x, width), y: middle(a.y, b.y, height) };
+}
+
+// How far a picture may move along one axis; before and behind are the px of room on either side, less than
+// none where it goes on.
+function shiftIntoRoom(before: number, behind: number): number {
+    if (before > kFitMargin && behind < kFitMargin) return -Math.min(before - kFitMargin, kFitMargin - behind);
+    if (behind > kFitMargin && before < kFitMargin) return Math.min(behind - kFitMargin, kFitMargin - before);
+    return 0;
 }
 
 function nudged(offset: number, low: number, high: number, size: number, margin: number): number {

@@ -30,6 +30,7 @@ export interface BoxLook {
 const kInset = 7; // px from the border to any text
 const kYearsSize = 11;
 const kKinSize = 10.5;
+const kLeastKinSize = 9.5; // before a word is cut
 
 // Silhouettes of 44 by 40 px, drawn at kFigureScale.
 const kFigureScale = 0.56;
@@ -119,7 +120,7 @@ function appendTallText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight
         box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
     if (look.years) box.append(text("years", middle, yearsY, fitLine(look.years, kYearsSize, 400, room)));
-    if (look.kinship) box.append(text("kin", middle, lastLine, fitLine(look.kinship, kKinSize, 400, room)));
+    if (look.kinship) box.append(kinText(middle, lastLine, look.kinship, kKinSize, room));
 }
 
 function appendWideText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
@@ -141,7 +142,9 @@ function appendWideText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight
     lower.forEach((line, i) => {
         const y = firstY + name.lines.length * pitch + i * 14;
         box.append(
-            text(line === look.kinship ? "kin" : "years", left, y, fitLine(line, kYearsSize, 400, room)),
+            line === look.kinship
+                ? kinText(left, y, line, kYearsSize, room)
+                : text("years", left, y, fitLine(line, kYearsSize, 400, room)),
         );
     });
     box.classList.add("wide");
@@ -162,6 +165,11 @@ function figure(look: BoxLook, x: number, y: number): SVGElement {
             transform: `translate(${x} ${y}) scale(${kFigureScale})`,
         });
     return text("unknown", x + 12, y + 19, "?");
+}
+
+function kinText(x: number, y: number, kinship: string, usualSize: number, room: number): SVGTextElement {
+    const size = textWidth(kinship, usualSize, 400) <= room ? usualSize : kLeastKinSize;
+    return text("kin", x, y, fitLine(kinship, size, 400, room), false, size === usualSize ? undefined : size);
 }
 
 function text(

@@ -64,6 +64,7 @@ export class Chrome {
     private readonly files: Popover;
     private readonly legend: HTMLDetailsElement;
     private shownGenerations = 0;
+    private readonly familyLegend: HTMLElement[] = []; // of lines that the pedigree never draws
 
     constructor(
         private readonly ui: UiMessages,
@@ -113,16 +114,21 @@ export class Chrome {
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
-        // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from.
-        this.disable("cousins", state.hidden.has("auntsUncles"));
-        this.disable("siblingSpouses", state.hidden.has("siblings"));
-        this.disable("niecesNephews", state.hidden.has("siblings"));
+        // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from. The
+        // pedigree has none of them, and the family view has its generations by the switches.
+        const isFamily = state.view === "family";
+        const { hidden } = state;
+        for (const name of this.switches.keys()) this.disable(name, !isFamily);
+        this.disable("cousins", !isFamily || hidden.has("auntsUncles"));
+        this.disable("siblingSpouses", !isFamily || hidden.has("siblings"));
+        this.disable("niecesNephews", !isFamily || hidden.has("siblings"));
         this.shownGenerations = state.generations;
         this.generations.textContent = String(state.generations);
         enable(
-            [this.fewer, state.generations > kLeastGenerations],
-            [this.more, state.generations < kMostGenerations],
+            [this.fewer, !isFamily && state.generations > kLeastGenerations],
+            [this.more, !isFamily && state.generations < kMostGenerations],
         );
+        for (const item of this.familyLegend) item.hidden = !isFamily;
     }
 
     showPanelState(open: boolean): void {
@@ -285,6 +291,10 @@ export class Chrome {
         const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
         const sign = (className: string, content: Element | string = "") =>
             html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
+        this.familyLegend.push(
+            row(sign("divorced"), items.divorced),
+            row(sign("adopted"), items.adopted),
+        );
         const list = html(
             "ul",
             { tabindex: 0, "aria-label": ui.legend },
@@ -294,8 +304,7 @@ export class Chrome {
             row(sign("focus"), items.focus),
             row(sign("more", "+3"), items.hidden),
             row(sign("missing", "?"), items.missing),
-            row(sign("divorced"), items.divorced),
-            row(sign("adopted"), items.adopted),
+            ...this.familyLegend,
             row(sign("twin", icon("twins")), items.repeated),
         );
         return html("details", { id: "legend" }, html("summary", {}, ui.legend), list);

@@ -8,6 +8,7 @@ import { html, onClick } from "./dom";
 import { icon } from "./icons";
 
 const kTime = 6000; // ms
+const kMostAtOnce = 3;
 
 export class Notices {
     readonly element = html("div", { id: "notices" });
@@ -58,7 +59,9 @@ export class Notices {
             dismiss,
         );
         onClick(dismiss, () => notice.remove());
-        this.element.replaceChildren(notice);
+        // The latest one last, where the eye is; those that nobody needs any more make room.
+        while (this.element.childElementCount >= kMostAtOnce) this.element.firstElementChild!.remove();
+        this.element.append(notice);
         return notice;
     }
 }

@@ -15,6 +15,7 @@ const kMostWidth = 200;
 const kMostHeight = 96;
 const kLeastHeight = 26;
 const kLeastFrame = 8;
+const kLeastUse = 12; // of either side; what is thinner shows nothing
 
 export class Overview {
     readonly element = html("div", { class: "overview", "aria-hidden": "true", hidden: true });
@@ -65,8 +66,9 @@ export class Overview {
     follow(): void {
         if (!this.area || !this.bounds) return;
         const window = this.camera.window();
-        this.element.hidden = encloses(window, this.bounds);
         const { area } = this;
+        const thin = Math.min(area.right - area.left, area.bottom - area.top) * this.scale;
+        this.element.hidden = thin < kLeastUse || encloses(window, this.bounds);
         const least = kLeastFrame / this.scale;
         const left = Math.max(area.left, window.left);
         const top = Math.max(area.top, window.top);

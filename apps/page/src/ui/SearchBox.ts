@@ -116,17 +116,27 @@ export class SearchBox {
     private look(): void {
         const text = this.input.value.trim();
         if (!text) return this.close();
-        this.found = this.source.find(text, kMostFound);
+        const found = this.source.find(text, kMostFound + 1);
+        this.found = found.slice(0, kMostFound);
+        const areMore = found.length > kMostFound;
         const { search } = this.messages;
         this.list.replaceChildren(...this.found.map((person, i) => this.option(person, i)));
-        if (this.found.length === 0)
-            this.list.append(
-                html("li", { class: "none", role: "option", "aria-disabled": "true" }, search.none),
-            );
+        if (this.found.length === 0) this.list.append(this.remark(search.none));
+        if (areMore) this.list.append(this.remark(search.first(kMostFound)));
         this.list.hidden = false;
         this.input.setAttribute("aria-expanded", "true");
-        this.status.textContent = this.found.length > 0 ? search.count(this.found.length) : search.none;
+        this.status.textContent = areMore ? search.first(kMostFound) : this.counted(this.found.length);
         this.select(this.found.length > 0 ? 0 : -1);
+    }
+
+    private counted(count: number): string {
+        const { search } = this.messages;
+        return count > 0 ? search.count(count) : search.none;
+    }
+
+    // A row that nobody can choose.
+    private remark(text: string): HTMLLIElement {
+        return html("li", { class: "none", role: "option", "aria-disabled": "true" }, text);
     }
 
     private option(person: Person, index: number): HTMLLIElement {

@@ -18,6 +18,8 @@ export interface KeyActions {
     zoomIn(): void;
     zoomOut(): void;
     fit(): void;
+    back(): void;
+    forward(): void;
 }
 
 const kPanStep = 90; // px
@@ -46,8 +48,18 @@ const kInPicture: Readonly<Record<string, (actions: KeyActions) => void>> = {
     n: (actions) => actions.nextBox(),
 };
 
-// Whether the key meant something. Keys with Ctrl, Alt or the like are the browser's.
+const kWithAlt: Readonly<Record<string, (actions: KeyActions) => void>> = {
+    ArrowLeft: (actions) => actions.back(),
+    ArrowRight: (actions) => actions.forward(),
+};
+
+// Whether the key meant something. Other keys with Ctrl, Alt or the like are the browser's.
 export function pictureKey(event: KeyboardEvent, inPicture: boolean, actions: KeyActions): boolean {
+    if (event.altKey && !event.ctrlKey && !event.metaKey && !event.shiftKey) {
+        const action = kWithAlt[event.key];
+        action?.(actions);
+        return action !== undefined;
+    }
     if (event.ctrlKey || event.altKey || event.metaKey) return false;
     const arrow = kArrows[event.key];
     if (arrow && inPicture) {

@@ -62,11 +62,6 @@ export class OpenFamily {
         return best;
     }
 
-    personOfXref(xref: string): Person | undefined {
-        const plain = xref.replaceAll("@", "");
-        return plain ? this.persons.find((person) => person.xref === plain) : undefined;
-    }
-
     // Asked for again and again with one focus, searched once.
     kinshipsTo(focus: number): ReadonlyMap<number, Kinship> {
         if (this.kinshipFocus !== focus || !this.kinships) {

@@ -35,12 +35,12 @@ export const kFamilySizes: Sizes = {
 };
 
 export const kPedigreeSizes: Sizes = {
-    nodeWidth: 176,
+    nodeWidth: 196,
     nodeHeight: 58,
-    horzPadding: 44,
-    vertPadding: 16,
+    horzPadding: 36,
+    vertPadding: 14,
     spouseLineStep: 9,
-    lineInset: 22,
+    lineInset: 18,
 };
 
 export function sizesOf(view: ViewName): Sizes {

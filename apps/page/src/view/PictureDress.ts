@@ -59,8 +59,11 @@ export class PictureDress implements Dress {
         return nearKinshipText(kinship, sex, this.wording.messages);
     }
 
+    // The pedigree's flags tell of ancestors alone, and its last column has none.
     hiddenOf(box: Box): number {
-        return box.hasHiddenRelatives ? this.family.hiddenRelatives(box.person, this.picture) : -1;
+        if (this.picture.view === "family" && !box.hasHiddenRelatives) return -1;
+        const hidden = this.family.hiddenRelatives(box.person, this.picture);
+        return hidden > 0 || this.picture.view === "family" ? hidden : -1;
     }
 
     lookOf(box: Box): BoxLook {

@@ -94,7 +94,16 @@ export function clampGenerations(generations: number): number {
 
 function focusIn(parts: URLSearchParams, persons: readonly Person[]): number {
     const xref = parts.get("person")?.replaceAll("@", "");
-    if (xref) return persons.find((person) => person.xref === xref)?.id ?? 0;
+    if (xref) return personOfXref(xref, persons)?.id ?? 0;
     const id = Number(parts.get("number"));
     return Number.isInteger(id) && persons[id - 1] ? id : 0;
+}
+
+// People type an identifier as they like; the file's own letters come first.
+function personOfXref(xref: string, persons: readonly Person[]): Person | undefined {
+    const capitals = xref.toUpperCase();
+    return (
+        persons.find((person) => person.xref === xref) ??
+        persons.find((person) => person.xref.toUpperCase() === capitals)
+    );
 }
