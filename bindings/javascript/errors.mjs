@@ -15,6 +15,13 @@ export class LayoutError extends Error {
 
 export class HostError extends LayoutError {}
 
+/** The module's memory has no room for what comes from JavaScript. */
+export class OutOfMemory extends RangeError {
+    constructor() {
+        super("not enough memory");
+    }
+}
+
 export class GedcomError extends Error {
     constructor(message) {
         super(message);

@@ -6,6 +6,7 @@
 
 import { GedcomError, LayoutError } from "./errors.mjs";
 import { runLayout } from "./layout.mjs";
+import { focusNumber } from "./options.mjs";
 
 const SEXES = ["male", "female", "other"];
 const MARKS = ["exact", "about", "before", "after", "between"];
@@ -106,12 +107,12 @@ export class GedcomFile {
 
     #run(focus, options) {
         const file = this.#opened();
-        if (this.persons[focus - 1] === undefined) {
+        if (this.persons[focusNumber(focus) - 1] === undefined) {
             throw new LayoutError("invalidPerson", `${this.name}: there is no person ${focus}`, "", []);
         }
         try {
-            return runLayout(this.#instance, null, options, (view) =>
-                this.#instance.exports.gedcom_layout(file, view, focus),
+            return runLayout(this.#instance, null, focus, options, (view, person) =>
+                this.#instance.exports.gedcom_layout(file, view, person),
             );
         } catch (error) {
             // A file answers every question; it only ends a layout that asks for too much.

@@ -4,6 +4,7 @@
 // The WebAssembly module at work: its memory as texts and numbers, and what it imports. A host's error can't pass
 // through the module, so a question keeps what the host threw and tells a failure; the layout throws it on.
 
+import { OutOfMemory } from "./errors.mjs";
 import { PERSON_NOT_FOUND } from "./values.mjs";
 
 const utf8 = { decoder: new TextDecoder(), encoder: new TextEncoder() };
@@ -16,6 +17,23 @@ function wholeId(id) {
 function parentId(answer) {
     const unknown = answer === null || answer === undefined || answer === PERSON_NOT_FOUND;
     return unknown ? Infinity : wholeId(answer);
+}
+
+function sexNumber(answer) {
+    if (Number.isInteger(answer)) return answer === 0 ? 0 : 1;
+    throw new TypeError(`a host answered ${String(answer)} where a sex is a whole number`);
+}
+
+// Any answer is true or not, but what only promises one.
+function truthNumber(answer) {
+    if (typeof answer?.then !== "function") return answer ? 1 : 0;
+    throw new TypeError("a host answered a promise where yes or no is due at once");
+}
+
+function dateText(answer) {
+    if (typeof answer === "string") return answer;
+    if (answer === null || answer === undefined) return "";
+    throw new TypeError(`a host answered ${String(answer)} where a date is a string`);
 }
 
 export class Instance {
@@ -33,19 +51,21 @@ export class Instance {
     #thrown = null;
     #broken = null;
 
+    // The module's pointers and counts have 32 bits and no sign, which JavaScript takes for one.
     text(pointer) {
         const bytes = new Uint8Array(this.exports.memory.buffer);
-        return utf8.decoder.decode(bytes.subarray(pointer, bytes.indexOf(0, pointer)));
+        const begin = pointer >>> 0;
+        return utf8.decoder.decode(bytes.subarray(begin, bytes.indexOf(0, begin)));
     }
 
     numbers(pointer, count) {
-        return new Int32Array(this.exports.memory.buffer, pointer, count);
+        return new Int32Array(this.exports.memory.buffer, pointer >>> 0, count >>> 0);
     }
 
     /** Copies bytes in, with a zero behind them, for as long as use runs. */
     withBytes(bytes, use) {
-        const pointer = this.exports.malloc(bytes.length + 1);
-        if (pointer === 0) throw new RangeError("not enough memory");
+        const pointer = this.exports.malloc(bytes.length + 1) >>> 0;
+        if (pointer === 0) throw new OutOfMemory();
         try {
             const memory = new Uint8Array(this.exports.memory.buffer);
             memory.set(bytes, pointer);
@@ -96,7 +116,7 @@ export class Instance {
     #askList(question, list) {
         return this.#ask((host) => {
             for (const id of question(host)) {
-                if (this.exports.append_person(list, wholeId(id)) !== 0) return 1;
+                if (this.exports.append_person(list, wholeId(id)) !== 0) throw new OutOfMemory();
             }
             return 0;
         }, 1);
@@ -104,7 +124,9 @@ export class Instance {
 
     #askNumber(question, pointer) {
         return this.#ask((host) => {
-            this.numbers(pointer, 1)[0] = Number(question(host));
+            // Asked before the memory is looked at, which a host may let grow.
+            const answer = question(host);
+            this.numbers(pointer, 1)[0] = answer;
             return 0;
         }, 1);
     }
@@ -117,16 +139,16 @@ export class Instance {
                 spouses_of: (person, list) => this.#askList((host) => host.spousesOf(person), list),
                 children_of: (person, list) => this.#askList((host) => host.childrenOf(person), list),
                 is_preferred_spouse: (person, spouse, answer) =>
-                    this.#askNumber((host) => host.isPreferredSpouse(person, spouse), answer),
-                is_dead: (person, answer) => this.#askNumber((host) => host.isDead(person), answer),
+                    this.#askNumber((host) => truthNumber(host.isPreferredSpouse(person, spouse)), answer),
+                is_dead: (person, answer) => this.#askNumber((host) => truthNumber(host.isDead(person)), answer),
                 date_of: (person, isBirth, date) =>
                     this.#ask((host) => {
-                        const text = String(host.dateOf(person, isBirth !== 0) ?? "");
+                        const text = dateText(host.dateOf(person, isBirth !== 0));
                         return this.withText(text, (pointer) => this.exports.set_date(date, pointer));
                     }, 1),
-                sex_of: (person, answer) => this.#askNumber((host) => host.sexOf(person), answer),
+                sex_of: (person, answer) => this.#askNumber((host) => sexNumber(host.sexOf(person)), answer),
                 compose: (pointer, length, result) => {
-                    const bytes = new Uint8Array(this.exports.memory.buffer, pointer, length);
+                    const bytes = new Uint8Array(this.exports.memory.buffer, pointer >>> 0, length >>> 0);
                     const text = utf8.decoder.decode(bytes).normalize("NFC");
                     this.withText(text, (made, size) => this.exports.composed_text(result, made, size));
                 },

@@ -19,7 +19,8 @@ export const PERSON_NOT_FOUND: number;
 /**
  * What a host answers. Ids are the host's own, whole numbers of 1 and more for real persons; only their low 32
  * bits count. The methods are asked many times for the same person, since no answer is kept, and must agree with
- * themselves within one layout. A method may throw: the layout then ends with HostError.
+ * themselves within one layout. A method may throw: the layout then ends with HostError. So does an answer of
+ * another type, such as a promise: every answer is due at once.
  */
 export interface Host {
     fatherOf(person: number): number | null | undefined;
@@ -30,9 +31,12 @@ export interface Host {
     /** Whether spouse is the preferred one of person. */
     isPreferredSpouse(person: number, spouse: number): boolean;
     isDead(person: number): boolean;
-    /** The date of birth, asked of children, or another date, asked of spouses: any form, empty if not known. */
-    dateOf(person: number, isBirth: boolean): string;
-    /** 0 is male; any other number counts as female. */
+    /**
+     * The date of birth, asked of children, or another date, asked of spouses: in any form, empty or null where it
+     * is not known.
+     */
+    dateOf(person: number, isBirth: boolean): string | null | undefined;
+    /** 0 is male; any other whole number counts as female. */
     sexOf(person: number): number;
 }
 
@@ -66,16 +70,20 @@ export interface Sizes {
     lineInset: number;
 }
 
+/**
+ * What is undefined is as if it were not given. A name that is none of these and a value of another type are a
+ * TypeError, a number out of its range is a RangeError.
+ */
 export interface Options {
     /** family: relatives above, beside and below. pedigree: ancestors, lying sideways. */
-    view?: "family" | "pedigree";
-    sizes?: Partial<Sizes>;
+    view?: "family" | "pedigree" | undefined;
+    sizes?: { readonly [Name in keyof Sizes]?: number | undefined } | undefined;
     /** Family view: bits of Shown; all of them if not given. */
-    shown?: number;
+    shown?: number | undefined;
     /** Pedigree: columns, the focus's own included: 1 to 1,000; 5. A full ancestry of n is 2 ** n - 1 boxes. */
-    generations?: number;
-    /** Pedigree: generations, the focus's own included, in which partners off the chart raise the flag; 4. */
-    flagDepth?: number;
+    generations?: number | undefined;
+    /** Pedigree: generations, the focus's own included, in which partners off the chart raise the flag: 0 or more; 4. */
+    flagDepth?: number | undefined;
 }
 
 /** A straight piece of a line, in points. */
@@ -102,7 +110,6 @@ export interface LayoutRecord {
 /** A layout that did not come to its end. text and records are what was laid out before, often nothing. */
 export class LayoutError extends Error {
     readonly status:
-        | "invalidArgument"
         | "invalidPerson"
         | "hostFailed"
         | "layoutFailed"
@@ -221,9 +228,9 @@ export class GedcomFile {
 export class Olvane {
     /** "MAJOR.MINOR.PATCH". */
     readonly version: string;
-    /** One record for each box, in the order of the walk. Throws LayoutError. */
+    /** One record for each box, in the order of the walk. Throws LayoutError; TypeError and RangeError as Options say. */
     layout(host: Host, focus: number, options?: Options): LayoutRecord[];
-    /** The engine's own line of text. Throws LayoutError. */
+    /** The engine's own line of text. Throws as layout does. */
     layoutText(host: Host, focus: number, options?: Options): string;
     /** Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Throws GedcomError. */
     readGedcom(bytes: Uint8Array, name?: string): GedcomFile;

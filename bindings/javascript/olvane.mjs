@@ -32,7 +32,8 @@ export class Olvane {
     }
 
     #run(host, focus, options) {
-        return runLayout(this.#instance, host, options, (view) => this.#instance.exports.layout_host(view, focus));
+        const { exports } = this.#instance;
+        return runLayout(this.#instance, host, focus, options, (view, person) => exports.layout_host(view, person));
     }
 }
 

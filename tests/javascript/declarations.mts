@@ -34,8 +34,11 @@ class Family implements Host {
 
 const options: Options = { view: "pedigree", generations: 6, flagDepth: 2, sizes: { nodeWidth: 120 } };
 const olvane = await loadOlvane(new Uint8Array());
+const usual: Options = { view: undefined, shown: undefined, sizes: { nodeWidth: undefined } };
 const records: LayoutRecord[] = olvane.layout(new Family(), 1, options);
 const texts: string[] = [olvane.version, olvane.layoutText(new Family(), 1, { shown: Shown.all & ~Shown.cousins })];
+const unknown: Host["dateOf"] = () => null;
+texts.push(olvane.layoutText(new Family(), 1, usual), unknown(1, true) ?? "");
 try {
     const file = olvane.readGedcom(new Uint8Array(), "x.ged");
     for (const person of file.persons) texts.push(person.name, person.birth?.shown ?? "", person.sex);
@@ -51,5 +54,10 @@ try {
 records[0]!.x = 1;
 // @ts-expect-error: there are two views
 olvane.layout(new Family(), 1, { view: "fan" });
+// @ts-expect-error: a width is one of the sizes
+olvane.layout(new Family(), 1, { nodeWidth: 105 });
+// @ts-expect-error: an answer is due at once
+const late: Host["isDead"] = async () => true;
+late(1);
 // @ts-expect-error: a host answers all eight questions
 olvane.layout({ fatherOf: () => null }, 1);

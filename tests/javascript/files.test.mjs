@@ -162,6 +162,10 @@ test("a person outside the file is refused", () => {
     const file = olvane.readGedcom(bytesOf(couple));
     assert.throws(() => file.layout(4), { name: "LayoutError", status: "invalidPerson" });
     assert.throws(() => file.layout(0), { name: "LayoutError", status: "invalidPerson" });
+    assert.throws(() => file.layout(1.5), { name: "LayoutError", status: "invalidPerson" });
+    for (const focus of [1n, Symbol("1"), "1"]) assert.throws(() => file.layout(focus), TypeError);
+    assert.throws(() => file.layout(1, null), TypeError);
+    assert.ok(file.layout(1).length > 0, "the next request is unaffected");
     assert.throws(() => file.factsOfPerson(4), GedcomError);
     assert.throws(() => file.factsOfFamily(2), GedcomError);
 });

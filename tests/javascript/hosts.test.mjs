@@ -4,12 +4,32 @@
 // A host in JavaScript is asked, laid out and told what went wrong.
 
 import assert from "node:assert/strict";
+import { readFile } from "node:fs/promises";
 import test from "node:test";
 
-import { HostError, LayoutError, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
+import { Instance } from "../../bindings/javascript/instance.mjs";
+import { runLayout } from "../../bindings/javascript/layout.mjs";
+import { HostError, LayoutError, Olvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
 import { henry, olvane, TableHost } from "./module.mjs";
 
+const SIZES = {
+    nodeWidth: undefined,
+    nodeHeight: undefined,
+    horzPadding: undefined,
+    vertPadding: undefined,
+    spouseLineStep: undefined,
+    lineInset: undefined,
+};
+
 const hostOf = (changes) => Object.assign(new TableHost(henry), changes);
+
+// The layout ends with a HostError whose cause is a TypeError with these words.
+function assertAnswerIsRefused(changes, words) {
+    assert.throws(
+        () => olvane.layout(hostOf(changes), 1),
+        (error) => error instanceof HostError && error.cause instanceof TypeError && words.test(error.cause.message),
+    );
+}
 
 test("a childless couple without parents stands side by side", () => {
     const couple = new TableHost({ 1: [0, 0, [2], [], 0], 2: [0, 0, [1], [], 1] });
@@ -32,7 +52,8 @@ test("records say what the text says", () => {
         .map((record) => {
             const lines = record.segments.map(({ x1, y1, x2, y2 }) => `${x1},${y1},${x2},${y2}|`).join("");
             const flag = record.hasHiddenRelatives ? 1 : 0;
-            const behind = record.kind === "person" ? "" : `:${record.kind === "missingFather" ? "M" : "F"}:${record.child}`;
+            const behind =
+                record.kind === "person" ? "" : `:${record.kind === "missingFather" ? "M" : "F"}:${record.child}`;
             return `${record.id}:${record.x}:${record.y}:${flag}:${lines}${behind};`;
         })
         .join("");
@@ -109,15 +130,10 @@ for (const question of Object.getOwnPropertyNames(TableHost.prototype).filter((n
                 throw thrown;
             },
         });
-        try {
-            olvane.layout(failing, 1);
-        } catch (error) {
-            assert.ok(error instanceof HostError);
-            assert.equal(error.cause, thrown);
-            return;
-        }
-        // Not every question is asked about every family; these two only where an order hangs on them.
-        assert.ok(["isPreferredSpouse", "isDead", "dateOf"].includes(question));
+        assert.throws(
+            () => olvane.layout(failing, 1),
+            (error) => error instanceof HostError && error.cause === thrown,
+        );
     });
 }
 
@@ -129,7 +145,7 @@ test("an id that is no whole number is refused", () => {
 });
 
 test("a focus that is nobody is refused", () => {
-    for (const focus of [0, -1, 2 ** 53, Infinity, NaN]) {
+    for (const focus of [0, -1, 1.5, 2 ** 53, Infinity, NaN]) {
         assert.throws(() => olvane.layout(new TableHost(henry), focus), {
             name: "LayoutError",
             status: "invalidPerson",
@@ -137,14 +153,95 @@ test("a focus that is nobody is refused", () => {
     }
 });
 
+test("a focus that is no number is refused, and the next request is answered", () => {
+    const host = new TableHost(henry);
+    const plain = olvane.layoutText(host, 1);
+    for (const focus of [1n, Symbol("1"), "1", null, undefined, {}]) {
+        const message = /^the focus is .*, and takes a number$/;
+        assert.throws(() => olvane.layout(host, focus), { name: "TypeError", message });
+        assert.equal(olvane.layoutText(host, 1), plain);
+    }
+});
+
+test("a sex that is no whole number is refused", () => {
+    for (const sex of ["F", "1", null, undefined, NaN, 0.5, 1n, true, Promise.resolve(1)]) {
+        assertAnswerIsRefused({ sexOf: () => sex }, /where a sex is a whole number/);
+    }
+});
+
+test("a promise is no answer", () => {
+    for (const question of Object.getOwnPropertyNames(TableHost.prototype).filter((name) => name !== "constructor")) {
+        assertAnswerIsRefused({ [question]: () => Promise.resolve(1) }, /promise|iterable/i);
+    }
+});
+
+test("a date that is no string is refused", () => {
+    for (const date of [1850, new Date(0), {}, ["1850"]]) {
+        assertAnswerIsRefused({ dateOf: () => date }, /where a date is a string/);
+    }
+    for (const unknown of [null, undefined]) {
+        const text = olvane.layoutText(hostOf({ dateOf: () => unknown }), 1);
+        assert.equal(text, olvane.layoutText(new TableHost(henry), 1));
+    }
+});
+
 test("options out of their range are refused", () => {
     const host = new TableHost(henry);
-    assert.throws(() => olvane.layout(host, 1, { view: "fan" }), TypeError);
-    assert.throws(() => olvane.layout(host, 1, { view: "pedigree", generations: 0 }), { status: "invalidArgument" });
-    assert.throws(() => olvane.layout(host, 1, { view: "pedigree", generations: 1001 }), {
-        status: "invalidArgument",
-    });
-    assert.throws(() => olvane.layout(host, 1, { sizes: { nodeWidth: Infinity } }), { status: "invalidArgument" });
+    const ranges = [
+        ["generations", [0, -1, 1001, 2.9, 2 ** 32 + 3, NaN, Infinity], "a whole number of 1 to 1000"],
+        ["flagDepth", [-1, 0.5, 2 ** 31, 2 ** 32], "a whole number of 0 to 2147483647"],
+        ["shown", [-1, ~Shown.siblings, 256, 2 ** 32, 0.5, NaN], "a whole number of 0 to 255"],
+    ];
+    for (const [name, values, takes] of ranges) {
+        for (const value of values) {
+            const message = `${name} is ${value}, and takes ${takes}`;
+            assert.throws(() => olvane.layout(host, 1, { [name]: value }), { name: "RangeError", message });
+        }
+    }
+    for (const size of Object.keys(SIZES)) {
+        for (const value of [Infinity, -Infinity, NaN, 1e39]) {
+            const message = `sizes.${size} is ${value}, and takes a finite number of single precision`;
+            assert.throws(() => olvane.layout(host, 1, { sizes: { [size]: value } }), { name: "RangeError", message });
+        }
+    }
+});
+
+test("options at the ends of their ranges are taken", () => {
+    const host = new TableHost(henry);
+    for (const options of [
+        { shown: 0, flagDepth: 0, generations: 1 },
+        { shown: Shown.all, flagDepth: 2 ** 31 - 1, generations: 1000 },
+    ]) {
+        assert.ok(olvane.layout(host, 1, options).length > 0);
+    }
+    assert.equal(olvane.layout(host, 3, { view: "pedigree", flagDepth: 0, generations: 1 }).length, 1);
+});
+
+test("options of another type are refused by their names", () => {
+    const host = new TableHost(henry);
+    const refused = (options, message) =>
+        assert.throws(() => olvane.layout(host, 1, options), { name: "TypeError", message }, message);
+    refused(null, "options is null, and takes an object");
+    refused("pedigree", 'options is "pedigree", and takes an object');
+    refused({ view: "fan" }, 'there is no view "fan", but "family" and "pedigree"');
+    refused({ view: null }, 'there is no view null, but "family" and "pedigree"');
+    refused({ view: 1n }, 'there is no view 1, but "family" and "pedigree"');
+    refused({ shown: "x" }, 'shown is "x", and takes a number');
+    refused({ shown: null }, "shown is null, and takes a number");
+    refused({ generations: 5n }, "generations is 5, and takes a number");
+    refused({ sizes: null }, "sizes is null, and takes an object");
+    refused({ sizes: { nodeWidth: "55" } }, 'sizes.nodeWidth is "55", and takes a number');
+    refused({ sizes: { width: 55 } }, `there is no size width, but ${Object.keys(SIZES).join(", ")}`);
+    const known = "there is no option %, but view, sizes, shown, generations, flagDepth";
+    refused({ generation: 3 }, known.replace("%", "generation"));
+    refused({ nodeWidth: 105 }, `${known.replace("%", "nodeWidth")}; nodeWidth is one of the sizes`);
+});
+
+test("an option that is undefined is as if it were not given", () => {
+    const host = new TableHost(henry);
+    const options = { view: undefined, shown: undefined, generations: undefined, flagDepth: undefined, sizes: SIZES };
+    assert.equal(olvane.layoutText(host, 1, options), olvane.layoutText(host, 1));
+    assert.equal(olvane.layoutText(host, 1, { sizes: undefined }), olvane.layoutText(host, 1));
 });
 
 test("a layout inside a layout is refused, and the outer one goes on", () => {
@@ -172,4 +269,46 @@ test("a family of a thousand generations is laid out", () => {
     for (let id = 1; id <= 1000; ++id) table[id] = [id < 1000 ? id + 1 : 0, 0, [], id > 1 ? [id - 1] : [], 0];
     const records = olvane.layout(new TableHost(table), 1, { view: "pedigree", generations: 1000 });
     assert.equal(records.filter(({ kind }) => kind === "person").length, 1000);
+});
+
+// Leaves the module with little more than a megabyte to grow into.
+async function nearlyFullInstance() {
+    const instance = await Instance.of(await readFile(process.env.OLVANE_WASM));
+    for (let size = 2 ** 30; size >= 2 ** 20;) {
+        if (instance.exports.malloc(size) === 0) size /= 2;
+    }
+    return instance;
+}
+
+test("what finds no room in the module's memory is no failure of the host", async () => {
+    const full = new Olvane(await nearlyFullInstance());
+    const plain = olvane.layoutText(new TableHost(henry), 1);
+    const endless = {
+        *[Symbol.iterator]() {
+            for (;;) yield 5;
+        },
+    };
+    for (const changes of [
+        { spousesOf: () => endless },
+        { childrenOf: () => endless },
+        { dateOf: () => "1850".repeat(1e6) },
+    ]) {
+        assert.throws(() => full.layout(hostOf(changes), 1), {
+            name: "LayoutError",
+            status: "outOfMemory",
+            message: "There is not enough memory.",
+        });
+        assert.equal(full.layoutText(new TableHost(henry), 1), plain, "the next request is unaffected");
+    }
+});
+
+test("a module that broke off answers no more", async () => {
+    const instance = await Instance.of(await readFile(process.env.OLVANE_WASM));
+    const cause = new RangeError("Maximum call stack size exceeded");
+    const breakOff = () => {
+        throw cause;
+    };
+    const message = "the module broke off in a layout; load it anew";
+    assert.throws(() => runLayout(instance, new TableHost(henry), 1, {}, breakOff), { message, cause });
+    assert.throws(() => new Olvane(instance).layout(new TableHost(henry), 1), { message, cause });
 });
