@@ -40,8 +40,7 @@ typedef enum olvane_status {
     OLVANE_INVALID_ARGUMENT = 1, /* a null pointer, a missing callback, or an option out of its range */
     OLVANE_INVALID_PERSON = 2,   /* the low 32 bits of the focus's id say no number of 1 or more */
     OLVANE_HOST_FAILED = 3,      /* a callback reported failure; the layout holds what came before */
-    OLVANE_LAYOUT_FAILED =
-        4, /* the family's data leave no picture: some relatives with an id below 1 do that */
+    OLVANE_LAYOUT_FAILED = 4,    /* the data leave no picture: relatives with ids below 1 may do that */
     OLVANE_OUT_OF_MEMORY = 5,
     OLVANE_NESTED_CALL = 6 /* asked for by a callback of a layout that is still running on this thread */
 } olvane_status;
@@ -54,7 +53,7 @@ OLVANE_C_API const char* olvane_version(void);
 
 /* ---- The host's data ----------------------------------------------------------------------------------- */
 
-/* The answer for a parent whom the host does not know; it stands there when the callback begins. 0 and -1 are not. */
+/* The answer for a parent whom the host does not know. 0 and -1 are not. */
 #define OLVANE_PERSON_NOT_FOUND INT64_MAX
 
 /* Answers of a callback that are no plain numbers. Both start empty and live only within the callback. */
