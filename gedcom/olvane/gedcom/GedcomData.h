@@ -91,7 +91,7 @@ struct Family {
     LineNumber line = 0;
     LineNumber husbandLine = 0;
     LineNumber wifeLine = 0;
-    bool married = false;   // MARR is there
+    bool married = false;   // MARR is there, and not as one that did not happen
     bool divorced = false;  // DIV is there, and no second MARR after it
 };
 

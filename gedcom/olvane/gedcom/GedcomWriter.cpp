@@ -1,13 +1,17 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A GEDCOM text line by line. Values are written as version 5.5.1 has them, a leading @ doubled, on one line
-// each however long, which every reader of ours takes.
+// A GEDCOM text line by line. Values are written as version 5.5.1 has them, every @ doubled but those of a
+// calendar, on one line each however long, which every reader of ours takes.
 
 #include <olvane/gedcom/GedcomWriter.h>
 
+#include <algorithm>
 #include <cstddef>
 #include <unordered_set>
+#include <utility>
+
+#include <olvane/gedcom/NameSpotterInternal.h>
 
 namespace olvane::gedcom {
 namespace {
@@ -36,9 +40,35 @@ bool isPlainXref(std::string_view xref) {
     return !xref.empty() && xref.size() <= kLongest && xref.find_first_of("@#! \t") == std::string_view::npos;
 }
 
+// The calendar at this place of a date, as "@#DJULIAN@"; empty where none stands. A reader takes one where a word
+// begins, so that no @ that is text stands before it.
+std::string_view calendarAt(std::string_view date, std::size_t at) {
+    const std::string_view rest = date.substr(at);
+    const bool beginsWord = at == 0 || date[at - 1] == ' ';
+    if (!beginsWord || !(rest.starts_with("@#D") || rest.starts_with("@#d"))) return {};
+    const std::size_t end = rest.find('@', 1);
+    return end == std::string_view::npos ? std::string_view() : rest.substr(0, end + 1);
+}
+
+// Facts that have no meaning of their own, but the text that somebody wrote.
+bool isFreeText(const Fact& fact) {
+    return fact.tag == "EVEN" || fact.tag == "FACT";
+}
+
+// Behind a tag these say that something happened, or that it did not.
+bool isYesOrNo(std::string_view value) {
+    return value == "Y" || value == "N";
+}
+
 class Writer {
 public:
-    Writer(const GedcomData& data, const WriteOptions& options) : data_(data), options_(options) {}
+    Writer(const GedcomData& data, const WriteOptions& options)
+        : data_(data),
+          options_(options),
+          anybodyHidden_(std::find(options.hidden.begin(), options.hidden.end(), true) !=
+                         options.hidden.end()) {
+        if (anybodyHidden_) hiddenNames_ = spotHiddenNames();
+    }
 
     std::string text() && {
         nameRecords();
@@ -52,6 +82,20 @@ public:
 private:
     bool isHidden(PersonId id) const {
         return id != 0 && id <= options_.hidden.size() && options_.hidden[id - 1];
+    }
+
+    NameSpotter spotHiddenNames() const {
+        NameSpotter names;
+        for (PersonId id = 1; id <= data_.personCount(); ++id) {
+            if (isHidden(id)) names.add(data_, id);
+        }
+        names.settle();
+        return names;
+    }
+
+    // What may be told: the text, or nothing where it names somebody hidden.
+    std::string_view shown(std::string_view text) const {
+        return anybodyHidden_ && hiddenNames_.isNamedIn(text) ? std::string_view() : text;
     }
 
     // Identifiers that stay are settled first, so that none that is made meets one of them.
@@ -69,7 +113,7 @@ private:
     }
 
     void keepXref(std::string& name, std::string_view xref) {
-        if (isPlainXref(xref) && taken_.insert(std::string(xref)).second) name = xref;
+        if (isPlainXref(xref) && !shown(xref).empty() && taken_.insert(std::string(xref)).second) name = xref;
     }
 
     void makeXref(std::string& name, const char* prefix, std::uint32_t id) {
@@ -126,10 +170,32 @@ private:
     }
 
     void writeFact(const Fact& fact) {
-        const bool bare = fact.value.empty() && fact.place.empty() && !fact.date.isGiven();
-        line(1, fact.tag, bare ? std::string_view("Y") : fact.value);
-        piece("DATE", fact.date.written);
-        piece("PLAC", fact.place);
+        const bool untold = anybodyHidden_ && isFreeText(fact);
+        const std::string_view value = untold ? std::string_view() : shown(fact.value);
+        const std::string_view place = shown(fact.place);
+        const std::string_view date = shown(fact.date.written);
+        const bool bare = value.empty() && place.empty() && date.empty();
+        if (bare && untold) return;
+        if (isYesOrNo(value)) {
+            line(1, fact.tag);
+            line(2, "TYPE", value);
+        } else {
+            line(1, fact.tag, bare ? std::string_view("Y") : value);
+        }
+        if (!date.empty()) writeDate(date);
+        piece("PLAC", place);
+    }
+
+    void writeDate(std::string_view date) {
+        start(2, "DATE");
+        text_ += ' ';
+        for (std::size_t at = 0; at < date.size();) {
+            const std::string_view calendar = calendarAt(date, at);
+            if (calendar.empty()) appendDoubled(date.substr(at, 1));
+            text_ += calendar;
+            at += std::max<std::size_t>(calendar.size(), 1);
+        }
+        text_ += '\n';
     }
 
     void writeLink(std::string_view tag, const FamilyLink& link) {
@@ -191,17 +257,14 @@ private:
         text_ += tag;
     }
 
-    // A calendar's escape is no text, and stays as it is.
     void appendDoubled(std::string_view value) {
-        if (value.starts_with("@#")) {
-            text_ += value;
-            return;
-        }
         for (const char c : value) text_.append(c == '@' ? 2 : 1, c);
     }
 
     const GedcomData& data_;
     const WriteOptions& options_;
+    bool anybodyHidden_;
+    NameSpotter hiddenNames_;
     std::unordered_set<std::string> taken_;
     std::vector<std::string> personXrefs_;
     std::vector<std::string> familyXrefs_;

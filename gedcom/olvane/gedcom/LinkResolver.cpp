@@ -7,7 +7,9 @@
 
 #include <olvane/gedcom/LinkResolverInternal.h>
 
+#include <algorithm>
 #include <cstddef>
+#include <cstdint>
 #include <span>
 #include <string>
 #include <vector>
@@ -15,8 +17,8 @@
 namespace olvane::gedcom {
 namespace {
 
-// Lists for persons whom the family does not name as partners may hold so many entries for each CHIL of the
-// file, so that a file in which all claim one family stays small in memory.
+// Lists for persons whom the family does not name as partners may hold so many entries for each child of the
+// file's families, so that a file in which all claim one family stays small in memory.
 constexpr std::size_t kClaimedChildren = 1;
 constexpr std::size_t kClaimedChildrenAtLeast = 1000;
 
@@ -27,13 +29,13 @@ public:
           xrefs_(xrefs),
           diagnostics_(diagnostics),
           takenBy_(tables.persons.size() + 1, 0),
-          visitedBy_(tables.families.size() + 1, 0),
-          claimsLeft_(tables.childLinks.size() * kClaimedChildren + kClaimedChildrenAtLeast) {}
+          visitedBy_(tables.families.size() + 1, 0) {}
 
     // Families before persons: relatives are found through them.
     void resolveAll() {
         for (Family& family : tables_.families) resolveFamily(family);
         for (ChildLink& link : tables_.childLinks) link.child = personAt(link.child, link.line);
+        countChildren();
         for (FamilyLink& link : tables_.parentLinks) link.family = familyAt(link.family, link.line);
         for (FamilyLink& link : tables_.coupleLinks) link.family = familyAt(link.family, link.line);
         for (PersonId id = 1; id <= tables_.persons.size(); ++id) findParents(tables_.persons[id - 1]);
@@ -49,6 +51,17 @@ private:
         if (family.husband == 0 || family.husband != family.wife) return;
         diagnostics_.add(DiagnosticKind::samePartners, Severity::warning, family.wifeLine,
                          "one person as both partners of a family", "not their own spouse", family.xref);
+    }
+
+    // Links that lead nowhere do not count.
+    void countChildren() {
+        for (const Family& family : tables_.families) {
+            const auto links = childLinks(family);
+            const auto known = std::count_if(links.begin(), links.end(),
+                                             [](const ChildLink& link) { return link.child != 0; });
+            childrenOf_.push_back(static_cast<std::uint32_t>(known));
+            claimsLeft_ += kClaimedChildren * childrenOf_.back();
+        }
     }
 
     PersonId personAt(XrefPlace place, LineNumber line) {
@@ -138,7 +151,7 @@ private:
     bool mayListChildren(PersonId id, const FamilyLink& link) {
         const Family& family = tables_.families[link.family - 1];
         if (family.husband == id || family.wife == id) return true;
-        const std::size_t wanted = family.childLinkSlice.count;
+        const std::size_t wanted = childrenOf_[link.family - 1];
         if (wanted <= claimsLeft_) {
             claimsLeft_ -= wanted;
             return true;
@@ -162,9 +175,10 @@ private:
     GedcomTables& tables_;
     const XrefTable& xrefs_;
     DiagnosticList& diagnostics_;
-    std::vector<PersonId> takenBy_;    // by person: who listed them last
-    std::vector<PersonId> visitedBy_;  // by family: whose children were listed from it last
-    std::size_t claimsLeft_;
+    std::vector<PersonId> takenBy_;          // by person: who listed them last
+    std::vector<PersonId> visitedBy_;        // by family: whose children were listed from it last
+    std::vector<std::uint32_t> childrenOf_;  // by family
+    std::size_t claimsLeft_ = kClaimedChildrenAtLeast;
 };
 
 }  // namespace

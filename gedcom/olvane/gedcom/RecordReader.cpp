@@ -306,15 +306,14 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
             if (!sexRead_) person().sex = sexOf(trimmed(line.value));
             sexRead_ = true;
             return;
+        case kBirth:
+            passOverIfNot(line);
+            return;
         case kDeath:
         case kBurial:
         case kCremation:
         case kProbate:
-            if (didNotHappen(line)) {
-                fact_ = 0;  // whatever is told below did not happen either
-                return;
-            }
-            person().dead = true;
+            person().dead = !passOverIfNot(line) || person().dead;
             return;
         case kFamilyAsChild:
             tables_.parentLinks.push_back({readPointer(line), line.number, Pedigree::notGiven});
@@ -327,6 +326,13 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
         default:
             return;
     }
+}
+
+// Whatever is told below what did not happen did not happen either.
+bool RecordReader::passOverIfNot(const GedcomLine& line) {
+    if (!didNotHappen(line)) return false;
+    fact_ = 0;
+    return true;
 }
 
 void RecordReader::readPersonDetail(const GedcomLine& line, std::uint64_t tag) {
@@ -349,6 +355,7 @@ void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
             ++family().childLinkSlice.count;
             return;
         case kMarriage:
+            if (passOverIfNot(line)) return;
             family().married = true;
             marriedLast_ = true;
             ++marriages_;
@@ -468,8 +475,9 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
                      "a date that cannot be read", "shown as written", value);
 }
 
+// A phrase that is a date is as good as one.
 void RecordReader::readDatePhrase(const GedcomLine& line) {
-    openDate_->written = keptValue(line);
+    *openDate_ = parseGedcomDate(keptValue(line));
     openDate_->line = line.number;
     if (factOpen_ && !tables_.facts.back().date.isGiven()) tables_.facts.back().date = *openDate_;
     openDate_ = nullptr;

@@ -73,6 +73,7 @@ private:
     XrefTable::Entry* claimXref(const GedcomLine& line);
 
     void readPersonFact(const GedcomLine& line, std::uint64_t tag);
+    bool passOverIfNot(const GedcomLine& line);
     void readPersonDetail(const GedcomLine& line, std::uint64_t tag);
     void readFamilyFact(const GedcomLine& line, std::uint64_t tag);
     void readFamilyDetail(const GedcomLine& line, std::uint64_t tag);

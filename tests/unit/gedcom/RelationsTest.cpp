@@ -198,6 +198,19 @@ TEST(Relations, aPhraseStandsInForAMissingDate) {
     EXPECT_EQ(displayYear(data.person(1).death), "1900");
 }
 
+TEST(Relations, aPhraseThatIsADateIsReadAsOne) {
+    const GedcomData data = read(document7("0 @I1@ INDI\n1 BIRT\n2 DATE\n3 PHRASE 5 MAY 1900\n"));
+    EXPECT_EQ(sortText(data.person(1).birth), "1900-05-05");
+}
+
+TEST(Relations, whatDidNotHappenHasNoDate) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 BIRT N\n2 DATE 1900\n0 @F1@ FAM\n1 MARR N\n2 DATE 1920\n"));
+    EXPECT_FALSE(data.person(1).birth.isGiven());
+    EXPECT_FALSE(data.family(1).married);
+    EXPECT_FALSE(data.family(1).marriage.isGiven());
+}
+
 TEST(Relations, divorceEndsAMarriageUntilTheNext) {
     const GedcomData data =
         read(document("0 @F1@ FAM\n1 MARR\n2 DATE 1900\n1 DIV\n0 @F2@ FAM\n1 MARR\n1 DIV\n1 MARR\n0 @F3@ "

@@ -82,6 +82,58 @@ TEST(Writing, readsAgainAsTheSameFamily) {
     EXPECT_TRUE(again.diagnostics().empty());
 }
 
+// Two passes, so that what one of them loses by halves is seen.
+void expectLastingly(const std::string& bytes) {
+    const GedcomData data = readWithFacts(bytes);
+    const GedcomData once = readWithFacts(writeGedcom(data));
+    EXPECT_EQ(everythingOf(once), everythingOf(data));
+    EXPECT_EQ(everythingOf(readWithFacts(writeGedcom(once))), everythingOf(data));
+}
+
+TEST(Writing, keepsEveryAtSignBehindWhatBeginsAsACalendar) {
+    expectLastingly(
+        document("0 @I1@ INDI\n1 NAME @#x@@@@y /S/\n1 OCCU @#ab@@@@c\n1 BIRT\n"
+                 "2 DATE @#DJULIAN@@@@ 5 MAY 1700\n"));
+    expectLastingly(
+        document("0 @I1@ INDI\n1 BIRT\n2 DATE @@@@@#DJULIAN@ 5 MAY 1700\n1 DEAT\n2 DATE @#DX\n"
+                 "1 BURI\n2 DATE @#DX@@#DY@ @#DZ@@@\n1 OCCU @\n1 OCCU @@@@@@\n"));
+}
+
+TEST(Writing, leavesTheSignsOfACalendarSingle) {
+    const GedcomData data = readWithFacts(
+        document("0 @I1@ INDI\n1 BIRT\n2 DATE BET @#DJULIAN@ 1700 AND @#DFRENCH R@ 8 (a@@b)\n"));
+    EXPECT_NE(writeGedcom(data).find("2 DATE BET @#DJULIAN@ 1700 AND @#DFRENCH R@ 8 (a@@b)\n"),
+              std::string::npos);
+}
+
+TEST(Writing, tellsAValueFromAYesOrNo) {
+    const GedcomData data = readWithFacts(document("0 @I1@ INDI\n1 EVEN\n2 TYPE Y\n1 DEAT Y\n2 TYPE N\n"));
+    EXPECT_TRUE(readWithFacts(writeGedcom(data)).person(1).dead);
+    expectLastingly(document("0 @I1@ INDI\n1 EVEN\n2 TYPE Y\n1 DEAT Y\n2 TYPE N\n"));
+}
+
+TEST(Writing, keepsWhatAPhraseWasReadAs) {
+    expectLastingly(
+        document7("0 @I1@ INDI\n1 BIRT\n2 DATE\n3 PHRASE 1900\n1 DEAT\n2 DATE\n3 PHRASE in May\n"));
+}
+
+TEST(Writing, keepsChildrenClaimedInAFileOfLooseLinks) {
+    std::string records = "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I3@\n";
+    for (int loose = 0; loose < 400; ++loose) records += "1 CHIL @LOOSE@\n";
+    for (int person = 1; person <= 1500; ++person) {
+        records += "0 @I" + std::to_string(person) + "@ INDI\n1 FAMS @F1@\n";
+    }
+    const GedcomData data = readWithFacts(document(records));
+    EXPECT_EQ(idsOf(data.children(1001)), "3");
+    EXPECT_EQ(idsOf(data.children(1500)), "");
+    EXPECT_TRUE(everythingOf(readWithFacts(writeGedcom(data))) == everythingOf(data));
+}
+
+TEST(Writing, knowsNothingOfWhatDidNotHappen) {
+    expectLastingly(
+        document("0 @I1@ INDI\n1 BIRT N\n2 DATE 1800\n1 BURI N\n0 @F1@ FAM\n1 MARR N\n2 DATE 1900\n"));
+}
+
 TEST(Writing, givesEveryRecordAnIdentifierOfItsOwn) {
     const GedcomData data = readWithFacts(
         document("0 @A@ INDI\n1 NAME one\n0 @A@ INDI\n1 NAME two\n0 INDI\n1 NAME three\n0 @P3@ INDI\n"
@@ -114,6 +166,73 @@ TEST(Writing, leavesOutWhatIsHidden) {
     EXPECT_EQ(idsOf(again.spouses(2)), "1");
     EXPECT_FALSE(again.family(1).married);
     EXPECT_EQ(dateOf(again.person(2).death), "1999=1999");
+}
+
+// What a dead person's record tells with Livia Secret hidden, who is written so.
+std::string shownBeside(const std::string& livia, const std::string& facts) {
+    const GedcomData data = readWithFacts(document("0 @I1@ INDI\n" + livia + "1 FAMS @F1@\n" +
+                                                   "0 @I2@ INDI\n1 NAME Karl /Shown/\n1 FAMS @F1@\n" + facts +
+                                                   "0 @F1@ FAM\n1 WIFE @I1@\n1 HUSB @I2@\n"));
+    WriteOptions options;
+    options.hidden = {true, false};
+    const GedcomData again = readWithFacts(writeGedcom(data, options));
+    std::string text;
+    tellFacts(again.factsOfPerson(2), text);
+    return text;
+}
+
+constexpr const char* kLivia = "1 NAME Livia Maria /von Secret/\n2 NICK Livi\n";
+
+TEST(Writing, leavesOutFreeTextWithAnybodyHidden) {
+    EXPECT_EQ(shownBeside(kLivia, "1 EVEN\n2 TYPE Witness Livia Secret\n1 FACT a friend\n2 DATE 1900\n"),
+              " FACT[||1900=1900]");
+    EXPECT_EQ(shownBeside("1 NAME /Secret/\n", "1 EVEN any\n1 EVEN\n2 PLAC Bern\n1 DEAT Y\n"),
+              " EVEN[|Bern|=] DEAT[||=]");
+}
+
+TEST(Writing, leavesOutTextThatNamesSomebodyHidden) {
+    EXPECT_EQ(shownBeside(kLivia, "1 OCCU Servant of LIVIA SECRET\n2 PLAC Bern\n"), " OCCU[|Bern|=]");
+    EXPECT_EQ(shownBeside(kLivia, "1 RESI\n2 PLAC Secret's house, given to Livi\n"), " RESI[||=]");
+    EXPECT_EQ(shownBeside(kLivia, "1 DEAT\n2 DATE (day of Maria\xE2\x80\x94Secret)\n"), " DEAT[||=]");
+    EXPECT_EQ(shownBeside(kLivia, "1 TITL Guardian of Livia Shown\n"), " TITL[||=]");
+    EXPECT_EQ(shownBeside("1 NAME X /Y/\n1 NAME L\xC3\xADvia /Secret/\n", "1 OCCU livia secret\n"),
+              " OCCU[||=]");
+    EXPECT_EQ(shownBeside("1 NAME L. /Sekret/\n2 GIVN Livia\n2 SURN Secret\n", "1 OCCU Livia Sekret\n"),
+              " OCCU[||=]");
+    EXPECT_EQ(shownBeside("1 NAME Jon Jonsson\n", "1 OCCU of Jonsson, Jon\n"), " OCCU[||=]");
+    EXPECT_EQ(shownBeside("1 NAME \xE5\xB0\x8F\xE6\x98\x8E /\xE7\x8E\x8B/\n",
+                          "1 OCCU \xE8\xAD\x89\xE4\xBA\xBA\xE7\x8E\x8B\xE5\xB0\x8F\xE6\x98\x8E\n"),
+              " OCCU[||=]");
+}
+
+TEST(Writing, leavesTextThatNamesNobodyHidden) {
+    EXPECT_EQ(shownBeside(kLivia, "1 OCCU Secret agent\n2 PLAC Santa Maria von Bern\n"),
+              " OCCU[Secret agent|Santa Maria von Bern|=]");
+    EXPECT_EQ(shownBeside(kLivia, "1 OCCU Livias Secretary\n"), " OCCU[Livias Secretary||=]");
+    EXPECT_EQ(shownBeside("1 NAME Bern\n", "1 OCCU Smith\n2 PLAC Bern\n"), " OCCU[Smith|Bern|=]");
+}
+
+TEST(Writing, makesAnIdentifierForOneThatNamesSomebodyHidden) {
+    const GedcomData data = readWithFacts(document(
+        "0 @I1@ INDI\n1 NAME Livia /Secret/\n0 @Father_of_Livia_Secret@ INDI\n1 NAME Karl /Shown/\n"));
+    WriteOptions options;
+    options.hidden = {true, false};
+    EXPECT_EQ(writeGedcom(data, options).find("Livia"), std::string::npos);
+}
+
+TEST(Writing, takesNoLongerWhereEverybodyIsHiddenAndNamedInOneText) {
+    std::string records = "0 INDI\n1 OCCU";
+    for (int person = 0; person < 20000; ++person) records += " Anna" + std::to_string(person) + " Berg";
+    records += "\n1 NAME Karl /Shown/\n";
+    for (int person = 0; person < 20000; ++person) {
+        records += "0 INDI\n1 NAME Anna" + std::to_string(person) + " /Berg" + std::to_string(person) + "/\n";
+    }
+    const GedcomData data = readWithFacts(document(records));
+    WriteOptions options;
+    options.hidden.assign(data.personCount(), true);
+    options.hidden[0] = false;
+    EXPECT_EQ(readWithFacts(writeGedcom(data, options)).factsOfPerson(1)[0].value.substr(0, 10),
+              "Anna0 Berg");
 }
 
 TEST(Writing, leavesOutThatAHiddenPersonWasAdopted) {
