@@ -5,6 +5,7 @@
 from __future__ import annotations
 
 from enum import IntEnum
+from typing import Any
 
 from olvane._records import Record
 
@@ -32,6 +33,10 @@ class LayoutError(Exception):
         self.status = status
         self.text = text
         self.records = records
+
+    def __reduce__(self) -> tuple[Any, ...]:
+        """For copies and for other processes: all but the cause, which no exception takes along."""
+        return type(self), (self.status, self.args[0], self.text, self.records), vars(self)
 
 
 class HostError(LayoutError):

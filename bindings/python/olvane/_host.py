@@ -13,7 +13,7 @@ class Host(Protocol):
 
     Ids are the host's own, 1 and more for real persons; only their low 32 bits count. The methods are asked many times
     for the same person, since no answer is kept, and must agree with themselves within one layout. A method may raise:
-    the layout then ends with :class:`HostError`.
+    the layout then ends with :class:`HostError`. So does an answer of another type, such as an awaitable.
     """
 
     def father_of(self, person: int) -> int | None:
@@ -34,8 +34,11 @@ class Host(Protocol):
     def is_dead(self, person: int) -> bool:
         """Whether the person is dead."""
 
-    def date_of(self, person: int, is_birth: bool) -> str:
-        """The date of birth, asked of children, or another date, asked of spouses; in any form, empty if not known."""
+    def date_of(self, person: int, is_birth: bool) -> str | None:
+        """The date of birth, asked of children, or another date, asked of spouses.
+
+        In any form, and empty or None where it is not known.
+        """
 
     def sex_of(self, person: int) -> int:
-        """0 for male; any other number counts as female."""
+        """0 for male; any other whole number counts as female."""

@@ -9,9 +9,12 @@ again when the layout has ended.
 from __future__ import annotations
 
 import ctypes
+import inspect
+import operator
+import sys
 from collections.abc import Callable, Iterable
 from ctypes import byref, c_char_p, c_int64, c_size_t, c_void_p
-from typing import Any
+from typing import Any, TypeVar
 
 from olvane import _native
 from olvane._errors import HostError, LayoutError, Status
@@ -21,21 +24,21 @@ from olvane._records import Record, RecordKind, Segment
 
 _FAILED = 1
 
+_Result = TypeVar("_Result")
+
 
 def layout(host: Host, focus: int, view: View = View.FAMILY, options: Options | None = None) -> list[Record]:
     """Lay out the relatives of a person, one record for each box, in the order of the walk.
 
     Raises HostError if a method of the host raised, LayoutError if there is no picture for another reason, and whatever
-    is no ordinary exception (KeyboardInterrupt) as the host raised it.
+    is no ordinary exception (KeyboardInterrupt) as it is, whether the host or a signal raised it.
     """
-    with _Request(host, focus, view, options) as request:
-        return request.records()
+    return _laid_out(_Request(host, focus, view, options), _Request.records)
 
 
 def layout_text(host: Host, focus: int, view: View = View.FAMILY, options: Options | None = None) -> str:
     """The same layout as one line of text."""
-    with _Request(host, focus, view, options) as request:
-        return request.text()
+    return _laid_out(_Request(host, focus, view, options), _Request.text)
 
 
 def version() -> str:
@@ -43,16 +46,19 @@ def version() -> str:
     return str(_native.library.olvane_version().decode("ascii"))
 
 
-class _Callbacks:
-    """A host behind eight C callbacks, and what it raised.
+class _Answers:
+    """What a host answers to C, and the first that it raised, or that a signal raised meanwhile.
 
-    The callbacks live as long as this object, which must outlive the call that uses them.
+    It holds none of its own callbacks, so that the host is let go when the call ends, without a collector's help.
     """
 
     def __init__(self, host: Host) -> None:
-        self.raised: BaseException | None = None
         self._host = host
-        self.struct = _native.HostStruct(
+        self._raised: BaseException | None = None
+
+    def callbacks(self) -> _native.HostStruct:
+        """The eight callbacks, which must outlive the call that uses them."""
+        return _native.HostStruct(
             None,
             _native.ParentCallback(self._father_of),
             _native.ParentCallback(self._mother_of),
@@ -63,6 +69,15 @@ class _Callbacks:
             _native.DateCallback(self._date_of),
             _native.SexCallback(self._sex_of),
         )
+
+    def keep(self, raised: BaseException) -> None:
+        if self._raised is None:
+            self._raised = raised
+
+    def take_raised(self) -> BaseException | None:
+        """What was kept, which is not kept any longer: its frames hold this object."""
+        raised, self._raised = self._raised, None
+        return raised
 
     def _father_of(self, _context: Any, person: int, parent: Any) -> int:
         return self._answer(lambda: _set_parent(parent, self._host.father_of(person)))
@@ -77,28 +92,67 @@ class _Callbacks:
         return self._answer(lambda: _append(children, self._host.children_of(person)))
 
     def _is_preferred_spouse(self, _context: Any, person: int, spouse: int, preferred: Any) -> int:
-        return self._answer(lambda: _set(preferred, bool(self._host.is_preferred_spouse(person, spouse))))
+        return self._answer(lambda: _set_truth(preferred, self._host.is_preferred_spouse(person, spouse)))
 
     def _is_dead(self, _context: Any, person: int, dead: Any) -> int:
-        return self._answer(lambda: _set(dead, bool(self._host.is_dead(person))))
+        return self._answer(lambda: _set_truth(dead, self._host.is_dead(person)))
 
     def _date_of(self, _context: Any, person: int, is_birth: int, date: Any) -> int:
         return self._answer(lambda: _set_date(date, self._host.date_of(person, is_birth != 0)))
 
     def _sex_of(self, _context: Any, person: int, sex: Any) -> int:
-        return self._answer(lambda: _set(sex, self._host.sex_of(person)))
+        return self._answer(lambda: _set_sex(sex, self._host.sex_of(person)))
 
     def _answer(self, question: Callable[[], None]) -> int:
+        if self._raised is not None:  # kept where C could not be told of it
+            return _FAILED
         try:
             question()
         except BaseException as raised:  # nothing may pass through C; the request raises it again
-            self.raised = raised
+            self.keep(raised)
             return _FAILED
         return 0
 
 
-def _set(slot: Any, value: int) -> None:
-    slot[0] = int(value)
+class _StrayHook:
+    """A sys.unraisablehook that keeps what leaves a callback, which ctypes would print and forget.
+
+    The handler of a signal runs between any two steps of a program, so also at a callback's first one, before its try.
+    What C makes of such a callback is undefined, but the layout ends with what was kept. All else goes to the hook
+    before this one. It stays in place: another thread may lay out when this one has ended.
+    """
+
+    def __init__(self, before: Callable[[Any], object]) -> None:
+        self._before = before
+
+    def __call__(self, unraisable: Any) -> None:
+        answers = _answers_left_by(unraisable)
+        if answers is None:
+            self._before(unraisable)
+        else:
+            answers.keep(unraisable.exc_value)
+
+
+def _answers_left_by(unraisable: Any) -> _Answers | None:
+    """The answers whose callback an exception left: its outermost frame is theirs."""
+    frames = unraisable.exc_traceback
+    left = None if frames is None else frames.tb_frame.f_locals.get("self")
+    return left if isinstance(left, _Answers) else None
+
+
+def _watch_for_strays() -> None:
+    if not isinstance(sys.unraisablehook, _StrayHook):
+        sys.unraisablehook = _StrayHook(sys.unraisablehook)
+
+
+def _set_truth(slot: Any, answer: object) -> None:
+    if not isinstance(answer, bool) and inspect.isawaitable(answer):
+        raise TypeError("a host answered an awaitable where yes or no is due at once")
+    slot[0] = 1 if answer else 0
+
+
+def _set_sex(slot: Any, sex: int) -> None:
+    slot[0] = 0 if operator.index(sex) == 0 else 1
 
 
 def _set_parent(slot: Any, parent: int | None) -> None:
@@ -111,8 +165,10 @@ def _append(ids: Any, people: Iterable[int]) -> None:
     _check(_native.library.olvane_person_list_append(ids, (c_int64 * len(known))(*known), len(known)))
 
 
-def _set_date(date: Any, text: str) -> None:
-    _check(_native.library.olvane_date_set(date, text.encode("utf-8")))
+def _set_date(date: Any, text: str | None) -> None:
+    if not isinstance(text, str | None):
+        raise TypeError(f"a host answered {text!r} where a date is a string")
+    _check(_native.library.olvane_date_set(date, (text or "").encode("utf-8")))
 
 
 def _check(status: int) -> None:
@@ -125,41 +181,37 @@ def _message(status: int) -> str:
 
 
 class _Request:
-    """A layout of the C interface, freed at the end of a with statement."""
+    """A layout of the C interface, from its question to its end."""
 
     def __init__(self, host: Host, focus: int, view: View, options: Options | None) -> None:
-        self._callbacks = _Callbacks(host)
+        self._answers = _Answers(host)
+        self._focus = operator.index(focus)
+        self._ask = _asking(view)
+        self._options = _options_struct(options)
         self._layout = c_void_p()
-        ask = {
-            View.FAMILY: _native.library.olvane_layout_family,
-            View.PEDIGREE: _native.library.olvane_layout_pedigree,
-        }[view]
-        chosen = _options_struct(options or Options())
-        self._status = Status(ask(byref(self._callbacks.struct), focus, byref(chosen), byref(self._layout)))
+        self._status = Status.OK
 
-    def __enter__(self) -> _Request:
-        try:
-            self._raise_failure()
-        except BaseException:
-            self._free()
-            raise
-        return self
+    def run(self) -> None:
+        _watch_for_strays()
+        callbacks = self._answers.callbacks()
+        status = self._ask(byref(callbacks), self._focus, byref(self._options), byref(self._layout))
+        self._status = Status(status)
 
-    def __exit__(self, *_unused: object) -> None:
-        self._free()
-
-    def _free(self) -> None:
+    def free(self) -> None:
         _native.library.olvane_layout_free(self._layout)
-        self._layout = c_void_p()
 
-    def _raise_failure(self) -> None:
-        raised = self._callbacks.raised
-        if raised is not None and not isinstance(raised, Exception):
-            raise raised
-        if self._status == Status.HOST_FAILED:
-            raise HostError(self._status, f"{type(raised).__name__}: {raised}", self.text(), self.records()) from raised
-        if self._status != Status.OK:
-            raise LayoutError(self._status, _message(self._status), self.text(), self.records())
+    def raise_failure(self) -> None:
+        raised = self._answers.take_raised()
+        try:
+            if raised is not None and not isinstance(raised, Exception):
+                raise raised
+            if raised is not None and self._status != Status.OUT_OF_MEMORY:
+                message = f"{type(raised).__name__}: {raised}"
+                raise HostError(Status.HOST_FAILED, message, self.text(), self.records()) from raised
+            if self._status != Status.OK:
+                raise LayoutError(self._status, _message(self._status), self.text(), self.records())
+        finally:
+            del raised  # whose frames may hold this one
 
     def text(self) -> str:
         text = c_char_p()
@@ -175,7 +227,27 @@ class _Request:
         return [_record(records[i]) for i in range(count.value)]
 
 
-def _options_struct(options: Options) -> _native.OptionsStruct:
+def _laid_out(request: _Request, read: Callable[[_Request], _Result]) -> _Result:
+    try:
+        request.run()
+        request.raise_failure()
+        return read(request)
+    finally:
+        request.free()
+
+
+def _asking(view: View) -> Any:
+    if view is View.FAMILY:
+        return _native.library.olvane_layout_family
+    if view is View.PEDIGREE:
+        return _native.library.olvane_layout_pedigree
+    raise TypeError(f"view is {view!r}, and takes a View")
+
+
+def _options_struct(options: Options | None) -> _native.OptionsStruct:
+    if not isinstance(options, Options | None):
+        raise TypeError(f"options is {options!r}, and takes Options")
+    options = options or Options()
     sizes = options.sizes
     return _native.OptionsStruct(
         _native.SizesStruct(
