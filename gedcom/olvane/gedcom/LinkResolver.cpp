@@ -7,7 +7,6 @@
 
 #include <olvane/gedcom/LinkResolverInternal.h>
 
-#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <span>
@@ -35,7 +34,7 @@ public:
     void resolveAll() {
         for (Family& family : tables_.families) resolveFamily(family);
         for (ChildLink& link : tables_.childLinks) link.child = personAt(link.child, link.line);
-        countChildren();
+        listKnownChildren();
         for (FamilyLink& link : tables_.parentLinks) link.family = familyAt(link.family, link.line);
         for (FamilyLink& link : tables_.coupleLinks) link.family = familyAt(link.family, link.line);
         for (PersonId id = 1; id <= tables_.persons.size(); ++id) findParents(tables_.persons[id - 1]);
@@ -53,15 +52,18 @@ private:
                          "one person as both partners of a family", "not their own spouse", family.xref);
     }
 
-    // Links that lead nowhere do not count.
-    void countChildren() {
+    // Links that lead nowhere are no children, and are not to be walked over again and again.
+    void listKnownChildren() {
+        knownChildrenOf_.reserve(tables_.families.size());
         for (const Family& family : tables_.families) {
-            const auto links = childLinks(family);
-            const auto known = std::count_if(links.begin(), links.end(),
-                                             [](const ChildLink& link) { return link.child != 0; });
-            childrenOf_.push_back(static_cast<std::uint32_t>(known));
-            claimsLeft_ += kClaimedChildren * childrenOf_.back();
+            Slice slice = {static_cast<std::uint32_t>(knownChildren_.size()), 0};
+            for (const ChildLink& link : childLinks(family)) {
+                if (link.child != 0) knownChildren_.push_back(link.child);
+            }
+            slice.count = static_cast<std::uint32_t>(knownChildren_.size()) - slice.first;
+            knownChildrenOf_.push_back(slice);
         }
+        claimsLeft_ = knownChildren_.size() * kClaimedChildren + kClaimedChildrenAtLeast;
     }
 
     PersonId personAt(XrefPlace place, LineNumber line) {
@@ -142,7 +144,7 @@ private:
         for (const FamilyLink& link : coupleLinks(person)) {
             if (link.family == 0 || visitedBy_[link.family] == id) continue;
             visitedBy_[link.family] = id;
-            if (mayListChildren(id, link)) addChildren(id, tables_.families[link.family - 1]);
+            if (mayListChildren(id, link)) addChildren(id, link.family);
         }
         person.childSlice.count =
             static_cast<std::uint32_t>(tables_.children.size()) - person.childSlice.first;
@@ -151,7 +153,7 @@ private:
     bool mayListChildren(PersonId id, const FamilyLink& link) {
         const Family& family = tables_.families[link.family - 1];
         if (family.husband == id || family.wife == id) return true;
-        const std::size_t wanted = childrenOf_[link.family - 1];
+        const std::size_t wanted = knownChildrenOf_[link.family - 1].count;
         if (wanted <= claimsLeft_) {
             claimsLeft_ -= wanted;
             return true;
@@ -162,11 +164,12 @@ private:
         return false;
     }
 
-    void addChildren(PersonId id, const Family& family) {
-        for (const ChildLink& link : childLinks(family)) {
-            if (link.child == 0 || takenBy_[link.child] == id) continue;
-            takenBy_[link.child] = id;
-            tables_.children.push_back(link.child);
+    void addChildren(PersonId id, FamilyId family) {
+        const Slice slice = knownChildrenOf_[family - 1];
+        for (const PersonId child : std::span(knownChildren_).subspan(slice.first, slice.count)) {
+            if (takenBy_[child] == id) continue;
+            takenBy_[child] = id;
+            tables_.children.push_back(child);
         }
     }
 
@@ -175,10 +178,11 @@ private:
     GedcomTables& tables_;
     const XrefTable& xrefs_;
     DiagnosticList& diagnostics_;
-    std::vector<PersonId> takenBy_;          // by person: who listed them last
-    std::vector<PersonId> visitedBy_;        // by family: whose children were listed from it last
-    std::vector<std::uint32_t> childrenOf_;  // by family
-    std::size_t claimsLeft_ = kClaimedChildrenAtLeast;
+    std::vector<PersonId> takenBy_;        // by person: who listed them last
+    std::vector<PersonId> visitedBy_;      // by family: whose children were listed from it last
+    std::vector<PersonId> knownChildren_;  // of all families
+    std::vector<Slice> knownChildrenOf_;   // by family
+    std::size_t claimsLeft_ = 0;
 };
 
 }  // namespace

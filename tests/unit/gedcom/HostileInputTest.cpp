@@ -92,6 +92,16 @@ TEST(HostileInput, aFamilyThatAllClaimStaysSmallInMemory) {
     EXPECT_EQ(told(data, DiagnosticKind::wrongPointer).size(), 100U);
 }
 
+TEST(HostileInput, looseChildrenOfAFamilyThatAllClaimAreWalkedOnce) {
+    std::string records;
+    for (int person = 1; person <= kMany; ++person) {
+        records.append("0 @I").append(std::to_string(person)).append("@ INDI\n1 FAMS @F1@\n");
+    }
+    records.append("0 @F1@ FAM\n");
+    for (int link = 0; link < kMany; ++link) records.append("1 CHIL @LOOSE@\n");
+    EXPECT_EQ(read(document(records)).children(kMany).size(), 0U);
+}
+
 TEST(HostileInput, troubleInEveryLineStaysSmallInMemory) {
     std::string records;
     for (int line = 0; line < kMany; ++line)

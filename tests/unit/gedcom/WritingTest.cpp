@@ -220,19 +220,20 @@ TEST(Writing, makesAnIdentifierForOneThatNamesSomebodyHidden) {
     EXPECT_EQ(writeGedcom(data, options).find("Livia"), std::string::npos);
 }
 
-TEST(Writing, takesNoLongerWhereEverybodyIsHiddenAndNamedInOneText) {
-    std::string records = "0 INDI\n1 OCCU";
-    for (int person = 0; person < 20000; ++person) records += " Anna" + std::to_string(person) + " Berg";
-    records += "\n1 NAME Karl /Shown/\n";
+// Each pair of the names would be looked up otherwise, for hours.
+TEST(Writing, leavesOutATextOfThousandsOfNames) {
+    std::string occupation;
+    std::string records;
     for (int person = 0; person < 20000; ++person) {
-        records += "0 INDI\n1 NAME Anna" + std::to_string(person) + " /Berg" + std::to_string(person) + "/\n";
+        const std::string number = std::to_string(person);
+        occupation.append(" Anna").append(number).append(" Berg").append(std::to_string(person + 1));
+        records.append("0 INDI\n1 NAME Anna").append(number).append(" /Berg").append(number).append("/\n");
     }
-    const GedcomData data = readWithFacts(document(records));
+    const GedcomData data = readWithFacts(document("0 INDI\n1 OCCU" + occupation + "\n" + records));
     WriteOptions options;
     options.hidden.assign(data.personCount(), true);
     options.hidden[0] = false;
-    EXPECT_EQ(readWithFacts(writeGedcom(data, options)).factsOfPerson(1)[0].value.substr(0, 10),
-              "Anna0 Berg");
+    EXPECT_EQ(readWithFacts(writeGedcom(data, options)).factsOfPerson(1)[0].value, "");
 }
 
 TEST(Writing, leavesOutThatAHiddenPersonWasAdopted) {
