@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // The counting operators. A block's size is asked of malloc itself, at both ends of its life, so nothing is
-// stored beside it and the blocks lie as they would without the count.
+// stored beside it and the blocks lie as they would without the count. What malloc itself keeps before each block is
+// counted, too.
 
 #include "CountedMemory.h"
 
@@ -14,21 +15,27 @@
 
 namespace {
 
+constexpr std::size_t kBeforeEachBlock = sizeof(std::size_t);  // of glibc
+
 std::size_t ALLOCATIONS = 0;
 std::int64_t HELD_BYTES = 0;  // below 0 where blocks go that came before the count
 std::int64_t PEAK_BYTES = 0;
 
+std::int64_t bytesOf(void* block) {
+    return static_cast<std::int64_t>(malloc_usable_size(block) + kBeforeEachBlock);
+}
+
 void* counted(void* block) {
     if (block == nullptr) throw std::bad_alloc();
     ++ALLOCATIONS;
-    HELD_BYTES += static_cast<std::int64_t>(malloc_usable_size(block));
+    HELD_BYTES += bytesOf(block);
     if (HELD_BYTES > PEAK_BYTES) PEAK_BYTES = HELD_BYTES;
     return block;
 }
 
 void release(void* block) {
     if (block == nullptr) return;
-    HELD_BYTES -= static_cast<std::int64_t>(malloc_usable_size(block));
+    HELD_BYTES -= bytesOf(block);
     std::free(block);
 }
 

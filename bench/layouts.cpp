@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // bench_layouts: how long one layout with its result text takes, and how that grows. Descendants and kin of 30
-// to 10,000 persons in the family view and full pedigrees, one by one; then both shapes of the family view up
-// to 100,000 persons, fitted against n log n.
+// to 10,000 persons in the family view and full pedigrees, one by one; then all three shapes up to some 100,000
+// persons, fitted against n log n.
 
 #include <benchmark/benchmark.h>
 
@@ -42,6 +42,9 @@ void registerGrowth() {
         for (const int persons : {1000, 3000, 10000, 30000, 100000}) growth->Arg(persons);
         growth->Unit(benchmark::kMicrosecond)->Complexity(benchmark::oNLogN);
     }
+    auto* growth = benchmark::RegisterBenchmark("growth/ped", layOut, "ped");
+    for (const int generations : {9, 11, 12, 14, 16}) growth->Arg(generations);  // 2^(n + 1) - 1 persons
+    growth->Unit(benchmark::kMicrosecond)->Complexity(benchmark::oNLogN);
 }
 
 }  // namespace

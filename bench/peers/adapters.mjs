@@ -153,7 +153,7 @@ async function familyChart() {
 }
 
 // It keeps two lists of what it has placed from call to call, and gets slower with every layout. So the modules that
-// hold them are loaded anew before each layout, not timed; the others stay, compiled and warm.
+// hold them are loaded anew before each layout, not timed, and so run not yet compiled; the others stay warm.
 async function entitreeFlex() {
   const holdsLists = /entitree-flex.dist.(index|layoutFromMap|drillChildren|drillParents)\.js$/;
   return entitreeFlexWith(() => {
