@@ -15,7 +15,7 @@ const persons = new Map([
     [5, { name: "Margaret", male: false }],
 ]);
 
-const myFamily = {
+export const myFamily = {
     fatherOf: (id) => persons.get(id).father,
     motherOf: (id) => persons.get(id).mother,
     // Whoever has a child with the person.
