@@ -7,8 +7,8 @@ import assert from "node:assert/strict";
 import { readFile } from "node:fs/promises";
 import test from "node:test";
 
-import { GedcomError } from "../../bindings/javascript/olvane.mjs";
-import { olvane } from "./module.mjs";
+import { GedcomError, Olvane } from "../../bindings/javascript/olvane.mjs";
+import { leaveRoomOf, olvane, openInstance } from "./module.mjs";
 
 const bytesOf = (text) => new TextEncoder().encode(text);
 const samples = new URL("../../samples/", import.meta.url);
@@ -195,4 +195,24 @@ test("a layout that grows without measure is ended in words", () => {
     assert.throws(() => file.layout(1), { name: "LayoutError", status: "tooLarge" });
     file.close();
     assert.ok(olvane.readGedcom(bytesOf(couple)).layout(1).length > 0, "the next request is unaffected");
+});
+
+test("what finds no room in the module's memory is not taken for too large", async () => {
+    const children = Array.from({ length: 20000 }, (_, i) => i + 2);
+    const person = (id, link) => `0 @I${id}@ INDI\n1 ${link} @F1@\n`;
+    const gedcom = [
+        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n",
+        person(1, "FAMS"),
+        ...children.map((id) => person(id, "FAMC")),
+        "0 @F1@ FAM\n1 HUSB @I1@\n",
+        ...children.map((id) => `1 CHIL @I${id}@\n`),
+        "0 TRLR\n",
+    ].join("");
+    // At each of these sizes it is another piece of work that finds no room.
+    for (const room of [2 ** 6, 2 ** 12, 2 ** 16, 2 ** 20]) {
+        const instance = await openInstance();
+        const file = new Olvane(instance).readGedcom(bytesOf(gedcom));
+        leaveRoomOf(instance, room);
+        assert.throws(() => file.layout(1), { name: "LayoutError", status: "outOfMemory" });
+    }
 });

@@ -4,13 +4,11 @@
 // A host in JavaScript is asked, laid out and told what went wrong.
 
 import assert from "node:assert/strict";
-import { readFile } from "node:fs/promises";
 import test from "node:test";
 
-import { Instance } from "../../bindings/javascript/instance.mjs";
 import { runLayout } from "../../bindings/javascript/layout.mjs";
 import { HostError, LayoutError, Olvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
-import { henry, olvane, TableHost } from "./module.mjs";
+import { henry, leaveRoomOf, olvane, openInstance, TableHost } from "./module.mjs";
 
 const SIZES = {
     nodeWidth: undefined,
@@ -271,17 +269,10 @@ test("a family of a thousand generations is laid out", () => {
     assert.equal(records.filter(({ kind }) => kind === "person").length, 1000);
 });
 
-// Leaves the module with little more than a megabyte to grow into.
-async function nearlyFullInstance() {
-    const instance = await Instance.of(await readFile(process.env.OLVANE_WASM));
-    for (let size = 2 ** 30; size >= 2 ** 20;) {
-        if (instance.exports.malloc(size) === 0) size /= 2;
-    }
-    return instance;
-}
-
 test("what finds no room in the module's memory is no failure of the host", async () => {
-    const full = new Olvane(await nearlyFullInstance());
+    const instance = await openInstance();
+    leaveRoomOf(instance, 2 ** 20);
+    const full = new Olvane(instance);
     const plain = olvane.layoutText(new TableHost(henry), 1);
     const endless = {
         *[Symbol.iterator]() {
@@ -303,7 +294,7 @@ test("what finds no room in the module's memory is no failure of the host", asyn
 });
 
 test("a module that broke off answers no more", async () => {
-    const instance = await Instance.of(await readFile(process.env.OLVANE_WASM));
+    const instance = await openInstance();
     const cause = new RangeError("Maximum call stack size exceeded");
     const breakOff = () => {
         throw cause;

@@ -5,9 +5,24 @@
 
 import { readFile } from "node:fs/promises";
 
+import { Instance } from "../../bindings/javascript/instance.mjs";
 import { loadOlvane } from "../../bindings/javascript/olvane.mjs";
 
-export const olvane = await loadOlvane(await readFile(process.env.OLVANE_WASM));
+const bytes = await readFile(process.env.OLVANE_WASM);
+
+export const olvane = await loadOlvane(bytes);
+
+/** A module of its own, for tests that look into it or leave it broken; new Olvane(instance) asks it. */
+export function openInstance() {
+    return Instance.of(bytes);
+}
+
+/** Fills the module's memory, until no piece of so many bytes, a power of 2, is free. */
+export function leaveRoomOf(instance, size) {
+    for (let piece = 2 ** 30; piece >= size;) {
+        if (instance.exports.malloc(piece) === 0) piece /= 2;
+    }
+}
 
 /** A host around a table: id to [father, mother, spouses, children, sex], 0 for a parent who is not known. */
 export class TableHost {

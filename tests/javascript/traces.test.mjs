@@ -5,12 +5,10 @@
 
 import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
-import { readFile } from "node:fs/promises";
 import test from "node:test";
 
-import { Instance } from "../../bindings/javascript/instance.mjs";
 import { CaseHost, casesIn } from "./cases.mjs";
-import { olvane } from "./module.mjs";
+import { olvane, openInstance } from "./module.mjs";
 
 function linesOfEngine(cases) {
     const files = cases.map(({ file }) => file);
@@ -47,7 +45,7 @@ async function openedModule() {
     const instantiate = WebAssembly.instantiate;
     let imports = null;
     WebAssembly.instantiate = (module, given) => instantiate(module, (imports = given));
-    const instance = await Instance.of(await readFile(process.env.OLVANE_WASM));
+    const instance = await openInstance();
     WebAssembly.instantiate = instantiate;
     return { instance, questions: imports.olvane };
 }

@@ -144,6 +144,13 @@ std::string tableOf(const gedcom::GedcomData& data) {
     return std::move(json).take();
 }
 
+// A file whose answers found no memory has not failed.
+void tellLackOfMemory(LayoutAnswer& answer) {
+    int code = 0;
+    if (answer.layout) olvane_layout_host_code(answer.layout.get(), &code);
+    if (code == kLacksMemory) answer.status = OLVANE_OUT_OF_MEMORY;
+}
+
 std::string factsText(std::span<const gedcom::Fact> facts) {
     JsonText json;
     json.begin();
@@ -205,7 +212,10 @@ OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFil
 
 OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {
     gedcom::LimitedDataSource limited(file->source, js::kMostRelatives);
-    return js::layoutAnswer(js::hostOfSource(limited), static_cast<js::View>(view), focus, js::nextOptions());
+    js::LayoutAnswer* answer =
+        js::layoutAnswer(js::hostOfSource(limited), static_cast<js::View>(view), focus, js::nextOptions());
+    if (answer) js::tellLackOfMemory(*answer);
+    return answer;
 }
 
 OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {

@@ -5,6 +5,7 @@
 
 #include "GedcomHost.h"
 
+#include <new>
 #include <string>
 #include <vector>
 
@@ -13,6 +14,16 @@ namespace {
 
 OlvaneViewerManagerWrapProtocol& sourceOf(void* context) {
     return *static_cast<OlvaneViewerManagerWrapProtocol*>(context);
+}
+
+// For answers that take memory.
+template <class Answer>
+int answered(const Answer& answer) {
+    try {
+        return answer() == OLVANE_OK ? 0 : kLacksMemory;
+    } catch (const std::bad_alloc&) {
+        return kLacksMemory;
+    }
 }
 
 int fatherOf(void* context, std::int64_t person, std::int64_t* parent) {
@@ -26,13 +37,17 @@ int motherOf(void* context, std::int64_t person, std::int64_t* parent) {
 }
 
 int spousesOf(void* context, std::int64_t person, olvane_person_list* list) {
-    const std::vector<std::int64_t> ids = sourceOf(context).spousesForPersonWithID(person);
-    return olvane_person_list_append(list, ids.data(), ids.size());
+    return answered([&] {
+        const std::vector<std::int64_t> ids = sourceOf(context).spousesForPersonWithID(person);
+        return olvane_person_list_append(list, ids.data(), ids.size());
+    });
 }
 
 int childrenOf(void* context, std::int64_t person, olvane_person_list* list) {
-    const std::vector<std::int64_t> ids = sourceOf(context).childrenForPersonWithID(person);
-    return olvane_person_list_append(list, ids.data(), ids.size());
+    return answered([&] {
+        const std::vector<std::int64_t> ids = sourceOf(context).childrenForPersonWithID(person);
+        return olvane_person_list_append(list, ids.data(), ids.size());
+    });
 }
 
 int isPreferredSpouse(void* context, std::int64_t person, std::int64_t spouse, int* preferred) {
@@ -46,7 +61,9 @@ int isDead(void* context, std::int64_t person, int* dead) {
 }
 
 int dateOf(void* context, std::int64_t person, int isBirth, olvane_date* date) {
-    return olvane_date_set(date, sourceOf(context).dateForPersonWithID(person, isBirth != 0).c_str());
+    return answered([&] {
+        return olvane_date_set(date, sourceOf(context).dateForPersonWithID(person, isBirth != 0).c_str());
+    });
 }
 
 int sexOf(void* context, std::int64_t person, std::int32_t* sex) {
