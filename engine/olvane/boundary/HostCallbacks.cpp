@@ -56,9 +56,10 @@ Parent parentOf(ViewerGlue& glue, std::int64_t answer) {
 void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int& father, int& mother) {
     const int id = glue.numberOfKey(key);
     if (id < 1) return;
-    const Parent first = parentOf(glue, host(manager).fatherForPersonWithID(id));
+    OlvaneViewerManagerWrapProtocol& source = host(manager);
+    const Parent first = parentOf(glue, source.fatherForPersonWithID(id));
     father = first.key;
-    const Parent second = parentOf(glue, host(manager).motherForPersonWithID(id));
+    const Parent second = parentOf(glue, source.motherForPersonWithID(id));
     mother = second.key;
     if (!first.isReal) glue.addAddNode(first.key, true, key, second.key);
     if (!second.isReal) glue.addAddNode(second.key, false, key, first.key);
@@ -67,13 +68,14 @@ void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int&
 void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, SpouseSet& spouses) {
     const int id = glue.numberOfKey(key);
     if (id < 1) return;
+    OlvaneViewerManagerWrapProtocol& source = host(manager);
     int place = 0;
-    for (const std::int64_t entry : host(manager).spousesForPersonWithID(id)) {
+    for (const std::int64_t entry : source.spousesForPersonWithID(id)) {
         const int spouseId = lowBits(entry);
         const int spouseKey = glue.keyOfNumber(spouseId);
-        const bool preferred = host(manager).isPreferredSpouse(id, spouseId);
-        const bool alive = !host(manager).isPersonDead(spouseId);
-        const std::string date = host(manager).dateForPersonWithID(spouseId, false);
+        const bool preferred = source.isPreferredSpouse(id, spouseId);
+        const bool alive = !source.isPersonDead(spouseId);
+        const std::string date = source.dateForPersonWithID(spouseId, false);
         ViewerGlue::NumberRoom room;
         spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, firstCharacterOf(date),
                              glue.textOfKey(spouseKey, room), ++place);
@@ -96,10 +98,11 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
     // Children met for the first time come in the order of the set. Records that were there before may lack a
     // place, and then the way by which a record comes in decides where it goes.
     const bool endFirst = children.empty();
+    OlvaneViewerManagerWrapProtocol& source = host(manager);
     int place = 0;
-    for (const std::int64_t entry : host(manager).childrenForPersonWithID(id)) {
+    for (const std::int64_t entry : source.childrenForPersonWithID(id)) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
-        const std::string date = host(manager).dateForPersonWithID(lowBits(entry), true);
+        const std::string date = source.dateForPersonWithID(lowBits(entry), true);
         ViewerGlue::NumberRoom room;
         const std::string_view text = glue.textOfKey(childKey, room);
         ++place;

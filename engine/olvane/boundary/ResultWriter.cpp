@@ -37,6 +37,17 @@ char* write(char* place, int value, char separator) {
     return end + 1;
 }
 
+constexpr std::size_t kCopied = 16;  // no number with its separator is longer
+
+// The number from first to last once more, at place, with its separator. Reads and writes kCopied bytes, however
+// long it is: a copy of a fixed length is two instructions.
+char* repeat(const char* first, const char* last, char* place) {
+    char number[kCopied];
+    std::memcpy(number, first, kCopied);
+    std::memcpy(place, number, kCopied);
+    return place + (last - first);
+}
+
 // Text put together here and appended in few pieces.
 class Piece {
 public:
@@ -56,12 +67,15 @@ public:
 
     void add(const TreeLineSegment& segment) {
         makeRoom();
-        char* const start = end_;
-        char* place = write(start, wholePoint(segment.x1), ',');
-        place = write(place, wholePoint(segment.y1), ',');
-        place = write(place, wholePoint(segment.x2), ',');
-        end_ = write(place, wholePoint(segment.y2), '|');
-        length_ = static_cast<std::size_t>(end_ - start);
+        char* const x1 = end_;
+        char* const y1 = write(x1, wholePoint(segment.x1), ',');
+        char* const x2 = write(y1, wholePoint(segment.y1), ',');
+        // Lines run along the axes, so the second end mostly shares a number with the first.
+        char* const y2 =
+            segment.x2 == segment.x1 ? repeat(x1, y1, x2) : write(x2, wholePoint(segment.x2), ',');
+        end_ = segment.y2 == segment.y1 ? repeat(y1, x2, y2) : write(y2, wholePoint(segment.y2), ',');
+        end_[-1] = '|';
+        length_ = static_cast<std::size_t>(end_ - x1);
     }
     // The segment that was added last, once more.
     void repeatSegment() {
@@ -76,7 +90,8 @@ public:
     }
 
 private:
-    static constexpr std::size_t kLongestSegment = 4 * (kLongestDecimal + 1);
+    // With what a repeated number writes past its end.
+    static constexpr std::size_t kLongestSegment = 4 * (kLongestDecimal + 1) + kCopied;
 
     // The last segment stays where it can be copied from.
     void makeRoom() {

@@ -13,7 +13,6 @@
 #include <olvane/boundary/DecimalInternal.h>
 #include <olvane/boundary/HostText.h>
 
-#include <cstdint>
 #include <stdexcept>
 
 namespace {
@@ -21,27 +20,14 @@ namespace {
 constexpr std::size_t kFirstSlots = 256;  // at most half of them full
 constexpr std::size_t kFirstAddNodes = 32;
 
-std::size_t scattered(int number) {
-    const std::uint64_t product = static_cast<std::uint32_t>(number) * std::uint64_t{0x9E3779B97F4A7C15};
-    return static_cast<std::size_t>(product >> 32);
-}
-
-// The slot that holds the number, or the empty one where it belongs.
-template <class Slots>
-auto& findSlot(Slots& slots, int number, int emptyKey) {
-    const std::size_t mask = slots.size() - 1;
-    std::size_t place = scattered(number) & mask;
-    while (slots[place].key != emptyKey && slots[place].number != number) place = (place + 1) & mask;
-    return slots[place];
-}
-
 }  // namespace
 
 ViewerGlue::ViewerGlue()
     : keyToPerson(*this, &ViewerGlue::fillKeyToPerson),
       personToKey(*this, &ViewerGlue::fillPersonToKey),
       addNodes(*this, &ViewerGlue::fillAddNodes),
-      slots_(kFirstSlots) {
+      slots_(kFirstSlots),
+      slotMask_(kFirstSlots - 1) {
     entries_.reserve(kFirstSlots / 2);
 }
 
@@ -54,11 +40,9 @@ int ViewerGlue::getKeyFromPerson(std::string personText) {
     return addEntry(number, &entry->first);
 }
 
-int ViewerGlue::keyOfNumber(int id) {
-    NumberSlot& slot = findSlot(slots_, id, kNone);
-    if (slot.key != kNone) return slot.key;
-    const int key = addEntry(id, nullptr);
-    slot = NumberSlot{id, key};
+int ViewerGlue::addNumber(NumberSlot& slot, int number) {
+    const int key = addEntry(number, nullptr);
+    slot = NumberSlot{number, key};
     if (++usedSlots_ * 2 > slots_.size()) growSlots();
     return key;
 }
@@ -67,17 +51,12 @@ void ViewerGlue::failToFind() {
     throw std::out_of_range("Unable to find key in unordered_map.");
 }
 
-int ViewerGlue::addEntry(int number, const std::string* oddText) {
-    const int key = static_cast<int>(entries_.size());
-    entries_.push_back(KeyEntry{number, kNone, oddText});
-    return key;
-}
-
 void ViewerGlue::growSlots() {
     std::vector<NumberSlot> smaller(slots_.size() * 2);
     smaller.swap(slots_);
+    slotMask_ = slots_.size() - 1;
     for (const NumberSlot& slot : smaller) {
-        if (slot.key != kNone) findSlot(slots_, slot.number, kNone) = slot;
+        if (slot.key != kNone) slotOf(slot.number) = slot;
     }
 }
 
@@ -96,7 +75,7 @@ std::string_view ViewerGlue::textOfKey(int key, NumberRoom& room) const {
 // kNone for a text that has no key.
 int ViewerGlue::knownKeyOf(const std::string& personText) const {
     const int number = stringToInt(personText);
-    if (personText == intToString(number)) return findSlot(slots_, number, kNone).key;
+    if (personText == intToString(number)) return slotOf(number).key;
     const auto known = oddTexts_.find(personText);
     return known != oddTexts_.end() ? known->second : kNone;
 }

@@ -6,6 +6,7 @@
 #include <boost/unordered_map.hpp>
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -70,7 +71,10 @@ public:
     // The key of a person; a new one where the text has none yet.
     int getKeyFromPerson(std::string personText);
     // The same for the decimal text of a number, without making that text.
-    int keyOfNumber(int id);
+    int keyOfNumber(int number) {
+        NumberSlot& slot = slotOf(number);
+        return slot.key != kNone ? slot.key : addNumber(slot, number);
+    }
 
     // The id text under a key, and the number that it says (0 for none).
     std::string personOfKey(int key) const;
@@ -116,8 +120,26 @@ private:
             failToFind();  // no list is as long as a key below 0
         return entries_[static_cast<std::size_t>(key)];
     }
+    // The slot that holds the number, or the empty one where it belongs.
+    NumberSlot& slotOf(int number) { return slots_[placeOf(number)]; }
+    const NumberSlot& slotOf(int number) const { return slots_[placeOf(number)]; }
+    std::size_t placeOf(int number) const {
+        std::size_t place = scattered(number) & slotMask_;
+        while (slots_[place].key != kNone && slots_[place].number != number) place = (place + 1) & slotMask_;
+        return place;
+    }
+    static std::size_t scattered(int number) {
+        const std::uint64_t product = static_cast<std::uint32_t>(number) * std::uint64_t{0x9E3779B97F4A7C15};
+        return static_cast<std::size_t>(product >> 32);
+    }
+
     [[noreturn]] static void failToFind();
-    int addEntry(int number, const std::string* oddText);
+    int addNumber(NumberSlot& slot, int number);
+    int addEntry(int number, const std::string* oddText) {
+        const int key = static_cast<int>(entries_.size());
+        entries_.push_back(KeyEntry{number, kNone, oddText});
+        return key;
+    }
     void growSlots();
     int knownKeyOf(const std::string& personText) const;
     const AddNodeRecord* recordOfKey(int key) const;
@@ -130,6 +152,7 @@ private:
 
     std::vector<KeyEntry> entries_;  // by key
     std::vector<NumberSlot> slots_;  // a power of two; open addressing, one step at a time
+    std::size_t slotMask_;           // their number less one
     std::size_t usedSlots_ = 0;
     boost::unordered_map<std::string, int> oddTexts_;  // to keys
     std::vector<AddNodeRecord> records_;

@@ -16,10 +16,9 @@ namespace olvane {
 inline int wholePoint(double value) {
     constexpr double kLeast = std::numeric_limits<int>::min();
     constexpr double kGreatest = std::numeric_limits<int>::max();
+    if (value > kLeast && value < kGreatest) return static_cast<int>(value);
     if (std::isnan(value)) return 0;
-    if (value <= kLeast) return std::numeric_limits<int>::min();
-    if (value >= kGreatest) return std::numeric_limits<int>::max();
-    return static_cast<int>(value);
+    return value < 0.0 ? std::numeric_limits<int>::min() : std::numeric_limits<int>::max();
 }
 
 // The same cut, handed back as a coordinate: where a line ends on whole points.
