@@ -9,24 +9,12 @@
 
 #include <algorithm>
 
-// Under the address sanitizer every piece is an allocation of its own, or a stray pointer into another piece
-// of the same block would go unseen.
-#if defined(__SANITIZE_ADDRESS__)
-#define OLVANE_EACH_PIECE_ALONE 1
-#elif defined(__has_feature)
-#if __has_feature(address_sanitizer)
-#define OLVANE_EACH_PIECE_ALONE 1
-#endif
-#endif
-#ifndef OLVANE_EACH_PIECE_ALONE
-#define OLVANE_EACH_PIECE_ALONE 0
-#endif
+#include <olvane/EachPieceAloneInternal.h>
 
 namespace olvane {
 
 namespace {
 
-constexpr bool kEachPieceAlone = OLVANE_EACH_PIECE_ALONE != 0;
 constexpr std::size_t kFirstBlock = std::size_t{8} << 10;
 constexpr std::size_t kLargestBlock = std::size_t{64} << 10;
 
@@ -45,13 +33,8 @@ void* Arena::takeAnew(std::size_t bytes) {
     return cutFromNewBlock(granulesOf(bytes) * kGranule);
 }
 
-void Arena::giveBack(void* piece, std::size_t bytes) noexcept {
-    if (kEachPieceAlone) {
-        ::operator delete(piece);
-        return;
-    }
-    const std::size_t granules = granulesOf(bytes);
-    if (granules < kReusedSizes) returned_[granules] = new (piece) Link{returned_[granules]};
+void Arena::freeAlone(void* piece) noexcept {
+    ::operator delete(piece);
 }
 
 // A piece that would fill a block nearly alone gets one of its own, and the rest of the newest block stays in

@@ -8,6 +8,7 @@
 #include <type_traits>
 
 #include <olvane/Export.h>
+#include <olvane/Trays.h>
 
 namespace olvane {
 
@@ -39,7 +40,14 @@ public:
         return piece;
     }
     // The size must be the one that was asked for.
-    void giveBack(void* piece, std::size_t bytes) noexcept;
+    void giveBack(void* piece, std::size_t bytes) noexcept {
+        if (blocks_ == nullptr) return freeAlone(piece);
+        const std::size_t granules = granulesOf(bytes);
+        if (granules < kReusedSizes) returned_[granules] = new (piece) Link{returned_[granules]};
+    }
+
+    // For what belongs to the picture and may outlive it.
+    Trays& trays() { return trays_; }
 
 private:
     struct Link {
@@ -51,6 +59,7 @@ private:
     static std::size_t granulesOf(std::size_t bytes) {
         return bytes == 0 ? 1 : (bytes + kGranule - 1) / kGranule;
     }
+    static void freeAlone(void* piece) noexcept;  // where each piece is an allocation of its own
     void* takeAnew(std::size_t bytes);  // where nothing that was returned and no rest of a block serves
     void* cutFromNewBlock(std::size_t size);
     char* addBlock(std::size_t size);
@@ -60,6 +69,7 @@ private:
     std::size_t left_ = 0;               // length of that rest
     std::size_t taken_ = 0;              // of all blocks
     Link* blocks_ = nullptr;
+    Trays trays_;
 };
 
 // The allocator of containers in an arena; without one it is the heap.

@@ -23,8 +23,7 @@
 #include <olvane/graph/WholePoint.h>
 #include <olvane/layouter/LineCourse.h>
 
-#include <boost/make_shared.hpp>
-
+#include <span>
 #include <utility>
 
 namespace SharedTreeViewer {
@@ -60,22 +59,37 @@ void TreeViewFamilyLayouter::addSpouseLinesToPerson(TreeViewPerson& person) {
 
 // The order of the three stages is the order of the segments in every list.
 void TreeViewFamilyLayouter::addLinesToPerson(TreeViewPerson& person) {
-    visitChildrenAndSpouses(
-        person, [&](TreeViewPerson& child, TreeViewPerson& spouse) { addChildLine(person, child, spouse); });
+    visitChildrenBySpouse(person, [&](std::span<TreeViewPerson> children, TreeViewPerson& spouse) {
+        if (children.empty()) return;
+        if (spouse.personId == person.personId) {
+            addLinesToChildrenOfLoneParent(person, spouse, children);
+        } else {
+            addLinesToChildrenOfCouple(person, spouse, children);
+        }
+    });
     for (TreeViewPerson& sibling : person.siblings) addSiblingLine(person, sibling);
     addParentLines(person);
 }
 
-void TreeViewFamilyLayouter::addChildLine(TreeViewPerson& person, TreeViewPerson& child,
-                                          TreeViewPerson& spouse) {
-    if (spouse.personId == person.personId) {
-        TreeLine line = drawDropBusAndStem(dropToChildOfLoneParent(spouse), spouse, child);
-        person.addGenerationEdge(
-            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &person));
-    } else {
-        TreeLine line = drawDropBusAndStem(dropToChildOfCouple(person, spouse), spouse, child);
-        TreeViewSpouseEdge* const couple = person.spouseEdge(&spouse, TreeLine());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, couple));
+// A person married to itself hangs its children from the spouse's box.
+void TreeViewFamilyLayouter::addLinesToChildrenOfLoneParent(TreeViewPerson& person, TreeViewPerson& holder,
+                                                            std::span<TreeViewPerson> children) {
+    const Drop drop = dropToChildOfLoneParent(holder);
+    for (TreeViewPerson& child : children) {
+        TreeLine line = drawDropBusAndStem(drop, holder, child);
+        person.addGenerationEdge(makeGenerationEdge(std::move(line), child, &person));
+    }
+}
+
+// All children hang from one drop and one edge, so both are looked up once.
+void TreeViewFamilyLayouter::addLinesToChildrenOfCouple(TreeViewPerson& person, TreeViewPerson& spouse,
+                                                        std::span<TreeViewPerson> children) {
+    const Drop drop = dropToChildOfCouple(person, spouse);
+    TreeViewSpouseEdge* const couple = person.spouseEdge(&spouse, TreeLine());
+    couple->reserveChildEdges(children.size());
+    for (TreeViewPerson& child : children) {
+        TreeLine line = drawDropBusAndStem(drop, spouse, child);
+        couple->addChildEdge(makeGenerationEdge(std::move(line), child, couple));
     }
 }
 
@@ -160,12 +174,12 @@ void TreeViewFamilyLayouter::addSiblingEdge(TreeViewPerson& person, TreeViewPers
     if (hasFather && hasMother) {
         TreeViewSpouseEdge* const couple =
             siblingParentsEdge(person.getPreferredFather(), person.getPreferredMother());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &sibling, couple));
+        couple->addChildEdge(makeGenerationEdge(std::move(line), sibling, couple));
         return;
     }
     const bool throughFather = hasFather && person.getPreferredFather().personId == sibling.getParentId();
     TreeViewPerson& parent = throughFather ? person.getPreferredFather() : person.getPreferredMother();
-    person.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &sibling, &parent));
+    person.addGenerationEdge(makeGenerationEdge(std::move(line), sibling, &parent));
 }
 
 // The points count only when this call is the one that makes the edge.
@@ -216,8 +230,7 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
         TreeViewPerson& parent =
             person.preferredFatherIndex != -1 ? person.getPreferredFather() : person.getPreferredMother();
         TreeLine line = drawDropBusAndStem(dropFromSingleParent(parent), parent, person);
-        parent.addGenerationEdge(
-            boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, &parent));
+        parent.addGenerationEdge(makeGenerationEdge(std::move(line), person, &parent));
         return;
     }
     TreeViewPerson& father = person.getPreferredFather();
@@ -226,7 +239,7 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
     TreeLine line = drawDropBusAndStem(drop, father, person);
     drawParentsMarriageLine(father, mother, drop);
     TreeViewSpouseEdge* const couple = father.spouseEdge(&mother, TreeLine());
-    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, couple));
+    couple->addChildEdge(makeGenerationEdge(std::move(line), person, couple));
 }
 
 // The one marriage line of a couple that stands on the chart as somebody's parents and not as each other's

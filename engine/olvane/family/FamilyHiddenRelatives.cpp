@@ -25,7 +25,7 @@ void TreeViewFamilyLayouter::flagNonDisplayedRelationships(TreeViewPerson& focus
     clearVisitedMarks();
     flagNonDisplayedRelationshipsForSpouses(focus, false);
     collectShownPersons();
-    for (TreeViewPerson* person : stackedPersons) flagAgainstWholeDisplay(*person);
+    flagAgainstWholeDisplay();
     everybody = std::move(stackedPersons);
     stackedPersons.clear();
     shownKeys.clear();
@@ -69,54 +69,71 @@ void TreeViewFamilyLayouter::collectShownPersons() {
     for (const TreeViewPerson* person : stackedPersons) shownKeys.insert(person->personId);
 }
 
-void TreeViewFamilyLayouter::flagAgainstWholeDisplay(TreeViewPerson& person) {
-    if (dataAdapter->isAddNode(person.personId)) return;
-    const bool hiddenChildren = hasHiddenChildren(person);
-    const bool hiddenSpouses = hasHiddenSpouses(person);
-    const bool hiddenParent = hasHiddenParent(person);
-    person.hasNonDisplayedRelationships = hiddenChildren || hiddenSpouses || hiddenParent;
-}
-
 namespace {
 
-// A relative counts as shown if any node with its key stands anywhere on the display. Where as many are drawn
-// under the person as the data source knows, nobody is looked up.
-template <class Records>
-bool someAreHidden(const Records& records, int drawnUnderPerson, const KeySet& shownKeys) {
-    if (static_cast<int>(records.size()) == drawnUnderPerson) return false;
-    return std::any_of(records.begin(), records.end(),
-                       [&](const auto& record) { return !shownKeys.contains(record.key); });
-}
+// The whole display, and the data source to compare it with.
+class WholeDisplay {
+public:
+    WholeDisplay(const DataAdapter& data, const KeySet& shownKeys, olvane::Arena& memory)
+        : data_(data), shownKeys_(shownKeys), memory_(memory) {}
+
+    void flag(TreeViewPerson& person) const {
+        if (data_.isAddNode(person.personId)) return;
+        const bool hiddenChildren = hasHiddenChildren(person);
+        const bool hiddenSpouses = hasHiddenSpouses(person);
+        const bool hiddenParent = hasHiddenParent(person);
+        person.hasNonDisplayedRelationships = hiddenChildren || hiddenSpouses || hiddenParent;
+    }
+
+private:
+    // A relative counts as shown if any node with its key stands anywhere on the display. Where as many are
+    // drawn under the person as the data source knows, nobody is looked up.
+    template <class Records>
+    bool someAreHidden(const Records& records, int drawnUnderPerson) const {
+        if (static_cast<int>(records.size()) == drawnUnderPerson) return false;
+        return std::any_of(records.begin(), records.end(),
+                           [&](const auto& record) { return !shownKeys_.contains(record.key); });
+    }
+
+    bool hasHiddenChildren(TreeViewPerson& person) const {
+        const ChildrenSet& children = person.getAllChildrenVector(data_.getChildren);
+        return !children.empty() && someAreHidden(children, countOfAllChildren(person));
+    }
+
+    bool hasHiddenSpouses(TreeViewPerson& person) const {
+        SpouseSet spouses(&memory_);
+        data_.getSpouses(person.personId, spouses);
+        return someAreHidden(spouses, person.getSpouseCount());
+    }
+
+    bool hasHiddenParent(TreeViewPerson& person) const {
+        int father =
+            person.preferredFatherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredFather().personId;
+        int mother =
+            person.preferredMotherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredMother().personId;
+        if (father == TreeViewPerson::kNoKey || mother == TreeViewPerson::kNoKey) {
+            data_.getParents(person.personId, father, mother);
+        }
+        const bool fatherShown = isShownOrUnknown(father);
+        const bool motherShown = isShownOrUnknown(mother);
+        return !(fatherShown && motherShown);
+    }
+
+    bool isShownOrUnknown(int parentKey) const {
+        return parentKey == TreeViewPerson::kNoKey || data_.isAddNode(parentKey) ||
+               shownKeys_.contains(parentKey);
+    }
+
+    const DataAdapter& data_;
+    const KeySet& shownKeys_;
+    olvane::Arena& memory_;
+};
 
 }  // namespace
 
-bool TreeViewFamilyLayouter::hasHiddenChildren(TreeViewPerson& person) {
-    const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
-    return someAreHidden(children, countOfAllChildren(person), shownKeys);
-}
-
-bool TreeViewFamilyLayouter::hasHiddenSpouses(TreeViewPerson& person) {
-    SpouseSet spouses(&memory);
-    dataAdapter->getSpouses(person.personId, spouses);
-    return someAreHidden(spouses, person.getSpouseCount(), shownKeys);
-}
-
-bool TreeViewFamilyLayouter::hasHiddenParent(TreeViewPerson& person) {
-    int father =
-        person.preferredFatherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredFather().personId;
-    int mother =
-        person.preferredMotherIndex == -1 ? TreeViewPerson::kNoKey : person.getPreferredMother().personId;
-    if (father == TreeViewPerson::kNoKey || mother == TreeViewPerson::kNoKey) {
-        dataAdapter->getParents(person.personId, father, mother);
-    }
-    const bool fatherShown = isShownOrUnknown(father);
-    const bool motherShown = isShownOrUnknown(mother);
-    return !(fatherShown && motherShown);
-}
-
-bool TreeViewFamilyLayouter::isShownOrUnknown(int parentKey) {
-    return parentKey == TreeViewPerson::kNoKey || dataAdapter->isAddNode(parentKey) ||
-           shownKeys.contains(parentKey);
+void TreeViewFamilyLayouter::flagAgainstWholeDisplay() {
+    const WholeDisplay display(*dataAdapter, shownKeys, memory);
+    for (TreeViewPerson* person : stackedPersons) display.flag(*person);
 }
 
 void TreeViewFamilyLayouter::flagNonDisplayedRelationshipsForSpouses(TreeViewPerson& person,

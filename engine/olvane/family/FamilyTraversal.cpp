@@ -22,7 +22,7 @@ void TreeViewFamilyLayouter::graphIteratorHelper(TreeViewPerson& person, const V
 
 std::vector<TreeViewPerson*> TreeViewFamilyLayouter::everyPerson() {
     std::vector<TreeViewPerson*> persons;
-    persons.reserve(shownPersons.size());  // all but a few
+    persons.reserve(shownPersons.sizeAtMost());  // all but a few
     visitGraph(focusPerson, [&persons](TreeViewPerson& person) { persons.push_back(&person); });
     return persons;
 }

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <span>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -130,14 +131,13 @@ private:
     void flagChildren(TreeViewPerson& focus);
     void clearVisitedMarks();
     void collectShownPersons();
-    void flagAgainstWholeDisplay(TreeViewPerson& person);
-    bool hasHiddenChildren(TreeViewPerson& person);
-    bool hasHiddenSpouses(TreeViewPerson& person);
-    bool hasHiddenParent(TreeViewPerson& person);
-    bool isShownOrUnknown(int parentKey);
+    void flagAgainstWholeDisplay();
 
     // Lines.
-    void addChildLine(TreeViewPerson& person, TreeViewPerson& child, TreeViewPerson& spouse);
+    void addLinesToChildrenOfLoneParent(TreeViewPerson& person, TreeViewPerson& holder,
+                                        std::span<TreeViewPerson> children);
+    void addLinesToChildrenOfCouple(TreeViewPerson& person, TreeViewPerson& spouse,
+                                    std::span<TreeViewPerson> children);
     void addSiblingLine(TreeViewPerson& person, TreeViewPerson& sibling);
     void addParentLines(TreeViewPerson& person);
     Drop dropToChildOfCouple(TreeViewPerson& person, TreeViewPerson& spouse) const;

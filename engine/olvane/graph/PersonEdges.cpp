@@ -19,7 +19,9 @@ TreeViewSpouseEdge* TreeViewPerson::spouseEdge(TreeViewPerson* spouse, TreeLine 
 
     TreeViewPerson* const first = gender ? this : spouse;
     TreeViewPerson* const second = gender ? spouse : this;
-    auto edge = std::make_unique<TreeViewSpouseEdge>(std::move(line), first, second);
+    std::unique_ptr<TreeViewSpouseEdge> edge(
+        arena() != nullptr ? new (arena()->trays()) TreeViewSpouseEdge(std::move(line), first, second)
+                           : new TreeViewSpouseEdge(std::move(line), first, second));
     spouseEdges.emplace(spouseKey, edge.get());
     TreeViewSpouseEdge* const made = edge.release();
     spouse->addUnownedSpouseEdge(made, personId);

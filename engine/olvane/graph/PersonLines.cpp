@@ -6,17 +6,6 @@
 
 #include <olvane/graph/TreeViewPerson.h>
 
-namespace {
-
-constexpr std::size_t kUsualSegments = 4;  // a person's own, without those that children leave
-
-}  // namespace
-
-void TreeViewPerson::addLineSegment(float x1, float y1, float x2, float y2, bool isSpouseLine) {
-    if (lineSegments.empty()) lineSegments.reserve(kUsualSegments);
-    lineSegments.push_back(TreeLineSegment{x1, y1, x2, y2, isSpouseLine});
-}
-
 void TreeViewPerson::addSpouseLine(int spouseKey, float x1, float y1, float x2, float y2) {
     linesTo(spouseKey).push_back(TreeLineSegment{x1, y1, x2, y2, true});
 }

@@ -12,6 +12,7 @@
 #include <olvane/graph/TreeViewPerson.h>
 
 #include <algorithm>
+#include <span>
 
 namespace {
 
@@ -20,10 +21,6 @@ typedef TreeViewPerson::Visitor Visitor;
 
 void walk(Persons& persons, const Visitor& visitor) {
     for (TreeViewPerson& person : persons) visitor(person);
-}
-
-int countOf(const Persons& persons) {
-    return static_cast<int>(persons.size());
 }
 
 template <class Walk>
@@ -74,7 +71,9 @@ void TreeViewPerson::allChildrenWithSpouseIterator(TreeViewPerson& spouse, const
 }
 
 void TreeViewPerson::childAndSpouseIterator(const PairVisitor& visitor) {
-    visitChildrenAndSpouses(*this, visitor);
+    visitChildrenBySpouse(*this, [&visitor](std::span<TreeViewPerson> list, TreeViewPerson& other) {
+        for (TreeViewPerson& child : list) visitor(child, other);
+    });
 }
 
 // From self: outward to the left from the person's own entry, then that entry, then on to the right. Without
@@ -144,39 +143,17 @@ TreeViewPerson::Iterator TreeViewPerson::getNonDisplayedSpouseIterator(const Spo
     return [this](const Visitor& visitor) { nonDisplayedSpouseIterator(visitor); };
 }
 
-TreeViewPerson::Persons& TreeViewPerson::getNonDisplayedSpouses(const SpousesLoader& loader) {
-    if (!nonDisplayedSpousesLoaded) {
-        nonDisplayedSpousesLoaded = true;
-        SpouseSet records(arena());
-        loader(personId, records);
-        nonDisplayedSpouses.reserve(nonDisplayedSpouses.size() + records.size());
-        for (const SpouseAdapter& record : records) addNonDisplayedSpouse(record.key);
-    }
-    return nonDisplayedSpouses;
+void TreeViewPerson::loadNonDisplayedSpouses(const SpousesLoader& loader) {
+    nonDisplayedSpousesLoaded = true;
+    SpouseSet records(arena());
+    loader(personId, records);
+    nonDisplayedSpouses.reserve(nonDisplayedSpouses.size() + records.size());
+    for (const SpouseAdapter& record : records) addNonDisplayedSpouse(record.key);
 }
 
-ChildrenSet& TreeViewPerson::getAllChildrenVector(const ChildrenLoader& loader) {
-    if (!allChildrenLoaded) {
-        allChildrenLoaded = true;
-        loader(personId, allChildren);
-    }
-    return allChildren;
-}
-
-int TreeViewPerson::getParentCount() const {
-    return countOf(parents);
-}
-
-int TreeViewPerson::getSpouseCount() const {
-    return countOf(spouses);
-}
-
-int TreeViewPerson::getNonDisplayedSpouseCount() const {
-    return countOf(nonDisplayedSpouses);
-}
-
-int TreeViewPerson::getSiblingCount() const {
-    return countOf(siblings);
+void TreeViewPerson::loadAllChildren(const ChildrenLoader& loader) {
+    allChildrenLoaded = true;
+    loader(personId, allChildren);
 }
 
 int TreeViewPerson::getGrandparentCount() {

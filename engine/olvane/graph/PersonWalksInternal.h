@@ -38,15 +38,13 @@ void visitParentsSpousesAndChildren(TreeViewPerson& person, const Visit& visit) 
     visitAllChildren(person, false, visit);
 }
 
-// The order of TreeViewPerson::childAndSpouseIterator: each child with its other parent, or with the person.
-template <class VisitPair>
-void visitChildrenAndSpouses(TreeViewPerson& person, const VisitPair& visit) {
-    const auto visitChildrenWith = [&visit, &person](int key, TreeViewPerson& other) {
-        for (TreeViewPerson& child : person.childrenBy(key)) visit(child, other);
-    };
-    if (person.gender) visitChildrenWith(TreeViewPerson::kNoKey, person);
-    for (TreeViewPerson& spouse : person.spouses) visitChildrenWith(spouse.personId, spouse);
-    if (!person.gender) visitChildrenWith(TreeViewPerson::kNoKey, person);
+// The lists of children in the order of TreeViewPerson::childAndSpouseIterator, each with the other parent, or with
+// the person where there is none.
+template <class VisitList>
+void visitChildrenBySpouse(TreeViewPerson& person, const VisitList& visit) {
+    if (person.gender) visit(person.childrenBy(TreeViewPerson::kNoKey), person);
+    for (TreeViewPerson& spouse : person.spouses) visit(person.childrenBy(spouse.personId), spouse);
+    if (!person.gender) visit(person.childrenBy(TreeViewPerson::kNoKey), person);
 }
 
 inline int countOfChildren(TreeViewPerson& person, int key) {

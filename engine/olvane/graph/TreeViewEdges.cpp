@@ -21,14 +21,6 @@ constexpr std::size_t kUsualChildren = 4;  // of a couple
 
 TreeViewEdge::~TreeViewEdge() = default;
 
-TreeViewGenerationEdge::TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson,
-                                               TreeViewSpouseEdge* parents)
-    : TreeViewEdge(std::move(line)), child(childPerson), singleParent(nullptr), parentsEdge(parents) {}
-
-TreeViewGenerationEdge::TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson,
-                                               TreeViewPerson* parent)
-    : TreeViewEdge(std::move(line)), child(childPerson), singleParent(parent), parentsEdge(nullptr) {}
-
 TreeViewGenerationEdge::~TreeViewGenerationEdge() = default;
 
 TreeViewSpouseEdge::TreeViewSpouseEdge(TreeViewPerson* first, TreeViewPerson* second)
@@ -44,7 +36,7 @@ TreeViewSpouseEdge::TreeViewSpouseEdge(TreeLine line, TreeViewPerson* first, Tre
 TreeViewSpouseEdge::~TreeViewSpouseEdge() = default;
 
 void TreeViewSpouseEdge::addChildEdge(boost::shared_ptr<TreeViewGenerationEdge> edge) {
-    if (childEdges.empty()) childEdges.reserve(kUsualChildren);
+    reserveChildEdges(kUsualChildren);
     childEdges.push_back(std::move(edge));
 }
 

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <utility>
+
 #include <olvane/Export.h>
 #include <olvane/graph/TreeViewEdge.h>
 
@@ -14,8 +16,10 @@ class TreeViewSpouseEdge;
 // parentsEdge is set.
 class OLVANE_API TreeViewGenerationEdge : public TreeViewEdge {
 public:
-    TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson, TreeViewSpouseEdge* parents);
-    TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson, TreeViewPerson* parent);
+    TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson, TreeViewSpouseEdge* parents)
+        : TreeViewEdge(std::move(line)), child(childPerson), singleParent(nullptr), parentsEdge(parents) {}
+    TreeViewGenerationEdge(TreeLine line, TreeViewPerson* childPerson, TreeViewPerson* parent)
+        : TreeViewEdge(std::move(line)), child(childPerson), singleParent(parent), parentsEdge(nullptr) {}
     ~TreeViewGenerationEdge() override;
 
     bool hasSingleParent() const { return parentsEdge == nullptr; }

@@ -104,6 +104,7 @@ public:
 
     // The children by that other parent, where they lie. Leaves no list under a key that is missing.
     std::span<TreeViewPerson> childrenBy(int key) {
+        if (children.empty()) return {};  // as for most persons
         const auto entry = children.find(key);
         if (entry == children.end()) return {};
         return {entry->second.data(), entry->second.size()};
@@ -137,14 +138,20 @@ public:
     // --- Loaders: ask the data source at most once for each node. The mark is set before the question, so a
     // loader that throws is not asked again.
     Iterator getNonDisplayedSpouseIterator(const SpousesLoader& loader);  // loads, then offers the walk
-    Persons& getNonDisplayedSpouses(const SpousesLoader& loader);         // loads, then offers the list
-    ChildrenSet& getAllChildrenVector(const ChildrenLoader& loader);  // the ordered set, whatever its name
+    Persons& getNonDisplayedSpouses(const SpousesLoader& loader) {        // loads, then offers the list
+        if (!nonDisplayedSpousesLoaded) loadNonDisplayedSpouses(loader);
+        return nonDisplayedSpouses;
+    }
+    ChildrenSet& getAllChildrenVector(const ChildrenLoader& loader) {  // the ordered set, whatever its name
+        if (!allChildrenLoaded) loadAllChildren(loader);
+        return allChildren;
+    }
 
     // --- Counts. Those that ask for children by key leave an empty list under a key that is missing.
-    int getParentCount() const;
-    int getSpouseCount() const;
-    int getNonDisplayedSpouseCount() const;  // 0 until loaded
-    int getSiblingCount() const;             // the person's own entry counts
+    int getParentCount() const { return countOf(parents); }
+    int getSpouseCount() const { return countOf(spouses); }
+    int getNonDisplayedSpouseCount() const { return countOf(nonDisplayedSpouses); }  // 0 until loaded
+    int getSiblingCount() const { return countOf(siblings); }  // the person's own entry counts
     int getGrandparentCount();
     int getGreatGrandparentCount();
     int getChildrenWithSpouseCount(int key);
@@ -162,7 +169,10 @@ public:
     void spouseEdgeIterator(const SpouseEdgeVisitor& visitor);  // owned edges alone, by ascending key
 
     // --- Lines.
-    void addLineSegment(float x1, float y1, float x2, float y2, bool isSpouseLine);
+    void addLineSegment(float x1, float y1, float x2, float y2, bool isSpouseLine) {
+        if (lineSegments.capacity() == 0) lineSegments.reserve(kUsualSegments);
+        lineSegments.push_back(TreeLineSegment{x1, y1, x2, y2, isSpouseLine});
+    }
     void addSpouseLine(int spouseKey, float x1, float y1, float x2, float y2);
     // The first line to that spouse. Fails with std::out_of_range where there is none, leaving an empty list.
     TreeLineSegment& getSpouseLine(int spouseKey);
@@ -195,6 +205,12 @@ public:
     TreePoint nodeCenter;
 
 private:
+    static constexpr std::size_t kUsualSegments = 4;  // a person's own, without those that children leave
+
+    static int countOf(const Persons& persons) { return static_cast<int>(persons.size()); }
+
+    void loadNonDisplayedSpouses(const SpousesLoader& loader);
+    void loadAllChildren(const ChildrenLoader& loader);
     olvane::Arena* arena() const { return parents.get_allocator().arena(); }
     Persons& childrenUnder(int key);  // both make the list where there is none
     Segments& linesTo(int spouseKey);

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include <olvane/Export.h>
+#include <olvane/Trays.h>
 #include <olvane/graph/TreeViewEdge.h>
 #include <olvane/graph/TreeViewGenerationEdge.h>
 
@@ -28,6 +29,10 @@ public:
     ~TreeViewSpouseEdge() override;
 
     void addChildEdge(boost::shared_ptr<TreeViewGenerationEdge> edge);
+    // Room for the first ones, where their number is known.
+    void reserveChildEdges(std::size_t count) {
+        if (childEdges.capacity() == 0) childEdges.reserve(count);
+    }
 
     // Appends, whatever the position: exactly what addChildEdge does. Hosts number a couple's children by
     // this list, and an honoured position would renumber those already handed out.
@@ -50,6 +55,15 @@ public:
     ChildEdges::const_iterator csend() const { return childEdges.cend(); }
 
     bool isSpouseMale() const;  // the gender of the second partner
+
+    // An edge lies on a tray, or by itself where none is given. Deleting it is the same for both. The forms with a
+    // place stand here for those who make an edge in memory of their own.
+    static void* operator new(std::size_t bytes) { return olvane::Trays::takeAlone(bytes); }
+    static void* operator new(std::size_t bytes, olvane::Trays& trays) { return trays.take(bytes); }
+    static void* operator new(std::size_t, void* place) { return place; }
+    static void operator delete(void* edge) { olvane::Trays::giveBack(edge); }
+    static void operator delete(void* edge, olvane::Trays&) { olvane::Trays::giveBack(edge); }
+    static void operator delete(void*, void*) {}
 
     ChildEdges childEdges;
     mutable ChildEdgeList childEdgeList;  // the plain view, rebuilt by begin and cbegin

@@ -22,13 +22,13 @@ public:
         }
         const std::size_t place = static_cast<std::size_t>(key);
         if (place >= marks_.size()) marks_.resize(place + place / 2 + kLeastMarks);
-        marks_[place] = true;
+        marks_[place] = 1;
     }
 
     bool contains(int key) const {
         const std::size_t place =
             static_cast<std::size_t>(key);  // beyond every mark where the key is negative
-        if (place < marks_.size() && marks_[place]) return true;
+        if (place < marks_.size() && marks_[place] != 0) return true;
         return !farOut_.empty() && farOut_.find(key) != farOut_.end();
     }
 
@@ -46,7 +46,7 @@ private:
         return key < 0 || static_cast<std::size_t>(key) >= kLeastMarks + kMarksForEachKey * inserted_;
     }
 
-    std::vector<bool> marks_;  // by key
+    std::vector<unsigned char> marks_;  // by key; bytes, which are read with less work than bits
     std::size_t inserted_ = 0;
     boost::unordered_set<int> farOut_;
 };

@@ -3,10 +3,9 @@
 
 #pragma once
 
+#include <boost/make_shared.hpp>
 #include <boost/unordered_map.hpp>
 
-#include <functional>
-#include <map>
 #include <string>
 #include <utility>
 #include <vector>
@@ -14,7 +13,9 @@
 #include <olvane/Arena.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/DataAdapter.h>
+#include <olvane/graph/TreeViewGenerationEdge.h>
 #include <olvane/graph/TreeViewPerson.h>
+#include <olvane/layouter/AdmittedKeys.h>
 #include <olvane/layouter/TreeSize.h>
 
 namespace SharedTreeViewer {
@@ -90,8 +91,7 @@ public:
     OptionMap options;
     DataAdapter* dataAdapter;
     TreeSize treeSize;
-    // Keys admitted to the graph; the value is always true.
-    std::map<int, bool, std::less<int>, olvane::ArenaAllocator<std::pair<const int, bool>>> shownPersons;
+    AdmittedKeys shownPersons;
 
 protected:
     ~TreeViewLayouter() = default;
@@ -99,9 +99,16 @@ protected:
     // The step from one row or column to the next.
     float rowStep() const;
 
-    // Mostly in the order of the keys, so the end is the place to look first.
-    void admit(int key) { shownPersons.emplace_hint(shownPersons.end(), key, true); }
-    bool isAdmitted(int key) const { return shownPersons.find(key) != shownPersons.end(); }
+    // Above is the parent, or the edge of the couple.
+    template <class Above>
+    boost::shared_ptr<TreeViewGenerationEdge> makeGenerationEdge(TreeLine&& line, TreeViewPerson& child,
+                                                                 Above* above) {
+        return boost::allocate_shared<TreeViewGenerationEdge>(
+            olvane::TrayAllocator<TreeViewGenerationEdge>(memory.trays()), std::move(line), &child, above);
+    }
+
+    void admit(int key) { shownPersons.admit(key); }
+    bool isAdmitted(int key) const { return shownPersons.count(key) != 0; }
 
 private:
     typedef TreeViewPerson::List<const ChildrenAdapter*> Records;  // in the sets where they lie

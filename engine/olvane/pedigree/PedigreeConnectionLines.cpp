@@ -19,8 +19,6 @@
 
 #include <olvane/graph/WholePoint.h>
 
-#include <boost/make_shared.hpp>
-
 #include <algorithm>
 #include <cstdint>
 #include <utility>
@@ -74,14 +72,14 @@ void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeV
         const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
         course.draw(spouse, at.x, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
-        focus.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, &focus));
+        focus.addGenerationEdge(makeGenerationEdge(std::move(line), child, &focus));
     } else {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;
         course.draw(spouse, lineX, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
         TreeViewSpouseEdge* const couple = spouse.spouseEdge(&focus, TreeLine());
-        couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &child, couple));
+        couple->addChildEdge(makeGenerationEdge(std::move(line), child, couple));
     }
 }
 
@@ -131,7 +129,7 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
     course.draw(person, x, middleY, middleX, middleY);
     course.draw(person, middleX, middleY, middleX, ownY);
     course.draw(person, middleX, ownY, ownRight, ownY);
-    couple->addChildEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, couple));
+    couple->addChildEdge(makeGenerationEdge(std::move(line), person, couple));
     addParentLinesForPerson(father);
     addParentLinesForPerson(mother);
 }
@@ -149,7 +147,7 @@ void TreeViewPedigreeLayouter::addSingleParentLines(TreeViewPerson& person, Tree
     course.draw(parent, parentX, parentY, stubX, parentY);
     course.draw(person, stubX, ownY, stubX, parentY);
     course.draw(person, own.x + treeSize.nodeWidth, ownY, stubX, ownY);
-    parent.addGenerationEdge(boost::make_shared<TreeViewGenerationEdge>(std::move(line), &person, &parent));
+    parent.addGenerationEdge(makeGenerationEdge(std::move(line), person, &parent));
     addParentLinesForPerson(parent);
 }
 

@@ -1,0 +1,69 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstddef>
+#include <functional>
+#include <initializer_list>
+#include <map>
+#include <utility>
+#include <vector>
+
+#include <olvane/Arena.h>
+
+namespace SharedTreeViewer {
+
+// The keys admitted to a graph, as an ordered map; the value is always true. Nearly every person is admitted and
+// hardly anybody is looked up, so keys wait in a list and enter the map at the next look. An entry that exists is
+// not touched by that.
+class AdmittedKeys {
+public:
+    typedef std::map<int, bool, std::less<int>, olvane::ArenaAllocator<std::pair<const int, bool>>> Map;
+    typedef Map::const_iterator const_iterator;
+
+    explicit AdmittedKeys(olvane::Arena* arena) : map_(arena), waiting_(arena) {}
+    AdmittedKeys& operator=(std::initializer_list<Map::value_type> entries) {
+        clear();
+        map_.insert(entries);
+        return *this;
+    }
+
+    void admit(int key) { waiting_.push_back(key); }
+    // No fewer than there are; takes no look.
+    std::size_t sizeAtMost() const { return map_.size() + waiting_.size(); }
+
+    // --- The map.
+    const Map& map() const {
+        enterWaiting();
+        return map_;
+    }
+    Map& map() {
+        enterWaiting();
+        return map_;
+    }
+    bool& operator[](int key) { return map()[key]; }
+    const bool& at(int key) const { return map().at(key); }
+    std::size_t count(int key) const { return map().count(key); }
+    const_iterator find(int key) const { return map().find(key); }
+    const_iterator begin() const { return map().begin(); }
+    const_iterator end() const { return map().end(); }
+    std::size_t size() const { return map().size(); }
+    bool empty() const { return map_.empty() && waiting_.empty(); }
+    void clear() {
+        map_.clear();
+        waiting_.clear();
+    }
+
+private:
+    // Mostly in the order of the keys, so the end is the place to look first.
+    void enterWaiting() const {
+        for (const int key : waiting_) map_.emplace_hint(map_.end(), key, true);
+        waiting_.clear();
+    }
+
+    mutable Map map_;
+    mutable std::vector<int, olvane::ArenaAllocator<int>> waiting_;
+};
+
+}  // namespace SharedTreeViewer
