@@ -103,11 +103,12 @@ void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defa
         ->type_name("tall|wide");
 }
 
-void addHideLiving(CLI::App& command, bool& hideLiving, int& year) {
+void addHideLiving(CLI::App& command, bool& hideLiving, int& year, const std::string& further = "") {
     command.add_flag(
         "--hide-living", hideLiving,
         "Tell nothing of whoever may be alive but 'Living': no death told and born less than 110 years "
-        "ago, or dates that cannot tell and near kin of such a person");
+        "ago, or dates that cannot tell and near kin of such a person" +
+            further);
     command.add_option("--year", year, "The year that --hide-living counts from; this year if not given")
         ->check(CLI::Range(1, 9999))
         ->type_name("YEAR");
@@ -235,7 +236,8 @@ private:
             ->add_option(
                 "--page", drawOptions_.page,
                 "Lay the picture out on sheets of this paper, with strips to glue them by. A .pdf holds "
-                "them all; other forms become OUT-1, OUT-2 and so on")
+                "them all; other forms become OUT-1, OUT-2 and so on. More than about 1,000 sheets are "
+                "refused")
             ->check(CLI::IsMember({"A4", "A3", "letter"}))
             ->type_name("A4|A3|letter");
         addHideLiving(*draw_, drawOptions_.hideLiving, drawOptions_.year);
@@ -300,7 +302,8 @@ private:
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
             ->type_name("TEXT");
-        addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year);
+        addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year,
+                      "; nor any free text about others that may name them");
         needsFile(focus);
         needsFile(page_->get_option("--hide-living"));
         needsFile(page_->get_option("--title"));

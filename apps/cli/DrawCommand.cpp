@@ -6,6 +6,8 @@
 
 #include <cli/Commands.h>
 
+#include <algorithm>
+#include <cmath>
 #include <iomanip>
 #include <sstream>
 
@@ -28,6 +30,8 @@ namespace {
 enum class Form { svg, png, pdf };
 
 constexpr double kSheetPngScale = 2;  // 192 pixels an inch, for paper
+// Sixty square metres of A4; beyond, time and memory are of no use to anybody.
+constexpr double kMostSheets = 1000;
 
 std::string lowerCase(std::string text) {
     for (char& c : text) {
@@ -103,10 +107,32 @@ void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::
     set.finish();
 }
 
+// Without the strips and margins that sheets share, and with those that would be blank.
+double sheetsFor(const draw::SvgPicture& picture, double paperWidth, double paperHeight) {
+    constexpr double kPxOfMm = 96 / 25.4;
+    return std::ceil(picture.width / (paperWidth * kPxOfMm)) *
+           std::ceil(picture.height / (paperHeight * kPxOfMm));
+}
+
+// Before any sheet is made: a picture may be kilometres wide.
+void refuseTooManySheets(const DrawOptions& options, const draw::SvgPicture& picture,
+                         const draw::Paper& paper) {
+    const double sheets = std::min(sheetsFor(picture, paper.width, paper.height),
+                                   sheetsFor(picture, paper.height, paper.width));
+    if (sheets <= kMostSheets) return;
+    std::ostringstream text;
+    text << std::fixed << std::setprecision(0) << "the picture would take about " << sheets << " sheets of "
+         << options.page << ", and " << kMostSheets
+         << " are the most; take larger paper, leave relatives or generations out, or draw it whole, "
+            "without --page";
+    throw UsageError(text.str());
+}
+
 std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::SvgPicture& picture,
                                        const std::string& title) {
     const auto paper = draw::paperOfName(options.page);
     if (!paper) return {picture};
+    refuseTooManySheets(options, picture, *paper);
     return draw::splitPages(picture, *paper, title);
 }
 

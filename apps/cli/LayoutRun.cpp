@@ -22,7 +22,8 @@ namespace {
 
 constexpr int kPedigreeStackDepth = 4;  // as the family view's own
 
-// A thousand times what charts of real families ask for. A layout at the limit takes about a gigabyte.
+// A thousand times what charts of real families ask for. A layout at the limit takes about a gigabyte, and up to a
+// quarter of a minute where one person has a hundred thousand children, which are looked up in a set that large.
 constexpr std::size_t kMostRelatives = 5000000;
 
 SharedTreeViewer::OptionMap optionsOf(const LayoutRequest& request) {

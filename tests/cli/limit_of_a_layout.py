@@ -37,17 +37,26 @@ def everybody_with_everybody(count):
     return gedcom(persons, [(man, wife, persons) for man in persons[::2] for wife in persons[1::2]])
 
 
-def man_with_wives(count):
+def man_with_wives(count, children_of_each=0):
     wives = range(2, 2 * count + 1, 2)
-    return gedcom([1, *wives], [(1, wife, []) for wife in wives])
+    first = 2 * count + 1
+    children = [range(first + number * children_of_each, first + (number + 1) * children_of_each) for number in range(count)]
+    everybody = [1, *wives, *(child for family in children for child in family)]
+    return gedcom(everybody, [(1, wife, children[number]) for number, wife in enumerate(wives)])
 
 
-def lay_out(command, text, *options):
+def run(command, text, *words):
+    """The command on FILE, and the names of the files that lie beside it then."""
     with tempfile.TemporaryDirectory() as folder:
         file = pathlib.Path(folder) / "family.ged"
         file.write_text(text, encoding="utf-8")
-        return subprocess.run([command, "layout", file, "--focus", "I1", *options], capture_output=True, text=True,
-                              timeout=100, check=False)
+        done = subprocess.run([command, *(str(file) if word == "FILE" else word for word in words)], capture_output=True,
+                              text=True, cwd=folder, timeout=100, check=False)
+        return done, sorted(path.name for path in pathlib.Path(folder).iterdir())
+
+
+def lay_out(command, text, *options):
+    return run(command, text, "layout", "FILE", "--focus", "I1", *options)[0]
 
 
 def require_refusal(done):
@@ -61,11 +70,21 @@ def require_records(done, fewest):
         raise SystemExit(f"status {done.returncode}, {records} records, not {fewest}: {done.stderr[:300]}")
 
 
+def require_few_sheets(command, text):
+    done, files = run(command, text, "draw", "FILE", "--focus", "I1", "--page", "A4", "-o", "out.svg")
+    if done.returncode != 2 or "sheets of A4, and 1000 are the most" not in done.stderr or files != ["family.ged"]:
+        raise SystemExit(f"thousands of sheets: status {done.returncode}, {len(files)} files, {done.stderr[:300]}")
+
+
 def main():
     command = sys.argv[1]
     require_refusal(lay_out(command, everybody_with_everybody(100)))
     require_records(lay_out(command, everybody_with_everybody(16)), 500)
     require_records(lay_out(command, man_with_wives(1000)), 1001)
+    require_records(lay_out(command, man_with_wives(300, 2)), 901)
+    # Five times as many of each take a quarter of a minute, and are refused as well.
+    require_refusal(lay_out(command, man_with_wives(2000, 10)))
+    require_few_sheets(command, man_with_wives(1000))
     own_parents = gedcom([1, 2], [(1, 2, [1, 2])])
     require_records(lay_out(command, own_parents), 5)
     require_records(lay_out(command, own_parents, "--view", "pedigree", "--generations", "12"), 4095)

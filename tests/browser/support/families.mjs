@@ -115,7 +115,8 @@ export function rightToLeftFamily() {
 /** A dead man and his wife, and their children, who are alive. */
 export function livingFamily() {
     return gedcom(
-        "0 @I1@ INDI", "1 NAME Gottfried /Altmann/", "1 SEX M", "1 BIRT", "2 DATE 1 JAN 1880", "1 DEAT", "2 DATE 2 FEB 1950", "1 FAMS @F1@",
+        "0 @I1@ INDI", "1 NAME Gottfried /Altmann/", "1 SEX M", "1 BIRT", "2 DATE 1 JAN 1880", "1 DEAT", "2 DATE 2 FEB 1950", "1 EVEN", "2 TYPE Witness Zacharias Geheimrat",
+        "1 RESI", "2 PLAC House of Yolanda Versteckt", "1 FAMS @F1@",
         "0 @I2@ INDI", "1 NAME Walburga /Altmann/", "1 SEX F", "1 BIRT", "2 DATE 1885", "1 DEAT Y", "1 FAMS @F1@",
         "0 @I3@ INDI", "1 NAME Zacharias /Geheimrat/", "1 SEX M", "1 BIRT", "2 DATE 13 MAY 1999", "2 PLAC Verborgenstadt", "1 OCCU Heimlichtuer", "1 FAMC @F1@", "1 FAMS @F2@",
         "0 @I4@ INDI", "1 NAME Yolanda /Versteckt/", "1 SEX F", "1 BIRT", "2 DATE 14 JUN 2001", "1 FAMS @F2@",
