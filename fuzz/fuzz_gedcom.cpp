@@ -2,19 +2,26 @@
 // SPDX-License-Identifier: MIT
 
 // Any bytes as a GEDCOM file. Whatever they are, they are either refused with a GedcomError or give data
-// that keeps every promise of its headers: relatives within the counts, texts valid, dates that sort.
+// that keeps every promise of its headers: relatives within the counts, texts valid, dates that sort. What was
+// read is written and read again as the same, and without those whom the input's size says are hidden.
 
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <span>
+#include <stdexcept>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include <olvane/gedcom/GedcomDate.h>
 #include <olvane/gedcom/GedcomDiagnostic.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/gedcom/GedcomWriter.h>
 #include <olvane/gedcom/PersonSearch.h>
+#include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/LimitedDataSource.h>
 
 #include "Holds.h"
 
@@ -25,6 +32,10 @@ using namespace olvane::gedcom;
 // Persons whose names are searched for: each search looks at all, and a file of 64 KiB has thousands.
 constexpr std::size_t kSearchedPersons = 8;
 constexpr std::size_t kSortTextBytes = 12;
+// Hidden persons whose names are looked for in all that is told of the others.
+constexpr std::size_t kSoughtPersons = 8;
+constexpr std::size_t kMostRelatives = 100;
+constexpr std::string_view kHiddenName = "(nobody)";
 
 std::size_t bytesOfCharacter(unsigned char lead) {
     if (lead < 0x80) return 1;
@@ -64,11 +75,19 @@ bool hasNoControls(std::string_view text) {
                         [](char c) { return static_cast<unsigned char>(c) < 0x20; });
 }
 
+bool isCapital(char c) {
+    return c >= 'A' && c <= 'Z';
+}
+
+void lookAtText(std::string_view text) {
+    HOLDS(isUtf8(text) && hasNoControls(text));
+    HOLDS(text.empty() || (text.front() != ' ' && text.back() != ' '));
+}
+
 void lookAtName(const PersonName& name) {
     for (const std::string_view piece :
          {name.written, name.prefix, name.given, name.surname, name.suffix, name.nickname}) {
-        HOLDS(isUtf8(piece) && hasNoControls(piece));
-        HOLDS(piece.empty() || (piece.front() != ' ' && piece.back() != ' '));
+        lookAtText(piece);
     }
     HOLDS(isUtf8(displayName(name)));
 }
@@ -80,6 +99,15 @@ void lookAtDate(const GedcomDate& date) {
     HOLDS(date.isRead() || displayYear(date) == date.written);
     const GedcomDate again = parseGedcomDate(date.written);
     HOLDS(again.year == date.year && again.month == date.month && again.day == date.day);
+}
+
+void lookAtFacts(std::span<const Fact> facts) {
+    for (const Fact& fact : facts) {
+        HOLDS(!fact.tag.empty() && std::all_of(fact.tag.begin(), fact.tag.end(), isCapital));
+        lookAtText(fact.value);
+        lookAtText(fact.place);
+        lookAtDate(fact.date);
+    }
 }
 
 void lookAtRelatives(const GedcomData& data, PersonId id) {
@@ -99,6 +127,7 @@ void lookAtPerson(const GedcomData& data, PersonId id) {
     lookAtDate(person.birth);
     lookAtDate(person.death);
     lookAtRelatives(data, id);
+    lookAtFacts(data.factsOfPerson(id));
     HOLDS(isUtf8(person.xref));
     // An identifier with an @ in it cannot be told from one that was given with its own.
     const bool canBeAskedFor = !person.xref.empty() && person.xref.find('@') == std::string_view::npos;
@@ -108,6 +137,7 @@ void lookAtPerson(const GedcomData& data, PersonId id) {
 void lookAtFamily(const GedcomData& data, FamilyId id) {
     const Family& family = data.family(id);
     lookAtDate(family.marriage);
+    lookAtFacts(data.factsOfFamily(id));
     HOLDS(family.husband == 0 || data.hasPerson(family.husband));
     HOLDS(family.wife == 0 || data.hasPerson(family.wife));
     for (const ChildLink& link : data.childLinks(id)) HOLDS(link.child == 0 || data.hasPerson(link.child));
@@ -132,6 +162,7 @@ void lookAtDiagnostics(const GedcomData& data) {
     for (const Diagnostic& diagnostic : data.diagnostics()) {
         const std::string line = formatDiagnostic(diagnostic);
         HOLDS(isUtf8(line) && isOneLine(line));
+        HOLDS(severityName(diagnostic.severity)[0] != '\0');
     }
 }
 
@@ -140,6 +171,221 @@ void lookAtAll(const GedcomData& data) {
     for (FamilyId id = 1; id <= data.familyCount(); ++id) lookAtFamily(data, id);
     searchForNames(data);
     lookAtDiagnostics(data);
+}
+
+bool areEqual(const PersonName& one, const PersonName& other) {
+    return one.written == other.written && one.prefix == other.prefix && one.given == other.given &&
+           one.surname == other.surname && one.suffix == other.suffix && one.nickname == other.nickname;
+}
+
+bool areEqual(const GedcomDate& one, const GedcomDate& other) {
+    return one.written == other.written && displayYear(one) == displayYear(other) &&
+           sortText(one) == sortText(other);
+}
+
+bool areEqual(const Fact& one, const Fact& other) {
+    return one.tag == other.tag && one.value == other.value && one.place == other.place &&
+           areEqual(one.date, other.date);
+}
+
+template <typename Item>
+bool allEqual(std::span<const Item> some, std::span<const Item> others) {
+    return std::equal(some.begin(), some.end(), others.begin(), others.end(),
+                      [](const Item& one, const Item& other) { return areEqual(one, other); });
+}
+
+// The families that links lead to, with how, and without those that lead nowhere, which are not written.
+std::vector<std::pair<FamilyId, Pedigree>> familiesOf(std::span<const FamilyLink> links) {
+    std::vector<std::pair<FamilyId, Pedigree>> families;
+    for (const FamilyLink& link : links) {
+        if (link.family != 0) families.emplace_back(link.family, link.pedigree);
+    }
+    return families;
+}
+
+std::vector<PersonId> childrenOf(std::span<const ChildLink> links) {
+    std::vector<PersonId> children;
+    for (const ChildLink& link : links) {
+        if (link.child != 0) children.push_back(link.child);
+    }
+    return children;
+}
+
+void holdEqualRelatives(const GedcomData& data, const GedcomData& again) {
+    HOLDS(again.personCount() == data.personCount() && again.familyCount() == data.familyCount());
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        const Person& person = data.person(id);
+        const Person& same = again.person(id);
+        HOLDS(same.sex == person.sex && same.father == person.father && same.mother == person.mother);
+        HOLDS(std::ranges::equal(data.spouses(id), again.spouses(id)));
+        HOLDS(std::ranges::equal(data.children(id), again.children(id)));
+        HOLDS(familiesOf(data.coupleLinks(id)) == familiesOf(again.coupleLinks(id)));
+    }
+    for (FamilyId id = 1; id <= data.familyCount(); ++id) {
+        const Family& family = data.family(id);
+        const Family& same = again.family(id);
+        HOLDS(same.husband == family.husband && same.wife == family.wife);
+        HOLDS(childrenOf(data.childLinks(id)) == childrenOf(again.childLinks(id)));
+    }
+}
+
+void holdEqualFacts(const GedcomData& data, const GedcomData& again) {
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        const Person& person = data.person(id);
+        const Person& same = again.person(id);
+        HOLDS(same.dead == person.dead);
+        HOLDS(areEqual(person.birth, same.birth) && areEqual(person.death, same.death));
+        HOLDS(allEqual(data.factsOfPerson(id), again.factsOfPerson(id)));
+    }
+    for (FamilyId id = 1; id <= data.familyCount(); ++id) {
+        const Family& family = data.family(id);
+        const Family& same = again.family(id);
+        HOLDS(same.married == family.married && same.divorced == family.divorced);
+        HOLDS(areEqual(family.marriage, same.marriage));
+        HOLDS(allEqual(data.factsOfFamily(id), again.factsOfFamily(id)));
+    }
+}
+
+GedcomData writtenAndRead(const GedcomData& data, const WriteOptions& options) {
+    const std::string text = writeGedcom(data, options);
+    HOLDS(isUtf8(text));
+    ReadOptions reading;
+    reading.facts = true;
+    GedcomData again = readGedcomBytes(text, "written", reading);
+    const bool wasSound = data.diagnostics().empty();
+    for (const Diagnostic& diagnostic : again.diagnostics())
+        HOLDS(!wasSound || diagnostic.severity != Severity::error);
+    return again;
+}
+
+void writeAll(const GedcomData& data, bool withFacts) {
+    const GedcomData again = writtenAndRead(data, {});
+    holdEqualRelatives(data, again);
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        HOLDS(allEqual(data.names(id), again.names(id)));
+        HOLDS(familiesOf(data.parentLinks(id)) == familiesOf(again.parentLinks(id)));
+    }
+    if (withFacts) holdEqualFacts(data, again);
+}
+
+bool isLetter(char c) {
+    return isCapital(c) || (c >= 'a' && c <= 'z');
+}
+
+bool isWordByte(char c) {
+    return isLetter(c) || (c >= '0' && c <= '9') || static_cast<unsigned char>(c) >= 0x80;
+}
+
+// A name that is one word of two letters or more, in the alphabet that any reader can compare.
+bool isPlainWord(std::string_view name) {
+    return name.size() > 1 && std::all_of(name.begin(), name.end(), isLetter);
+}
+
+std::string smallLetters(std::string_view text) {
+    std::string small(text);
+    for (char& c : small) {
+        if (isCapital(c)) c = static_cast<char>(c - 'A' + 'a');
+    }
+    return small;
+}
+
+bool holdsWord(std::string_view text, std::string_view word) {
+    for (std::size_t at = text.find(word); at != std::string_view::npos; at = text.find(word, at + 1)) {
+        const std::size_t end = at + word.size();
+        if ((at == 0 || !isWordByte(text[at - 1])) && (end == text.size() || !isWordByte(text[end])))
+            return true;
+    }
+    return false;
+}
+
+void holdNotNamedIn(std::span<const Fact> facts, const PersonName& name) {
+    const std::string given = smallLetters(name.given);
+    const std::string surname = smallLetters(name.surname);
+    for (const Fact& fact : facts) {
+        for (const std::string_view told : {fact.value, fact.place, fact.date.written}) {
+            const std::string text = smallLetters(told);
+            HOLDS(given == surname || !holdsWord(text, given) || !holdsWord(text, surname));
+        }
+    }
+}
+
+void holdNamedNowhere(const GedcomData& again, const PersonName& name) {
+    if (!isPlainWord(name.given) || !isPlainWord(name.surname)) return;
+    for (PersonId id = 1; id <= again.personCount(); ++id) holdNotNamedIn(again.factsOfPerson(id), name);
+    for (FamilyId id = 1; id <= again.familyCount(); ++id) holdNotNamedIn(again.factsOfFamily(id), name);
+}
+
+void holdHidden(const GedcomData& data, const GedcomData& again, const std::vector<bool>& hidden) {
+    std::size_t sought = 0;
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        if (!hidden[id - 1]) {
+            HOLDS(allEqual(data.names(id), again.names(id)));
+            continue;
+        }
+        HOLDS(again.names(id).size() == 1 && again.firstName(id).written == kHiddenName);
+        HOLDS(again.factsOfPerson(id).empty() && !again.person(id).dead);
+        HOLDS(!again.person(id).birth.isGiven() && !again.person(id).death.isGiven());
+        if (++sought <= kSoughtPersons) holdNamedNowhere(again, data.firstName(id));
+    }
+    for (FamilyId id = 1; id <= data.familyCount(); ++id) {
+        const Family& family = data.family(id);
+        const bool isHidden = (family.husband != 0 && hidden[family.husband - 1]) ||
+                              (family.wife != 0 && hidden[family.wife - 1]);
+        HOLDS(!isHidden || again.factsOfFamily(id).empty());
+    }
+}
+
+// Every so many-th person, the first one included.
+void writeHidden(const GedcomData& data, std::size_t step) {
+    WriteOptions options;
+    options.hiddenName = kHiddenName;
+    for (std::size_t i = 0; i < data.personCount(); ++i) options.hidden.push_back(i % step == 0);
+    const GedcomData again = writtenAndRead(data, options);
+    holdEqualRelatives(data, again);
+    holdHidden(data, again, options.hidden);
+}
+
+std::int64_t asAnswer(PersonId id) {
+    return id == 0 ? OlvaneViewerManagerWrapProtocol::kPersonNotFound : std::int64_t{id};
+}
+
+// The questions of a layout, as a layout asks them.
+void lookAtSource(const GedcomData& data) {
+    GedcomDataSource source(data);
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        const Person& person = data.person(id);
+        HOLDS(source.fatherForPersonWithID(id) == asAnswer(person.father));
+        HOLDS(source.motherForPersonWithID(id) == asAnswer(person.mother));
+        HOLDS(std::ranges::equal(source.spousesForPersonWithID(id), data.spouses(id)));
+        HOLDS(std::ranges::equal(source.childrenForPersonWithID(id), data.children(id)));
+        for (const PersonId spouse : data.spouses(id)) {
+            HOLDS(source.isPreferredSpouse(id, spouse) == (spouse == data.spouses(id).front()));
+        }
+        HOLDS(source.isPersonDead(id) == person.dead);
+        HOLDS(source.dateForPersonWithID(id, true) == sortText(person.birth));
+        HOLDS(source.dateForPersonWithID(id, false) == sortText(person.death));
+        HOLDS(source.sexOfPersonWithID(id) == static_cast<std::int32_t>(person.sex));
+    }
+}
+
+// Whether it ends is a matter of how many relatives there are, a father and a mother for everybody included.
+void lookAtLimit(const GedcomData& data) {
+    GedcomDataSource source(data);
+    LimitedDataSource limited(source, kMostRelatives);
+    std::size_t asked = 0;
+    try {
+        for (PersonId id = 1; id <= data.personCount(); ++id) {
+            asked += 2 + data.spouses(id).size();
+            HOLDS(limited.fatherForPersonWithID(id) == asAnswer(data.person(id).father));
+            HOLDS(limited.motherForPersonWithID(id) == asAnswer(data.person(id).mother));
+            HOLDS(std::ranges::equal(limited.spousesForPersonWithID(id), data.spouses(id)));
+            asked += data.children(id).size();
+            HOLDS(std::ranges::equal(limited.childrenForPersonWithID(id), data.children(id)));
+        }
+        HOLDS(asked <= kMostRelatives);
+    } catch (const std::length_error&) {
+        HOLDS(asked > kMostRelatives);
+    }
 }
 
 void readAsDate(std::string_view bytes) {
@@ -153,8 +399,17 @@ void readAsDate(std::string_view bytes) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
     const std::string text(reinterpret_cast<const char*>(bytes), size);
     readAsDate(text);
+    // Three sizes in four read facts; of these, seven in eight hide every person, every second one, and so on.
+    ReadOptions options;
+    options.facts = size % 4 != 0;
+    const std::size_t hiddenStep = size / 4 % 8;
     try {
-        lookAtAll(readGedcomBytes(text, "f"));
+        const GedcomData data = readGedcomBytes(text, "f", options);
+        lookAtAll(data);
+        lookAtSource(data);
+        lookAtLimit(data);
+        writeAll(data, options.facts);
+        if (options.facts && hiddenStep != 0) writeHidden(data, hiddenStep);
     } catch (const GedcomError& error) {
         HOLDS(isOneLine(error.what()));
     }
