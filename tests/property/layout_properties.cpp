@@ -17,6 +17,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 #include <memory>
 #include <regex>
 #include <set>
@@ -92,6 +93,18 @@ RC_GTEST_PROP(LayoutProperties, engineAndPlainLayoutAgreeToTheLastBitAndCall, ()
     const CaseFile request = drawCase(property::anyRequest(kMostPersons));
     RC_ASSERT(support::joinLines(support::runCase(request, true, true)) ==
               plain::layOut(request, true, true).text());
+}
+
+// Where sizes are no measures, neither are the places; but what is written of them is settled all the same.
+RC_GTEST_PROP(LayoutProperties, engineAndPlainLayoutAgreeOverASizeWithoutEnd, ()) {
+    CaseFile request = drawCase(property::anyRequest(kMostPersons));
+    constexpr float kEndless = std::numeric_limits<float>::infinity();
+    float support::CaseSize::*const size = *rc::gen::element(
+        &support::CaseSize::nodeWidth, &support::CaseSize::nodeHeight, &support::CaseSize::horzPadding,
+        &support::CaseSize::vertPadding, &support::CaseSize::spouseLineStep);
+    request.size.*size = *rc::gen::element(kEndless, -kEndless);
+    RC_ASSERT(support::joinLines(support::runCase(request, false, true)) ==
+              plain::layOut(request, false, true).text());
 }
 
 RC_GTEST_PROP(LayoutProperties, caseFrameAndEntryCallGiveOneText, ()) {

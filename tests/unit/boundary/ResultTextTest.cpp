@@ -201,6 +201,11 @@ TEST_F(ResultText, firstPersonSetsAllFourBounds) {
     expectBounds(bounds, -12, 110, -12, 110);
 }
 
+TEST_F(ResultText, firstPersonAboveTheOriginSetsAllFourBounds) {
+    writeAt("17", 12.5f, -110.0f);
+    expectBounds(bounds, 12, -110, 12, -110);
+}
+
 TEST_F(ResultText, boundsGrowWithEachPerson) {
     writeAt("17", 10.0f, 20.0f);
     expectBounds(bounds, 10, 20, 10, 20);
