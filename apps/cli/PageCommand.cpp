@@ -48,7 +48,7 @@ std::string withoutEnding(const std::string& name) {
 // No word of any language: the page speaks its reader's own.
 std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus,
                     const gedcom::WriteOptions& hiding) {
-    const std::string fileTitle = withoutEnding(fileNameOf(data.file()));
+    std::string fileTitle = withoutEnding(fileNameOf(data.file()));
     if (focus == 0 || (!hiding.hidden.empty() && hiding.hidden[focus - 1])) return fileTitle;
     const std::string name = gedcom::displayName(data.firstName(focus));
     return name.empty() ? fileTitle : name;
