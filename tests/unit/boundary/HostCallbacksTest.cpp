@@ -204,6 +204,15 @@ TEST(ChildrenOfAPerson, personWithoutAnyLeavesTheSetAsItCame) {
     EXPECT_EQ((Calls{"childrenForPersonWithID 17"}), request.newCalls());
 }
 
+// The keys say 7 before 3; the record without a place is compared by id text. It stands between them, since each
+// child looks for its place from the top.
+TEST(ChildrenOfAPerson, eachFindsItsOwnPlaceAmongRecordsThatHaveNone) {
+    Request request(family("17: 7 3"));
+    ChildrenSet set{ChildrenAdapter(99, "", "5")};
+    request.callbacks.getChildren(request.key(17), set);
+    EXPECT_EQ((Texts{"3", "5", "7"}), idTexts(set));
+}
+
 TEST(ChildrenOfAnAddNode, isTheOnePersonForWhomItStandsWithoutPlaceAndDate) {
     CaseFile told = family("17");
     told.births[17] = "1850";

@@ -88,6 +88,12 @@ TEST(DateToText, dateThatBeginsWithAZeroByteIsEmpty) {
                                              5)));
 }
 
+TEST(DateToText, zeroByteBehindTheFirstCharacterIsNoPartOfIt) {
+    EXPECT_EQ("1", stringToString(std::string("1\0"
+                                              "850",
+                                              5)));
+}
+
 TEST(DateToText, utf8DateKeepsItsFirstCharacterWhole) {
     EXPECT_EQ("\xC3\xA9", stringToString("\xC3\xA9t\xC3\xA9 1850"));
     EXPECT_EQ("\xE5\xB9\xB4", stringToString("\xE5\xB9\xB4"
