@@ -1,0 +1,128 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <span>
+#include <string>
+#include <vector>
+
+#include <olvane/kin/KinGraph.h>
+
+namespace olvane::picture {
+
+// A place in one of the lists of a Picture; kNone where there is nothing.
+using Index = std::int32_t;
+constexpr Index kNone = -1;
+
+enum class BoxKind : std::uint8_t { person, unknownParent };
+
+// One box. In a round chart its place is that of `arcs`, and x, y, width and height are those of the smallest
+// upright rectangle around it.
+//
+// Units: points; x grows right, y grows down, (x, y) is the upper-left corner.
+// Holds: id is 0 for an unknown parent, and childOf is then the box whose parent it is. repeat is 0 for a
+//        person with one box; else it counts the person's boxes from 1, the nearest to the focus first.
+struct Box {
+    std::int64_t id = 0;
+    double x = 0;
+    double y = 0;
+    float width = 0;
+    float height = 0;
+    Index childOf = kNone;
+    std::int32_t repeat = 0;
+    // Relatives without a box.
+    std::int32_t hiddenParents = 0;
+    std::int32_t hiddenPartners = 0;
+    std::int32_t hiddenChildren = 0;
+    BoxKind kind = BoxKind::person;
+    kin::Sex sex = kin::Sex::unknown;
+    bool hasFlag = false;  // the view is one of the engine's, and flag is its own
+    bool flag = false;
+};
+
+// A box of a round chart: a piece of a ring, clockwise from the top, in degrees. Ring 0 is the middle.
+struct Arc {
+    std::int32_t ring = 0;
+    double from = 0;
+    double to = 0;
+};
+
+enum class LineRole : std::uint8_t { marriage, drop, bar, stem, link };
+
+// A straight piece of the lines of a family: horizontal or vertical, save in round charts.
+//
+// Units: points. bridges are places along the piece, from (x1, y1), in Picture::bridges: there it jumps over
+//        another family's line.
+struct Line {
+    double x1 = 0;
+    double y1 = 0;
+    double x2 = 0;
+    double y2 = 0;
+    Index child = kNone;  // the box of the child that the piece belongs to alone
+    std::uint32_t firstBridge = 0;
+    std::uint16_t bridgeCount = 0;
+    LineRole role = LineRole::link;
+};
+
+// A family of which two members are shown.
+//
+// Holds: parents are one or two boxes, father or husband first; members lie in Picture::members, parents, then
+//        children, and childKinds beside them; lines in Picture::lines. number is the data source's own number
+//        of the family, 0 without one.
+struct Family {
+    std::uint32_t firstMember = 0;
+    std::uint32_t firstLine = 0;
+    std::uint32_t childCount = 0;
+    std::uint32_t lineCount = 0;
+    std::uint32_t number = 0;
+    std::uint8_t parentCount = 0;
+    kin::UnionState style = kin::UnionState::unknown;
+};
+
+enum class MarkKind : std::uint8_t { samePerson, parentsElsewhere, partnersElsewhere };
+
+// What is expressed without a line. samePerson: two boxes of one person; parentsElsewhere: a child and the one
+// or two parents whose family is drawn elsewhere; partnersElsewhere: two partners.
+// Marks of the same number, from 1, are shown by the same sign at each of their boxes.
+struct Mark {
+    Index boxes[3] = {kNone, kNone, kNone};
+    std::int32_t number = 0;
+    MarkKind kind = MarkKind::samePerson;
+};
+
+// What is drawn, as data: boxes, families and the lines of each family. Every view ends in one.
+//
+// Holds: places are valid; boxes stand in a stable order; a family's members, kinds and lines lie side by
+//        side. A value: copies are deep.
+struct Picture {
+    std::string view;
+    Index focus = kNone;
+    std::vector<Box> boxes;
+    std::vector<Arc> arcs;  // one for each box of a round chart, else empty
+    std::vector<Family> families;
+    std::vector<Index> members;
+    std::vector<kin::ChildKind> childKinds;  // beside members; of no meaning at a parent
+    std::vector<Line> lines;
+    std::vector<float> bridges;
+    std::vector<Mark> marks;
+
+    bool isRound() const { return !arcs.empty(); }
+    std::span<const Index> parents(const Family& f) const {
+        return {members.data() + f.firstMember, f.parentCount};
+    }
+    std::span<const Index> children(const Family& f) const {
+        return {members.data() + f.firstMember + f.parentCount, f.childCount};
+    }
+    std::span<const kin::ChildKind> kinds(const Family& f) const {
+        return {childKinds.data() + f.firstMember + f.parentCount, f.childCount};
+    }
+    std::span<const Line> linesOf(const Family& f) const { return {lines.data() + f.firstLine, f.lineCount}; }
+    std::span<const float> bridgesOf(const Line& line) const {
+        return {bridges.data() + line.firstBridge, line.bridgeCount};
+    }
+};
+
+}  // namespace olvane::picture
