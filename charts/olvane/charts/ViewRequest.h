@@ -4,6 +4,9 @@
 #pragma once
 
 #include <cstdint>
+#include <span>
+
+#include <olvane/kin/KinGraph.h>
 
 namespace olvane::charts {
 
@@ -20,16 +23,55 @@ enum class View : std::uint8_t {
     everybody
 };
 
-// Where the generations after the first one stand: descendants below, above, to the left or to the right.
+// Where later generations stand, seen from earlier ones: below, above, to the left or to the right.
 enum class Direction : std::uint8_t { down, up, left, right };
 
-// The size of a box and the least gaps around it, in points. across is along a generation, along is from one
-// generation to the next.
+// The size of a box and the least gaps around it, in points. gapX lies between neighbours of one generation and
+// gapY between generations, whichever way the chart runs.
 struct ChartSizes {
     float boxWidth = 55;
     float boxHeight = 80;
     float gapX = 25;
     float gapY = 30;
+};
+
+// The size of one person's box, in points, as it stands on paper: not turned when the chart runs sideways.
+struct BoxSize {
+    float width = 0;
+    float height = 0;
+};
+
+// Whom a fan shows around its middle.
+enum class FanOf : std::uint8_t { ancestors, descendants };
+
+// Which ways between two persons the kinship view draws.
+enum class WayChoice : std::uint8_t { blood, marriage, both };
+
+// What chart to make. A view ignores the options that it has no use for.
+//
+// Holds: numbers of generations count from the focus, and 0 means all of them. boxSizes is empty, or has one
+//        size for each person of the graph by place; it is read during the call only.
+struct ChartRequest {
+    View view = View::descendants;
+    kin::Place focus = 0;
+    kin::Place to = kin::kNobody;  // kinship: the other person
+    int up = 0;                    // generations of ancestors
+    int down = 0;                  // generations of descendants; relatives: below the focus's own generation
+    Direction direction = Direction::down;
+    ChartSizes sizes;
+    std::span<const BoxSize> boxSizes;
+    bool spouses = true;    // descendants, hourglass, relatives, fan of descendants
+    bool siblings = false;  // ancestors, hourglass: the siblings of the focus and of its ancestors
+    bool compact = false;   // generations packed tighter, where the boxes allow it
+
+    FanOf fanOf = FanOf::ancestors;
+    double fanAngle = 360;  // degrees, 90 to 360
+
+    WayChoice ways = WayChoice::both;
+    int mostWays = 8;  // kinship: no more ways than this are drawn, the nearest first; 0 means all
+
+    int mostMarks = -1;  // everybody: how many second parent links may become marks; -1 for as many as serve
+    int effort = 1;      // everybody: 0 is quickest, each step more takes about twice the time
 };
 
 }  // namespace olvane::charts

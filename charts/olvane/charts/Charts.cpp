@@ -1,0 +1,68 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/charts/Charts.h>
+
+#include <cmath>
+#include <stdexcept>
+#include <string>
+
+namespace olvane::charts {
+
+namespace {
+
+void checkPerson(const kin::KinGraph& graph, kin::Place person) {
+    if (person < 0 || person >= graph.personCount()) throw std::out_of_range("no such person");
+}
+
+bool isLength(float value) {
+    return std::isfinite(value) && value >= 0;
+}
+
+void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
+    const ChartSizes& sizes = request.sizes;
+    bool good =
+        isLength(sizes.boxWidth) && isLength(sizes.boxHeight) && isLength(sizes.gapX) && isLength(sizes.gapY);
+    for (const BoxSize& size : request.boxSizes) good = good && isLength(size.width) && isLength(size.height);
+    if (!good) throw std::invalid_argument("sizes of boxes and gaps must be finite and not negative");
+    if (!request.boxSizes.empty() &&
+        request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
+        throw std::invalid_argument("there must be one box size for each person");
+    }
+}
+
+}  // namespace
+
+const char* nameOf(View view) {
+    switch (view) {
+        case View::family:
+            return "family";
+        case View::pedigree:
+            return "pedigree";
+        case View::near:
+            return "near";
+        case View::ancestors:
+            return "ancestors";
+        case View::descendants:
+            return "descendants";
+        case View::hourglass:
+            return "hourglass";
+        case View::relatives:
+            return "relatives";
+        case View::fan:
+            return "fan";
+        case View::kinship:
+            return "kinship";
+        case View::everybody:
+            return "everybody";
+    }
+    return "";
+}
+
+picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request) {
+    checkPerson(graph, request.focus);
+    checkSizes(graph, request);
+    throw std::invalid_argument(std::string("no chart is made of the view ") + nameOf(request.view));
+}
+
+}  // namespace olvane::charts
