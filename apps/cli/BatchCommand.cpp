@@ -19,6 +19,7 @@
 #include <olvane/gedcom/PersonSearch.h>
 
 #include <cli/FileReading.h>
+#include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
@@ -165,6 +166,10 @@ BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const
 }  // namespace
 
 int runBatch(const BatchOptions& options) {
+    if (options.file == kStandardInput && options.focusFrom == kStandardInput) {
+        throw UsageError(
+            "the standard input cannot hold both the family and the focuses; name a file for one");
+    }
     const gedcom::GedcomData data = readFile(options.file);
     FocusList focuses(data, options.focusFrom);
     const ProgressBar progress(focuses.total());

@@ -15,6 +15,7 @@
 #include <olvane/family/FamilyOptions.h>
 
 #include <cli/Commands.h>
+#include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/UsageError.h>
 
@@ -48,7 +49,9 @@ const std::vector<FamilySwitch>& familySwitches() {
 }
 
 void addFile(CLI::App& command, std::string& file) {
-    command.add_option("FILE", file, "GEDCOM file: .ged, or a .gdz archive")->required()->type_name("");
+    command.add_option("FILE", file, "GEDCOM file: .ged, or a .gdz archive; - for the standard input")
+        ->required()
+        ->type_name("");
 }
 
 void addFocus(CLI::App& command, std::string& focus) {
@@ -284,8 +287,10 @@ private:
         page_ = app_.add_subcommand("page",
                                     "Write a page to explore the family in any browser, without a network");
         page_
-            ->add_option("FILE", pageOptions_.file,
-                         "GEDCOM file: .ged, or a .gdz archive; without one the page asks for it when opened")
+            ->add_option(
+                "FILE", pageOptions_.file,
+                "GEDCOM file: .ged, or a .gdz archive; - for the standard input. Without one the page asks "
+                "for it when opened")
             ->type_name("");
         page_->add_option("-o,--output", pageOptions_.output, "Page to write; - for the standard output")
             ->required()
@@ -353,10 +358,25 @@ private:
     PageOptions pageOptions_;
 };
 
+// The files that the words of a command line may name for reading.
+std::vector<std::string> wordsThatMayBeInput(int argc, char** argv) {
+    std::vector<std::string> words;
+    for (int i = 1; i < argc; ++i) {
+        const std::string word = argv[i];
+        const bool namesOutput = word == "-o" || word == "--output";
+        if (namesOutput) ++i;
+        if (namesOutput || word.starts_with("-o")) continue;
+        const std::size_t value = word.starts_with("--") ? word.find('=') + 1 : 0;
+        if (!word.starts_with("--output=")) words.push_back(word.substr(value));
+    }
+    return words;
+}
+
 }  // namespace
 
 int runCommand(int argc, char** argv) {
     try {
+        refuseStreamsIntoInputs(InputFiles(wordsThatMayBeInput(argc, argv)));
         return CommandLine().run(argc, argv);
     } catch (const UsageError& error) {
         tell(error.what());

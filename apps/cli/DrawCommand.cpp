@@ -49,6 +49,18 @@ Form formOf(const std::string& output) {
     throw UsageError(output + ": pictures are written as .svg, .png or .pdf");
 }
 
+const char* endingOf(Form form) {
+    switch (form) {
+        case Form::png:
+            return ".png";
+        case Form::pdf:
+            return ".pdf";
+        case Form::svg:
+            break;
+    }
+    return ".svg";
+}
+
 draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::DrawingContent& content) {
     const TreeSize size = sizeOf(options.request.boxes);
     const bool isPedigree = options.request.view == View::pedigree;
@@ -94,12 +106,14 @@ std::string contentOfSheet(const std::string& path, Form form, const draw::SvgPi
 }
 
 // All of them or none: half a wall of sheets is of no use.
-void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets) {
+void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets,
+                 const OutputRules& rules) {
     const double scale = options.page.empty() ? 1 : kSheetPngScale;
     if (sheets.size() == 1) {
-        return writeOutput(options.output, contentOfSheet(options.output, form, sheets.front(), scale));
+        return writeOutput(options.output, contentOfSheet(options.output, form, sheets.front(), scale),
+                           rules);
     }
-    OutputSet set;
+    OutputSet set(rules);
     for (std::size_t i = 0; i < sheets.size(); ++i) {
         const std::string path = sheetName(options.output, i + 1, sheets.size());
         set.add(path, contentOfSheet(path, form, sheets[i], scale));
@@ -140,6 +154,8 @@ std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::S
 
 int runDraw(const DrawOptions& options) {
     const Form form = formOf(options.output);
+    const OutputRules rules{InputFiles({options.file}), {endingOf(form)}};
+    checkOutput(options.output, rules);
     const gedcom::GedcomData data = readFile(options.file);
     const draw::DrawingContent content = contentOf(data, options);
     const draw::DrawingOptions drawing = drawingOptions(options, content);
@@ -149,9 +165,9 @@ int runDraw(const DrawOptions& options) {
                          " sheets; name a file for them");
     }
     if (form == Form::pdf) {
-        writeOutput(options.output, pdfOf(sheets, drawing.title));
+        writeOutput(options.output, pdfOf(sheets, drawing.title), rules);
     } else {
-        writeSheets(options, form, sheets);
+        writeSheets(options, form, sheets, rules);
     }
     return 0;
 }

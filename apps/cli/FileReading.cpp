@@ -5,11 +5,16 @@
 
 #include <cli/FileReading.h>
 
+#include <algorithm>
 #include <array>
+#include <cerrno>
 #include <cstddef>
+#include <cstdio>
+#include <cstring>
 
 #include <olvane/gedcom/GedcomReader.h>
 
+#include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/UsageError.h>
 
@@ -17,7 +22,8 @@ namespace olvane::cli {
 
 namespace {
 
-constexpr std::size_t kPerKind = 10;     // told on stderr
+const char* const kStandardInputName = "standard input";  // in messages
+constexpr std::size_t kPerKind = 10;                      // told on stderr
 constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are told as a number, for memory's sake
 
 // The first of each kind, and how many were kept back. Notes are for those who ask.
@@ -36,8 +42,30 @@ void report(const gedcom::GedcomData& data) {
         }
     }
     if (keptBack == 0) return;
-    tell(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) +
-         " more; 'olvane check " + data.file() + "' tells them all");
+    const std::string command =
+        data.file() == kStandardInputName ? "olvane check" : "olvane check " + data.file();
+    tell(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) + " more; '" +
+         command + "' lists them all");
+}
+
+std::string readStandardInput() {
+    constexpr std::size_t kBlock = 64 * 1024;
+    std::string bytes;
+    for (std::size_t got = 1; got != 0;) {
+        const std::size_t filled = bytes.size();
+        bytes.resize(filled + std::max(filled, kBlock));
+        got = std::fread(bytes.data() + filled, 1, bytes.size() - filled, stdin);
+        bytes.resize(filled + got);
+    }
+    if (std::ferror(stdin) != 0) {
+        throw gedcom::GedcomError(kStandardInputName, std::string("cannot be read: ") + std::strerror(errno));
+    }
+    return bytes;
+}
+
+gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions& options) {
+    if (path != kStandardInput) return gedcom::readGedcomFile(path, options);
+    return gedcom::readGedcomBytes(readStandardInput(), kStandardInputName, options);
 }
 
 gedcom::GedcomData read(const std::string& path, bool facts = false) {
@@ -45,7 +73,7 @@ gedcom::GedcomData read(const std::string& path, bool facts = false) {
     options.diagnosticsPerKind = kCounted;
     options.facts = facts;
     try {
-        return gedcom::readGedcomFile(path, options);
+        return readSource(path, options);
     } catch (const gedcom::GedcomError& error) {
         throw UsageError(std::string(error.what()) + " (a GEDCOM file is needed, .ged or .gdz)");
     }

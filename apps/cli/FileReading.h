@@ -9,7 +9,7 @@
 
 namespace olvane::cli {
 
-// Reads a GEDCOM file and reports on stderr, by file and line, what was wrong in it: errors and warnings, but
+// Reads a GEDCOM file, or the standard input where the path is "-", and reports on stderr, by file and line, what was wrong in it: errors and warnings, but
 // not notes, at most ten of a kind, and how many more there are.
 // Fails: throws UsageError with a hint where there is nothing to read.
 gedcom::GedcomData readFile(const std::string& path);

@@ -1,18 +1,23 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Output that is whole or not there.
+// Output that is whole or not there, and never in the place of anything but an earlier output.
 
 #include <cli/OutputFile.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
 #include <filesystem>
 #include <system_error>
+#include <utility>
 
+#include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
+#include <cli/TemporaryFile.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -25,86 +30,105 @@ namespace {
     throw UsageError(path + ": cannot be written: " + std::strerror(error));
 }
 
-void writeStraight(const std::string& shownPath, const std::string& path, std::string_view content) {
-    std::FILE* file = std::fopen(path.c_str(), "wb");
-    if (file == nullptr) refuse(shownPath, errno);
-    const bool written = std::fwrite(content.data(), 1, content.size(), file) == content.size();
-    const int writeError = errno;
-    const bool closed = std::fclose(file) == 0;
-    if (!written) refuse(shownPath, writeError);
-    if (!closed) refuse(shownPath, errno);
+// Into a character device or pipe, which has nothing to lose.
+void writeStraight(const std::string& path, std::string_view content) {
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CLOEXEC);
+    if (descriptor < 0) refuse(path, errno);
+    int error = 0;
+    try {
+        writeFully(descriptor, content);
+    } catch (const std::system_error& failure) {
+        error = failure.code().value();
+    }
+    if (::close(descriptor) != 0 && error == 0) error = errno;
+    if (error != 0) refuse(path, error);
 }
 
-bool isSpecial(const fs::path& path) {
-    std::error_code ignored;
-    const fs::file_status status = fs::status(path, ignored);
-    return fs::exists(status) && !fs::is_regular_file(status) && !fs::is_directory(status);
+bool isStream(const std::string& path) {
+    struct stat status = {};
+    return ::stat(path.c_str(), &status) == 0 && (S_ISCHR(status.st_mode) || S_ISFIFO(status.st_mode));
 }
 
-// Where a link leads to, so that the link stays.
-fs::path withoutLinks(const fs::path& path) {
+// Where a link leads to, so that the link stays; also where nothing is there yet.
+fs::path withoutLinks(fs::path path) {
+    constexpr int kMostLinks = 40;  // as the system's own
     std::error_code error;
-    const fs::path target = fs::canonical(path, error);
-    return error ? path : target;
+    const fs::path existing = fs::canonical(path, error);
+    if (!error) return existing;
+    for (int i = 0; i < kMostLinks && fs::is_symlink(fs::symlink_status(path, error)); ++i) {
+        const fs::path target = fs::read_symlink(path, error);
+        path = target.is_absolute() ? target : path.parent_path() / target;
+    }
+    return path;
+}
+
+bool hasEnding(const fs::path& path, const std::vector<std::string>& endings) {
+    std::string name = path.filename().string();
+    for (char& c : name) {
+        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+    }
+    return std::any_of(endings.begin(), endings.end(), [&name](const std::string& ending) {
+        return name.size() > ending.size() && name.ends_with(ending);
+    });
+}
+
+std::string joined(const std::vector<std::string>& endings) {
+    std::string text;
+    for (const std::string& ending : endings) text += (text.empty() ? "" : " or ") + ending;
+    return text;
+}
+
+void checkRegularFile(const std::string& path, const OutputRules& rules) {
+    if (rules.inputs.hasPath(path)) {
+        throw UsageError(path + ": is the input file, which is never written to; name another file");
+    }
+    const fs::path place = withoutLinks(path);
+    if (!hasEnding(path, rules.endings) || !hasEnding(place, rules.endings)) {
+        throw UsageError(path + ": is there already and is not replaced, since its name does not end in " +
+                         joined(rules.endings) + "; name another file");
+    }
+    if (::faccessat(AT_FDCWD, place.c_str(), W_OK, AT_EACCESS) != 0) refuse(path, errno);
 }
 
 }  // namespace
 
-// Removes the file beside the place unless it was moved there.
-class FileBeside {
-public:
-    explicit FileBeside(const fs::path& place) : place_(place), path_(place) {
-        path_ += ".part" + std::to_string(::getpid());
-    }
-    FileBeside(const FileBeside&) = delete;
-    FileBeside& operator=(const FileBeside&) = delete;
-    ~FileBeside() {
-        std::error_code ignored;
-        if (!moved_) fs::remove(path_, ignored);
-    }
+void checkOutput(const std::string& path, const OutputRules& rules) {
+    if (path == kStandardOutput) return;
+    struct stat status = {};
+    if (::stat(path.c_str(), &status) != 0) return;
+    if (S_ISDIR(status.st_mode)) refuse(path, EISDIR);
+    if (S_ISREG(status.st_mode)) return checkRegularFile(path, rules);
+    if (!isStream(path)) throw UsageError(path + ": is a disk or a socket, and is not written to");
+}
 
-    const fs::path& path() const { return path_; }
-
-    void move(const std::string& shownPath) {
-        std::error_code error;
-        fs::rename(path_, place_, error);
-        if (error) refuse(shownPath, error.value());
-        moved_ = true;
-    }
-
-    void removeMoved() {
-        std::error_code ignored;
-        if (moved_) fs::remove(place_, ignored);
-    }
-
-private:
-    fs::path place_;
-    fs::path path_;
-    bool moved_ = false;
-};
-
-OutputSet::OutputSet() = default;
+OutputSet::OutputSet(OutputRules rules) : rules_(std::move(rules)) {}
 OutputSet::~OutputSet() = default;
 
 void OutputSet::add(const std::string& path, std::string_view content) {
-    if (fs::is_directory(path)) refuse(path, EISDIR);
-    if (isSpecial(path)) return writeStraight(path, path, content);
-    parts_.push_back({path, std::make_unique<FileBeside>(withoutLinks(path))});
-    writeStraight(path, parts_.back().file->path().string(), content);
-}
-
-void OutputSet::finish() {
+    checkOutput(path, rules_);
+    if (isStream(path)) return writeStraight(path, content);
     try {
-        for (const Part& part : parts_) part.file->move(part.shownPath);
-    } catch (...) {
-        for (const Part& part : parts_) part.file->removeMoved();
-        throw;
+        parts_.push_back({path, std::make_unique<TemporaryFile>(withoutLinks(path), content)});
+    } catch (const std::system_error& error) {
+        refuse(path, error.code().value());
     }
 }
 
-void writeOutput(const std::string& path, std::string_view content) {
-    if (path == "-") return writeStandardOutput(content);
-    OutputSet set;
+void OutputSet::finish() {
+    for (const Part& part : parts_) {
+        try {
+            checkOutput(part.shownPath, rules_);
+            part.file->publish();
+        } catch (const std::system_error& error) {
+            refuse(part.shownPath, error.code().value());
+        }
+    }
+    for (const Part& part : parts_) part.file->keep();
+}
+
+void writeOutput(const std::string& path, std::string_view content, const OutputRules& rules) {
+    if (path == kStandardOutput) return writeStandardOutput(content);
+    OutputSet set(rules);
     set.add(path, content);
     set.finish();
 }
@@ -112,10 +136,10 @@ void writeOutput(const std::string& path, std::string_view content) {
 // Past the stream of the C library, which loses its place when a signal breaks into a write.
 void writeStandardOutput(std::string_view content) {
     if (std::fflush(stdout) != 0) refuse("standard output", errno);
-    while (!content.empty()) {
-        const ssize_t written = ::write(STDOUT_FILENO, content.data(), content.size());
-        if (written < 0 && errno != EINTR) refuse("standard output", errno);
-        if (written > 0) content.remove_prefix(static_cast<std::size_t>(written));
+    try {
+        writeFully(STDOUT_FILENO, content);
+    } catch (const std::system_error& error) {
+        refuse("standard output", error.code().value());
     }
 }
 

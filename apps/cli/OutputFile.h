@@ -8,35 +8,56 @@
 #include <string_view>
 #include <vector>
 
+#include <cli/InputFiles.h>
+
 namespace olvane::cli {
 
-// Writes a whole file or nothing: first beside its place, then moved there, so that a failure leaves what was
-// there before. "-" is the standard output; a device or pipe is written straight.
-// Fails: throws UsageError; no partial file is left.
-void writeOutput(const std::string& path, std::string_view content);
+// Output that stands for the standard output on the command line.
+constexpr std::string_view kStandardOutput = "-";
 
-class FileBeside;
+// What an output must not replace.
+struct OutputRules {
+    InputFiles inputs;
+    // In small letters: ".svg". An existing regular file is replaced only if its name ends in one of these,
+    // whatever its capitals; under its own name and under that of a link that leads to it.
+    std::vector<std::string> endings;
+};
 
-// Several files that come about together: each is written beside its place, and finish moves them all.
+// Refuses a place that must not be written: an input file, an existing file of another ending, a directory, a
+// disk, a file that may not be written. Touches nothing. "-" is the standard output and always allowed.
+// Fails: throws UsageError.
+void checkOutput(const std::string& path, const OutputRules& rules);
+
+// Writes a whole file or nothing: first under a name of its own in the same folder, then renamed, so that a failure
+// leaves what was there before. A file that is replaced keeps its permissions and, as far as the system allows,
+// its owner and group; a new one has those that the umask leaves. "-" is the standard output; a character device
+// or pipe is written straight.
+// Fails: throws UsageError, also where checkOutput does; no partial file is left.
+void writeOutput(const std::string& path, std::string_view content, const OutputRules& rules);
+
+class TemporaryFile;
+
+// Several files that come about together: each is written under a temporary name, and finish renames them all.
 //
-// Fails: add and finish throw UsageError. Unless finish has succeeded, none of the files is left behind, and
-//        while only add has failed, what was there before stays.
+// Fails: add and finish throw UsageError. Unless finish has succeeded, none of the new files is left behind, and
+//        files that were there before are as they were.
 class OutputSet {
 public:
-    OutputSet();
+    explicit OutputSet(OutputRules rules);
     OutputSet(const OutputSet&) = delete;
     OutputSet& operator=(const OutputSet&) = delete;
     ~OutputSet();
 
-    // A device or pipe is written straight.
+    // A character device or pipe is written straight.
     void add(const std::string& path, std::string_view content);
     void finish();
 
 private:
     struct Part {
         std::string shownPath;
-        std::unique_ptr<FileBeside> file;
+        std::unique_ptr<TemporaryFile> file;
     };
+    OutputRules rules_;
     std::vector<Part> parts_;
 };
 

@@ -86,10 +86,12 @@ int runPage(const PageOptions& options) {
         throw UsageError(
             "this olvane was built without the page; install emscripten, nodejs and npm, and build it again");
     }
+    const OutputRules rules{InputFiles({options.file}), {".html", ".htm"}};
+    checkOutput(options.output, rules);
     if (options.file.empty()) {
-        writeOutput(options.output, pageTemplate());
+        writeOutput(options.output, pageTemplate(), rules);
     } else {
-        writeOutput(options.output, pageWith(pageTemplate(), familyOf(options)));
+        writeOutput(options.output, pageWith(pageTemplate(), familyOf(options)), rules);
     }
     return 0;
 }
