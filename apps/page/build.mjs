@@ -27,6 +27,8 @@ async function bundledScript() {
         target: ["es2022"],
         charset: "utf8",
         legalComments: "none",
+        // The viewer's style sheets are text in the script; those of the page around it stand in its head.
+        plugins: [styleText],
         // The engine lies in the page, not beside it.
         define: { "import.meta.url": '"data:,"' },
         alias: {
@@ -42,13 +44,23 @@ async function bundledScript() {
     return outputFiles[0].text.trim().replaceAll("</script", "<\\/script");
 }
 
-async function minifiedStyle() {
-    const { code } = await transform(await readFile(here("src/page.css"), "utf8"), {
-        loader: "css",
-        minify: true,
-    });
+async function minifiedStyle(...paths) {
+    const texts = await Promise.all(paths.map((path) => readFile(path, "utf8")));
+    const { code } = await transform(texts.join("\n"), { loader: "css", minify: true });
     return code.trim();
 }
+
+const styleText = {
+    name: "style-text",
+    setup(bundle) {
+        bundle.onLoad({ filter: /\.css$/ }, async ({ path }) => ({
+            contents: await minifiedStyle(path),
+            loader: "text",
+        }));
+    },
+};
+
+const kPageStyles = ["colours", "controls", "shell"].map((name) => here(`src/styles/${name}.css`));
 
 const hashOf = (text) => "'sha256-" + createHash("sha256").update(text).digest("base64") + "'";
 
@@ -65,7 +77,7 @@ function policyOf(script, style) {
     ].join("; ");
 }
 
-const [script, style] = await Promise.all([bundledScript(), minifiedStyle()]);
+const [script, style] = await Promise.all([bundledScript(), minifiedStyle(...kPageStyles)]);
 const engine = gzipSync(await readFile(values.wasm), { level: 9 }).toString("base64");
 const parts = { policy: policyOf(script, style), style, script, engine };
 const template = await readFile(here("src/page.html"), "utf8");

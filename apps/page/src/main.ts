@@ -3,16 +3,19 @@
 
 // Starts the engine, then the page, then the family that came with it.
 
-import { App } from "./App";
+import { html } from "./base/dom";
+import { defineOlvaneTree, OlvaneTree } from "./element/OlvaneTree";
 import { embeddedFamily, startEngine } from "./engine/engine";
 import { uiMessagesFor } from "./messages/ui";
-import { html } from "./ui/dom";
+import { App } from "./shell/App";
 
 async function start(): Promise<void> {
     const root = document.getElementById("app")!;
     const { errors } = uiMessagesFor(navigator.language);
     try {
-        const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
+        defineOlvaneTree();
+        OlvaneTree.engine = startEngine();
+        const [engine, family] = await Promise.all([OlvaneTree.engine, embeddedFamily()]);
         const app = new App(root, engine);
         if (family) app.openEmbedded(family);
     } catch (error) {

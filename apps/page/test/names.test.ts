@@ -4,7 +4,7 @@
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import { english, factLabel, german, messagesFor } from "../src/messages";
-import { dateText, directionOf, nameOf, yearsOf } from "../src/names";
+import { dateText, directionOf, nameOf, yearsOf } from "../src/messages/names";
 import { date, person } from "./families";
 
 test("a date is told as far as it is known", () => {

@@ -68,7 +68,7 @@ describe("accessible", kTwoAtOnce, () => {
         for (let i = 0; i < 60; ++i) {
             await page.keyboard.press("Tab");
             const at = await page.evaluate(() => {
-                const element = document.activeElement;
+                const element = holder();
                 return element.id || element.closest("[data-xref]")?.getAttribute("data-xref") || element.tagName;
             });
             reached.add(at);
@@ -85,12 +85,12 @@ describe("accessible", kTwoAtOnce, () => {
         await page.keyboard.press("Tab");
         await page.keyboard.press("Tab");
         const outline = await page.evaluate(() => {
-            const { outlineStyle, outlineWidth, boxShadow } = getComputedStyle(document.activeElement);
+            const { outlineStyle, outlineWidth, boxShadow } = getComputedStyle(holder());
             return { outline: outlineStyle !== "none" && parseFloat(outlineWidth) > 0, shadow: boxShadow !== "none" };
         });
         assert.ok(outline.outline || outline.shadow);
         const ring = (xref) => page.evaluate((xref) => {
-            const { stroke, opacity, display, visibility } = getComputedStyle(document.querySelector(`#tree [data-xref="${xref}"] .ring`));
+            const { stroke, opacity, display, visibility } = getComputedStyle(one(`#tree [data-xref="${xref}"] .ring`));
             return [stroke, opacity, display, visibility].join();
         }, xref);
         await visit.stand("I1");
@@ -103,8 +103,7 @@ describe("accessible", kTwoAtOnce, () => {
 
     test("a change of the focus is announced", async () => {
         const visit = await visitDarwins();
-        await visit.box("I12").click();
-        await visit.still();
+        await visit.open("I12");
         const live = visit.page.locator("#live");
         assert.equal(await live.getAttribute("aria-live"), "polite");
         assert.match(await live.innerText(), /Robert Waring Darwin.*\d+ boxes/);

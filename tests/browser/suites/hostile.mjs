@@ -28,9 +28,9 @@ describe("hostile", kTwoAtOnce, () => {
         await visit.box("R1").hover({ force: true });
         await page.waitForTimeout(400);
         const after = await page.evaluate(() => ({
-            elements: document.querySelectorAll("script, style, link, iframe, object, img, base, form").length,
-            handlers: [...document.querySelectorAll("*")].filter((one) => one.getAttributeNames().some((name) => name.startsWith("on"))).length,
-            links: [...document.querySelectorAll("[href]")].filter((link) => !/^(#|blob:|data:,$)/.test(link.getAttribute("href"))).length,
+            elements: all("script, style, link, iframe, object, img, base, form").length,
+            handlers: [...all("*")].filter((one) => one.getAttributeNames().some((name) => name.startsWith("on"))).length,
+            links: [...all("[href]")].filter((link) => !/^(#|blob:|data:,$)/.test(link.getAttribute("href"))).length,
             wasRun: window.wasRun ?? null,
             title: document.title,
         }));
@@ -64,9 +64,9 @@ describe("hostile", kTwoAtOnce, () => {
         await visit.still();
         const widths = await page.evaluate(() => ({
             page: document.documentElement.scrollWidth - innerWidth,
-            panel: document.querySelector("#side-panel").scrollWidth - document.querySelector("#side-panel").clientWidth,
-            box: Math.max(...[...document.querySelectorAll('#tree [data-xref="R18"] text')].map((line) => line.getBBox().width)),
-            frame: document.querySelector('#tree [data-xref="R18"] .frame').getBBox().width,
+            panel: one("#side-panel").scrollWidth - one("#side-panel").clientWidth,
+            box: Math.max(...[...all('#tree [data-xref="R18"] text')].map((line) => line.getBBox().width)),
+            frame: one('#tree [data-xref="R18"] .frame').getBBox().width,
         }));
         assert.ok(widths.page <= 0 && widths.panel <= 0, JSON.stringify(widths));
         assert.ok(widths.box <= widths.frame, JSON.stringify(widths));

@@ -12,10 +12,10 @@ const kPhone = { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile
 async function unreachable(visit) {
     return visit.page.evaluate(() => {
         const bad = [];
-        for (const part of document.querySelectorAll(".bar button, .bar input, .zoom button, #legend summary")) {
+        for (const part of all(".bar button, .bar input, .zoom button, #legend summary")) {
             const { left, right, top, bottom, width } = part.getBoundingClientRect();
             if (width === 0 || part.closest("[hidden]")) continue;
-            const over = document.elementFromPoint((left + right) / 2, (top + bottom) / 2);
+            const over = under((left + right) / 2, (top + bottom) / 2);
             const isOutside = left < 0 || top < 0 || right > innerWidth || bottom > innerHeight;
             if (isOutside || (over !== part && !part.contains(over))) bad.push(part.id || part.outerHTML.slice(0, 80));
         }
@@ -44,7 +44,7 @@ describe("looks", kTwoAtOnce, () => {
         await visit.page.focus("#legend ul");
         await visit.press("Escape");
         assert.ok(!(await visit.page.isVisible("#legend ul")));
-        assert.equal(await visit.page.evaluate(() => document.activeElement.tagName), "SUMMARY");
+        assert.equal(await visit.page.evaluate(() => holder().tagName), "SUMMARY");
         await visit.end();
     });
 
@@ -61,14 +61,14 @@ describe("looks", kTwoAtOnce, () => {
         for (const colorScheme of ["light", "dark"]) {
             const visit = await visitDarwins("#person=I1&hide=cousins", { forcedColors: "active", colorScheme });
             const { page } = visit;
-            const fill = (selector) => page.evaluate((one) => getComputedStyle(document.querySelector(one)).backgroundColor, selector);
+            const fill = (selector) => page.evaluate((wanted) => getComputedStyle(one(wanted)).backgroundColor, selector);
             assert.notEqual(await fill("#view-family"), await fill("#view-pedigree"));
             await page.click("#options-button");
             assert.notEqual(await fill("#show-siblings"), await fill("#show-cousins"));
             await page.fill("#search", "emma");
             assert.notEqual(await fill("#found-0"), await fill("#found-1"));
             const [text, paper] = await page.evaluate(() => {
-                const styleOf = (selector) => getComputedStyle(document.querySelector(selector));
+                const styleOf = (selector) => getComputedStyle(one(selector));
                 const canvas = document.createElement("div");
                 canvas.style.cssText = "color: CanvasText; background: Canvas";
                 document.body.append(canvas);
@@ -112,6 +112,12 @@ describe("looks", kTwoAtOnce, () => {
         const father = await visit.middleOf("I12");
         await page.touchscreen.tap(father.x, father.y);
         await visit.still();
+        assert.equal(await visit.focus(), "I1", "a tap selects");
+        assert.equal(await page.innerText("#side-panel h2"), "Robert Waring Darwin");
+        await page.tap("#side-panel .handle");
+        await page.waitForTimeout(400);
+        await page.tap("#make-focus");
+        await visit.still();
         assert.equal(await visit.focus(), "I12");
         await visit.end();
     });
@@ -128,7 +134,7 @@ describe("looks", kTwoAtOnce, () => {
         const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
         const { page } = visit;
         const wears = (theme) => page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
-        const paper = () => page.evaluate(() => getComputedStyle(document.querySelector("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
+        const paper = () => page.evaluate(() => getComputedStyle(one("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
         await wears("dark");
         await visit.stand("I2");
         await photograph(visit, "dark");
@@ -171,10 +177,10 @@ describe("looks", kTwoAtOnce, () => {
         const directions = await page.$$eval('#tree [data-xref="I2"] .name', (lines) => lines.map((line) => line.getAttribute("direction")));
         assert.ok(directions.length > 0 && directions.every((direction) => direction === "rtl"));
         assert.ok((await page.locator('#tree [data-xref="I4"] .name[direction=rtl]').count()) === 0);
-        const panel = await page.evaluate(() => getComputedStyle(document.querySelector("#side-panel h2")).direction);
+        const panel = await page.evaluate(() => getComputedStyle(one("#side-panel h2")).direction);
         assert.equal(panel, "rtl");
         const inside = await page.evaluate(() =>
-            [...document.querySelectorAll("#tree .box")].every((box) => {
+            [...all("#tree .box")].every((box) => {
                 const frame = box.querySelector(".frame").getBoundingClientRect();
                 return [...box.querySelectorAll("text.name, text.years")].every((line) => {
                     const { left, right } = line.getBoundingClientRect();

@@ -121,12 +121,12 @@ describe("opening", kTwoAtOnce, () => {
         assert.match(await visit.page.innerText("#notices"), /holiday\.jpg.*could not be read/);
         assert.ok(await visit.page.isVisible("#choose-file"));
         await visit.drop("empty.ged", "0 HEAD\n0 TRLR\n");
-        await visit.page.waitForFunction(() => /empty\.ged/.test(document.querySelector("#notices").textContent));
+        await visit.page.waitForFunction(() => /empty\.ged/.test(one("#notices").textContent));
         const told = await visit.page.innerText("#notices");
         assert.match(told, /holds no person/);
         assert.doesNotMatch(told, /could not be read|0 HEAD/, "it is GEDCOM, and was read");
         await visit.drop("broken.gdz", Buffer.from("PK\u0003\u0004 not an archive"));
-        await visit.page.waitForFunction(() => /archive/i.test(document.querySelector("#notices").textContent));
+        await visit.page.waitForFunction(() => /archive/i.test(one("#notices").textContent));
         await visit.end();
     });
 
@@ -138,7 +138,7 @@ describe("opening", kTwoAtOnce, () => {
         await visit.page.click("#notices .warned .plain");
         assert.ok(await visit.page.isVisible("#diagnostics"));
         await visit.page.keyboard.press("Escape");
-        assert.equal(await visit.page.evaluate(() => document.activeElement.id), "diagnostics-button");
+        assert.equal(await visit.page.evaluate(() => holder().id), "diagnostics-button");
         await visit.page.click("#diagnostics-button");
         assert.ok(await visit.page.isVisible("#diagnostics"));
         const told = await visit.page.innerText("#diagnostics");
@@ -191,7 +191,7 @@ describe("opening", kTwoAtOnce, () => {
     test("an address is put right that asks for too much, or has other letters", async () => {
         const visit = await visitDarwins("#person=I1");
         await visit.page.evaluate(() => (location.hash = "#person=i5&view=pedigree&generations=99"));
-        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I5");
+        await visit.page.waitForFunction(() => one("#tree .box.focus")?.getAttribute("data-xref") === "I5");
         await visit.still();
         assert.equal(await visit.hash(), "#person=I5&view=pedigree&generations=10");
         await visit.end();
@@ -243,7 +243,7 @@ describe("opening", kTwoAtOnce, () => {
         const here = await visit.focus();
         assert.equal(await visit.hash(), `#person=${here}&view=pedigree`);
         await visit.page.evaluate(() => (location.hash = "#person=NOBODY"));
-        await visit.page.waitForFunction(() => /NOBODY/.test(document.querySelector("#notices").textContent));
+        await visit.page.waitForFunction(() => /NOBODY/.test(one("#notices").textContent));
         await visit.still();
         assert.equal(await visit.focus(), here);
         assert.equal(await visit.hash(), `#person=${here}`);

@@ -63,8 +63,8 @@ describe("saving", kTwoAtOnce, () => {
         await page.emulateMedia({ media: "print" });
         const printed = await page.evaluate(() => {
             dispatchEvent(new Event("beforeprint"));
-            const sheet = document.querySelector("#print-sheet");
-            const shown = [...document.querySelectorAll(".bar, .stage, #side-panel")].filter((part) => part.getClientRects().length > 0);
+            const sheet = one("#print-sheet");
+            const shown = [...all(".bar, .stage, #side-panel")].filter((part) => part.getClientRects().length > 0);
             const answer = {
                 boxes: sheet.querySelectorAll("g[aria-label]").length,
                 paper: sheet.querySelector("svg > rect").getAttribute("fill"),

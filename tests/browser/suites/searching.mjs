@@ -13,7 +13,7 @@ describe("searching", kTwoAtOnce, () => {
     test("words in any order find a person, and Enter leads there", async () => {
         const visit = await visitDarwins();
         await visit.page.keyboard.press("/");
-        assert.equal(await visit.page.evaluate(() => document.activeElement.id), "search");
+        assert.equal(await visit.page.evaluate(() => holder().id), "search");
         await visit.page.keyboard.type("williams ralph");
         assert.deepEqual(await found(visit), ["Ralph Vaughan Williams"]);
         await visit.page.keyboard.press("Enter");
@@ -82,7 +82,7 @@ describe("searching", kTwoAtOnce, () => {
         await visit.page.fill("#search", "emma");
         await visit.page.evaluate(() => {
             const composing = { key: "Enter", isComposing: true, bubbles: true, cancelable: true };
-            document.getElementById("search").dispatchEvent(new KeyboardEvent("keydown", composing));
+            one("#search").dispatchEvent(new KeyboardEvent("keydown", composing));
         });
         await visit.still();
         assert.equal(await visit.focus(), "I1");

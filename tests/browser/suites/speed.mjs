@@ -22,7 +22,8 @@ async function refocusTime(visit, xref) {
     };
     const before = await scripts();
     await visit.page.evaluate((xref) => {
-        document.querySelector(`#tree [data-xref="${xref}"]`).dispatchEvent(new MouseEvent("click", { bubbles: true }));
+        const box = one(`#tree [data-xref="${xref}"]`);
+        for (const detail of [1, 2]) box.dispatchEvent(new MouseEvent("click", { bubbles: true, composed: true, detail }));
     }, xref);
     await visit.page.evaluate(() => new Promise((drawn) => requestAnimationFrame(() => requestAnimationFrame(drawn))));
     return (await scripts()) - before;
@@ -51,7 +52,7 @@ describe("speed", () => {
         const elements = await visit.page.locator("#tree .boxes > g").count();
         assert.ok(elements < 1500, `${elements} elements: only what is in sight`);
         const frames = await visit.page.evaluate(async () => {
-            const tree = document.querySelector("#tree");
+            const tree = one("#tree");
             const frames = [];
             const drag = (type, x) => tree.dispatchEvent(new MouseEvent(type, { bubbles: true, view: window, button: 0, clientX: x, clientY: 300 }));
             drag("mousedown", 600);
@@ -80,7 +81,7 @@ describe("speed", () => {
         await visit.page.evaluate(() => {
             addEventListener("drop", () => (window.droppedAt = performance.now()), true);
             new MutationObserver(() => {
-                if (document.querySelector("#tree .box.focus")) window.readyAt ??= performance.now();
+                if (one("#tree .box.focus")) window.readyAt ??= performance.now();
             }).observe(document.body, { childList: true, subtree: true });
         });
         await visit.drop("royal92.ged", file);
@@ -92,7 +93,7 @@ describe("speed", () => {
         assert.match(await visit.page.innerText("#side-panel h2"), /Victoria/);
         await photograph(visit, "royal");
         const search = await visit.page.evaluate(() => {
-            const input = document.querySelector("#search");
+            const input = one("#search");
             input.value = "george 18";
             const start = performance.now();
             input.dispatchEvent(new Event("input"));
@@ -107,7 +108,7 @@ describe("speed", () => {
         const page = statSync(process.env.OLVANE_PAGE).size;
         const family = gzipSync(sample("darwin-wedgwood.ged")).length * (4 / 3);
         context.diagnostic(`the page without a family: ${(page / 1000).toFixed(0)} kB; with 142 persons: ${((page + family) / 1000).toFixed(0)} kB`);
-        assert.ok(page + family < 300_000, `${page + family} bytes`);
+        assert.ok(page + family < 500_000, `${page + family} bytes`);
         const engine = /<script[^>]*id="olvane-engine"[^>]*>\s*([A-Za-z0-9+/=]+)/.exec(readFileSync(process.env.OLVANE_PAGE, "utf8"))[1];
         context.diagnostic(`the engine, packed: ${((engine.length * 3) / 4000).toFixed(0)} kB`);
         assert.ok((engine.length * 3) / 4 < 150_000);

@@ -9,12 +9,26 @@ import { describe, test } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
 
 describe("walking", kTwoAtOnce, () => {
-    test("a click on a person makes them the focus, of the picture, the address and the panel", async () => {
+    test("a click selects: the panel is about the person, and the picture stays", async () => {
+        const visit = await visitDarwins();
+        await visit.fit();
+        const before = await visit.placing();
+        await visit.box("I34").click();
+        await visit.still();
+        assert.equal(await visit.focus(), "I1");
+        assert.deepEqual(await visit.placing(), before);
+        assert.equal(await visit.page.innerText("#side-panel h2"), "Caroline Sarah Darwin");
+        assert.doesNotMatch(await visit.hash(), /person=I34/);
+        await visit.click("#make-focus");
+        assert.equal(await visit.focus(), "I34");
+        await visit.end();
+    });
+
+    test("a double click on a person makes them the focus, of the picture, the address and the panel", async () => {
         const visit = await visitDarwins();
         assert.equal(await visit.focus(), "I1");
         await visit.fit();
-        await visit.box("I34").click();
-        await visit.still();
+        await visit.open("I34");
         assert.equal(await visit.focus(), "I34");
         assert.match(await visit.hash(), /person=I34/);
         assert.equal(await visit.page.innerText("#side-panel h2"), "Caroline Sarah Darwin");
@@ -79,12 +93,13 @@ describe("walking", kTwoAtOnce, () => {
         // Measured within the page, so that a busy machine changes nothing.
         const glide = await visit.page.evaluate(async () => {
             const placeOf = (xref) => {
-                const { left, top } = document.querySelector(`#tree .boxes > [data-xref="${xref}"] .frame`).getBoundingClientRect();
+                const { left, top } = one(`#tree .boxes > [data-xref="${xref}"] .frame`).getBoundingClientRect();
                 return [left, top];
             };
             const farApart = (one, other) => Math.hypot(one[0] - other[0], one[1] - other[1]);
             const before = placeOf("I12");
-            document.querySelector('#tree [data-xref="I12"] .frame').dispatchEvent(new MouseEvent("click", { bubbles: true }));
+            for (const detail of [1, 2])
+                one('#tree [data-xref="I12"] .frame').dispatchEvent(new MouseEvent("click", { bubbles: true, composed: true, detail }));
             const start = placeOf("I12");
             const mother = [placeOf("I55")];
             for (const began = performance.now(); performance.now() - began < 900; ) {
@@ -111,8 +126,7 @@ describe("walking", kTwoAtOnce, () => {
         const visit = await visitDarwins();
         assert.ok(await visit.page.isDisabled("#back"));
         await visit.fit();
-        await visit.box("I34").click();
-        await visit.still();
+        await visit.open("I34");
         await visit.click("#view-pedigree");
         assert.equal(await visit.page.locator("#view-pedigree").getAttribute("aria-pressed"), "true");
         await visit.click("#back");
@@ -160,6 +174,9 @@ describe("walking", kTwoAtOnce, () => {
         assert.match(await page.innerText("#side-panel"), /Death\s+19 April 1882/);
         await page.click('#side-panel a[data-person-id="2"]');
         await visit.still();
+        assert.equal(await visit.focus(), "I1", "reading about a relative loses no place");
+        assert.equal(await page.innerText("#side-panel h2"), "Emma Wedgwood");
+        await visit.click("#make-focus");
         assert.equal(await visit.focus(), "I2");
         await visit.fit();
         await visit.stand("I1");
@@ -180,18 +197,20 @@ describe("walking", kTwoAtOnce, () => {
         const visit = await visitDarwins();
         await visit.page.focus('#side-panel a[href*="person=I12"]');
         await visit.press("Enter");
-        assert.equal(await visit.focus(), "I12");
+        assert.equal(await visit.focus(), "I1");
         assert.equal(await visit.keysOn(), "I12");
+        await visit.press("Enter");
+        assert.equal(await visit.focus(), "I12");
         await visit.end();
     });
 
     test("a button that has come to its end hands the keys to the other", async () => {
         const visit = await visitDarwins();
-        const holder = () => visit.page.evaluate(() => document.activeElement.id);
+        const holder = () => visit.page.evaluate(() => holder().id);
         await visit.goTo("Emma Wedgwood 1808");
         await visit.page.focus("#back");
         await visit.press("Enter");
-        await visit.page.waitForFunction(() => document.getElementById("back").disabled);
+        await visit.page.waitForFunction(() => one("#back").disabled);
         assert.equal(await holder(), "forward");
         await visit.click("#view-pedigree");
         await visit.click("#options-button");
@@ -206,9 +225,9 @@ describe("walking", kTwoAtOnce, () => {
         const visit = await visitDarwins();
         await visit.goTo("Emma Wedgwood 1808");
         await visit.press("Alt+ArrowLeft");
-        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I1");
+        await visit.page.waitForFunction(() => one("#tree .box.focus")?.getAttribute("data-xref") === "I1");
         await visit.press("Alt+ArrowRight");
-        await visit.page.waitForFunction(() => document.querySelector("#tree .box.focus")?.getAttribute("data-xref") === "I2");
+        await visit.page.waitForFunction(() => one("#tree .box.focus")?.getAttribute("data-xref") === "I2");
         await visit.end();
     });
 
@@ -238,14 +257,13 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("who has relatives out of the picture has a mark, and a click leads to them", async () => {
+    test("who has relatives out of the picture has a mark, and a double click leads to them", async () => {
         const visit = await visitDarwins("#person=I1&hide=cousins,greatGrandparents");
         const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
         assert.ok(marked.includes("I5"), "Erasmus has parents who are not shown");
         assert.match(await visit.label("I5"), /more relatives? not shown/);
         assert.ok(!(await visit.shows("I3")));
-        await visit.box("I5").click();
-        await visit.still();
+        await visit.open("I5");
         assert.ok(await visit.shows("I3"), "his father");
         await visit.end();
     });
@@ -277,8 +295,8 @@ describe("walking", kTwoAtOnce, () => {
         assert.ok((await visit.placing()).k < moved.k);
         await visit.click("#fit");
         const sizes = await page.evaluate(() => {
-            const tree = document.querySelector("#tree").getBoundingClientRect();
-            const boxes = [...document.querySelectorAll("#tree .frame")].map((box) => box.getBoundingClientRect());
+            const tree = one("#tree").getBoundingClientRect();
+            const boxes = [...all("#tree .frame")].map((box) => box.getBoundingClientRect());
             return boxes.every((box) => box.left >= tree.left && box.right <= tree.right && box.top >= tree.top && box.bottom <= tree.bottom);
         });
         assert.ok(sizes, "everything is in sight");
@@ -325,7 +343,7 @@ describe("walking", kTwoAtOnce, () => {
         const visit = await visitDarwins("#person=I1", { reducedMotion: "no-preference" });
         const before = await visit.placing();
         await visit.page.evaluate(() => {
-            for (let i = 0; i < 3; ++i) document.getElementById("zoom-in").click();
+            for (let i = 0; i < 3; ++i) one("#zoom-in").click();
         });
         await visit.still();
         assert.ok(Math.abs((await visit.placing()).k / before.k - 1.35 ** 3) < 0.01);

@@ -5,6 +5,18 @@
 
 import assert from "node:assert/strict";
 
+/** In the page: what a selector finds in it and in the viewer's own tree, and what has the keys in either. */
+function lookInside() {
+    const viewer = () => document.querySelector("olvane-tree")?.shadowRoot;
+    window.one = (selector) => document.querySelector(selector) ?? viewer()?.querySelector(selector) ?? null;
+    window.all = (selector) => [document, viewer()].flatMap((tree) => [...(tree?.querySelectorAll(selector) ?? [])]);
+    window.under = (x, y) => {
+        const outer = document.elementFromPoint(x, y);
+        return outer?.shadowRoot?.elementFromPoint(x, y) ?? outer;
+    };
+    window.holder = () => document.activeElement?.shadowRoot?.activeElement ?? document.activeElement;
+}
+
 export class Visit {
     /** Addresses that the page asked for, but for the page itself. */
     requests = [];
@@ -15,6 +27,7 @@ export class Visit {
         const visit = new Visit();
         visit.context = context;
         visit.page = await context.newPage();
+        await visit.page.addInitScript(lookInside);
         visit.watch(address);
         await visit.page.goto(address);
         await visit.page.waitForSelector("#welcome, #tree, .fatal");
@@ -55,11 +68,11 @@ export class Visit {
     async still() {
         await this.page.evaluate(async () => {
             const look = () => {
-                const boxes = [...document.querySelectorAll("#tree .boxes > g")];
-                const ghosts = document.querySelector("#tree .ghosts")?.childElementCount ?? 0;
+                const boxes = [...all("#tree .boxes > g")];
+                const ghosts = one("#tree .ghosts")?.childElementCount ?? 0;
                 const words = boxes.reduce((n, box) => n + box.querySelector(".frame").getAttribute("aria-label").length, 0);
                 const places = boxes.map((box) => box.getAttribute("transform")).join();
-                return [document.querySelector("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
+                return [one("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
             };
             let last = look();
             let since = performance.now();
@@ -113,9 +126,15 @@ export class Visit {
         return this.box(xref).locator(".frame");
     }
 
+    /** Makes a person in sight the focus, as a double click does. */
+    async open(xref) {
+        await this.box(xref).dblclick();
+        await this.still();
+    }
+
     /** Gives the keys to a box, in sight or not. */
     async stand(xref) {
-        await this.page.evaluate((xref) => document.querySelector(`#tree .boxes > [data-xref="${xref}"] .frame`).focus(), xref);
+        await this.page.evaluate((xref) => one(`#tree .boxes > [data-xref="${xref}"] .frame`).focus(), xref);
         await this.still();
     }
 
@@ -145,12 +164,12 @@ export class Visit {
 
     /** The record of the box that has the keys; null if none has. */
     async keysOn() {
-        return this.page.evaluate(() => document.activeElement?.closest("[data-box]")?.getAttribute("data-xref") ?? null);
+        return this.page.evaluate(() => holder()?.closest("[data-box]")?.getAttribute("data-xref") ?? null);
     }
 
     /** With everything in sight. */
     async fit() {
-        await this.page.evaluate(() => document.getElementById("fit").click());
+        await this.page.evaluate(() => one("#fit").click());
         await this.still();
     }
 
@@ -158,8 +177,8 @@ export class Visit {
     async places() {
         return this.page.evaluate(() => {
             const placeOf = (box) => /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);
-            const boxes = [...document.querySelectorAll("#tree .boxes > g")];
-            const [x0, y0] = placeOf(document.querySelector("#tree .box.focus"));
+            const boxes = [...all("#tree .boxes > g")];
+            const [x0, y0] = placeOf(one("#tree .box.focus"));
             const named = boxes.map((box) => {
                 const [x, y] = placeOf(box);
                 const name = box.getAttribute("data-xref") ?? box.querySelector(".frame").getAttribute("aria-label");
@@ -171,7 +190,7 @@ export class Visit {
 
     async middleOf(xref) {
         return this.page.evaluate((xref) => {
-            const frame = document.querySelector(`#tree .boxes > [data-xref="${xref}"] .frame`);
+            const frame = one(`#tree .boxes > [data-xref="${xref}"] .frame`);
             const { left, right, top, bottom } = frame.getBoundingClientRect();
             return { x: (left + right) / 2, y: (top + bottom) / 2 };
         }, xref);

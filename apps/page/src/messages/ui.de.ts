@@ -147,7 +147,7 @@ export const uiGerman: UiMessages = {
         dismiss: "Schließen",
     },
     firstHint:
-        "Wer angeklickt oder angetippt wird, steht im Mittelpunkt. Ziehen verschiebt; Mausrad oder zwei Finger vergrößern.",
+        "Ein Klick oder Tippen wählt eine Person, ein Doppelklick stellt sie in die Mitte. Ziehen verschiebt; Mausrad oder zwei Finger vergrößern.",
     livingHidden: "Namen und Daten lebender Personen sind ausgelassen.",
     firstOfFiles: (name) => `Von den abgelegten Dateien wurde ${name} geöffnet.`,
     personCount: (n) => (n === 1 ? "1 Person" : `${n.toLocaleString("de")} Personen`),

@@ -144,7 +144,7 @@ export const uiEnglish: UiMessages = {
         layout: "This picture could not be laid out. Try fewer generations or relatives.",
         dismiss: "Dismiss",
     },
-    firstHint: "Click or tap a person to stand among that family. Drag to move; turn the wheel or pinch to zoom.",
+    firstHint: "Click or tap a person to read about them, twice to show their family. Drag to move; turn the wheel or pinch to zoom.",
     livingHidden: "The names and dates of living persons are left out.",
     firstOfFiles: (name) => `Of the files that were dropped, ${name} was opened.`,
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),

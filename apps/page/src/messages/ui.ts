@@ -3,7 +3,7 @@
 
 // The texts of the page's own parts, in each language that it speaks.
 
-import type { RelativeName } from "../view/ViewState";
+import type { RelativeName } from "../base/views";
 import { uiGerman } from "./ui.de";
 import { uiEnglish } from "./ui.en";
 

@@ -4,17 +4,12 @@
 // The ways out of the page: the picture as SVG or PNG in the colours of the screen, and on paper in its own.
 
 import type { UiMessages } from "../messages/ui";
-import type { Dress } from "../scene/Scene";
 import type { Notices } from "../ui/Notices";
-import type { Picture } from "../view/Picture";
-import { wholePicture, type WholePicture } from "./pictureSvg";
+import { type Looks, wholePicture, type WholePicture } from "./pictureSvg";
 import { PrintSheet } from "./printing";
 import { pngOf, saveFile, svgBlob } from "./saving";
 
-export interface Subject {
-    readonly picture: Picture;
-    readonly dress: Dress;
-    readonly title: string;
+export interface Subject extends Looks {
     // Of a file, without its ending.
     readonly name: string;
 }
@@ -51,7 +46,7 @@ export class PictureOutput {
 
     private whole(theme: string): WholePicture | null {
         const subject = this.subject();
-        return subject && wholePicture(subject.picture, subject.dress, subject.title, theme);
+        return subject && wholePicture(subject, theme);
     }
 }
 

@@ -7,7 +7,7 @@
 import { drawBox, handleOf } from "../scene/boxArt";
 import { type Dress, linePaths } from "../scene/Scene";
 import { kFontFamily } from "../scene/textFit";
-import { svg } from "../ui/dom";
+import { svg } from "../base/dom";
 import type { Picture } from "../view/Picture";
 
 const kMargin = 24; // points
@@ -39,6 +39,13 @@ const kPageOnly = [
     "class",
 ];
 
+export interface Looks {
+    readonly picture: Picture;
+    readonly dress: Dress;
+    readonly title: string;
+    readonly root: ParentNode & Node;
+}
+
 export interface WholePicture {
     readonly svg: SVGSVGElement;
     readonly width: number; // points
@@ -47,7 +54,11 @@ export interface WholePicture {
 }
 
 // theme is the name of a set of colours in the style sheet.
-export function wholePicture(picture: Picture, dress: Dress, title: string, theme: string): WholePicture {
+// root is the tree of elements that the sheet holds for.
+export function wholePicture(
+    { picture, dress, title, root }: Looks,
+    theme: string,
+): WholePicture {
     const { left, top, right, bottom } = picture.bounds;
     const width = right - left + 2 * kMargin;
     const height = bottom - top + 2 * kMargin;
@@ -77,7 +88,7 @@ export function wholePicture(picture: Picture, dress: Dress, title: string, them
         element.prepend(svg("title", {}, look.label));
         drawing.append(element);
     }
-    resolveLooks(drawing, theme);
+    resolveLooks(drawing, theme, root);
     return { svg: drawing, width, height, title };
 }
 
@@ -92,12 +103,12 @@ export function svgText(drawing: SVGSVGElement): string {
 }
 
 // Asks the browser once for each kind of element how the style sheet has it look.
-function resolveLooks(drawing: SVGSVGElement, theme: string): void {
+function resolveLooks(drawing: SVGSVGElement, theme: string, root: Node): void {
     const host = document.createElement("div");
     host.className = "unseen";
     host.dataset["theme"] = theme;
     host.append(drawing);
-    document.body.append(host);
+    root.appendChild(host);
     const known = new Map<string, readonly (readonly [string, string])[]>();
     const elements = [...drawing.querySelectorAll("rect, path, text, g")];
     for (const element of elements) {

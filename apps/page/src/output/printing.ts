@@ -4,7 +4,7 @@
 // Puts the whole picture on one sheet of paper under its title, lying or standing as suits it, in colours made
 // for paper.
 
-import { html } from "../ui/dom";
+import { html } from "../base/dom";
 import type { WholePicture } from "./pictureSvg";
 
 export class PrintSheet {

@@ -3,7 +3,7 @@
 
 // Hands files to the browser's downloads, and turns a drawing into pixels.
 
-import { html } from "../ui/dom";
+import { html } from "../base/dom";
 import { svgText, type WholePicture } from "./pictureSvg";
 
 const kSharpness = 2; // px for a point

@@ -6,8 +6,8 @@
 
 import { select } from "d3-selection";
 import { type D3ZoomEvent, zoom, zoomIdentity, type ZoomTransform } from "d3-zoom";
-import { prefersStillness } from "../ui/dom";
-import type { Rectangle } from "../view/SpatialGrid";
+import { prefersStillness } from "../base/dom";
+import type { Rectangle } from "../base/SpatialGrid";
 
 // screen = world * k + (x, y), in CSS px.
 export interface Placing {

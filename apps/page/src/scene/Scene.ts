@@ -2,28 +2,30 @@
 // SPDX-License-Identifier: MIT
 
 // The picture on the screen. Only what is in sight has elements, with some room around it, so that panning
-// moves one group and nothing else. Where too many boxes to be read are in sight they become a crowd: one
+// moves one group and nothing else. Where too many boxes to be read are in sight, they are drawn in overview mode: one
 // path a colour.
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
 import type { Segment, Sex } from "olvane";
-import { prefersStillness, svg } from "../ui/dom";
+import { prefersStillness, svg } from "../base/dom";
 import type { Box, Picture } from "../view/Picture";
 import { kLineStyles, type LineStyle } from "../view/lineStyles";
-import { encloses, grown, type Rectangle, touches } from "../view/SpatialGrid";
+import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 
 const kMostReadable = 420; // boxes in sight
 const kGlideTime = 520; // ms
-const kFadeTime = 200; // ms, as in page.css
+const kFadeTime = 200; // ms, as in styles/viewer.css
 const kLineWidth = 1.6; // points
 const kRoomAround = 0.4; // of the window, drawn on each side of it
 
 export interface SceneEvents {
-    // A box was clicked, or Enter pressed on it.
-    chosen(box: Box): void;
+    // A box was clicked or tapped twice.
+    opened(box: Box): void;
+    // A box was clicked or tapped once.
+    selected(box: Box): void;
     // The keys stand on another box.
     active(box: Box): void;
     pointed(box: Box | null, element: SVGGElement | null): void;
@@ -47,7 +49,7 @@ export class Scene {
     readonly camera: Camera;
     private readonly world = svg("g", { class: "world" });
     private lines = svg("g", { class: "lines", "aria-hidden": "true" });
-    private readonly crowd = svg("g", { class: "crowd", "aria-hidden": "true" });
+    private readonly overviewLayer = svg("g", { class: "far", "aria-hidden": "true" });
     private readonly ghosts = svg("g", { class: "ghosts", "aria-hidden": "true" });
     private readonly boxLayer = svg("g", { class: "boxes" });
     private readonly elements = new Map<Box, SVGGElement>();
@@ -55,7 +57,7 @@ export class Scene {
     private dress!: Dress; // given with the picture
     private activeBox: Box | null = null;
     private drawn: Rectangle | null = null; // whose boxes and lines have elements
-    private crowded = false;
+    private isFar = false; // in overview mode
     private glide: Glide | null = null;
     private frame = 0;
 
@@ -63,7 +65,7 @@ export class Scene {
         readonly surface: SVGSVGElement,
         private readonly events: SceneEvents,
     ) {
-        this.world.append(this.crowd, this.lines, this.ghosts, this.boxLayer);
+        this.world.append(this.overviewLayer, this.lines, this.ghosts, this.boxLayer);
         surface.append(this.world);
         this.camera = new Camera(surface, (placing) => this.cameraMoved(placing));
         this.listen();
@@ -73,7 +75,7 @@ export class Scene {
     // of the picture so far, hands its place on the screen to the new focus.
     show(picture: Picture, dress: Dress, anchor: Box | null): void {
         const before = this.picture;
-        const hadKeys = this.surface.contains(document.activeElement);
+        const hadKeys = this.surface.contains(this.keyHolder);
         const oldElements = new Map(this.elements);
         const held = before ? (anchor ?? before.boxOfKey(picture.focusBox.key) ?? null) : null;
 
@@ -83,7 +85,7 @@ export class Scene {
         this.activeBox = picture.focusBox;
         this.elements.clear();
         this.boxLayer.replaceChildren();
-        this.crowd.replaceChildren();
+        this.overviewLayer.replaceChildren();
         this.drawn = null;
 
         if (before && held) this.arrive(before, picture, held, oldElements);
@@ -97,7 +99,7 @@ export class Scene {
             repaintBox(element, this.dress.lookOf(box), this.picture!.sizes);
     }
 
-    dressAnew(dress: Dress): void {
+    restyle(dress: Dress): void {
         this.dress = dress;
         this.redraw();
     }
@@ -107,7 +109,7 @@ export class Scene {
         this.picture = null;
         this.activeBox = null;
         this.elements.clear();
-        for (const group of [this.lines, this.boxLayer, this.crowd, this.ghosts]) group.replaceChildren();
+        for (const group of [this.lines, this.boxLayer, this.overviewLayer, this.ghosts]) group.replaceChildren();
     }
 
     fit(): void {
@@ -149,9 +151,9 @@ export class Scene {
     }
 
     // Marks all the boxes of one person, when one of several is pointed at.
-    markTwins(person: number): void {
+    markDuplicates(person: number): void {
         for (const [box, element] of this.elements)
-            element.classList.toggle("twin-lit", person > 0 && box.person === person);
+            element.classList.toggle("duplicate-lit", person > 0 && box.person === person);
     }
 
     private begin(picture: Picture): void {
@@ -272,28 +274,28 @@ export class Scene {
         if (!picture) return;
         const sight = this.camera.window();
         const needed = alsoWindow ? unionOf(sight, alsoWindow) : sight;
-        const crowded =
+        const isFar =
             picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
         const far = this.drawn && this.drawn.right - this.drawn.left > 6 * (sight.right - sight.left);
         if (
             this.drawn &&
-            crowded === this.crowded &&
+            isFar === this.isFar &&
             !far &&
             encloses(this.drawn, clipped(needed, this.drawn, picture.bounds))
         ) {
             this.keepAlways(picture);
             return;
         }
-        this.crowded = crowded;
+        this.isFar = isFar;
         const around = this.glide ? 0 : kRoomAround;
         this.drawn = grown(needed, (sight.right - sight.left) * around, (sight.bottom - sight.top) * around);
         this.drawLines(picture);
-        this.drawCrowd(picture);
-        this.drawBoxes(crowded ? [] : picture.boxesWithin(this.drawn), picture);
+        this.drawOverview(picture);
+        this.drawBoxes(isFar ? [] : picture.boxesWithin(this.drawn), picture);
     }
 
     private drawLines(picture: Picture): void {
-        const segments = this.crowded ? picture.segments : picture.segmentsWithin(this.drawn!);
+        const segments = this.isFar ? picture.segments : picture.segmentsWithin(this.drawn!);
         this.lines.replaceChildren(...linePaths(segments, this.dress));
         this.thickenLines();
     }
@@ -304,10 +306,10 @@ export class Scene {
         if (this.lines.getAttribute("stroke-width") !== width) this.lines.setAttribute("stroke-width", width);
     }
 
-    private drawCrowd(picture: Picture): void {
-        this.crowd.classList.toggle("shown", this.crowded);
-        if (!this.crowded || this.crowd.firstChild) return;
-        this.crowd.append(...crowdPaths(picture, this.dress));
+    private drawOverview(picture: Picture): void {
+        this.overviewLayer.classList.toggle("shown", this.isFar);
+        if (!this.isFar || this.overviewLayer.firstChild) return;
+        this.overviewLayer.append(...overviewPaths(picture, this.dress));
     }
 
     private drawBoxes(boxes: readonly Box[], picture: Picture): void {
@@ -323,7 +325,7 @@ export class Scene {
         for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box, picture));
         this.boxLayer.append(added);
         const focus = this.elements.get(picture.focusBox);
-        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(document.activeElement))
+        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(this.keyHolder))
             this.boxLayer.append(focus);
     }
 
@@ -359,9 +361,16 @@ export class Scene {
 
     private listen(): void {
         const { surface, events } = this;
+        let lastClicked: Box | null = null;
         surface.addEventListener("click", (event) => {
             const box = this.boxAt(event.target);
-            if (box?.person) events.chosen(box);
+            if (!box) return;
+            // The second of two quick clicks opens what the first one selected.
+            const isSecond = event.detail > 1 && box === lastClicked;
+            lastClicked = box;
+            if (isSecond) return events.opened(box);
+            if (box.person && box !== this.activeBox) this.activate(box, false);
+            events.selected(box);
         });
         // A box that is pressed gets the keys, but the picture must hold still until it is known whether that is a
         // click or the beginning of a drag.
@@ -383,6 +392,11 @@ export class Scene {
         surface.addEventListener("scroll", () => surface.scrollTo(0, 0));
     }
 
+    // What has the keys in the tree of elements that the surface stands in.
+    private get keyHolder(): Element | null {
+        return (this.surface.getRootNode() as Document | ShadowRoot).activeElement ?? null;
+    }
+
     private boxAt(target: EventTarget | null): Box | null {
         const index = (target as Element | null)?.closest?.("[data-box]")?.getAttribute("data-box");
         return index ? (this.picture?.boxes[Number(index)] ?? null) : null;
@@ -390,7 +404,7 @@ export class Scene {
 }
 
 // All boxes of a picture, with nothing in them: a path for each sex.
-export function crowdPaths(picture: Picture, dress: Dress): SVGPathElement[] {
+export function overviewPaths(picture: Picture, dress: Dress): SVGPathElement[] {
     const { nodeWidth, nodeHeight } = picture.sizes;
     const paths = new Map<string, string[]>();
     for (const box of picture.boxes) {

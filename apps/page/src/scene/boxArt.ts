@@ -6,7 +6,8 @@
 // page's themes.
 
 import type { Sex, Sizes } from "olvane";
-import { svg } from "../ui/dom";
+import { svg } from "../base/dom";
+import { kSilhouettes } from "../base/silhouettes";
 import { fitLine, fitName, textWidth } from "./textFit";
 
 // Everything that a box shows and says.
@@ -32,15 +33,8 @@ const kYearsSize = 11;
 const kKinSize = 10.5;
 const kLeastKinSize = 9.5; // before a word is cut
 
-// Silhouettes of 44 by 40 px, drawn at kFigureScale.
+// Silhouettes of 44 by 40 px are drawn at this scale.
 const kFigureScale = 0.56;
-export const kSilhouettes: Record<Sex, string> = {
-    male: "M22 1.5a9 9 0 1 0 .01 0zM4 40v-5c0-8 5-12.5 11-13.5l7 5 7-5c6 1 11 5.5 11 13.5v5z",
-    female:
-        "M22 1c-8 0-11.5 5.5-11.5 12 0 5.5-.5 8.5-3.5 11.5 4 1.5 8 1 10.5-.5v3h9v-3c2.5 1.5 6.5 2 10.5.5-3-3-3.5-6-3.5-11.5 0-6.5-3.5-12-11.5-12z" +
-        "M6 40c0-8 5-12.5 11-13.5h10c6 1 11 5.5 11 13.5z",
-    other: "M22 2.5a8 8 0 1 0 .01 0zM5.5 38.7v-3c0-8 7-12 16.5-12s16.5 4 16.5 12v3z",
-};
 
 // Square corners for men, round ones for women, in between for everybody else.
 const kCorners: Record<Sex, number> = { male: 3, female: 16, other: 8 };
@@ -61,7 +55,7 @@ export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
     if (sizes.nodeWidth > 1.5 * sizes.nodeHeight) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
     if (look.hidden >= 0) appendBadge(box, look.hidden, sizes);
-    if (look.repeated) appendTwinMark(box);
+    if (look.repeated) appendDuplicateMark(box);
     return box;
 }
 
@@ -202,12 +196,12 @@ function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): vo
     box.append(badge);
 }
 
-function appendTwinMark(box: SVGGElement): void {
+function appendDuplicateMark(box: SVGGElement): void {
     const d = "M-.5 3.5h8v8h-8zM3.5 3.5v-4h8v8h-4";
     box.append(
         svg(
             "g",
-            { class: "twin", transform: "translate(0 -1)" },
+            { class: "duplicate", transform: "translate(0 -1)" },
             svg("rect", { x: -5, y: -5, width: 21, height: 21, rx: 6 }),
             svg("path", { d }),
         ),

@@ -4,8 +4,8 @@
 // Short messages at the lower edge. What went well goes away by itself; what went wrong stays until
 // dismissed.
 
-import { html, onClick } from "./dom";
-import { icon } from "./icons";
+import { html, onClick } from "../base/dom";
+import { icon } from "../base/icons";
 
 const kTime = 6000; // ms
 const kMostAtOnce = 3;
@@ -14,7 +14,7 @@ export class Notices {
     readonly element = html("div", { id: "notices" });
     private dismissLabel = "";
 
-    speak(dismissLabel: string): void {
+    setDismissLabel(dismissLabel: string): void {
         this.dismissLabel = dismissLabel;
     }
 
@@ -35,12 +35,15 @@ export class Notices {
         setTimeout(() => notice.remove(), 2 * kTime);
     }
 
-    fail(text: string, details: readonly string[]): void {
-        this.add("failed", "alert", text, details);
+    // subject names what the message is about, so that it can be taken away when that is over.
+    fail(text: string, details: readonly string[], subject = ""): void {
+        this.add("failed", "alert", text, details).dataset["subject"] = subject;
     }
 
-    clear(): void {
-        this.element.replaceChildren();
+    // All of them, or those about one subject.
+    clear(subject?: string): void {
+        for (const notice of [...this.element.children] as HTMLElement[])
+            if (subject === undefined || notice.dataset["subject"] === subject) notice.remove();
     }
 
     private add(className: string, role: string, text: string, details: readonly string[]): HTMLElement {

@@ -5,10 +5,10 @@
 // Shown only while there is a rest. The keys have other ways, so it is for the mouse alone.
 
 import type { Camera } from "../scene/Camera";
-import { crowdPaths, type Dress } from "../scene/Scene";
+import { overviewPaths, type Dress } from "../scene/Scene";
 import type { Picture } from "../view/Picture";
-import { encloses, grown, type Rectangle } from "../view/SpatialGrid";
-import { html, setAttributes, svg } from "./dom";
+import { encloses, grown, type Rectangle } from "../base/SpatialGrid";
+import { html, setAttributes, svg } from "../base/dom";
 
 // px
 const kMostWidth = 200;
@@ -58,7 +58,7 @@ export class Overview {
             cy: (focus.top + focus.bottom) / 2,
             r: mark,
         });
-        this.drawing.replaceChildren(...crowdPaths(picture, dress), dot, this.frame);
+        this.drawing.replaceChildren(...overviewPaths(picture, dress), dot, this.frame);
         this.follow();
     }
 

@@ -8,10 +8,10 @@
 import type { Fact, Family, Person } from "olvane";
 import { factLabel, type Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { dateText, nameOf, yearsOf } from "../names";
+import { dateText, nameOf, yearsOf } from "../messages/names";
 import type { OpenFamily } from "../view/OpenFamily";
-import { html, isolated, onClick } from "./dom";
-import { icon, silhouette } from "./icons";
+import { html, isolated, onClick } from "../base/dom";
+import { icon, silhouette } from "../base/icons";
 
 // Told by the panel in other ways, or of no use to a reader.
 const kUntold = new Set([
@@ -35,6 +35,7 @@ const kUntold = new Set([
 const kMostListed = 24; // relatives of a kind, until all are asked for
 
 export interface PanelEvents {
+    select(person: number): void;
     choose(person: number): void;
     nextBox(person: number): void;
     addressOf(person: number): string;
@@ -268,7 +269,7 @@ export class SidePanel {
         onClick(link, (event) => {
             if (event.ctrlKey || event.metaKey || event.shiftKey) return;
             event.preventDefault();
-            this.events.choose(person.id);
+            this.events.select(person.id);
         });
         return link;
     }

@@ -4,7 +4,7 @@
 // A card beside the box under the mouse, with what a box has no room for. It says nothing that the side panel
 // and the labels for screen readers do not say too.
 
-import { html } from "./dom";
+import { html } from "../base/dom";
 
 const kDelay = 350; // ms
 const kGap = 10; // px

@@ -11,16 +11,14 @@ export interface KeyActions {
     chooseActive(): void;
     nextBox(): void;
     home(): void;
-    switchView(): void;
-    startSearch(): void;
-    escape(): void;
-    showKeys(): void;
     zoomIn(): void;
     zoomOut(): void;
     fit(): void;
-    back(): void;
-    forward(): void;
+    // A key that leads out of the picture. Answers whether somebody took it.
+    outer(key: OuterKey): boolean;
 }
+
+export type OuterKey = "search" | "keys" | "back" | "forward" | "switchView" | "escape";
 
 const kPanStep = 90; // px
 const kArrows: Readonly<Record<string, readonly [Direction, number, number]>> = {
@@ -30,36 +28,33 @@ const kArrows: Readonly<Record<string, readonly [Direction, number, number]>> = 
     ArrowRight: ["right", -1, 0],
 };
 
-const kAnywhere: Readonly<Record<string, (actions: KeyActions) => void>> = {
-    "/": (actions) => actions.startSearch(),
-    "?": (actions) => actions.showKeys(),
+const kAnywhere: Readonly<Record<string, (actions: KeyActions) => unknown>> = {
+    "/": (actions) => actions.outer("search"),
+    "?": (actions) => actions.outer("keys"),
     "+": (actions) => actions.zoomIn(),
     "=": (actions) => actions.zoomIn(),
     "-": (actions) => actions.zoomOut(),
     "0": (actions) => actions.fit(),
-    v: (actions) => actions.switchView(),
-    Escape: (actions) => actions.escape(),
+    v: (actions) => actions.outer("switchView"),
+    Escape: (actions) => actions.outer("escape"),
 };
 
-const kInPicture: Readonly<Record<string, (actions: KeyActions) => void>> = {
+const kInPicture: Readonly<Record<string, (actions: KeyActions) => unknown>> = {
     Enter: (actions) => actions.chooseActive(),
     " ": (actions) => actions.chooseActive(),
     Home: (actions) => actions.home(),
     n: (actions) => actions.nextBox(),
 };
 
-const kWithAlt: Readonly<Record<string, (actions: KeyActions) => void>> = {
-    ArrowLeft: (actions) => actions.back(),
-    ArrowRight: (actions) => actions.forward(),
+const kWithAlt: Readonly<Record<string, (actions: KeyActions) => unknown>> = {
+    ArrowLeft: (actions) => actions.outer("back"),
+    ArrowRight: (actions) => actions.outer("forward"),
 };
 
 // Whether the key meant something. Other keys with Ctrl, Alt or the like are the browser's.
 export function pictureKey(event: KeyboardEvent, inPicture: boolean, actions: KeyActions): boolean {
-    if (event.altKey && !event.ctrlKey && !event.metaKey && !event.shiftKey) {
-        const action = kWithAlt[event.key];
-        action?.(actions);
-        return action !== undefined;
-    }
+    if (event.altKey && !event.ctrlKey && !event.metaKey && !event.shiftKey)
+        return run(kWithAlt[event.key], actions);
     if (event.ctrlKey || event.altKey || event.metaKey) return false;
     const arrow = kArrows[event.key];
     if (arrow && inPicture) {
@@ -69,7 +64,10 @@ export function pictureKey(event: KeyboardEvent, inPicture: boolean, actions: Ke
         return true;
     }
     const key = event.key.length === 1 ? event.key.toLowerCase() : event.key;
-    const action = kAnywhere[key] ?? (inPicture ? kInPicture[key] : undefined);
-    action?.(actions);
-    return action !== undefined;
+    return run(kAnywhere[key] ?? (inPicture ? kInPicture[key] : undefined), actions);
+}
+
+// Keys that nobody took are left to the page around the viewer.
+function run(action: ((actions: KeyActions) => unknown) | undefined, actions: KeyActions): boolean {
+    return action !== undefined && action(actions) !== false;
 }

@@ -6,8 +6,8 @@
 // upper-left corner.
 
 import type { LayoutRecord, Segment, Sizes } from "olvane";
-import { type Rectangle, SpatialGrid } from "./SpatialGrid";
-import type { ViewName } from "./ViewState";
+import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
+import type { ViewName } from "../base/views";
 
 export interface Box {
     readonly index: number;

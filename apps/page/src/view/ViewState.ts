@@ -4,8 +4,7 @@
 // What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
 
 import type { Person } from "olvane";
-
-export type ViewName = "family" | "pedigree";
+import { kRelativeNames, kRelatives, type RelativeName, type ViewName } from "../base/views";
 
 export interface ViewState {
     readonly focus: number;
@@ -16,24 +15,17 @@ export interface ViewState {
     readonly hidden: ReadonlySet<RelativeName>;
 }
 
-// In the order of the switches. A bit is the engine's own.
-export const kRelatives = {
-    siblings: 0x04,
-    siblingSpouses: 0x08,
-    niecesNephews: 0x10,
-    auntsUncles: 0x01,
-    cousins: 0x02,
-    greatGrandparents: 0x40,
-    spousesOfChildren: 0x80,
-    grandchildren: 0x20,
-} as const;
-
-export type RelativeName = keyof typeof kRelatives;
-export const kRelativeNames = Object.keys(kRelatives) as RelativeName[];
-
 export const kLeastGenerations = 2;
 export const kMostGenerations = 10;
 export const kUsualGenerations = 5;
+
+/** What is shown where nobody said otherwise; the focus is then chosen from the family. */
+export const kUsualState: ViewState = {
+    focus: 0,
+    view: "family",
+    generations: kUsualGenerations,
+    hidden: new Set(),
+};
 
 export function shownBits(state: ViewState): number {
     return kRelativeNames.reduce(
@@ -82,7 +74,7 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
 }
 
 // The person whom an address names and the file does not hold; empty where there is none.
-export function strangerIn(address: string, persons: readonly Person[]): string {
+export function unknownPersonIn(address: string, persons: readonly Person[]): string {
     const parts = new URLSearchParams(address.replace(/^#/, ""));
     return focusIn(parts, persons) ? "" : (parts.get("person") ?? parts.get("number") ?? "");
 }

@@ -3,7 +3,7 @@
 
 // A button that opens a small panel below it. Escape, a click elsewhere and leaving by Tab close it.
 
-import { html, onClick } from "./dom";
+import { html, onClick } from "../base/dom";
 
 export class Popover {
     constructor(

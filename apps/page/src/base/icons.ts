@@ -4,8 +4,8 @@
 // The small pictures on buttons: strokes on a square of 24 px.
 
 import type { Sex } from "olvane";
-import { kSilhouettes } from "../scene/boxArt";
 import { svg } from "./dom";
+import { kSilhouettes } from "./silhouettes";
 
 const kPaths = {
     search: "M10.5 4a6.5 6.5 0 1 0 .01 0zM15.5 15.5 20 20",
@@ -23,7 +23,7 @@ const kPaths = {
     family: "M12 4v6M6 14v-4h12v4M4 14h4v5H4zM16 14h4v5h-4zM10 2.5h4v3h-4z",
     pedigree: "M3 10h4v4H3zM7 12h4M11 6v12M11 6h4M11 18h4M15 4h5v4h-5zM15 16h5v4h-5z",
     up: "M6 15l6-6 6 6",
-    twins: "M5 9h10v10H5zM9 9V5h10v10h-4",
+    duplicates: "M5 9h10v10H5zM9 9V5h10v10h-4",
     lock: "M6 11h12v9H6zM8.5 11V8a3.5 3.5 0 0 1 7 0v3",
 } as const;
 

@@ -8,12 +8,12 @@ import type { Person, Segment, Sex } from "olvane";
 import { kinshipText, nearKinshipText } from "../kinship";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { directionOf, nameOf, yearsOf } from "../names";
-import type { BoxLook } from "../scene/boxArt";
-import type { Dress } from "../scene/Scene";
-import { type LineStyle, lineStylesOf } from "./lineStyles";
-import type { OpenFamily } from "./OpenFamily";
-import type { Box, Picture } from "./Picture";
+import { directionOf, nameOf, yearsOf } from "../messages/names";
+import type { BoxLook } from "./boxArt";
+import type { Dress } from "./Scene";
+import { type LineStyle, lineStylesOf } from "../view/lineStyles";
+import type { OpenFamily } from "../view/OpenFamily";
+import type { Box, Picture } from "../view/Picture";
 
 export interface Wording {
     readonly messages: Messages;

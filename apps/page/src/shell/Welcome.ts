@@ -4,8 +4,8 @@
 // The page before any family is open, and the invitation that covers it while a file is dragged over it.
 
 import type { UiMessages } from "../messages/ui";
-import { html, onClick, svg } from "./dom";
-import { icon } from "./icons";
+import { html, onClick, svg } from "../base/dom";
+import { icon } from "../base/icons";
 
 export class Welcome {
     readonly element: HTMLElement;

@@ -4,7 +4,7 @@
 // Names and dates of a person as words on the page.
 
 import type { GedcomDate, Person } from "olvane";
-import type { DateMark, Messages } from "./messages";
+import type { DateMark, Messages } from "../messages";
 
 export type Direction = "ltr" | "rtl";
 

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Which set of colours the page wears. The sets themselves are in page.css, under the same names.
+// Which set of colours the page wears. The sets themselves are in styles/colours.css, under the same names.
 
-import { recall, remember } from "./dom";
+import { recall, remember } from "../base/dom";
 
 export const kThemeChoices = ["auto", "light", "dark", "contrast"] as const;
 export type ThemeChoice = (typeof kThemeChoices)[number];
@@ -14,7 +14,8 @@ const kContrast = "(prefers-contrast: more)";
 export class Theme {
     choice: ThemeChoice;
 
-    constructor() {
+    // The viewer wears what the page wears.
+    constructor(private readonly viewer: HTMLElement) {
         const known = recall("theme");
         this.choice = kThemeChoices.find((choice) => choice === known) ?? "auto";
         for (const query of [kDark, kContrast])
@@ -29,7 +30,8 @@ export class Theme {
     }
 
     private wear(): void {
-        document.documentElement.dataset["theme"] = this.choice === "auto" ? systemTheme() : this.choice;
+        const theme = this.choice === "auto" ? systemTheme() : this.choice;
+        for (const element of [document.documentElement, this.viewer]) element.dataset["theme"] = theme;
     }
 }
 

@@ -3,7 +3,7 @@
 
 // Takes files that are dropped anywhere on the page, or chosen in the browser's own dialog.
 
-import { html } from "./dom";
+import { html } from "../base/dom";
 
 export function fileInput(take: (file: File) => void): HTMLInputElement {
     const input = html("input", {

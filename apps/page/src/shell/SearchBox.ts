@@ -6,8 +6,8 @@
 
 import type { Person } from "olvane";
 import type { UiMessages } from "../messages/ui";
-import { html, isolated, onClick } from "./dom";
-import { icon, silhouette } from "./icons";
+import { html, isolated, onClick } from "../base/dom";
+import { icon, silhouette } from "../base/icons";
 
 const kMostFound = 30;
 

@@ -6,16 +6,11 @@
 
 import type { Diagnostic } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
-import {
-    kLeastGenerations,
-    kMostGenerations,
-    kRelativeNames,
-    type RelativeName,
-    type ViewName,
-    type ViewState,
-} from "../view/ViewState";
-import { html, onClick } from "./dom";
-import { icon, type IconName, silhouette } from "./icons";
+import { kRelativeNames, type RelativeName, type ViewName } from "../base/views";
+import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
+import { iconButton } from "../base/controls";
+import { html, onClick } from "../base/dom";
+import { icon } from "../base/icons";
 import { Popover } from "./Popover";
 import { SearchBox, type SearchSource } from "./SearchBox";
 import { kThemeChoices, type ThemeChoice } from "./theme";
@@ -29,10 +24,6 @@ export interface ChromeActions extends SearchSource {
     setLanguage(language: string): void;
     back(): void;
     forward(): void;
-    zoomIn(): void;
-    zoomOut(): void;
-    fit(): void;
-    home(): void;
     openFile(): void;
     saveSvg(): void;
     savePng(): void;
@@ -49,7 +40,6 @@ const kMostDiagnostics = 500; // listed; the rest is counted
 
 export class Chrome {
     readonly bar: HTMLElement;
-    readonly corner: HTMLElement;
     readonly keys: HTMLDialogElement;
     readonly diagnostics: HTMLDialogElement;
     readonly search: SearchBox;
@@ -62,9 +52,7 @@ export class Chrome {
     private readonly more: HTMLButtonElement;
     private readonly options: Popover;
     private readonly files: Popover;
-    private readonly legend: HTMLDetailsElement;
     private shownGenerations = 0;
-    private readonly familyLegend: HTMLElement[] = []; // of lines that the pedigree never draws
 
     constructor(
         private readonly ui: UiMessages,
@@ -73,35 +61,33 @@ export class Chrome {
     ) {
         this.search = new SearchBox(actions, ui);
         this.buttons = {
-            back: this.iconButton("back", "back", ui.back, () => actions.back()),
-            forward: this.iconButton("forward", "forward", ui.forward, () => actions.forward()),
+            back: iconButton("back", "back", ui.back, () => actions.back()),
+            forward: iconButton("forward", "forward", ui.forward, () => actions.forward()),
             family: this.viewButton("family", ui.views.family),
             pedigree: this.viewButton("pedigree", ui.views.pedigree),
-            panel: this.iconButton("panel-button", "panel", ui.panel.toggle, () => actions.togglePanel()),
+            panel: iconButton("panel-button", "panel", ui.panel.toggle, () => actions.togglePanel()),
         };
-        this.fewer = this.iconButton("generations-fewer", "minus", ui.fewer, () =>
+        this.fewer = iconButton("generations-fewer", "minus", ui.fewer, () =>
             actions.setGenerations(this.shownGenerations - 1),
         );
-        this.more = this.iconButton("generations-more", "plus", ui.more, () =>
+        this.more = iconButton("generations-more", "plus", ui.more, () =>
             actions.setGenerations(this.shownGenerations + 1),
         );
         this.keys = this.keyDialog();
         this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
-        this.diagnosticsButton = this.iconButton("diagnostics-button", "warning", "", () =>
+        this.diagnosticsButton = iconButton("diagnostics-button", "warning", "", () =>
             this.openDiagnostics(),
         );
         this.diagnosticsButton.hidden = true;
         this.options = new Popover(
-            this.iconButton("options-button", "options", ui.options, () => {}),
+            iconButton("options-button", "options", ui.options, () => {}),
             this.optionsPanel(looks),
         );
         this.files = new Popover(
-            this.iconButton("file-button", "file", ui.file, () => {}),
+            iconButton("file-button", "file", ui.file, () => {}),
             this.filePanel(),
         );
         this.bar = this.barElement();
-        this.legend = this.legendPanel();
-        this.corner = html("div", { class: "corner" }, this.legend, this.zoomButtons());
     }
 
     showFamily(title: string, persons: string): void {
@@ -128,16 +114,10 @@ export class Chrome {
             [this.fewer, !isFamily && state.generations > kLeastGenerations],
             [this.more, !isFamily && state.generations < kMostGenerations],
         );
-        for (const item of this.familyLegend) item.hidden = !isFamily;
     }
 
     showPanelState(open: boolean): void {
         this.buttons.panel.setAttribute("aria-pressed", String(open));
-    }
-
-    closeLegend(): void {
-        if (this.legend.contains(document.activeElement)) this.legend.querySelector("summary")!.focus();
-        this.legend.open = false;
     }
 
     showDiagnostics(found: readonly Diagnostic[], persons: number): void {
@@ -193,18 +173,6 @@ export class Chrome {
                 this.files.element,
                 buttons.panel,
             ),
-        );
-    }
-
-    private zoomButtons(): HTMLElement {
-        const { ui, actions } = this;
-        return html(
-            "div",
-            { class: "zoom", role: "group", "aria-label": ui.zoom },
-            this.iconButton("zoom-in", "plus", ui.zoomIn, () => actions.zoomIn()),
-            this.iconButton("zoom-out", "minus", ui.zoomOut, () => actions.zoomOut()),
-            this.iconButton("fit", "fit", ui.fit, () => actions.fit()),
-            this.iconButton("home", "home", ui.home, () => actions.home()),
         );
     }
 
@@ -281,43 +249,8 @@ export class Chrome {
     }
 
     private dialogHead(id: string, title: string, dialog: HTMLDialogElement): HTMLElement {
-        const close = this.iconButton(id + "-close", "close", this.ui.close, () => dialog.close());
+        const close = iconButton(id + "-close", "close", this.ui.close, () => dialog.close());
         return html("div", { class: "dialog-head" }, html("h2", { id }, title), close);
-    }
-
-    private legendPanel(): HTMLDetailsElement {
-        const { ui } = this;
-        const items = ui.legendItems;
-        const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
-        const sign = (className: string, content: Element | string = "") =>
-            html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
-        this.familyLegend.push(
-            row(sign("divorced"), items.divorced),
-            row(sign("adopted"), items.adopted),
-        );
-        const list = html(
-            "ul",
-            { tabindex: 0, "aria-label": ui.legend },
-            row(sign("male", silhouette("male")), items.male),
-            row(sign("female", silhouette("female")), items.female),
-            row(sign("other", silhouette("other")), items.other),
-            row(sign("focus"), items.focus),
-            row(sign("more", "+3"), items.hidden),
-            row(sign("missing", "?"), items.missing),
-            ...this.familyLegend,
-            row(sign("twin", icon("twins")), items.repeated),
-        );
-        return html("details", { id: "legend" }, html("summary", {}, ui.legend), list);
-    }
-
-    private iconButton(id: string, name: IconName, label: string, action: () => void): HTMLButtonElement {
-        const button = html(
-            "button",
-            { id, type: "button", class: "icon-button", "aria-label": label, title: label },
-            icon(name),
-        );
-        onClick(button, action);
-        return button;
     }
 
     private viewButton(view: ViewName, label: string): HTMLButtonElement {

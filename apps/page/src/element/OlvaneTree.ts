@@ -1,0 +1,498 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The viewer as an element of its own, <olvane-tree>: the picture, the buttons over it and the panel about the
+// selected person. Whoever places it listens to its events and tells it what to show; it keeps no history, opens
+// no dialog and stores nothing. Everything inside lies in its own shadow tree, so that any number of them stand
+// on one page.
+
+import { type GedcomFile, LayoutError, type Olvane, type Person } from "olvane";
+import { html, setAttributes, svg } from "../base/dom";
+import type { ViewName } from "../base/views";
+import { type Messages, messagesFor } from "../messages";
+import { nameOf, yearsOf } from "../messages/names";
+import { type UiMessages, uiMessagesFor } from "../messages/ui";
+import type { Placing } from "../scene/Camera";
+import { PictureDress } from "../scene/PictureDress";
+import { Scene } from "../scene/Scene";
+import { Corner } from "../ui/Corner";
+import { Overview } from "../ui/Overview";
+import { type OuterKey, pictureKey } from "../ui/pictureKeys";
+import { SidePanel } from "../ui/SidePanel";
+import { Tooltip } from "../ui/Tooltip";
+import { boxTowards, type Direction } from "../view/kinMoves";
+import { OpenFamily } from "../view/OpenFamily";
+import type { Box, Picture } from "../view/Picture";
+import { addressOf, kUsualState, readAddress, sameState, type ViewState } from "../view/ViewState";
+import { viewerStyles } from "./styles";
+
+const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
+const kWarmUps = 8;
+const kWarmUpPause = 120; // ms
+const kWarmEnough = 12; // ms; what takes less needs no warming
+const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
+
+/** A picture and what is written on it, for whoever saves or prints it. */
+export interface Shown {
+    readonly picture: Picture;
+    readonly dress: PictureDress;
+    readonly title: string;
+    /** Where the viewer's looks hold. */
+    readonly root: ShadowRoot;
+}
+
+export interface OlvaneTreeEvents {
+    /** Another person is selected: the panel is about them. */
+    select: CustomEvent<{ person: Person }>;
+    /** Another picture is shown. byUser is false where the program asked for it. */
+    focuschange: CustomEvent<{ state: ViewState; person: Person; boxes: number; byUser: boolean }>;
+    /** The box of an unknown parent was chosen. */
+    action: CustomEvent<{ child: Person; parent: "father" | "mother" }>;
+    /** A picture could not be laid out; the one before stays. */
+    refused: CustomEvent<{ tooLarge: boolean }>;
+    /** A key that leads out of the viewer; preventDefault says that it was taken. */
+    outerkey: CustomEvent<{ key: OuterKey }>;
+}
+
+export class OlvaneTree extends HTMLElement {
+    /** The engine that all viewers share; set it before any of them gets a file. */
+    static engine: Promise<Olvane> | null = null;
+    static readonly observedAttributes = ["src", "focus", "view", "language", "panel", "kinship", "theme"];
+
+    private readonly shadow: ShadowRoot;
+    private readonly surface = svg("svg", { id: "tree", role: "application", part: "tree" });
+    private readonly hint = html("p", { id: "tree-hint", class: "unseen" });
+    private readonly live = html("div", { id: "live", class: "unseen", "aria-live": "polite" });
+    private readonly stage = html("div", { class: "stage", part: "stage" });
+    private readonly parts = html("div", { class: "parts" });
+    private readonly tooltip = new Tooltip();
+    private readonly scene: Scene;
+    private readonly overview: Overview;
+    private readonly size = new ResizeObserver(() => this.resized());
+    private corner!: Corner; // made by rebuildUi()
+    private panel!: SidePanel;
+    private messages: Messages;
+    private ui: UiMessages;
+    private opened: OpenFamily | null = null;
+    private shownState: ViewState | null = null;
+    private picture: Picture | null = null;
+    private dress: PictureDress | null = null;
+    private shownPerson = 0; // in the panel
+    private kinshipTimer = 0;
+
+    constructor() {
+        super();
+        this.shadow = this.attachShadow({ mode: "open", delegatesFocus: false });
+        this.shadow.adoptedStyleSheets = [...viewerStyles()];
+        const language = this.getAttribute("language") ?? navigator.language;
+        this.messages = messagesFor(language);
+        this.ui = uiMessagesFor(language);
+        this.scene = new Scene(this.surface, {
+            opened: (box) => this.openBox(box),
+            selected: (box) => this.selectBox(box),
+            active: (box) => this.showInPanel(box.person || box.child),
+            pointed: (box, element) => this.pointAt(box, element),
+            moved: (placing) => this.moved(placing),
+        });
+        this.overview = new Overview(this.scene.camera);
+        this.shadow.append(html("div", { class: "viewer" }, this.parts), this.tooltip.element, this.live);
+        this.shadow.addEventListener("keydown", (event) => this.key(event as KeyboardEvent));
+        this.rebuildUi();
+    }
+
+    connectedCallback(): void {
+        this.size.observe(this.surface);
+        if (!this.hasAttribute("data-theme")) this.applyTheme();
+        const src = this.getAttribute("src");
+        if (src && !this.opened) void this.load(src);
+    }
+
+    disconnectedCallback(): void {
+        this.size.disconnect();
+        this.tooltip.hide();
+        clearTimeout(this.kinshipTimer);
+    }
+
+    attributeChangedCallback(name: string, before: string | null, now: string | null): void {
+        if (before === now) return;
+        if (name === "src" && this.isConnected && now) void this.load(now);
+        if (name === "language") this.setLanguage(now ?? navigator.language);
+        if (name === "panel") this.parts.classList.toggle("panel-closed", now === "closed");
+        if (name === "kinship") this.restyle();
+        if (name === "theme") this.applyTheme();
+        if ((name === "focus" || name === "view") && this.opened) this.show(this.attributeState());
+    }
+
+    // --- the family ---
+
+    /** The family that is shown; null before any. */
+    get family(): OpenFamily | null {
+        return this.opened;
+    }
+
+    /** What is shown; null before any picture. */
+    get state(): ViewState | null {
+        return this.shownState;
+    }
+
+    /** The selected person: the one that the panel is about. */
+    get selected(): Person | null {
+        return this.opened?.person(this.shownPerson) ?? null;
+    }
+
+    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be had or read. */
+    async load(address: string): Promise<void> {
+        const response = await fetch(address);
+        if (!response.ok) throw new Error(`${response.url}: ${response.status} ${response.statusText}`);
+        const name = decodeURIComponent(new URL(address, document.baseURI).pathname.split("/").at(-1) || address);
+        await this.open(new Uint8Array(await response.arrayBuffer()), name);
+    }
+
+    /** Shows the bytes of a GEDCOM file. Rejects with GedcomError where they are none. */
+    async open(bytes: Uint8Array, name = "family.ged"): Promise<void> {
+        if (!OlvaneTree.engine) throw new Error("OlvaneTree.engine is not set");
+        const engine = await OlvaneTree.engine;
+        this.openFile(engine.readGedcom(bytes, name));
+    }
+
+    /** Shows a file that is open already; the viewer closes it when it gets another. */
+    openFile(file: GedcomFile, title = file.name, livingHidden = false): void {
+        this.setFamily(new OpenFamily(file, title, livingHidden));
+        this.show(this.attributeState());
+        this.warmUp();
+    }
+
+    /** Takes a family without showing it yet: show() follows. */
+    setFamily(family: OpenFamily): void {
+        this.opened?.close();
+        this.opened = family;
+        this.picture = null;
+        this.shownState = null;
+        this.shownPerson = 0;
+        this.scene.clear();
+        this.overview.clear();
+    }
+
+    // --- what to show ---
+
+    /**
+     * Shows a person, a view or options; what is left out stays as it is. anchor is the box that hands its place
+     * on the screen to the new focus. False where that was not possible: then everything is as before.
+     */
+    show(wanted: Partial<ViewState>, anchor: Box | null = null, byUser = false): boolean {
+        const { opened } = this;
+        if (!opened) return false;
+        const state: ViewState = { ...(this.shownState ?? { ...kUsualState, focus: opened.bestFocus() }), ...wanted };
+        if (this.shownState && this.picture && sameState(state, this.shownState)) return true;
+        const start = performance.now();
+        let picture: Picture;
+        try {
+            picture = opened.picture(state);
+        } catch (error) {
+            this.shownState ??= state;
+            this.emit("refused", { tooLarge: error instanceof LayoutError && error.status === "tooLarge" });
+            return false;
+        }
+        const isNewFocus = this.shownState?.focus !== state.focus;
+        this.shownState = state;
+        this.picture = picture;
+        this.tooltip.hide();
+        this.dress = this.newDress(opened, picture);
+        this.dress.kinshipKnown = opened.persons.length <= kSoonSearched;
+        this.scene.show(picture, this.dress, anchor);
+        this.overview.show(picture, this.dress);
+        this.nameTree();
+        this.learnKinships();
+        const person = opened.person(state.focus)!;
+        if (isNewFocus) this.live.textContent = this.ui.focusNow(this.nameOf(person), picture.boxes.length);
+        this.shownPerson = state.focus;
+        this.refreshPanel();
+        performance.measure("olvane-picture", { start });
+        this.emit("focuschange", { state, person, boxes: picture.boxes.length, byUser });
+        return true;
+    }
+
+    /** Makes a person the focus, from the box where they stand. */
+    focusOn(person: number, from: Box | null = null): void {
+        if (!this.shownState || !person) return;
+        const anchor = from ?? this.picture?.boxesOf(person)[0] ?? null;
+        if (person !== this.shownState.focus) this.show({ focus: person }, anchor, true);
+        else if (this.picture) this.scene.activate(from ?? this.picture.focusBox, false);
+        this.panel.draw(false);
+    }
+
+    /** Selects a person without changing the picture. */
+    select(person: number): void {
+        const box = this.picture?.boxesOf(person)[0];
+        if (box) this.scene.activate(box);
+        else this.showInPanel(person);
+    }
+
+    fit(): void {
+        this.scene.fit();
+    }
+
+    home(): void {
+        this.scene.home();
+    }
+
+    zoomBy(factor: number): void {
+        this.scene.camera.zoomBy(factor);
+    }
+
+    /** Puts the keys on the selected box. */
+    takeKeys(): void {
+        if (this.scene.active) this.scene.activate(this.scene.active);
+    }
+
+    /** Draws the panel down to its name on a narrow window. */
+    closeSheets(): void {
+        this.tooltip.hide();
+        this.corner.closeLegend();
+        this.panel.draw(false);
+    }
+
+    /** The picture and its looks; null before any. */
+    get shown(): Shown | null {
+        const { picture, dress } = this;
+        return picture && dress ? { picture, dress, title: this.pictureTitle(), root: this.shadow } : null;
+    }
+
+    // --- words ---
+
+    nameOf(person: Person): string {
+        return nameOf(person, this.messages);
+    }
+
+    yearsOf(person: Person): string {
+        return yearsOf(person, this.messages);
+    }
+
+    /** To the focus; empty while it is not known. */
+    kinshipOf(person: Person): string {
+        return this.dress?.kinshipKnown ? this.dress.kinshipOf(person.id) : "";
+    }
+
+    private setLanguage(language: string): void {
+        this.messages = messagesFor(language);
+        this.ui = uiMessagesFor(language);
+        this.rebuildUi();
+    }
+
+    // Makes everything that holds words.
+    private rebuildUi(): void {
+        const { ui } = this;
+        this.corner = new Corner(ui, this.overview.element, {
+            zoomIn: () => this.zoomBy(1.35),
+            zoomOut: () => this.zoomBy(1 / 1.35),
+            fit: () => this.fit(),
+            home: () => this.home(),
+        });
+        this.panel = new SidePanel(this.messages, ui, {
+            select: (person) => this.select(person),
+            choose: (person) => {
+                this.focusOn(person);
+                this.takeKeys();
+            },
+            nextBox: (person) => this.nextBox(person),
+            addressOf: (person) => addressOf({ ...this.shownState!, focus: person }, this.opened!.persons),
+        });
+        this.hint.textContent = ui.treeHint;
+        this.stage.replaceChildren(this.hint, this.surface, this.corner.element);
+        this.parts.replaceChildren(this.stage, this.panel.element);
+        this.restyle();
+    }
+
+    /** Writes the boxes again, where words or marks have changed. */
+    private restyle(): void {
+        if (!this.opened || !this.picture || !this.shownState) return;
+        const known = this.dress?.kinshipKnown ?? false;
+        this.dress = this.newDress(this.opened, this.picture);
+        this.dress.kinshipKnown = known;
+        this.scene.restyle(this.dress);
+        this.nameTree();
+        this.refreshPanel();
+    }
+
+    private applyTheme(): void {
+        const theme = this.getAttribute("theme");
+        if (theme) this.dataset["theme"] = theme;
+        else if (matchMedia("(prefers-color-scheme: dark)").matches) this.dataset["theme"] = "dark";
+    }
+
+    // --- events of the picture ---
+
+    private openBox(box: Box): void {
+        if (box.person) this.focusOn(box.person, box);
+        else this.selectBox(box);
+    }
+
+    private selectBox(box: Box): void {
+        const child = this.opened?.person(box.child);
+        if (box.person || !child) return;
+        this.emit("action", { child, parent: box.kind === "missingFather" ? "father" : "mother" });
+    }
+
+    private showInPanel(person: number): void {
+        if (!person || person === this.shownPerson) return;
+        this.shownPerson = person;
+        this.refreshPanel();
+        this.emit("select", { person: this.opened!.person(person)! });
+    }
+
+    private refreshPanel(): void {
+        const { opened, shownState, picture } = this;
+        const person = opened?.person(this.shownPerson);
+        if (!opened || !shownState || !picture || !person) return;
+        const isFocus = person.id === shownState.focus;
+        this.panel.show(person, opened, {
+            focus: opened.person(shownState.focus)!,
+            kinship: isFocus ? "" : (this.dress?.kinshipOf(person.id) ?? ""),
+            boxes: picture.boxesOf(person.id).length,
+        });
+    }
+
+    private pointAt(box: Box | null, element: SVGGElement | null): void {
+        const { picture, dress } = this;
+        const person = box ? this.opened?.person(box.person) : undefined;
+        this.scene.markDuplicates(person && picture!.boxesOf(person.id).length > 1 ? person.id : 0);
+        if (!box || !person || !element || !dress || !picture) return this.tooltip.hide();
+        const hidden = dress.hiddenOf(box);
+        const boxes = picture.boxesOf(person.id).length;
+        this.tooltip.show(element, {
+            name: this.nameOf(person),
+            lines: [
+                this.yearsOf(person),
+                box === picture.focusBox ? this.ui.inFocus : this.kinshipOf(person),
+                hidden >= 0 ? this.ui.hiddenCount(hidden) : "",
+                boxes > 1 ? this.ui.severalBoxes(boxes) : "",
+            ],
+        });
+    }
+
+    private moved(_placing: Placing): void {
+        this.tooltip.hide();
+        this.overview?.follow();
+    }
+
+    private resized(): void {
+        this.scene.resized();
+        this.overview.follow();
+    }
+
+    // --- keys ---
+
+    /** Acts on a key as if it had been pressed in the picture. True where it meant something. */
+    press(event: KeyboardEvent): boolean {
+        const target = event.composedPath()[0] as Element;
+        const inPicture = target === document.body || this.surface.contains(target);
+        return pictureKey(event, inPicture, {
+            moveKeys: (direction) => this.moveKeys(direction),
+            panBy: (dx, dy) => this.scene.camera.panBy(dx, dy),
+            chooseActive: () => this.chooseActive(),
+            nextBox: () => this.nextBox(),
+            home: () => this.home(),
+            zoomIn: () => this.zoomBy(1.35),
+            zoomOut: () => this.zoomBy(1 / 1.35),
+            fit: () => this.fit(),
+            outer: (key) => this.emit("outerkey", { key }),
+        });
+    }
+
+    private key(event: KeyboardEvent): void {
+        if (!this.opened || event.defaultPrevented) return;
+        const target = event.composedPath()[0] as Element;
+        if (target.matches("input:not([type=checkbox]), select, textarea")) return;
+        if (this.press(event)) event.preventDefault();
+    }
+
+    private moveKeys(direction: Direction): void {
+        const { picture, opened } = this;
+        const from = this.scene.active ?? picture?.focusBox;
+        if (!picture || !opened || !from) return;
+        const next = boxTowards(from, direction, picture, opened);
+        if (next) this.scene.activate(next);
+    }
+
+    private chooseActive(): void {
+        if (this.scene.active) this.openBox(this.scene.active);
+    }
+
+    private nextBox(person = this.scene.active?.person ?? 0): void {
+        const boxes = this.picture?.boxesOf(person) ?? [];
+        if (boxes.length < 2) return;
+        const at = boxes.findIndex((box) => box === this.scene.active);
+        this.scene.activate(boxes[(at + 1) % boxes.length]!);
+    }
+
+    // --- the picture's dress ---
+
+    private newDress(family: OpenFamily, picture: Picture): PictureDress {
+        return new PictureDress(family, picture, {
+            messages: this.messages,
+            ui: this.ui,
+            kinshipInBoxes: this.getAttribute("kinship") !== "none",
+        });
+    }
+
+    // In a large family the boxes come first; what is written into them of kinship follows when there is time.
+    private learnKinships(): void {
+        clearTimeout(this.kinshipTimer);
+        if (this.dress?.kinshipKnown) return;
+        this.kinshipTimer = window.setTimeout(() => {
+            if (!this.dress || !this.opened || !this.shownState) return;
+            const start = performance.now();
+            this.opened.kinshipsTo(this.shownState.focus);
+            this.dress.kinshipKnown = true;
+            this.scene.redraw();
+            performance.measure("olvane-kinship", { start });
+        }, kKinshipDelay);
+    }
+
+    /**
+     * Browsers compile well only what has run for a while, so a large picture is laid out a few times more while
+     * nobody waits for it. The first click then is as quick as those after it.
+     */
+    warmUp(times = kWarmUps): void {
+        const { opened } = this;
+        setTimeout(() => {
+            const { shownState } = this;
+            if (!opened || this.opened !== opened || !this.picture || !shownState) return;
+            const start = performance.now();
+            opened.picture(shownState);
+            if (performance.now() - start > kWarmEnough && times > 1) this.warmUp(times - 1);
+        }, kWarmUpPause);
+    }
+
+    private nameTree(): void {
+        setAttributes(this.surface, { "aria-label": this.pictureTitle(), "aria-describedby": "tree-hint" });
+    }
+
+    private pictureTitle(): string {
+        const focus = this.opened?.person(this.shownState?.focus ?? 0);
+        return focus ? this.ui.treeLabel(this.nameOf(focus), this.ui.views[this.shownState!.view]) : "";
+    }
+
+    // The state that the attributes ask for, in the form of an address.
+    private attributeState(): ViewState {
+        const family = this.opened!;
+        const focus = (this.getAttribute("focus") ?? "").replaceAll("@", "");
+        const usual = { ...kUsualState, focus: this.shownState?.focus ?? family.bestFocus() };
+        const view = (this.getAttribute("view") ?? this.shownState?.view ?? usual.view) as ViewName;
+        const parts = new URLSearchParams({ view });
+        if (focus) parts.set("person", focus);
+        return readAddress("#" + parts.toString(), family.persons, usual);
+    }
+
+    private emit<Name extends keyof OlvaneTreeEvents>(
+        name: Name,
+        detail: OlvaneTreeEvents[Name] extends CustomEvent<infer Detail> ? Detail : never,
+    ): boolean {
+        return !this.dispatchEvent(new CustomEvent(name, { detail, cancelable: true }));
+    }
+}
+
+/** Makes <olvane-tree> known to the browser; once is enough. */
+export function defineOlvaneTree(): void {
+    if (!customElements.get("olvane-tree")) customElements.define("olvane-tree", OlvaneTree);
+}

@@ -1,0 +1,375 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The page around the viewer: the bar, the dialogs, the address and what the browser's own history keeps of it.
+// Files come in through FileOpening; everything about the picture is the viewer's.
+
+import type { Diagnostic, GedcomFile, Person } from "olvane";
+import { html, recall, remember } from "../base/dom";
+import type { RelativeName, ViewName } from "../base/views";
+import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
+import type { EmbeddedFamily } from "../engine/engine";
+import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
+import { PictureOutput, type Subject } from "../output/PictureOutput";
+import { fileNameOf } from "../output/saving";
+import { Notices } from "../ui/Notices";
+import type { OuterKey } from "../ui/pictureKeys";
+import { OpenFamily } from "../view/OpenFamily";
+import {
+    addressOf,
+    clampGenerations,
+    kUsualState,
+    readAddress,
+    sameState,
+    unknownPersonIn,
+    type ViewState,
+} from "../view/ViewState";
+import { Chrome, type ChromeActions } from "./Chrome";
+import { fileInput, takeDrops } from "./dropping";
+import { FileOpening, type OpenedFile } from "./FileOpening";
+import { Journey } from "./Journey";
+import { Theme, type ThemeChoice } from "./theme";
+import { Welcome } from "./Welcome";
+
+export class App implements ChromeActions {
+    private ui: UiMessages;
+    private chrome!: Chrome; // made by rebuildUi()
+    private welcome!: Welcome;
+    private fileName = "";
+    private remarks: readonly Diagnostic[] = [];
+    private panelOpen = recall("panel") !== "no";
+    private kinshipInBoxes = recall("kinship") !== "no";
+    // Whether the next picture is one that the history leads to.
+    private arriving = false;
+
+    private readonly tree = document.createElement("olvane-tree") as OlvaneTree;
+    private readonly theme = new Theme(this.tree);
+    private readonly notices = new Notices();
+    private readonly cover = html("div", { class: "cover", hidden: true });
+    private readonly input = fileInput((file) => void this.openDropped([file]));
+    private readonly journey = new Journey((address) => this.arriveAt(address));
+    private readonly output = new PictureOutput(() => this.subject(), this.notices);
+    private readonly files: FileOpening;
+
+    constructor(
+        private readonly root: HTMLElement,
+        engine: ConstructorParameters<typeof FileOpening>[0],
+    ) {
+        const language = recall("language") ?? navigator.language;
+        this.ui = uiMessagesFor(language);
+        this.files = new FileOpening(engine);
+        this.tree.setAttribute("language", language);
+        this.tree.setAttribute("kinship", this.kinshipInBoxes ? "boxes" : "none");
+        this.listen();
+        takeDrops(this.cover, (files) => void this.openDropped(files));
+        addEventListener("keydown", (event) => this.key(event));
+        this.rebuildUi();
+    }
+
+    // --- families ---
+
+    openEmbedded(embedded: EmbeddedFamily): void {
+        try {
+            this.show(this.files.openEmbedded(embedded), embedded);
+        } catch (error) {
+            this.refuse(embedded.name, error);
+        }
+    }
+
+    // One family at a time: of several files the first is opened, and the page says so.
+    async openDropped([file, ...others]: readonly File[]): Promise<void> {
+        if (!file) return;
+        this.notices.clear();
+        this.welcome.showReading(file.name);
+        await pause();
+        try {
+            this.show(await this.files.openFile(file), null);
+            if (others.length > 0) this.notices.tell(this.ui.firstOfFiles(quoted(file.name)));
+        } catch (error) {
+            this.refuse(file.name, error);
+        }
+        this.welcome.showReading(null);
+    }
+
+    private show({ file, name, title }: OpenedFile, embedded: EmbeddedFamily | null): void {
+        const start = performance.now();
+        // Of an empty page only a link as it was followed is meant for the first file; what we wrote named
+        // persons of another.
+        const isLinked = embedded !== null || (this.tree.family === null && history.state === null);
+        const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
+        this.fileName = name;
+        this.remarks = embedded?.remarks ?? file.diagnostics;
+        this.tree.setFamily(family);
+        document.title = title;
+        this.arrange();
+        const usual: ViewState = {
+            ...kUsualState,
+            focus: family.person(embedded?.focus ?? 0)?.id ?? family.bestFocus(),
+            view: embedded?.view === "pedigree" ? "pedigree" : "family",
+        };
+        const address = isLinked ? location.hash : "";
+        const state = readAddress(address, family.persons, usual);
+        this.journey.begin(addressOf(state, family.persons), embedded !== null);
+        this.arrive(state);
+        performance.measure("olvane-open", { start });
+        this.greet(family);
+        this.nameUnknownPerson(address);
+        this.tree.warmUp();
+        if (!embedded) this.warnOfErrors(file);
+    }
+
+    // Who was sent a page cannot fix the file behind it.
+    private warnOfErrors(file: GedcomFile): void {
+        if (!file.diagnostics.some((one) => one.severity === "error")) return;
+        const summary = this.ui.diagnostics.summary(file.persons.length, file.diagnostics.length);
+        this.notices.warn(summary, this.ui.diagnostics.show, () => this.chrome.openDiagnostics());
+    }
+
+    private greet(family: OpenFamily): void {
+        if (recall("greeted") !== "yes") this.notices.tell(this.ui.firstHint);
+        remember("greeted", "yes");
+        if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
+    }
+
+    // A link that leads to nobody is named; one that leads somewhere takes the notice away.
+    private nameUnknownPerson(address: string): void {
+        const link = unknownPersonIn(address, this.tree.family!.persons);
+        if (link) this.notices.fail(this.ui.errors.stranger(quoted(link)), [], "link");
+        else this.notices.clear("link");
+    }
+
+    private refuse(name: string, error: unknown): void {
+        const [text, details] = this.files.complaint(name, error, this.ui);
+        this.notices.fail(text, details);
+    }
+
+    // --- the way through the family ---
+
+    private travel(change: Partial<ViewState>): void {
+        const { state } = this.tree;
+        if (state && !sameState({ ...state, ...change }, state)) this.tree.show(change, null, true);
+    }
+
+    private arrive(state: ViewState): void {
+        this.arriving = true;
+        this.tree.show(state);
+        this.arriving = false;
+        this.showState();
+    }
+
+    private arriveAt(address: string): void {
+        const { family, state } = this.tree;
+        if (!family || !state) return;
+        const wanted = readAddress(address, family.persons, state);
+        if (!sameState(wanted, state)) this.arrive(wanted);
+        this.nameUnknownPerson(address);
+        const shown = addressOf(this.tree.state!, family.persons);
+        if (address !== shown) this.journey.replace(shown);
+        this.showState();
+    }
+
+    private listen(): void {
+        const on = <Name extends keyof OlvaneTreeEvents>(
+            name: Name,
+            act: (event: OlvaneTreeEvents[Name]) => void,
+        ) => this.tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
+        on("focuschange", ({ detail }) => {
+            if (!this.arriving) this.journey.add(addressOf(detail.state, this.tree.family!.persons));
+            this.showState();
+        });
+        on("refused", ({ detail }) =>
+            this.notices.fail(detail.tooLarge ? this.ui.errors.pictureTooLarge : this.ui.errors.layout, []),
+        );
+        on("outerkey", (event) => {
+            if (this.outerKey(event.detail.key)) event.preventDefault();
+        });
+    }
+
+    // --- what the bar and the keys do ---
+
+    setView(view: ViewName): void {
+        this.travel({ view });
+    }
+
+    setRelative(name: RelativeName, shown: boolean): void {
+        const hidden = new Set(this.tree.state?.hidden);
+        if (shown) hidden.delete(name);
+        else hidden.add(name);
+        this.travel({ hidden });
+    }
+
+    setGenerations(generations: number): void {
+        this.travel({ generations: clampGenerations(generations) });
+    }
+
+    setKinshipInBoxes(shown: boolean): void {
+        this.kinshipInBoxes = shown;
+        remember("kinship", shown ? "yes" : "no");
+        this.tree.setAttribute("kinship", shown ? "boxes" : "none");
+    }
+
+    setTheme(theme: ThemeChoice): void {
+        this.theme.choose(theme);
+    }
+
+    setLanguage(language: string): void {
+        remember("language", language);
+        this.ui = uiMessagesFor(language);
+        this.tree.setAttribute("language", language);
+        this.rebuildUi();
+        document.getElementById(this.tree.family ? "options-button" : "language")?.focus();
+    }
+
+    back(): void {
+        this.journey.back();
+    }
+
+    forward(): void {
+        this.journey.forward();
+    }
+
+    openFile(): void {
+        this.input.click();
+    }
+
+    saveSvg(): void {
+        this.output.saveSvg(this.ui);
+    }
+
+    savePng(): void {
+        void this.output.savePng(this.ui);
+    }
+
+    print(): void {
+        window.print();
+    }
+
+    togglePanel(): void {
+        this.panelOpen = !this.panelOpen;
+        remember("panel", this.panelOpen ? "yes" : "no");
+        this.showPanelState();
+    }
+
+    private switchView(): void {
+        const { state } = this.tree;
+        if (state) this.setView(state.view === "family" ? "pedigree" : "family");
+    }
+
+    private outerKey(key: OuterKey): boolean {
+        if (key === "search") this.chrome.search.input.focus();
+        else if (key === "keys") this.chrome.keys.showModal();
+        else if (key === "back") this.back();
+        else if (key === "forward") this.forward();
+        else if (key === "switchView") this.switchView();
+        else {
+            this.notices.clear();
+            this.tree.closeSheets();
+        }
+        return true;
+    }
+
+    // Keys pressed outside the viewer; those inside it have been acted on by the time they come here.
+    private key(event: KeyboardEvent): void {
+        if (!this.tree.family || event.defaultPrevented) return;
+        if (document.querySelector("dialog[open]") || event.composedPath().includes(this.tree)) return;
+        const target = event.target as Element;
+        if (target.matches("input:not([type=checkbox]), select, textarea")) return;
+        if (this.tree.press(event)) event.preventDefault();
+    }
+
+    // --- the search's questions ---
+
+    find(text: string, limit: number): readonly Person[] {
+        return this.tree.family?.index.find(text, limit) ?? [];
+    }
+
+    nameOf(person: Person): string {
+        return this.tree.nameOf(person);
+    }
+
+    yearsOf(person: Person): string {
+        return this.tree.yearsOf(person);
+    }
+
+    kinshipOf(person: Person): string {
+        return this.tree.kinshipOf(person);
+    }
+
+    choose(person: Person): void {
+        this.tree.focusOn(person.id);
+        this.tree.takeKeys();
+    }
+
+    // --- showing ---
+
+    // Makes everything that holds words.
+    private rebuildUi(): void {
+        const { ui } = this;
+        document.documentElement.lang = ui.language;
+        this.chrome = new Chrome(ui, this, { theme: this.theme.choice, kinshipInBoxes: this.kinshipInBoxes });
+        this.welcome = new Welcome(ui, () => this.openFile(), this.languageChooser());
+        this.notices.setDismissLabel(ui.errors.dismiss);
+        this.cover.textContent = ui.welcome.dropNow;
+        this.arrange();
+    }
+
+    private arrange(): void {
+        const { chrome, tree } = this;
+        const { family } = tree;
+        const always = [this.notices.element, this.cover, this.input, this.output.sheet.element];
+        this.root.classList.toggle("empty", !family);
+        if (!family) {
+            this.root.replaceChildren(this.welcome.element, ...always);
+            return;
+        }
+        // The viewer stays where it is: taken out and put back, it would lose the keys.
+        const main = tree.parentElement ?? html("main", { class: "viewer-place" }, tree);
+        for (const child of [...this.root.children]) if (child !== main) child.remove();
+        if (!main.isConnected) this.root.append(main);
+        main.before(chrome.bar);
+        this.root.append(chrome.keys, chrome.diagnostics, ...always);
+        chrome.showFamily(family.title, this.ui.personCount(family.persons.length));
+        chrome.showDiagnostics(this.remarks, family.persons.length);
+        this.showPanelState();
+        this.showState();
+    }
+
+    private showState(): void {
+        const { state } = this.tree;
+        if (state) this.chrome.showState(state, this.journey.canGoBack, this.journey.canGoForward);
+    }
+
+    private showPanelState(): void {
+        this.tree.setAttribute("panel", this.panelOpen ? "open" : "closed");
+        this.root.classList.toggle("panel-closed", !this.panelOpen);
+        this.chrome.showPanelState(this.panelOpen);
+    }
+
+    private subject(): Subject | null {
+        const { shown, state, family } = this.tree;
+        const focus = family?.person(state?.focus ?? 0);
+        if (!shown || !focus) return null;
+        return { ...shown, name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)) };
+    }
+
+    private languageChooser(): HTMLElement {
+        const select = html("select", { id: "language", "aria-label": this.ui.languageLabel });
+        for (const { language, languageName } of uiLanguages) {
+            select.append(
+                html("option", { value: language, selected: language === this.ui.language }, languageName),
+            );
+        }
+        select.addEventListener("change", () => this.setLanguage(select.value));
+        return select;
+    }
+}
+
+// Kept apart from the direction of the text around it.
+function quoted(text: string): string {
+    return "\u2068" + text + "\u2069";
+}
+
+// Lets the browser show what was said so far.
+function pause(): Promise<void> {
+    return new Promise((done) => setTimeout(done, 0));
+}

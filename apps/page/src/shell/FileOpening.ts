@@ -1,0 +1,56 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// How a family file becomes an open family, and what is said of one that does not.
+
+import type { GedcomFile, Olvane } from "olvane";
+import { ArchiveError, gedcomInArchive, isArchive, TooLargeError } from "../engine/archive";
+import type { EmbeddedFamily } from "../engine/engine";
+import type { UiMessages } from "../messages/ui";
+
+const kMostBytes = 128 * 2 ** 20; // of a file
+
+/** A file that was read and has somebody in it. */
+export interface OpenedFile {
+    readonly file: GedcomFile;
+    readonly name: string;
+    readonly title: string;
+}
+
+export class FileOpening {
+    constructor(private readonly engine: Olvane) {}
+
+    openEmbedded({ bytes, name, title }: EmbeddedFamily): OpenedFile {
+        return this.read(bytes, name, title);
+    }
+
+    // Throws as complaint() knows.
+    async openFile(file: File): Promise<OpenedFile> {
+        if (file.size > kMostBytes) throw new TooLargeError();
+        const bytes = new Uint8Array(await file.arrayBuffer());
+        return this.read(isArchive(bytes) ? await gedcomInArchive(bytes, kMostBytes) : bytes, file.name, "");
+    }
+
+    /** What to say of a file that could not be opened: a sentence and details. */
+    complaint(name: string, error: unknown, ui: UiMessages): [string, readonly string[]] {
+        const { errors } = ui;
+        const file = "\u2068" + name + "\u2069";
+        if (error instanceof TooLargeError) return [errors.notGedcom(file), [errors.tooLarge]];
+        if (error instanceof ArchiveError) return [errors.archive, []];
+        if (error instanceof NoPersonsError) return [errors.noPersons(file), []];
+        const detail = error instanceof Error ? error.message : "";
+        return [errors.notGedcom(file), [ui.diagnostics.remark(detail), errors.hint]];
+    }
+
+    private read(bytes: Uint8Array, name: string, title: string): OpenedFile {
+        const file = this.engine.readGedcom(bytes, name);
+        if (file.persons.length === 0) {
+            file.close();
+            throw new NoPersonsError();
+        }
+        return { file, name, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
+    }
+}
+
+// What was read is GEDCOM, with nobody in it.
+class NoPersonsError extends Error {}

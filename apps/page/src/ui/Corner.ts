@@ -1,0 +1,65 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What floats over the lower edge of the picture: the legend, the overview, and the buttons for zooming.
+
+import { iconButton } from "../base/controls";
+import { html } from "../base/dom";
+import { icon, silhouette } from "../base/icons";
+import type { UiMessages } from "../messages/ui";
+
+export interface CornerActions {
+    zoomIn(): void;
+    zoomOut(): void;
+    fit(): void;
+    home(): void;
+}
+
+export class Corner {
+    readonly element: HTMLElement;
+    private readonly legend: HTMLDetailsElement;
+
+    constructor(ui: UiMessages, overview: HTMLElement, actions: CornerActions) {
+        this.legend = legendOf(ui);
+        this.element = html("div", { class: "corner" }, this.legend, overview, zoomButtons(ui, actions));
+    }
+
+    // The keys move to the legend's heading when they stood inside it.
+    closeLegend(): void {
+        if (this.legend.contains((this.legend.getRootNode() as Document | ShadowRoot).activeElement))
+            this.legend.querySelector("summary")!.focus();
+        this.legend.open = false;
+    }
+}
+
+function zoomButtons(ui: UiMessages, actions: CornerActions): HTMLElement {
+    return html(
+        "div",
+        { class: "zoom", part: "zoom", role: "group", "aria-label": ui.zoom },
+        iconButton("zoom-in", "plus", ui.zoomIn, () => actions.zoomIn()),
+        iconButton("zoom-out", "minus", ui.zoomOut, () => actions.zoomOut()),
+        iconButton("fit", "fit", ui.fit, () => actions.fit()),
+        iconButton("home", "home", ui.home, () => actions.home()),
+    );
+}
+
+function legendOf(ui: UiMessages): HTMLDetailsElement {
+    const items = ui.legendItems;
+    const row = (sign: Element, text: string) => html("li", {}, sign, html("span", {}, text));
+    const sign = (className: string, content: Element | string = "") =>
+        html("span", { class: "sign " + className, "aria-hidden": "true" }, content);
+    const list = html(
+        "ul",
+        { tabindex: 0, "aria-label": ui.legend },
+        row(sign("male", silhouette("male")), items.male),
+        row(sign("female", silhouette("female")), items.female),
+        row(sign("other", silhouette("other")), items.other),
+        row(sign("focus"), items.focus),
+        row(sign("more", "+3"), items.hidden),
+        row(sign("missing", "?"), items.missing),
+        row(sign("divorced"), items.divorced),
+        row(sign("adopted"), items.adopted),
+        row(sign("duplicate", icon("duplicates")), items.repeated),
+    );
+    return html("details", { id: "legend", part: "legend" }, html("summary", {}, ui.legend), list);
+}
