@@ -106,13 +106,16 @@ void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defa
         ->type_name("tall|wide");
 }
 
-void addHideLiving(CLI::App& command, bool& hideLiving, int& year, const std::string& further = "") {
+void addHideLiving(CLI::App& command, HidingOptions& hiding, const std::string& further = "") {
     command.add_flag(
-        "--hide-living", hideLiving,
-        "Tell nothing of whoever may be alive but 'Living': no death told and born less than 110 years "
-        "ago, or dates that cannot tell and near kin of such a person" +
+        "--hide-living", hiding.hideLiving,
+        "Hide everyone who may be living, as 'Living': no death is recorded and the birth was less than 110 "
+        "years ago, or the dates decide nothing and the person is near kin of such a person" +
             further);
-    command.add_option("--year", year, "The year that --hide-living counts from; this year if not given")
+    command
+        .add_option("--year", hiding.year,
+                    "The year that --hide-living counts from; this year if not given, or an earlier one of "
+                    "SOURCE_DATE_EPOCH")
         ->check(CLI::Range(1, 9999))
         ->type_name("YEAR");
 }
@@ -213,7 +216,7 @@ private:
             ->type_name("text|json");
         addView(*layout_, layoutOptions_.request);
         addBoxes(*layout_, layoutOptions_.request, "default tall");
-        addHideLiving(*layout_, layoutOptions_.hideLiving, layoutOptions_.year);
+        addHideLiving(*layout_, layoutOptions_.hiding);
         addFamilySwitches(*layout_, layoutOptions_.request);
     }
 
@@ -243,7 +246,7 @@ private:
                 "refused")
             ->check(CLI::IsMember({"A4", "A3", "letter"}))
             ->type_name("A4|A3|letter");
-        addHideLiving(*draw_, drawOptions_.hideLiving, drawOptions_.year);
+        addHideLiving(*draw_, drawOptions_.hiding);
         addFamilySwitches(*draw_, drawOptions_.request);
     }
 
@@ -307,8 +310,7 @@ private:
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
             ->type_name("TEXT");
-        addHideLiving(*page_, pageOptions_.hideLiving, pageOptions_.year,
-                      "; nor any free text about others that may name them");
+        addHideLiving(*page_, pageOptions_.hiding, "; nor any free text about others that may name them");
         needsFile(focus);
         needsFile(page_->get_option("--hide-living"));
         needsFile(page_->get_option("--title"));

@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include <cli/HiddenPersons.h>
 #include <cli/LayoutRun.h>
 
 namespace olvane::cli {
@@ -22,8 +23,7 @@ struct LayoutOptions {
     std::string file;
     std::string focus;
     bool json = false;
-    bool hideLiving = false;
-    int year = 0;  // as with DrawOptions
+    HidingOptions hiding;
     LayoutRequest request;
 };
 
@@ -35,8 +35,7 @@ struct DrawOptions {
     std::string theme = "light";
     std::string title;  // empty for one made of the focus's name
     std::string page;   // name of a paper; empty for a picture of its own size
-    bool hideLiving = false;
-    int year = 0;  // the present one for hideLiving; 0 asks the clock
+    HidingOptions hiding;
 };
 
 struct BatchOptions {
@@ -58,8 +57,7 @@ struct PageOptions {
     std::string output;
     std::string title;  // empty for one made of the focus's name
     View view = View::family;
-    bool hideLiving = false;
-    int year = 0;  // as with DrawOptions
+    HidingOptions hiding;
 };
 
 int runPeople(const PeopleOptions& options);

@@ -16,11 +16,11 @@
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
-#include <cli/LivingPersons.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PictureConversion.h>
 #include <cli/PictureLabels.h>
+#include <cli/SourceDate.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -79,10 +79,8 @@ draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::Draw
 
 draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options) {
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    std::vector<bool> living;
-    if (options.hideLiving) living = livingPersons(data, options.year != 0 ? options.year : currentYear());
     const std::string text = layoutText(data, focus, options.request);
-    return pictureContent(data, readLayoutText(text), focus, std::move(living));
+    return pictureContent(data, readLayoutText(text), focus, hiddenPersons(data, options.hiding));
 }
 
 // "tree.svg" and sheet 3 of 12 give "tree-03.svg".
@@ -165,7 +163,7 @@ int runDraw(const DrawOptions& options) {
                          " sheets; name a file for them");
     }
     if (form == Form::pdf) {
-        writeOutput(options.output, pdfOf(sheets, drawing.title), rules);
+        writeOutput(options.output, pdfOf(sheets, drawing.title, sourceDate()), rules);
     } else {
         writeSheets(options, form, sheets, rules);
     }

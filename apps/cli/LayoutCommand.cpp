@@ -8,7 +8,6 @@
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/LayoutJson.h>
-#include <cli/LivingPersons.h>
 #include <cli/OutputFile.h>
 
 namespace olvane::cli {
@@ -18,10 +17,8 @@ int runLayout(const LayoutOptions& options) {
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
     std::string text = layoutText(data, focus, options.request);
     if (options.json) {
-        std::vector<bool> living;
-        if (options.hideLiving)
-            living = livingPersons(data, options.year != 0 ? options.year : currentYear());
-        text = layoutJson(data, focus, options.request, readLayoutText(text), living);
+        text = layoutJson(data, focus, options.request, readLayoutText(text),
+                          hiddenPersons(data, options.hiding));
     }
     writeStandardOutput(text + "\n");
     return 0;

@@ -6,7 +6,6 @@
 
 #include <cli/LivingPersons.h>
 
-#include <chrono>
 #include <cstdint>
 
 namespace olvane::cli {
@@ -77,11 +76,6 @@ std::vector<bool> livingPersons(const gedcom::GedcomData& data, int thisYear) {
         living[i] = signs[i] == Sign::alive || (signs[i] == Sign::cannotTell && near[i]);
     }
     return living;
-}
-
-int currentYear() {
-    const auto today = std::chrono::floor<std::chrono::days>(std::chrono::system_clock::now());
-    return static_cast<int>(std::chrono::year_month_day(today).year());
 }
 
 }  // namespace olvane::cli

@@ -16,7 +16,4 @@ namespace olvane::cli {
 // Holds: one entry for each person of the file; entry 0 is person 1.
 std::vector<bool> livingPersons(const gedcom::GedcomData& data, int thisYear);
 
-// By the clock of the machine.
-int currentYear();
-
 }  // namespace olvane::cli

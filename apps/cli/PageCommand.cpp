@@ -12,7 +12,6 @@
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
-#include <cli/LivingPersons.h>
 #include <cli/OutputFile.h>
 #include <cli/PageFamily.h>
 #include <cli/PageTemplate.h>
@@ -36,8 +35,11 @@ void refuseTooLarge(const gedcom::GedcomData& data, std::size_t bytes) {
         "family, or draw pictures");
 }
 
-std::string fileNameOf(const std::string& path) {
-    return path.substr(path.find_last_of('/') + 1);
+// The name that the page knows the file by. A file is often named after somebody, so with anybody hidden, as without
+// a name, it has a common one.
+std::string fileNameOf(const PageOptions& options) {
+    if (options.hiding.hideLiving || options.file == kStandardInput) return "family.ged";
+    return options.file.substr(options.file.find_last_of('/') + 1);
 }
 
 std::string withoutEnding(const std::string& name) {
@@ -46,10 +48,10 @@ std::string withoutEnding(const std::string& name) {
 }
 
 // No word of any language: the page speaks its reader's own.
-std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus,
-                    const gedcom::WriteOptions& hiding) {
-    std::string fileTitle = withoutEnding(fileNameOf(data.file()));
-    if (focus == 0 || (!hiding.hidden.empty() && hiding.hidden[focus - 1])) return fileTitle;
+std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const PageFamily& family,
+                    const std::vector<bool>& hidden) {
+    const std::string fileTitle = withoutEnding(family.name);
+    if (focus == 0 || (!hidden.empty() && hidden[focus - 1])) return fileTitle;
     const std::string name = gedcom::displayName(data.firstName(focus));
     return name.empty() ? fileTitle : name;
 }
@@ -62,20 +64,18 @@ std::string focusOf(gedcom::PersonId focus) {
 PageFamily familyOf(const PageOptions& options) {
     const gedcom::GedcomData data = readFileWithFacts(options.file);
     gedcom::WriteOptions hiding;
-    if (options.hideLiving) {
-        hiding.hidden = livingPersons(data, options.year != 0 ? options.year : currentYear());
-    }
+    hiding.hidden = hiddenPersons(data, options.hiding);
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
     PageFamily family;
     family.gedcom = gedcom::writeGedcom(data, hiding);
     refuseTooLarge(data, family.gedcom.size());
-    family.name = fileNameOf(options.file);
-    family.title = options.title.empty() ? titleOf(data, focus, hiding) : options.title;
+    family.name = fileNameOf(options);
+    family.title = options.title.empty() ? titleOf(data, focus, family, hiding.hidden) : options.title;
     family.focus = focusOf(focus);
     family.view = options.view == View::pedigree ? "pedigree" : "family";
-    family.livingHidden = options.hideLiving;
+    family.livingHidden = options.hiding.hideLiving;
     // They quote the file, and so may name whom the page does not.
-    if (!options.hideLiving) family.remarks = data.diagnostics();
+    if (!options.hiding.hideLiving) family.remarks = data.diagnostics();
     return family;
 }
 

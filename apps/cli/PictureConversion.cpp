@@ -6,7 +6,9 @@
 #include <cli/PictureConversion.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <cstdio>
 #include <memory>
 #include <stdexcept>
 
@@ -62,6 +64,20 @@ void renderOnto(cairo_t* target, const draw::SvgPicture& picture) {
     requireSuccess(lib.cairo_status(target));
 }
 
+// As ISO 8601 has it, in universal time; empty without a date.
+std::string isoDate(const std::optional<std::chrono::sys_seconds>& date) {
+    if (!date) return {};
+    const auto day = std::chrono::floor<std::chrono::days>(*date);
+    const std::chrono::year_month_day calendar(day);
+    const std::chrono::hh_mm_ss time(*date - day);
+    std::array<char, 32> text{};
+    std::snprintf(text.data(), text.size(), "%04d-%02u-%02uT%02d:%02d:%02dZ",
+                  static_cast<int>(calendar.year()), static_cast<unsigned>(calendar.month()),
+                  static_cast<unsigned>(calendar.day()), static_cast<int>(time.hours().count()),
+                  static_cast<int>(time.minutes().count()), static_cast<int>(time.seconds().count()));
+    return text.data();
+}
+
 double longestSide(const draw::SvgPicture& picture) {
     return std::max({picture.width, picture.height, 1});
 }
@@ -92,13 +108,17 @@ std::string pngOf(const draw::SvgPicture& picture, double scale) {
     return bytes;
 }
 
-std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title) {
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title,
+                  const std::optional<std::chrono::sys_seconds>& created) {
     const RenderLibraries& lib = renderLibraries();
     std::string bytes;
     {
         const auto surface = owned(lib.cairo_pdf_surface_create_for_stream(appendBytes, &bytes, 1, 1),
                                    lib.cairo_surface_destroy);
         lib.cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_TITLE, title.c_str());
+        // Left to itself, cairo writes the time of day.
+        lib.cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_CREATE_DATE,
+                                           isoDate(created).c_str());
         for (const draw::SvgPicture& page : pages) {
             const double scale = std::min(kPointsOfPx, kLongestPdf / longestSide(page));
             lib.cairo_pdf_surface_set_size(surface.get(), page.width * scale, page.height * scale);

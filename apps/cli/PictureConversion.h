@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <chrono>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -22,7 +24,9 @@ double pngScale(const draw::SvgPicture& picture, double wanted);
 std::string pngOf(const draw::SvgPicture& picture, double scale);
 
 // A PDF with one page for each picture, of its size at 96 px an inch, in vectors and with its text as text. A
-// page larger than the form allows (14,400 points) is scaled down.
-std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title);
+// page larger than the form allows (14,400 points) is scaled down. The same pages give the same bytes; created is the
+// time of creation that it states, none where empty.
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title,
+                  const std::optional<std::chrono::sys_seconds>& created);
 
 }  // namespace olvane::cli

@@ -87,7 +87,7 @@ private:
     NameSpotter spotHiddenNames() const {
         NameSpotter names;
         for (PersonId id = 1; id <= data_.personCount(); ++id) {
-            if (isHidden(id)) names.add(data_, id);
+            isHidden(id) ? names.add(data_, id) : names.addOther(data_, id);
         }
         names.settle();
         return names;
@@ -98,7 +98,13 @@ private:
         return anybodyHidden_ && hiddenNames_.isNamedIn(text) ? std::string_view() : text;
     }
 
-    // Identifiers that stay are settled first, so that none that is made meets one of them.
+    // As shown, and nothing either where a single word is a name of somebody hidden and of nobody else. For texts
+    // that may be about anybody; a place or a date may bear a name by chance.
+    std::string_view shownText(std::string_view text) const {
+        return anybodyHidden_ && hiddenNames_.isHintedAtIn(text) ? std::string_view() : shown(text);
+    }
+
+    // Identifiers that stay are settled first, so that none that is made meets one of them, nor one that is hidden.
     void nameRecords() {
         personXrefs_.resize(data_.personCount());
         familyXrefs_.resize(data_.familyCount());
@@ -106,14 +112,17 @@ private:
             if (!isHidden(id)) keepXref(personXrefs_[id - 1], data_.person(id).xref);
         }
         for (FamilyId id = 1; id <= data_.familyCount(); ++id) {
-            if (!hasHiddenPartner(id)) keepXref(familyXrefs_[id - 1], data_.family(id).xref);
+            if (!isBare(id)) keepXref(familyXrefs_[id - 1], data_.family(id).xref);
         }
+        for (const Person& person : data_.persons()) taken_.insert(std::string(person.xref));
+        for (const Family& family : data_.families()) taken_.insert(std::string(family.xref));
         for (PersonId id = 1; id <= data_.personCount(); ++id) makeXref(personXrefs_[id - 1], "P", id);
         for (FamilyId id = 1; id <= data_.familyCount(); ++id) makeXref(familyXrefs_[id - 1], "U", id);
     }
 
     void keepXref(std::string& name, std::string_view xref) {
-        if (isPlainXref(xref) && !shown(xref).empty() && taken_.insert(std::string(xref)).second) name = xref;
+        if (isPlainXref(xref) && !shownText(xref).empty() && taken_.insert(std::string(xref)).second)
+            name = xref;
     }
 
     void makeXref(std::string& name, const char* prefix, std::uint32_t id) {
@@ -122,9 +131,15 @@ private:
         while (!taken_.insert(name).second) name += 'X';
     }
 
-    bool hasHiddenPartner(FamilyId id) const {
+    // A family of which nothing is told but who belongs to it: one with a hidden partner, or without a partner and
+    // with hidden children, who alone know of it.
+    bool isBare(FamilyId id) const {
         const Family& family = data_.family(id);
-        return isHidden(family.husband) || isHidden(family.wife);
+        if (isHidden(family.husband) || isHidden(family.wife)) return true;
+        if (family.husband != 0 || family.wife != 0) return false;
+        const auto links = data_.childLinks(id);
+        return std::any_of(links.begin(), links.end(),
+                           [this](const ChildLink& link) { return isHidden(link.child); });
     }
 
     void writeHeader() {
@@ -162,7 +177,7 @@ private:
         piece("GIVN", name.given);
         piece("SURN", name.surname);
         piece("NSFX", name.suffix);
-        piece("NICK", name.nickname);
+        piece("NICK", shownText(name.nickname));
     }
 
     void piece(std::string_view tag, std::string_view value) {
@@ -171,7 +186,7 @@ private:
 
     void writeFact(const Fact& fact) {
         const bool untold = anybodyHidden_ && isFreeText(fact);
-        const std::string_view value = untold ? std::string_view() : shown(fact.value);
+        const std::string_view value = untold ? std::string_view() : shownText(fact.value);
         const std::string_view place = shown(fact.place);
         const std::string_view date = shown(fact.date.written);
         const bool bare = value.empty() && place.empty() && date.empty();
@@ -223,7 +238,7 @@ private:
         for (const ChildLink& link : data_.childLinks(id)) {
             if (link.child != 0) pointer(1, "CHIL", personXrefs_[link.child - 1]);
         }
-        if (hasHiddenPartner(id)) return;
+        if (isBare(id)) return;
         for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);
     }
 

@@ -22,13 +22,16 @@ struct WriteOptions {
 //
 // Holds: UTF-8. Read again with facts, it gives the same persons and families with the same ids, relatives,
 //        names, dates and facts. Identifiers stay where each stands for one record; others are made. Of a
-//        hidden person there are sex and links alone, and no word on adoption; of a family with a hidden partner
-//        there is nothing but who belongs to it.
-//        With anybody hidden, free text of others stays out too: the values of EVEN and FACT, and any value, place,
-//        date or identifier that holds, as words in any order and whatever their capitals and accents, a given
-//        name or nickname of a hidden person and a surname of theirs or of a spouse. Where no surname is given, the
-//        last word of the name stands for it. Particles in small letters and single letters are no such words, and
-//        of very long names the first words alone count. Names of those who are not hidden stay.
+//        hidden person there are sex and links alone, and no word on adoption; of a family with a hidden partner, or
+//        with hidden children and no partner, there is nothing but who belongs to it. No identifier of theirs is
+//        in the text, not even for another record.
+//        With anybody hidden, free text of others stays out too: the values of EVEN and FACT, and any value,
+//        nickname, place, date or identifier that holds, as words in any order and whatever their capitals and
+//        accents, a given name or nickname of a hidden person and a surname of theirs or of a spouse; and any value,
+//        nickname or identifier with a single word that is such a name of somebody hidden and of nobody else. Where
+//        no surname is given, the last word of the name stands for it. Particles in small letters and single letters
+//        are no such words, and of very long names the first words alone count. Given names and surnames of those who
+//        are not hidden stay.
 // Units: time grows with the size of the data, whoever is hidden.
 // Fails: what was read without facts is written without; nothing is thrown but std::bad_alloc.
 std::string writeGedcom(const GedcomData& data, const WriteOptions& options = {});

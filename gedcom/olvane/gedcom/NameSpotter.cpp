@@ -212,6 +212,8 @@ void NameSpotter::add(const GedcomData& data, PersonId id) {
         given.pop_back();
     }
     for (const PersonName& name : someNames(data, id)) addSome(wordsOfName(name.nickname), given);
+    ownWords_.insert(ownWords_.end(), given.begin(), given.end());
+    ownWords_.insert(ownWords_.end(), surnames.begin(), surnames.end());
     addSpousesSurnames(data, id, surnames);
     for (const std::uint64_t word : given) {
         for (const std::uint64_t surname : surnames) pairs_.push_back(pairOf(word, surname));
@@ -220,8 +222,18 @@ void NameSpotter::add(const GedcomData& data, PersonId id) {
     surnameWords_.insert(surnameWords_.end(), surnames.begin(), surnames.end());
 }
 
+void NameSpotter::addOther(const GedcomData& data, PersonId id) {
+    Hashes words;
+    for (const PersonName& name : someNames(data, id)) {
+        addGivenNames(name, words);
+        addSurname(name, words);
+    }
+    otherWords_.insert(otherWords_.end(), words.begin(), words.end());
+}
+
 void NameSpotter::settle() {
-    for (Hashes* const set : {&givenWords_, &surnameWords_, &pairs_}) makeSet(*set);
+    for (Hashes* const set : {&givenWords_, &surnameWords_, &pairs_, &ownWords_, &otherWords_}) makeSet(*set);
+    std::erase_if(ownWords_, [this](std::uint64_t word) { return contains(otherWords_, word); });
 }
 
 bool NameSpotter::isNamedIn(std::string_view text) const {
@@ -234,6 +246,12 @@ bool NameSpotter::isNamedIn(std::string_view text) const {
         return std::any_of(surnames.begin(), surnames.end(),
                            [&](std::uint64_t surname) { return contains(pairs_, pairOf(word, surname)); });
     });
+}
+
+bool NameSpotter::isHintedAtIn(std::string_view text) const {
+    const Hashes words = wordsOfText(text);
+    return std::any_of(words.begin(), words.end(),
+                       [this](std::uint64_t word) { return contains(ownWords_, word); });
 }
 
 }  // namespace olvane::gedcom
