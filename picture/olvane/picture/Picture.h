@@ -54,8 +54,8 @@ enum class LineRole : std::uint8_t { marriage, drop, bar, stem, link };
 
 // A straight piece of the lines of a family: horizontal or vertical, save in round charts.
 //
-// Units: points. bridges are places along the piece, from (x1, y1), in Picture::bridges: there it jumps over
-//        another family's line.
+// Units: points. Its bridges, in Picture::bridges, are places on the piece where it jumps over another family's
+//        line: the x of each on a horizontal piece, the y on a vertical one.
 struct Line {
     double x1 = 0;
     double y1 = 0;
@@ -106,7 +106,7 @@ struct Picture {
     std::vector<Index> members;
     std::vector<kin::ChildKind> childKinds;  // beside members; of no meaning at a parent
     std::vector<Line> lines;
-    std::vector<float> bridges;
+    std::vector<double> bridges;
     std::vector<Mark> marks;
 
     bool isRound() const { return !arcs.empty(); }
@@ -120,7 +120,7 @@ struct Picture {
         return {childKinds.data() + f.firstMember + f.parentCount, f.childCount};
     }
     std::span<const Line> linesOf(const Family& f) const { return {lines.data() + f.firstLine, f.lineCount}; }
-    std::span<const float> bridgesOf(const Line& line) const {
+    std::span<const double> bridgesOf(const Line& line) const {
         return {bridges.data() + line.firstBridge, line.bridgeCount};
     }
 };
