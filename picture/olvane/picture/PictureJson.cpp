@@ -1,0 +1,188 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Writes JSON by hand: the same bytes from every compiler, and no library to load in a browser.
+
+#include <olvane/picture/PictureJson.h>
+
+#include <array>
+#include <cmath>
+#include <cstdint>
+#include <string_view>
+
+#include <olvane/picture/PictureNames.h>
+
+namespace olvane::picture {
+
+namespace {
+
+constexpr double kDecimals = 1000;
+constexpr double kMostThousandths = 9e18;
+
+// Rounded to thousandths, without trailing zeros; what is not finite is 0.
+std::string number(double value) {
+    const double thousandths = std::round(value * kDecimals);
+    if (!(std::abs(thousandths) < kMostThousandths)) return "0";
+    const auto whole = static_cast<std::int64_t>(thousandths);
+    const std::int64_t positive = whole < 0 ? -whole : whole;
+    std::string text = (whole < 0 ? "-" : "") + std::to_string(positive / 1000);
+    std::string decimals = std::to_string(positive % 1000 + 1000).substr(1);
+    while (!decimals.empty() && decimals.back() == '0') decimals.pop_back();
+    return decimals.empty() ? text : text + "." + decimals;
+}
+
+std::string quoted(std::string_view text) {
+    constexpr std::string_view kHex = "0123456789abcdef";
+    std::string json = "\"";
+    for (const char c : text) {
+        const auto byte = static_cast<unsigned char>(c);
+        if (c == '"' || c == '\\') {
+            json += '\\';
+            json += c;
+        } else if (byte < 0x20) {
+            json += "\\u00";
+            json += kHex[byte >> 4];
+            json += kHex[byte & 15];
+        } else {
+            json += c;
+        }
+    }
+    return json + "\"";
+}
+
+template <class Values, class Text>
+std::string listOf(const Values& values, Text text) {
+    std::string json = "[";
+    for (const auto& value : values) {
+        if (json.size() > 1) json += ", ";
+        json += text(value);
+    }
+    return json + "]";
+}
+
+std::string placesJson(std::span<const Index> places) {
+    return listOf(places, [](Index place) { return std::to_string(place); });
+}
+
+std::string field(std::string_view name, double value) {
+    return ", \"" + std::string(name) + "\": " + number(value);
+}
+
+// The x of a place on a horizontal piece, the y on a vertical one; on others the distance itself.
+double coordinateAlong(const Line& line, double distance) {
+    if (line.y1 == line.y2) return line.x1 < line.x2 ? line.x1 + distance : line.x1 - distance;
+    if (line.x1 == line.x2) return line.y1 < line.y2 ? line.y1 + distance : line.y1 - distance;
+    return distance;
+}
+
+class PictureWriter {
+public:
+    PictureWriter(const Picture& picture, const PictureFacts& facts) : picture_(picture), facts_(facts) {}
+
+    std::string write() {
+        const std::int64_t focus =
+            picture_.focus == kNone ? 0 : picture_.boxes[static_cast<std::size_t>(picture_.focus)].id;
+        json_ = "{\n \"format\": 2,\n \"view\": " + quoted(picture_.view) +
+                ",\n \"focus\": " + std::to_string(focus) + ",\n";
+        addList("boxes", picture_.boxes.size(), [this](std::size_t i) { return boxJson(i); });
+        json_ += ",\n";
+        addList("families", picture_.families.size(),
+                [this](std::size_t i) { return familyJson(picture_.families[i]); });
+        json_ += ",\n";
+        addList("marks", picture_.marks.size(),
+                [this](std::size_t i) { return markJson(picture_.marks[i]); });
+        return std::move(json_) + "\n}\n";
+    }
+
+private:
+    template <class Entry>
+    void addList(std::string_view name, std::size_t count, Entry entry) {
+        json_ += " " + quoted(name) + ": [";
+        for (std::size_t i = 0; i < count; ++i) json_ += (i == 0 ? "\n  " : ",\n  ") + entry(i);
+        json_ += count == 0 ? "]" : "\n ]";
+    }
+
+    std::string boxJson(std::size_t i) const {
+        const Box& box = picture_.boxes[i];
+        std::string json = "{\"id\": " + std::to_string(box.id) + ", \"kind\": " + quoted(nameOf(box.kind));
+        if (picture_.isRound()) {
+            const Arc& arc = picture_.arcs[i];
+            json += ", \"ring\": " + std::to_string(arc.ring) + field("from", arc.from) + field("to", arc.to);
+        } else {
+            json += field("x", box.x) + field("y", box.y) + field("width", static_cast<double>(box.width)) +
+                    field("height", static_cast<double>(box.height));
+        }
+        if (box.kind == BoxKind::unknownParent) {
+            json += ", \"sex\": " + quoted(nameOf(box.sex));
+            if (box.childOf != kNone) json += ", \"childOf\": " + std::to_string(box.childOf);
+        } else {
+            json += personFields(box);
+        }
+        return json + "}";
+    }
+
+    std::string personFields(const Box& box) const {
+        std::string json = ", \"repeat\": " + std::to_string(box.repeat) +
+                           ", \"hidden\": {\"parents\": " + std::to_string(box.hiddenParents) +
+                           ", \"partners\": " + std::to_string(box.hiddenPartners) +
+                           ", \"children\": " + std::to_string(box.hiddenChildren) + "}";
+        if (box.hasFlag) json += std::string(", \"flag\": ") + (box.flag ? "true" : "false");
+        const std::string person = facts_.person ? facts_.person(box.id) : std::string();
+        return person.empty() ? json : json + ", \"person\": " + person;
+    }
+
+    std::string familyJson(const Family& family) const {
+        std::string json = "{";
+        if (family.number != 0) json += knownFamilyFields(family.number);
+        json += "\"parents\": " + placesJson(picture_.parents(family)) +
+                ", \"children\": " + placesJson(picture_.children(family)) + ", \"childKinds\": " +
+                listOf(picture_.kinds(family), [](kin::ChildKind kind) { return quoted(nameOf(kind)); }) +
+                ", \"style\": " + quoted(nameOf(family.style)) + ",\n   \"lines\": [";
+        std::string_view separator = "\n    ";
+        for (const Line& line : picture_.linesOf(family)) {
+            json.append(separator).append(lineJson(line));
+            separator = ",\n    ";
+        }
+        return json + "]}";
+    }
+
+    std::string knownFamilyFields(std::uint32_t familyNumber) const {
+        std::string json = "\"number\": " + std::to_string(familyNumber) + ", ";
+        const std::string xref = facts_.familyXref ? facts_.familyXref(familyNumber) : std::string();
+        if (!xref.empty()) json += "\"xref\": " + quoted(xref) + ", ";
+        const std::string label = facts_.familyLabel ? facts_.familyLabel(familyNumber) : std::string();
+        if (!label.empty()) json += "\"label\": " + quoted(label) + ", ";
+        return json;
+    }
+
+    std::string lineJson(const Line& line) const {
+        return "{\"role\": " + quoted(nameOf(line.role)) + field("x1", line.x1) + field("y1", line.y1) +
+               field("x2", line.x2) + field("y2", line.y2) +
+               ", \"child\": " + (line.child == kNone ? "null" : std::to_string(line.child)) +
+               ", \"bridges\": " +
+               listOf(picture_.bridgesOf(line),
+                      [](float place) { return number(static_cast<double>(place)); }) +
+               "}";
+    }
+
+    static std::string markJson(const Mark& mark) {
+        std::string boxes;
+        for (const Index box : mark.boxes) {
+            if (box != kNone) boxes += (boxes.empty() ? "" : ", ") + std::to_string(box);
+        }
+        return "{\"kind\": " + quoted(nameOf(mark.kind)) + ", \"boxes\": [" + boxes +
+               "], \"number\": " + std::to_string(mark.number) + "}";
+    }
+
+    const Picture& picture_;
+    const PictureFacts& facts_;
+    std::string json_;
+};
+
+}  // namespace
+
+std::string pictureJson(const Picture& picture, const PictureFacts& facts) {
+    return PictureWriter(picture, facts).write();
+}
+
+}  // namespace olvane::picture
