@@ -161,7 +161,9 @@ private:
                ", \"child\": " + (line.child == kNone ? "null" : std::to_string(line.child)) +
                ", \"bridges\": " +
                listOf(picture_.bridgesOf(line),
-                      [](float place) { return number(static_cast<double>(place)); }) +
+                      [&line](float place) {
+                          return number(coordinateAlong(line, static_cast<double>(place)));
+                      }) +
                "}";
     }
 
