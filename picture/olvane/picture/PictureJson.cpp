@@ -68,13 +68,6 @@ std::string field(std::string_view name, double value) {
     return ", \"" + std::string(name) + "\": " + number(value);
 }
 
-// The x of a place on a horizontal piece, the y on a vertical one; on others the distance itself.
-double coordinateAlong(const Line& line, double distance) {
-    if (line.y1 == line.y2) return line.x1 < line.x2 ? line.x1 + distance : line.x1 - distance;
-    if (line.x1 == line.x2) return line.y1 < line.y2 ? line.y1 + distance : line.y1 - distance;
-    return distance;
-}
-
 class PictureWriter {
 public:
     PictureWriter(const Picture& picture, const PictureFacts& facts) : picture_(picture), facts_(facts) {}
@@ -159,12 +152,7 @@ private:
         return "{\"role\": " + quoted(nameOf(line.role)) + field("x1", line.x1) + field("y1", line.y1) +
                field("x2", line.x2) + field("y2", line.y2) +
                ", \"child\": " + (line.child == kNone ? "null" : std::to_string(line.child)) +
-               ", \"bridges\": " +
-               listOf(picture_.bridgesOf(line),
-                      [&line](float place) {
-                          return number(coordinateAlong(line, static_cast<double>(place)));
-                      }) +
-               "}";
+               ", \"bridges\": " + listOf(picture_.bridgesOf(line), number) + "}";
     }
 
     static std::string markJson(const Mark& mark) {

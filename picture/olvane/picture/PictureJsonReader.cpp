@@ -101,13 +101,6 @@ Value namedValue(const Json* json, int count, Value fallback) {
     return fallback;
 }
 
-// From the start of the piece to the place with that coordinate; on a slanted piece it is the distance already.
-double distanceAlong(const Line& line, double coordinate) {
-    if (line.y1 == line.y2) return std::abs(coordinate - line.x1);
-    if (line.x1 == line.x2) return std::abs(coordinate - line.y1);
-    return coordinate;
-}
-
 class PictureReader {
 public:
     Picture read(const Json& json) {
@@ -224,7 +217,7 @@ private:
         const Json& bridges = listAt(json, "bridges");
         if (bridges.size() > std::numeric_limits<std::uint16_t>::max()) fail("a line has too many bridges");
         for (const Json& place : bridges) {
-            picture_.bridges.push_back(static_cast<float>(distanceAlong(line, numberOf(place, "bridges"))));
+            picture_.bridges.push_back(numberOf(place, "bridges"));
         }
         line.bridgeCount = static_cast<std::uint16_t>(bridges.size());
         picture_.lines.push_back(line);

@@ -27,7 +27,7 @@ namespace kin = olvane::kin;
 
 namespace {
 
-// A person of id 7 with an unknown mother, in a family of number 3 with one line that jumps at 12.5.
+// A person of id 7 with an unknown mother, in a family of number 3 with one line that jumps at y 92.5.
 Picture smallPicture() {
     Picture picture;
     picture.view = "family";
@@ -47,7 +47,7 @@ Picture smallPicture() {
     picture.members = {1, 0};
     picture.childKinds = {kin::ChildKind::birth, kin::ChildKind::adopted};
     picture.lines.push_back({27.5, 80, 27.5, 110, 0, 0, 1, olvane::picture::LineRole::drop});
-    picture.bridges = {12.5F};
+    picture.bridges = {92.5};
     picture.marks.push_back({{0, 1, olvane::picture::kNone}, 1, olvane::picture::MarkKind::parentsElsewhere});
     return picture;
 }
