@@ -134,10 +134,14 @@ export class GedcomFile {
     }
 }
 
-export function readGedcom(instance, bytes, name) {
+export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
     const { exports } = instance;
     const file = instance.withText(name, (namePointer) =>
-        instance.withBytes(bytes, (pointer, length) => exports.gedcom_open(pointer, length, namePointer)),
+        instance.withText(encoding, (encodingPointer) =>
+            instance.withBytes(bytes, (pointer, length) =>
+                exports.gedcom_open(pointer, length, namePointer, encodingPointer),
+            ),
+        ),
     );
     if (file === 0) throw new GedcomError(instance.text(exports.last_text()));
     try {

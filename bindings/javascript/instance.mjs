@@ -9,6 +9,15 @@ import { PERSON_NOT_FOUND } from "./values.mjs";
 
 const utf8 = { decoder: new TextDecoder(), encoder: new TextEncoder() };
 
+// Undefined for a label that this JavaScript does not know. Bytes that are no character become U+FFFD.
+function decoderOf(label) {
+    try {
+        return new TextDecoder(label, { ignoreBOM: true });
+    } catch {
+        return undefined;
+    }
+}
+
 function wholeId(id) {
     if (Number.isSafeInteger(id)) return id;
     throw new TypeError(`a host answered ${String(id)} where an id is a whole number`);
@@ -151,6 +160,15 @@ export class Instance {
                     const bytes = new Uint8Array(this.exports.memory.buffer, pointer >>> 0, length >>> 0);
                     const text = utf8.decoder.decode(bytes).normalize("NFC");
                     this.withText(text, (made, size) => this.exports.composed_text(result, made, size));
+                },
+                decode: (label, labelLength, pointer, length, result) => {
+                    const memory = this.exports.memory.buffer;
+                    const name = utf8.decoder.decode(new Uint8Array(memory, label >>> 0, labelLength >>> 0));
+                    const decoder = decoderOf(name);
+                    if (decoder === undefined) return 0;
+                    const text = decoder.decode(new Uint8Array(memory, pointer >>> 0, length >>> 0));
+                    this.withText(text, (made, size) => this.exports.composed_text(result, made, size));
+                    return 1;
                 },
             },
         };

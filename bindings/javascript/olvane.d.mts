@@ -232,8 +232,11 @@ export class Olvane {
     layout(host: Host, focus: number, options?: Options): LayoutRecord[];
     /** The engine's own line of text. Throws as layout does. */
     layoutText(host: Host, focus: number, options?: Options): string;
-    /** Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Throws GedcomError. */
-    readGedcom(bytes: Uint8Array, name?: string): GedcomFile;
+    /**
+     * Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Where the file's own word on its
+     * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.
+     */
+    readGedcom(bytes: Uint8Array, name?: string, options?: { readonly encoding?: string }): GedcomFile;
 }
 
 /**

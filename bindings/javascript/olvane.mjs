@@ -27,8 +27,8 @@ export class Olvane {
         return this.#run(host, focus, options).text;
     }
 
-    readGedcom(bytes, name = "family.ged") {
-        return readGedcom(this.#instance, bytes, name);
+    readGedcom(bytes, name = "family.ged", options = {}) {
+        return readGedcom(this.#instance, bytes, name, options);
     }
 
     #run(host, focus, options) {

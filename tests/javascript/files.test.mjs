@@ -127,6 +127,21 @@ test("letters of other encodings come out composed", () => {
     assert.equal(olvane.readGedcom(bytes).persons[0].name, "Grüber");
 });
 
+test("encodings are read by the platform's tables", () => {
+    const named = (encoding, name) => {
+        const head = `0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR ${encoding}\n0 @I1@ INDI\n1 NAME `;
+        return new Uint8Array([...bytesOf(head), ...name, ...bytesOf("\n0 TRLR\n")]);
+    };
+    const nameIn = (encoding, name, options) =>
+        olvane.readGedcom(named(encoding, name), "a.ged", options).persons[0].name;
+    assert.equal(nameIn("KOI8-R", [0xe9, 0xd7, 0xc1, 0xce]), "Иван");
+    assert.equal(nameIn("windows-1253", [0xc1, 0xed, 0xed, 0xe1]), "Αννα");
+    assert.equal(nameIn("Shift_JIS", [0x8e, 0x52, 0x93, 0x63]), "山田");
+    assert.equal(nameIn("ANSI", [0xc8, 0xe2, 0xe0, 0xed], { encoding: "cp1251" }), "Иван");
+    assert.equal(nameIn("IBM852", [0x9d]), "Ł");
+    assert.throws(() => nameIn("ANSI", [0x41], { encoding: "KLINGON" }), /KLINGON/);
+});
+
 test("trouble in a file is told by its line, and the rest is read", () => {
     const file = olvane.readGedcom(bytesOf("0 HEAD\n0 @I1@ INDI\n1 NAME A\n1 FAMS @F9@\n0 @I2@ INDI\n"), "bad.ged");
     assert.equal(file.persons.length, 2);

@@ -184,11 +184,13 @@ const char* toldOrRefused(const Make& make) {
 using namespace olvane;
 using js::OpenFile;
 
-// Null for a file that is refused; last_text then says why.
-OLVANE_EXPORT("gedcom_open") OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name) {
+// An empty encoding is what the file itself says. Null for a file that is refused; last_text then says why.
+OLVANE_EXPORT("gedcom_open")
+OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, const char* encoding) {
     try {
         gedcom::ReadOptions options;
         options.facts = true;
+        options.encoding = encoding;
         return std::make_unique<OpenFile>(gedcom::readGedcomBytes(std::string(bytes, length), name, options))
             .release();
     } catch (const std::exception& error) {

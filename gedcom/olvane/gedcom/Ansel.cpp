@@ -6,6 +6,7 @@
 
 #include <olvane/gedcom/AnselInternal.h>
 
+#include <algorithm>
 #include <cstddef>
 
 #include <olvane/gedcom/LineScannerInternal.h>
@@ -65,18 +66,72 @@ unsigned char characterBehind(std::string_view rest) {
     return static_cast<unsigned char>(rest.empty() ? ' ' : rest.front());
 }
 
+// Marks in a row at the front, up to one more than a letter bears.
+std::size_t markRun(std::string_view rest) {
+    constexpr std::size_t kMoreThanALetterBears = 3;
+    std::size_t run = 0;
+    while (run < rest.size() && run < kMoreThanALetterBears &&
+           markOf(static_cast<unsigned char>(rest[run])) != 0) {
+        ++run;
+    }
+    return run;
+}
+
+// A mark over two letters, which is written as its halves before each: "\xEBi\xECa".
+bool beginsLigature(std::string_view rest) {
+    if (rest.size() < 4) return false;
+    const auto first = static_cast<unsigned char>(rest[0]);
+    const auto second = static_cast<unsigned char>(rest[2]);
+    const bool halves = (first == 0xEB && second == 0xEC) || (first == 0xFA && second == 0xFB);
+    return halves && isLetter(static_cast<unsigned char>(rest[1])) &&
+           isLetter(static_cast<unsigned char>(rest[3]));
+}
+
+bool isAnselLetter(unsigned char byte) {
+    return isLetter(byte) || (byte >= kFirstSign && byte <= 0xBD && signOf(byte) != 0);
+}
+
+// Judges the marks at the front of rest. Outside of words, and where the letter before bears a mark too, as in tables of
+// all characters, a mark may stand before any letter.
+void judgeMarks(std::string_view rest, std::size_t run, bool isInsideWord, AnselCensus& census) {
+    const unsigned char next = characterBehind(rest.substr(run));
+    if (run >= 3 || !isAnselLetter(next)) {
+        census.impossible += run;
+        return;
+    }
+    bool fits = false;
+    for (std::size_t at = 0; at < run && isLetter(next); ++at) {
+        fits = fits || composes(markOf(static_cast<unsigned char>(rest[at])), next);
+    }
+    if (fits) {
+        census.fitting += run;
+    } else if (isInsideWord) {
+        census.doubtful += run;
+    }
+}
+
 }  // namespace
 
 AnselCensus takeAnselCensus(std::string_view bytes) {
+    constexpr std::size_t kLigatureBytes = 3;
     AnselCensus census;
-    for (std::size_t at = 0; at < bytes.size(); ++at) {
+    bool isInsideWord = false;  // the character before is a letter without a mark
+    bool isMarked = false;      // the character in hand bears a mark
+    for (std::size_t at = 0; at < bytes.size();) {
         const auto byte = static_cast<unsigned char>(bytes[at]);
-        if (byte < 0x80) continue;
-        const unsigned char next = characterBehind(bytes.substr(at + 1));
-        const char32_t mark = markOf(byte);
-        const bool fits =
-            mark != 0 ? markOf(next) != 0 || (isLetter(next) && composes(mark, next)) : signOf(byte) != 0;
-        ++(fits ? census.fitting : census.doubtful);
+        const std::string_view rest = bytes.substr(at);
+        const std::size_t run = byte < kFirstMark ? 0 : markRun(rest);
+        const bool isLigature = run == 1 && beginsLigature(rest);
+        if (isLigature) {
+            census.fitting += 2;
+        } else if (run > 0) {
+            judgeMarks(rest, run, isInsideWord, census);
+        } else if (byte >= 0x80) {
+            ++(signOf(byte) != 0 ? census.fitting : census.impossible);
+        }
+        isInsideWord = run == 0 && isLetter(byte) && !isMarked;
+        isMarked = run > 0;
+        at += isLigature ? kLigatureBytes : std::max<std::size_t>(run, 1);
     }
     return census;
 }

@@ -10,7 +10,9 @@ namespace olvane::gedcom {
 // How well bytes fit ANSEL, in which a mark stands before the letter that it belongs to.
 struct AnselCensus {
     std::size_t fitting = 0;   // single characters, and marks before a letter that has them
-    std::size_t doubtful = 0;  // bytes that are no ANSEL, and marks before anything else
+    std::size_t doubtful = 0;  // marks within a word before a letter that has none such in Unicode
+    std::size_t impossible =
+        0;  // bytes that are no ANSEL, marks before what is no letter, three marks in a row
 };
 
 AnselCensus takeAnselCensus(std::string_view bytes);

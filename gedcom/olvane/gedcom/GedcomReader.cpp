@@ -25,7 +25,7 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     DiagnosticList diagnostics(name, options.diagnosticsPerKind);
     const auto store = std::make_shared<TextStore>();
     store->bytes = looksLikeArchive(bytes) ? unpackGedcom(bytes, name, diagnostics) : std::move(bytes);
-    const TextForm form = prepareText(store->bytes, diagnostics);
+    const TextForm form = prepareText(store->bytes, name, options.encoding, diagnostics);
 
     const auto xrefs = std::make_shared<XrefTable>();
     GedcomTables tables;
@@ -39,7 +39,7 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     tables.xrefs = xrefs;
     tables.diagnostics = diagnostics.take();
     tables.file = name;
-    tables.encoding = encodingName(form.encoding);
+    tables.encoding = form.encoding->name;
     tables.version = form.version;
     return GedcomData(std::move(tables));
 }

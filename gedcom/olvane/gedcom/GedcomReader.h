@@ -16,6 +16,8 @@ struct ReadOptions {
     // Whether events and attributes are kept beyond birth, death and marriage, with their places. They take
     // memory, and a layout needs none of them.
     bool facts = false;
+    // The encoding of the file, by any name that GedcomEncodings.h knows. Empty: as the file says and its bytes allow.
+    std::string encoding = {};
 };
 
 // Reads the bytes of a GEDCOM file, 5.5 to 7.0, or of a .gdz archive, in any encoding that is known.

@@ -9,178 +9,40 @@
 
 #include <olvane/gedcom/TextEncodingInternal.h>
 
-#include <array>
+#include <algorithm>
 #include <cstddef>
-#include <optional>
+#include <utility>
 
 #include <olvane/gedcom/AnselInternal.h>
-#include <olvane/gedcom/CodePagesInternal.h>
+#include <olvane/gedcom/EncodingGuessInternal.h>
+#include <olvane/gedcom/GedcomError.h>
 #include <olvane/gedcom/LineScannerInternal.h>
+#include <olvane/gedcom/MultiByteTextInternal.h>
+#include <olvane/gedcom/PlatformDecoderInternal.h>
 #include <olvane/gedcom/UnicodeTextInternal.h>
+#include <olvane/gedcom/Utf16TextInternal.h>
 
 namespace olvane::gedcom {
 namespace {
 
-constexpr char32_t kReplacement = 0xFFFD;
 constexpr std::string_view kUtf8Mark = "\xEF\xBB\xBF";
 
-// What a header may call an encoding. utf16 stands for either order.
-struct EncodingLabel {
-    std::string_view label;
-    Encoding encoding;
-};
-
-constexpr EncodingLabel kLabels[] = {
-    {"UTF-8", Encoding::utf8},
-    {"UTF8", Encoding::utf8},
-    {"UNICODE", Encoding::utf16Little},
-    {"UTF-16", Encoding::utf16Little},
-    {"UTF16", Encoding::utf16Little},
-    {"UTF-16LE", Encoding::utf16Little},
-    {"UTF-16BE", Encoding::utf16Big},
-    {"ANSEL", Encoding::ansel},
-    {"ASCII", Encoding::ascii},
-    {"US-ASCII", Encoding::ascii},
-    {"ANSI", Encoding::windows1252},
-    {"WINDOWS", Encoding::windows1252},
-    {"IBM WINDOWS", Encoding::windows1252},
-    {"WINDOWS-1252", Encoding::windows1252},
-    {"CP1252", Encoding::windows1252},
-    {"ISO-8859-1", Encoding::windows1252},
-    {"ISO8859-1", Encoding::windows1252},
-    {"LATIN1", Encoding::windows1252},
-    {"WINDOWS-1250", Encoding::windows1250},
-    {"CP1250", Encoding::windows1250},
-    {"WINDOWS-1251", Encoding::windows1251},
-    {"CP1251", Encoding::windows1251},
-    {"IBMPC", Encoding::ibm437},
-    {"IBM", Encoding::ibm437},
-    {"IBM-PC", Encoding::ibm437},
-    {"IBM DOS", Encoding::ibm850},
-    {"MSDOS", Encoding::ibm850},
-    {"MS-DOS", Encoding::ibm850},
-    {"CP437", Encoding::ibm437},
-    {"CP850", Encoding::ibm850},
-    {"MACINTOSH", Encoding::macRoman},
-    {"MACROMAN", Encoding::macRoman},
-};
-
-// Names of a maker's system instead of an encoding; what they mean is a custom, not a rule.
-constexpr std::string_view kLooseLabels[] = {"ANSI", "WINDOWS", "IBM WINDOWS", "IBMPC",
-                                             "IBM",  "IBM-PC",  "IBM DOS"};
-
-std::string capitals(std::string_view text) {
-    std::string upper(text);
-    for (char& c : upper) {
-        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 'a' + 'A');
-    }
-    return upper;
+bool isUtf16(const KnownEncoding* encoding) {
+    return encoding == &kUtf16Little || encoding == &kUtf16Big;
 }
 
-std::optional<Encoding> encodingLabelled(const std::string& label) {
-    for (const EncodingLabel& known : kLabels) {
-        if (known.label == label) return known.encoding;
-    }
-    return {};
+bool hasPage(const KnownEncoding* encoding) {
+    return encoding->sort == EncodingSort::ownPage || encoding->sort == EncodingSort::platformPage;
 }
 
-bool isLooseLabel(const std::string& label) {
-    for (const std::string_view loose : kLooseLabels) {
-        if (loose == label) return true;
-    }
-    return false;
-}
-
-bool isUtf16(Encoding encoding) {
-    return encoding == Encoding::utf16Little || encoding == Encoding::utf16Big;
-}
-
-const CodePage* codePageOf(Encoding encoding) {
-    switch (encoding) {
-        case Encoding::windows1250:
-            return &kWindows1250;
-        case Encoding::windows1251:
-            return &kWindows1251;
-        case Encoding::windows1252:
-            return &kWindows1252;
-        case Encoding::ibm437:
-            return &kIbm437;
-        case Encoding::ibm850:
-            return &kIbm850;
-        case Encoding::macRoman:
-            return &kMacRoman;
-        default:
-            return nullptr;
-    }
-}
-
-unsigned byteAt(std::string_view bytes, std::size_t at) {
-    return static_cast<unsigned char>(bytes[at]);
-}
-
-// UTF-16 by its mark, or by the zero byte that every ASCII character has, on one side.
-std::optional<Encoding> utf16OrderOf(std::string_view bytes) {
-    if (bytes.size() < 2) return {};
-    const unsigned first = byteAt(bytes, 0);
-    const unsigned second = byteAt(bytes, 1);
-    if ((first == 0xFF && second == 0xFE) || (first != 0 && second == 0)) return Encoding::utf16Little;
-    if ((first == 0xFE && second == 0xFF) || (first == 0 && second != 0)) return Encoding::utf16Big;
-    return {};
-}
-
-// A lone surrogate in the three bytes that UTF-8 would give it.
-void appendSurrogate(std::string& text, unsigned unit) {
-    text += static_cast<char>(0xE0 | (unit >> 12));
-    text += static_cast<char>(0x80 | ((unit >> 6) & 0x3F));
-    text += static_cast<char>(0x80 | (unit & 0x3F));
-}
-
-bool isHighSurrogate(unsigned unit) {
-    return unit >= 0xD800 && unit <= 0xDBFF;
-}
-bool isLowSurrogate(unsigned unit) {
-    return unit >= 0xDC00 && unit <= 0xDFFF;
-}
-
-char32_t joinSurrogates(unsigned high, unsigned low) {
-    return 0x10000 + (static_cast<char32_t>(high - 0xD800) << 10) + (low - 0xDC00);
-}
-
-std::string utf8FromUtf16(std::string_view bytes, Encoding order) {
-    const std::size_t highByte = order == Encoding::utf16Big ? 0 : 1;
-    const auto unitAt = [&bytes, highByte](std::size_t at) {
-        return byteAt(bytes, at + highByte) << 8 | byteAt(bytes, at + 1 - highByte);
-    };
-    std::string text;
-    text.reserve(bytes.size() / 2 + bytes.size() / 16);
-    const std::size_t end = bytes.size() & ~std::size_t{1};
-    for (std::size_t at = 0; at < end; at += 2) {
-        const unsigned unit = unitAt(at);
-        if (at == 0 && unit == 0xFEFF) continue;
-        if (unit < 0x80) {
-            text += static_cast<char>(unit);
-        } else if (isHighSurrogate(unit) && at + 2 < end && isLowSurrogate(unitAt(at + 2))) {
-            appendUtf8(text, joinSurrogates(unit, unitAt(at + 2)));
-            at += 2;
-        } else if (isHighSurrogate(unit) || isLowSurrogate(unit)) {
-            appendSurrogate(text, unit);
-        } else {
-            appendUtf8(text, unit);
-        }
-    }
-    return text;
-}
-
-// Takes the bytes for UTF-16 if they are, and makes them UTF-8.
-std::optional<Encoding> turnUtf16(std::string& bytes, DiagnosticList& diagnostics) {
-    const auto order = utf16OrderOf(bytes);
-    if (!order) return {};
+// Takes the bytes for UTF-16 of that order, and makes them UTF-8.
+const KnownEncoding* turnUtf16(std::string& bytes, Utf16Order order, DiagnosticList& diagnostics) {
     if (bytes.size() % 2 != 0) {
         diagnostics.add(DiagnosticKind::badCharacter, Severity::error, 0,
                         "half a character at the end of the file", "left out");
     }
-    bytes = utf8FromUtf16(bytes, *order);
-    return order;
+    bytes = utf8FromUtf16(bytes, order);
+    return order == Utf16Order::bigEndian ? &kUtf16Big : &kUtf16Little;
 }
 
 bool takeUtf8Mark(std::string& bytes) {
@@ -210,41 +72,6 @@ HeaderClaims readHeaderClaims(std::string_view bytes) {
     return claims;
 }
 
-// What the bytes beyond ASCII allow, for a file that is neither UTF-16 nor marked as UTF-8.
-Encoding encodingByBytes(std::string_view bytes, std::optional<Encoding> claimed, const Utf8Census& census) {
-    if (census.characters > 0 && census.faults == 0) return Encoding::utf8;
-    if (claimed == Encoding::utf8 && census.characters >= census.faults) return Encoding::utf8;
-    if (claimed && codePageOf(*claimed) != nullptr) return *claimed;
-    if (claimed && *claimed != Encoding::ansel) return Encoding::windows1252;
-    const AnselCensus ansel = takeAnselCensus(bytes);
-    const bool trusted = claimed ? ansel.fitting > ansel.doubtful : ansel.doubtful == 0;
-    return trusted ? Encoding::ansel : Encoding::windows1252;
-}
-
-void reportClaims(const HeaderClaims& claims, std::optional<Encoding> claimed, Encoding used,
-                  DiagnosticList& diagnostics) {
-    if (claims.characters.empty()) return;
-    const std::string done = std::string("read as ") + encodingName(used);
-    const std::string label = capitals(claims.characters);
-    if (!claimed) {
-        diagnostics.add(DiagnosticKind::encodingUnknown, Severity::warning, claims.charactersLine,
-                        "the header names an encoding that is not known", done, claims.characters);
-    } else if (*claimed != used && !(isUtf16(*claimed) && isUtf16(used))) {
-        diagnostics.add(DiagnosticKind::encodingMismatch, Severity::warning, claims.charactersLine,
-                        "the text is not in the encoding that the header names", done, claims.characters);
-    } else if (isLooseLabel(label)) {
-        diagnostics.add(DiagnosticKind::encodingUnknown, Severity::note, claims.charactersLine,
-                        "the header names a system, not an encoding", done, claims.characters);
-    }
-}
-
-void reportFaults(const Utf8Census& census, Encoding used, DiagnosticList& diagnostics) {
-    if (used != Encoding::utf8 || census.faults == 0) return;
-    diagnostics.add(DiagnosticKind::badCharacter, Severity::warning, 0,
-                    "the text is UTF-8 but for " + std::to_string(census.faults) + " places",
-                    "those in names and dates are told below");
-}
-
 // A file's version counts as 7 or later by its first number.
 bool isBeforeVersion7(std::string_view version) {
     const std::string_view major = version.substr(0, version.find('.'));
@@ -252,137 +79,192 @@ bool isBeforeVersion7(std::string_view version) {
 }
 
 // All that the header says fits a text of ASCII alone, but for UTF-16. Since version 7 there is UTF-8 only.
-Encoding encodingOfAscii(const HeaderClaims& claims, std::optional<Encoding> claimed) {
-    if (claimed && !isUtf16(*claimed)) return *claimed;
-    return isBeforeVersion7(claims.version) ? Encoding::ascii : Encoding::utf8;
+const KnownEncoding* encodingOfAscii(const HeaderClaims& claims, const KnownEncoding* claimed) {
+    if (claimed != nullptr && !isUtf16(claimed)) return claimed;
+    return isBeforeVersion7(claims.version) ? &kAscii : &kUtf8;
 }
 
-Encoding chooseEncoding(std::string_view bytes, const HeaderClaims& claims, bool marked,
-                        DiagnosticList& diagnostics) {
-    const auto claimed = encodingLabelled(capitals(claims.characters));
-    const Utf8Census census = takeUtf8Census(bytes);
-    const bool ascii = census.characters == 0 && census.faults == 0;
-    Encoding used = Encoding::utf8;
-    if (!marked) used = ascii ? encodingOfAscii(claims, claimed) : encodingByBytes(bytes, claimed, census);
-    reportClaims(claims, claimed, used, diagnostics);
-    reportFaults(census, used, diagnostics);
-    return used;
+// Marks before letters that have none in Unicode are rare, and so are bytes that are no ANSEL at all; those are
+// usual in text of another encoding, whose letters end words.
+bool isAnsel(std::string_view bytes, bool claimed) {
+    constexpr std::size_t kWeightOfFaults = 4;
+    const AnselCensus ansel = takeAnselCensus(bytes);
+    const std::size_t against = ansel.doubtful + kWeightOfFaults * ansel.impossible;
+    return claimed ? against == 0 || ansel.fitting > against : against == 0;
 }
 
-// Takes a pair of lone surrogates that a CONC line had parted; 0 if there is none at the front.
-std::size_t takeSurrogatePair(std::string_view raw, std::string& text) {
-    const auto unitAt = [&raw](std::size_t at) -> unsigned {
-        if (raw.size() < at + 3 || byteAt(raw, at) != 0xED) return 0;
-        return 0xD000 | (byteAt(raw, at + 1) & 0x3F) << 6 | (byteAt(raw, at + 2) & 0x3F);
-    };
-    const unsigned high = unitAt(0);
-    const unsigned low = unitAt(3);
-    if (!isHighSurrogate(high) || !isLowSurrogate(low)) return 0;
-    appendUtf8(text, joinSurrogates(high, low));
-    return 6;
+// What the bytes beyond ASCII allow, for a file that is neither UTF-16 nor marked as UTF-8.
+const KnownEncoding* encodingByBytes(std::string_view bytes, const KnownEncoding* claimed,
+                                     const Utf8Census& census) {
+    if (census.characters > 0 && census.faults == 0) return &kUtf8;
+    if (claimed == &kUtf8 && census.characters >= census.faults) return &kUtf8;
+    if (claimed != nullptr && (hasPage(claimed) || claimed->sort == EncodingSort::multiByte)) return claimed;
+    if (claimed != nullptr && claimed != &kAnsel) return &kWindowsLatin;
+    return isAnsel(bytes, claimed == &kAnsel) ? &kAnsel : &kWindowsLatin;
 }
 
-// Whether nothing but the beginning of a character is left: whoever wrote the value cut it there.
-bool isCutCharacter(std::string_view raw) {
-    const unsigned first = byteAt(raw, 0);
-    if (first < 0xC2 || first > 0xF4 || raw.size() > 3) return false;
-    for (std::size_t at = 1; at < raw.size(); ++at) {
-        if ((byteAt(raw, at) & 0xC0) != 0x80) return false;
+class EncodingChooser {
+public:
+    EncodingChooser(std::string_view bytes, const HeaderClaims& claims, DiagnosticList& diagnostics)
+        : bytes_(bytes),
+          claims_(claims),
+          claimed_(findEncoding(claims.characters)),
+          census_(takeUtf8Census(bytes)),
+          diagnostics_(diagnostics) {}
+
+    const KnownEncoding* choose(bool marked) {
+        const bool ascii = census_.characters == 0 && census_.faults == 0;
+        const KnownEncoding* used = &kUtf8;
+        if (!marked)
+            used = ascii ? encodingOfAscii(claims_, claimed_) : encodingByBytes(bytes_, claimed_, census_);
+        reportClaims(used, ascii);
+        reportFaults(used);
+        return used;
+    }
+
+    const KnownEncoding* takeUtf16(const KnownEncoding* order) {
+        reportClaims(order, true);
+        return order;
+    }
+
+private:
+    // Certain is what cannot be met by chance: UTF-8, UTF-16, and text of ASCII alone.
+    void reportClaims(const KnownEncoding* used, bool ascii) {
+        const bool certain = ascii || used == &kUtf8 || isUtf16(used);
+        const std::string done = std::string("read as ").append(used->name);
+        if (claims_.characters.empty()) {
+            if (!certain)
+                addGuess(DiagnosticKind::encodingUnknown, Severity::warning, "the file names no encoding",
+                         done);
+        } else if (claimed_ == nullptr) {
+            const char* const what = "the header names an encoding that is not known";
+            if (certain) return add(DiagnosticKind::encodingUnknown, Severity::warning, what, done);
+            addGuess(DiagnosticKind::encodingUnknown, Severity::error, what, done);
+        } else if (claimed_ != used && !(isUtf16(claimed_) && isUtf16(used))) {
+            const char* const what = "the text is not in the encoding that the header names";
+            if (certain) return add(DiagnosticKind::encodingMismatch, Severity::warning, what, done);
+            addGuess(DiagnosticKind::encodingMismatch, Severity::error, what, done);
+        } else if (!certain && hasPage(used) && !explains(*used)) {
+            addGuess(DiagnosticKind::encodingMismatch, Severity::error,
+                     "the text does not look like the encoding that the header names", done);
+        } else if (namesASystem(claims_.characters)) {
+            add(DiagnosticKind::encodingUnknown, Severity::note, "the header names a system, not an encoding",
+                done);
+        }
+    }
+
+    // Only windows-1252 is looked at for what else it may be: it is what programs claim by default.
+    bool explains(const KnownEncoding& used) const {
+        return &used != &kWindowsLatin || likelyEncoding(bytes_) == nullptr;
+    }
+
+    void add(DiagnosticKind kind, Severity severity, const char* what, const std::string& done) {
+        diagnostics_.add(kind, severity, claims_.charactersLine, what, done, claims_.characters);
+    }
+    void addGuess(DiagnosticKind kind, Severity severity, const char* what, const std::string& done) {
+        add(kind, severity, what, done + "; " + encodingSuggestion(bytes_));
+    }
+
+    void reportFaults(const KnownEncoding* used) {
+        if (used != &kUtf8 || census_.faults == 0) return;
+        diagnostics_.add(DiagnosticKind::badCharacter, Severity::warning, 0,
+                         "the text is UTF-8 but for " + std::to_string(census_.faults) + " places",
+                         "those in names and dates are told below");
+    }
+
+    std::string_view bytes_;
+    const HeaderClaims& claims_;
+    const KnownEncoding* claimed_;
+    Utf8Census census_;
+    DiagnosticList& diagnostics_;
+};
+
+// The platform decodes the bytes 80 to FF on lines of their own, so that none waits for the next one.
+bool fillFromPlatform(const KnownEncoding& encoding, CodePage& page) {
+    std::string bytes;
+    for (unsigned byte = 0x80; byte <= 0xFF; ++byte) bytes.append({static_cast<char>(byte), '\n'});
+    const auto text = decodedByPlatform(encoding, bytes);
+    if (!text) return false;
+    std::string_view rest = *text;
+    for (char16_t& character : page) {
+        const std::string_view line = rest.substr(0, rest.find('\n'));
+        character = static_cast<char16_t>(firstCharacter(line));
+        if (character == 0xFFFD) character = 0;
+        rest.remove_prefix(std::min(line.size() + 1, rest.size()));
     }
     return true;
 }
 
-// Bytes at the front that are no character, read as well as can be. Returns how many.
-std::size_t repairUtf8(std::string_view raw, std::string& text) {
-    if (const std::size_t pair = takeSurrogatePair(raw, text); pair != 0) return pair;
-    if (isCutCharacter(raw)) {
-        appendUtf8(text, kReplacement);
-        return raw.size();
+// How values are read, now that the encoding is known; false if the platform does not know it.
+bool setCoding(std::string& bytes, TextForm& form, DiagnosticList& diagnostics) {
+    const KnownEncoding& encoding = *form.encoding;
+    switch (encoding.sort) {
+        case EncodingSort::ansel:
+            form.coding = ValueCoding::ansel;
+            return true;
+        case EncodingSort::ownPage:
+            form.coding = ValueCoding::page;
+            form.page = *encoding.page;
+            return true;
+        case EncodingSort::platformPage:
+            form.coding = ValueCoding::page;
+            return fillFromPlatform(encoding, form.page);
+        case EncodingSort::multiByte:
+            return isAscii(bytes) || turnMultiByte(bytes, encoding, diagnostics);
+        default:
+            return true;
     }
-    const char32_t windows = kWindows1252[byteAt(raw, 0) - 0x80];
-    appendUtf8(text, windows < 0xA0 ? kReplacement : windows);
-    return 1;
 }
 
-std::string decodeUtf8(std::string_view raw, std::size_t& faults) {
-    std::string text;
-    text.reserve(raw.size());
-    while (!raw.empty()) {
-        std::size_t length = utf8CharacterLength(raw);
-        if (length != 0) {
-            text += raw.substr(0, length);
-        } else {
-            length = repairUtf8(raw, text);
-            if (length != 6) ++faults;
-        }
-        raw.remove_prefix(length);
-    }
-    return text;
+// A file that says by a mark or by zero bytes what it is cannot be read as anything else.
+const KnownEncoding* takeUnicode(std::string& bytes, const KnownEncoding* chosen, bool& marked,
+                                 DiagnosticList& diagnostics) {
+    Utf16Order order = utf16OrderOf(bytes);
+    if (order == Utf16Order::none && chosen == &kUtf16Little) order = Utf16Order::littleEndian;
+    if (order == Utf16Order::none && chosen == &kUtf16Big) order = Utf16Order::bigEndian;
+    if (order != Utf16Order::none) return turnUtf16(bytes, order, diagnostics);
+    marked = takeUtf8Mark(bytes);
+    return marked ? &kUtf8 : nullptr;
 }
 
-std::string decodeCodePage(std::string_view raw, const CodePage& page, std::size_t& faults) {
-    std::string text;
-    text.reserve(raw.size() + raw.size() / 4);
-    for (const char c : raw) {
-        const auto byte = static_cast<unsigned char>(c);
-        const char32_t character = byte < 0x80 ? byte : page[byte - 0x80];
-        const bool known = byte < 0x80 || character != 0;
-        if (!known) ++faults;
-        appendUtf8(text, known ? character : kReplacement);
-    }
-    return text;
+const KnownEncoding* chosenEncoding(std::string_view chosen, const std::string& file) {
+    if (chosen.empty()) return nullptr;
+    if (const KnownEncoding* found = findEncoding(chosen)) return found;
+    throw GedcomError(
+        file, "cannot be read as " + lossyUtf8(chosen) +
+                  ", which is no known encoding; UTF-8, ANSEL, windows-1252, ISO-8859-2 and IBM850 are "
+                  "some that are known");
+}
+
+void reportChosen(const KnownEncoding* chosen, const KnownEncoding* found, DiagnosticList& diagnostics) {
+    if (found == nullptr || found == chosen || (isUtf16(chosen) && isUtf16(found))) return;
+    diagnostics.add(DiagnosticKind::encodingMismatch, Severity::warning, 0,
+                    "the text is not in the encoding that was chosen",
+                    std::string("read as ").append(found->name), chosen->name);
 }
 
 }  // namespace
 
-const char* encodingName(Encoding encoding) {
-    switch (encoding) {
-        case Encoding::ascii:
-            return "ASCII";
-        case Encoding::utf8:
-            return "UTF-8";
-        case Encoding::utf16Little:
-            return "UTF-16LE";
-        case Encoding::utf16Big:
-            return "UTF-16BE";
-        case Encoding::ansel:
-            return "ANSEL";
-        case Encoding::windows1250:
-            return "windows-1250";
-        case Encoding::windows1251:
-            return "windows-1251";
-        case Encoding::windows1252:
-            return "windows-1252";
-        case Encoding::ibm437:
-            return "IBM437";
-        case Encoding::ibm850:
-            return "IBM850";
-        case Encoding::macRoman:
-            return "macintosh";
-    }
-    return "";
-}
-
-TextForm prepareText(std::string& bytes, DiagnosticList& diagnostics) {
-    const auto utf16 = turnUtf16(bytes, diagnostics);
-    const bool marked = takeUtf8Mark(bytes);
+TextForm prepareText(std::string& bytes, const std::string& file, std::string_view chosen,
+                     DiagnosticList& diagnostics) {
+    const KnownEncoding* const wanted = chosenEncoding(chosen, file);
+    bool marked = false;
+    const KnownEncoding* const found = takeUnicode(bytes, wanted, marked, diagnostics);
     const HeaderClaims claims = readHeaderClaims(bytes);
     TextForm form;
     form.version = lossyUtf8(claims.version);
     form.doublesEveryAt = isBeforeVersion7(claims.version);
-    if (utf16) {
-        form.encoding = *utf16;
-        reportClaims(claims, encodingLabelled(capitals(claims.characters)), *utf16, diagnostics);
+    if (wanted != nullptr) {
+        reportChosen(wanted, found, diagnostics);
+        form.encoding = found != nullptr ? found : wanted;
     } else {
-        form.encoding = chooseEncoding(bytes, claims, marked, diagnostics);
+        EncodingChooser chooser(bytes, claims, diagnostics);
+        form.encoding = isUtf16(found) ? chooser.takeUtf16(found) : chooser.choose(marked);
     }
-    return form;
-}
-
-std::string decodeText(std::string_view raw, Encoding encoding, std::size_t& faults) {
-    if (encoding == Encoding::ansel) return composed(decodeAnsel(raw, faults));
-    if (const CodePage* page = codePageOf(encoding)) return decodeCodePage(raw, *page, faults);
-    return decodeUtf8(raw, faults);
+    if (setCoding(bytes, form, diagnostics)) return form;
+    throw GedcomError(file, std::string("is in ")
+                                .append(form.encoding->name)
+                                .append(", which this system cannot read; convert the file to UTF-8"));
 }
 
 }  // namespace olvane::gedcom

@@ -41,7 +41,7 @@ bool isWhiteControl(char c) {
 bool TextKeeper::isPlain(std::string_view raw) const {
     unsigned demands = 0;
     for (const char c : raw) demands |= kDemands[static_cast<unsigned char>(c)];
-    return demands == kNothing || (demands == kDecoding && form_.encoding == Encoding::utf8 && isUtf8(raw));
+    return demands == kNothing || (demands == kDecoding && form_.coding == ValueCoding::utf8 && isUtf8(raw));
 }
 
 bool TextKeeper::liesInBytes(std::string_view text) const {
@@ -61,11 +61,11 @@ std::string_view TextKeeper::keep(std::string_view raw, std::uint32_t line) {
 
 std::string TextKeeper::decoded(std::string_view raw, std::uint32_t line) {
     std::size_t faults = 0;
-    std::string text = decodeText(raw, form_.encoding, faults);
+    std::string text = decodeText(raw, form_, faults);
     if (faults != 0) {
         diagnostics_.add(
             DiagnosticKind::badCharacter, Severity::warning, line,
-            std::to_string(faults) + " bytes that are no character in " + encodingName(form_.encoding),
+            std::to_string(faults) + " bytes that are no character in " + std::string(form_.encoding->name),
             "read as well as can be", text);
     }
     return text;

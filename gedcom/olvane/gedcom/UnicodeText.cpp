@@ -65,6 +65,13 @@ std::size_t utf8CharacterLength(std::string_view text) {
     return static_cast<std::size_t>(end - text.data());
 }
 
+char32_t firstCharacter(std::string_view text) {
+    const char* at = text.data();
+    const auto codePoint = Utf8::decode(at, text.data() + text.size());
+    const bool none = codePoint == boost::locale::utf::illegal || codePoint == boost::locale::utf::incomplete;
+    return none ? 0 : static_cast<char32_t>(codePoint);
+}
+
 bool isAscii(std::string_view text) {
     return asciiRun(text) == text.size();
 }

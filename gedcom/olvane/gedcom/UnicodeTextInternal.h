@@ -20,6 +20,9 @@ struct Utf8Census {
 // Fails: a surrogate, an overlong form and a character beyond U+10FFFF are not well-formed.
 std::size_t utf8CharacterLength(std::string_view text);
 
+// The character at the front of text; 0 if there is no well-formed one.
+char32_t firstCharacter(std::string_view text);
+
 bool isUtf8(std::string_view text);
 
 bool isAscii(std::string_view text);
