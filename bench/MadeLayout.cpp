@@ -58,6 +58,14 @@ std::string MadeLayout::textFrom(const std::shared_ptr<OlvaneViewerManagerWrapPr
     return shape_ == "ped" ? pedigreeText(source, size_ + 1) : FamilyViewLayout("1", source);
 }
 
+olvane::TypedLayout MadeLayout::typed(bool withText) const {
+    olvane::LayoutOptions options;
+    options.withText = withText;
+    if (shape_ != "ped") return olvane::familyLayout(1, source_, options);
+    options.generations = size_ + 1;
+    return olvane::pedigreeLayout(1, source_, options);
+}
+
 const std::vector<LayoutName>& layoutsOfTheTables() {
     static const std::vector<LayoutName> layouts = {
         {"desc", 30},  {"desc", 100},  {"desc", 1003}, {"desc", 9998}, {"ego", 30}, {"ego", 100},

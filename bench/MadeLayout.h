@@ -10,6 +10,7 @@
 #include <vector>
 
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/boundary/TypedLayout.h>
 
 #include "MadeFamily.h"
 
@@ -31,6 +32,9 @@ public:
     std::string text() const { return textFrom(source_); }
     // The same, with the questions asked of another data source.
     std::string textFrom(const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& source) const;
+
+    // The same with a typed layout beside the text.
+    olvane::TypedLayout typed(bool withText = true) const;
 
     std::string name() const { return shape_ + " " + std::to_string(size_); }
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& source() const { return source_; }

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// count_layout SHAPE SIZE [floor]: one layout, or its floor, inside a function of its own, for tools that count
+// count_layout SHAPE SIZE [floor|typed]: one layout, its floor, or the layout with a typed result beside its text, inside a function of its own, for tools that count
 // the instructions of one function:
 //
 //     valgrind --tool=callgrind --toggle-collect=countedWork count_layout ego 100
@@ -40,9 +40,10 @@ void runTwice(const Work& work) {
     std::cout << text.size() << " bytes\n";
 }
 
-void count(const std::string& shape, int size, bool floorAlone) {
+void count(const std::string& shape, int size, const std::string& what) {
     const bench::MadeLayout layout(shape, size);
-    if (!floorAlone) return runTwice([&layout] { return layout.text(); });
+    if (what.empty()) return runTwice([&layout] { return layout.text(); });
+    if (what == "typed") return runTwice([&layout] { return layout.typed().text; });
     const bench::Floor floor(layout);
     runTwice([&floor] { return floor.text(); });
 }
@@ -50,13 +51,13 @@ void count(const std::string& shape, int size, bool floorAlone) {
 }  // namespace
 
 int main(int argc, char** argv) {
-    const bool floorAlone = argc == 4 && std::string(argv[3]) == "floor";
-    if (argc != 3 && !floorAlone) {
-        std::cerr << "usage: count_layout desc|ego|ped SIZE [floor]\n";
+    const std::string what = argc == 4 ? argv[3] : "";
+    if (argc != 3 && what != "floor" && what != "typed") {
+        std::cerr << "usage: count_layout desc|ego|ped SIZE [floor|typed]\n";
         return 2;
     }
     try {
-        count(argv[1], std::atoi(argv[2]), floorAlone);
+        count(argv[1], std::atoi(argv[2]), what);
     } catch (const std::exception& error) {
         std::cerr << "count_layout: " << error.what() << "\n";
         return 1;

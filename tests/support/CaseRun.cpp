@@ -99,40 +99,47 @@ struct Outcome {
     std::vector<std::string> graphLines;
 };
 
-template <class Layouter>
-void layOutAndWrite(Layouter& layouter, ViewerGlue& glue, bool graph, Outcome& outcome) {
-    layouter.layoutForFocusNID();
-    if (graph) outcome.graphLines = graphLines(layouter, glue);
-    olvane::ResultBounds bounds;
-    layouter.graphIterator(olvane::resultWriter(glue, bounds, outcome.text));
-}
-
-void runLayouter(const CaseFile& request, DataAdapter& adapter, ViewerGlue& glue, int focusKey, bool graph,
-                 Outcome& outcome) {
+// Runs the layouter that the case asks for.
+template <class Run>
+void withLayouter(const CaseFile& request, DataAdapter& adapter, int focusKey, const Run& run) {
     const int isMale = adapter.isMale(focusKey) ? 1 : 0;
     const OptionMap options = optionsOf(request);
     const TreeSize size = treeSizeOf(request);
     if (request.view == CaseView::pedigree) {
         TreeViewPedigreeLayouter layouter(&adapter, focusKey, isMale, options, size, request.maxGenerations,
                                           request.maxStackDepth);
-        layOutAndWrite(layouter, glue, graph, outcome);
+        run(layouter);
     } else {
         TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale, options, size);
-        layOutAndWrite(layouter, glue, graph, outcome);
+        run(layouter);
     }
 }
 
-Outcome layOut(const CaseFile& request, const std::shared_ptr<CaseManager>& manager, bool graph) {
+// The frame of a request. Whatever fails is swallowed, and the answer is whether nothing did.
+template <class Run>
+bool inRequest(const CaseFile& request, const std::shared_ptr<CaseManager>& manager, const Run& run) {
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source = manager;
     ViewerGlue glue;
     olvane::HostCallbacks callbacks(glue, source);
     if (request.adapter == CaseAdapter::bare) callbacks.getParents = bareParents(glue, *manager);
-    Outcome outcome;
+    bool completed = false;
     olvane::resetAddParentId();
     olvane::guarded([&] {
         DataAdapter adapter = callbacks.dataAdapter();
         const int focusKey = glue.getKeyFromPerson(intToString(static_cast<int>(request.focus)));
-        runLayouter(request, adapter, glue, focusKey, graph, outcome);
+        withLayouter(request, adapter, focusKey, [&](auto& layouter) { run(layouter, glue); });
+        completed = true;
+    });
+    return completed;
+}
+
+Outcome layOut(const CaseFile& request, const std::shared_ptr<CaseManager>& manager, bool graph) {
+    Outcome outcome;
+    inRequest(request, manager, [&](TreeViewLayouter& layouter, ViewerGlue& glue) {
+        layouter.layoutForFocusNID();
+        if (graph) outcome.graphLines = graphLines(layouter, glue);
+        olvane::ResultBounds bounds;
+        layouter.graphIterator(olvane::resultWriter(glue, bounds, outcome.text));
     });
     outcome.text = std::string(outcome.text.c_str());
     return outcome;
@@ -151,6 +158,21 @@ std::vector<std::string> runCase(const CaseFile& request, bool graph, bool trace
 
 std::string layoutText(const CaseFile& request) {
     return layOut(request, std::make_shared<CaseManager>(borrowed(request)), false).text;
+}
+
+TypedRun runTypedCase(const CaseFile& request, const std::function<void(TreeViewLayouter&)>& look) {
+    const auto manager = std::make_shared<CaseManager>(borrowed(request), true);
+    TypedRun result;
+    const bool completed = inRequest(request, manager, [&](TreeViewLayouter& layouter, ViewerGlue& glue) {
+        SharedTreeViewer::LineRecord record;
+        layouter.recordLinesIn(record);
+        layouter.layoutForFocusNID();
+        if (look) look(layouter);
+        olvane::writeTypedLayout(layouter, glue, record, true, result.layout);
+    });
+    result.failed = !completed;
+    result.trace = manager->host.trace();
+    return result;
 }
 
 std::string joinLines(const std::vector<std::string>& lines) {

@@ -3,12 +3,14 @@
 
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include <olvane/boundary/LayoutPieces.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/boundary/TypedLayout.h>
 #include <support/CaseFile.h>
 
 namespace support {
@@ -41,6 +43,16 @@ std::vector<std::string> runCase(const CaseFile& request, bool graph, bool trace
 
 // The result text alone.
 std::string layoutText(const CaseFile& request);
+
+// The same request with a typed layout out, its text included.
+struct TypedRun {
+    olvane::TypedLayout layout;
+    std::vector<std::string> trace;  // the calls, as runCase prints them
+    bool failed = false;             // the layout holds what came before
+};
+// look is called with the finished graph, if it is set.
+TypedRun runTypedCase(const CaseFile& request,
+                      const std::function<void(SharedTreeViewer::TreeViewLayouter&)>& look = {});
 
 // Lines with their ends, as they are printed.
 std::string joinLines(const std::vector<std::string>& lines);

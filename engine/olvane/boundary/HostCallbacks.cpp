@@ -148,4 +148,12 @@ void resetAddParentId() {
     ADD_PARENT_ID = -1;
 }
 
+SyntheticIds::SyntheticIds() : before_(ADD_PARENT_ID) {
+    resetAddParentId();
+}
+
+SyntheticIds::~SyntheticIds() {
+    ADD_PARENT_ID = before_;
+}
+
 }  // namespace olvane

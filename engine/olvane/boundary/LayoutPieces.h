@@ -11,9 +11,11 @@
 #include <olvane/Export.h>
 #include <olvane/adapters/DataAdapter.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/boundary/TypedLayout.h>
 #include <olvane/boundary/ViewerGlue.h>
 #include <olvane/graph/TreeViewPerson.h>
-#include <olvane/layouter/TreeSize.h>
+#include <olvane/layouter/LineRecord.h>
+#include <olvane/layouter/TreeViewLayouter.h>
 
 namespace olvane {
 
@@ -59,8 +61,18 @@ public:
 // get would otherwise go on from the request before. There is one count for each thread.
 OLVANE_API void resetAddParentId();
 
-// The box sizes of the family view, in points.
-OLVANE_API TreeSize familyTreeSize();
+// Starts them at -1 for as long as it lives, and then goes on where they were: for a layout that may run within
+// an operation of another one.
+class OLVANE_API SyntheticIds {
+public:
+    SyntheticIds();
+    ~SyntheticIds();
+    SyntheticIds(const SyntheticIds&) = delete;
+    SyntheticIds& operator=(const SyntheticIds&) = delete;
+
+private:
+    int before_;
+};
 
 // Whole-number bounds of the records written. A bound of 0 stands for one not yet set, so one that has truly
 // reached 0 is set anew by the next person. Nothing reads them.
@@ -75,6 +87,12 @@ struct ResultBounds {
 // Fails: std::out_of_range for a person of an unknown key, before anything is written, and for a person of
 //        negative id without an add-node record, behind its segments.
 OLVANE_API TreeViewPerson::Visitor resultWriter(ViewerGlue& glue, ResultBounds& bounds, std::string& text);
+
+// Fills the typed layout, and its text too if asked to, from a layouter that has run with this record.
+// Fails: as resultWriter, with what was written so far in the result.
+OLVANE_API void writeTypedLayout(SharedTreeViewer::TreeViewLayouter& layouter, ViewerGlue& glue,
+                                 const SharedTreeViewer::LineRecord& record, bool withText,
+                                 TypedLayout& result);
 
 // Does the work and swallows whatever it throws: the caller is left with what was written so far.
 template <class Work>

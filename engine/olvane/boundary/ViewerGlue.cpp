@@ -111,6 +111,11 @@ std::string ViewerGlue::childTextOfAddNode(int key) const {
     return record != nullptr ? personOfKey(record->childKey) : toldRecord(personOfKey(key)).childText;
 }
 
+int ViewerGlue::childNumberOfAddNode(int key) const {
+    const AddNodeRecord* const record = recordOfKey(key);
+    return record != nullptr ? numberOfKey(record->childKey) : stringToInt(childTextOfAddNode(key));
+}
+
 // Null where the add-node came as text, or where there is none.
 const ViewerGlue::AddNodeRecord* ViewerGlue::recordOfKey(int key) const {
     const int place = entryOfKey(key).addNode;

@@ -91,6 +91,7 @@ public:
     void addAddNode(int key, bool male, int childKey, int otherParentKey);
     bool addNodeIsMale(int key) const;
     std::string childTextOfAddNode(int key) const;
+    int childNumberOfAddNode(int key) const;  // the number that the child's text says
 
     Table<int, std::string> keyToPerson;
     Table<std::string, int> personToKey;

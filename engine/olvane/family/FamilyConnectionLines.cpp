@@ -50,6 +50,7 @@ void TreeViewFamilyLayouter::addSpouseLinesToPerson(TreeViewPerson& person) {
         const float y = cutToWholePoint(own.y + treeSize.nodeHeight * 0.5f + static_cast<float>(lineOffset));
         const float x2 = cutToWholePoint(other.x + spouseEdgeX);
         person.addLineSegment(x1, y, x2, y, true);
+        if (lineRecord != nullptr) lineRecord->addMarriage(person, person, spouse);
         person.spouseEdge(&spouse, TreeLine({TreePoint{x1, y}, TreePoint{dropX, y}, TreePoint{x2, y}}));
         person.addSpouseLine(spouse.personId, x1, y, x2, y);
         lineOffset =
@@ -93,10 +94,10 @@ void TreeViewFamilyLayouter::addLinesToChildrenOfCouple(TreeViewPerson& person, 
     }
 }
 
-TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfLoneParent(
-    const TreeViewPerson& parent) const {
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfLoneParent(TreeViewPerson& parent) const {
     const TreePoint at = parent.getNodeCenter();
     Drop drop;
+    drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = at.y + treeSize.nodeHeight;
     drop.busY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
@@ -107,6 +108,8 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfCouple(TreeVie
                                                                          TreeViewPerson& spouse) const {
     const TreePoint at = spouse.getNodeCenter();
     Drop drop;
+    drop.parent = &person;
+    drop.other = &spouse;
     drop.x = person.gender ? at.x + treeSize.horzPadding * -0.5f
                            : treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = person.getSpouseLine(spouse.personId).y1;
@@ -125,13 +128,17 @@ TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPe
     course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
     course.draw(child, stemX, drop.busY, drop.x, drop.busY);
     course.draw(child, stemX, at.y, stemX, drop.busY);
+    if (lineRecord != nullptr) lineRecord->addChildLines(holder, child, *drop.parent, drop.other);
     return line;
 }
 
 // From a father's mid-height, in the gap at his right, down to the bus of a couple's children.
-TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(const TreeViewPerson& father) const {
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(TreeViewPerson& father,
+                                                                    TreeViewPerson* mother) const {
     const TreePoint at = father.getNodeCenter();
     Drop drop;
+    drop.parent = &father;
+    drop.other = mother;
     drop.x = treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight * 0.5f);
     drop.busY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
@@ -139,10 +146,10 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(const TreeVi
 }
 
 // From a parent's bottom centre, for a person with one parent and for a half sibling.
-TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromSingleParent(
-    const TreeViewPerson& parent) const {
+TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromSingleParent(TreeViewPerson& parent) const {
     const TreePoint at = parent.getNodeCenter();
     Drop drop;
+    drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight);
     drop.busY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
@@ -155,7 +162,9 @@ void TreeViewFamilyLayouter::addSiblingLine(TreeViewPerson& person, TreeViewPers
     const int sharedParent = sibling.getParentId();
     if (dataAdapter->isAddNode(sharedParent)) {
         TreeViewPerson& father = person.getPreferredFather();
-        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromCouple(father), father, sibling));
+        TreeViewPerson* const mother =
+            person.preferredMotherIndex != -1 ? &person.getPreferredMother() : nullptr;
+        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromCouple(father, mother), father, sibling));
     } else {
         const bool throughFather =
             person.preferredFatherIndex != -1 && person.getPreferredFather().personId == sharedParent;
@@ -235,7 +244,7 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
     }
     TreeViewPerson& father = person.getPreferredFather();
     TreeViewPerson& mother = person.getPreferredMother();
-    const Drop drop = dropFromCouple(father);
+    const Drop drop = dropFromCouple(father, &mother);
     TreeLine line = drawDropBusAndStem(drop, father, person);
     drawParentsMarriageLine(father, mother, drop);
     TreeViewSpouseEdge* const couple = father.spouseEdge(&mother, TreeLine());
@@ -250,6 +259,7 @@ void TreeViewFamilyLayouter::drawParentsMarriageLine(TreeViewPerson& father, Tre
     const float fatherEndX = father.getNodeCenter().x + treeSize.nodeWidth;
     const float motherEndX = mother.getNodeCenter().x;
     father.addLineSegment(fatherEndX, drop.startY, motherEndX, drop.startY, true);
+    if (lineRecord != nullptr) lineRecord->addMarriage(father, father, mother);
     dataAdapter->isAddNode(father.personId);
     father.spouseEdge(&mother, TreeLine({TreePoint{fatherEndX, drop.startY}, TreePoint{drop.x, drop.startY},
                                          TreePoint{motherEndX, drop.startY}}));

@@ -141,6 +141,9 @@ void TreeViewFamilyLayouter::placeGreatGrandparents() {
 
 void TreeViewFamilyLayouter::drawLines() {
     const std::vector<TreeViewPerson*> persons = std::move(everybody);
+    if (lineRecord != nullptr) {
+        for (TreeViewPerson* person : persons) lineRecord->number(*person);
+    }
     for (TreeViewPerson* person : persons) addSpouseLinesToPerson(*person);
     for (TreeViewPerson* person : persons) addLinesToPerson(*person);
 }

@@ -86,11 +86,13 @@ public:
     std::vector<TreeViewPerson*> stackedPersons;  // not owned; filled and emptied while flags are set
 
 private:
-    // The vertical piece from which a child's bus and stem hang.
+    // The vertical piece from which a child's bus and stem hang, and the parents whose it is.
     struct Drop {
         float x;
         float startY;
         float busY;
+        TreeViewPerson* parent;
+        TreeViewPerson* other = nullptr;  // null for a lone parent
     };
 
     // The acts of the driver.
@@ -141,9 +143,9 @@ private:
     void addSiblingLine(TreeViewPerson& person, TreeViewPerson& sibling);
     void addParentLines(TreeViewPerson& person);
     Drop dropToChildOfCouple(TreeViewPerson& person, TreeViewPerson& spouse) const;
-    Drop dropToChildOfLoneParent(const TreeViewPerson& parent) const;
-    Drop dropFromCouple(const TreeViewPerson& father) const;
-    Drop dropFromSingleParent(const TreeViewPerson& parent) const;
+    Drop dropToChildOfLoneParent(TreeViewPerson& parent) const;
+    Drop dropFromCouple(TreeViewPerson& father, TreeViewPerson* mother) const;
+    Drop dropFromSingleParent(TreeViewPerson& parent) const;
     TreeLine drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder, TreeViewPerson& child) const;
     void drawParentsMarriageLine(TreeViewPerson& father, TreeViewPerson& mother, const Drop& drop);
     void addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling, TreeLine line);

@@ -93,6 +93,9 @@ public:
     void setGender(bool male) { gender = male; }
     void setHasBeenVisited(bool visited) { hasBeenVisited_ = visited; }
     bool hasBeenVisited() const { return hasBeenVisited_; }
+    // The place in the walk of the result, counted from 0: set where lines are recorded, else kNoKey.
+    void setWalkNumber(int number) { walkNumber_ = number; }
+    int walkNumber() const { return walkNumber_; }
     int getPersonId() const { return personId; }
     int getParentId() const { return parentId; }
     TreePoint& getNodeCenter() { return nodeCenter; }
@@ -216,4 +219,5 @@ private:
     Segments& linesTo(int spouseKey);
 
     bool hasBeenVisited_ = false;  // mark of the traversals that enter a node once
+    int walkNumber_ = kNoKey;
 };

@@ -16,6 +16,7 @@
 #include <olvane/graph/TreeViewGenerationEdge.h>
 #include <olvane/graph/TreeViewPerson.h>
 #include <olvane/layouter/AdmittedKeys.h>
+#include <olvane/layouter/LineRecord.h>
 #include <olvane/layouter/TreeSize.h>
 
 namespace SharedTreeViewer {
@@ -50,6 +51,9 @@ public:
     virtual void layoutForFocusNID() = 0;
     // Visits each person of the finished graph once, in the order of the result.
     virtual void graphIterator(const Visitor& visitor) = 0;
+
+    // From now on what each line is for is recorded too. The record must outlive layoutForFocusNID.
+    void recordLinesIn(LineRecord& record) { lineRecord = &record; }
 
     // The option's value, or the default where the key is absent. Never enters the key.
     bool boolOptionForKey(const std::string& key, bool defaultValue) const;
@@ -109,6 +113,8 @@ protected:
 
     void admit(int key) { shownPersons.admit(key); }
     bool isAdmitted(int key) const { return shownPersons.count(key) != 0; }
+
+    LineRecord* lineRecord = nullptr;  // not owned; null where nobody asked for one
 
 private:
     typedef TreeViewPerson::List<const ChildrenAdapter*> Records;  // in the sets where they lie

@@ -57,6 +57,7 @@ void TreeViewPedigreeLayouter::addPedigreeSpouseLine(TreeViewPerson& focus, Tree
     const float y1 = cutToWholePoint(own.y + treeSize.nodeHeight);
     const float y2 = cutToWholePoint(spouse.getNodeCenter().y);
     focus.addLineSegment(x, y1, x, y2, true);
+    if (lineRecord != nullptr) lineRecord->addMarriage(focus, focus, spouse);
     focus.addSpouseLine(spouse.personId, x, y1, x, y2);
     const TreePoint turn{x, y2 + treeSize.vertPadding * -0.5f};
     focus.spouseEdge(&spouse, TreeLine({TreePoint{x, y1}, turn, TreePoint{x, y2}}));
@@ -72,12 +73,14 @@ void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeV
         const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
         course.draw(spouse, at.x, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
+        if (lineRecord != nullptr) lineRecord->addChildLines(spouse, child, spouse, nullptr);
         focus.addGenerationEdge(makeGenerationEdge(std::move(line), child, &focus));
     } else {
         const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;
         course.draw(spouse, lineX, joint.y, joint.x, joint.y);
         joinChild(course, child, joint);
+        if (lineRecord != nullptr) lineRecord->addChildLines(spouse, child, focus, &spouse);
         TreeViewSpouseEdge* const couple = spouse.spouseEdge(&focus, TreeLine());
         couple->addChildEdge(makeGenerationEdge(std::move(line), child, couple));
     }
@@ -110,6 +113,7 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
     const float y1 = cutToWholePoint(fatherAt.y + treeSize.nodeHeight);
     const float y2 = cutToWholePoint(mother.getNodeCenter().y);
     father.addLineSegment(x, y1, x, y2, true);
+    if (lineRecord != nullptr) lineRecord->addMarriage(father, father, mother);
     // Stored under the line's own x, with the numbers one place on. Hosts that read the marriage lines of a
     // pedigree look them up in this form; filed under the mother they would meet a second line where there is
     // one marriage.
@@ -129,6 +133,7 @@ void TreeViewPedigreeLayouter::addCoupleLines(TreeViewPerson& person, TreeViewPe
     course.draw(person, x, middleY, middleX, middleY);
     course.draw(person, middleX, middleY, middleX, ownY);
     course.draw(person, middleX, ownY, ownRight, ownY);
+    if (lineRecord != nullptr) lineRecord->addChildLines(person, person, father, &mother);
     couple->addChildEdge(makeGenerationEdge(std::move(line), person, couple));
     addParentLinesForPerson(father);
     addParentLinesForPerson(mother);
@@ -147,6 +152,7 @@ void TreeViewPedigreeLayouter::addSingleParentLines(TreeViewPerson& person, Tree
     course.draw(parent, parentX, parentY, stubX, parentY);
     course.draw(person, stubX, ownY, stubX, parentY);
     course.draw(person, own.x + treeSize.nodeWidth, ownY, stubX, ownY);
+    if (lineRecord != nullptr) lineRecord->addChildLines(parent, person, parent, nullptr);
     parent.addGenerationEdge(makeGenerationEdge(std::move(line), person, &parent));
     addParentLinesForPerson(parent);
 }

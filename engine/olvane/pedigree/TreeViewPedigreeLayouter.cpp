@@ -30,6 +30,9 @@ void TreeViewPedigreeLayouter::layoutForFocusNID() {
     admit(focusPerson.personId);
     addAndLayoutChildrenAndSpousesOfFocusPerson(focusPerson);
     addAndLayoutParentsOfPerson(focusPerson, 0, 0);
+    if (lineRecord != nullptr) {
+        graphIterator([this](TreeViewPerson& person) { lineRecord->number(person); });
+    }
     addSpouseAndChildrenLinesForFocusPerson(focusPerson);
     addParentLinesForPerson(focusPerson);
     flagNonDisplayedRelationships(focusPerson);

@@ -1,0 +1,240 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A typed layout is filled in the walk that writes the text: each visited person gives a box and the lines that
+// it holds, joined one by one with what the layouter recorded of them.
+
+#include <olvane/boundary/TypedLayout.h>
+
+#include <cmath>
+#include <limits>
+#include <stdexcept>
+#include <string>
+
+#include <olvane/boundary/LayoutPieces.h>
+#include <olvane/family/FamilyOptions.h>
+#include <olvane/family/TreeViewFamilyLayouter.h>
+#include <olvane/graph/WholePoint.h>
+#include <olvane/layouter/LineRecord.h>
+#include <olvane/pedigree/TreeViewPedigreeLayouter.h>
+
+namespace olvane {
+
+namespace {
+
+using SharedTreeViewer::LineRecord;
+using SharedTreeViewer::OptionMap;
+typedef TypedLayout::Index Index;
+
+// Fills the boxes and the lines, person by person.
+class BoxWriter {
+public:
+    BoxWriter(const ViewerGlue& glue, const LineRecord& record, TypedLayout& layout)
+        : glue_(glue), record_(record), layout_(layout) {
+        layout.boxes.reserve(record.visits());
+        layout.lines.reserve(record.entries().size());
+    }
+
+    void add(const TreeViewPerson& person) {
+        const Index place = static_cast<Index>(layout_.boxes.size());
+        TypedLayout::Box box;
+        box.id = glue_.numberOfKey(person.personId);
+        box.x = wholePoint(person.getNodeCenter().x);
+        box.y = wholePoint(person.getNodeCenter().y);
+        box.male = person.gender;
+        box.hasHiddenRelatives = person.hasNonDisplayedRelationships;
+        if (person.walkNumber() != place) box.repeatOf = person.walkNumber();
+        if (box.id < 0) setUnknownParent(person.personId, box);
+        box.firstLine = static_cast<std::uint32_t>(layout_.lines.size());
+        addLines(person, place);
+        box.lineCount = static_cast<std::uint32_t>(layout_.lines.size()) - box.firstLine;
+        layout_.boxes.push_back(box);
+    }
+
+private:
+    void setUnknownParent(int key, TypedLayout::Box& box) const {
+        box.kind = glue_.addNodeIsMale(key) ? TypedLayout::BoxKind::unknownFather
+                                            : TypedLayout::BoxKind::unknownMother;
+        box.childId = glue_.childNumberOfAddNode(key);
+    }
+
+    void addLines(const TreeViewPerson& person, Index holder) {
+        int place = record_.firstEntryOf(person);
+        for (const TreeLineSegment& segment : person.lineSegments) {
+            if (place == LineRecord::kNone) throw std::logic_error("a line without a record");
+            const LineRecord::Entry& entry = record_.entries()[static_cast<std::size_t>(place)];
+            layout_.lines.push_back({wholePoint(segment.x1), wholePoint(segment.y1), wholePoint(segment.x2),
+                                     wholePoint(segment.y2), holder, entry.family, entry.child, entry.role});
+            place = entry.next;
+        }
+    }
+
+    const ViewerGlue& glue_;
+    const LineRecord& record_;
+    TypedLayout& layout_;
+};
+
+// Groups the children by family, each once, and leaves their order within a family.
+void addFamilies(const LineRecord& record, TypedLayout& layout) {
+    layout.families.reserve(record.families().size());
+    for (const LineRecord::Family& family : record.families()) {
+        layout.families.push_back({{family.first, family.second}, 0, 0});
+    }
+    std::vector<std::uint32_t> next(layout.families.size() + 1, 0);
+    for (const LineRecord::Child& child : record.children())
+        ++next[static_cast<std::size_t>(child.family) + 1];
+    for (std::size_t i = 1; i < next.size(); ++i) next[i] += next[i - 1];
+    std::vector<Index> grouped(record.children().size());
+    for (const LineRecord::Child& child : record.children()) {
+        grouped[next[static_cast<std::size_t>(child.family)]++] = child.child;
+    }
+    std::vector<Index> seenIn(layout.boxes.size(), TypedLayout::kNone);
+    layout.children.reserve(grouped.size());
+    std::size_t from = 0;
+    for (std::size_t i = 0; i < layout.families.size(); ++i) {
+        TypedLayout::Family& family = layout.families[i];
+        family.firstChild = static_cast<std::uint32_t>(layout.children.size());
+        for (; from < next[i]; ++from) {
+            Index& seen = seenIn[static_cast<std::size_t>(grouped[from])];
+            if (seen == static_cast<Index>(i)) continue;
+            seen = static_cast<Index>(i);
+            layout.children.push_back(grouped[from]);
+        }
+        family.childCount = static_cast<std::uint32_t>(layout.children.size()) - family.firstChild;
+    }
+}
+
+// An unknown parent stands in a family with the child for whom it stands, and perhaps with that one's siblings.
+void linkUnknownParents(TypedLayout& layout) {
+    for (const TypedLayout::Family& family : layout.families) {
+        for (const Index parent : layout.parentsOf(family)) {
+            TypedLayout::Box& box = layout.boxes[static_cast<std::size_t>(parent)];
+            if (box.kind == TypedLayout::BoxKind::person || box.childOf != TypedLayout::kNone) continue;
+            for (const Index child : layout.childrenOf(family)) {
+                if (layout.boxes[static_cast<std::size_t>(child)].id == box.childId) box.childOf = child;
+            }
+        }
+    }
+}
+
+// Every option that is read stands at true when its key is absent.
+OptionMap familyOptionsOf(const LayoutOptions& options) {
+    using namespace SharedTreeViewer;
+    OptionMap map;
+    map[IndicateNonDisplayedRelationships] = true;
+    const auto leaveOut = [&map](const std::string& key, bool isShown) {
+        if (!isShown) map[key] = false;
+    };
+    leaveOut(kTreeViewFamShowAuntsUnclesKey, options.auntsUncles);
+    leaveOut(kTreeViewFamShowCousinsKey, options.cousins);
+    leaveOut(kTreeViewFamShowSiblingsKey, options.siblings);
+    leaveOut(kTreeViewFamShowSiblingSpousesKey, options.siblingSpouses);
+    leaveOut(kTreeViewFamShowNeicesNephewsKey, options.niecesNephews);
+    leaveOut(kTreeViewFamShowGrandchildrenKey, options.grandchildren);
+    leaveOut(kTreeViewFamShowGreatGrandparentsKey, options.greatGrandparents);
+    leaveOut(kTreeViewFamShowSpousesOfChildrenKey, options.spousesOfChildren);
+    return map;
+}
+
+void check(std::int64_t focusId, const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& manager,
+           const LayoutOptions& options) {
+    const TreeSize& sizes = options.sizes;
+    if (focusId < 1 || focusId > std::numeric_limits<std::int32_t>::max()) {
+        throw std::invalid_argument("the focus's id is not between 1 and 2147483647");
+    }
+    if (!manager) throw std::invalid_argument("no data source");
+    for (const float size : {sizes.nodeWidth, sizes.nodeHeight, sizes.horzPadding, sizes.vertPadding,
+                             sizes.spouseLineStep, sizes.lineInset}) {
+        if (!std::isfinite(size)) throw std::invalid_argument("a size is not finite");
+    }
+    if (options.generations < 1 || options.generations > LayoutOptions::kMostGenerations) {
+        throw std::invalid_argument("generations is not between 1 and 1000");
+    }
+    if (options.flagDepth < 0) throw std::invalid_argument("flagDepth is below 0");
+}
+
+template <class Layouter>
+void run(Layouter& layouter, ViewerGlue& glue, bool withText, TypedLayout& result) {
+    LineRecord record;
+    layouter.recordLinesIn(record);
+    layouter.layoutForFocusNID();
+    writeTypedLayout(layouter, glue, record, withText, result);
+}
+
+}  // namespace
+
+void writeTypedLayout(SharedTreeViewer::TreeViewLayouter& layouter, ViewerGlue& glue,
+                      const SharedTreeViewer::LineRecord& record, bool withText, TypedLayout& result) {
+    BoxWriter boxes(glue, record, result);
+    ResultBounds bounds;
+    const TreeViewPerson::Visitor writeText =
+        withText ? resultWriter(glue, bounds, result.text) : TreeViewPerson::Visitor();
+    layouter.graphIterator([&](TreeViewPerson& person) {
+        if (withText) writeText(person);
+        boxes.add(person);
+    });
+    addFamilies(record, result);
+    linkUnknownParents(result);
+}
+
+void layOut(TypedLayout::View view, std::int64_t focusId,
+            const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& manager, const LayoutOptions& options,
+            TypedLayout& result) {
+    check(focusId, manager, options);
+    result = TypedLayout();
+    result.view = view;
+    result.sizes = options.sizes;
+    const SyntheticIds ids;
+    ViewerGlue glue;
+    const HostCallbacks callbacks(glue, manager);
+    DataAdapter adapter = callbacks.dataAdapter();
+    const int focusKey = glue.keyOfNumber(static_cast<int>(focusId));
+    const int isMale = adapter.isMale(focusKey) ? 1 : 0;
+    if (view == TypedLayout::View::family) {
+        SharedTreeViewer::TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale,
+                                                          familyOptionsOf(options), options.sizes);
+        run(layouter, glue, options.withText, result);
+    } else {
+        SharedTreeViewer::TreeViewPedigreeLayouter layouter(
+            &adapter, focusKey, isMale, OptionMap(), options.sizes, options.generations, options.flagDepth);
+        run(layouter, glue, options.withText, result);
+    }
+}
+
+TypedLayout familyLayout(std::int64_t focusId,
+                         const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& manager,
+                         const LayoutOptions& options) {
+    TypedLayout result;
+    layOut(TypedLayout::View::family, focusId, manager, options, result);
+    return result;
+}
+
+TypedLayout pedigreeLayout(std::int64_t focusId,
+                           const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& manager,
+                           const LayoutOptions& options) {
+    TypedLayout result;
+    layOut(TypedLayout::View::pedigree, focusId, manager, options, result);
+    return result;
+}
+
+std::vector<LayoutRecord> recordsOf(const TypedLayout& layout) {
+    std::vector<LayoutRecord> records;
+    records.reserve(layout.boxes.size());
+    for (const TypedLayout::Box& box : layout.boxes) {
+        LayoutRecord record;
+        record.id = box.id;
+        record.x = box.x;
+        record.y = box.y;
+        record.hasHiddenRelatives = box.hasHiddenRelatives;
+        for (const TypedLayout::Line& line : layout.linesOf(box)) {
+            record.segments.push_back({line.x1, line.y1, line.x2, line.y2});
+        }
+        if (box.id < 0) {
+            record.addNode = AddNodeSuffix{box.kind == TypedLayout::BoxKind::unknownFather, box.childId};
+        }
+        records.push_back(std::move(record));
+    }
+    return records;
+}
+
+}  // namespace olvane
