@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Lays out many persons: a line for each, in the order asked for, over all cores. Focuses are taken in
+// Lays out many persons: a line for each line of the input, in the same order, over all cores. Focuses are read in
 // blocks; a block is laid out in parallel and then written line by line. An interrupt ends the work behind
 // the line being written.
 
@@ -23,6 +23,7 @@
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
+#include <cli/TableCells.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -70,7 +71,9 @@ gedcom::PersonId idOfNumber(const gedcom::GedcomData& data, const std::string& w
 // Fails: throws UsageError where the stream cannot be opened or breaks off.
 class FocusList {
 public:
-    FocusList(const gedcom::GedcomData& data, const std::string& from) : data_(data), from_(from) {
+    // perBlock: how many focuses a block has; with 1, a line is answered before the next one is waited for.
+    FocusList(const gedcom::GedcomData& data, const std::string& from, std::size_t perBlock)
+        : data_(data), from_(from), perBlock_(perBlock) {
         if (from.empty()) return;
         if (from != "-") {
             if (std::filesystem::is_directory(from)) {
@@ -87,7 +90,7 @@ public:
 
     std::vector<BatchFocus> nextBlock() {
         std::vector<BatchFocus> block;
-        for (BatchFocus focus; block.size() < kBlock && next(focus);) block.push_back(focus);
+        for (BatchFocus focus; block.size() < perBlock_ && next(focus);) block.push_back(focus);
         return block;
     }
 
@@ -95,9 +98,8 @@ private:
     bool next(BatchFocus& focus) {
         if (lines_ == nullptr) return nextPerson(focus);
         std::string& written = focus.written;
-        while (std::getline(*lines_, written)) {
+        if (std::getline(*lines_, written)) {
             if (!written.empty() && written.back() == '\r') written.pop_back();
-            if (written.empty()) continue;
             focus.id = idOfNumber(data_, written);
             return true;
         }
@@ -113,6 +115,7 @@ private:
 
     const gedcom::GedcomData& data_;
     std::string from_;
+    std::size_t perBlock_;
     std::unique_ptr<std::ifstream> file_;
     std::istream* lines_ = nullptr;
     gedcom::PersonId given_ = 0;
@@ -152,14 +155,14 @@ struct BatchLine {
 // A number is an id first, as this command itself and the list of persons print it, even where a file has
 // numbers for xrefs. Then xrefs; a name serves where it means one person.
 gedcom::PersonId personOf(const gedcom::GedcomData& data, const BatchFocus& focus) {
-    if (focus.id != 0) return focus.id;
+    if (focus.id != 0 || focus.written.empty()) return focus.id;
     const auto found = gedcom::findPersons(data, focus.written, 2);
     return found.size() == 1 ? found.front() : 0;
 }
 
 BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const LayoutRequest& request) {
     const gedcom::PersonId id = personOf(data, focus);
-    if (id == 0) return {focus.written + "\t\n", false};
+    if (id == 0) return {escapedField(focus.written) + "\t\n", false};
     return {std::to_string(id) + "\t" + layoutText(data, id, request) + "\n", true};
 }
 
@@ -171,7 +174,7 @@ int runBatch(const BatchOptions& options) {
             "the standard input cannot hold both the family and the focuses; name a file for one");
     }
     const gedcom::GedcomData data = readFile(options.file);
-    FocusList focuses(data, options.focusFrom);
+    FocusList focuses(data, options.focusFrom, options.unbuffered ? 1 : kBlock);
     const ProgressBar progress(focuses.total());
     const InterruptMark mark;
     std::size_t done = 0;

@@ -124,7 +124,7 @@ std::string tableLine(const std::string& name, const std::vector<std::size_t>& c
 
 // One line for each person as focus, and one for all of them; answers how many layouts have trouble.
 std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& request) {
-    writeStandardOutput(
+    writeReport(
         "focus\tboxes\toverlaps\tlines through boxes\tfamilies on one track\tpersons in several "
         "boxes\tids\n");
     std::size_t troubled = 0;
@@ -142,9 +142,9 @@ std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& 
             text += tableLine(std::to_string(idAt(i)), counts, idsOf(layouts[i].findings));
             if (layouts[i].findings.anyTrouble()) ++troubled;
         }
-        writeStandardOutput(text);
+        writeReport(text);
     }
-    writeStandardOutput(tableLine("total", totals, counted(troubled, "layout", "layouts") + " with trouble"));
+    writeReport(tableLine("total", totals, counted(troubled, "layout", "layouts") + " with trouble"));
     return troubled;
 }
 
@@ -153,7 +153,7 @@ bool tellOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const
     const CheckedLayout layout = checkLayoutOf(data, focus, request);
     std::string text;
     tellLayout(layout, text);
-    writeStandardOutput(text);
+    writeReport(text);
     return layout.findings.anyTrouble();
 }
 
@@ -161,7 +161,7 @@ bool tellOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const
 std::size_t tellData(const gedcom::GedcomData& data) {
     std::string text = summaryOf(data);
     const std::size_t problems = tellDiagnostics(data, text) + tellOddities(data, text);
-    writeStandardOutput(text);
+    writeReport(text);
     return problems;
 }
 

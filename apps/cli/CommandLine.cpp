@@ -54,6 +54,14 @@ void addFile(CLI::App& command, std::string& file) {
         ->type_name("");
 }
 
+void addListFormat(CLI::App& command, ListFormat& format, const char* help) {
+    static const std::map<std::string, ListFormat> kFormats = {
+        {"text", ListFormat::text}, {"tsv", ListFormat::tsv}, {"json", ListFormat::json}};
+    command.add_option("--format", format, help)
+        ->transform(CLI::CheckedTransformer(kFormats))
+        ->type_name("text|tsv|json");
+}
+
 void addFocus(CLI::App& command, std::string& focus) {
     command
         .add_option(
@@ -201,6 +209,9 @@ private:
             ->add_option("WORDS", peopleOptions_.words,
                          "Words that the name must hold; everybody without any")
             ->type_name("");
+        addListFormat(
+            *people_, peopleOptions_.format,
+            "text: id, xref, name and years (default); tsv and json: all fields, for other programs");
     }
 
     void addLayout() {
@@ -260,6 +271,10 @@ private:
                          "bare number is "
                          "an id first. Everybody when not given")
             ->type_name("FROM");
+        batch_
+            ->add_flag("--unbuffered", batchOptions_.unbuffered,
+                       "Answer each line before the next one is read, for a program that asks and waits")
+            ->needs("--focus-from");
         addView(*batch_, batchOptions_.request);
         addBoxes(*batch_, batchOptions_.request, "default tall");
         addFamilySwitches(*batch_, batchOptions_.request);

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -14,8 +15,12 @@ namespace olvane::cli {
 // What the user asked for. Each run... does one subcommand and answers the exit status.
 // Fails: throws UsageError; whatever else goes wrong passes on as it is.
 
+// How a command lists: for people to read, as tab-separated values, or as JSON.
+enum class ListFormat : std::uint8_t { text, tsv, json };
+
 struct PeopleOptions {
     std::string file;
+    ListFormat format = ListFormat::text;
     std::vector<std::string> words;
 };
 
@@ -41,6 +46,7 @@ struct DrawOptions {
 struct BatchOptions {
     std::string file;
     std::string focusFrom;  // file of ids, "-" for the standard input; empty for everybody
+    bool unbuffered = false;
     LayoutRequest request;
 };
 

@@ -20,7 +20,7 @@ int runLayout(const LayoutOptions& options) {
         text = layoutJson(data, focus, options.request, readLayoutText(text),
                           hiddenPersons(data, options.hiding));
     }
-    writeStandardOutput(text + "\n");
+    writeReport(text + "\n");
     return 0;
 }
 

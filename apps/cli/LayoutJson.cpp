@@ -7,6 +7,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <cli/PersonJson.h>
+
 namespace olvane::cli {
 
 namespace {
@@ -14,45 +16,6 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 constexpr int kFormatVersion = 1;
-
-const char* sexName(gedcom::Sex sex) {
-    switch (sex) {
-        case gedcom::Sex::male:
-            return "male";
-        case gedcom::Sex::female:
-            return "female";
-        case gedcom::Sex::other:
-            break;
-    }
-    return "other";
-}
-
-// As written and, where it could be read, in the form that sorts.
-Json dateJson(const gedcom::GedcomDate& date) {
-    Json json;
-    json["written"] = std::string(date.written);
-    if (date.isRead()) {
-        json["year"] = date.year;
-        json["sort"] = gedcom::sortText(date);
-    }
-    json["shown"] = gedcom::displayYear(date);
-    return json;
-}
-
-Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id) {
-    const gedcom::Person& person = data.person(id);
-    const gedcom::PersonName& name = data.firstName(id);
-    Json json;
-    json["xref"] = std::string(person.xref);
-    json["name"] = gedcom::displayName(name);
-    json["given"] = std::string(name.given);
-    json["surname"] = std::string(name.surname);
-    json["sex"] = sexName(person.sex);
-    json["dead"] = person.dead;
-    if (person.birth.isGiven()) json["birth"] = dateJson(person.birth);
-    if (person.death.isGiven()) json["death"] = dateJson(person.death);
-    return json;
-}
 
 Json segmentJson(const LayoutSegment& segment) {
     return {{"x1", segment.x1}, {"y1", segment.y1}, {"x2", segment.x2}, {"y2", segment.y2}};

@@ -10,6 +10,8 @@
 
 #include <unistd.h>
 
+#include <cli/TerminalText.h>
+
 namespace olvane::cli {
 
 namespace {
@@ -26,7 +28,8 @@ bool coloursWanted() {
     return kWanted;
 }
 
-void print(const std::string& text, const char* colour) {
+void print(const std::string& message, const char* colour) {
+    const std::string text = textFor(STDERR_FILENO, message);
     if (coloursWanted()) {
         std::cerr << colour << text << kPlain << '\n';
     } else {

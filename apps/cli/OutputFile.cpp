@@ -18,6 +18,7 @@
 #include <unistd.h>
 
 #include <cli/TemporaryFile.h>
+#include <cli/TerminalText.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -141,6 +142,10 @@ void writeStandardOutput(std::string_view content) {
     } catch (const std::system_error& error) {
         refuse("standard output", error.code().value());
     }
+}
+
+void writeReport(std::string_view text) {
+    writeStandardOutput(textFor(STDOUT_FILENO, text));
 }
 
 }  // namespace olvane::cli

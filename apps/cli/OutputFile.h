@@ -65,4 +65,7 @@ private:
 // Fails: throws UsageError.
 void writeStandardOutput(std::string_view content);
 
+// As writeStandardOutput, for text that holds what a file says: on a terminal it is written as visibleText.
+void writeReport(std::string_view text);
+
 }  // namespace olvane::cli

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Lists persons: number, xref, name and years, with tabs between.
+// Lists persons: number, xref, name and years, with tabs between; or all fields, for other programs.
 
 #include <cli/Commands.h>
 
@@ -11,6 +11,7 @@
 #include <cli/FocusChoice.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
+#include <cli/PeopleList.h>
 
 namespace olvane::cli {
 
@@ -28,15 +29,23 @@ std::vector<gedcom::PersonId> everybody(const gedcom::GedcomData& data) {
     return all;
 }
 
+std::string textOf(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                   ListFormat format) {
+    if (format == ListFormat::tsv) return peopleTable(data, persons);
+    if (format == ListFormat::json) return peopleJson(data, persons);
+    std::string text;
+    for (const gedcom::PersonId id : persons) text += personLine(data, id) + "\n";
+    return text;
+}
+
 }  // namespace
 
 int runPeople(const PeopleOptions& options) {
-    const gedcom::GedcomData data = readFile(options.file);
+    const bool isForPeople = options.format == ListFormat::text;
+    const gedcom::GedcomData data = isForPeople ? readFile(options.file) : readFileWithFacts(options.file);
     const std::string words = joined(options.words);
     const auto persons = words.empty() ? everybody(data) : gedcom::findPersons(data, words);
-    std::string text;
-    for (const gedcom::PersonId id : persons) text += personLine(data, id) + "\n";
-    writeStandardOutput(text);
+    writeReport(textOf(data, persons, options.format));
     if (!persons.empty()) return 0;
     tell(options.file + ": " +
          (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));

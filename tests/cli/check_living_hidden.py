@@ -98,9 +98,9 @@ class Outputs:
             listed = subprocess.run([command, "people", self.path], capture_output=True, timeout=120)
             if listed.returncode not in (0, 1, 2):
                 raise SystemExit(f"{path}: olvane people ended with {listed.returncode}")
-            self.people = [line.split("\t") for line in listed.stdout.decode().splitlines()]
+            self.people = [line.split("\t") for line in listed.stdout.decode().split("\n")[:-1]]
             self.hidden = self.find_hidden()
-            if has_page:
+            if has_page and self.people:
                 self.add_page()
             for focus in [p for p in self.people if p[0] in self.hidden][:1] + self.people[:1]:
                 self.add_pictures(focus[0])

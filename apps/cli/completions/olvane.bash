@@ -21,7 +21,7 @@ _olvane() {
         --boxes) COMPREPLY=($(compgen -W "tall wide" -- "$cur")); return ;;
         --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
         --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
-        --format) COMPREPLY=($(compgen -W "text json" -- "$cur")); return ;;
+        --format) COMPREPLY=($(compgen -W "text tsv json" -- "$cur")); return ;;
         --focus | --title | --year) return ;;
         -o | --output | --focus-from) COMPREPLY=($(compgen -f -- "$cur")); return ;;
     esac
@@ -34,10 +34,10 @@ _olvane() {
         return
     fi
     case ${words[1]} in
-        people) COMPREPLY=($(compgen -W "--help" -- "$cur")) ;;
+        people) COMPREPLY=($(compgen -W "--help --format" -- "$cur")) ;;
         layout) COMPREPLY=($(compgen -W "--help --focus --format $view $living $family" -- "$cur")) ;;
         draw) COMPREPLY=($(compgen -W "--help --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
-        batch) COMPREPLY=($(compgen -W "--help --focus-from $view $family" -- "$cur")) ;;
+        batch) COMPREPLY=($(compgen -W "--help --focus-from --unbuffered $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --focus --all $view $family" -- "$cur")) ;;
         page) COMPREPLY=($(compgen -W "--help --focus --output --title --view $living" -- "$cur")) ;;
     esac

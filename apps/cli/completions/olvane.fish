@@ -34,5 +34,7 @@ complete -c olvane -n '__fish_seen_subcommand_from draw' -l theme -x -a 'light d
 complete -c olvane -n '__fish_seen_subcommand_from draw page' -l title -x -d 'Title'
 complete -c olvane -n '__fish_seen_subcommand_from draw' -l page -x -a 'A4 A3 letter' -d 'Paper to lay the picture out on'
 complete -c olvane -n '__fish_seen_subcommand_from batch' -l focus-from -r -d 'File with the focuses'
+complete -c olvane -n '__fish_seen_subcommand_from batch' -l unbuffered -d 'Answer each line at once'
+complete -c olvane -n '__fish_seen_subcommand_from people' -l format -x -a 'text tsv json' -d 'Form of the output'
 complete -c olvane -n '__fish_seen_subcommand_from page' -l view -x -a 'family pedigree' -d 'Which relatives'
 complete -c olvane -n '__fish_seen_subcommand_from check' -l all -d 'Look at every layout'

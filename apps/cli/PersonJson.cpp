@@ -1,0 +1,76 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A person for other programs.
+
+#include <cli/PersonJson.h>
+
+#include <string>
+
+namespace olvane::cli {
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+void addEvent(const gedcom::GedcomData& data, gedcom::PersonId id, const char* name, std::string_view tag,
+              const gedcom::GedcomDate& date, Json& json) {
+    if (date.isGiven()) json[name] = dateJson(date);
+    const std::string_view place = placeOf(data, id, tag);
+    if (!place.empty()) json[std::string(name) + "Place"] = std::string(place);
+}
+
+}  // namespace
+
+const char* sexName(gedcom::Sex sex) {
+    switch (sex) {
+        case gedcom::Sex::male:
+            return "male";
+        case gedcom::Sex::female:
+            return "female";
+        case gedcom::Sex::other:
+            break;
+    }
+    return "other";
+}
+
+std::string_view placeOf(const gedcom::GedcomData& data, gedcom::PersonId id, std::string_view tag) {
+    const gedcom::Person& person = data.person(id);
+    const std::uint32_t dateLine = tag == "BIRT" ? person.birth.line : person.death.line;
+    std::string_view first;
+    for (const gedcom::Fact& fact : data.factsOfPerson(id)) {
+        if (fact.tag != tag || fact.place.empty()) continue;
+        if (dateLine != 0 && fact.date.line == dateLine) return fact.place;
+        if (first.empty()) first = fact.place;
+    }
+    return first;
+}
+
+// As written and, where it could be read, in the form that sorts.
+Json dateJson(const gedcom::GedcomDate& date) {
+    Json json;
+    json["written"] = std::string(date.written);
+    if (date.isRead()) {
+        json["year"] = date.year;
+        json["sort"] = gedcom::sortText(date);
+    }
+    json["shown"] = gedcom::displayYear(date);
+    return json;
+}
+
+Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id) {
+    const gedcom::Person& person = data.person(id);
+    const gedcom::PersonName& name = data.firstName(id);
+    Json json;
+    json["xref"] = std::string(person.xref);
+    json["name"] = gedcom::displayName(name);
+    json["given"] = std::string(name.given);
+    json["surname"] = std::string(name.surname);
+    json["sex"] = sexName(person.sex);
+    json["dead"] = person.dead;
+    addEvent(data, id, "birth", "BIRT", person.birth, json);
+    addEvent(data, id, "death", "DEAT", person.death, json);
+    return json;
+}
+
+}  // namespace olvane::cli
