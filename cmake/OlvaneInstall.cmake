@@ -5,7 +5,7 @@
 
 include(CMakePackageConfigHelpers)
 
-install(TARGETS olvane_engine EXPORT olvaneTargets
+install(TARGETS olvane_engine olvane_family EXPORT olvaneTargets
   ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
   LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT dev
   FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR})

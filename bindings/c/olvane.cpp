@@ -17,6 +17,8 @@
 #include <utility>
 #include <vector>
 
+#include "FamilyInternal.h"
+
 #include <olvane/boundary/HostText.h>
 #include <olvane/boundary/LayoutPieces.h>
 #include <olvane/family/FamilyOptions.h>
@@ -219,12 +221,18 @@ OptionMap familyOptionsOf(const olvane_options& options) {
     return map;
 }
 
-// What both views ask for.
+// What both views ask for. Exactly one of host and family is there.
 struct Request {
-    const olvane_host& host;
+    const olvane_host* host;
+    const olvane_family* family;
     int focus;
     const olvane_options& options;
 };
+
+std::shared_ptr<OlvaneViewerManagerWrapProtocol> managerOf(const Request& request) {
+    if (request.host) return std::make_shared<CallbackManager>(*request.host);
+    return std::make_shared<olvane::FamilyDataSource>(request.family->table);
+}
 
 template <class Layouter>
 void writeLayout(Layouter& layouter, ViewerGlue& glue, std::string& text) {
@@ -254,8 +262,7 @@ typedef void (*ViewWriter)(const Request&, DataAdapter&, ViewerGlue&, int, std::
 
 void runRequest(const Request& request, ViewWriter writeView, std::string& text) {
     ViewerGlue glue;
-    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> manager =
-        std::make_shared<CallbackManager>(request.host);
+    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> manager = managerOf(request);
     const olvane::HostCallbacks callbacks(glue, manager);
     olvane::resetAddParentId();
     DataAdapter adapter = callbacks.dataAdapter();
@@ -322,22 +329,26 @@ olvane_status fillLayout(const Request& request, ViewWriter writeView, olvane_la
     return status;
 }
 
-olvane_status layOut(const olvane_host* host, std::int64_t focus, const olvane_options* options,
-                     ViewWriter writeView, olvane_layout** layout) noexcept {
-    if (!layout) return OLVANE_INVALID_ARGUMENT;
-    *layout = nullptr;
-    const olvane_options chosen = options ? *options : defaultOptions();
-    if (!host || !isComplete(*host) || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+olvane_status layOut(const Request& request, ViewWriter writeView, olvane_layout** layout) noexcept {
     const RunningLayout running;
     if (!running.isFirst()) return OLVANE_NESTED_CALL;
     try {
         auto filled = std::make_unique<olvane_layout>();
-        const olvane_status status = fillLayout({*host, lowBits(focus), chosen}, writeView, *filled);
+        const olvane_status status = fillLayout(request, writeView, *filled);
         *layout = filled.release();
         return status;
     } catch (...) {
         return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here: the text is the writer's own
     }
+}
+
+olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olvane_options* options,
+                         ViewWriter writeView, olvane_layout** layout) noexcept {
+    if (!layout) return OLVANE_INVALID_ARGUMENT;
+    *layout = nullptr;
+    const olvane_options chosen = options ? *options : defaultOptions();
+    if (!host || !isComplete(*host) || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    return layOut({host, nullptr, lowBits(focus), chosen}, writeView, layout);
 }
 
 }  // namespace
@@ -358,6 +369,8 @@ const char* olvane_status_text(olvane_status status) {
             return "There is not enough memory.";
         case OLVANE_NESTED_CALL:
             return "A callback asked for a layout while its own is still running on this thread.";
+        case OLVANE_REFUSED:
+            return "Rows of a family are wrong; nothing has changed, and the error says where.";
     }
     return "This number is not a status of this version.";
 }
@@ -396,12 +409,24 @@ olvane_status olvane_options_default(olvane_options* options) {
 
 olvane_status olvane_layout_family(const olvane_host* host, int64_t focus, const olvane_options* options,
                                    olvane_layout** layout) {
-    return layOut(host, focus, options, writeFamily, layout);
+    return layOutHost(host, focus, options, writeFamily, layout);
 }
 
 olvane_status olvane_layout_pedigree(const olvane_host* host, int64_t focus, const olvane_options* options,
                                      olvane_layout** layout) {
-    return layOut(host, focus, options, writePedigree, layout);
+    return layOutHost(host, focus, options, writePedigree, layout);
+}
+
+olvane_status olvane_view(const olvane_family* family, int32_t view, int64_t focus,
+                          const olvane_options* options, olvane_layout** layout) {
+    if (!layout) return OLVANE_INVALID_ARGUMENT;
+    *layout = nullptr;
+    const olvane_options chosen = options ? *options : defaultOptions();
+    const bool isView = view == OLVANE_VIEW_FAMILY || view == OLVANE_VIEW_PEDIGREE;
+    if (!family || !isView || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    const int known = family->table.hasPerson(focus) ? static_cast<int>(focus) : 0;
+    return layOut({nullptr, family, known, chosen}, view == OLVANE_VIEW_FAMILY ? writeFamily : writePedigree,
+                  layout);
 }
 
 void olvane_layout_free(olvane_layout* layout) {

@@ -42,7 +42,8 @@ typedef enum olvane_status {
     OLVANE_HOST_FAILED = 3,      /* a callback reported failure; the layout holds what came before */
     OLVANE_LAYOUT_FAILED = 4,    /* the data leave no picture: relatives with ids below 1 may do that */
     OLVANE_OUT_OF_MEMORY = 5,
-    OLVANE_NESTED_CALL = 6 /* asked for by a callback of a layout that is still running on this thread */
+    OLVANE_NESTED_CALL = 6, /* asked for by a callback of a layout that is still running on this thread */
+    OLVANE_REFUSED = 7      /* rows of a family are wrong; nothing has changed, and the error says where */
 } olvane_status;
 
 /* A sentence in English for every status, and for any other number one that says so. Lives for ever. */

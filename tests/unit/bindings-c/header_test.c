@@ -5,6 +5,7 @@
  */
 
 #include <olvane.h>
+#include <olvane_family.h>
 
 #include <stdio.h>
 #include <string.h>
