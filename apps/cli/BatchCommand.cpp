@@ -169,11 +169,11 @@ BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const
 }  // namespace
 
 int runBatch(const BatchOptions& options) {
-    if (options.file == kStandardInput && options.focusFrom == kStandardInput) {
+    if (options.input.file == kStandardInput && options.focusFrom == kStandardInput) {
         throw UsageError(
             "the standard input cannot hold both the family and the focuses; name a file for one");
     }
-    const gedcom::GedcomData data = readFile(options.file);
+    const gedcom::GedcomData data = readFile(options.input);
     FocusList focuses(data, options.focusFrom, options.unbuffered ? 1 : kBlock);
     const ProgressBar progress(focuses.total());
     const InterruptMark mark;
@@ -188,7 +188,7 @@ int runBatch(const BatchOptions& options) {
             writeStandardOutput(lines[i].text);
             if (lines[i].isKnown) continue;
             ++unknown;
-            tell(options.file + ": '" + block[i].written + "' is not one person");
+            tell(options.input.file + ": '" + block[i].written + "' is not one person");
         }
         progress.show(done);
     }

@@ -169,7 +169,7 @@ std::size_t tellData(const gedcom::GedcomData& data) {
 
 // The focus is settled first, so that a mistyped name is not lost below what the data brings up.
 int runCheck(const CheckOptions& options) {
-    const gedcom::GedcomData data = readFileQuietly(options.file);
+    const gedcom::GedcomData data = readFileQuietly(options.input);
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
     bool anyTrouble = tellData(data) > 0;
     if (focus != 0) anyTrouble = tellOneLayout(data, focus, options.request) || anyTrouble;

@@ -13,6 +13,7 @@
 #include <CLI/CLI.hpp>
 
 #include <olvane/family/FamilyOptions.h>
+#include <olvane/gedcom/GedcomEncodings.h>
 
 #include <cli/Commands.h>
 #include <cli/InputFiles.h>
@@ -24,6 +25,16 @@ namespace olvane::cli {
 namespace {
 
 constexpr int kWrongUse = 2;
+
+std::string unknownEncoding(const std::string& name) {
+    std::string text = "'" + name + "' is no known encoding; known are";
+    const char* separator = " ";
+    for (const std::string_view known : gedcom::encodingNames()) {
+        text.append(separator).append(known);
+        separator = ", ";
+    }
+    return text;
+}
 
 struct FamilySwitch {
     const char* name;
@@ -48,10 +59,23 @@ const std::vector<FamilySwitch>& familySwitches() {
     return kSwitches;
 }
 
-void addFile(CLI::App& command, std::string& file) {
-    command.add_option("FILE", file, "GEDCOM file: .ged, or a .gdz archive; - for the standard input")
+void addEncoding(CLI::App& command, InputOptions& input) {
+    command
+        .add_option(
+            "--encoding", input.encoding,
+            "The encoding of the file, such as UTF-8, ANSEL, windows-1250, ISO-8859-2 or KOI8-R; as the file "
+            "says and its text allows when not given")
+        ->check([](const std::string& name) {
+            return gedcom::encodingLabelled(name).empty() ? unknownEncoding(name) : std::string();
+        })
+        ->type_name("NAME");
+}
+
+void addFile(CLI::App& command, InputOptions& input) {
+    command.add_option("FILE", input.file, "GEDCOM file: .ged, or a .gdz archive; - for the standard input")
         ->required()
         ->type_name("");
+    addEncoding(command, input);
 }
 
 void addListFormat(CLI::App& command, ListFormat& format, const char* help) {
@@ -204,7 +228,7 @@ private:
 
     void addPeople() {
         people_ = app_.add_subcommand("people", "List persons with ids, names and years");
-        addFile(*people_, peopleOptions_.file);
+        addFile(*people_, peopleOptions_.input);
         people_
             ->add_option("WORDS", peopleOptions_.words,
                          "Words that the name must hold; everybody without any")
@@ -216,7 +240,7 @@ private:
 
     void addLayout() {
         layout_ = app_.add_subcommand("layout", "Print where everybody stands, as the engine's result text");
-        addFile(*layout_, layoutOptions_.file);
+        addFile(*layout_, layoutOptions_.input);
         addFocus(*layout_, layoutOptions_.focus);
         layout_
             ->add_option(
@@ -233,7 +257,7 @@ private:
 
     void addDraw() {
         draw_ = app_.add_subcommand("draw", "Draw a person's family or pedigree");
-        addFile(*draw_, drawOptions_.file);
+        addFile(*draw_, drawOptions_.input);
         addFocus(*draw_, drawOptions_.focus);
         draw_
             ->add_option("-o,--output", drawOptions_.output,
@@ -264,7 +288,7 @@ private:
     void addBatch() {
         batch_ = app_.add_subcommand("batch",
                                      "Print many layouts: id, a tab and the result text on a line for each");
-        addFile(*batch_, batchOptions_.file);
+        addFile(*batch_, batchOptions_.input);
         batch_
             ->add_option("--focus-from", batchOptions_.focusFrom,
                          "File with the focuses, an id or xref on each line; - for the standard input. A "
@@ -283,7 +307,7 @@ private:
     void addCheck() {
         check_ =
             app_.add_subcommand("check", "Tell what is wrong or odd in a file, or hard to read in a layout");
-        addFile(*check_, checkOptions_.file);
+        addFile(*check_, checkOptions_.input);
         CLI::Option* focus = check_
                                  ->add_option("--focus", checkOptions_.focus,
                                               "Look at this person's layout as well, an xref, a number of "
@@ -306,10 +330,11 @@ private:
                                     "Write a page to explore the family in any browser, without a network");
         page_
             ->add_option(
-                "FILE", pageOptions_.file,
+                "FILE", pageOptions_.input.file,
                 "GEDCOM file: .ged, or a .gdz archive; - for the standard input. Without one the page asks "
                 "for it when opened")
             ->type_name("");
+        addEncoding(*page_, pageOptions_.input);
         page_->add_option("-o,--output", pageOptions_.output, "Page to write; - for the standard output")
             ->required()
             ->type_name("OUT.html");
@@ -327,6 +352,7 @@ private:
             ->type_name("TEXT");
         addHideLiving(*page_, pageOptions_.hiding, "; nor any free text about others that may name them");
         needsFile(focus);
+        needsFile(page_->get_option("--encoding"));
         needsFile(page_->get_option("--hide-living"));
         needsFile(page_->get_option("--title"));
         needsFile(page_->get_option("--view"));

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include <cli/FileReading.h>
 #include <cli/HiddenPersons.h>
 #include <cli/LayoutRun.h>
 
@@ -19,13 +20,13 @@ namespace olvane::cli {
 enum class ListFormat : std::uint8_t { text, tsv, json };
 
 struct PeopleOptions {
-    std::string file;
+    InputOptions input;
     ListFormat format = ListFormat::text;
     std::vector<std::string> words;
 };
 
 struct LayoutOptions {
-    std::string file;
+    InputOptions input;
     std::string focus;
     bool json = false;
     HidingOptions hiding;
@@ -33,7 +34,7 @@ struct LayoutOptions {
 };
 
 struct DrawOptions {
-    std::string file;
+    InputOptions input;
     std::string focus;
     std::string output;
     LayoutRequest request;
@@ -44,21 +45,21 @@ struct DrawOptions {
 };
 
 struct BatchOptions {
-    std::string file;
+    InputOptions input;
     std::string focusFrom;  // file of ids, "-" for the standard input; empty for everybody
     bool unbuffered = false;
     LayoutRequest request;
 };
 
 struct CheckOptions {
-    std::string file;
+    InputOptions input;
     std::string focus;  // empty for the data alone
     bool all = false;   // the layouts of everybody
     LayoutRequest request;
 };
 
 struct PageOptions {
-    std::string file;  // empty for a page without a family
+    InputOptions input;  // without a file for a page without a family
     std::string focus;
     std::string output;
     std::string title;  // empty for one made of the focus's name

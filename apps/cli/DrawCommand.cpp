@@ -152,9 +152,9 @@ std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::S
 
 int runDraw(const DrawOptions& options) {
     const Form form = formOf(options.output);
-    const OutputRules rules{InputFiles({options.file}), {endingOf(form)}};
+    const OutputRules rules{InputFiles({options.input.file}), {endingOf(form)}};
     checkOutput(options.output, rules);
-    const gedcom::GedcomData data = readFile(options.file);
+    const gedcom::GedcomData data = readFile(options.input);
     const draw::DrawingContent content = contentOf(data, options);
     const draw::DrawingOptions drawing = drawingOptions(options, content);
     const auto sheets = sheetsOf(options, draw::drawSvg(content, drawing), drawing.title);

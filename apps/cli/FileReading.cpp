@@ -68,12 +68,13 @@ gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions
     return gedcom::readGedcomBytes(readStandardInput(), kStandardInputName, options);
 }
 
-gedcom::GedcomData read(const std::string& path, bool facts = false) {
+gedcom::GedcomData read(const InputOptions& input, bool facts = false) {
     gedcom::ReadOptions options;
     options.diagnosticsPerKind = kCounted;
     options.facts = facts;
+    options.encoding = input.encoding;
     try {
-        return readSource(path, options);
+        return readSource(input.file, options);
     } catch (const gedcom::GedcomError& error) {
         throw UsageError(std::string(error.what()) + " (a GEDCOM file is needed, .ged or .gdz)");
     }
@@ -81,20 +82,20 @@ gedcom::GedcomData read(const std::string& path, bool facts = false) {
 
 }  // namespace
 
-gedcom::GedcomData readFile(const std::string& path) {
-    gedcom::GedcomData data = read(path);
+gedcom::GedcomData readFile(const InputOptions& input) {
+    gedcom::GedcomData data = read(input);
     report(data);
     return data;
 }
 
-gedcom::GedcomData readFileWithFacts(const std::string& path) {
-    gedcom::GedcomData data = read(path, true);
+gedcom::GedcomData readFileWithFacts(const InputOptions& input) {
+    gedcom::GedcomData data = read(input, true);
     report(data);
     return data;
 }
 
-gedcom::GedcomData readFileQuietly(const std::string& path) {
-    return read(path);
+gedcom::GedcomData readFileQuietly(const InputOptions& input) {
+    return read(input);
 }
 
 }  // namespace olvane::cli

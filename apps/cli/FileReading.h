@@ -9,15 +9,21 @@
 
 namespace olvane::cli {
 
-// Reads a GEDCOM file, or the standard input where the path is "-", and reports on stderr, by file and line, what was wrong in it: errors and warnings, but
+// A GEDCOM file and how it is to be read.
+struct InputOptions {
+    std::string file;      // "-" for the standard input
+    std::string encoding;  // a label that gedcom::encodingLabelled knows; empty for the file's own
+};
+
+// Reads a GEDCOM file, or the standard input, and reports on stderr, by file and line, what was wrong in it: errors and warnings, but
 // not notes, at most ten of a kind, and how many more there are.
 // Fails: throws UsageError with a hint where there is nothing to read.
-gedcom::GedcomData readFile(const std::string& path);
+gedcom::GedcomData readFile(const InputOptions& input);
 
 // As readFile, and keeps the facts of persons and couples.
-gedcom::GedcomData readFileWithFacts(const std::string& path);
+gedcom::GedcomData readFileWithFacts(const InputOptions& input);
 
 // As readFile, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
-gedcom::GedcomData readFileQuietly(const std::string& path);
+gedcom::GedcomData readFileQuietly(const InputOptions& input);
 
 }  // namespace olvane::cli

@@ -13,7 +13,7 @@
 namespace olvane::cli {
 
 int runLayout(const LayoutOptions& options) {
-    const gedcom::GedcomData data = readFile(options.file);
+    const gedcom::GedcomData data = readFile(options.input);
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
     std::string text = layoutText(data, focus, options.request);
     if (options.json) {

@@ -38,8 +38,8 @@ void refuseTooLarge(const gedcom::GedcomData& data, std::size_t bytes) {
 // The name that the page knows the file by. A file is often named after somebody, so with anybody hidden, as without
 // a name, it has a common one.
 std::string fileNameOf(const PageOptions& options) {
-    if (options.hiding.hideLiving || options.file == kStandardInput) return "family.ged";
-    return options.file.substr(options.file.find_last_of('/') + 1);
+    if (options.hiding.hideLiving || options.input.file == kStandardInput) return "family.ged";
+    return options.input.file.substr(options.input.file.find_last_of('/') + 1);
 }
 
 std::string withoutEnding(const std::string& name) {
@@ -62,7 +62,7 @@ std::string focusOf(gedcom::PersonId focus) {
 }
 
 PageFamily familyOf(const PageOptions& options) {
-    const gedcom::GedcomData data = readFileWithFacts(options.file);
+    const gedcom::GedcomData data = readFileWithFacts(options.input);
     gedcom::WriteOptions hiding;
     hiding.hidden = hiddenPersons(data, options.hiding);
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
@@ -86,9 +86,9 @@ int runPage(const PageOptions& options) {
         throw UsageError(
             "this olvane was built without the page; install emscripten, nodejs and npm, and build it again");
     }
-    const OutputRules rules{InputFiles({options.file}), {".html", ".htm"}};
+    const OutputRules rules{InputFiles({options.input.file}), {".html", ".htm"}};
     checkOutput(options.output, rules);
-    if (options.file.empty()) {
+    if (options.input.file.empty()) {
         writeOutput(options.output, pageTemplate(), rules);
     } else {
         writeOutput(options.output, pageWith(pageTemplate(), familyOf(options)), rules);

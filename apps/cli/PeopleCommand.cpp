@@ -42,12 +42,12 @@ std::string textOf(const gedcom::GedcomData& data, const std::vector<gedcom::Per
 
 int runPeople(const PeopleOptions& options) {
     const bool isForPeople = options.format == ListFormat::text;
-    const gedcom::GedcomData data = isForPeople ? readFile(options.file) : readFileWithFacts(options.file);
+    const gedcom::GedcomData data = isForPeople ? readFile(options.input) : readFileWithFacts(options.input);
     const std::string words = joined(options.words);
     const auto persons = words.empty() ? everybody(data) : gedcom::findPersons(data, words);
     writeReport(textOf(data, persons, options.format));
     if (!persons.empty()) return 0;
-    tell(options.file + ": " +
+    tell(options.input.file + ": " +
          (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));
     return 1;
 }

@@ -15,6 +15,8 @@ _olvane() {
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"
+    local encodings="UTF-8 UTF-16LE UTF-16BE ANSEL windows-1250 windows-1251 windows-1252 windows-1253 ISO-8859-2 \
+        ISO-8859-15 KOI8-R GB18030 Big5 Shift_JIS EUC-JP EUC-KR IBM437 IBM850"
     case $prev in
         --view) COMPREPLY=($(compgen -W "family pedigree" -- "$cur")); return ;;
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
@@ -22,6 +24,7 @@ _olvane() {
         --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
         --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
         --format) COMPREPLY=($(compgen -W "text tsv json" -- "$cur")); return ;;
+        --encoding) COMPREPLY=($(compgen -W "$encodings" -- "$cur")); return ;;
         --focus | --title | --year) return ;;
         -o | --output | --focus-from) COMPREPLY=($(compgen -f -- "$cur")); return ;;
     esac
@@ -34,12 +37,12 @@ _olvane() {
         return
     fi
     case ${words[1]} in
-        people) COMPREPLY=($(compgen -W "--help --format" -- "$cur")) ;;
-        layout) COMPREPLY=($(compgen -W "--help --focus --format $view $living $family" -- "$cur")) ;;
-        draw) COMPREPLY=($(compgen -W "--help --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
-        batch) COMPREPLY=($(compgen -W "--help --focus-from --unbuffered $view $family" -- "$cur")) ;;
-        check) COMPREPLY=($(compgen -W "--help --focus --all $view $family" -- "$cur")) ;;
-        page) COMPREPLY=($(compgen -W "--help --focus --output --title --view $living" -- "$cur")) ;;
+        people) COMPREPLY=($(compgen -W "--help --encoding --format" -- "$cur")) ;;
+        layout) COMPREPLY=($(compgen -W "--help --encoding --focus --format $view $living $family" -- "$cur")) ;;
+        draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
+        batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
+        check) COMPREPLY=($(compgen -W "--help --encoding --focus --all $view $family" -- "$cur")) ;;
+        page) COMPREPLY=($(compgen -W "--help --encoding --focus --output --title --view $living" -- "$cur")) ;;
     esac
 }
 

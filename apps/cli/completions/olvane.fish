@@ -11,6 +11,7 @@ complete -c olvane -n __fish_use_subcommand -f -a check -d 'Tell what is wrong o
 complete -c olvane -n __fish_use_subcommand -f -a page -d 'Write a page for any browser'
 complete -c olvane -n __fish_use_subcommand -l version -d 'Show the version'
 complete -c olvane -l help -d 'Show help'
+complete -c olvane -n 'not __fish_use_subcommand' -l encoding -x -a 'UTF-8 UTF-16LE UTF-16BE ANSEL windows-1250 windows-1251 windows-1252 windows-1253 ISO-8859-2 ISO-8859-15 KOI8-R GB18030 Big5 Shift_JIS EUC-JP EUC-KR IBM437 IBM850' -d 'Encoding of the file'
 
 set -l layouts layout draw batch check
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l view -x -a 'family pedigree' -d 'Which relatives'
