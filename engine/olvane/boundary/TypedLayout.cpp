@@ -32,7 +32,7 @@ public:
     BoxWriter(const ViewerGlue& glue, const LineRecord& record, TypedLayout& layout)
         : glue_(glue), record_(record), layout_(layout) {
         layout.boxes.reserve(record.visits());
-        layout.lines.reserve(record.entries().size());
+        layout.lines.reserve(record.segments());
     }
 
     void add(const TreeViewPerson& person) {
@@ -59,14 +59,31 @@ private:
     }
 
     void addLines(const TreeViewPerson& person, Index holder) {
-        int place = record_.firstEntryOf(person);
-        for (const TreeLineSegment& segment : person.lineSegments) {
-            if (place == LineRecord::kNone) throw std::logic_error("a line without a record");
+        const TreeLineSegment* segment = person.lineSegments.data();
+        std::size_t left = person.lineSegments.size();
+        for (int place = record_.firstEntryOf(person); place != LineRecord::kNone;) {
             const LineRecord::Entry& entry = record_.entries()[static_cast<std::size_t>(place)];
-            layout_.lines.push_back({wholePoint(segment.x1), wholePoint(segment.y1), wholePoint(segment.x2),
-                                     wholePoint(segment.y2), holder, entry.family, entry.child, entry.role});
+            if (entry.segments > left) failForCount();
+            for (std::uint8_t i = 0; i < entry.segments; ++i) addLine(*segment++, entry, i, holder);
+            left -= entry.segments;
             place = entry.next;
         }
+        if (left != 0) failForCount();
+    }
+
+    // Lines run along the axes, so the second end mostly shares a number with the first.
+    void addLine(const TreeLineSegment& segment, const LineRecord::Entry& entry, std::uint8_t place,
+                 Index holder) {
+        const int x1 = wholePoint(segment.x1);
+        const int y1 = wholePoint(segment.y1);
+        const int x2 = segment.x2 == segment.x1 ? x1 : wholePoint(segment.x2);
+        const int y2 = segment.y2 == segment.y1 ? y1 : wholePoint(segment.y2);
+        const auto role = static_cast<LineRole>(static_cast<std::uint8_t>(entry.first) + place);
+        layout_.lines.push_back({x1, y1, x2, y2, holder, entry.family, entry.child, role});
+    }
+
+    [[noreturn]] static void failForCount() {
+        throw std::logic_error("a person's lines are not those that were recorded");
     }
 
     const ViewerGlue& glue_;
@@ -74,33 +91,31 @@ private:
     TypedLayout& layout_;
 };
 
-// Groups the children by family, each once, and leaves their order within a family.
-void addFamilies(const LineRecord& record, TypedLayout& layout) {
-    layout.families.reserve(record.families().size());
-    for (const LineRecord::Family& family : record.families()) {
-        layout.families.push_back({{family.first, family.second}, 0, 0});
-    }
-    std::vector<std::uint32_t> next(layout.families.size() + 1, 0);
-    for (const LineRecord::Child& child : record.children())
-        ++next[static_cast<std::size_t>(child.family) + 1];
-    for (std::size_t i = 1; i < next.size(); ++i) next[i] += next[i - 1];
-    std::vector<Index> grouped(record.children().size());
-    for (const LineRecord::Child& child : record.children()) {
-        grouped[next[static_cast<std::size_t>(child.family)]++] = child.child;
-    }
-    std::vector<Index> seenIn(layout.boxes.size(), TypedLayout::kNone);
-    layout.children.reserve(grouped.size());
-    std::size_t from = 0;
-    for (std::size_t i = 0; i < layout.families.size(); ++i) {
-        TypedLayout::Family& family = layout.families[i];
-        family.firstChild = static_cast<std::uint32_t>(layout.children.size());
-        for (; from < next[i]; ++from) {
-            Index& seen = seenIn[static_cast<std::size_t>(grouped[from])];
-            if (seen == static_cast<Index>(i)) continue;
-            seen = static_cast<Index>(i);
-            layout.children.push_back(grouped[from]);
+// A family's children, each once. Only where the walk visits somebody twice may one have been recorded twice.
+void addChildren(const LineRecord& record, const LineRecord::Family& family, std::vector<Index>& seenIn,
+                 TypedLayout& layout) {
+    const auto number = static_cast<Index>(layout.families.size());
+    for (int place = family.firstChild; place != LineRecord::kNone;) {
+        const LineRecord::Child& entry = record.children()[static_cast<std::size_t>(place)];
+        place = entry.next;
+        if (record.hasRepeatedVisits()) {
+            Index& seen = seenIn[static_cast<std::size_t>(entry.child)];
+            if (seen == number) continue;
+            seen = number;
         }
-        family.childCount = static_cast<std::uint32_t>(layout.children.size()) - family.firstChild;
+        layout.children.push_back(entry.child);
+    }
+}
+
+void addFamilies(const LineRecord& record, TypedLayout& layout) {
+    std::vector<Index> seenIn(record.hasRepeatedVisits() ? record.visits() : 0, TypedLayout::kNone);
+    layout.families.reserve(record.families().size());
+    layout.children.reserve(record.children().size());
+    for (const LineRecord::Family& family : record.families()) {
+        const auto first = static_cast<std::uint32_t>(layout.children.size());
+        addChildren(record, family, seenIn, layout);
+        const auto count = static_cast<std::uint32_t>(layout.children.size()) - first;
+        layout.families.push_back({{family.first, family.second}, first, count});
     }
 }
 

@@ -142,6 +142,7 @@ void TreeViewFamilyLayouter::placeGreatGrandparents() {
 void TreeViewFamilyLayouter::drawLines() {
     const std::vector<TreeViewPerson*> persons = std::move(everybody);
     if (lineRecord != nullptr) {
+        lineRecord->reserve(persons.size());
         for (TreeViewPerson* person : persons) lineRecord->number(*person);
     }
     for (TreeViewPerson* person : persons) addSpouseLinesToPerson(*person);

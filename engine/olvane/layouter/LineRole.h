@@ -14,7 +14,7 @@ namespace olvane {
 //        +-----+-----+      bar: along the children
 //        |           |      stem: to one child
 //
-// In a pedigree, which lies on its side, drops and stems run sideways and bars up and down.
+// In the order in which the pieces to one child are made. In a pedigree, which lies on its side, drops and stems run sideways and bars up and down.
 enum class LineRole : std::uint8_t { marriage, drop, bar, stem };
 
 }  // namespace olvane

@@ -24,6 +24,21 @@ TreeViewPedigreeLayouter::TreeViewPedigreeLayouter(DataAdapter* data, int focusK
       maxGenerations(generations),
       maxStackDepth(stackDepth) {}
 
+namespace {
+
+// In the order of graphIterator.
+void numberPersons(TreeViewPerson& person, LineRecord& record) {
+    record.number(person);
+    const auto goOn = [&record](TreeViewPerson& relative) { numberPersons(relative, record); };
+    if (person.children.empty() && person.spouses.empty()) {  // as all ancestors
+        for (TreeViewPerson& parent : person.parents) goOn(parent);
+    } else {
+        visitParentsSpousesAndChildren(person, goOn);
+    }
+}
+
+}  // namespace
+
 void TreeViewPedigreeLayouter::layoutForFocusNID() {
     shownPersons.clear();
     focusPerson.getNodeCenter() = TreePoint{treeSize.nodeWidth * 0.5f, 0.0f};
@@ -31,7 +46,8 @@ void TreeViewPedigreeLayouter::layoutForFocusNID() {
     addAndLayoutChildrenAndSpousesOfFocusPerson(focusPerson);
     addAndLayoutParentsOfPerson(focusPerson, 0, 0);
     if (lineRecord != nullptr) {
-        graphIterator([this](TreeViewPerson& person) { lineRecord->number(person); });
+        lineRecord->reserve(shownPersons.sizeAtMost());
+        numberPersons(focusPerson, *lineRecord);
     }
     addSpouseAndChildrenLinesForFocusPerson(focusPerson);
     addParentLinesForPerson(focusPerson);

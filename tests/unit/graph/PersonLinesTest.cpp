@@ -3,6 +3,7 @@
 
 // The segments that hang from a person, and the cut of a coordinate to a whole point.
 
+#include <cmath>
 #include <limits>
 #include <stdexcept>
 #include <vector>
@@ -118,6 +119,23 @@ TEST(WholePoints, notANumberBecomesZero) {
 
 TEST(WholePoints, sumInDoubleIsCutDirectly) {
     EXPECT_EQ(0, olvane::wholePoint(0.99999999999));  // a float would have made 1 of it
+}
+
+// A float is cut by comparisons of its own, and must be cut to the same number: at every power of two and its
+// neighbours, and where nothing fits.
+TEST(WholePoints, ofAFloatIsThatOfTheSameNumberAsADouble) {
+    constexpr float kEndless = std::numeric_limits<float>::infinity();
+    std::vector<float> values = {0.0f, -0.0f, kEndless, -kEndless, std::numeric_limits<float>::quiet_NaN()};
+    for (int exponent = -149; exponent < 128; ++exponent) {
+        const float power = std::ldexp(1.0f, exponent);
+        for (const float value : {std::nextafter(power, 0.0f), power, std::nextafter(power, kEndless)}) {
+            values.push_back(value);
+            values.push_back(-value);
+        }
+    }
+    for (const float value : values) {
+        EXPECT_EQ(olvane::wholePoint(static_cast<double>(value)), olvane::wholePoint(value)) << value;
+    }
 }
 
 TEST(WholePoints, areHandedBackAsCoordinates) {
