@@ -164,6 +164,7 @@ public:
         addDraw();
         addBatch();
         addCheck();
+        addJudge();
         addPage();
     }
 
@@ -180,6 +181,7 @@ public:
         if (layout_->parsed()) return runLayout(completedLayoutOptions());
         if (batch_->parsed()) return runBatch(batchOptions_);
         if (check_->parsed()) return runCheck(completedCheckOptions());
+        if (judge_->parsed()) return runJudge(judgeOptions_);
         if (page_->parsed()) return runPage(pageOptions_);
         return runDraw(completedDrawOptions());
     }
@@ -190,7 +192,7 @@ private:
         const std::vector<std::string> strangers = app_.remaining();
         if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
             return "there is no command '" + strangers.front() +
-                   "', but people, layout, draw, batch, check and page; 'olvane --help' tells more";
+                   "', but people, layout, draw, batch, check, judge and page; 'olvane --help' tells more";
         }
         return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' tells more";
     }
@@ -325,6 +327,27 @@ private:
         addFamilySwitches(*check_, checkOptions_.request);
     }
 
+    void addJudge() {
+        judge_ = app_.add_subcommand("judge", "Count what makes a picture hard to read, in pictures as JSON");
+        judge_
+            ->add_option("PICTURE", judgeOptions_.files,
+                         "Pictures as 'olvane layout --format json' prints them; - for the standard input")
+            ->required()
+            ->type_name("");
+        CLI::Option* family =
+            judge_
+                ->add_option("--family", judgeOptions_.family.file,
+                             "GEDCOM file of the family, to count relations of it that a picture "
+                             "does not express")
+                ->type_name("FILE");
+        addEncoding(*judge_, judgeOptions_.family);
+        judge_->get_option("--encoding")->needs(family);
+        addListFormat(
+            *judge_, judgeOptions_.format,
+            "text: a line for each count (default); tsv: a line for each picture; json: with what each "
+            "count is about");
+    }
+
     void addPage() {
         page_ = app_.add_subcommand("page",
                                     "Write a page to explore the family in any browser, without a network");
@@ -391,6 +414,7 @@ private:
     CLI::App* draw_ = nullptr;
     CLI::App* batch_ = nullptr;
     CLI::App* check_ = nullptr;
+    CLI::App* judge_ = nullptr;
     CLI::App* page_ = nullptr;
     PeopleOptions peopleOptions_;
     LayoutOptions layoutOptions_;
@@ -398,6 +422,7 @@ private:
     DrawOptions drawOptions_;
     BatchOptions batchOptions_;
     CheckOptions checkOptions_;
+    JudgeOptions judgeOptions_;
     PageOptions pageOptions_;
 };
 

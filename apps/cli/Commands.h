@@ -58,6 +58,12 @@ struct CheckOptions {
     LayoutRequest request;
 };
 
+struct JudgeOptions {
+    std::vector<std::string> files;  // pictures as JSON, "-" for the standard input
+    InputOptions family;             // what is known, without a file for nothing
+    ListFormat format = ListFormat::text;
+};
+
 struct PageOptions {
     InputOptions input;  // without a file for a page without a family
     std::string focus;
@@ -72,6 +78,7 @@ int runLayout(const LayoutOptions& options);
 int runDraw(const DrawOptions& options);
 int runBatch(const BatchOptions& options);
 int runCheck(const CheckOptions& options);
+int runJudge(const JudgeOptions& options);
 int runPage(const PageOptions& options);
 
 }  // namespace olvane::cli

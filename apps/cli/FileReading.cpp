@@ -5,15 +5,12 @@
 
 #include <cli/FileReading.h>
 
-#include <algorithm>
 #include <array>
-#include <cerrno>
 #include <cstddef>
-#include <cstdio>
-#include <cstring>
 
 #include <olvane/gedcom/GedcomReader.h>
 
+#include <cli/InputBytes.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/UsageError.h>
@@ -22,8 +19,7 @@ namespace olvane::cli {
 
 namespace {
 
-const char* const kStandardInputName = "standard input";  // in messages
-constexpr std::size_t kPerKind = 10;                      // told on stderr
+constexpr std::size_t kPerKind = 10;     // told on stderr
 constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are told as a number, for memory's sake
 
 // The first of each kind, and how many were kept back. Notes are for those who ask.
@@ -42,30 +38,16 @@ void report(const gedcom::GedcomData& data) {
         }
     }
     if (keptBack == 0) return;
-    const std::string command =
-        data.file() == kStandardInputName ? "olvane check" : "olvane check " + data.file();
+    const std::string command = data.file() == inputName(std::string(kStandardInput))
+                                    ? "olvane check"
+                                    : "olvane check " + data.file();
     tell(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) + " more; '" +
          command + "' lists them all");
 }
 
-std::string readStandardInput() {
-    constexpr std::size_t kBlock = 64 * 1024;
-    std::string bytes;
-    for (std::size_t got = 1; got != 0;) {
-        const std::size_t filled = bytes.size();
-        bytes.resize(filled + std::max(filled, kBlock));
-        got = std::fread(bytes.data() + filled, 1, bytes.size() - filled, stdin);
-        bytes.resize(filled + got);
-    }
-    if (std::ferror(stdin) != 0) {
-        throw gedcom::GedcomError(kStandardInputName, std::string("cannot be read: ") + std::strerror(errno));
-    }
-    return bytes;
-}
-
 gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions& options) {
     if (path != kStandardInput) return gedcom::readGedcomFile(path, options);
-    return gedcom::readGedcomBytes(readStandardInput(), kStandardInputName, options);
+    return gedcom::readGedcomBytes(readInputBytes(path), inputName(path), options);
 }
 
 gedcom::GedcomData read(const InputOptions& input, bool facts = false) {

@@ -9,7 +9,8 @@ Usage: validate_json.py SCHEMA DOCUMENT
 import json
 import sys
 
-TYPES = {"object": dict, "array": list, "string": str, "integer": int, "boolean": bool}
+TYPES = {"object": dict, "array": list, "string": str, "integer": int, "boolean": bool,
+         "number": (int, float)}
 
 
 def complaints(value, schema, root, place):

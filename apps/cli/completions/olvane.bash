@@ -10,7 +10,7 @@ _olvane() {
     else
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
-    local commands="people layout draw batch check page"
+    local commands="people layout draw batch check judge page"
     local view="--view --generations --boxes"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
@@ -26,7 +26,7 @@ _olvane() {
         --format) COMPREPLY=($(compgen -W "text tsv json" -- "$cur")); return ;;
         --encoding) COMPREPLY=($(compgen -W "$encodings" -- "$cur")); return ;;
         --focus | --title | --year) return ;;
-        -o | --output | --focus-from) COMPREPLY=($(compgen -f -- "$cur")); return ;;
+        -o | --output | --focus-from | --family) COMPREPLY=($(compgen -f -- "$cur")); return ;;
     esac
     if ((cword == 1)); then
         COMPREPLY=($(compgen -W "$commands --help --version" -- "$cur"))
@@ -42,6 +42,7 @@ _olvane() {
         draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --encoding --focus --all $view $family" -- "$cur")) ;;
+        judge) COMPREPLY=($(compgen -W "--help --encoding --family --format" -- "$cur")) ;;
         page) COMPREPLY=($(compgen -W "--help --encoding --focus --output --title --view $living" -- "$cur")) ;;
     esac
 }
