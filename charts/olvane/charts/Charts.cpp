@@ -3,6 +3,11 @@
 
 #include <olvane/charts/Charts.h>
 
+#include <olvane/charts/GapTracksInternal.h>
+#include <olvane/charts/PlanBuilderInternal.h>
+#include <olvane/charts/PlanPictureInternal.h>
+#include <olvane/charts/PlanPlacementInternal.h>
+
 #include <cmath>
 #include <stdexcept>
 #include <string>
@@ -29,6 +34,19 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("there must be one box size for each person");
     }
+}
+
+// A second line to parents may be so many times as long as the way from one box to the next.
+constexpr double kReachOfShortLinks = 4;
+
+picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& request) {
+    const PlanSizes sizes(request);
+    Plan plan = PlanBuilder(graph, sizes, selectPersons(graph, request)).build(request.focus);
+    PlanPlacement(plan, sizes.gapX()).place();
+    GapTracks gaps(plan);
+    gaps.addShortLinks(kReachOfShortLinks * (request.sizes.boxWidth + request.sizes.gapX));
+    gaps.assignTracks();
+    return PlanPicture(graph, request, sizes, plan, gaps).make();
 }
 
 }  // namespace
@@ -62,6 +80,16 @@ const char* nameOf(View view) {
 picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request) {
     checkPerson(graph, request.focus);
     checkSizes(graph, request);
+    switch (request.view) {
+        case View::near:
+        case View::ancestors:
+        case View::descendants:
+        case View::hourglass:
+        case View::relatives:
+            return treeChart(graph, request);
+        default:
+            break;
+    }
     throw std::invalid_argument(std::string("no chart is made of the view ") + nameOf(request.view));
 }
 

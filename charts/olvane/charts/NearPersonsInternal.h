@@ -1,0 +1,15 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <vector>
+
+#include <olvane/charts/PlanInternal.h>
+
+namespace olvane::charts {
+
+// Whom the engine's family view shows of a family, each once. Boxes for unknown parents are no persons.
+std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus);
+
+}  // namespace olvane::charts
