@@ -2,10 +2,14 @@
 # SPDX-License-Identifier: MIT
 """Family trees: which relatives of a person are shown, and where each box and line stands.
 
-A host is any object with the eight methods of :class:`Host`. One call is one whole layout::
+A :class:`Family` is handed over once, as rows or columns or by two queries. One call is one whole layout::
 
-    for record in olvane.layout(host, 17):
+    family = olvane.Family(cursor.execute("SELECT id, father, mother, sex, birth FROM person"))
+    for record in olvane.layout(family, 17):
         draw_box(record.id, record.x, record.y)
+
+A host that keeps its data elsewhere is any object with the eight methods of :class:`Host`, in the family's place. It is
+asked many times, and so takes many times longer.
 
 Units are points; x grows right, y grows down, and (x, y) is the upper-left corner of a box. The size of a box is that
 of the options, 55 by 80 unless told otherwise.
@@ -14,16 +18,24 @@ Layouts may run on several threads at once, if their hosts may be asked so; a ho
 """
 
 from olvane._errors import HostError, LayoutError, Status
+from olvane._family import ChildKind, Family, FamilyError, FamilyRow, FamilyState, NameKind, Person
 from olvane._host import Host
 from olvane._layout import layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
 from olvane._records import Record, RecordKind, Segment
 
 __all__ = [
+    "ChildKind",
+    "Family",
+    "FamilyError",
+    "FamilyRow",
+    "FamilyState",
     "Host",
     "HostError",
     "LayoutError",
+    "NameKind",
     "Options",
+    "Person",
     "Record",
     "RecordKind",
     "Segment",

@@ -20,6 +20,7 @@ class Status(IntEnum):
     LAYOUT_FAILED = 4
     OUT_OF_MEMORY = 5
     NESTED_CALL = 6
+    REFUSED = 7
 
 
 class LayoutError(Exception):

@@ -18,6 +18,7 @@ from typing import Any, TypeVar
 
 from olvane import _native
 from olvane._errors import HostError, LayoutError, Status
+from olvane._family import Family
 from olvane._host import Host
 from olvane._options import Options, View
 from olvane._records import Record, RecordKind, Segment
@@ -27,18 +28,20 @@ _FAILED = 1
 _Result = TypeVar("_Result")
 
 
-def layout(host: Host, focus: int, view: View = View.FAMILY, options: Options | None = None) -> list[Record]:
+def layout(host: Host | Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> list[Record]:
     """Lay out the relatives of a person, one record for each box, in the order of the walk.
+
+    The host is asked; a Family is laid out without a question, and many times faster.
 
     Raises HostError if a method of the host raised, LayoutError if there is no picture for another reason, and whatever
     is no ordinary exception (KeyboardInterrupt) as it is, whether the host or a signal raised it.
     """
-    return _laid_out(_Request(host, focus, view, options), _Request.records)
+    return _laid_out(_request(host, focus, view, options), _Request.records)
 
 
-def layout_text(host: Host, focus: int, view: View = View.FAMILY, options: Options | None = None) -> str:
+def layout_text(host: Host | Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> str:
     """The same layout as one line of text."""
-    return _laid_out(_Request(host, focus, view, options), _Request.text)
+    return _laid_out(_request(host, focus, view, options), _Request.text)
 
 
 def version() -> str:
@@ -225,6 +228,44 @@ class _Request:
         if self._layout:
             _native.library.olvane_layout_records(self._layout, byref(records), byref(count))
         return [_record(records[i]) for i in range(count.value)]
+
+
+class _FamilyRequest(_Request):
+    """A layout of a family that the library holds."""
+
+    def __init__(self, family: Family, focus: int, view: View, options: Options | None) -> None:
+        self._family = family
+        self._focus = _family_focus(focus)
+        self._view = _view_number(view)
+        self._chosen = None if options is None else byref(_options_struct(options))
+        self._layout = c_void_p()
+        self._status = Status.OK
+
+    def run(self) -> None:
+        pointer = self._family._pointer
+        status = _native.library.olvane_view(pointer, self._view, self._focus, self._chosen, byref(self._layout))
+        self._status = Status(status)
+
+    def raise_failure(self) -> None:
+        if self._status != Status.OK:
+            raise LayoutError(self._status, _message(self._status), self.text(), self.records())
+
+
+def _request(host: Host | Family, focus: int, view: View, options: Options | None) -> _Request:
+    if isinstance(host, Family):
+        return _FamilyRequest(host, focus, view, options)
+    return _Request(host, focus, view, options)
+
+
+def _family_focus(focus: int) -> int:
+    whole = operator.index(focus)
+    return whole if 0 < whole < 2**31 else 0
+
+
+def _view_number(view: View) -> int:
+    if not isinstance(view, View):
+        raise TypeError(f"view is {view!r}, and takes a View")
+    return 0 if view is View.FAMILY else 1
 
 
 def _laid_out(request: _Request, read: Callable[[_Request], _Result]) -> _Result:
