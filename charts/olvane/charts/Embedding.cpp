@@ -106,7 +106,7 @@ void Embedding::pushRightOf(Index parents, Limits limits) {
 }
 
 // On which side of the child in the line each of its siblings stands: its own, if that is open down to the lowest
-// row that it needs, else the other one, else none.
+// row that it needs, else the other one, else none. Half siblings cannot change sides, for their line would cross.
 void Embedding::splitSiblings(Index parents, Limits limits) {
     const Household& household = plan_.households[at(parents)];
     leftSiblings_.clear();
@@ -117,9 +117,10 @@ void Embedding::splitSiblings(Index parents, Limits limits) {
         const bool fitsLeft = lowestRow_[at(child)] < limits.left;
         const bool fitsRight = lowestRow_[at(child)] < limits.right;
         const bool isEarlier = sibling.treeLink < household.treeLink;
-        if (fitsLeft && (isEarlier || !fitsRight)) {
+        const bool isHalf = sibling.treeFamily != household.treeFamily;
+        if (fitsLeft && (isEarlier || (!fitsRight && !isHalf))) {
             leftSiblings_.push_back(child);
-        } else if (fitsRight) {
+        } else if (fitsRight && !(isEarlier && isHalf)) {
             rightSiblings_.push_back(child);
         } else {
             sibling.treeParent = kNone;

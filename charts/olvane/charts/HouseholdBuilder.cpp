@@ -28,7 +28,7 @@ int linesThatFit(float length) {
 
 }  // namespace
 
-Index HouseholdBuilder::add(kin::Place lead, std::int32_t row, kin::Place keepOpen) {
+Index HouseholdBuilder::add(kin::Place lead, std::int32_t row, kin::Place beside) {
     const Index household = static_cast<Index>(plan_.households.size());
     firstBox_ = static_cast<Index>(plan_.persons.size());
     Household& added = plan_.households.emplace_back();
@@ -44,9 +44,7 @@ Index HouseholdBuilder::add(kin::Place lead, std::int32_t row, kin::Place keepOp
     if (leadSpouses_.empty()) {
         addAlone(lead);
     } else {
-        std::size_t onTheLeft = leadSpouses_.size() / 2;
-        if (leadSpouses_.size() == 1) onTheLeft = graph_.partners(leadSpouses_[0].u)[1] == lead ? 1 : 0;
-        if (keepOpen != kin::kNobody) uncover(keepOpen, leadSpouses_, onTheLeft);
+        const std::size_t onTheLeft = splitSpouses(lead, beside);
         spouses_.assign(leadSpouses_.begin(), leadSpouses_.begin() + static_cast<std::ptrdiff_t>(onTheLeft));
         followOutwards(spouses_, true, left_);
         spouses_.assign(leadSpouses_.begin() + static_cast<std::ptrdiff_t>(onTheLeft), leadSpouses_.end());
@@ -103,19 +101,19 @@ void HouseholdBuilder::followOutwards(std::vector<Joined>& spouses, bool leftwar
     }
 }
 
-// Only the outermost spouse on a side, and one who stands next to the lead with nobody behind her, have no line
-// over them.
-void HouseholdBuilder::uncover(kin::Place keepOpen, std::vector<Joined>& leadSpouses,
-                               std::size_t onTheLeft) const {
-    const auto found = std::find_if(leadSpouses.begin(), leadSpouses.end(),
-                                    [keepOpen](const Joined& one) { return one.person == keepOpen; });
-    if (found == leadSpouses.end()) return;
-    const auto middle = leadSpouses.begin() + static_cast<std::ptrdiff_t>(onTheLeft);
-    if (found < middle) {
-        std::rotate(leadSpouses.begin(), found, found + 1);
-    } else {
-        std::rotate(found, found + 1, leadSpouses.end());
+// How many of the spouses of the lead stand on its left; the list is in their order from left to right.
+std::size_t HouseholdBuilder::splitSpouses(kin::Place lead, kin::Place beside) {
+    const auto isHusbandOf = [this, lead](const Joined& one) { return graph_.partners(one.u)[1] == lead; };
+    if (leadSpouses_.size() == 1) return isHusbandOf(leadSpouses_[0]) ? 1 : 0;
+    const auto found = std::find_if(leadSpouses_.begin(), leadSpouses_.end(),
+                                    [beside](const Joined& one) { return one.person == beside; });
+    if (found == leadSpouses_.end()) return leadSpouses_.size() / 2;
+    if (isHusbandOf(*found)) {
+        std::rotate(leadSpouses_.begin(), found, found + 1);
+        return 1;
     }
+    std::rotate(found, found + 1, leadSpouses_.end());
+    return leadSpouses_.size() - 1;
 }
 
 void HouseholdBuilder::placeBoxes(kin::Place lead) {

@@ -28,9 +28,9 @@ public:
     HouseholdBuilder(const kin::KinGraph& graph, const PlanSizes& sizes, Plan& plan)
         : graph_(graph), sizes_(sizes), plan_(plan) {}
 
-    // The household of a shown person without a box. keepOpen, where it is somebody, is a spouse of the lead
-    // whom no line shall pass over, since lines come to her from above.
-    Index add(kin::Place lead, std::int32_t row, kin::Place keepOpen = kin::kNobody);
+    // The household of a shown person without a box. beside, where it is somebody, is the spouse with whom the
+    // lead has a child in the line: the two stand side by side, all other spouses of the lead on its other side.
+    Index add(kin::Place lead, std::int32_t row, kin::Place beside = kin::kNobody);
 
 private:
     // A partner as reached from another one: its place in the row is found from the inside outwards.
@@ -43,7 +43,7 @@ private:
     void addAlone(kin::Place person);
     void gatherSpouses(kin::Place person, std::vector<Joined>& spouses);
     void followOutwards(std::vector<Joined>& spouses, bool leftwards, std::vector<Joined>& side);
-    void uncover(kin::Place keepOpen, std::vector<Joined>& leadSpouses, std::size_t onTheLeft) const;
+    std::size_t splitSpouses(kin::Place lead, kin::Place beside);
     void placeBoxes(kin::Place lead);
     void joinCouples(const std::vector<Joined>& side);
     void chooseOverLines(const std::vector<Joined>& side);
