@@ -23,7 +23,7 @@ using LineNumber = std::uint32_t;
 
 enum class Sex : std::uint8_t { male = 0, female = 1, other = 2 };
 
-enum class Pedigree : std::uint8_t { notGiven, birth, adopted, foster, sealing, other };
+enum class Pedigree : std::uint8_t { notGiven, birth, adopted, foster, sealing, other, step };
 
 // One NAME of a person. Pieces come from the record's own pieces (GIVN, SURN with SPFX, NPFX, NSFX, NICK);
 // given name, surname and suffix come from the slashes of the value where the record has none.
@@ -49,14 +49,16 @@ struct Slice {
 
 // A person, with relatives as a tree wants them.
 //
-// Holds: father and mother come from the first FAMC of birth (or without a PEDI), else from the first FAMC,
-//        and are never outside 1 to personCount(), or 0. A person may be their own relative: data, not ours.
+// Holds: father and mother are the partners of parentFamily: of the first parent link of birth (or without a pedigree),
+//        else of the first one; they are never outside 1 to personCount(), or 0. A person may be their own relative:
+//        data, not ours.
 struct Person {
     std::string_view xref;  // without its @; empty if the record has none
     GedcomDate birth;       // of the first BIRT that has a date
     GedcomDate death;       // of the first DEAT that has a date
     PersonId father = 0;
     PersonId mother = 0;
+    FamilyId parentFamily = 0;  // which father and mother come from; 0 for none
     Slice nameSlice;
     Slice spouseSlice;
     Slice childSlice;
@@ -67,21 +69,29 @@ struct Person {
     bool dead = false;  // DEAT, BURI, CREM or PROB is there
 };
 
-// A person's FAMC or FAMS. family is 0 for a void pointer and for one that leads to no family.
+// A person's tie to a family, as child or as partner: a FAMC or FAMS of their own, or the family's CHIL, HUSB or WIFE
+// where their own record does not name the family. family is 0 for a void pointer and for one that leads to no family.
 struct FamilyLink {
     FamilyId family = 0;
     LineNumber line = 0;
-    Pedigree pedigree = Pedigree::notGiven;  // of a FAMC
+    Pedigree pedigree =
+        Pedigree::notGiven;  // of a child: of the PEDI, else of an ADOP or of the family's _FREL and _MREL
+    bool isFamilysAlone = false;  // the family names the person, not the other way round
 };
 
-// A family's CHIL. child is 0 for a void pointer and for one that leads to no person.
+// A family's child: a CHIL, or the child's FAMC where the family does not name the child. child is 0 for a void pointer
+// and for one that leads to no person.
 struct ChildLink {
     PersonId child = 0;
     LineNumber line = 0;
+    Pedigree pedigree = Pedigree::notGiven;  // of a CHIL: what its _FREL and _MREL say
+    bool isChildsAlone = false;              // the child names the family, not the other way round
 };
 
-// A family as its record gives it. The first two partners alone count; husband is the father, wife the
-// mother. Two HUSB, or two WIFE, stand in the order of the record: the first as husband, the second as wife.
+// A family. The first two partners alone count; husband is the father, wife the mother. Two HUSB, or two WIFE, stand in
+// the order of the record: the first as husband, the second as wife. A slot that the record leaves free is taken by the
+// first person whose FAMS names the family. A man alone is the husband and a woman alone the wife, whatever slot the
+// record gives them; so are a woman and a man who stand in each other's slot.
 struct Family {
     std::string_view xref;  // without its @
     GedcomDate marriage;    // of the first MARR that has a date
@@ -89,10 +99,11 @@ struct Family {
     PersonId wife = 0;
     Slice childLinkSlice;
     LineNumber line = 0;
-    LineNumber husbandLine = 0;
+    LineNumber husbandLine = 0;  // of the HUSB, or of the person's FAMS
     LineNumber wifeLine = 0;
-    bool married = false;   // MARR is there, and not as one that did not happen
-    bool divorced = false;  // DIV is there, and no second MARR after it
+    bool married = false;     // MARR is there, and not as one that did not happen
+    bool divorced = false;    // DIV is there, and no second MARR after it
+    bool notMarried = false;  // the record says that there was no marriage, and has none
 };
 
 // Something that a file tells of a person or a couple: an event or an attribute.
@@ -161,15 +172,15 @@ public:
     // The first name; one without text for a person without any.
     const PersonName& firstName(PersonId id) const;
 
-    // Partners over all FAMS in order, each once; the first is the preferred one. Never the person themself.
+    // Partners over all coupleLinks in order, each once; the first is the preferred one. Never the person themself.
     std::span<const PersonId> spouses(PersonId id) const;
-    // Children over all FAMS in order, each once.
+    // Children over all coupleLinks in order, each once.
     std::span<const PersonId> children(PersonId id) const;
-    // All FAMC in order.
+    // All FAMC in order; behind them the families that name the person as CHIL alone, in the order of the file.
     std::span<const FamilyLink> parentLinks(PersonId id) const;
-    // All FAMS in order.
+    // All FAMS in order; behind them the families that name the person as partner alone, in the order of the file.
     std::span<const FamilyLink> coupleLinks(PersonId id) const;
-    // All CHIL in order.
+    // All CHIL in order; behind them those who name the family by FAMC alone, in the order of the file.
     std::span<const ChildLink> childLinks(FamilyId id) const;
 
     // In the order of the record; empty unless the facts were asked for when the file was read.

@@ -40,6 +40,9 @@ constexpr const char* kKindNames[] = {
     "unreadable date",
     "archive member of another name",
     "more of a kind",
+    "link of one side alone",
+    "links that contradict each other",
+    "partner in the slot of the other sex",
 };
 
 std::string printable(std::string_view raw) {

@@ -16,26 +16,29 @@ enum class Severity : std::uint8_t {
 
 // What kind of trouble a diagnostic tells of. New kinds are added at the end.
 enum class DiagnosticKind : std::uint8_t {
-    missingHeader,     // the first record is not HEAD
-    missingTrailer,    // the file ends without TRLR: it may have been cut off
-    afterTrailer,      // records behind TRLR
-    notALine,          // a line without level and tag
-    emptyLine,         // lines with nothing in them
-    wrongLevel,        // a level that is no plain number
-    levelJump,         // a level more than one above its predecessor
-    brokenXref,        // an identifier or pointer without its closing @
-    duplicateXref,     // two records of one identifier
-    danglingPointer,   // a pointer to no record
-    wrongPointer,      // a pointer to a record of another sort, or a link without a pointer
-    tooManyPartners,   // a family with a third partner
-    samePartners,      // a family with one person as both partners
-    encodingMismatch,  // the bytes are not what the header says
-    encodingUnknown,   // an encoding that the header names and nobody knows
-    badCharacter,      // bytes that are no character in the file's encoding
-    controlCharacter,  // control characters in a text that is kept
-    unreadableDate,    // a date that is shown as written
-    archiveMember,     // an archive whose GEDCOM member has another name than the standard's
-    moreOfAKind,       // stands for diagnostics of one kind that are not listed singly
+    missingHeader,      // the first record is not HEAD
+    missingTrailer,     // the file ends without TRLR: it may have been cut off
+    afterTrailer,       // records behind TRLR
+    notALine,           // a line without level and tag
+    emptyLine,          // lines with nothing in them
+    wrongLevel,         // a level that is no plain number
+    levelJump,          // a level more than one above its predecessor
+    brokenXref,         // an identifier or pointer without its closing @
+    duplicateXref,      // two records of one identifier
+    danglingPointer,    // a pointer to no record
+    wrongPointer,       // a pointer to a record of another sort, or a link without a pointer
+    tooManyPartners,    // a family with a third partner
+    samePartners,       // a family with one person as both partners
+    encodingMismatch,   // the bytes are not what the header says
+    encodingUnknown,    // an encoding that the header names and nobody knows
+    badCharacter,       // bytes that are no character in the file's encoding
+    controlCharacter,   // control characters in a text that is kept
+    unreadableDate,     // a date that is shown as written
+    archiveMember,      // an archive whose GEDCOM member has another name than the standard's
+    moreOfAKind,        // stands for diagnostics of one kind that are not listed singly
+    oneSidedLink,       // a person and a family of which one alone names the other
+    contradictingLink,  // a link beside which the other side names somebody else
+    wrongSlot,          // a man as WIFE, or a woman as HUSB
 };
 
 // One thing that was wrong with a file, and what was done about it.

@@ -28,6 +28,8 @@ std::string_view pedigreeWord(Pedigree pedigree) {
             return "sealing";
         case Pedigree::other:
             return "other";
+        case Pedigree::step:
+            return "step";
         case Pedigree::notGiven:
             break;
     }
@@ -221,13 +223,8 @@ private:
 
     // The family that father and mother come from, as if there were no other.
     void writeParentsAlone(PersonId id) {
-        const Person& person = data_.person(id);
-        for (const FamilyLink& link : data_.parentLinks(id)) {
-            if (link.family == 0) continue;
-            const Family& family = data_.family(link.family);
-            if (family.husband != person.father || family.wife != person.mother) continue;
-            return pointer(1, "FAMC", familyXrefs_[link.family - 1]);
-        }
+        const FamilyId family = data_.person(id).parentFamily;
+        if (family != 0) pointer(1, "FAMC", familyXrefs_[family - 1]);
     }
 
     void writeFamily(FamilyId id) {
@@ -236,7 +233,9 @@ private:
         if (family.husband != 0) pointer(1, "HUSB", personXrefs_[family.husband - 1]);
         if (family.wife != 0) pointer(1, "WIFE", personXrefs_[family.wife - 1]);
         for (const ChildLink& link : data_.childLinks(id)) {
-            if (link.child != 0) pointer(1, "CHIL", personXrefs_[link.child - 1]);
+            if (link.child == 0) continue;
+            const bool untold = isHidden(link.child) && data_.person(link.child).parentFamily != id;
+            if (!untold) pointer(1, "CHIL", personXrefs_[link.child - 1]);
         }
         if (isBare(id)) return;
         for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);

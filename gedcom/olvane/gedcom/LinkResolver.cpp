@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// From pointers to relatives. A family names its partners and children, a person the families; parents come
-// by the person's own FAMC, spouses and children by their own FAMS. Where only one side names the other, the
-// picture differs from either end, as the data do.
+// From pointers to relatives. A family names its partners and children, a person the families. Where only one side
+// names the other, the missing side is added; then parents come by a person's parent links, spouses and children by
+// the couple links.
 
 #include <olvane/gedcom/LinkResolverInternal.h>
 
@@ -12,6 +12,8 @@
 #include <span>
 #include <string>
 #include <vector>
+
+#include <olvane/gedcom/LinkCompletionInternal.h>
 
 namespace olvane::gedcom {
 namespace {
@@ -30,13 +32,14 @@ public:
           takenBy_(tables.persons.size() + 1, 0),
           visitedBy_(tables.families.size() + 1, 0) {}
 
-    // Families before persons: relatives are found through them.
+    // Pointers before links of one side: only what leads somewhere has another side.
     void resolveAll() {
         for (Family& family : tables_.families) resolveFamily(family);
         for (ChildLink& link : tables_.childLinks) link.child = personAt(link.child, link.line);
-        listKnownChildren();
         for (FamilyLink& link : tables_.parentLinks) link.family = familyAt(link.family, link.line);
         for (FamilyLink& link : tables_.coupleLinks) link.family = familyAt(link.family, link.line);
+        completeLinks(tables_, diagnostics_);
+        listKnownChildren();
         for (PersonId id = 1; id <= tables_.persons.size(); ++id) findParents(tables_.persons[id - 1]);
         for (PersonId id = 1; id <= tables_.persons.size(); ++id) listSpouses(id);
         forgetTaken();
@@ -111,17 +114,15 @@ private:
             if (byBirth) break;
         }
         if (chosen == 0) return;
+        person.parentFamily = chosen;
         person.father = tables_.families[chosen - 1].husband;
         person.mother = tables_.families[chosen - 1].wife;
     }
 
-    // The partner beside the person. Someone whom the family does not name stands in for the one who is
-    // missing.
+    // The partner beside the person; 0 beside somebody whom the family does not name, for it names two others then.
     static PersonId otherPartner(const Family& family, PersonId person) {
         if (family.husband == person) return family.wife == person ? 0 : family.wife;
-        if (family.wife == person) return family.husband;
-        if (family.husband == 0) return family.wife;
-        return family.wife == 0 ? family.husband : 0;
+        return family.wife == person ? family.husband : 0;
     }
 
     void listSpouses(PersonId id) {

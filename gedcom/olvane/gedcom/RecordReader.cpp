@@ -11,6 +11,7 @@
 #include <array>
 #include <cstddef>
 #include <iterator>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -30,6 +31,7 @@ constexpr std::uint64_t tagCode(std::string_view tag) {
     return code;
 }
 
+constexpr std::uint64_t kAdoption = tagCode("ADOP");
 constexpr std::uint64_t kBirth = tagCode("BIRT");
 constexpr std::uint64_t kBurial = tagCode("BURI");
 constexpr std::uint64_t kChild = tagCode("CHIL");
@@ -40,15 +42,18 @@ constexpr std::uint64_t kDivorce = tagCode("DIV");
 constexpr std::uint64_t kFamily = tagCode("FAM");
 constexpr std::uint64_t kFamilyAsChild = tagCode("FAMC");
 constexpr std::uint64_t kFamilyAsSpouse = tagCode("FAMS");
+constexpr std::uint64_t kFatherTie = tagCode("_FREL");
 constexpr std::uint64_t kGiven = tagCode("GIVN");
 constexpr std::uint64_t kHeader = tagCode("HEAD");
 constexpr std::uint64_t kHusband = tagCode("HUSB");
 constexpr std::uint64_t kIndividual = tagCode("INDI");
 constexpr std::uint64_t kMarriage = tagCode("MARR");
+constexpr std::uint64_t kMotherTie = tagCode("_MREL");
 constexpr std::uint64_t kName = tagCode("NAME");
 constexpr std::uint64_t kNamePrefix = tagCode("NPFX");
 constexpr std::uint64_t kNameSuffix = tagCode("NSFX");
 constexpr std::uint64_t kNickname = tagCode("NICK");
+constexpr std::uint64_t kNo = tagCode("NO");
 constexpr std::uint64_t kPedigree = tagCode("PEDI");
 constexpr std::uint64_t kPhrase = tagCode("PHRASE");
 constexpr std::uint64_t kPlace = tagCode("PLAC");
@@ -130,9 +135,18 @@ Pedigree pedigreeOf(std::string_view value) {
             return Pedigree::foster;
         case tagCode("SEALING"):
             return Pedigree::sealing;
+        case tagCode("STEP"):
+            return Pedigree::step;
         default:
             return Pedigree::other;
     }
+}
+
+// What a program says of a child's tie to father or mother alone: "Natural", "Adopted", "Step".
+Pedigree tieOf(std::string_view value) {
+    const std::uint64_t word = tagCode(value.substr(0, 7));
+    if (word == tagCode("NATURAL") || word == tagCode("BIOLOGI")) return Pedigree::birth;
+    return word == tagCode("UNKNOWN") ? Pedigree::notGiven : pedigreeOf(value);
 }
 
 // Adds to a list that is read from a text of which this share is behind. A full list grows to what the whole
@@ -248,6 +262,7 @@ void RecordReader::endRecord() {
     endName();
     openDate_ = nullptr;
     factOpen_ = false;
+    if (record_ == Record::person) endPerson();
     if (record_ == Record::family) endFamily();
     record_ = Record::other;
 }
@@ -279,6 +294,18 @@ void RecordReader::beginPerson(const GedcomLine& line) {
     if (keepsFacts_) tables_.factsOfPersons.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->person == 0) entry->person = static_cast<PersonId>(tables_.persons.size());
+}
+
+// An adoption says of a link to the adoptive family what its PEDI did not.
+void RecordReader::endPerson() {
+    if (adoptiveFamilies_.empty()) return;
+    const Slice slice = person().parentLinkSlice;
+    for (FamilyLink& link : std::span(tables_.parentLinks).subspan(slice.first, slice.count)) {
+        const auto& adoptive = adoptiveFamilies_;
+        const bool isAdoptive = std::find(adoptive.begin(), adoptive.end(), link.family) != adoptive.end();
+        if (isAdoptive && link.pedigree == Pedigree::notGiven) link.pedigree = Pedigree::adopted;
+    }
+    adoptiveFamilies_.clear();
 }
 
 void RecordReader::beginFamily(const GedcomLine& line) {
@@ -316,11 +343,11 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
             person().dead = !passOverIfNot(line) || person().dead;
             return;
         case kFamilyAsChild:
-            tables_.parentLinks.push_back({readPointer(line), line.number, Pedigree::notGiven});
+            tables_.parentLinks.push_back({readPointer(line), line.number});
             ++person().parentLinkSlice.count;
             return;
         case kFamilyAsSpouse:
-            tables_.coupleLinks.push_back({readPointer(line), line.number, Pedigree::notGiven});
+            tables_.coupleLinks.push_back({readPointer(line), line.number});
             ++person().coupleLinkSlice.count;
             return;
         default:
@@ -342,6 +369,7 @@ void RecordReader::readPersonDetail(const GedcomLine& line, std::uint64_t tag) {
     if (fact_ == kFamilyAsChild && tag == kPedigree && !trimmed(line.value).empty()) {
         tables_.parentLinks.back().pedigree = pedigreeOf(trimmed(line.value));
     }
+    if (fact_ == kAdoption && tag == kFamilyAsChild) adoptiveFamilies_.push_back(readPointer(line));
 }
 
 void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
@@ -352,10 +380,17 @@ void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
             return addPartner(line, wives_);
         case kChild:
             tables_.childLinks.push_back({readPointer(line), line.number});
+            tiesOfChild_ = 0;
             ++family().childLinkSlice.count;
             return;
+        case kNo:
+            if (tagCode(trimmed(line.value)) == kMarriage) family().notMarried = true;
+            return;
         case kMarriage:
-            if (passOverIfNot(line)) return;
+            if (passOverIfNot(line)) {
+                family().notMarried = true;
+                return;
+            }
             family().married = true;
             marriedLast_ = true;
             ++marriages_;
@@ -371,7 +406,15 @@ void RecordReader::readFamilyFact(const GedcomLine& line, std::uint64_t tag) {
 }
 
 void RecordReader::readFamilyDetail(const GedcomLine& line, std::uint64_t tag) {
-    if (fact_ == kMarriage && tag == kDate) readDate(line, family().marriage);
+    if (fact_ == kMarriage && tag == kDate) return readDate(line, family().marriage);
+    if (fact_ == kChild && (tag == kFatherTie || tag == kMotherTie)) readChildTie(tieOf(trimmed(line.value)));
+}
+
+// A child by birth of either parent is the family's by birth.
+void RecordReader::readChildTie(Pedigree tie) {
+    if (tie == Pedigree::notGiven) return;
+    Pedigree& pedigree = tables_.childLinks.back().pedigree;
+    if (tiesOfChild_++ == 0 || tie == Pedigree::birth) pedigree = tie;
 }
 
 void RecordReader::beginName(const GedcomLine& line) {
@@ -498,6 +541,7 @@ void RecordReader::refusePartner(LineNumber line) {
 void RecordReader::endFamily() {
     settlePartners();
     if (marriages_ > 1 && marriedLast_) family().divorced = false;
+    if (family().married) family().notMarried = false;
 }
 
 // One HUSB and one WIFE if there are both; else two of one tag in their order.

@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/LineScannerInternal.h>
@@ -77,6 +78,7 @@ private:
     void readPersonDetail(const GedcomLine& line, std::uint64_t tag);
     void readFamilyFact(const GedcomLine& line, std::uint64_t tag);
     void readFamilyDetail(const GedcomLine& line, std::uint64_t tag);
+    void readChildTie(Pedigree tie);
 
     void beginName(const GedcomLine& line);
     void readNamePiece(const GedcomLine& line, std::uint64_t tag);
@@ -91,6 +93,7 @@ private:
     void readDate(const GedcomLine& line, GedcomDate& date);
     void readDatePhrase(const GedcomLine& line);
     void addPartner(const GedcomLine& line, PartnerDraft& draft);
+    void endPerson();
     void endFamily();
     void settlePartners();
     void refusePartner(LineNumber line);
@@ -119,6 +122,8 @@ private:
     NameDraft name_;
     bool nameOpen_ = false;
     bool sexRead_ = false;
+    std::vector<XrefPlace> adoptiveFamilies_;  // that ADOP events of the person in hand name
+    std::uint32_t tiesOfChild_ = 0;            // of the CHIL in hand: _FREL and _MREL so far
     PartnerDraft husbands_;
     PartnerDraft wives_;
     std::uint32_t marriages_ = 0;

@@ -9,7 +9,6 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <span>
 #include <utility>
 #include <vector>
 
@@ -44,6 +43,8 @@ ChildKind kindOf(Pedigree pedigree) {
             return ChildKind::foster;
         case Pedigree::sealing:
             return ChildKind::sealing;
+        case Pedigree::step:
+            return ChildKind::step;
         case Pedigree::other:
             break;
     }
@@ -53,10 +54,11 @@ ChildKind kindOf(Pedigree pedigree) {
 UnionState stateOf(const Family& family) {
     if (family.husband == 0 || family.wife == 0) return UnionState::unknown;
     if (family.divorced) return UnionState::divorced;
-    return family.married ? UnionState::married : UnionState::unknown;
+    if (family.married) return UnionState::married;
+    return family.notMarried ? UnionState::unmarried : UnionState::unknown;
 }
 
-// A person's own word on being a child of a family.
+// A person's link to a family of parents.
 struct ChildClaim {
     PersonId child = 0;
     ChildKind kind = ChildKind::birth;
@@ -111,7 +113,7 @@ private:
         });
     }
 
-    // The first of several claims of one child on one family gives the kind.
+    // Every child of a family has a link to it. The first of several to one family gives the kind.
     void addChildren() {
         std::vector<FamilyId> claimed(data_.personCount() + 1, 0);
         std::vector<ChildKind> kinds(data_.personCount() + 1, ChildKind::birth);
@@ -123,13 +125,7 @@ private:
                 }
             }
             for (const ChildLink& link : data_.childLinks(id)) {
-                if (link.child == 0) continue;
-                const bool byBoth = claimed[link.child] == id;
-                builder_.addChild(unionOf_[id], placeOf(link.child),
-                                  byBoth ? kinds[link.child] : ChildKind::birth);
-            }
-            for (std::size_t i = claimStart_[id]; i < claimStart_[id + 1]; ++i) {
-                builder_.addChild(unionOf_[id], placeOf(claims_[i].child), claims_[i].kind);
+                if (link.child != 0) builder_.addChild(unionOf_[id], placeOf(link.child), kinds[link.child]);
             }
         }
     }
@@ -145,7 +141,7 @@ private:
 
     void orderAsChild(PersonId id) {
         std::vector<UnionPlace> order;
-        addUnion(order, parentFamily(data_.person(id), data_.parentLinks(id)));
+        addUnion(order, data_.person(id).parentFamily);
         for (const FamilyLink& link : data_.parentLinks(id)) addUnion(order, link.family);
         if (!std::is_sorted(order.begin(), order.end())) {
             builder_.orderUnionsAsChild(placeOf(id), std::move(order));
@@ -154,17 +150,6 @@ private:
 
     void addUnion(std::vector<UnionPlace>& order, FamilyId family) const {
         if (unionOf_[family] != kNoUnion) order.push_back(unionOf_[family]);
-    }
-
-    // The family that father and mother come from; 0 for none.
-    FamilyId parentFamily(const Person& person, std::span<const FamilyLink> links) const {
-        const auto isTheirs = [this, &person](const FamilyLink& link) {
-            if (link.family == 0) return false;
-            const Family& family = data_.family(link.family);
-            return family.husband == person.father && family.wife == person.mother;
-        };
-        const auto found = std::find_if(links.begin(), links.end(), isTheirs);
-        return found == links.end() ? 0 : found->family;
     }
 
     const GedcomData& data_;

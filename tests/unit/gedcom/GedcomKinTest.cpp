@@ -89,6 +89,24 @@ TEST(GedcomKin, childrenOfEitherSideAreChildren) {
     EXPECT_THAT(graph.unionsAsChild(2), ElementsAre(0));
 }
 
+TEST(GedcomKin, aCoupleThatDidNotMarryIsUnmarried) {
+    const KinGraph graph = kinGraphOf(
+        read(document7("0 @I1@ INDI\n0 @I2@ INDI\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 NO MARR\n"
+                       "0 @F2@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 MARR N\n"
+                       "0 @F3@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 NO MARR\n1 MARR\n")));
+    EXPECT_EQ(graph.state(0), UnionState::unmarried);
+    EXPECT_EQ(graph.state(1), UnionState::unmarried);
+    EXPECT_EQ(graph.state(2), UnionState::married);
+}
+
+TEST(GedcomKin, aLoneFatherIsPartnerZeroWhateverHisSlot) {
+    const KinGraph graph =
+        graphOf("0 @I1@ INDI\n1 SEX M\n0 @I2@ INDI\n0 @F1@ FAM\n1 WIFE @I1@\n1 CHIL @I2@\n");
+    EXPECT_THAT(graph.partners(0), ElementsAre(0, kNobody));
+    EXPECT_THAT(graph.unionsAsPartner(0), ElementsAre(0));
+    EXPECT_THAT(graph.unionsAsChild(1), ElementsAre(0));
+}
+
 TEST(GedcomKin, aPedigreeOfAnotherKindIsUnknown) {
     const KinGraph graph =
         graphOf("0 @I1@ INDI\n0 @I2@ INDI\n1 FAMC @F1@\n2 PEDI _LIKE\n0 @F1@ FAM\n1 HUSB @I1@\n");

@@ -125,7 +125,7 @@ TEST_F(RealFiles, brokenOnesTellTheirLines) {
     EXPECT_EQ(linesTold(file("malformed/level-jump-skip.ged"), DiagnosticKind::levelJump), "8");
     EXPECT_EQ(linesTold(file("malformed/missing-header.ged"), DiagnosticKind::missingHeader), "1");
     EXPECT_TRUE(file("malformed/deep-nesting-levels.ged").diagnostics().empty());
-    EXPECT_TRUE(file("malformed/circular-reference.ged").diagnostics().empty());
+    EXPECT_EQ(linesTold(file("malformed/circular-reference.ged"), DiagnosticKind::contradictingLink), "31");
 }
 
 TEST_F(RealFiles, filesOfOtherSortsAreRefused) {

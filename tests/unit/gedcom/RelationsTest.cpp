@@ -136,15 +136,141 @@ TEST(Relations, nobodyIsTheirOwnSpouse) {
     EXPECT_EQ(linesTold(data, DiagnosticKind::samePartners), "10");
 }
 
-TEST(Relations, oneSidedLinksAreReadFromTheirSide) {
+TEST(Relations, aFamilyThatAloneNamesItsMembersIsFollowed) {
     const GedcomData data =
-        read(document("0 @I1@ INDI\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n0 @I4@ INDI\n1 FAMC @F1@\n"
-                      "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I3@\n"));
-    EXPECT_EQ(idsOf(data.spouses(1)), "");
+        read(document("0 @I1@ INDI\n1 SEX M\n0 @I2@ INDI\n0 @I3@ INDI\n0 @I4@ INDI\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I4@\n1 CHIL @I3@\n1 CHIL @I4@\n"));
+    EXPECT_EQ(idsOf(data.spouses(1)), "2");
     EXPECT_EQ(idsOf(data.spouses(2)), "1");
+    EXPECT_EQ(idsOf(data.children(1)), "4 3");
+    EXPECT_EQ(data.person(3).father, 1U);
+    EXPECT_EQ(data.person(4).mother, 2U);
+    EXPECT_EQ(data.person(4).parentFamily, 1U);
+    ASSERT_EQ(data.parentLinks(4).size(), 1U);
+    EXPECT_TRUE(data.parentLinks(4)[0].isFamilysAlone);
+    EXPECT_EQ(data.parentLinks(4)[0].line, 14U);
+    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "12 13 14 15");
+    EXPECT_EQ(data.diagnostics()[0].severity, Severity::note);
+}
+
+TEST(Relations, personsWhoAloneNameTheirFamilyAreFollowed) {
+    const GedcomData data = read(
+        document("0 @I1@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n1 FAMC @F1@\n"
+                 "0 @I4@ INDI\n1 FAMC @F1@\n0 @F1@ FAM\n1 CHIL @I4@\n"));
+    EXPECT_EQ(data.family(1).wife, 1U);
+    EXPECT_EQ(data.family(1).husband, 2U);
+    EXPECT_EQ(idsOf(data.spouses(1)), "2");
+    EXPECT_EQ(idsOf(data.children(2)), "4 3");
+    EXPECT_EQ(data.person(3).mother, 1U);
+    ASSERT_EQ(data.childLinks(1).size(), 2U);
+    EXPECT_TRUE(data.childLinks(1)[1].isChildsAlone);
+    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "8 10 12");
+}
+
+TEST(Relations, ownLinksComeFirstThenTheFamiliesInTheirOrder) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMS @F3@\n0 @I2@ INDI\n1 FAMC @F3@\n2 PEDI adopted\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 CHIL @I2@\n0 @F2@ FAM\n1 HUSB @I1@\n1 CHIL @I2@\n"
+                      "0 @F3@ FAM\n1 HUSB @I1@\n1 CHIL @I2@\n"));
+    std::string families;
+    for (const FamilyLink& link : data.coupleLinks(1)) families += std::to_string(link.family);
+    for (const FamilyLink& link : data.parentLinks(2)) families += std::to_string(link.family);
+    EXPECT_EQ(families, "312312");
+    EXPECT_EQ(data.person(2).parentFamily, 1U);
+}
+
+TEST(Relations, familiesThatContradictEachOtherAreBothKept) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F2@\n0 @I3@ INDI\n1 FAMC @F2@\n"
+                      "0 @F1@ FAM\n1 HUSB @I1@\n1 CHIL @I3@\n0 @F2@ FAM\n1 HUSB @I2@\n"));
+    EXPECT_EQ(data.person(3).father, 2U);
+    EXPECT_EQ(idsOf(data.children(1)), "3");
     EXPECT_EQ(idsOf(data.children(2)), "3");
-    EXPECT_EQ(data.person(3).father, 0U);
-    EXPECT_EQ(data.person(4).father, 1U);
+    EXPECT_EQ(data.parentLinks(3).size(), 2U);
+    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "14");
+    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "11");
+}
+
+TEST(Relations, anAdoptedChildOfTwoFamiliesIsNoContradiction) {
+    const GedcomData data = read(document(
+        "0 @I1@ INDI\n1 FAMC @F2@\n2 PEDI adopted\n0 @F1@ FAM\n1 CHIL @I1@\n0 @F2@ FAM\n1 CHIL @I1@\n"));
+    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "");
+    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "10");
+}
+
+TEST(Relations, aPartnerWhomAFullFamilyDoesNotNameIsReported) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n1 FAMS @F1@\n"
+                      "0 @I4@ INDI\n1 FAMC @F1@\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I4@\n"));
+    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "11");
+    EXPECT_EQ(idsOf(data.spouses(3)), "");
+    EXPECT_EQ(idsOf(data.children(3)), "4");
+}
+
+TEST(Relations, aLoneParentStandsInTheSlotOfTheirSex) {
+    const auto parents = [](const char* sex, const char* slot) {
+        const GedcomData data =
+            read(document(std::string("0 @I1@ INDI\n1 SEX ")
+                              .append(sex)
+                              .append("\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMC @F1@\n0 @F1@ FAM\n1 ")
+                              .append(slot)
+                              .append(" @I1@\n1 CHIL @I2@\n")));
+        return std::to_string(data.person(2).father) + std::to_string(data.person(2).mother) + ":" +
+               linesTold(data, DiagnosticKind::wrongSlot);
+    };
+    EXPECT_EQ(parents("M", "WIFE"), "10:12");
+    EXPECT_EQ(parents("F", "HUSB"), "01:12");
+    EXPECT_EQ(parents("M", "HUSB"), "10:");
+    EXPECT_EQ(parents("F", "WIFE"), "01:");
+    EXPECT_EQ(parents("X", "WIFE"), "01:");
+    EXPECT_EQ(parents("U", "HUSB"), "10:");
+}
+
+TEST(Relations, aCoupleInEachOthersSlotsIsPutRight) {
+    const std::string persons = "0 @I1@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n";
+    const GedcomData data = read(document(persons + "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n"));
+    EXPECT_EQ(data.family(1).husband, 2U);
+    EXPECT_EQ(data.family(1).wife, 1U);
+    EXPECT_EQ(data.family(1).wifeLine, 13U);
+    EXPECT_EQ(linesTold(data, DiagnosticKind::wrongSlot), "13 14");
+}
+
+TEST(Relations, aFamilysWordOnItsChildCountsWhereTheChildHasNone) {
+    const auto pedigreeBy = [](const std::string& ties, const std::string& own) {
+        const GedcomData data = read(document("0 @I1@ INDI\n1 FAMC @F1@\n" + own +
+                                              "0 @I2@ INDI\n0 @F1@ FAM\n1 HUSB @I2@\n1 CHIL @I1@\n" + ties));
+        return data.parentLinks(1)[0].pedigree;
+    };
+    EXPECT_EQ(pedigreeBy("2 _FREL Adopted\n2 _MREL Adopted\n", ""), Pedigree::adopted);
+    EXPECT_EQ(pedigreeBy("2 _FREL Step\n2 _MREL Natural\n", ""), Pedigree::birth);
+    EXPECT_EQ(pedigreeBy("2 _FREL Natural\n2 _MREL step\n", ""), Pedigree::birth);
+    EXPECT_EQ(pedigreeBy("2 _FREL step\n", ""), Pedigree::step);
+    EXPECT_EQ(pedigreeBy("2 _FREL Unknown\n", ""), Pedigree::notGiven);
+    EXPECT_EQ(pedigreeBy("2 _FREL Adopted\n", "2 PEDI birth\n"), Pedigree::birth);
+    EXPECT_EQ(pedigreeBy("", "2 PEDI step\n"), Pedigree::step);
+}
+
+TEST(Relations, anAdoptionMakesItsFamilyTheAdoptiveOne) {
+    const GedcomData data = read(childOf("1 ADOP Y\n2 FAMC @F1@\n3 ADOP BOTH\n1 FAMC @F1@\n1 FAMC @F2@\n"));
+    EXPECT_EQ(data.parentLinks(5)[0].pedigree, Pedigree::adopted);
+    EXPECT_EQ(data.parentLinks(5)[1].pedigree, Pedigree::notGiven);
+    EXPECT_EQ(data.person(5).father, 3U);
+    EXPECT_EQ(read(childOf("1 ADOP\n2 FAMC @F1@\n1 FAMC @F1@\n2 PEDI birth\n")).person(5).father, 1U);
+}
+
+// Time is linear however many claims of one side meet in one person or family.
+TEST(Relations, manyLinksOfOneSideTakeLinearTime) {
+    std::string records = "0 @I0@ INDI\n";
+    for (int i = 1; i <= 20000; ++i) {
+        const std::string number = std::to_string(i);
+        records.append("0 @I").append(number).append("@ INDI\n1 FAMC @F0@\n1 FAMS @F0@\n");
+        records.append("0 @F").append(number).append("@ FAM\n1 HUSB @I0@\n1 CHIL @I0@\n");
+    }
+    records.append("0 @F0@ FAM\n1 CHIL @I0@\n");
+    const GedcomData data = read(document(records));
+    EXPECT_EQ(data.childLinks(data.familyByXref("F0")).size(), 20001U);
+    EXPECT_EQ(data.parentLinks(1).size(), 20001U);
+    EXPECT_EQ(data.coupleLinks(1).size(), 20000U);
 }
 
 TEST(Relations, aFamilyMayHaveOneParent) {
