@@ -38,6 +38,7 @@ std::string summaryOf(const gedcom::GedcomData& data) {
 std::size_t tellDiagnostics(const gedcom::GedcomData& data, std::string& text) {
     std::size_t problems = 0;
     for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
+        if (isFoundInData(diagnostic.kind)) continue;
         text += gedcom::formatDiagnostic(diagnostic) + "\n";
         if (diagnostic.severity != gedcom::Severity::note) ++problems;
     }

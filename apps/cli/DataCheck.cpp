@@ -93,9 +93,9 @@ private:
         std::size_t births = 0;
         for (const gedcom::FamilyLink& link : links) {
             if (link.family == 0) continue;
-            if (!hasChild(link.family, id)) {
-                tell(link.line, named(id) + " names " + namedFamily(link.family) +
-                                    " as parents, which does not list the child");
+            if (link.isFamilysAlone) {
+                tell(link.line, namedFamily(link.family) + " lists " + named(id) +
+                                    " as a child, who does not name the family");
             }
             const bool byBirth =
                 link.pedigree == gedcom::Pedigree::birth || link.pedigree == gedcom::Pedigree::notGiven;
@@ -105,21 +105,23 @@ private:
         }
     }
 
-    bool hasChild(FamilyId family, PersonId child) const {
-        const auto links = data_.childLinks(family);
-        return std::any_of(links.begin(), links.end(),
-                           [child](const gedcom::ChildLink& link) { return link.child == child; });
-    }
-
     void checkCoupleLinks(PersonId id) {
         for (const gedcom::FamilyLink& link : data_.coupleLinks(id)) {
             if (link.family == 0) continue;
-            const gedcom::Family& family = data_.family(link.family);
-            if (family.husband != id && family.wife != id) {
+            if (link.isFamilysAlone) {
+                tell(link.line, namedFamily(link.family) + " names " + named(id) +
+                                    " as partner, who does not name the family");
+            } else if (!namesPartner(data_.family(link.family), id, link.line)) {
                 tell(link.line, named(id) + " names " + namedFamily(link.family) +
                                     " as marriage, which does not name the partner");
             }
         }
+    }
+
+    // A partner whom the family does not name stands there by the line of their own link.
+    static bool namesPartner(const gedcom::Family& family, PersonId id, gedcom::LineNumber own) {
+        return (family.husband == id && family.husbandLine != own) ||
+               (family.wife == id && family.wifeLine != own);
     }
 
     void checkLife(PersonId id) {
@@ -156,18 +158,14 @@ private:
 
     void checkFamily(FamilyId id) {
         const gedcom::Family& family = data_.family(id);
-        checkPartner(id, family.husband, family.husbandLine);
-        if (family.wife != family.husband) checkPartner(id, family.wife, family.wifeLine);
+        checkPartner(id, family.husband);
+        if (family.wife != family.husband) checkPartner(id, family.wife);
         for (const gedcom::ChildLink& link : data_.childLinks(id)) checkChild(id, link);
     }
 
-    void checkPartner(FamilyId id, PersonId partner, gedcom::LineNumber line) {
+    void checkPartner(FamilyId id, PersonId partner) {
         if (partner == 0) return;
         const gedcom::Family& family = data_.family(id);
-        if (!namesFamily(data_.coupleLinks(partner), id)) {
-            tell(line,
-                 namedFamily(id) + " names " + named(partner) + " as partner, who does not name the family");
-        }
         if (family.marriage.isRead() &&
             yearsOf(family.marriage).last < yearsOf(data_.person(partner).birth).first) {
             tell(family.line, named(partner) + " married before being born");
@@ -179,14 +177,9 @@ private:
     }
 
     void checkChild(FamilyId id, const gedcom::ChildLink& link) {
-        if (link.child == 0 || namesFamily(data_.parentLinks(link.child), id)) return;
+        if (link.child == 0 || !link.isChildsAlone) return;
         tell(link.line,
-             namedFamily(id) + " lists " + named(link.child) + " as a child, who does not name the family");
-    }
-
-    static bool namesFamily(std::span<const gedcom::FamilyLink> links, FamilyId family) {
-        return std::any_of(links.begin(), links.end(),
-                           [family](const gedcom::FamilyLink& link) { return link.family == family; });
+             named(link.child) + " names " + namedFamily(id) + " as parents, which does not list the child");
     }
 
     void findOwnAncestors() {
@@ -199,6 +192,10 @@ private:
 };
 
 }  // namespace
+
+bool isFoundInData(gedcom::DiagnosticKind kind) {
+    return kind == gedcom::DiagnosticKind::oneSidedLink || kind == gedcom::DiagnosticKind::contradictingLink;
+}
 
 std::vector<DataFinding> checkData(const GedcomData& data) {
     return DataChecker(data).check();

@@ -20,4 +20,7 @@ struct DataFinding {
 // families as a child, people who are their own ancestors, dates that cannot be.
 std::vector<DataFinding> checkData(const gedcom::GedcomData& data);
 
+// Whether checkData finds, with names, what the reader has reported by a diagnostic of this kind.
+bool isFoundInData(gedcom::DiagnosticKind kind);
+
 }  // namespace olvane::cli
