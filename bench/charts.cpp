@@ -8,9 +8,12 @@
 // Of each person the least of three times is kept, typed picture included. The file is named by
 // OLVANE_BENCH_GEDCOM, or is history/royal92.ged below the folder that OLVANE_GEDCOM_DIR names.
 
+#include <olvane/boundary/FamilyViewLayout.h>
 #include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/host/LayoutText.h>
 #include <olvane/picture/Judge.h>
+#include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
 
 #include <algorithm>
@@ -20,6 +23,7 @@
 #include <exception>
 #include <iostream>
 #include <limits>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -109,6 +113,41 @@ void print(View view, Totals totals) {
     std::fflush(stdout);
 }
 
+// The area of the engine's family view of somebody, boxes for unknown parents included. Its coordinates are cut to
+// whole points, so it may be a point wider and higher than they say.
+double familyViewArea(const std::shared_ptr<olvane::gedcom::GedcomDataSource>& source,
+                      olvane::kin::Place person) {
+    constexpr int kWidth = 55;
+    constexpr int kHeight = 80;
+    int left = 0, top = 0, right = 0, bottom = 0;
+    for (const auto& record : olvane::readLayoutText(FamilyViewLayout(std::to_string(person + 1), source))) {
+        left = std::min(left, record.x);
+        top = std::min(top, record.y);
+        right = std::max(right, record.x + kWidth);
+        bottom = std::max(bottom, record.y + kHeight);
+    }
+    return static_cast<double>(right - left + 1) * static_cast<double>(bottom - top + 1);
+}
+
+void compareNearWithFamilyView(const olvane::kin::KinGraph& graph,
+                               const std::shared_ptr<olvane::gedcom::GedcomDataSource>& source) {
+    std::vector<double> shares;
+    for (olvane::kin::Place person = 0; person < graph.personCount(); ++person) {
+        double right = 0;
+        double bottom = 0;
+        for (const auto& box : olvane::charts::chartOf(graph, requestFor(View::near, person)).boxes) {
+            right = std::max(right, box.x + static_cast<double>(box.width));
+            bottom = std::max(bottom, box.y + static_cast<double>(box.height));
+        }
+        shares.push_back(right * bottom / familyViewArea(source, person));
+    }
+    const double middle = middleOf(shares);
+    const auto larger = std::count_if(shares.begin(), shares.end(), [](double share) { return share > 1; });
+    std::printf(
+        "\nArea of near beside the family view's: %.3f at the median, %.3f at most; larger %td times.\n",
+        middle, shares.back(), larger);
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -119,7 +158,8 @@ int main(int argc, char** argv) {
             std::cerr << "neither OLVANE_BENCH_GEDCOM nor OLVANE_GEDCOM_DIR is set\n";
             return 1;
         }
-        const auto graph = olvane::gedcom::kinGraphOf(olvane::gedcom::readGedcomFile(path));
+        const olvane::gedcom::GedcomData data = olvane::gedcom::readGedcomFile(path);
+        const auto graph = olvane::gedcom::kinGraphOf(data);
         std::printf(
             "| view | boxes | most | overlaps | hits | tracks | touches | unjoined | untold | unmarked | "
             "crossings | side by side | marks | area | median ms | slowest ms |\n"
@@ -132,6 +172,7 @@ int main(int argc, char** argv) {
             };
             if (argc == 1 || std::any_of(argv + 1, argv + argc, isNamed)) print(view, measure(graph, view));
         }
+        compareNearWithFamilyView(graph, std::make_shared<olvane::gedcom::GedcomDataSource>(data));
     } catch (const std::exception& error) {
         std::cerr << error.what() << "\n";
         return 1;

@@ -39,10 +39,13 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
 // A second line to parents may be so many times as long as the way from one box to the next.
 constexpr double kReachOfShortLinks = 4;
 
+// The view of the near is narrowed to this part of the width that its lines would like best.
+constexpr double kShareOfNear = 0.8;
+
 picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& request) {
     const PlanSizes sizes(request);
     Plan plan = PlanBuilder(graph, sizes, selectPersons(graph, request)).build(request.focus);
-    PlanPlacement(plan, sizes.gapX()).place();
+    PlanPlacement(plan, sizes.gapX(), request.view == View::near ? kShareOfNear : 1).place();
     GapTracks gaps(plan);
     gaps.addShortLinks(kReachOfShortLinks * (request.sizes.boxWidth + request.sizes.gapX));
     gaps.assignTracks();

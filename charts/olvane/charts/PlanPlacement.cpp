@@ -14,8 +14,13 @@ constexpr double kNothing = -std::numeric_limits<double>::infinity();
 
 }  // namespace
 
-PlanPlacement::PlanPlacement(Plan& plan, double gap)
-    : plan_(plan), gap_(gap), embedding_(plan), tidy_(plan, gap), relaxation_(plan, gap) {}
+PlanPlacement::PlanPlacement(Plan& plan, double gap, double share)
+    : plan_(plan),
+      gap_(gap),
+      isNarrowed_(share < 1),
+      embedding_(plan),
+      tidy_(plan, gap),
+      relaxation_(plan, gap, share) {}
 
 // Embedding a tree may cut off others, which are new roots behind it.
 void PlanPlacement::place() {
@@ -34,7 +39,7 @@ void PlanPlacement::place() {
 
 void PlanPlacement::placeTree(Index root) {
     gatherTree(root);
-    if (isMixed_) {
+    if (isMixed_ || isNarrowed_) {
         const std::vector<Index> order = embedding_.orderTree(root);
         relaxation_.place(order);
         below_.assign(order.begin(), order.end());
@@ -76,7 +81,7 @@ void PlanPlacement::setBeside() {
         for (std::size_t i = 1; i < above_.size(); ++i) visit(plan_.households[at(above_[i])]);
     };
     forEach([&](const Household& h) {
-        shift = std::max(shift, rowEnd_[at(h.row - firstRow_)] + 2 * gap_ - h.x);
+        shift = std::max(shift, rowEnd_[at(h.row - firstRow_)] + gap_ - h.x);
         least = std::min(least, h.x);
     });
     if (shift == kNothing) shift = -least;

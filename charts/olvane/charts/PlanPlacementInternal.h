@@ -13,11 +13,12 @@
 namespace olvane::charts {
 
 // Gives every household of a plan its x: each tree for itself, then all trees side by side, that of the focus
-// first. Trees that grow one way from their root are tidy trees; the others are relaxed row by row.
+// first. Trees that grow one way from their root are tidy trees; the others, and those to be narrowed, are relaxed
+// row by row.
 class PlanPlacement {
 public:
-    // gap is the least distance between households of a row.
-    PlanPlacement(Plan& plan, double gap);
+    // gap is the least distance between households of a row; share is that of RowRelaxation.
+    PlanPlacement(Plan& plan, double gap, double share);
 
     void place();
 
@@ -28,6 +29,7 @@ private:
 
     Plan& plan_;
     double gap_;
+    bool isNarrowed_;
     Embedding embedding_;
     TidyTree tidy_;
     RowRelaxation relaxation_;

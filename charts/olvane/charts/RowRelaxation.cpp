@@ -5,15 +5,18 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace olvane::charts {
 
 namespace {
 
 constexpr double kWeightOfUnlinked = 1e-3;
+constexpr double kSlightBend = 4;  // points
+constexpr double kEndless = std::numeric_limits<double>::infinity();
 
 std::size_t turnsFor(std::size_t households) {
-    if (households <= 1000) return 24;
+    if (households <= 1000) return 120;
     return households <= 20000 ? 10 : 4;
 }
 
@@ -49,6 +52,8 @@ void RowRelaxation::measureLinks() {
 void RowRelaxation::place(const std::vector<Index>& order) {
     sortIntoRows(order);
     measureLinks();
+    least_ = -kEndless;
+    most_ = kEndless;
     const std::size_t rows = rowStart_.size() - 1;
     const std::size_t turns = turnsFor(byRow_.size());
     for (const Index h : byRow_) plan_.households[at(h)].x = 0;
@@ -57,8 +62,11 @@ void RowRelaxation::place(const std::vector<Index>& order) {
         const bool coarse = turn * 3 < turns;
         for (std::size_t row = 0; row < rows; ++row) placeRow(row, coarse ? Pull::fromAbove : Pull::fromBoth);
         for (std::size_t row = rows; row-- > 0;) placeRow(row, coarse ? Pull::fromBelow : Pull::fromBoth);
+        if (share_ < 1 && turn * 2 >= turns && least_ == -kEndless) setBounds();
     }
     snap();
+    for (std::size_t row = 0; row < rows; ++row) straighten(row, false);
+    for (std::size_t row = rows; row-- > 0;) straighten(row, true);
 }
 
 void RowRelaxation::placeRow(std::size_t row, Pull pull) {
@@ -99,16 +107,42 @@ void RowRelaxation::placeRow(std::size_t row, Pull pull) {
             blocks_.pop_back();
         }
     }
+    const double total = offset;
     std::size_t i = rowStart_[row];
     offset = 0;
     for (const Block& block : blocks_) {
-        const double x = block.weighted / block.weight;
+        const double x = std::max(std::min(block.weighted / block.weight, most_ - (total - gap_)), least_);
         for (std::size_t k = 0; k < block.count; ++k, ++i) {
             Household& household = plan_.households[at(byRow_[i])];
             household.x = x + offset;
             offset += household.width + gap_;
         }
     }
+}
+
+// From here on, all rows stay inside a share of the width that they have taken, around the widest of them, which
+// keeps what it needs.
+void RowRelaxation::setBounds() {
+    double from = kEndless;
+    double to = -kEndless;
+    double widest = -1;
+    double middle = 0;
+    for (std::size_t row = 0; row + 1 < rowStart_.size(); ++row) {
+        double width = -gap_;
+        for (std::size_t i = rowStart_[row]; i < rowStart_[row + 1]; ++i) {
+            width += plan_.households[at(byRow_[i])].width + gap_;
+        }
+        const double left = plan_.households[at(byRow_[rowStart_[row]])].x;
+        const Household& last = plan_.households[at(byRow_[rowStart_[row + 1] - 1])];
+        from = std::min(from, left);
+        to = std::max(to, last.x + last.width);
+        if (width <= widest) continue;
+        widest = width;
+        middle = (left + last.x + last.width) / 2;
+    }
+    const double room = std::max(widest, (to - from) * share_);
+    least_ = std::floor(middle - room / 2);
+    most_ = least_ + room;
 }
 
 // To half points, and no nearer than the gap for all that was rounded.
@@ -121,6 +155,26 @@ void RowRelaxation::snap() {
             const Household& before = plan_.households[at(byRow_[i - 1])];
             household.x = std::max(household.x, before.x + before.width + gap_);
         }
+    }
+}
+
+// A line that is straight but for a few points is made straight, where the gaps allow.
+void RowRelaxation::straighten(std::size_t row, bool above) {
+    for (std::size_t i = rowStart_[row]; i < rowStart_[row + 1]; ++i) {
+        Household& household = plan_.households[at(byRow_[i])];
+        if (household.treeParent == kNone || household.isAbove != above) continue;
+        const double x = plan_.households[at(household.treeParent)].x + toParent_[at(byRow_[i])];
+        if (x == household.x || std::abs(x - household.x) > kSlightBend) continue;
+        if (x < least_ || x + household.width > most_) continue;
+        if (i > rowStart_[row]) {
+            const Household& before = plan_.households[at(byRow_[i - 1])];
+            if (x < before.x + before.width + gap_) continue;
+        }
+        if (i + 1 < rowStart_[row + 1] &&
+            x + household.width + gap_ > plan_.households[at(byRow_[i + 1])].x) {
+            continue;
+        }
+        household.x = x;
     }
 }
 

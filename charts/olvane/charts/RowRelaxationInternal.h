@@ -19,8 +19,10 @@ namespace olvane::charts {
 // Holds: the number of turns depends on the number of households alone. Time is linear.
 class RowRelaxation {
 public:
-    // gap is the least distance between households of a row.
-    RowRelaxation(Plan& plan, double gap) : plan_(plan), gap_(gap), toParent_(plan.households.size()) {}
+    // gap is the least distance between households of a row. With a share below 1 the tree is narrowed to that
+    // part of the width it would take, as far as its widest row allows.
+    RowRelaxation(Plan& plan, double gap, double share)
+        : plan_(plan), gap_(gap), share_(share), toParent_(plan.households.size()) {}
 
     // Sets the x of the households of one tree; order has those of each row from left to right.
     void place(const std::vector<Index>& order);
@@ -39,10 +41,15 @@ private:
     void sortIntoRows(const std::vector<Index>& order);
     void measureLinks();
     void placeRow(std::size_t row, Pull pull);
+    void setBounds();
     void snap();
+    void straighten(std::size_t row, bool above);
 
     Plan& plan_;
     double gap_;
+    double share_;
+    double least_ = 0;  // where all rows start and end at most
+    double most_ = 0;
     std::vector<Index> byRow_;  // households, row by row
     std::vector<std::size_t> rowStart_;
     std::vector<double> toParent_;  // by household: where it would stand, seen from its treeParent
