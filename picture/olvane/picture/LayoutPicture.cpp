@@ -1,0 +1,334 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/picture/LayoutPicture.h>
+
+#include <algorithm>
+#include <cstddef>
+#include <map>
+#include <span>
+#include <tuple>
+#include <unordered_map>
+#include <utility>
+#include <vector>
+
+namespace olvane::picture {
+
+namespace {
+
+constexpr kin::UnionPlace kNoUnion = -1;
+
+std::size_t at(std::int32_t place) {
+    return static_cast<std::size_t>(place);
+}
+
+struct FamilyChild {
+    Index box = kNone;
+    kin::ChildKind kind = kin::ChildKind::birth;
+};
+
+struct PictureFamily {
+    std::vector<Index> parents;
+    std::vector<FamilyChild> children;
+    kin::UnionPlace known = kNoUnion;
+};
+
+class LayoutPainter {
+public:
+    LayoutPainter(const TypedLayout& layout, const LayoutPictureOptions& options)
+        : layout_(layout), options_(options), known_(options.known) {}
+
+    Picture paint() {
+        picture_.view = layout_.view == TypedLayout::View::pedigree ? "pedigree" : "family";
+        addBoxes();
+        for (const TypedLayout::Family& family : layout_.families) addFamily(family);
+        mergeSiblings();
+        writeFamilies();
+        numberRepeats();
+        countHidden();
+        RouteOptions route;
+        route.direction = directionOf(layout_.view);
+        routeLines(picture_, route);
+        return std::move(picture_);
+    }
+
+private:
+    bool isUnknown(const TypedLayout::Box& box) const { return box.kind != TypedLayout::BoxKind::person; }
+
+    void addBoxes() {
+        boxOf_.assign(layout_.boxes.size(), kNone);
+        for (std::size_t i = 0; i < layout_.boxes.size(); ++i) {
+            const TypedLayout::Box& box = layout_.boxes[i];
+            const bool isLeftOut =
+                box.repeatOf != TypedLayout::kNone || (isUnknown(box) && !options_.unknownParents);
+            if (isLeftOut) continue;
+            boxOf_[i] = static_cast<Index>(picture_.boxes.size());
+            picture_.boxes.push_back(pictureBox(box));
+        }
+        for (std::size_t i = 0; i < layout_.boxes.size(); ++i) {
+            if (boxOf_[i] == kNone || layout_.boxes[i].childOf == TypedLayout::kNone) continue;
+            picture_.boxes[at(boxOf_[i])].childOf = boxOf(layout_.boxes[i].childOf);
+        }
+        if (!picture_.boxes.empty()) picture_.focus = 0;
+    }
+
+    Box pictureBox(const TypedLayout::Box& box) const {
+        Box result;
+        result.x = box.x;
+        result.y = box.y;
+        result.width = static_cast<float>(static_cast<int>(layout_.sizes.nodeWidth));
+        result.height = static_cast<float>(static_cast<int>(layout_.sizes.nodeHeight));
+        if (isUnknown(box)) {
+            result.kind = BoxKind::unknownParent;
+            result.sex = box.kind == TypedLayout::BoxKind::unknownFather ? kin::Sex::male : kin::Sex::female;
+            return result;
+        }
+        result.id = box.id;
+        result.hasFlag = true;
+        result.flag = box.hasHiddenRelatives;
+        const kin::Place person = placeOf(box.id);
+        result.sex = person != kin::kNobody ? known_->sex(person)
+                     : box.male             ? kin::Sex::male
+                                            : kin::Sex::female;
+        return result;
+    }
+
+    // The box of the picture, of a repeated box the one that it repeats.
+    Index boxOf(TypedLayout::Index box) const {
+        if (box < 0 || at(box) >= layout_.boxes.size()) return kNone;
+        const TypedLayout::Index first = layout_.boxes[at(box)].repeatOf;
+        if (first != TypedLayout::kNone && first >= 0 && first < box) return boxOf_[at(first)];
+        return boxOf_[at(box)];
+    }
+
+    kin::Place placeOf(std::int64_t id) const {
+        return known_ != nullptr ? known_->placeOf(id) : kin::kNobody;
+    }
+    kin::Place placeOfBox(Index box) const {
+        return picture_.boxes[at(box)].kind == BoxKind::person ? placeOf(picture_.boxes[at(box)].id)
+                                                               : kin::kNobody;
+    }
+
+    // --- families
+
+    // One family of the layout, split into the known ones.
+    void addFamily(const TypedLayout::Family& family) {
+        std::vector<Index> parents;
+        for (const TypedLayout::Index parent : layout_.parentsOf(family)) {
+            const Index box = boxOf(parent);
+            if (box != kNone && (parents.empty() || parents[0] != box)) parents.push_back(box);
+        }
+        if (parents.empty()) return;
+        std::map<kin::UnionPlace, std::size_t> parts;
+        const auto partOf = [&](kin::UnionPlace u) -> PictureFamily& {
+            const auto [part, isNew] = parts.emplace(u, families_.size());
+            if (isNew) families_.push_back({parents, {}, u});
+            return families_[part->second];
+        };
+        for (const TypedLayout::Index c : layout_.childrenOf(family)) {
+            const Index child = boxOf(c);
+            if (child == kNone) continue;
+            const kin::UnionPlace u = unionOfChild(parents, child);
+            std::vector<FamilyChild>& children = partOf(u).children;
+            const auto isChild = [child](const FamilyChild& other) { return other.box == child; };
+            if (std::none_of(children.begin(), children.end(), isChild))
+                children.push_back({child, kindOf(u, child)});
+        }
+        for (const kin::UnionPlace u : unionsOfCouple(parents)) partOf(u);
+        if (parts.empty() && parents.size() == 2) partOf(kNoUnion);
+    }
+
+    bool has(kin::UnionPlace u, kin::Place person) const {
+        const auto& partners = known_->partners(u);
+        return partners[0] == person || partners[1] == person;
+    }
+
+    // The child's first known family with all parents who are drawn: with the couple alone, or of a lone
+    // parent the one that the data source names first.
+    kin::UnionPlace unionOfChild(const std::vector<Index>& parents, Index child) const {
+        const kin::Place person = placeOfBox(child);
+        if (person == kin::kNobody) return kNoUnion;
+        for (const kin::UnionPlace u : known_->unionsAsChild(person)) {
+            const bool fits = std::all_of(parents.begin(), parents.end(), [&](Index parent) {
+                const kin::Place place = placeOfBox(parent);
+                if (picture_.boxes[at(parent)].kind == BoxKind::unknownParent) return hasFreeSlot(u);
+                return place != kin::kNobody && has(u, place);
+            });
+            if (fits) return u;
+        }
+        return kNoUnion;
+    }
+
+    bool hasFreeSlot(kin::UnionPlace u) const {
+        const auto& partners = known_->partners(u);
+        return partners[0] == kin::kNobody || partners[1] == kin::kNobody;
+    }
+
+    kin::ChildKind kindOf(kin::UnionPlace u, Index child) const {
+        if (u == kNoUnion) return kin::ChildKind::birth;
+        const auto children = known_->children(u);
+        const auto found = std::find(children.begin(), children.end(), placeOfBox(child));
+        return known_->childKinds(u)[static_cast<std::size_t>(found - children.begin())];
+    }
+
+    // All known families of two persons.
+    std::vector<kin::UnionPlace> unionsOfCouple(const std::vector<Index>& parents) const {
+        std::vector<kin::UnionPlace> unions;
+        if (parents.size() < 2) return unions;
+        const kin::Place one = placeOfBox(parents[0]);
+        const kin::Place other = placeOfBox(parents[1]);
+        if (one == kin::kNobody || other == kin::kNobody) return unions;
+        for (const kin::UnionPlace u : known_->unionsAsPartner(one)) {
+            if (known_->otherPartner(u, one) == other) unions.push_back(u);
+        }
+        return unions;
+    }
+
+    // Full siblings whose other parent is not known: those who hang from the known parent alone join the one
+    // who has the box of the unknown parent as well.
+    void mergeSiblings() {
+        std::map<std::pair<kin::UnionPlace, Index>, std::size_t> withUnknown;
+        for (std::size_t f = 0; f < families_.size(); ++f) {
+            const Index parent = knownParent(families_[f]);
+            if (families_[f].known != kNoUnion && families_[f].parents.size() == 2 && parent != kNone) {
+                withUnknown.emplace(std::pair(families_[f].known, parent), f);
+            }
+        }
+        for (PictureFamily& family : families_) {
+            if (family.known == kNoUnion || family.parents.size() != 1) continue;
+            const auto found = withUnknown.find({family.known, family.parents[0]});
+            if (found == withUnknown.end()) continue;
+            std::vector<FamilyChild>& children = families_[found->second].children;
+            children.insert(children.end(), family.children.begin(), family.children.end());
+            family.children.clear();
+        }
+    }
+
+    // The person of a couple whose other one is an unknown parent; kNone for other families.
+    Index knownParent(const PictureFamily& family) const {
+        if (family.parents.size() != 2) return kNone;
+        const bool first = picture_.boxes[at(family.parents[0])].kind == BoxKind::person;
+        const bool second = picture_.boxes[at(family.parents[1])].kind == BoxKind::person;
+        if (first == second) return kNone;
+        return family.parents[first ? 0 : 1];
+    }
+
+    void writeFamilies() {
+        for (const PictureFamily& family : families_) {
+            if (family.parents.size() + family.children.size() < 2) continue;
+            Family result;
+            result.firstMember = static_cast<std::uint32_t>(picture_.members.size());
+            result.parentCount = static_cast<std::uint8_t>(family.parents.size());
+            result.childCount = static_cast<std::uint32_t>(family.children.size());
+            if (family.known != kNoUnion) {
+                result.number = known_->family(family.known);
+                result.style = known_->state(family.known);
+            }
+            for (const Index parent : family.parents) {
+                picture_.members.push_back(parent);
+                picture_.childKinds.push_back(kin::ChildKind::birth);
+            }
+            for (const FamilyChild& child : family.children) {
+                picture_.members.push_back(child.box);
+                picture_.childKinds.push_back(child.kind);
+            }
+            picture_.families.push_back(result);
+        }
+    }
+
+    // --- persons with several boxes, and without
+
+    double distanceFromFocus(Index box) const {
+        const Box& focus = picture_.boxes[at(picture_.focus)];
+        const double dx = picture_.boxes[at(box)].x - focus.x;
+        const double dy = picture_.boxes[at(box)].y - focus.y;
+        return dx * dx + dy * dy;
+    }
+
+    void numberRepeats() {
+        std::vector<Index> order;
+        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
+            if (picture_.boxes[i].kind == BoxKind::person) order.push_back(static_cast<Index>(i));
+        }
+        const auto key = [this](Index i) {
+            return std::tuple(picture_.boxes[at(i)].id, distanceFromFocus(i), i);
+        };
+        std::sort(order.begin(), order.end(), [&](Index a, Index b) { return key(a) < key(b); });
+        std::vector<std::span<const Index>> repeated;
+        for (std::size_t i = 0, next = 0; i < order.size(); i = next) {
+            while (next < order.size() &&
+                   picture_.boxes[at(order[next])].id == picture_.boxes[at(order[i])].id)
+                ++next;
+            if (next - i > 1) repeated.push_back(std::span(order).subspan(i, next - i));
+        }
+        // Numbers run in the order of the first boxes.
+        std::sort(repeated.begin(), repeated.end(), [](const auto& a, const auto& b) {
+            return *std::min_element(a.begin(), a.end()) < *std::min_element(b.begin(), b.end());
+        });
+        std::int32_t number = 0;
+        for (const std::span<const Index> boxes : repeated) markRepeats(boxes, ++number);
+    }
+
+    void markRepeats(std::span<const Index> boxes, std::int32_t number) {
+        for (std::size_t i = 0; i < boxes.size(); ++i) {
+            picture_.boxes[at(boxes[i])].repeat = static_cast<std::int32_t>(i) + 1;
+            if (i > 0) picture_.marks.push_back({{boxes[0], boxes[i], kNone}, number, MarkKind::samePerson});
+        }
+    }
+
+    void countHidden() {
+        if (known_ == nullptr) return;
+        std::vector<bool> shown(at(known_->personCount()));
+        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
+            const kin::Place person = placeOfBox(static_cast<Index>(i));
+            if (person != kin::kNobody) shown[at(person)] = true;
+        }
+        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
+            const kin::Place person = placeOfBox(static_cast<Index>(i));
+            if (person != kin::kNobody) countHiddenOf(person, shown, picture_.boxes[i]);
+        }
+    }
+
+    // Everybody once, in however many families.
+    void countHiddenOf(kin::Place person, const std::vector<bool>& shown, Box& box) const {
+        std::vector<kin::Place> parents;
+        std::vector<kin::Place> partners;
+        std::vector<kin::Place> children;
+        for (const kin::UnionPlace u : known_->unionsAsChild(person)) {
+            const auto& two = known_->partners(u);
+            parents.insert(parents.end(), two.begin(), two.end());
+        }
+        for (const kin::UnionPlace u : known_->unionsAsPartner(person)) {
+            partners.push_back(known_->otherPartner(u, person));
+            const auto all = known_->children(u);
+            children.insert(children.end(), all.begin(), all.end());
+        }
+        const auto countOf = [&shown](std::vector<kin::Place>& persons) {
+            std::erase_if(persons, [&](kin::Place p) { return p == kin::kNobody || shown[at(p)]; });
+            std::sort(persons.begin(), persons.end());
+            return static_cast<std::int32_t>(std::unique(persons.begin(), persons.end()) - persons.begin());
+        };
+        box.hiddenParents = countOf(parents);
+        box.hiddenPartners = countOf(partners);
+        box.hiddenChildren = countOf(children);
+    }
+
+    const TypedLayout& layout_;
+    const LayoutPictureOptions& options_;
+    const kin::KinGraph* known_;
+    Picture picture_;
+    std::vector<Index> boxOf_;  // by box of the layout
+    std::vector<PictureFamily> families_;
+};
+
+}  // namespace
+
+Picture pictureOf(const TypedLayout& layout, const LayoutPictureOptions& options) {
+    return LayoutPainter(layout, options).paint();
+}
+
+Direction directionOf(TypedLayout::View view) {
+    return view == TypedLayout::View::pedigree ? Direction::left : Direction::down;
+}
+
+}  // namespace olvane::picture
