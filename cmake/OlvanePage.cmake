@@ -33,7 +33,7 @@ ExternalProject_Add(olvane_wasm_module
   BINARY_DIR ${CMAKE_BINARY_DIR}/wasm
   PREFIX ${CMAKE_BINARY_DIR}/wasm-stamps
   CONFIGURE_COMMAND ${for_emscripten} ${OLVANE_EMCMAKE} ${CMAKE_COMMAND} -S <SOURCE_DIR> -B <BINARY_DIR>
-                    -G ${CMAKE_GENERATOR} -DCMAKE_BUILD_TYPE=Release
+                    -G ${CMAKE_GENERATOR} -DCMAKE_BUILD_TYPE=MinSizeRel
   BUILD_COMMAND ${for_emscripten} ${CMAKE_COMMAND} --build <BINARY_DIR> --target ${inner_targets}
   INSTALL_COMMAND ""
   BUILD_ALWAYS ON
@@ -43,14 +43,15 @@ ExternalProject_Add(olvane_wasm_module
   LOG_OUTPUT_ON_FAILURE ON)
 
 set(OLVANE_PAGE_TEMPLATE ${CMAKE_BINARY_DIR}/apps/page/page.html)
+set(OLVANE_TREE_ELEMENT ${CMAKE_BINARY_DIR}/apps/page/olvane-tree.mjs)
 file(GLOB_RECURSE page_sources CONFIGURE_DEPENDS
   ${PROJECT_SOURCE_DIR}/apps/page/src/* ${PROJECT_SOURCE_DIR}/apps/page/*.mjs ${PROJECT_SOURCE_DIR}/apps/page/*.json
   ${PROJECT_SOURCE_DIR}/bindings/javascript/*.mjs)
 list(FILTER page_sources EXCLUDE REGEX "/node_modules/")
-add_custom_command(OUTPUT ${OLVANE_PAGE_TEMPLATE}
+add_custom_command(OUTPUT ${OLVANE_PAGE_TEMPLATE} ${OLVANE_TREE_ELEMENT}
   COMMAND ${CMAKE_COMMAND} -E env OLVANE_JAVASCRIPT=${PROJECT_SOURCE_DIR}/bindings/javascript
           ${PROJECT_SOURCE_DIR}/apps/page/build-page ${CMAKE_BINARY_DIR}/apps/page/work ${OLVANE_WASM}
-          ${OLVANE_PAGE_TEMPLATE}
+          ${OLVANE_PAGE_TEMPLATE} ${OLVANE_TREE_ELEMENT}
   DEPENDS olvane_wasm_module ${OLVANE_WASM} ${PROJECT_SOURCE_DIR}/apps/page/build-page ${page_sources}
   COMMENT "Building the viewer page"
   VERBATIM)

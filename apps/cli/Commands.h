@@ -25,13 +25,10 @@ struct PeopleOptions {
     std::vector<std::string> words;
 };
 
-// The result text of a view of the engine, a picture as JSON (format 2), or the older JSON of the engine's views.
-enum class LayoutFormat : std::uint8_t { text, json, json1 };
-
 struct LayoutOptions {
     InputOptions input;
     std::string focus;
-    LayoutFormat format = LayoutFormat::text;
+    bool json = false;
     HidingOptions hiding;
     LayoutRequest request;
 };

@@ -3,7 +3,9 @@
 
 // Builds the page: one HTML file that holds its code, its looks and the engine, and may load nothing else.
 //
-//     node build.mjs --wasm olvane.wasm --out page.html
+//     node build.mjs --wasm olvane.wasm --out page.html [--element olvane-tree.mjs]
+//
+// With --element, the viewer alone is built as well, as one module for other sites.
 
 import { createHash } from "node:crypto";
 import { readFile, writeFile } from "node:fs/promises";
@@ -14,23 +16,24 @@ import { build, transform } from "esbuild";
 
 const here = (path) => fileURLToPath(new URL(path, import.meta.url));
 
-const { values } = parseArgs({ options: { wasm: { type: "string" }, out: { type: "string" } } });
+const { values } = parseArgs({ options: { wasm: { type: "string" }, out: { type: "string" }, element: { type: "string" } } });
 if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
 
-async function bundledScript() {
+// One script with all that it imports. settings are esbuild's.
+async function bundled(entry, settings) {
     const { outputFiles } = await build({
-        entryPoints: [here("src/main.ts")],
+        entryPoints: [here(entry)],
         bundle: true,
         minify: true,
         write: false,
-        format: "iife",
         target: ["es2022"],
         charset: "utf8",
         legalComments: "none",
         // The viewer's style sheets are text in the script; those of the page around it stand in its head.
         plugins: [styleText],
-        // The engine lies in the page, not beside it.
-        define: { "import.meta.url": '"data:,"' },
+        ...settings,
+        // The engine lies in the script's own file, not beside it.
+        define: { "import.meta.url": '"data:,"', ...settings.define },
         alias: {
             olvane: process.env.OLVANE_JAVASCRIPT
                 ? `${process.env.OLVANE_JAVASCRIPT}/olvane.mjs`
@@ -40,8 +43,23 @@ async function bundledScript() {
             "d3-interpolate": here("src/scene/noInterpolation.ts"),
         },
     });
-    // What would end the element early may stand in a script only as an escape.
-    return outputFiles[0].text.trim().replaceAll("</script", "<\\/script");
+    return outputFiles[0].text.trim();
+}
+
+// What would end the element early may stand in a script only as an escape.
+async function bundledScript() {
+    return (await bundled("src/main.ts", { format: "iife" })).replaceAll("</script", "<\\/script");
+}
+
+async function writeElement(path, engine) {
+    const banner = "// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n";
+    const script = await bundled("src/element/package.ts", {
+        format: "esm",
+        define: { kPackedModule: JSON.stringify(engine) },
+    });
+    await writeFile(path, banner + script + "\n");
+    const packed = gzipSync(script, { level: 9 }).length;
+    console.log(`${path}: ${script.length} characters, ${packed} bytes packed`);
 }
 
 async function minifiedStyle(...paths) {
@@ -86,3 +104,4 @@ await writeFile(values.out, page);
 console.log(
     `${values.out}: ${page.length} characters (script ${script.length}, style ${style.length}, engine ${engine.length})`,
 );
+if (values.element) await writeElement(values.element, engine);

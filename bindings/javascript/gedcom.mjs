@@ -7,6 +7,8 @@
 import { GedcomError, LayoutError } from "./errors.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
+import { pictureFrom } from "./picture.mjs";
+import { pictureNumbers } from "./pictureOptions.mjs";
 
 const SEXES = ["male", "female", "other"];
 const MARKS = ["exact", "about", "before", "after", "between"];
@@ -68,13 +70,9 @@ function diagnosticFrom([line, severity, message, hint]) {
     return { line, severity, message, hint };
 }
 
-// Closes what nobody holds any more and nobody closed.
-const unclosed = new FinalizationRegistry(({ instance, file }) => instance.exports.gedcom_close(file));
-
 export class GedcomFile {
     #instance;
     #file;
-    #token = {};
 
     constructor(instance, file, name) {
         this.#instance = instance;
@@ -86,7 +84,6 @@ export class GedcomFile {
         this.persons = persons.map(personFrom);
         this.families = families.map(familyFrom);
         this.diagnostics = diagnostics.map(diagnosticFrom);
-        unclosed.register(this, { instance, file }, this.#token);
     }
 
     factsOfPerson(id) {
@@ -97,18 +94,43 @@ export class GedcomFile {
         return this.#told("gedcom_family_facts", id).map(factFrom);
     }
 
-    layout(focus, options = undefined) {
+    layout(focus, options = {}) {
         return this.#run(focus, options).records;
     }
 
-    layoutText(focus, options = undefined) {
+    layoutText(focus, options = {}) {
         return this.#run(focus, options).text;
     }
 
+    picture(focus, options = {}) {
+        const { exports } = this.#instance;
+        const file = this.#opened();
+        const numbers = pictureNumbers(options);
+        for (const person of [focusNumber(focus), numbers[3] || focus]) {
+            if (this.persons[person - 1] !== undefined) continue;
+            throw new LayoutError("invalidPerson", `${this.name}: there is no person ${person}`, "", []);
+        }
+        const head = exports.picture_options(numbers.length);
+        new Float64Array(exports.memory.buffer, head >>> 0, numbers.length).set(numbers);
+        const answer = exports.gedcom_picture(file, focus);
+        if (answer === 0) this.#refuse();
+        try {
+            const count = exports.picture_count(answer) >>> 0;
+            const pointer = exports.picture_numbers(answer) >>> 0;
+            return pictureFrom(options.view ?? "family", new Float64Array(exports.memory.buffer, pointer, count));
+        } finally {
+            exports.picture_free(answer);
+        }
+    }
+
+    #refuse() {
+        const message = this.#instance.text(this.#instance.exports.last_text());
+        const status = message === "too large" ? "tooLarge" : "layoutFailed";
+        throw new LayoutError(status, message, "", []);
+    }
+
     close() {
-        if (this.#file === 0) return;
-        unclosed.unregister(this.#token);
-        this.#instance.exports.gedcom_close(this.#file);
+        if (this.#file !== 0) this.#instance.exports.gedcom_close(this.#file);
         this.#file = 0;
     }
 
@@ -140,8 +162,6 @@ export class GedcomFile {
         return this.#file;
     }
 }
-
-if (Symbol.dispose) GedcomFile.prototype[Symbol.dispose] = GedcomFile.prototype.close;
 
 export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
     const { exports } = instance;

@@ -30,7 +30,8 @@ function statusOf(result, thrown) {
 /** ask(view number, focus) runs the layout and gives the module's answer; host may be null where none is asked. */
 export function runLayout(instance, host, focus, options, ask) {
     const person = focusNumber(focus);
-    const view = instance.useOptions(options, optionNumbers);
+    const { view, numbers } = optionNumbers(options);
+    instance.exports.set_options(...numbers);
     const { result, thrown } = instance.askingHost(host, () => readAnswer(instance, ask(view, person)));
     const number = statusOf(result, thrown);
     const status = STATUSES[number];

@@ -14,8 +14,8 @@ async function start(): Promise<void> {
     const { errors } = uiMessagesFor(navigator.language);
     try {
         defineOlvaneTree();
-        OlvaneTree.engine = startEngine();
-        const [engine, family] = await Promise.all([OlvaneTree.engine, embeddedFamily()]);
+        const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
+        OlvaneTree.engine = () => Promise.resolve(engine);
         const app = new App(root, engine);
         if (family) app.openEmbedded(family);
     } catch (error) {

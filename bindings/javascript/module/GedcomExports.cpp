@@ -12,30 +12,20 @@
 #include <string_view>
 
 #include <olvane/gedcom/GedcomReader.h>
-#include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "GedcomHost.h"
 #include "JsonText.h"
 #include "LayoutAnswer.h"
+#include "OpenFile.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
-namespace {
 
-struct OpenFile {
-    explicit OpenFile(gedcom::GedcomData read) : data(std::move(read)), source(data) {}
-
-    gedcom::GedcomData data;
-    gedcom::GedcomDataSource source;
-};
-
-// Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for so many.
-constexpr std::size_t kMostRelatives = 1000000;
-
-// What the last call had to say: a table, facts, or why a file was refused.
 std::string lastText;
+
+namespace {
 
 void tell(JsonText& json, const gedcom::GedcomDate& date) {
     if (!date.isGiven()) return json.number(0);

@@ -81,8 +81,12 @@ export async function visitDarwins(hash = "#person=I1", settings = {}) {
     return visitFamily(sample("darwin-wedgwood.ged"), { name: "darwin-wedgwood.ged", title: "Darwin and Wedgwood" }, settings, hash);
 }
 
-// Movements are switched off unless a test is about them, which makes the others quick and certain.
 export async function visitFile(path, settings = {}, hash = "") {
+    return Visit.begin(await newContext(settings), pathToFileURL(path).href + hash);
+}
+
+// Movements are switched off unless a test is about them, which makes the others quick and certain.
+export async function newContext(settings = {}) {
     launched ??= chromium.launch({
         executablePath: process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium",
         args: kArguments,
@@ -96,7 +100,7 @@ export async function visitFile(path, settings = {}, hash = "") {
         ...settings,
     });
     context.setDefaultTimeout(kPatience);
-    return Visit.begin(context, pathToFileURL(path).href + hash);
+    return context;
 }
 
 /** Keeps a picture of the window when the run was told to. */

@@ -1,9 +1,43 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The names of views and of the groups of relatives that can be switched off.
+// The names of views and directions, and of the groups of relatives that can be switched off.
 
-export type ViewName = "family" | "pedigree";
+import type { PictureView } from "olvane";
+
+export type ViewName = PictureView;
+
+export const kViewNames = [
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+] as const satisfies readonly ViewName[];
+
+export const kDirections = ["down", "up", "left", "right"] as const;
+export type ChartDirection = (typeof kDirections)[number];
+
+// Views whose relatives are switched by groups.
+export function hasGroups(view: ViewName): boolean {
+    return view === "family" || view === "near";
+}
+
+// Views of which generations above the focus can be counted, and below it.
+export function hasUp(view: ViewName): boolean {
+    return view === "ancestors" || view === "hourglass" || view === "relatives" || view === "fan";
+}
+export function hasDown(view: ViewName): boolean {
+    return view === "descendants" || view === "hourglass" || view === "relatives";
+}
+export function hasDirection(view: ViewName): boolean {
+    return !["family", "pedigree", "fan"].includes(view);
+}
 
 // In the order of the switches. A bit is the engine's own.
 export const kRelatives = {

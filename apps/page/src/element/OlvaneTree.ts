@@ -13,6 +13,7 @@ import { type Messages, messagesFor } from "../messages";
 import { nameOf, yearsOf } from "../messages/names";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import type { Placing } from "../scene/Camera";
+import { svgText, wholePicture } from "../output/pictureSvg";
 import { PictureDress } from "../scene/PictureDress";
 import { Scene } from "../scene/Scene";
 import { Corner } from "../ui/Corner";
@@ -55,8 +56,8 @@ export interface OlvaneTreeEvents {
 }
 
 export class OlvaneTree extends HTMLElement {
-    /** The engine that all viewers share; set it before any of them gets a file. */
-    static engine: Promise<Olvane> | null = null;
+    /** Where viewers get the engine that they share; set before any of them gets a file. */
+    static engine: (() => Promise<Olvane>) | null = null;
     static readonly observedAttributes = ["src", "focus", "view", "language", "panel", "kinship", "theme"];
 
     private readonly shadow: ShadowRoot;
@@ -104,7 +105,7 @@ export class OlvaneTree extends HTMLElement {
         this.size.observe(this.surface);
         if (!this.hasAttribute("data-theme")) this.applyTheme();
         const src = this.getAttribute("src");
-        if (src && !this.opened) void this.load(src);
+        if (src && !this.opened) this.loadAttribute(src);
     }
 
     disconnectedCallback(): void {
@@ -115,7 +116,7 @@ export class OlvaneTree extends HTMLElement {
 
     attributeChangedCallback(name: string, before: string | null, now: string | null): void {
         if (before === now) return;
-        if (name === "src" && this.isConnected && now) void this.load(now);
+        if (name === "src" && this.isConnected && now) this.loadAttribute(now);
         if (name === "language") this.setLanguage(now ?? navigator.language);
         if (name === "panel") this.parts.classList.toggle("panel-closed", now === "closed");
         if (name === "kinship") this.restyle();
@@ -148,10 +149,18 @@ export class OlvaneTree extends HTMLElement {
         await this.open(new Uint8Array(await response.arrayBuffer()), name);
     }
 
+    // Nobody waits for what an attribute asks for, so a failure is an event.
+    private loadAttribute(address: string): void {
+        this.load(address).catch((error: unknown) => {
+            const message = error instanceof Error ? error.message : String(error);
+            this.dispatchEvent(new ErrorEvent("error", { message, error }));
+        });
+    }
+
     /** Shows the bytes of a GEDCOM file. Rejects with GedcomError where they are none. */
     async open(bytes: Uint8Array, name = "family.ged"): Promise<void> {
         if (!OlvaneTree.engine) throw new Error("OlvaneTree.engine is not set");
-        const engine = await OlvaneTree.engine;
+        const engine = await OlvaneTree.engine();
         this.openFile(engine.readGedcom(bytes, name));
     }
 
@@ -194,17 +203,21 @@ export class OlvaneTree extends HTMLElement {
             return false;
         }
         const isNewFocus = this.shownState?.focus !== state.focus;
+        const isNewView = this.shownState !== null && this.shownState.view !== state.view;
         this.shownState = state;
         this.picture = picture;
         this.tooltip.hide();
         this.dress = this.newDress(opened, picture);
         this.dress.kinshipKnown = opened.persons.length <= kSoonSearched;
         this.scene.show(picture, this.dress, anchor);
-        this.overview.show(picture, this.dress);
+        this.overview.show(picture);
         this.nameTree();
         this.learnKinships();
         const person = opened.person(state.focus)!;
-        if (isNewFocus) this.live.textContent = this.ui.focusNow(this.nameOf(person), picture.boxes.length);
+        if (isNewFocus || isNewView) {
+            const boxes = this.ui.focusNow(this.nameOf(person), picture.boxes.length);
+            this.live.textContent = isNewView ? `${this.pictureTitle()}. ${boxes}` : boxes;
+        }
         this.shownPerson = state.focus;
         this.refreshPanel();
         performance.measure("olvane-picture", { start });
@@ -252,6 +265,12 @@ export class OlvaneTree extends HTMLElement {
         this.panel.draw(false);
     }
 
+    /** The whole picture as the text of an SVG file, in the colours of the viewer; null before any. */
+    saveSvg(): string | null {
+        const { shown } = this;
+        return shown && svgText(wholePicture(shown, this.dataset["theme"] ?? "light").svg);
+    }
+
     /** The picture and its looks; null before any. */
     get shown(): Shown | null {
         const { picture, dress } = this;
@@ -294,6 +313,7 @@ export class OlvaneTree extends HTMLElement {
                 this.focusOn(person);
                 this.takeKeys();
             },
+            relate: (person) => void this.show({ view: "kinship", to: person }, null, true),
             nextBox: (person) => this.nextBox(person),
             addressOf: (person) => addressOf({ ...this.shownState!, focus: person }, this.opened!.persons),
         });
@@ -330,7 +350,7 @@ export class OlvaneTree extends HTMLElement {
     private selectBox(box: Box): void {
         const child = this.opened?.person(box.child);
         if (box.person || !child) return;
-        this.emit("action", { child, parent: box.kind === "missingFather" ? "father" : "mother" });
+        this.emit("action", { child, parent: box.sex === "male" ? "father" : "mother" });
     }
 
     private showInPanel(person: number): void {
@@ -354,6 +374,7 @@ export class OlvaneTree extends HTMLElement {
 
     private pointAt(box: Box | null, element: SVGGElement | null): void {
         const { picture, dress } = this;
+        this.scene.pointAt(box);
         const person = box ? this.opened?.person(box.person) : undefined;
         this.scene.markDuplicates(person && picture!.boxesOf(person.id).length > 1 ? person.id : 0);
         if (!box || !person || !element || !dress || !picture) return this.tooltip.hide();

@@ -3,9 +3,10 @@
 
 // The texts of the page's own parts, in each language that it speaks.
 
-import type { RelativeName } from "../base/views";
+import type { ChartDirection, RelativeName, ViewName } from "../base/views";
 import { uiGerman } from "./ui.de";
 import { uiEnglish } from "./ui.en";
+import { uiSpanish } from "./ui.es";
 
 export interface UiMessages {
     readonly language: string;
@@ -26,7 +27,13 @@ export interface UiMessages {
         readonly count: (n: number) => string;
         readonly first: (n: number) => string;
     };
-    readonly views: { readonly label: string; readonly family: string; readonly pedigree: string };
+    readonly views: { readonly label: string } & Readonly<Record<ViewName, string>>;
+    readonly depth: { readonly up: string; readonly down: string; readonly all: string };
+    readonly direction: string;
+    readonly directions: Readonly<Record<ChartDirection, string>>;
+    /** Of a numbered mark at a box. */
+    readonly marked: (numbers: string) => string;
+    readonly howRelated: string;
     readonly back: string;
     readonly forward: string;
     readonly zoom: string;
@@ -130,7 +137,7 @@ export interface UiMessages {
     readonly personCount: (n: number) => string;
 }
 
-export const uiLanguages: readonly UiMessages[] = [uiEnglish, uiGerman];
+export const uiLanguages: readonly UiMessages[] = [uiEnglish, uiGerman, uiSpanish];
 
 // For a tag such as "de-AT"; English where the language is not spoken.
 export function uiMessagesFor(tag: string): UiMessages {

@@ -5,7 +5,8 @@
 // the page understands.
 
 import { drawBox, handleOf } from "../scene/boxArt";
-import { type Dress, linePaths } from "../scene/Scene";
+import { drawFamily } from "../scene/familyLines";
+import type { Dress } from "../scene/Scene";
 import { kFontFamily } from "../scene/textFit";
 import { svg } from "../base/dom";
 import type { Picture } from "../view/Picture";
@@ -36,6 +37,7 @@ const kPageOnly = [
     "data-person-id",
     "data-xref",
     "data-box",
+    "data-family",
     "class",
 ];
 
@@ -75,11 +77,11 @@ export function wholePicture(
     drawing.append(
         svg("title", {}, title),
         svg("rect", { class: "paper", x: left - kMargin, y: top - kMargin, width, height }),
-        svg("g", { "stroke-width": 1.6 }, ...linePaths(picture.segments, dress)),
+        svg("g", { "stroke-width": 1.6 }, ...picture.families.map(drawFamily)),
     );
     for (const box of picture.boxes) {
         const look = dress.lookOf(box);
-        const element = drawBox(look, picture.sizes);
+        const element = drawBox(look, box);
         element.setAttribute("transform", `translate(${box.x} ${box.y})`);
         element.setAttribute("role", "img");
         element.setAttribute("aria-label", look.label);

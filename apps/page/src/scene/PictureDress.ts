@@ -4,14 +4,13 @@
 // What stands in each box and what is read out for it. Kinship is told only once it is known, since a search
 // through a large family must not hold up the picture.
 
-import type { Person, Segment, Sex } from "olvane";
+import type { Person } from "olvane";
 import { kinshipText, nearKinshipText } from "../kinship";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../messages/names";
 import type { BoxLook } from "./boxArt";
 import type { Dress } from "./Scene";
-import { type LineStyle, lineStylesOf } from "../view/lineStyles";
 import type { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
 
@@ -23,23 +22,12 @@ export interface Wording {
 
 export class PictureDress implements Dress {
     kinshipKnown = false;
-    private readonly lineStyles: ReadonlyMap<Segment, LineStyle>;
 
     constructor(
         private readonly family: OpenFamily,
         private readonly picture: Picture,
         private readonly wording: Wording,
-    ) {
-        this.lineStyles = lineStylesOf(picture, family);
-    }
-
-    styleOf(segment: Segment): LineStyle {
-        return this.lineStyles.get(segment) ?? "plain";
-    }
-
-    sexOf(box: Box): Sex {
-        return this.family.person(box.person)?.sex ?? "other";
-    }
+    ) {}
 
     // Empty where none is known, and for the focus.
     kinshipOf(id: number): string {
@@ -59,11 +47,13 @@ export class PictureDress implements Dress {
         return nearKinshipText(kinship, sex, this.wording.messages);
     }
 
-    // The pedigree's flags tell of ancestors alone, and its last column has none.
+    // How many relatives of a box are off the picture: -1 for none, 0 for an unknown number. The pedigree's flags
+    // speak of ancestors alone, and its last column has none; so only the family view goes by its flag.
     hiddenOf(box: Box): number {
-        if (this.picture.view === "family" && !box.hasHiddenRelatives) return -1;
-        const hidden = this.family.hiddenRelatives(box.person, this.picture);
-        return hidden > 0 || this.picture.view === "family" ? hidden : -1;
+        const { parents, partners, children } = box.hidden;
+        const hidden = parents + partners + children;
+        if (this.picture.view === "family") return box.flag ? hidden : -1;
+        return hidden > 0 ? hidden : -1;
     }
 
     lookOf(box: Box): BoxLook {
@@ -83,6 +73,7 @@ export class PictureDress implements Dress {
             isFocus ? ui.inFocus : kinship,
             boxes > 1 && ui.severalBoxes(boxes),
             hidden >= 0 && ui.hiddenCount(hidden),
+            box.marks.length > 0 && ui.marked(box.marks.join(", ")),
         ];
         return {
             person: person.id,
@@ -97,6 +88,7 @@ export class PictureDress implements Dress {
                     : ""
                 : null,
             hidden,
+            marks: box.marks,
             repeated: boxes > 1,
             isFocus,
             label: label.filter(Boolean).join(", "),
@@ -106,16 +98,17 @@ export class PictureDress implements Dress {
     private missingLook(box: Box): BoxLook {
         const { ui, messages } = this.wording;
         const child = this.family.person(box.child);
-        const what = box.kind === "missingFather" ? ui.missingFather : ui.missingMother;
+        const what = box.sex === "male" ? ui.missingFather : ui.missingMother;
         return {
             person: 0,
             xref: "",
-            sex: box.kind === "missingFather" ? "male" : "female",
+            sex: box.sex,
             nameParts: [what],
             rightToLeft: false,
             years: "",
             kinship: null,
             hidden: -1,
+            marks: [],
             repeated: false,
             isFocus: false,
             label: child ? ui.missingOf(what, nameOf(child, messages)) : what,

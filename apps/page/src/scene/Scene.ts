@@ -7,13 +7,12 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
-import type { Segment, Sex } from "olvane";
 import { prefersStillness, svg } from "../base/dom";
-import type { Box, Picture } from "../view/Picture";
-import { kLineStyles, type LineStyle } from "../view/lineStyles";
+import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
+import { drawFamily } from "./familyLines";
 
 const kMostReadable = 420; // boxes in sight
 const kGlideTime = 520; // ms
@@ -35,9 +34,6 @@ export interface SceneEvents {
 // How the boxes of a picture are to be drawn.
 export interface Dress {
     lookOf(box: Box): BoxLook;
-    // Of a person's box.
-    sexOf(box: Box): Sex;
-    styleOf(segment: Segment): LineStyle;
 }
 
 interface Glide {
@@ -56,6 +52,7 @@ export class Scene {
     private picture: Picture | null = null;
     private dress!: Dress; // given with the picture
     private activeBox: Box | null = null;
+    private pointedBox: Box | null = null;
     private drawn: Rectangle | null = null; // whose boxes and lines have elements
     private isFar = false; // in overview mode
     private glide: Glide | null = null;
@@ -83,6 +80,7 @@ export class Scene {
         this.picture = picture;
         this.dress = dress;
         this.activeBox = picture.focusBox;
+        this.pointedBox = null;
         this.elements.clear();
         this.boxLayer.replaceChildren();
         this.overviewLayer.replaceChildren();
@@ -96,7 +94,7 @@ export class Scene {
     // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
     redraw(): void {
         for (const [box, element] of this.elements)
-            repaintBox(element, this.dress.lookOf(box), this.picture!.sizes);
+            repaintBox(element, this.dress.lookOf(box), box);
     }
 
     restyle(dress: Dress): void {
@@ -136,6 +134,7 @@ export class Scene {
         this.handle(box)?.setAttribute("tabindex", "0");
         if (takeKeys) this.focusActive();
         this.bringIntoSight(box);
+        this.lightFamilies();
         this.events.active(box);
     }
 
@@ -154,6 +153,20 @@ export class Scene {
     markDuplicates(person: number): void {
         for (const [box, element] of this.elements)
             element.classList.toggle("duplicate-lit", person > 0 && box.person === person);
+    }
+
+    // Lights up the lines of a person's families: of the one under the pointer, or else of the selected one.
+    pointAt(box: Box | null): void {
+        if (this.pointedBox === box) return;
+        this.pointedBox = box;
+        this.lightFamilies();
+    }
+
+    private lightFamilies(): void {
+        const box = this.pointedBox ?? this.activeBox;
+        const lit = new Set(box && this.picture ? this.picture.familiesOf(box).map(({ index }) => String(index)) : []);
+        for (const group of this.lines.children)
+            group.classList.toggle("lit", lit.has(group.getAttribute("data-family") ?? ""));
     }
 
     private begin(picture: Picture): void {
@@ -177,8 +190,8 @@ export class Scene {
         const from = new Map<string, Point>();
         for (const box of before.boxes) from.set(box.key, { x: box.x + shift.x, y: box.y + shift.y });
         from.set(picture.focusBox.key, {
-            x: oldCentre.x + shift.x - picture.sizes.nodeWidth / 2,
-            y: oldCentre.y + shift.y - picture.sizes.nodeHeight / 2,
+            x: oldCentre.x + shift.x - picture.focusBox.width / 2,
+            y: oldCentre.y + shift.y - picture.focusBox.height / 2,
         });
         this.glide = { start: performance.now(), from };
         // Whoever was found far away is not travelled to: the way would show, and draw, all that lies between.
@@ -295,9 +308,10 @@ export class Scene {
     }
 
     private drawLines(picture: Picture): void {
-        const segments = this.isFar ? picture.segments : picture.segmentsWithin(this.drawn!);
-        this.lines.replaceChildren(...linePaths(segments, this.dress));
+        const families = this.isFar ? picture.families : picture.familiesWithin(this.drawn!);
+        this.lines.replaceChildren(...(this.isFar ? [farLines(families)] : families.map(drawFamily)));
         this.thickenLines();
+        this.lightFamilies();
     }
 
     // Lines stay to be seen when the picture is a long way off.
@@ -309,7 +323,7 @@ export class Scene {
     private drawOverview(picture: Picture): void {
         this.overviewLayer.classList.toggle("shown", this.isFar);
         if (!this.isFar || this.overviewLayer.firstChild) return;
-        this.overviewLayer.append(...overviewPaths(picture, this.dress));
+        this.overviewLayer.append(...overviewPaths(picture));
     }
 
     private drawBoxes(boxes: readonly Box[], picture: Picture): void {
@@ -322,7 +336,7 @@ export class Scene {
             this.elements.delete(box);
         }
         const added = document.createDocumentFragment();
-        for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box, picture));
+        for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box));
         this.boxLayer.append(added);
         const focus = this.elements.get(picture.focusBox);
         if (focus && this.boxLayer.lastChild !== focus && !focus.contains(this.keyHolder))
@@ -331,12 +345,12 @@ export class Scene {
 
     private keepAlways(picture: Picture): void {
         for (const box of [picture.focusBox, this.activeBox]) {
-            if (box && !this.elements.has(box)) this.boxLayer.append(this.newElement(box, picture));
+            if (box && !this.elements.has(box)) this.boxLayer.append(this.newElement(box));
         }
     }
 
-    private newElement(box: Box, picture: Picture): SVGGElement {
-        const element = drawBox(this.dress.lookOf(box), picture.sizes);
+    private newElement(box: Box): SVGGElement {
+        const element = drawBox(this.dress.lookOf(box), box);
         element.setAttribute("data-box", String(box.index));
         if (box === this.activeBox) handleOf(element).setAttribute("tabindex", "0");
         this.elements.set(box, element);
@@ -404,29 +418,23 @@ export class Scene {
 }
 
 // All boxes of a picture, with nothing in them: a path for each sex.
-export function overviewPaths(picture: Picture, dress: Dress): SVGPathElement[] {
-    const { nodeWidth, nodeHeight } = picture.sizes;
+export function overviewPaths(picture: Picture): SVGPathElement[] {
     const paths = new Map<string, string[]>();
-    for (const box of picture.boxes) {
-        const kind = box.person ? dress.sexOf(box) : "missing";
+    for (const { person, sex, x, y, width, height } of picture.boxes) {
+        const kind = person ? sex : "missing";
         const list = paths.get(kind) ?? [];
-        list.push(`M${box.x} ${box.y}h${nodeWidth}v${nodeHeight}h${-nodeWidth}z`);
+        list.push(`M${x} ${y}h${width}v${height}h${-width}z`);
         paths.set(kind, list);
     }
     return [...paths].map(([kind, list]) => svg("path", { class: kind, d: list.join("") }));
 }
 
-// One path for each style that is there.
-export function linePaths(segments: readonly Segment[], dress: Dress): SVGPathElement[] {
-    const paths = new Map<LineStyle, string>(kLineStyles.map((style) => [style, ""]));
-    for (const segment of segments) {
-        const { x1, y1, x2, y2 } = segment;
-        const style = dress.styleOf(segment);
-        paths.set(style, paths.get(style) + `M${x1} ${y1}L${x2} ${y2}`);
-    }
-    return [...paths]
-        .filter(([, d]) => d !== "")
-        .map(([style, d]) => svg("path", { class: "line " + style, d }));
+// From afar all lines are one path.
+function farLines(families: readonly FamilyLines[]): SVGPathElement {
+    const d = families
+        .flatMap(({ family }) => family.lines.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`))
+        .join("");
+    return svg("path", { class: "line", d });
 }
 
 function middleOf(area: Rectangle): Point {

@@ -5,10 +5,16 @@
 // left and lines beside it. Sex is told by corners and silhouette as well as by colour. Colours come from the
 // page's themes.
 
-import type { Sex, Sizes } from "olvane";
+import type { Sex } from "olvane";
 import { svg } from "../base/dom";
 import { kSilhouettes } from "../base/silhouettes";
 import { fitLine, fitName, textWidth } from "./textFit";
+
+// Of one box, in points.
+export interface Extent {
+    readonly width: number;
+    readonly height: number;
+}
 
 // Everything that a box shows and says.
 export interface BoxLook {
@@ -23,6 +29,8 @@ export interface BoxLook {
     readonly kinship: string | null;
     // Relatives without a box: -1 for none, 0 for an unknown number.
     readonly hidden: number;
+    // Numbers of the marks that lead to other boxes.
+    readonly marks: readonly number[];
     readonly repeated: boolean;
     readonly isFocus: boolean;
     readonly label: string;
@@ -39,7 +47,7 @@ const kFigureScale = 0.56;
 // Square corners for men, round ones for women, in between for everybody else.
 const kCorners: Record<Sex, number> = { male: 3, female: 16, other: 8 };
 
-export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
+export function drawBox(look: BoxLook, sizes: Extent): SVGGElement {
     const classes = [
         "box",
         look.person ? look.sex : "missing",
@@ -52,15 +60,16 @@ export function drawBox(look: BoxLook, sizes: Sizes): SVGGElement {
         "data-xref": look.xref || null,
     });
     appendFrame(box, look, sizes);
-    if (sizes.nodeWidth > 1.5 * sizes.nodeHeight) appendWideText(box, look, sizes);
+    if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
     if (look.hidden >= 0) appendBadge(box, look.hidden, sizes);
     if (look.repeated) appendDuplicateMark(box);
+    if (look.marks.length > 0) appendMarks(box, look.marks, sizes);
     return box;
 }
 
 // Draws a box anew without letting go of its element, on which the keys may stand.
-export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Sizes): void {
+export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Extent): void {
     const fresh = drawBox(look, sizes);
     const handle = handleOf(box);
     handle.setAttribute("aria-label", look.label);
@@ -74,7 +83,7 @@ export function handleOf(box: SVGGElement): SVGRectElement {
     return box.querySelector<SVGRectElement>(":scope > .frame")!;
 }
 
-function appendFrame(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+function appendFrame(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
     const rx = kCorners[look.sex];
     box.append(
         svg("rect", {
@@ -98,7 +107,7 @@ function appendFrame(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }:
     );
 }
 
-function appendTallText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
     const middle = nodeWidth / 2;
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
@@ -117,7 +126,7 @@ function appendTallText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight
     if (look.kinship) box.append(kinText(middle, lastLine, look.kinship, kKinSize, room));
 }
 
-function appendWideText(box: SVGGElement, look: BoxLook, { nodeWidth, nodeHeight }: Sizes): void {
+function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
     const left = 40;
     const right = nodeWidth - kInset;
     const room = right - left;
@@ -184,7 +193,7 @@ function text(
 }
 
 // On the upper edge, where neither names nor lines go.
-function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): void {
+function appendBadge(box: SVGGElement, hidden: number, { width: nodeWidth }: Extent): void {
     const label = hidden > 0 ? "+" + hidden : "+";
     const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
     const badge = svg("g", {
@@ -192,6 +201,15 @@ function appendBadge(box: SVGGElement, hidden: number, { nodeWidth }: Sizes): vo
         "aria-hidden": "true",
         transform: `translate(${nodeWidth - width + 8} -9)`,
     });
+    badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
+    box.append(badge);
+}
+
+// On the lower edge: the same number stands at every box that belongs together.
+function appendMarks(box: SVGGElement, marks: readonly number[], { height }: Extent): void {
+    const label = marks.slice(0, 3).join(" \u00b7 ") + (marks.length > 3 ? " \u2026" : "");
+    const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
+    const badge = svg("g", { class: "mark", "aria-hidden": "true", transform: `translate(-8 ${height - 9})` });
     badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
 }

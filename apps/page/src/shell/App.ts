@@ -6,7 +6,7 @@
 
 import type { Diagnostic, GedcomFile, Person } from "olvane";
 import { html, recall, remember } from "../base/dom";
-import type { RelativeName, ViewName } from "../base/views";
+import { type ChartDirection, kViewNames, type RelativeName, type ViewName } from "../base/views";
 import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
 import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
@@ -17,6 +17,7 @@ import type { OuterKey } from "../ui/pictureKeys";
 import { OpenFamily } from "../view/OpenFamily";
 import {
     addressOf,
+    clampDepth,
     clampGenerations,
     kUsualState,
     readAddress,
@@ -105,7 +106,7 @@ export class App implements ChromeActions {
         const usual: ViewState = {
             ...kUsualState,
             focus: family.person(embedded?.focus ?? 0)?.id ?? family.bestFocus(),
-            view: embedded?.view === "pedigree" ? "pedigree" : "family",
+            view: kViewNames.find((name) => name === embedded?.view) ?? "family",
         };
         const address = isLinked ? location.hash : "";
         const state = readAddress(address, family.persons, usual);
@@ -189,6 +190,14 @@ export class App implements ChromeActions {
 
     setView(view: ViewName): void {
         this.travel({ view });
+    }
+
+    setDepth(which: "up" | "down", generations: number): void {
+        this.travel({ [which]: clampDepth(generations, this.tree.state?.[which] ?? 0) });
+    }
+
+    setDirection(direction: ChartDirection): void {
+        this.travel({ direction });
     }
 
     setRelative(name: RelativeName, shown: boolean): void {

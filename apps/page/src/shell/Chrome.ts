@@ -6,17 +6,17 @@
 
 import type { Diagnostic } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
-import { kRelativeNames, type RelativeName, type ViewName } from "../base/views";
+import { hasGroups, kRelativeNames, type RelativeName } from "../base/views";
 import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
 import { iconButton } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import { icon } from "../base/icons";
 import { Popover } from "./Popover";
 import { SearchBox, type SearchSource } from "./SearchBox";
+import { type ViewActions, ViewChooser } from "./ViewChooser";
 import { kThemeChoices, type ThemeChoice } from "./theme";
 
-export interface ChromeActions extends SearchSource {
-    setView(view: ViewName): void;
+export interface ChromeActions extends SearchSource, ViewActions {
     setRelative(name: RelativeName, shown: boolean): void;
     setGenerations(generations: number): void;
     setKinshipInBoxes(shown: boolean): void;
@@ -52,6 +52,7 @@ export class Chrome {
     private readonly more: HTMLButtonElement;
     private readonly options: Popover;
     private readonly files: Popover;
+    private readonly views: ViewChooser;
     private shownGenerations = 0;
 
     constructor(
@@ -79,6 +80,7 @@ export class Chrome {
             this.openDiagnostics(),
         );
         this.diagnosticsButton.hidden = true;
+        this.views = new ViewChooser(ui, actions);
         this.options = new Popover(
             iconButton("options-button", "options", ui.options, () => {}),
             this.optionsPanel(looks),
@@ -97,12 +99,13 @@ export class Chrome {
     showState(state: ViewState, canGoBack: boolean, canGoForward: boolean): void {
         const { back, forward, family, pedigree } = this.buttons;
         enable([back, canGoBack], [forward, canGoForward]);
+        this.views.show(state);
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
         // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from. The
         // pedigree has none of them, and the family view has its generations by the switches.
-        const isFamily = state.view === "family";
+        const isFamily = hasGroups(state.view);
         const { hidden } = state;
         for (const name of this.switches.keys()) this.disable(name, !isFamily);
         this.disable("cousins", !isFamily || hidden.has("auntsUncles"));
@@ -111,8 +114,8 @@ export class Chrome {
         this.shownGenerations = state.generations;
         this.generations.textContent = String(state.generations);
         enable(
-            [this.fewer, !isFamily && state.generations > kLeastGenerations],
-            [this.more, !isFamily && state.generations < kMostGenerations],
+            [this.fewer, state.view === "pedigree" && state.generations > kLeastGenerations],
+            [this.more, state.view === "pedigree" && state.generations < kMostGenerations],
         );
     }
 
@@ -164,6 +167,7 @@ export class Chrome {
             this.title,
             this.search.element,
             group("segments", ui.views.label, buttons.family, buttons.pedigree),
+            this.views.popover.element,
             group("buttons travel", ui.back + ", " + ui.forward, buttons.back, buttons.forward),
             html(
                 "div",
@@ -253,7 +257,7 @@ export class Chrome {
         return html("div", { class: "dialog-head" }, html("h2", { id }, title), close);
     }
 
-    private viewButton(view: ViewName, label: string): HTMLButtonElement {
+    private viewButton(view: "family" | "pedigree", label: string): HTMLButtonElement {
         const button = html(
             "button",
             { id: "view-" + view, type: "button", "aria-pressed": "false", "aria-label": label },

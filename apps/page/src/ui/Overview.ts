@@ -5,7 +5,7 @@
 // Shown only while there is a rest. The keys have other ways, so it is for the mouse alone.
 
 import type { Camera } from "../scene/Camera";
-import { overviewPaths, type Dress } from "../scene/Scene";
+import { overviewPaths } from "../scene/Scene";
 import type { Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle } from "../base/SpatialGrid";
 import { html, setAttributes, svg } from "../base/dom";
@@ -38,10 +38,10 @@ export class Overview {
             this.drawing.addEventListener(end, () => (held = false));
     }
 
-    show(picture: Picture, dress: Dress): void {
+    show(picture: Picture): void {
         const { bounds } = picture;
         this.bounds = bounds;
-        this.area = grown(bounds, picture.sizes.nodeWidth / 2, picture.sizes.nodeHeight / 2);
+        this.area = grown(bounds, picture.focusBox.width / 2, picture.focusBox.height / 2);
         const { left, top, right, bottom } = this.area;
         this.scale = Math.min(kMostWidth / (right - left), kMostHeight / (bottom - top));
         const height = Math.max(kLeastHeight, (bottom - top) * this.scale);
@@ -58,7 +58,7 @@ export class Overview {
             cy: (focus.top + focus.bottom) / 2,
             r: mark,
         });
-        this.drawing.replaceChildren(...overviewPaths(picture, dress), dot, this.frame);
+        this.drawing.replaceChildren(...overviewPaths(picture), dot, this.frame);
         this.follow();
     }
 

@@ -5,7 +5,7 @@
 // relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
 // drawn up.
 
-import type { Fact, GedcomFamily as Family, Person } from "olvane";
+import type { Fact, Family, Person } from "olvane";
 import { factLabel, type Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { dateText, nameOf, yearsOf } from "../messages/names";
@@ -37,6 +37,8 @@ const kMostListed = 24; // relatives of a kind, until all are asked for
 export interface PanelEvents {
     select(person: number): void;
     choose(person: number): void;
+    // Draws the ways between the person and the focus.
+    relate(person: number): void;
     nextBox(person: number): void;
     addressOf(person: number): string;
 }
@@ -113,7 +115,10 @@ export class SidePanel {
             html("p", { class: "kinship" }, isFocus ? this.ui.inFocus : relation),
         );
         if (!isFocus)
-            header.append(this.button("make-focus", this.ui.makeFocus, () => this.events.choose(person.id)));
+            header.append(
+                this.button("make-focus", this.ui.makeFocus, () => this.events.choose(person.id)),
+                this.button("how-related", this.ui.howRelated, () => this.events.relate(person.id)),
+            );
         if (boxes > 1) {
             header.append(
                 html("p", { class: "places" }, this.ui.severalBoxes(boxes) + " "),

@@ -3,11 +3,11 @@
 
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
-import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
+import type { Family, GedcomFile, Person } from "olvane";
 import { allKinships, type Kinship } from "../kinship";
 import { PersonIndex } from "../search";
-import { Picture, sizesOf } from "./Picture";
-import { shownBits, type ViewState } from "./ViewState";
+import { Picture } from "./Picture";
+import { optionsOf, type ViewState } from "./ViewState";
 
 export class OpenFamily {
     readonly persons: readonly Person[];
@@ -32,23 +32,7 @@ export class OpenFamily {
 
     // Throws LayoutError.
     picture(state: ViewState): Picture {
-        const records = this.file.layout(state.focus, {
-            view: state.view,
-            sizes: sizesOf(state.view),
-            shown: shownBits(state),
-            generations: state.generations,
-            flagDepth: Math.max(1, state.generations - 1),
-        });
-        return new Picture(state.view, state.focus, records);
-    }
-
-    // Relatives of the first degree who have no box.
-    hiddenRelatives(id: number, picture: Picture): number {
-        const person = this.person(id);
-        if (!person) return 0;
-        const relatives = new Set([person.father, person.mother, ...person.spouses, ...person.children]);
-        relatives.delete(0);
-        return [...relatives].filter((relative) => !picture.shows(relative)).length;
+        return new Picture(state.view, state.direction, state.focus, this.file.picture(state.focus, optionsOf(state)));
     }
 
     // The focus stands first among all who could be one: whoever has the most relatives near.

@@ -1,100 +1,96 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// One layout, made ready for drawing: boxes and line pieces with a grid over each, and what a walk from box
-// to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
+// One picture, ready for the screen: the module's values with a grid over boxes and families, and what a walk from
+// box to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
 // upper-left corner.
 
-import type { LayoutRecord, Segment, Sizes } from "olvane";
+import type { PictureArc, PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
 import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
-import type { ViewName } from "../base/views";
+import type { ChartDirection, ViewName } from "../base/views";
 
 export interface Box {
     readonly index: number;
-    // Names the box across pictures: the same person again, or the same missing parent.
+    // Names the box across pictures: the same person again, or the same unknown parent.
     readonly key: string;
     // 0 where a parent is not known.
     readonly person: number;
     // The person whose parent is not known; else 0.
     readonly child: number;
-    readonly kind: LayoutRecord["kind"];
+    readonly sex: Sex;
     readonly x: number;
     readonly y: number;
-    readonly hasHiddenRelatives: boolean;
+    readonly width: number;
+    readonly height: number;
+    // The engine's own flag, in its two views.
+    readonly flag: boolean | null;
+    // How many relatives have no box.
+    readonly hidden: PictureBox["hidden"];
+    // Numbers of the marks that stand at the box.
+    readonly marks: readonly number[];
 }
 
-// Boxes wide enough for most names, and rows far enough apart for the lines between them to be told from
-// another.
-export const kFamilySizes: Sizes = {
-    nodeWidth: 118,
-    nodeHeight: 104,
-    horzPadding: 22,
-    vertPadding: 42,
-    spouseLineStep: 9,
-    lineInset: 0,
-};
-
-export const kPedigreeSizes: Sizes = {
-    nodeWidth: 196,
-    nodeHeight: 58,
-    horzPadding: 36,
-    vertPadding: 14,
-    spouseLineStep: 9,
-    lineInset: 18,
-};
-
-export function sizesOf(view: ViewName): Sizes {
-    return view === "family" ? kFamilySizes : kPedigreeSizes;
+/** A family as the scene draws it: its lines, and the rectangle that they fill. */
+export interface FamilyLines {
+    readonly index: number;
+    readonly family: PictureFamily;
+    readonly area: Rectangle;
 }
 
 export class Picture {
     readonly boxes: readonly Box[];
-    // Each piece once, however many records tell it.
-    readonly segments: readonly Segment[];
-    readonly sizes: Sizes;
+    readonly arcs: readonly PictureArc[];
+    readonly families: readonly FamilyLines[];
+    readonly marks: readonly PictureMark[];
     readonly bounds: Rectangle;
     readonly focusBox: Box;
     private readonly boxGrid: SpatialGrid;
     private readonly lineGrid: SpatialGrid;
     private readonly byPerson = new Map<number, Box[]>();
     private readonly byKey = new Map<string, Box>();
+    private readonly familiesByBox = new Map<number, FamilyLines[]>();
 
-    // records is not empty, and the first one is the focus's.
+    // values has at least one box.
     constructor(
         readonly view: ViewName,
+        readonly direction: ChartDirection,
         readonly focus: number,
-        records: readonly LayoutRecord[],
+        values: PictureValues,
     ) {
-        this.sizes = sizesOf(view);
-        this.boxes = records.map((record, index) => this.boxOf(record, index));
-        this.segments = distinctSegments(records);
-        this.boxGrid = new SpatialGrid(this.boxes.map((box) => this.areaOf(box)));
-        this.lineGrid = new SpatialGrid(this.segments.map(areaOfSegment));
-        this.bounds = boundsOf([
-            ...this.boxes.map((box) => this.areaOf(box)),
-            ...this.segments.map(areaOfSegment),
-        ]);
-        this.focusBox = this.byPerson.get(focus)?.[0] ?? this.boxes[0]!;
+        const numbers = markNumbers(values.marks);
+        this.boxes = values.boxes.map((box) => this.boxOf(box, values.boxes, numbers));
+        this.arcs = values.arcs;
+        this.marks = values.marks;
+        this.families = values.families.map((family, index) => this.linesOf(family, index));
+        const drawn = this.families.filter(({ family }) => family.lines.length > 0);
+        this.boxGrid = new SpatialGrid(this.boxes.map(areaOf));
+        this.lineGrid = new SpatialGrid(this.families.map(({ area }) => area));
+        this.bounds = boundsOf([...this.boxes.map(areaOf), ...drawn.map(({ area }) => area)]);
+        this.focusBox = this.boxes[values.focus] ?? this.byPerson.get(focus)?.[0] ?? this.boxes[0]!;
+    }
+
+    get isRound(): boolean {
+        return this.arcs.length > 0;
     }
 
     areaOf(box: Box): Rectangle {
-        return {
-            left: box.x,
-            top: box.y,
-            right: box.x + this.sizes.nodeWidth,
-            bottom: box.y + this.sizes.nodeHeight,
-        };
+        return areaOf(box);
     }
 
     boxesWithin(window: Rectangle): Box[] {
         return this.boxGrid.within(window).map((index) => this.boxes[index]!);
     }
 
-    segmentsWithin(window: Rectangle): Segment[] {
-        return this.lineGrid.within(window).map((index) => this.segments[index]!);
+    familiesWithin(window: Rectangle): FamilyLines[] {
+        return this.lineGrid.within(window).map((index) => this.families[index]!);
     }
 
-    // All the boxes of one person, in the order of the layout.
+    // The families that a box is a member of.
+    familiesOf(box: Box): readonly FamilyLines[] {
+        return this.familiesByBox.get(box.index) ?? [];
+    }
+
+    // All the boxes of one person, in the order of the picture.
     boxesOf(person: number): readonly Box[] {
         return this.byPerson.get(person) ?? [];
     }
@@ -107,42 +103,53 @@ export class Picture {
         return this.byPerson.has(person);
     }
 
-    private boxOf(record: LayoutRecord, index: number): Box {
-        const person = record.kind === "person" ? record.id : 0;
-        const child = record.child ?? 0;
-        const base = person ? String(person) : record.kind + child;
+    private boxOf(from: PictureBox, all: readonly PictureBox[], marks: ReadonlyMap<number, number[]>): Box {
+        const { index, id: person, sex, x, y, width, height, flag, hidden } = from;
+        const child = from.childOf === null ? 0 : all[from.childOf]!.id;
+        const base = person ? String(person) : `${sex} parent of ${child}`;
         let key = base;
         for (let copy = 1; this.byKey.has(key); ++copy) key = base + "#" + copy;
-        const { kind, x, y, hasHiddenRelatives } = record;
-        const box: Box = { index, key, person, child, kind, x, y, hasHiddenRelatives };
+        const box = { index, key, person, child, sex, x, y, width, height, flag, hidden, marks: marks.get(index) ?? [] };
         this.byKey.set(key, box);
         const copies = this.byPerson.get(person);
         if (copies) copies.push(box);
         else if (person) this.byPerson.set(person, [box]);
         return box;
     }
+
+    private linesOf(family: PictureFamily, index: number): FamilyLines {
+        const area = boundsOf(
+            family.lines.map(({ x1, y1, x2, y2 }) => ({
+                left: Math.min(x1, x2),
+                top: Math.min(y1, y2),
+                right: Math.max(x1, x2),
+                bottom: Math.max(y1, y2),
+            })),
+        );
+        const lines = { index, family, area };
+        for (const box of new Set([...family.parents, ...family.children])) {
+            const known = this.familiesByBox.get(box);
+            if (known) known.push(lines);
+            else this.familiesByBox.set(box, [lines]);
+        }
+        return lines;
+    }
 }
 
-function distinctSegments(records: readonly LayoutRecord[]): Segment[] {
-    const distinct = new Map<string, Segment>();
-    for (const record of records) {
-        for (const segment of record.segments) {
-            const { x1, y1, x2, y2 } = segment;
-            if (x1 === x2 && y1 === y2) continue;
-            const forward = x1 < x2 || (x1 === x2 && y1 < y2);
-            distinct.set(forward ? `${x1},${y1},${x2},${y2}` : `${x2},${y2},${x1},${y1}`, segment);
+function markNumbers(marks: readonly PictureMark[]): ReadonlyMap<number, number[]> {
+    const numbers = new Map<number, number[]>();
+    for (const { boxes, number } of marks) {
+        for (const box of boxes) {
+            const known = numbers.get(box);
+            if (!known) numbers.set(box, [number]);
+            else if (!known.includes(number)) known.push(number);
         }
     }
-    return [...distinct.values()];
+    return numbers;
 }
 
-function areaOfSegment({ x1, y1, x2, y2 }: Segment): Rectangle {
-    return {
-        left: Math.min(x1, x2),
-        top: Math.min(y1, y2),
-        right: Math.max(x1, x2),
-        bottom: Math.max(y1, y2),
-    };
+function areaOf(box: Box): Rectangle {
+    return { left: box.x, top: box.y, right: box.x + box.width, bottom: box.y + box.height };
 }
 
 function boundsOf(areas: readonly Rectangle[]): Rectangle {

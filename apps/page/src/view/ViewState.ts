@@ -3,14 +3,31 @@
 
 // What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
 
-import type { Person } from "olvane";
-import { kRelativeNames, kRelatives, type RelativeName, type ViewName } from "../base/views";
+import type { Person, PictureOptions } from "olvane";
+import {
+    type ChartDirection,
+    hasDirection,
+    hasDown,
+    hasUp,
+    kDirections,
+    kRelativeNames,
+    kRelatives,
+    kViewNames,
+    type RelativeName,
+    type ViewName,
+} from "../base/views";
 
 export interface ViewState {
     readonly focus: number;
     readonly view: ViewName;
     // Columns of the pedigree, the focus's own included.
     readonly generations: number;
+    // Of the other charts: generations above and below the focus, 0 for all.
+    readonly up: number;
+    readonly down: number;
+    readonly direction: ChartDirection;
+    // The other person of the kinship view; 0 for nobody.
+    readonly to: number;
     // Names of kRelatives that are switched off.
     readonly hidden: ReadonlySet<RelativeName>;
 }
@@ -18,16 +35,37 @@ export interface ViewState {
 export const kLeastGenerations = 2;
 export const kMostGenerations = 10;
 export const kUsualGenerations = 5;
+export const kMostDepth = 30; // that can be counted; beyond it, all
+const kUsualUp = 4;
+const kUsualDown = 3;
 
 /** What is shown where nobody said otherwise; the focus is then chosen from the family. */
 export const kUsualState: ViewState = {
     focus: 0,
     view: "family",
     generations: kUsualGenerations,
+    up: kUsualUp,
+    down: kUsualDown,
+    direction: "down",
+    to: 0,
     hidden: new Set(),
 };
 
-export function shownBits(state: ViewState): number {
+// Boxes wide enough for most names, and rows far enough apart for the lines between them to be told from
+// another.
+const kTall = { width: 118, height: 104, gapX: 22, gapY: 42 };
+const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
+const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
+
+/** What to ask of the module for a state. */
+export function optionsOf(state: ViewState): PictureOptions {
+    const { view, generations, direction, up, down, to } = state;
+    const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
+    const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : kTall;
+    return { view, generations, direction, up, down, to, shown: shownBits(state), ...sizes };
+}
+
+function shownBits(state: ViewState): number {
     return kRelativeNames.reduce(
         (bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]),
         0,
@@ -35,13 +73,10 @@ export function shownBits(state: ViewState): number {
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
-    return (
-        a.focus === b.focus &&
-        a.view === b.view &&
-        a.generations === b.generations &&
-        a.hidden.size === b.hidden.size &&
-        [...a.hidden].every((name) => b.hidden.has(name))
+    const same = (["focus", "view", "generations", "up", "down", "direction", "to"] as const).every(
+        (name) => a[name] === b[name],
     );
+    return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
 }
 
 // "#person=I17&view=pedigree&generations=6&hide=cousins,siblings"; what has its usual value is left out.
@@ -50,25 +85,34 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     const person = persons[state.focus - 1];
     if (person?.xref) parts.set("person", person.xref);
     else parts.set("number", String(state.focus));
-    if (state.view !== "family") parts.set("view", state.view);
+    const { view } = state;
+    if (view !== "family") parts.set("view", view);
     if (state.generations !== kUsualGenerations) parts.set("generations", String(state.generations));
+    if (hasUp(view) && state.up !== kUsualUp) parts.set("up", String(state.up));
+    if (hasDown(view) && state.down !== kUsualDown) parts.set("down", String(state.down));
+    if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
+    if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
     if (state.hidden.size > 0) parts.set("hide", [...state.hidden].join(","));
     return "#" + parts.toString().replaceAll("%2C", ",");
 }
 
-// Whatever an address does not tell, or tells wrongly, is as in the state that it is read into.
+const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "hide"];
+
+// Whatever an address does not name, or names wrongly, is as in the state that it is read into.
 export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {
     const parts = new URLSearchParams(address.replace(/^#/, ""));
-    if (![...parts.keys()].some((key) => ["person", "number", "view", "generations", "hide"].includes(key)))
-        return usual;
-    const view = parts.get("view");
-    const hidden = (parts.get("hide") ?? "")
-        .split(",")
-        .filter((name): name is RelativeName => name in kRelatives);
+    if (![...parts.keys()].some((key) => kParts.includes(key))) return usual;
+    const hidden = (parts.get("hide") ?? "").split(",");
+    const to = personIn(parts.get("to") ?? "", persons);
+    const view = kViewNames.find((name) => name === parts.get("view")) ?? "family";
     return {
         focus: focusIn(parts, persons) || usual.focus,
-        view: view === "pedigree" ? "pedigree" : "family",
+        view: view === "kinship" && !to ? "family" : view,
         generations: clampGenerations(Number(parts.get("generations") ?? kUsualGenerations)),
+        up: clampDepth(Number(parts.get("up") ?? kUsualUp), kUsualUp),
+        down: clampDepth(Number(parts.get("down") ?? kUsualDown), kUsualDown),
+        direction: kDirections.find((name) => name === parts.get("direction")) ?? "down",
+        to,
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
     };
 }
@@ -76,7 +120,9 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
 // The person whom an address names and the file does not hold; empty where there is none.
 export function unknownPersonIn(address: string, persons: readonly Person[]): string {
     const parts = new URLSearchParams(address.replace(/^#/, ""));
-    return focusIn(parts, persons) ? "" : (parts.get("person") ?? parts.get("number") ?? "");
+    if (!focusIn(parts, persons)) return parts.get("person") ?? parts.get("number") ?? "";
+    const to = parts.get("to") ?? "";
+    return to && !personIn(to, persons) ? to : "";
 }
 
 export function clampGenerations(generations: number): number {
@@ -84,11 +130,23 @@ export function clampGenerations(generations: number): number {
     return Math.min(kMostGenerations, Math.max(kLeastGenerations, Math.round(generations)));
 }
 
+/** 0 to kMostDepth; 0 is all. */
+export function clampDepth(depth: number, usual: number): number {
+    if (!Number.isFinite(depth)) return usual;
+    return Math.min(kMostDepth, Math.max(0, Math.round(depth)));
+}
+
 function focusIn(parts: URLSearchParams, persons: readonly Person[]): number {
-    const xref = parts.get("person")?.replaceAll("@", "");
-    if (xref) return personOfXref(xref, persons)?.id ?? 0;
+    const xref = parts.get("person");
+    if (xref) return personOfXref(xref.replaceAll("@", ""), persons)?.id ?? 0;
     const id = Number(parts.get("number"));
     return Number.isInteger(id) && persons[id - 1] ? id : 0;
+}
+
+// By xref or by number.
+function personIn(text: string, persons: readonly Person[]): number {
+    if (!text) return 0;
+    return personOfXref(text.replaceAll("@", ""), persons)?.id ?? persons[Number(text) - 1]?.id ?? 0;
 }
 
 // People type an identifier as they like; the file's own letters come first.

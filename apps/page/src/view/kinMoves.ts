@@ -25,9 +25,23 @@ export function boxTowards(
     );
 }
 
-// Parents are above in the family view, and at the right in the pedigree, which lies on its side.
+// Where parents lie, seen from their children: above in most charts, at the right in a pedigree.
+function waysOf(picture: Picture): readonly [toParents: Direction, toChildren: Direction] {
+    if (picture.view === "pedigree") return ["right", "left"];
+    switch (picture.direction) {
+        case "up":
+            return ["down", "up"];
+        case "left":
+            return ["right", "left"];
+        case "right":
+            return ["left", "right"];
+        default:
+            return ["up", "down"];
+    }
+}
+
 function kinBoxes(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box[] {
-    const [toParents, toChildren] = picture.view === "family" ? ["up", "down"] : ["right", "left"];
+    const [toParents, toChildren] = waysOf(picture);
     if (from.child && direction === toChildren) return [...picture.boxesOf(from.child)];
     const person = family.person(from.person);
     if (!person) return [];
@@ -47,7 +61,7 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
 // Along a generation only the generation itself counts; from one to another also what lies not quite straight
 // ahead.
 function inLine(from: Box, direction: Direction, boxes: readonly Box[], picture: Picture): Box[] {
-    const alongGeneration = (direction === "left" || direction === "right") === (picture.view === "family");
+    const alongGeneration = !waysOf(picture).includes(direction);
     const slope = alongGeneration ? 0.2 : 1.8;
     return boxes.filter(
         (box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope,

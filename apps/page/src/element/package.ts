@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What a site imports: the element, known to the browser at once, with the engine inside. The engine is unpacked
+// when the first viewer asks for it.
+
+import { loadOlvane, type Olvane } from "olvane";
+import { bytesOfBase64, gunzip } from "../engine/archive";
+import { defineOlvaneTree, OlvaneTree } from "./OlvaneTree";
+
+/** Put in by the build: the module, packed and written as text. */
+declare const kPackedModule: string;
+
+let engine: Promise<Olvane> | null = null;
+
+/** The engine that all viewers of the page share. */
+export function sharedEngine(): Promise<Olvane> {
+    engine ??= gunzip(bytesOfBase64(kPackedModule)).then(loadOlvane);
+    return engine;
+}
+
+OlvaneTree.engine = sharedEngine;
+defineOlvaneTree();
+
+export { OlvaneTree };
+export type { OlvaneTreeEvents, Shown } from "./OlvaneTree";

@@ -1,0 +1,117 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Pictures of an open GEDCOM file: options come in as a run of numbers, a picture goes out as another.
+
+#include <algorithm>
+#include <cstddef>
+#include <exception>
+#include <memory>
+#include <stdexcept>
+#include <vector>
+
+#include <olvane/charts/Views.h>
+#include <olvane/source/LimitedDataSource.h>
+
+#include "OpenFile.h"
+#include "PictureAnswer.h"
+
+#define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
+
+namespace olvane::js {
+namespace {
+
+// As pictureOptions.mjs writes them, which has checked their ranges.
+std::vector<double> pictureOptions;
+
+class OptionReader {
+public:
+    template <class Value>
+    Value next() {
+        return static_cast<Value>(static_cast<int>(pictureOptions.at(place_++)));
+    }
+    bool flag() { return next<int>() != 0; }
+    double number() { return pictureOptions.at(place_++); }
+
+private:
+    std::size_t place_ = 0;
+};
+
+void setShown(LayoutOptions& layout, unsigned bits) {
+    layout.auntsUncles = (bits & 0x01u) != 0;
+    layout.cousins = (bits & 0x02u) != 0;
+    layout.siblings = (bits & 0x04u) != 0;
+    layout.siblingSpouses = (bits & 0x08u) != 0;
+    layout.niecesNephews = (bits & 0x10u) != 0;
+    layout.grandchildren = (bits & 0x20u) != 0;
+    layout.greatGrandparents = (bits & 0x40u) != 0;
+    layout.spousesOfChildren = (bits & 0x80u) != 0;
+}
+
+charts::ViewRequest requestOf(kin::Place focus) {
+    charts::ViewRequest request;
+    charts::ChartRequest& chart = request.chart;
+    OptionReader options;
+    chart.focus = focus;
+    chart.view = options.next<charts::View>();
+    setShown(request.layout, options.next<unsigned>());
+    request.layout.generations = options.next<int>();
+    request.layout.flagDepth = std::max(1, request.layout.generations - 1);
+    chart.to = options.next<kin::Place>() - 1;
+    chart.up = options.next<int>();
+    chart.down = options.next<int>();
+    chart.direction = options.next<charts::Direction>();
+    chart.spouses = options.flag();
+    chart.siblings = options.flag();
+    chart.compact = options.flag();
+    chart.fanOf = options.next<charts::FanOf>();
+    chart.fanAngle = options.next<int>();
+    chart.ways = options.next<charts::WayChoice>();
+    chart.mostWays = options.next<int>();
+    chart.mostMarks = options.next<int>();
+    chart.effort = options.next<int>();
+    request.unknownParents = options.flag();
+    chart.sizes.boxWidth = static_cast<float>(options.number());
+    chart.sizes.boxHeight = static_cast<float>(options.number());
+    chart.sizes.gapX = static_cast<float>(options.number());
+    chart.sizes.gapY = static_cast<float>(options.number());
+    return request;
+}
+
+}  // namespace
+}  // namespace olvane::js
+
+using namespace olvane;
+using js::OpenFile;
+
+// Room for so many numbers, which JavaScript fills before it asks for a picture.
+OLVANE_EXPORT("picture_options") double* pictureOptionsRoom(std::size_t count) {
+    js::pictureOptions.assign(count, 0);
+    return js::pictureOptions.data();
+}
+
+// Null for a picture that is refused; last_text then says why.
+OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* file, std::int32_t focus) {
+    try {
+        const auto limited = std::make_shared<gedcom::LimitedDataSource>(file->source, js::kMostRelatives);
+        const picture::Picture picture = charts::pictureOf(limited, file->kin(), js::requestOf(focus - 1));
+        return std::make_unique<std::vector<double>>(js::numbersOf(picture)).release();
+    } catch (const std::length_error&) {
+        js::lastText = "too large";
+    } catch (const std::exception& error) {
+        js::lastText = error.what();
+    }
+    return nullptr;
+}
+
+OLVANE_EXPORT("picture_numbers") const double* pictureNumbers(const std::vector<double>* answer) {
+    return answer->data();
+}
+
+OLVANE_EXPORT("picture_count") std::size_t pictureCount(const std::vector<double>* answer) {
+    return answer->size();
+}
+
+OLVANE_EXPORT("picture_free") void pictureFree(std::vector<double>* answer) {
+    delete answer;
+}

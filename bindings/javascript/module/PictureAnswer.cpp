@@ -1,0 +1,74 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Writes a picture down as numbers, list after list. Doubles hold every index and every id that JavaScript can name.
+
+#include "PictureAnswer.h"
+
+#include <initializer_list>
+
+namespace olvane::js {
+namespace {
+
+constexpr std::size_t kBoxNumbers = 13;
+constexpr std::size_t kLineNumbers = 8;
+
+void append(std::vector<double>& numbers, std::initializer_list<double> values) {
+    numbers.insert(numbers.end(), values);
+}
+
+void appendBox(std::vector<double>& numbers, const picture::Box& box) {
+    const int flag = box.hasFlag ? (box.flag ? 1 : 0) : -1;
+    append(numbers, {static_cast<double>(box.id), box.x, box.y, box.width, box.height,
+                     static_cast<double>(box.childOf), static_cast<double>(box.repeat),
+                     static_cast<double>(box.hiddenParents), static_cast<double>(box.hiddenPartners),
+                     static_cast<double>(box.hiddenChildren), static_cast<double>(box.kind),
+                     static_cast<double>(box.sex), static_cast<double>(flag)});
+}
+
+void appendFamily(std::vector<double>& numbers, const picture::Family& family) {
+    append(numbers, {static_cast<double>(family.firstMember), static_cast<double>(family.firstLine),
+                     static_cast<double>(family.childCount), static_cast<double>(family.lineCount),
+                     static_cast<double>(family.number), static_cast<double>(family.parentCount),
+                     static_cast<double>(family.style)});
+}
+
+void appendLine(std::vector<double>& numbers, const picture::Line& line) {
+    append(numbers, {line.x1, line.y1, line.x2, line.y2, static_cast<double>(line.child),
+                     static_cast<double>(line.firstBridge), static_cast<double>(line.bridgeCount),
+                     static_cast<double>(line.role)});
+}
+
+void appendMark(std::vector<double>& numbers, const picture::Mark& mark) {
+    append(numbers, {static_cast<double>(mark.kind), static_cast<double>(mark.number),
+                     static_cast<double>(mark.boxes[0]), static_cast<double>(mark.boxes[1]),
+                     static_cast<double>(mark.boxes[2])});
+}
+
+}  // namespace
+
+std::vector<double> numbersOf(const picture::Picture& picture) {
+    std::vector<double> numbers;
+    numbers.reserve(8 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
+                    kLineNumbers * picture.lines.size());
+    append(numbers,
+           {static_cast<double>(picture.boxes.size()), static_cast<double>(picture.arcs.size()),
+            static_cast<double>(picture.families.size()), static_cast<double>(picture.members.size()),
+            static_cast<double>(picture.lines.size()), static_cast<double>(picture.bridges.size()),
+            static_cast<double>(picture.marks.size()), static_cast<double>(picture.focus)});
+    for (const picture::Box& box : picture.boxes) appendBox(numbers, box);
+    for (const picture::Arc& arc : picture.arcs) {
+        append(numbers, {static_cast<double>(arc.ring), arc.from, arc.to});
+    }
+    for (const picture::Family& family : picture.families) appendFamily(numbers, family);
+    for (std::size_t i = 0; i < picture.members.size(); ++i) {
+        append(numbers,
+               {static_cast<double>(picture.members[i]), static_cast<double>(picture.childKinds[i])});
+    }
+    for (const picture::Line& line : picture.lines) appendLine(numbers, line);
+    numbers.insert(numbers.end(), picture.bridges.begin(), picture.bridges.end());
+    for (const picture::Mark& mark : picture.marks) appendMark(numbers, mark);
+    return numbers;
+}
+
+}  // namespace olvane::js

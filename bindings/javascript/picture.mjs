@@ -1,0 +1,97 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A picture, read from the run of numbers that the module writes.
+
+const BOX_KINDS = ["person", "unknownParent"];
+const SEXES = ["male", "female", "other"];
+const ROLES = ["marriage", "drop", "bar", "stem", "link"];
+const STYLES = ["married", "divorced", "unmarried", "unknown"];
+const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
+const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
+const HEAD = 8;
+
+function boxAt(n, at, index) {
+    return {
+        index,
+        id: n[at],
+        kind: BOX_KINDS[n[at + 10]],
+        x: n[at + 1],
+        y: n[at + 2],
+        width: n[at + 3],
+        height: n[at + 4],
+        sex: SEXES[n[at + 11]],
+        childOf: n[at + 5] < 0 ? null : n[at + 5],
+        repeat: n[at + 6],
+        hidden: { parents: n[at + 7], partners: n[at + 8], children: n[at + 9] },
+        flag: n[at + 12] < 0 ? null : n[at + 12] > 0,
+    };
+}
+
+function familyAt(n, at, members, lines) {
+    const [firstMember, firstLine, childCount, lineCount, number, parentCount, style] = n.subarray(at, at + 7);
+    const firstChild = firstMember + parentCount;
+    const children = members.slice(firstChild, firstChild + childCount);
+    return {
+        number,
+        parents: members.slice(firstMember, firstChild).map((member) => member.box),
+        children: children.map((member) => member.box),
+        childKinds: children.map((member) => CHILD_KINDS[member.kind]),
+        style: STYLES[style],
+        lines: lines.slice(firstLine, firstLine + lineCount),
+    };
+}
+
+function lineAt(n, at, bridges) {
+    const first = n[at + 5];
+    return {
+        x1: n[at],
+        y1: n[at + 1],
+        x2: n[at + 2],
+        y2: n[at + 3],
+        child: n[at + 4] < 0 ? null : n[at + 4],
+        role: ROLES[n[at + 7]],
+        bridges: n[at + 6] === 0 ? [] : bridges.slice(first, first + n[at + 6]),
+    };
+}
+
+function markAt(n, at) {
+    const boxes = [n[at + 2], n[at + 3], n[at + 4]].filter((box) => box >= 0);
+    return { kind: MARK_KINDS[n[at]], number: n[at + 1], boxes };
+}
+
+/** The picture of a view; numbers may be memory of the module's, which is not kept. */
+export function pictureFrom(view, numbers) {
+    const [boxCount, arcCount, familyCount, memberCount, lineCount, bridgeCount, markCount, focus] = numbers;
+    // Lists refer to those behind them, so each is read where it lies before any is put together.
+    const starts = {};
+    let at = HEAD;
+    const place = (name, count, size) => {
+        starts[name] = at;
+        at += count * size;
+    };
+    place("boxes", boxCount, 13);
+    place("arcs", arcCount, 3);
+    place("families", familyCount, 7);
+    place("members", memberCount, 2);
+    place("lines", lineCount, 8);
+    place("bridges", bridgeCount, 1);
+    place("marks", markCount, 5);
+    const list = (name, count, size, make) =>
+        Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
+    const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
+    const members = list("members", memberCount, 2, (start) => ({ box: numbers[start], kind: numbers[start + 1] }));
+    const lines = list("lines", lineCount, 8, (start) => lineAt(numbers, start, bridges));
+    return {
+        view,
+        focus,
+        boxes: list("boxes", boxCount, 13, (start, index) => boxAt(numbers, start, index)),
+        arcs: list("arcs", arcCount, 3, (start) => ({
+            ring: numbers[start],
+            from: numbers[start + 1],
+            to: numbers[start + 2],
+        })),
+        families: list("families", familyCount, 7, (start) => familyAt(numbers, start, members, lines)),
+        marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
+    };
+}

@@ -1,0 +1,94 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What a caller asks of a picture, checked before the module hears of it, as options.mjs does for layouts.
+
+import { Shown } from "./values.mjs";
+
+export const VIEWS = [
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+];
+const DIRECTIONS = ["down", "up", "left", "right"];
+const FANS = ["ancestors", "descendants"];
+const WAYS = ["blood", "marriage", "both"];
+
+const MOST = 2 ** 31 - 1;
+
+/** In the order of set_picture_options. */
+const OPTIONS = {
+    view: { words: VIEWS, usual: "family" },
+    shown: { least: 0, most: Shown.all, usual: Shown.all },
+    generations: { least: 1, most: 1000, usual: 5 },
+    to: { least: 0, most: MOST, usual: 0 },
+    up: { least: 0, most: MOST, usual: 0 },
+    down: { least: 0, most: MOST, usual: 0 },
+    direction: { words: DIRECTIONS, usual: "down" },
+    spouses: { flag: true, usual: true },
+    siblings: { flag: true, usual: false },
+    compact: { flag: true, usual: false },
+    fan: { words: FANS, usual: "ancestors" },
+    angle: { least: 90, most: 360, usual: 360 },
+    ways: { words: WAYS, usual: "both" },
+    mostWays: { least: 0, most: MOST, usual: 8 },
+    marks: { least: -1, most: MOST, usual: -1 },
+    effort: { least: 0, most: 100, usual: 1 },
+    unknownParents: { flag: true, usual: true },
+    width: { size: true, usual: 55 },
+    height: { size: true, usual: 80 },
+    gapX: { size: true, usual: 25 },
+    gapY: { size: true, usual: 30 },
+};
+
+function quoted(value) {
+    return typeof value === "string" ? JSON.stringify(value) : String(value);
+}
+
+function wordNumber(name, value, words) {
+    const number = words.indexOf(value);
+    if (number >= 0) return number;
+    throw new TypeError(`${name} is ${quoted(value)}, and takes one of ${words.join(", ")}`);
+}
+
+function flagNumber(name, value) {
+    if (typeof value === "boolean") return value ? 1 : 0;
+    throw new TypeError(`${name} is ${quoted(value)}, and takes true or false`);
+}
+
+function plainNumber(name, value, { least, most, size }) {
+    if (typeof value !== "number") throw new TypeError(`${name} is ${quoted(value)}, and takes a number`);
+    if (size) {
+        if (Number.isFinite(Math.fround(value)) && value >= 0) return value;
+        throw new RangeError(`${name} is ${value}, and takes a finite number of 0 or more`);
+    }
+    if (Number.isInteger(value) && value >= least && value <= most) return value;
+    throw new RangeError(`${name} is ${value}, and takes a whole number of ${least} to ${most}`);
+}
+
+function numberOf(name, value, option) {
+    if (option.words) return wordNumber(name, value, option.words);
+    return option.flag ? flagNumber(name, value) : plainNumber(name, value, option);
+}
+
+/** All options as numbers, in the order of set_picture_options. */
+export function pictureNumbers(options) {
+    if (typeof options !== "object" || options === null) {
+        throw new TypeError(`options is ${quoted(options)}, and takes an object`);
+    }
+    for (const name of Object.keys(options)) {
+        if (!Object.hasOwn(OPTIONS, name)) {
+            throw new TypeError(`there is no option ${name}, but ${Object.keys(OPTIONS).join(", ")}`);
+        }
+    }
+    return Object.entries(OPTIONS).map(([name, option]) =>
+        numberOf(name, options[name] ?? option.usual, option),
+    );
+}

@@ -1,0 +1,104 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The viewer on somebody else's page: <olvane-tree>, served over http as a site would.
+
+import assert from "node:assert/strict";
+import { readFileSync } from "node:fs";
+import { createServer } from "node:http";
+import { join } from "node:path";
+import { after, before, describe, test } from "node:test";
+import { newContext, sample } from "../support/browser.mjs";
+
+const kTypes = { html: "text/html", mjs: "text/javascript", ged: "text/plain" };
+
+let server = null;
+let address = "";
+const files = new Map();
+
+before(async () => {
+    files.set("/olvane-tree.mjs", readFileSync(process.env.OLVANE_ELEMENT));
+    files.set("/family.ged", sample("darwin-wedgwood.ged"));
+    files.set("/example.html", readFileSync(join(process.env.OLVANE_SOURCES, "examples/javascript/element.html")));
+    server = createServer((request, response) => {
+        const path = new URL(request.url, "http://localhost").pathname;
+        const content = files.get(path);
+        response.writeHead(content ? 200 : 404, { "content-type": kTypes[path.split(".").at(-1)] ?? "text/plain" });
+        response.end(content ?? "not here");
+    });
+    await new Promise((done) => server.listen(0, "127.0.0.1", done));
+    address = `http://127.0.0.1:${server.address().port}`;
+});
+after(() => server?.close());
+
+async function open(path) {
+    const context = await newContext();
+    const page = await context.newPage();
+    const troubles = [];
+    page.on("pageerror", (error) => troubles.push(String(error)));
+    await page.goto(address + path);
+    return { page, end: async () => (await context.close(), assert.deepEqual(troubles, [])) };
+}
+
+describe("element", () => {
+    test("the example shows a family, and its events reach the page around it", async () => {
+        const { page, end } = await open("/example.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        assert.equal(await page.locator("olvane-tree .box.focus").getAttribute("data-xref"), "I1");
+        await page.locator('olvane-tree [data-xref="I2"]').first().click();
+        await page.waitForFunction(() => /is selected/.test(document.querySelector("#about").textContent));
+        await end();
+    });
+
+    test("attributes, methods and events speak of one state", async () => {
+        files.set("/one.html", '<!doctype html><olvane-tree src="family.ged" focus="I1" style="height: 500px"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>');
+        const { page, end } = await open("/one.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const seen = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            const events = [];
+            tree.addEventListener("focuschange", ({ detail }) => events.push([detail.person.xref, detail.state.view, detail.byUser]));
+            tree.setAttribute("focus", "I5");
+            tree.setAttribute("view", "pedigree");
+            const isShown = tree.show({ focus: 1 });
+            tree.select(12);
+            return { events, isShown, selected: tree.selected.id, view: tree.state.view, svg: tree.saveSvg().slice(0, 60) };
+        });
+        assert.deepEqual(seen.events, [["I5", "family", false], ["I5", "pedigree", false], ["I1", "pedigree", false]]);
+        assert.equal(seen.isShown, true);
+        assert.equal(seen.selected, 12);
+        assert.equal(seen.view, "pedigree");
+        assert.match(seen.svg, /^<\?xml/);
+        await end();
+    });
+
+    test("ten of them on one page know nothing of each other", async () => {
+        const trees = Array.from({ length: 10 }, (_, i) => `<olvane-tree src="family.ged" focus="I${i + 1}" style="height: 300px"></olvane-tree>`);
+        files.set("/ten.html", `<!doctype html>${trees.join("")}<script type="module" src="olvane-tree.mjs"></script>`);
+        const { page, end } = await open("/ten.html");
+        await page.waitForFunction(() => [...document.querySelectorAll("olvane-tree")].every((tree) => tree.state));
+        const focuses = () => page.$$eval("olvane-tree", (all) => all.map((tree) => tree.state.focus));
+        assert.deepEqual(await focuses(), [1, 2, 3, 4, 5, 6, 7, 8, 9, 10]);
+        await page.evaluate(() => document.querySelectorAll("olvane-tree")[3].show({ focus: 20 }));
+        assert.deepEqual(await focuses(), [1, 2, 3, 20, 5, 6, 7, 8, 9, 10]);
+        await end();
+    });
+
+    test("a file that cannot be had leaves the element empty and says why to whoever asks", async () => {
+        files.set("/none.html", '<!doctype html><olvane-tree></olvane-tree><script type="module" src="olvane-tree.mjs"></script>');
+        const { page, end } = await open("/none.html");
+        const reason = await page.evaluate(async () => {
+            await customElements.whenDefined("olvane-tree");
+            return document.querySelector("olvane-tree").load("nowhere.ged").catch((error) => error.message);
+        });
+        assert.match(reason, /nowhere\.ged: 404/);
+        const event = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            const failed = new Promise((done) => tree.addEventListener("error", (error) => done(error.message)));
+            tree.setAttribute("src", "nowhere.ged");
+            return failed;
+        });
+        assert.match(event, /404/);
+        await end();
+    });
+});

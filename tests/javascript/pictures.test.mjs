@@ -1,0 +1,97 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Pictures of a GEDCOM file in JavaScript: boxes, families and their lines as values.
+
+import assert from "node:assert/strict";
+import test from "node:test";
+
+import { LayoutError } from "../../bindings/javascript/olvane.mjs";
+import { olvane } from "./module.mjs";
+
+// A couple with a child of their own and an adopted one; the husband's parents are divorced.
+const family = `0 HEAD
+1 GEDC
+2 VERS 5.5.1
+1 CHAR UTF-8
+0 @I1@ INDI
+1 SEX M
+1 FAMC @F2@
+1 FAMS @F1@
+0 @I2@ INDI
+1 SEX F
+1 FAMS @F1@
+0 @I3@ INDI
+1 FAMC @F1@
+0 @I4@ INDI
+1 FAMC @F1@
+2 PEDI adopted
+0 @I5@ INDI
+1 SEX M
+1 FAMS @F2@
+0 @I6@ INDI
+1 SEX F
+1 FAMS @F2@
+0 @F1@ FAM
+1 HUSB @I1@
+1 WIFE @I2@
+1 CHIL @I3@
+1 CHIL @I4@
+1 MARR
+0 @F2@ FAM
+1 HUSB @I5@
+1 WIFE @I6@
+1 CHIL @I1@
+1 DIV Y
+0 TRLR`;
+
+const file = olvane.readGedcom(new TextEncoder().encode(family), "family.ged");
+const idsOf = (picture, places) => places.map((place) => picture.boxes[place].id);
+
+test("a picture tells who belongs to which family, and how", () => {
+    const picture = file.picture(1);
+    assert.equal(picture.view, "family");
+    assert.equal(picture.boxes[picture.focus].id, 1);
+    const own = picture.families.find(({ number }) => number === 1);
+    assert.deepEqual(idsOf(picture, own.parents), [1, 2]);
+    assert.deepEqual(idsOf(picture, own.children), [3, 4]);
+    assert.deepEqual(own.childKinds, ["birth", "adopted"]);
+    assert.equal(own.style, "married");
+    const parents = picture.families.find(({ number }) => number === 2);
+    assert.equal(parents.style, "divorced");
+    assert.deepEqual(new Set(own.lines.map(({ role }) => role)), new Set(["marriage", "drop", "bar", "stem"]));
+    assert.deepEqual(own.lines.filter(({ role }) => role === "stem").map(({ child }) => picture.boxes[child].id).sort(), [3, 4]);
+});
+
+test("the boxes of the engine's views stand where its layout has them", () => {
+    for (const view of ["family", "pedigree"]) {
+        const records = file.layout(1, { view });
+        const boxes = file.picture(1, { view, width: 55, height: 80, gapX: 25, gapY: 30 }).boxes;
+        assert.deepEqual(boxes.map(({ x, y }) => [x, y]), records.map(({ x, y }) => [x, y]));
+        const flags = records.map(({ id, hasHiddenRelatives }) => (id > 0 ? hasHiddenRelatives : null));
+        assert.deepEqual(boxes.map(({ flag }) => flag), flags);
+    }
+});
+
+test("a box of an unknown parent names its child, and can be left out", () => {
+    const withThem = file.picture(5, { view: "pedigree", generations: 2 });
+    const unknown = withThem.boxes.filter(({ kind }) => kind === "unknownParent");
+    const without = file.picture(5, { view: "pedigree", generations: 2, unknownParents: false });
+    assert.equal(without.boxes.length, withThem.boxes.length - unknown.length);
+    for (const { childOf, id } of unknown) assert.deepEqual([withThem.boxes[childOf].id, id], [5, 0]);
+});
+
+test("a chart shows everybody of its kind once, and counts who is hidden", () => {
+    const { boxes } = file.picture(5, { view: "descendants", spouses: false, down: 1 });
+    assert.deepEqual(boxes.map(({ id }) => id).sort(), [1, 5]);
+    const [focus] = boxes.filter(({ id }) => id === 5);
+    assert.deepEqual(focus.hidden, { parents: 0, partners: 1, children: 0 });
+});
+
+test("what cannot be asked for is refused by its name", () => {
+    assert.throws(() => file.picture(1, { view: "tree" }), /view is "tree", and takes one of family, pedigree/);
+    assert.throws(() => file.picture(1, { depth: 3 }), /there is no option depth/);
+    assert.throws(() => file.picture(1, { generations: 0 }), RangeError);
+    assert.throws(() => file.picture(1, { spouses: 1 }), /takes true or false/);
+    assert.throws(() => file.picture(7), LayoutError);
+});
