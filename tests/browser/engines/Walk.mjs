@@ -77,15 +77,13 @@ export class Walk {
         return this.window.evaluate(() => one("#tree .box.focus")?.getAttribute("data-xref") ?? "");
     }
 
-    /** All boxes and lines of the picture as drawn, for a comparison between engines. */
+    /** All boxes and lines of the picture, in sight or not, for a comparison between engines. */
     picture() {
         return this.window.evaluate(() => {
-            const [x0, y0] = /translate\(([-\d.]+) ([-\d.]+)\)/.exec(one("#tree .box.focus").getAttribute("transform")).slice(1).map(Number);
-            const boxes = all("#tree .boxes > g").map((box) => {
-                const [x, y] = /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);
-                return `${box.getAttribute("data-xref") ?? "-"} ${Math.round(x - x0)} ${Math.round(y - y0)}`;
-            });
-            return boxes.sort().join("\n");
+            const { picture } = document.querySelector("olvane-tree").shown;
+            const boxes = picture.boxes.map(({ key, x, y, width, height }) => [key, x, y, width, height].join(" "));
+            const lines = picture.families.flatMap(({ family }) => family.lines.map(({ x1, y1, x2, y2 }) => [x1, y1, x2, y2].join(" ")));
+            return [...boxes, ...lines].join("\n");
         });
     }
 }
