@@ -166,7 +166,7 @@ int main(int argc, char** argv) {
             "| --- | ---: | ---: | ---: | ---: | ---: | ---: | ---: | ---: | ---: | ---: | ---: | ---: | "
             "---: | ---: | ---: |\n");
         for (const View view :
-             {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives}) {
+             {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives, View::fan}) {
             const auto isNamed = [view](const char* name) {
                 return std::string(name) == olvane::charts::nameOf(view);
             };

@@ -3,6 +3,7 @@
 
 #include <olvane/charts/Charts.h>
 
+#include <olvane/charts/FanInternal.h>
 #include <olvane/charts/GapTracksInternal.h>
 #include <olvane/charts/PlanBuilderInternal.h>
 #include <olvane/charts/PlanPictureInternal.h>
@@ -90,6 +91,8 @@ picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request
         case View::hourglass:
         case View::relatives:
             return treeChart(graph, request);
+        case View::fan:
+            return fanChart(graph, request);
         default:
             break;
     }

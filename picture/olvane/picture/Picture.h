@@ -44,10 +44,13 @@ struct Box {
 };
 
 // A box of a round chart: a piece of a ring, clockwise from the top, in degrees. Ring 0 is the middle.
+// line is the box at which its line of descent begins: that of a grandparent, or in a chart of descendants, of a
+// child of the middle; kNone for boxes nearer to the middle.
 struct Arc {
     std::int32_t ring = 0;
     double from = 0;
     double to = 0;
+    Index line = kNone;
 };
 
 enum class LineRole : std::uint8_t { marriage, drop, bar, stem, link };
@@ -102,6 +105,10 @@ struct Picture {
     Index focus = kNone;
     std::vector<Box> boxes;
     std::vector<Arc> arcs;  // one for each box of a round chart, else empty
+    // Of a round chart: ring i reaches from ringRadii[i] to ringRadii[i + 1], around the middle.
+    std::vector<double> ringRadii;
+    double middleX = 0;
+    double middleY = 0;
     std::vector<Family> families;
     std::vector<Index> members;
     std::vector<kin::ChildKind> childKinds;  // beside members; of no meaning at a parent

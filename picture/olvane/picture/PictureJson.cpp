@@ -77,6 +77,10 @@ public:
             picture_.focus == kNone ? 0 : picture_.boxes[static_cast<std::size_t>(picture_.focus)].id;
         json_ = "{\n \"format\": 2,\n \"view\": " + quoted(picture_.view) +
                 ",\n \"focus\": " + std::to_string(focus) + ",\n";
+        if (picture_.isRound()) {
+            json_ += " \"rings\": " + listOf(picture_.ringRadii, number) +
+                     field("middleX", picture_.middleX) + field("middleY", picture_.middleY) + ",\n";
+        }
         addList("boxes", picture_.boxes.size(), [this](std::size_t i) { return boxJson(i); });
         json_ += ",\n";
         addList("families", picture_.families.size(),
@@ -101,6 +105,7 @@ private:
         if (picture_.isRound()) {
             const Arc& arc = picture_.arcs[i];
             json += ", \"ring\": " + std::to_string(arc.ring) + field("from", arc.from) + field("to", arc.to);
+            if (arc.line != kNone) json += ", \"line\": " + std::to_string(arc.line);
         } else {
             json += field("x", box.x) + field("y", box.y) + field("width", static_cast<double>(box.width)) +
                     field("height", static_cast<double>(box.height));

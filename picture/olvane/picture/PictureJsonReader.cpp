@@ -117,6 +117,7 @@ public:
         if (!picture_.arcs.empty() && picture_.arcs.size() != boxes.size()) {
             fail("only some of the boxes have a ring");
         }
+        readRings(json);
         findFocus(integerAt<std::int64_t>(json, "focus"));
         for (const Json& family : listAt(json, "families")) readFamily(family);
         for (const Json& mark : listAt(json, "marks")) readMark(mark);
@@ -132,6 +133,15 @@ private:
     Index placeAt(const Json& object, const char* name) const {
         const Json* value = find(object, name);
         return value == nullptr ? kNone : placeOf(*value, name);
+    }
+
+    void readRings(const Json& json) {
+        if (find(json, "rings") == nullptr) return;
+        for (const Json& radius : listAt(json, "rings")) {
+            picture_.ringRadii.push_back(numberOf(radius, "rings"));
+        }
+        picture_.middleX = numberAt(json, "middleX");
+        picture_.middleY = numberAt(json, "middleY");
     }
 
     void readBox(const Json& json) {
@@ -150,8 +160,8 @@ private:
         }
         readHidden(json, box);
         if (find(json, "ring") != nullptr) {
-            picture_.arcs.push_back(
-                {integerAt<std::int32_t>(json, "ring"), numberAt(json, "from"), numberAt(json, "to")});
+            picture_.arcs.push_back({integerAt<std::int32_t>(json, "ring"), numberAt(json, "from"),
+                                     numberAt(json, "to"), placeAt(json, "line")});
         }
         picture_.boxes.push_back(box);
     }
