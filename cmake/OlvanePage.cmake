@@ -33,7 +33,7 @@ ExternalProject_Add(olvane_wasm_module
   BINARY_DIR ${CMAKE_BINARY_DIR}/wasm
   PREFIX ${CMAKE_BINARY_DIR}/wasm-stamps
   CONFIGURE_COMMAND ${for_emscripten} ${OLVANE_EMCMAKE} ${CMAKE_COMMAND} -S <SOURCE_DIR> -B <BINARY_DIR>
-                    -G ${CMAKE_GENERATOR} -DCMAKE_BUILD_TYPE=MinSizeRel
+                    -G ${CMAKE_GENERATOR} -DCMAKE_BUILD_TYPE=Release
   BUILD_COMMAND ${for_emscripten} ${CMAKE_COMMAND} --build <BINARY_DIR> --target ${inner_targets}
   INSTALL_COMMAND ""
   BUILD_ALWAYS ON

@@ -11,6 +11,7 @@
 #include <csignal>
 #include <filesystem>
 #include <fstream>
+#include <functional>
 #include <iostream>
 #include <memory>
 
@@ -23,6 +24,7 @@
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
+#include <cli/PictureRun.h>
 #include <cli/TableCells.h>
 #include <cli/UsageError.h>
 
@@ -147,6 +149,9 @@ private:
     bool shown_;
 };
 
+// What follows the id on a line.
+using Answer = std::function<std::string(gedcom::PersonId id)>;
+
 struct BatchLine {
     std::string text;
     bool isKnown = false;
@@ -160,10 +165,32 @@ gedcom::PersonId personOf(const gedcom::GedcomData& data, const BatchFocus& focu
     return found.size() == 1 ? found.front() : 0;
 }
 
-BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const LayoutRequest& request) {
+// JSON has line ends between its values alone.
+std::string onOneLine(std::string json) {
+    std::string line;
+    for (std::size_t at = 0; at < json.size(); ++at) {
+        if (json[at] != '\n') {
+            line += json[at];
+        } else {
+            while (at + 1 < json.size() && json[at + 1] == ' ') ++at;
+        }
+    }
+    return line;
+}
+
+BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const Answer& answer) {
     const gedcom::PersonId id = personOf(data, focus);
     if (id == 0) return {escapedField(focus.written) + "\t\n", false};
-    return {std::to_string(id) + "\t" + layoutText(data, id, request) + "\n", true};
+    return {std::to_string(id) + "\t" + answer(id) + "\n", true};
+}
+
+// The result text of a view of the engine, or else the picture.
+Answer answerOf(const gedcom::GedcomData& data, const LayoutRequest& request) {
+    if (isEngineView(request.view)) {
+        return [&](gedcom::PersonId id) { return layoutText(data, id, request); };
+    }
+    const auto run = std::make_shared<PictureRun>(data, request, std::vector<bool>());
+    return [run](gedcom::PersonId id) { return onOneLine(run->jsonOf(id)); };
 }
 
 }  // namespace
@@ -174,6 +201,7 @@ int runBatch(const BatchOptions& options) {
             "the standard input cannot hold both the family and the focuses; name a file for one");
     }
     const gedcom::GedcomData data = readFile(options.input);
+    const Answer answer = answerOf(data, options.request);
     FocusList focuses(data, options.focusFrom, options.unbuffered ? 1 : kBlock);
     const ProgressBar progress(focuses.total());
     const InterruptMark mark;
@@ -182,7 +210,7 @@ int runBatch(const BatchOptions& options) {
     for (auto block = focuses.nextBlock(); !block.empty() && interrupted == 0; block = focuses.nextBlock()) {
         std::vector<BatchLine> lines(block.size());
         inParallel(block.size(), [&](std::size_t i) {
-            if (interrupted == 0) lines[i] = lineFor(data, block[i], options.request);
+            if (interrupted == 0) lines[i] = lineFor(data, block[i], answer);
         });
         for (std::size_t i = 0; i < lines.size() && interrupted == 0; ++i, ++done) {
             writeStandardOutput(lines[i].text);

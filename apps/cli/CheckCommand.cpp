@@ -8,14 +8,18 @@
 
 #include <algorithm>
 #include <functional>
+#include <map>
+#include <optional>
 
 #include <olvane/draw/LayoutCheck.h>
+#include <olvane/picture/Judge.h>
 
 #include <cli/DataCheck.h>
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
+#include <cli/PictureRun.h>
 
 namespace olvane::cli {
 
@@ -59,8 +63,8 @@ struct CheckedLayout {
     draw::LayoutFindings findings;
 };
 
-CheckedLayout checkLayoutOf(const gedcom::GedcomData& data, gedcom::PersonId focus,
-                            const LayoutRequest& request) {
+CheckedLayout checkEngineLayout(const gedcom::GedcomData& data, gedcom::PersonId focus,
+                                const LayoutRequest& request) {
     const std::vector<LayoutRecord> records = readLayoutText(layoutText(data, focus, request));
     const TreeSize size = sizeOf(request.boxes);
     const auto direction =
@@ -68,6 +72,62 @@ CheckedLayout checkLayoutOf(const gedcom::GedcomData& data, gedcom::PersonId foc
     const draw::BoxSize box{static_cast<int>(size.nodeWidth), static_cast<int>(size.nodeHeight)};
     return {records.size(), box, draw::checkLayout(records, direction, box)};
 }
+
+// A family goes by its first child, or by a parent where it has none.
+std::int64_t idOfFamily(const picture::Picture& picture, picture::Index place) {
+    const picture::Family& family = picture.families[static_cast<std::size_t>(place)];
+    const auto children = picture.children(family);
+    const picture::Index box = children.empty() ? picture.parents(family).front() : children.front();
+    return picture.boxes[static_cast<std::size_t>(box)].id;
+}
+
+draw::LayoutFindings findingsOf(const picture::Picture& picture) {
+    std::vector<picture::Finding> found;
+    picture::judge(picture, nullptr, &found);
+    const auto box = [&](picture::Index place) { return picture.boxes[static_cast<std::size_t>(place)].id; };
+    draw::LayoutFindings findings;
+    for (const picture::Finding& finding : found) {
+        if (finding.kind == picture::FindingKind::overlap) {
+            findings.overlappingBoxes.emplace_back(box(finding.one), box(finding.other));
+        } else if (finding.kind == picture::FindingKind::hit) {
+            findings.linesThroughBoxes.emplace_back(idOfFamily(picture, finding.one), box(finding.other));
+        } else if (finding.kind == picture::FindingKind::track ||
+                   finding.kind == picture::FindingKind::touch) {
+            findings.sharedTracks.emplace_back(idOfFamily(picture, finding.one),
+                                               idOfFamily(picture, finding.other));
+        }
+    }
+    std::map<std::int64_t, int> boxes;
+    for (const picture::Box& one : picture.boxes) {
+        if (one.kind == picture::BoxKind::person) ++boxes[one.id];
+    }
+    for (const auto& [id, count] : boxes) {
+        if (count > 1) findings.repeatedPersons.push_back({id, count});
+    }
+    return findings;
+}
+
+// Looks at the layouts of one file in one view.
+class LayoutChecker {
+public:
+    LayoutChecker(const gedcom::GedcomData& data, const LayoutRequest& request)
+        : data_(data), request_(request) {
+        if (!isEngineView(request.view)) charts_.emplace(data, request, std::vector<bool>());
+    }
+
+    CheckedLayout check(gedcom::PersonId focus) const {
+        if (!charts_) return checkEngineLayout(data_, focus, request_);
+        const picture::Picture picture = charts_->pictureOf(focus);
+        const TreeSize size = sizeOf(request_.boxes);
+        const draw::BoxSize box{static_cast<int>(size.nodeWidth), static_cast<int>(size.nodeHeight)};
+        return {picture.boxes.size(), box, findingsOf(picture)};
+    }
+
+private:
+    const gedcom::GedcomData& data_;
+    const LayoutRequest& request_;
+    std::optional<PictureRun> charts_;
+};
 
 void tellPairs(const std::vector<draw::IdPair>& pairs, const char* what, std::string& text) {
     for (const auto& [one, other] : pairs) {
@@ -128,14 +188,14 @@ std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& 
     writeReport(
         "focus\tboxes\toverlaps\tlines through boxes\tfamilies on one track\tpersons in several "
         "boxes\tids\n");
+    const LayoutChecker checker(data, request);
     std::size_t troubled = 0;
     std::vector<std::size_t> totals(countsOf({}).size());
     const std::size_t count = data.personCount();
     for (std::size_t start = 0; start < count; start += kBlock) {
         std::vector<CheckedLayout> layouts(std::min(kBlock, count - start));
         const auto idAt = [start](std::size_t i) { return static_cast<gedcom::PersonId>(start + i + 1); };
-        inParallel(layouts.size(),
-                   [&](std::size_t i) { layouts[i] = checkLayoutOf(data, idAt(i), request); });
+        inParallel(layouts.size(), [&](std::size_t i) { layouts[i] = checker.check(idAt(i)); });
         std::string text;
         for (std::size_t i = 0; i < layouts.size(); ++i) {
             const std::vector<std::size_t> counts = countsOf(layouts[i]);
@@ -151,7 +211,7 @@ std::size_t tellAllLayouts(const gedcom::GedcomData& data, const LayoutRequest& 
 
 // Answers whether the layout has trouble.
 bool tellOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
-    const CheckedLayout layout = checkLayoutOf(data, focus, request);
+    const CheckedLayout layout = LayoutChecker(data, request).check(focus);
     std::string text;
     tellLayout(layout, text);
     writeReport(text);

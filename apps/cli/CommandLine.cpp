@@ -12,13 +12,13 @@
 
 #include <CLI/CLI.hpp>
 
-#include <olvane/family/FamilyOptions.h>
 #include <olvane/gedcom/GedcomEncodings.h>
 
 #include <cli/Commands.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/UsageError.h>
+#include <cli/ViewOptions.h>
 
 namespace olvane::cli {
 
@@ -34,29 +34,6 @@ std::string unknownEncoding(const std::string& name) {
         separator = ", ";
     }
     return text;
-}
-
-struct FamilySwitch {
-    const char* name;
-    const std::string& key;
-    const char* help;
-};
-
-const std::vector<FamilySwitch>& familySwitches() {
-    using namespace SharedTreeViewer;
-    static const std::vector<FamilySwitch> kSwitches = {
-        {"--no-aunts-uncles", kTreeViewFamShowAuntsUnclesKey,
-         "Leave out siblings of the parents, and so cousins too"},
-        {"--no-cousins", kTreeViewFamShowCousinsKey, "Leave out children of the parents' siblings"},
-        {"--no-siblings", kTreeViewFamShowSiblingsKey, "Leave out siblings and half siblings"},
-        {"--no-sibling-spouses", kTreeViewFamShowSiblingSpousesKey, "Leave out spouses of the siblings"},
-        {"--no-nieces-nephews", kTreeViewFamShowNeicesNephewsKey, "Leave out children of the siblings"},
-        {"--no-grandchildren", kTreeViewFamShowGrandchildrenKey, "Leave out grandchildren"},
-        {"--no-great-grandparents", kTreeViewFamShowGreatGrandparentsKey, "Leave out great-grandparents"},
-        {"--no-spouses-of-children", kTreeViewFamShowSpousesOfChildrenKey,
-         "Leave out spouses of the children"},
-    };
-    return kSwitches;
 }
 
 void addEncoding(CLI::App& command, InputOptions& input) {
@@ -96,7 +73,8 @@ void addFocus(CLI::App& command, std::string& focus) {
         ->type_name("WHO");
 }
 
-void addViewAlone(CLI::App& command, View& view) {
+// Of a page, which is opened in a view of the engine and shows any.
+void addPageView(CLI::App& command, View& view) {
     static const std::map<std::string, View> kViews = {{"family", View::family},
                                                        {"pedigree", View::pedigree}};
     command
@@ -105,37 +83,6 @@ void addViewAlone(CLI::App& command, View& view) {
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways")
         ->transform(CLI::CheckedTransformer(kViews))
         ->type_name("family|pedigree");
-}
-
-void addView(CLI::App& command, LayoutRequest& request) {
-    addViewAlone(command, request.view);
-    command
-        .add_option(
-            "--generations", request.generations,
-            "Generations of a pedigree, the focus's own included: 1 to 12, default 5. Full ancestry of N "
-            "generations is 2^N - 1 boxes: 5 are 31, 8 are 255, 10 are 1,023, 12 are 4,095, and each "
-            "generation doubles the height of the picture")
-        ->check(CLI::Range(1, 12))
-        ->type_name("N");
-}
-
-void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
-    for (const FamilySwitch& option : familySwitches()) {
-        const std::string& key = option.key;
-        command
-            .add_flag_callback(
-                option.name, [&request, &key] { request.keysOff.push_back(key); }, option.help)
-            ->group("Family view");
-    }
-}
-
-void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defaults) {
-    static const std::map<std::string, BoxForm> kForms = {{"tall", BoxForm::tall}, {"wide", BoxForm::wide}};
-    command
-        .add_option("--boxes", request.boxes,
-                    "Form of the boxes: tall (55 by 80) or wide (105 by 40); " + defaults)
-        ->transform(CLI::CheckedTransformer(kForms))
-        ->type_name("tall|wide");
 }
 
 void addHideLiving(CLI::App& command, HidingOptions& hiding, const std::string& further = "") {
@@ -179,7 +126,7 @@ public:
         refuseWithoutEffect();
         if (people_->parsed()) return runPeople(peopleOptions_);
         if (layout_->parsed()) return runLayout(completedLayoutOptions());
-        if (batch_->parsed()) return runBatch(batchOptions_);
+        if (batch_->parsed()) return runBatch(completedBatchOptions());
         if (check_->parsed()) return runCheck(completedCheckOptions());
         if (judge_->parsed()) return runJudge(judgeOptions_);
         if (page_->parsed()) return runPage(pageOptions_);
@@ -208,24 +155,10 @@ private:
         if (isGiven(command, "--year") && !isGiven(command, "--hide-living")) {
             throw UsageError("--year changes nothing without --hide-living");
         }
-        if (isGiven(command, "--generations") && viewOf(command) != View::pedigree) {
-            throw UsageError("--generations changes nothing without --view pedigree");
-        }
-        for (const FamilySwitch& option : familySwitches()) {
-            if (!isGiven(command, option.name) || viewOf(command) == View::family) continue;
-            throw UsageError(std::string(option.name) + " changes nothing in a pedigree");
-        }
     }
 
     static bool isGiven(const CLI::App& command, const char* option) {
         return command.get_option_no_throw(option) != nullptr && command.count(option) > 0;
-    }
-
-    View viewOf(const CLI::App& command) const {
-        if (&command == page_) return pageOptions_.view;
-        if (&command == layout_) return layoutOptions_.request.view;
-        if (&command == draw_) return drawOptions_.request.view;
-        return &command == batch_ ? batchOptions_.request.view : checkOptions_.request.view;
     }
 
     void addPeople() {
@@ -241,20 +174,20 @@ private:
     }
 
     void addLayout() {
-        layout_ = app_.add_subcommand("layout", "Print where everybody stands, as the engine's result text");
+        layout_ = app_.add_subcommand("layout", "Print where everybody stands, as text or as data");
         addFile(*layout_, layoutOptions_.input);
         addFocus(*layout_, layoutOptions_.focus);
         layout_
             ->add_option(
-                "--format", layoutFormat_,
-                "text: a record for each box on one line (default); json: each field by name, with names "
-                "and dates of the persons")
-            ->check(CLI::IsMember({"text", "json"}))
-            ->type_name("text|json");
-        addView(*layout_, layoutOptions_.request);
-        addBoxes(*layout_, layoutOptions_.request, "default tall");
+                "--format", layoutOptions_.format,
+                "text: a record for each box on one line, of the views family and pedigree (their default); "
+                "json: the picture with names and dates of the persons (default of the other views); json1: "
+                "the older form of json, of family and pedigree")
+            ->transform(CLI::CheckedTransformer(std::map<std::string, LayoutFormat>{
+                {"text", LayoutFormat::text}, {"json", LayoutFormat::json}, {"json1", LayoutFormat::json1}}))
+            ->type_name("text|json|json1");
+        addViewOptions(*layout_, layoutOptions_.request, "default tall");
         addHideLiving(*layout_, layoutOptions_.hiding);
-        addFamilySwitches(*layout_, layoutOptions_.request);
     }
 
     void addDraw() {
@@ -266,8 +199,8 @@ private:
                          "Picture to write: .svg, .png or .pdf; - writes SVG to the standard output")
             ->required()
             ->type_name("OUT");
-        addView(*draw_, drawOptions_.request);
-        addBoxes(*draw_, drawOptions_.request, "default tall, and wide in a pedigree");
+        addViewOptions(*draw_, drawOptions_.request,
+                       "default tall, and wide in a pedigree and in charts that lie sideways");
         draw_
             ->add_option("--theme", drawOptions_.theme,
                          "Colours: light (default), dark, or print for little ink")
@@ -284,7 +217,6 @@ private:
             ->check(CLI::IsMember({"A4", "A3", "letter"}))
             ->type_name("A4|A3|letter");
         addHideLiving(*draw_, drawOptions_.hiding);
-        addFamilySwitches(*draw_, drawOptions_.request);
     }
 
     void addBatch() {
@@ -301,9 +233,7 @@ private:
             ->add_flag("--unbuffered", batchOptions_.unbuffered,
                        "Answer each line before the next one is read, for a program that asks and waits")
             ->needs("--focus-from");
-        addView(*batch_, batchOptions_.request);
-        addBoxes(*batch_, batchOptions_.request, "default tall");
-        addFamilySwitches(*batch_, batchOptions_.request);
+        addViewOptions(*batch_, batchOptions_.request, "default tall");
     }
 
     void addCheck() {
@@ -322,9 +252,8 @@ private:
                 "--all", checkOptions_.all,
                 "Look at everybody's layout as well: a line of counts for each, with ids, and the totals")
             ->excludes(focus);
-        addView(*check_, checkOptions_.request);
-        addBoxes(*check_, checkOptions_.request, "default tall, and wide in a pedigree");
-        addFamilySwitches(*check_, checkOptions_.request);
+        addViewOptions(*check_, checkOptions_.request,
+                       "default tall, and wide in a pedigree and in charts that lie sideways");
     }
 
     void addJudge() {
@@ -368,7 +297,7 @@ private:
                     "The person in the middle when the page opens: an xref, a number of 'olvane people' "
                     "or words of the name; the page's own choice when not given")
                 ->type_name("WHO");
-        addViewAlone(*page_, pageOptions_.view);
+        addPageView(*page_, pageOptions_.view);
         page_
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
@@ -386,25 +315,43 @@ private:
 
     LayoutOptions completedLayoutOptions() const {
         LayoutOptions options = layoutOptions_;
-        options.json = layoutFormat_ == "json";
+        completeViewOptions(*layout_, options.request);
+        if (isEngineView(options.request.view)) return options;
+        if (!isGiven(*layout_, "--format")) options.format = LayoutFormat::json;
+        if (options.format != LayoutFormat::json) {
+            throw UsageError(
+                std::string("--format: the view ") + charts::nameOf(options.request.view) +
+                " is printed as json alone; text and json1 are of the views family and pedigree");
+        }
+        return options;
+    }
+
+    BatchOptions completedBatchOptions() const {
+        BatchOptions options = batchOptions_;
+        completeViewOptions(*batch_, options.request);
         return options;
     }
 
     DrawOptions completedDrawOptions() const {
         DrawOptions options = drawOptions_;
-        widenPedigree(*draw_, options.request);
+        completeViewOptions(*draw_, options.request);
+        widenSideways(*draw_, options.request);
         return options;
     }
 
     CheckOptions completedCheckOptions() const {
         CheckOptions options = checkOptions_;
-        widenPedigree(*check_, options.request);
+        completeViewOptions(*check_, options.request);
+        widenSideways(*check_, options.request);
         return options;
     }
 
-    // Pictures of pedigrees have wide boxes, and what is checked is the picture.
-    static void widenPedigree(const CLI::App& command, LayoutRequest& request) {
-        if (request.view == View::pedigree && command.count("--boxes") == 0) request.boxes = BoxForm::wide;
+    // Pictures that lie sideways have wide boxes, and what is checked is the picture.
+    static void widenSideways(const CLI::App& command, LayoutRequest& request) {
+        const charts::Direction direction = request.chart.direction;
+        const bool liesSideways = request.view == View::pedigree || direction == charts::Direction::left ||
+                                  direction == charts::Direction::right;
+        if (liesSideways && command.count("--boxes") == 0) request.boxes = BoxForm::wide;
     }
 
     CLI::App app_{"Family trees from GEDCOM files: lists persons, lays out families and draws them.",
@@ -418,7 +365,6 @@ private:
     CLI::App* page_ = nullptr;
     PeopleOptions peopleOptions_;
     LayoutOptions layoutOptions_;
-    std::string layoutFormat_ = "text";
     DrawOptions drawOptions_;
     BatchOptions batchOptions_;
     CheckOptions checkOptions_;

@@ -25,10 +25,13 @@ struct PeopleOptions {
     std::vector<std::string> words;
 };
 
+// The result text of a view of the engine, a picture as JSON (format 2), or the older JSON of the engine's views.
+enum class LayoutFormat : std::uint8_t { text, json, json1 };
+
 struct LayoutOptions {
     InputOptions input;
     std::string focus;
-    bool json = false;
+    LayoutFormat format = LayoutFormat::text;
     HidingOptions hiding;
     LayoutRequest request;
 };

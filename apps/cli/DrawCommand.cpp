@@ -152,6 +152,11 @@ std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::S
 
 int runDraw(const DrawOptions& options) {
     const Form form = formOf(options.output);
+    if (!isEngineView(options.request.view)) {
+        throw UsageError(
+            std::string("the view ") + charts::nameOf(options.request.view) +
+            " is not drawn, but printed as data by 'olvane layout'; family and pedigree are drawn");
+    }
     const OutputRules rules{InputFiles({options.input.file}), {endingOf(form)}};
     checkOutput(options.output, rules);
     const gedcom::GedcomData data = readFile(options.input);

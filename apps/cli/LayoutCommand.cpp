@@ -9,18 +9,29 @@
 #include <cli/FocusChoice.h>
 #include <cli/LayoutJson.h>
 #include <cli/OutputFile.h>
+#include <cli/PictureRun.h>
 
 namespace olvane::cli {
+
+namespace {
+
+std::string outputOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options) {
+    if (!isEngineView(options.request.view)) {
+        return PictureRun(data, options.request, hiddenPersons(data, options.hiding)).jsonOf(focus);
+    }
+    const std::string text = layoutText(data, focus, options.request);
+    if (options.format == LayoutFormat::text) return text + "\n";
+    return layoutJson(data, focus, options.request, readLayoutText(text),
+                      hiddenPersons(data, options.hiding)) +
+           "\n";
+}
+
+}  // namespace
 
 int runLayout(const LayoutOptions& options) {
     const gedcom::GedcomData data = readFile(options.input);
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    std::string text = layoutText(data, focus, options.request);
-    if (options.json) {
-        text = layoutJson(data, focus, options.request, readLayoutText(text),
-                          hiddenPersons(data, options.hiding));
-    }
-    writeReport(text + "\n");
+    writeReport(outputOf(data, focus, options));
     return 0;
 }
 

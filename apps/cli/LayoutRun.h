@@ -7,27 +7,35 @@
 #include <string>
 #include <vector>
 
+#include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/layouter/TreeSize.h>
 
 namespace olvane::cli {
 
-enum class View : std::uint8_t { family, pedigree };
+// Family and pedigree are the engine's own; the others are charts.
+using charts::View;
 
 // The form of the boxes: tall ones as hosts draw them, or wide ones, which keep a sideways chart low.
 enum class BoxForm : std::uint8_t { tall, wide };
 
 struct LayoutRequest {
     View view = View::family;
-    int generations = 5;  // columns of a pedigree, the focus's own included
+    int generations = 5;           // columns of a pedigree, the focus's own included
+    charts::ChartRequest chart{};  // of the other views; view, focus and sizes are filled in by PictureRun
     BoxForm boxes = BoxForm::tall;
     // Relatives that a family view leaves out, by the engine's option keys.
     std::vector<std::string> keysOff;
 };
 
+// Whether the engine makes the view, so that it has a result text.
+inline bool isEngineView(View view) {
+    return view == View::family || view == View::pedigree;
+}
+
 TreeSize sizeOf(BoxForm boxes);
 
-// The result text of one layout. Safe to call on several threads with the same data.
+// The result text of one layout, of a view of the engine. Safe to call on several threads with the same data.
 // Fails: std::length_error, with a sentence for the user, where the layout asks for more than 5 million relatives;
 //        passes on what the engine throws; an id that is no person throws std::out_of_range.
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);

@@ -28,3 +28,15 @@ export class GedcomError extends Error {
         this.name = "GedcomError";
     }
 }
+
+/** What a family refuses; nothing has changed then. */
+export class FamilyError extends Error {
+    constructor(message, { table, row, id, field }) {
+        super(message);
+        this.name = "FamilyError";
+        this.table = table;
+        this.row = row;
+        this.id = id;
+        this.field = field;
+    }
+}

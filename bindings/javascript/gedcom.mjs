@@ -70,9 +70,13 @@ function diagnosticFrom([line, severity, message, hint]) {
     return { line, severity, message, hint };
 }
 
+// Closes what nobody holds any more and nobody closed.
+const unclosed = new FinalizationRegistry(({ instance, file }) => instance.exports.gedcom_close(file));
+
 export class GedcomFile {
     #instance;
     #file;
+    #token = {};
 
     constructor(instance, file, name) {
         this.#instance = instance;
@@ -84,6 +88,7 @@ export class GedcomFile {
         this.persons = persons.map(personFrom);
         this.families = families.map(familyFrom);
         this.diagnostics = diagnostics.map(diagnosticFrom);
+        unclosed.register(this, { instance, file }, this.#token);
     }
 
     factsOfPerson(id) {
@@ -94,11 +99,11 @@ export class GedcomFile {
         return this.#told("gedcom_family_facts", id).map(factFrom);
     }
 
-    layout(focus, options = {}) {
+    layout(focus, options = undefined) {
         return this.#run(focus, options).records;
     }
 
-    layoutText(focus, options = {}) {
+    layoutText(focus, options = undefined) {
         return this.#run(focus, options).text;
     }
 
@@ -130,7 +135,9 @@ export class GedcomFile {
     }
 
     close() {
-        if (this.#file !== 0) this.#instance.exports.gedcom_close(this.#file);
+        if (this.#file === 0) return;
+        unclosed.unregister(this.#token);
+        this.#instance.exports.gedcom_close(this.#file);
         this.#file = 0;
     }
 
@@ -162,6 +169,8 @@ export class GedcomFile {
         return this.#file;
     }
 }
+
+if (Symbol.dispose) GedcomFile.prototype[Symbol.dispose] = GedcomFile.prototype.close;
 
 export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
     const { exports } = instance;

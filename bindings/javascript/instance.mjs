@@ -55,6 +55,18 @@ export class Instance {
         return instance;
     }
 
+    /** The options that the module has, and the view that they ask for; null before the first ones. */
+    #options = null;
+
+    /** Gives options to the module, unless it has the usual ones already; the number of their view. */
+    useOptions(options, numbersOf) {
+        if (options === undefined && this.#options === undefined) return 0;
+        const { view, numbers } = numbersOf(options === undefined ? {} : options);
+        this.exports.set_options(...numbers);
+        this.#options = options === undefined ? undefined : null;
+        return view;
+    }
+
     /** The host of the layout that is running, and what it threw. */
     #host = null;
     #thrown = null;

@@ -30,8 +30,7 @@ function statusOf(result, thrown) {
 /** ask(view number, focus) runs the layout and gives the module's answer; host may be null where none is asked. */
 export function runLayout(instance, host, focus, options, ask) {
     const person = focusNumber(focus);
-    const { view, numbers } = optionNumbers(options);
-    instance.exports.set_options(...numbers);
+    const view = instance.useOptions(options, optionNumbers);
     const { result, thrown } = instance.askingHost(host, () => readAnswer(instance, ask(view, person)));
     const number = statusOf(result, thrown);
     const status = STATUSES[number];

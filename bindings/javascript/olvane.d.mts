@@ -1,13 +1,18 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
+/// <reference lib="esnext.disposable" />
 
 /**
  * Family trees in JavaScript: which relatives of a person are shown, and where each box and line stands.
  *
- * A host is any object with the eight methods of Host. One call is one whole layout:
+ * A family is handed over once, as rows or columns. One call is one whole layout:
  *
  *     const olvane = await loadOlvane();
- *     for (const record of olvane.layout(host, 17)) drawBox(record.id, record.x, record.y);
+ *     const family = olvane.family({ persons: [{ id: 17 }, { id: 42 }, { id: 5, father: 17, mother: 42 }] });
+ *     for (const record of family.layout(17)) drawBox(record.id, record.x, record.y);
+ *
+ * Data that lie elsewhere are reached through a host: any object with the eight methods of Host, as the first argument
+ * of olvane.layout. It is asked many times, and so takes longer.
  *
  * Units are points; x grows right, y grows down, and (x, y) is the upper-left corner of a box. The size of a box
  * is that of the options, 55 by 80 unless told otherwise.
@@ -94,18 +99,29 @@ export interface Segment {
     readonly y2: number;
 }
 
-/** One box, and the lines that hang from it. One person may stand in several boxes, and segments may repeat. */
-export interface LayoutRecord {
-    /** Negative for an add-node: an empty box where the host knows no parent. */
+interface BoxOfALayout {
     readonly id: number;
     readonly x: number;
     readonly y: number;
     readonly hasHiddenRelatives: boolean;
-    readonly kind: "person" | "missingFather" | "missingMother";
-    /** The person whose parent is missing, for an add-node; else null. */
-    readonly child: number | null;
     readonly segments: readonly Segment[];
 }
+
+/** The box of a person. One person may stand in several boxes, and segments may repeat. */
+export interface PersonRecord extends BoxOfALayout {
+    readonly kind: "person";
+    readonly child: null;
+}
+
+/** An add-node: an empty box, of a negative id, where no parent is known. */
+export interface MissingParentRecord extends BoxOfALayout {
+    readonly kind: "missingFather" | "missingMother";
+    /** The person whose parent is missing. */
+    readonly child: number;
+}
+
+/** One box, and the lines that hang from it; kind says which. */
+export type LayoutRecord = PersonRecord | MissingParentRecord;
 
 /** A layout that did not come to its end. text and records are what was laid out before, often nothing. */
 export class LayoutError extends Error {
@@ -315,7 +331,8 @@ export interface ParentFamily {
     readonly pedigree: "notGiven" | "birth" | "adopted" | "foster" | "sealing" | "other";
 }
 
-export interface Family {
+/** A family of a GEDCOM file. */
+export interface GedcomFamily {
     readonly id: number;
     readonly husband: number;
     readonly wife: number;
@@ -338,7 +355,7 @@ export interface Diagnostic {
 export class GedcomFile {
     /** persons[0] is person 1. */
     readonly persons: readonly Person[];
-    readonly families: readonly Family[];
+    readonly families: readonly GedcomFamily[];
     readonly diagnostics: readonly Diagnostic[];
     readonly name: string;
     /** How the bytes were read: "UTF-8", "UTF-16LE", "ANSEL", "windows-1252" and so on. */
@@ -353,17 +370,162 @@ export class GedcomFile {
     layoutText(focus: number, options?: Options): string;
     /** The picture of a view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
     picture(focus: number, options?: PictureOptions): Picture;
-    /** Gives the memory back; nothing can be asked afterwards but what was read out before. */
+    /**
+     * Releases the memory; nothing can be asked afterwards but what was read out before. A file that nobody holds any more
+     * is closed in time.
+     */
     close(): void;
+    [Symbol.dispose](): void;
+}
+
+/** Whole numbers of 1 to 2147483647; 0, null and undefined are nobody. */
+type Id = number | bigint | null | undefined;
+type Text = string | number | Date | null | undefined;
+export type NameKind = "full" | "given" | "surname" | "prefix" | "suffix" | "nickname" | "married" | "other";
+export type FamilyState = "married" | "divorced" | "unmarried" | "unknown";
+export type ChildKind = "birth" | "adopted" | "foster" | "step" | "sealing" | "unknown";
+type NumbersOf = Int8Array | Uint8Array | Int32Array | Uint32Array | BigInt64Array | Float64Array;
+
+/** Rows as objects; or columns: for each field an array of its values, or a typed array where they are numbers. */
+export type FamilyTable<Row> =
+    | Iterable<Row>
+    | { readonly [Field in keyof Row]?: readonly Row[Field][] | NumbersOf };
+
+/** Columns beside these become names, by their kind, or fields for labels. */
+export interface PersonRow {
+    readonly id: Id;
+    readonly father?: Id;
+    readonly mother?: Id;
+    /** 0, "m" or "male"; 1, "f" or "female"; 2 or "unknown", which is the default. */
+    readonly sex?: number | string | null | undefined;
+    readonly dead?: boolean | number | null | undefined;
+    /** In a form that sorts, as "1809-02-12" does. */
+    readonly birth?: Text;
+    readonly death?: Text;
+    /** For people to read; the sorting form by default. */
+    readonly birthWritten?: Text;
+    readonly deathWritten?: Text;
+    readonly [column: string]: unknown;
+}
+
+export interface FamilyRow {
+    /** From 1 in the order of the rows, where no row has one. */
+    readonly number?: Id;
+    readonly partner0?: Id;
+    readonly partner1?: Id;
+    readonly state?: FamilyState | number | null | undefined;
+    readonly marriage?: Text;
+    readonly marriageWritten?: Text;
+    readonly marriagePlace?: Text;
+}
+
+export interface FamilyRows {
+    readonly persons?: FamilyTable<PersonRow> | undefined;
+    /** One row for each of the two lists that a couple stands in. Not given, the lists follow from the families. */
+    readonly spouses?: FamilyTable<{ person: Id; spouse: Id; preferred?: boolean | number | null }> | undefined;
+    /** Not given, the lists follow from the families, and from father and mother. */
+    readonly children?: FamilyTable<{ parent: Id; child: Id }> | undefined;
+    readonly families?: FamilyTable<FamilyRow> | undefined;
+    readonly familyChildren?: FamilyTable<{ family: Id; child: Id; kind?: ChildKind | number }> | undefined;
+    readonly names?: FamilyTable<{ person: Id; kind?: NameKind | number; text: Text }> | undefined;
+    readonly fields?: FamilyTable<{ person: Id; key: string; text: Text }> | undefined;
+}
+
+/** A person as the table has it. Relatives are ids, and 0 is nobody. */
+export interface FamilyPerson {
+    readonly id: number;
+    readonly father: number;
+    readonly mother: number;
+    readonly sex: "male" | "female" | "unknown";
+    readonly dead: boolean;
+    readonly birth: string;
+    readonly death: string;
+    readonly birthWritten: string;
+    readonly deathWritten: string;
+    readonly spouses: readonly number[];
+    readonly preferred: number;
+    readonly children: readonly number[];
+    readonly names: readonly { readonly kind: NameKind; readonly text: string }[];
+    readonly fields: { readonly [key: string]: string };
+}
+
+export interface StoredFamily {
+    readonly number: number;
+    readonly partner0: number;
+    readonly partner1: number;
+    readonly state: FamilyState;
+    readonly marriage: string;
+    readonly marriageWritten: string;
+    readonly marriagePlace: string;
+    readonly children: readonly { readonly child: number; readonly kind: ChildKind }[];
+}
+
+interface NewFamily extends FamilyRow {
+    readonly number: Id;
+    readonly children?: Iterable<Id | { readonly child: Id; readonly kind?: ChildKind | number }>;
+}
+
+/** What a family refuses: nothing has changed then. */
+export class FamilyError extends Error {
+    /** "persons", "spouses", "children", "families", "family children", "names" or "fields". */
+    readonly table: string;
+    /** From 0; null for an edit and for a whole column. */
+    readonly row: number | null;
+    /** The person or the family of an edit; else null. */
+    readonly id: number | null;
+    readonly field: string;
+}
+
+/**
+ * A family that the module holds, made by olvane.family. What is wrong is refused with FamilyError before anything
+ * changes. Memory outside of JavaScript is held until close, or until nobody holds the family any more.
+ */
+export class Family {
+    private constructor();
+    readonly size: number;
+    readonly memoryBytes: number;
+    /** In the order in which they were added. */
+    readonly ids: readonly number[];
+    readonly familyNumbers: readonly number[];
+    has(person: number): boolean;
+    /** Throws RangeError for somebody who is not there. */
+    person(person: number): FamilyPerson;
+    family(number: number): StoredFamily;
+    /** Parents get a new person at the end of their children. */
+    addPerson(row: PersonRow): void;
+    /** In place of the person of that id; a field that is not given gets its default. */
+    setPerson(row: PersonRow): void;
+    /** With everything that names the person. */
+    removePerson(person: number): void;
+    /** The list and nothing else; preferred is one of them, or 0. */
+    setSpouses(person: number, spouses: Iterable<number>, preferred?: number): void;
+    setChildren(person: number, children: Iterable<number>): void;
+    setNames(person: number, names: Iterable<{ readonly kind?: NameKind | number; readonly text: string }>): void;
+    /** An empty text removes the field. */
+    setField(person: number, key: string, text: string): void;
+    /** Partners and children enter each other's lists where they are missing. */
+    addFamily(row: NewFamily): void;
+    setFamily(row: NewFamily): void;
+    /** Partners whom no other family joins are no longer each other's spouses. */
+    removeFamily(number: number): void;
+    /** For undo: made at once, whatever the size, and changed on its own. */
+    copy(): Family;
+    layout(focus: number, options?: Options): LayoutRecord[];
+    layoutText(focus: number, options?: Options): string;
+    /** Releases the memory; nothing can be asked afterwards. */
+    close(): void;
+    [Symbol.dispose](): void;
 }
 
 export class Olvane {
     /** "MAJOR.MINOR.PATCH". */
     readonly version: string;
+    /** Takes over a family: none of the rows is looked at again. Throws FamilyError. */
+    family(rows?: FamilyRows): Family;
     /** One record for each box, in the order of the walk. Throws LayoutError; TypeError and RangeError as Options say. */
-    layout(host: Host, focus: number, options?: Options): LayoutRecord[];
+    layout(host: Host | Family, focus: number, options?: Options): LayoutRecord[];
     /** The engine's own line of text. Throws as layout does. */
-    layoutText(host: Host, focus: number, options?: Options): string;
+    layoutText(host: Host | Family, focus: number, options?: Options): string;
     /**
      * Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Where the file's own word on its
      * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.

@@ -3,11 +3,13 @@
 
 // What a JavaScript host loads; olvane.d.mts tells what everything means.
 
+import { Family } from "./family.mjs";
 import { readGedcom } from "./gedcom.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 
-export { GedcomError, HostError, LayoutError } from "./errors.mjs";
+export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
+export { Family } from "./family.mjs";
 export { GedcomFile } from "./gedcom.mjs";
 export { PERSON_NOT_FOUND, Shown } from "./values.mjs";
 
@@ -19,11 +21,17 @@ export class Olvane {
         this.version = instance.text(instance.exports.version());
     }
 
-    layout(host, focus, options = {}) {
+    family(rows = {}) {
+        return new Family(this.#instance, rows);
+    }
+
+    layout(host, focus, options = undefined) {
+        if (host instanceof Family) return host.layout(focus, options);
         return this.#run(host, focus, options).records;
     }
 
-    layoutText(host, focus, options = {}) {
+    layoutText(host, focus, options = undefined) {
+        if (host instanceof Family) return host.layoutText(focus, options);
         return this.#run(host, focus, options).text;
     }
 

@@ -25,34 +25,40 @@ export const STATUSES = [
     "layoutFailed",
     "outOfMemory",
     "nestedCall",
+    "refused",
 ];
+
+export const SEXES = ["male", "female", "unknown"];
+export const NAME_KINDS = ["full", "given", "surname", "prefix", "suffix", "nickname", "married", "other"];
+export const FAMILY_STATES = ["married", "divorced", "unmarried", "unknown"];
+export const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 
 const KINDS = ["person", "missingFather", "missingMother"];
 
 const NUMBERS_OF_A_RECORD = 7;
 const NUMBERS_OF_A_SEGMENT = 4;
 
-function segmentAt(numbers, at) {
-    return { x1: numbers[at], y1: numbers[at + 1], x2: numbers[at + 2], y2: numbers[at + 3] };
-}
-
 /** The records that a run of numbers tells, in its order. */
 export function recordsFrom(numbers) {
     const records = [];
     for (let at = 0; at < numbers.length; ) {
-        const [id, x, y, flag, kind, child, count] = numbers.subarray(at, at + NUMBERS_OF_A_RECORD);
-        at += NUMBERS_OF_A_RECORD;
-        const segments = [];
-        for (let i = 0; i < count; ++i, at += NUMBERS_OF_A_SEGMENT) segments.push(segmentAt(numbers, at));
+        const kind = numbers[at + 4];
+        const count = numbers[at + 6];
+        const segments = new Array(count);
+        let next = at + NUMBERS_OF_A_RECORD;
+        for (let i = 0; i < count; ++i, next += NUMBERS_OF_A_SEGMENT) {
+            segments[i] = { x1: numbers[next], y1: numbers[next + 1], x2: numbers[next + 2], y2: numbers[next + 3] };
+        }
         records.push({
-            id,
-            x,
-            y,
-            hasHiddenRelatives: flag !== 0,
+            id: numbers[at],
+            x: numbers[at + 1],
+            y: numbers[at + 2],
+            hasHiddenRelatives: numbers[at + 3] !== 0,
             kind: KINDS[kind],
-            child: kind === 0 ? null : child,
+            child: kind === 0 ? null : numbers[at + 5],
             segments,
         });
+        at = next;
     }
     return records;
 }

@@ -127,6 +127,9 @@ class Outputs:
         name = f"of {focus}"
         layout = run(self.command, "layout", self.path, "--focus", focus, "--format", "json", *self.hiding)
         self.texts["json " + name] = layout.decode()
+        for view in ("hourglass", "relatives"):
+            chart = run(self.command, "layout", self.path, "--focus", focus, "--view", view, *self.hiding)
+            self.texts[view + " " + name] = chart.decode()
         for ending in (".svg", ".pdf", ".png"):
             picture = self.folder / ("out" + ending)
             words = [self.command, "draw", self.path, "--focus", focus, "-o", str(picture), *self.hiding]

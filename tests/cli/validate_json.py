@@ -10,7 +10,7 @@ import json
 import sys
 
 TYPES = {"object": dict, "array": list, "string": str, "integer": int, "boolean": bool,
-         "number": (int, float)}
+         "number": (int, float), "null": type(None)}
 
 
 def complaints(value, schema, root, place):
@@ -18,6 +18,11 @@ def complaints(value, schema, root, place):
         name = schema["$ref"].removeprefix("#/$defs/")
         yield from complaints(value, root["$defs"][name], root, place)
         return
+    for several, fewest, most in (("anyOf", 1, None), ("oneOf", 1, 1)):
+        if several in schema:
+            fitting = sum(not list(complaints(value, one, root, place)) for one in schema[several])
+            if fitting < fewest or (most is not None and fitting > most):
+                yield f"{place}: fits {fitting} of {several}"
     if "const" in schema and value != schema["const"]:
         yield f"{place}: not {schema['const']}"
     if "enum" in schema and value not in schema["enum"]:
@@ -38,6 +43,8 @@ def complaints(value, schema, root, place):
             elif schema.get("additionalProperties") is False:
                 yield f"{place}: has {name}"
     if isinstance(value, list):
+        if not schema.get("minItems", 0) <= len(value) <= schema.get("maxItems", len(value)):
+            yield f"{place}: {len(value)} entries"
         for i, entry in enumerate(value):
             yield from complaints(entry, schema["items"], root, f"{place}[{i}]")
 

@@ -4,7 +4,7 @@
 // Never runs: a program in TypeScript must be able to say all this, and must not be able to say what is expected to
 // be an error.
 
-import { GedcomError, HostError, LayoutError, loadOlvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
+import { FamilyError, GedcomError, HostError, LayoutError, loadOlvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
 import type { Host, LayoutRecord, Options } from "../../bindings/javascript/olvane.mjs";
 
 class Family implements Host {
@@ -50,6 +50,32 @@ try {
     if (error instanceof GedcomError) texts.push(error.message);
 }
 
+const table = olvane.family({
+    persons: [{ id: 1, sex: "m", occupation: "smith" }, { id: 2n, birth: 1880 }, { id: 3, father: 1, mother: null }],
+    families: { number: [1], partner0: new Int32Array([1]), state: ["married"] },
+    spouses: [{ person: 1, spouse: 2, preferred: true }],
+});
+try {
+    table.addPerson({ id: 4, mother: 2 });
+    table.addFamily({ number: 2, partner0: 1, children: [3, { child: 4, kind: "adopted" }] });
+    texts.push(table.person(3).birth, table.family(2).state, olvane.layoutText(table, 1));
+} catch (error) {
+    if (error instanceof FamilyError) texts.push(error.table, error.field, String(error.row));
+}
+// What a record is decides whether it has a child.
+for (const record of table.copy().layout(1)) {
+    if (record.kind === "person") texts.push(String(record.id));
+    else texts.push(record.child.toFixed());
+}
+{
+    using closed = olvane.family();
+    texts.push(String(closed.size));
+}
+
+// @ts-expect-error: a family is made by olvane
+new (await import("../../bindings/javascript/olvane.mjs")).Family();
+// @ts-expect-error: a kind of child is one of six
+table.addFamily({ number: 3, children: [{ child: 1, kind: "own" }] });
 // @ts-expect-error: a record is not the host's to change
 records[0]!.x = 1;
 // @ts-expect-error: there are two views

@@ -11,19 +11,21 @@ _olvane() {
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
     local commands="people layout draw batch check judge page"
-    local view="--view --generations --boxes"
+    local view="--view --generations --boxes --up --down --direction --siblings --no-spouses --compact"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"
     local encodings="UTF-8 UTF-16LE UTF-16BE ANSEL windows-1250 windows-1251 windows-1252 windows-1253 ISO-8859-2 \
         ISO-8859-15 KOI8-R GB18030 Big5 Shift_JIS EUC-JP EUC-KR IBM437 IBM850"
     case $prev in
-        --view) COMPREPLY=($(compgen -W "family pedigree" -- "$cur")); return ;;
+        --view) COMPREPLY=($(compgen -W "family pedigree near ancestors descendants hourglass relatives" -- "$cur")); return ;;
+        --direction) COMPREPLY=($(compgen -W "down up left right" -- "$cur")); return ;;
+        --up | --down) COMPREPLY=($(compgen -W "0 1 2 3 4 5 6 7 8" -- "$cur")); return ;;
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
         --boxes) COMPREPLY=($(compgen -W "tall wide" -- "$cur")); return ;;
         --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
         --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
-        --format) COMPREPLY=($(compgen -W "text tsv json" -- "$cur")); return ;;
+        --format) COMPREPLY=($(compgen -W "text tsv json json1" -- "$cur")); return ;;
         --encoding) COMPREPLY=($(compgen -W "$encodings" -- "$cur")); return ;;
         --focus | --title | --year) return ;;
         -o | --output | --focus-from | --family) COMPREPLY=($(compgen -f -- "$cur")); return ;;

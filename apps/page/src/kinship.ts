@@ -7,7 +7,7 @@
 // ways by blood are found in one pass, nearest first; those over one couple or two are laid on top. Which words a
 // way has is the message table's business.
 
-import type { Family, Person, Sex } from "olvane";
+import type { GedcomFamily as Family, Person, Sex } from "olvane";
 import { BloodSearch, type Side } from "./kinship/BloodSearch";
 import { type LinkKind, type Links, linksOf } from "./kinship/Links";
 import type { KinshipWords, Messages, Noun } from "./messages";

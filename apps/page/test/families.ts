@@ -9,7 +9,7 @@
 //
 // A partner on the left is male and one on the right female, unless a mark says else: .m .f .x
 
-import type { Family, GedcomDate, ParentFamily, Person, Sex } from "olvane";
+import type { GedcomFamily as Family, GedcomDate, ParentFamily, Person, Sex } from "olvane";
 
 type Open<T> = { -readonly [Key in keyof T]: T[Key] extends readonly (infer E)[] ? E[] : T[Key] };
 

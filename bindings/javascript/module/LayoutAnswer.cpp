@@ -86,7 +86,7 @@ OLVANE_EXPORT("answer_status") int answerStatus(const LayoutAnswer* answer) {
 }
 
 OLVANE_EXPORT("answer_text") const char* answerText(const LayoutAnswer* answer) {
-    const char* text = "";
+    const char* text = answer->text.c_str();
     if (answer->layout) olvane_layout_text(answer->layout.get(), &text, nullptr);
     return text;
 }

@@ -5,6 +5,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include <olvane.h>
@@ -23,6 +24,7 @@ struct LayoutAnswer {
     olvane_status status = OLVANE_OUT_OF_MEMORY;
     std::unique_ptr<olvane_layout, FreeLayout> layout;
     std::vector<std::int32_t> numbers;
+    std::string text;  // of a layout that is no olvane_layout
 };
 
 enum class View : int { family = 0, pedigree = 1 };

@@ -4,7 +4,7 @@
 // Who is whose parent, child and partner, from both sides of a file at once: a family that names a child counts,
 // and so does a person who names a family.
 
-import type { Family, Person, Sex } from "olvane";
+import type { GedcomFamily as Family, Person, Sex } from "olvane";
 
 /** How a child belongs to a parent. A seal or a link of an unknown kind counts as birth. */
 export type LinkKind = "birth" | "adopted" | "foster";

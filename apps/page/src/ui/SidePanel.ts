@@ -5,7 +5,7 @@
 // relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
 // drawn up.
 
-import type { Fact, Family, Person } from "olvane";
+import type { Fact, GedcomFamily as Family, Person } from "olvane";
 import { factLabel, type Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { dateText, nameOf, yearsOf } from "../messages/names";

@@ -3,7 +3,7 @@
 
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
-import type { Family, GedcomFile, Person } from "olvane";
+import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
 import { allKinships, type Kinship } from "../kinship";
 import { PersonIndex } from "../search";
 import { Picture } from "./Picture";

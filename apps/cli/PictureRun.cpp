@@ -1,0 +1,93 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// From a file to a picture, and what the file says of those in it.
+
+#include <cli/PictureRun.h>
+
+#include <algorithm>
+#include <span>
+#include <utility>
+
+#include <olvane/charts/Charts.h>
+#include <olvane/source/GedcomKin.h>
+
+#include <cli/PersonJson.h>
+
+namespace olvane::cli {
+
+namespace {
+
+constexpr const char* kLivingJson = "{\"living\": true}";
+
+charts::ChartSizes sizesOf(BoxForm boxes) {
+    const TreeSize size = sizeOf(boxes);
+    charts::ChartSizes sizes;
+    sizes.boxWidth = size.nodeWidth;
+    sizes.boxHeight = size.nodeHeight;
+    if (boxes == BoxForm::wide) sizes.gapY = 45;  // room for names of children over one another
+    return sizes;
+}
+
+}  // namespace
+
+PictureRun::PictureRun(const gedcom::GedcomData& data, LayoutRequest request, std::vector<bool> hidden)
+    : data_(data),
+      request_(std::move(request)),
+      hidden_(std::move(hidden)),
+      graph_(gedcom::kinGraphOf(data)) {
+    request_.chart.view = request_.view;
+    request_.chart.sizes = sizesOf(request_.boxes);
+}
+
+bool PictureRun::isHidden(std::int64_t id) const {
+    return id > 0 && static_cast<std::size_t>(id) <= hidden_.size() &&
+           hidden_[static_cast<std::size_t>(id - 1)];
+}
+
+picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
+    charts::ChartRequest chart = request_.chart;
+    chart.focus = graph_.placeOf(focus);
+    picture::Picture picture = charts::chartOf(graph_, chart);
+    if (!hidden_.empty()) hideIn(picture);
+    return picture;
+}
+
+void PictureRun::hideIn(picture::Picture& picture) const {
+    const auto isHiddenBox = [&](picture::Index box) {
+        return isHidden(picture.boxes[static_cast<std::size_t>(box)].id);
+    };
+    for (picture::Family& family : picture.families) {
+        const auto parents = picture.parents(family);
+        const auto children = picture.children(family);
+        for (std::size_t i = 0; i < children.size(); ++i) {
+            if (isHiddenBox(children[i])) {
+                picture.childKinds[family.firstMember + family.parentCount + i] = kin::ChildKind::unknown;
+            }
+        }
+        if (std::none_of(parents.begin(), parents.end(), isHiddenBox)) continue;
+        family.number = 0;
+        family.style = kin::UnionState::unknown;
+    }
+}
+
+picture::PictureFacts PictureRun::facts() const {
+    picture::PictureFacts facts;
+    facts.person = [this](std::int64_t id) {
+        if (isHidden(id)) return std::string(kLivingJson);
+        return personJson(data_, static_cast<gedcom::PersonId>(id))
+            .dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);
+    };
+    facts.familyXref = [this](std::uint32_t number) { return std::string(data_.family(number).xref); };
+    facts.familyLabel = [this](std::uint32_t number) {
+        const gedcom::GedcomDate& marriage = data_.family(number).marriage;
+        return marriage.isGiven() ? gedcom::displayYear(marriage) : std::string();
+    };
+    return facts;
+}
+
+std::string PictureRun::jsonOf(gedcom::PersonId focus) const {
+    return picture::pictureJson(pictureOf(focus), facts());
+}
+
+}  // namespace olvane::cli

@@ -1,0 +1,47 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <olvane/gedcom/GedcomData.h>
+#include <olvane/kin/KinGraph.h>
+#include <olvane/picture/Picture.h>
+#include <olvane/picture/PictureJson.h>
+
+#include <cli/LayoutRun.h>
+
+namespace olvane::cli {
+
+// Pictures of one file in one view: of any that is made by charts.
+//
+// Holds: refers to the data, which must outlive it. Safe to ask on several threads.
+// Fails: what charts throw passes on.
+class PictureRun {
+public:
+    // hidden: whom nothing is told of, an entry for each person; empty for nobody.
+    PictureRun(const gedcom::GedcomData& data, LayoutRequest request, std::vector<bool> hidden);
+
+    // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, neither number
+    // nor state of a family with a hidden partner or without a partner who is known.
+    picture::Picture pictureOf(gedcom::PersonId focus) const;
+
+    // What the file adds in JSON; of a hidden person {"living": true}. Valid as long as this lives.
+    picture::PictureFacts facts() const;
+
+    // As olvane layout prints it.
+    std::string jsonOf(gedcom::PersonId focus) const;
+
+private:
+    bool isHidden(std::int64_t id) const;
+    void hideIn(picture::Picture& picture) const;
+
+    const gedcom::GedcomData& data_;
+    LayoutRequest request_;
+    std::vector<bool> hidden_;
+    kin::KinGraph graph_;
+};
+
+}  // namespace olvane::cli

@@ -1,0 +1,194 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Each option knows the views that it changes; what would change nothing is refused, since it was meant to.
+
+#include <cli/ViewOptions.h>
+
+#include <algorithm>
+#include <map>
+#include <span>
+#include <vector>
+
+#include <CLI/CLI.hpp>
+
+#include <olvane/family/FamilyOptions.h>
+
+#include <cli/UsageError.h>
+
+namespace olvane::cli {
+
+namespace {
+
+constexpr int kMostPedigreeGenerations = 12;
+
+struct FamilySwitch {
+    const char* name;
+    const std::string& key;
+    const char* help;
+};
+
+const std::vector<FamilySwitch>& familySwitches() {
+    using namespace SharedTreeViewer;
+    static const std::vector<FamilySwitch> kSwitches = {
+        {"--no-aunts-uncles", kTreeViewFamShowAuntsUnclesKey,
+         "Leave out siblings of the parents, and so cousins too"},
+        {"--no-cousins", kTreeViewFamShowCousinsKey, "Leave out children of the parents' siblings"},
+        {"--no-siblings", kTreeViewFamShowSiblingsKey, "Leave out siblings and half siblings"},
+        {"--no-sibling-spouses", kTreeViewFamShowSiblingSpousesKey, "Leave out spouses of the siblings"},
+        {"--no-nieces-nephews", kTreeViewFamShowNeicesNephewsKey, "Leave out children of the siblings"},
+        {"--no-grandchildren", kTreeViewFamShowGrandchildrenKey, "Leave out grandchildren"},
+        {"--no-great-grandparents", kTreeViewFamShowGreatGrandparentsKey, "Leave out great-grandparents"},
+        {"--no-spouses-of-children", kTreeViewFamShowSpousesOfChildrenKey,
+         "Leave out spouses of the children"},
+    };
+    return kSwitches;
+}
+
+const std::map<std::string, View>& views() {
+    static const std::map<std::string, View> kViews = {
+        {"family", View::family},       {"pedigree", View::pedigree},       {"near", View::near},
+        {"ancestors", View::ancestors}, {"descendants", View::descendants}, {"hourglass", View::hourglass},
+        {"relatives", View::relatives},
+    };
+    return kViews;
+}
+
+// An option, and the views that it changes.
+struct OptionUse {
+    const char* option;
+    std::vector<View> views;
+};
+
+const std::vector<OptionUse>& optionUses() {
+    static const std::vector<View> kTrees = {View::ancestors, View::descendants, View::hourglass,
+                                             View::relatives};
+    static const std::vector<OptionUse> kUses = {
+        {"--generations",
+         {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives}},
+        {"--up", {View::ancestors, View::hourglass, View::relatives}},
+        {"--down", {View::descendants, View::hourglass, View::relatives}},
+        {"--direction", kTrees},
+        {"--siblings", {View::ancestors, View::hourglass}},
+        {"--no-spouses", {View::descendants, View::hourglass, View::relatives}},
+        {"--compact", kTrees},
+    };
+    return kUses;
+}
+
+bool isGiven(const CLI::App& command, const char* option) {
+    return command.get_option_no_throw(option) != nullptr && command.count(option) > 0;
+}
+
+void addView(CLI::App& command, LayoutRequest& request) {
+    command
+        .add_option(
+            "--view", request.view,
+            "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
+            "the relatives of family, placed anew without overlaps; ancestors, descendants, hourglass (both) "
+            "and relatives (the descendants of every ancestor): any number of generations, each person once")
+        ->transform(CLI::CheckedTransformer(views()))
+        ->type_name("VIEW");
+    command
+        .add_option("--generations", request.generations,
+                    "Generations, the focus's own included. Of a pedigree 1 to 12, default 5: N generations "
+                    "are up to "
+                    "2^N - 1 boxes. Of other views, up and down, 2 and more; 0, the default, is all of them")
+        ->check(CLI::NonNegativeNumber)
+        ->type_name("N");
+}
+
+void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
+    static const std::map<std::string, charts::Direction> kDirections = {{"down", charts::Direction::down},
+                                                                         {"up", charts::Direction::up},
+                                                                         {"left", charts::Direction::left},
+                                                                         {"right", charts::Direction::right}};
+    const std::string group = "Views to any depth";
+    command.add_option("--up", chart.up, "Generations above the focus; 0, the default, is all")
+        ->check(CLI::NonNegativeNumber)
+        ->type_name("N")
+        ->group(group);
+    command.add_option("--down", chart.down, "Generations below the focus; 0, the default, is all")
+        ->check(CLI::NonNegativeNumber)
+        ->type_name("N")
+        ->group(group);
+    command
+        .add_option("--direction", chart.direction,
+                    "Where later generations stand: down (default), up, left or right of earlier ones")
+        ->transform(CLI::CheckedTransformer(kDirections))
+        ->type_name("down|up|left|right")
+        ->group(group);
+    command.add_flag("--siblings", chart.siblings, "Show siblings of the focus and of its ancestors")
+        ->group(group);
+    command.add_flag("!--no-spouses", chart.spouses, "Leave out spouses of descendants")->group(group);
+    command.add_flag("--compact", chart.compact, "Pack generations tighter where the boxes allow it")
+        ->group(group);
+}
+
+void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
+    for (const FamilySwitch& option : familySwitches()) {
+        const std::string& key = option.key;
+        command
+            .add_flag_callback(
+                option.name, [&request, &key] { request.keysOff.push_back(key); }, option.help)
+            ->group("Family view");
+    }
+}
+
+void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defaults) {
+    static const std::map<std::string, BoxForm> kForms = {{"tall", BoxForm::tall}, {"wide", BoxForm::wide}};
+    command
+        .add_option("--boxes", request.boxes,
+                    "Form of the boxes: tall (55 by 80) or wide (105 by 40); " + defaults)
+        ->transform(CLI::CheckedTransformer(kForms))
+        ->type_name("tall|wide");
+}
+
+void refuseIdle(const CLI::App& command, const char* option, std::span<const View> views, View view) {
+    if (!isGiven(command, option) || std::find(views.begin(), views.end(), view) != views.end()) return;
+    std::string text =
+        std::string(option) + " changes nothing in the view " + charts::nameOf(view) + ", but in";
+    const char* separator = " ";
+    for (const View other : views) {
+        text.append(separator).append(charts::nameOf(other));
+        separator = ", ";
+    }
+    throw UsageError(text);
+}
+
+void refuseIdleOptions(const CLI::App& command, View view) {
+    constexpr View kFamilyAlone[] = {View::family};
+    for (const OptionUse& use : optionUses()) refuseIdle(command, use.option, use.views, view);
+    for (const FamilySwitch& option : familySwitches()) refuseIdle(command, option.name, kFamilyAlone, view);
+}
+
+// Counted with the focus's own in --generations, and from the focus on in a chart.
+void applyGenerations(const CLI::App& command, LayoutRequest& request) {
+    if (!isGiven(command, "--generations")) return;
+    if (request.view == View::pedigree) {
+        if (request.generations >= 1 && request.generations <= kMostPedigreeGenerations) return;
+        throw UsageError("--generations: a pedigree has 1 to " + std::to_string(kMostPedigreeGenerations) +
+                         " generations");
+    }
+    if (request.generations == 1)
+        throw UsageError("--generations: 1 would be the focus alone; 2 and more, or 0 for all");
+    const int others = std::max(request.generations - 1, 0);
+    if (!isGiven(command, "--up")) request.chart.up = others;
+    if (!isGiven(command, "--down")) request.chart.down = others;
+}
+
+}  // namespace
+
+void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string& boxDefaults) {
+    addView(command, request);
+    addBoxes(command, request, boxDefaults);
+    addChartOptions(command, request.chart);
+    addFamilySwitches(command, request);
+}
+
+void completeViewOptions(const CLI::App& command, LayoutRequest& request) {
+    refuseIdleOptions(command, request.view);
+    applyGenerations(command, request);
+}
+
+}  // namespace olvane::cli
