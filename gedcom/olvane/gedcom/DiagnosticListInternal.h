@@ -30,7 +30,7 @@ public:
     std::vector<Diagnostic> take();
 
 private:
-    static constexpr std::size_t kKinds = static_cast<std::size_t>(DiagnosticKind::wrongSlot) + 1;
+    static constexpr std::size_t kKinds = static_cast<std::size_t>(DiagnosticKind::ambiguousDate) + 1;
 
     struct Tally {
         std::size_t seen = 0;

@@ -5,7 +5,9 @@
 
 #include <olvane/gedcom/GedcomData.h>
 
+#include <algorithm>
 #include <array>
+#include <limits>
 #include <stdexcept>
 #include <utility>
 
@@ -40,13 +42,13 @@ bool endsUnspaced(std::string_view text) {
 }
 
 // The value with a space for each slash, but none between characters that are written without, and no two in
-// a row.
-std::string withoutSlashes(std::string_view written) {
+// a row. Ends once the text is longer than so many bytes.
+std::string withoutSlashes(std::string_view written, std::size_t mostBytes) {
     std::string text;
-    text.reserve(written.size());
+    text.reserve(std::min(written.size(), mostBytes));
     bool space = false;
     bool slash = false;
-    for (std::size_t at = 0; at < written.size(); ++at) {
+    for (std::size_t at = 0; at < written.size() && text.size() <= mostBytes; ++at) {
         if (written[at] == ' ' || written[at] == '/') {
             space = space || written[at] == ' ';
             slash = slash || written[at] == '/';
@@ -60,17 +62,34 @@ std::string withoutSlashes(std::string_view written) {
     return text;
 }
 
+// A piece that was cut may end within a character.
+std::string cutToBytes(std::string text, std::size_t mostBytes) {
+    if (text.size() > mostBytes) text.resize(mostBytes);
+    std::size_t start = text.size();
+    while (start > 0 && (static_cast<unsigned char>(text[start - 1]) & 0xC0) == 0x80) --start;
+    if (start > 0 && static_cast<unsigned char>(text[start - 1]) >= 0xC0 &&
+        utf8CharacterLength(std::string_view(text).substr(start - 1)) == 0) {
+        text.resize(start - 1);
+    }
+    return text;
+}
+
 }  // namespace
 
 std::string displayName(const PersonName& name) {
-    std::string text = withoutSlashes(name.written);
-    if (!text.empty()) return text;
+    return displayName(name, std::numeric_limits<std::size_t>::max());
+}
+
+std::string displayName(const PersonName& name, std::size_t mostBytes) {
+    std::string text = withoutSlashes(name.written, mostBytes);
+    if (!text.empty()) return cutToBytes(std::move(text), mostBytes);
     for (const std::string_view piece : {name.prefix, name.given, name.surname, name.suffix}) {
-        if (piece.empty()) continue;
+        if (piece.empty() || text.size() > mostBytes) continue;
         if (!text.empty()) text += ' ';
-        text += piece;
+        text += piece.substr(0, std::min(piece.size(), mostBytes));
     }
-    return text.empty() ? std::string(name.nickname) : text;
+    if (text.empty()) text = name.nickname.substr(0, std::min(name.nickname.size(), mostBytes));
+    return cutToBytes(std::move(text), mostBytes);
 }
 
 GedcomData::GedcomData(GedcomTables tables) : tables_(std::move(tables)) {}

@@ -15,34 +15,12 @@
 #include <optional>
 
 #include <olvane/gedcom/CalendarDaysInternal.h>
+#include <olvane/gedcom/DateWordsInternal.h>
 
 namespace olvane::gedcom {
 namespace {
 
 constexpr int kLastYear = 9999;
-constexpr std::size_t kLongestWord = 16;
-
-// A word in capitals; words that are longer than any known one are empty.
-class Word {
-public:
-    explicit Word(std::string_view raw) {
-        if (raw.size() > kLongestWord) return;
-        for (const char c : raw)
-            letters_[length_++] = c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
-    }
-    std::string_view text() const { return {letters_.data(), length_}; }
-    // Without the point of an abbreviation.
-    std::string_view stem() const {
-        return length_ > 0 && letters_[length_ - 1] == '.' ? text().substr(0, length_ - 1) : text();
-    }
-    bool isOneOf(std::initializer_list<std::string_view> choices) const {
-        return std::find(choices.begin(), choices.end(), stem()) != choices.end();
-    }
-
-private:
-    std::array<char, kLongestWord> letters_{};
-    std::size_t length_ = 0;
-};
 
 bool isSpace(char c) {
     return c == ' ' || c == '\t' || c == '\n' || c == '\r';
@@ -52,7 +30,16 @@ bool isDigit(char c) {
     return c >= '0' && c <= '9';
 }
 
-// Words of a value from left to right.
+bool isWordLetter(char c) {
+    return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || static_cast<unsigned char>(c) >= 0x80;
+}
+
+bool isJoint(char c) {
+    return c == '.' || c == '-' || c == '/';
+}
+
+// Words of a value from left to right. A word ends at a space, and between letters and digits: "12MAY1900", "c.1590",
+// "972B.C.", "24-JAN-1915".
 class Words {
 public:
     explicit Words(std::string_view text) : rest_(text) { findWord(); }
@@ -68,7 +55,7 @@ public:
     }
     // No choice begins with a digit.
     bool skipIf(std::initializer_list<std::string_view> choices) {
-        if (isDigit(front()) || !Word(peek()).isOneOf(choices)) return false;
+        if (isDigit(front()) || !DateWord(peek()).isOneOf(choices)) return false;
         skip();
         return true;
     }
@@ -77,7 +64,16 @@ private:
     void findWord() {
         while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
         wordLength_ = 0;
-        while (wordLength_ < rest_.size() && !isSpace(rest_[wordLength_])) ++wordLength_;
+        while (wordLength_ < rest_.size() && !isSpace(rest_[wordLength_]) && !beginsOther(wordLength_))
+            ++wordLength_;
+    }
+
+    // Whether a letter stands behind a digit at this place, or a digit behind a letter, with at most a joint between.
+    bool beginsOther(std::size_t at) const {
+        const bool letter = isWordLetter(rest_[at]);
+        if (at == 0 || (!letter && !isDigit(rest_[at]))) return false;
+        const std::size_t before = at >= 2 && isJoint(rest_[at - 1]) ? at - 2 : at - 1;
+        return letter ? isDigit(rest_[before]) : isWordLetter(rest_[before]);
     }
 
     std::string_view rest_;
@@ -112,9 +108,6 @@ constexpr std::array kFrenchMonths = {code("VEND"), code("BRUM"), code("FRIM"), 
 constexpr std::array kHebrewMonths = {code("TSH"), code("CSH"), code("KSL"), code("TVT"), code("SHV"),
                                       code("ADR"), code("ADS"), code("NSN"), code("IYR"), code("SVN"),
                                       code("TMZ"), code("AAV"), code("ELL")};
-constexpr std::array<std::string_view, 12> kLongMonths = {"JANUARY",   "FEBRUARY", "MARCH",    "APRIL",
-                                                          "MAY",       "JUNE",     "JULY",     "AUGUST",
-                                                          "SEPTEMBER", "OCTOBER",  "NOVEMBER", "DECEMBER"};
 
 // Place of the name in the list from 1; 0 if it is not there.
 template <typename Name, std::size_t N>
@@ -129,9 +122,8 @@ int monthOf(Calendar calendar, std::string_view word) {
         case Calendar::gregorian:
         case Calendar::julian: {
             const std::uint32_t letters = code(word);
-            if (letters == code("SEPT")) return 9;
             const int place = letters == 0 ? 0 : placeIn(kMonths, letters);
-            return place != 0 || word.size() <= 3 ? place : placeIn(kLongMonths, Word(word).text());
+            return place != 0 ? place : monthNamed(DateWord(word));
         }
         case Calendar::frenchRepublican:
             return placeIn(kFrenchMonths, code(word));
@@ -139,6 +131,15 @@ int monthOf(Calendar calendar, std::string_view word) {
             return placeIn(kHebrewMonths, code(word));
     }
     return 0;
+}
+
+std::string capitals(std::string_view word) {
+    constexpr std::size_t kLongest = 16;
+    std::string text(word.substr(0, kLongest));
+    for (char& c : text) {
+        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 'a' + 'A');
+    }
+    return text;
 }
 
 std::optional<Calendar> calendarNamed(std::string_view name) {
@@ -156,12 +157,12 @@ std::optional<Calendar> takeCalendar(Words& words) {
     if (rest.starts_with("@#D") || rest.starts_with("@#d")) {
         const std::size_t end = rest.find('@', 3);
         if (end == std::string_view::npos) return {};
-        const auto calendar = calendarNamed(Word(rest.substr(3, end - 3)).text());
+        const auto calendar = calendarNamed(capitals(rest.substr(3, end - 3)));
         words.drop(end + 1);
         return calendar;
     }
     const std::string_view word = words.peek();
-    const auto calendar = word.size() > kLongestMonthCode ? calendarNamed(Word(word).text()) : std::nullopt;
+    const auto calendar = word.size() > kLongestMonthCode ? calendarNamed(capitals(word)) : std::nullopt;
     if (!calendar) return Calendar::gregorian;
     words.skip();
     return calendar;
@@ -172,11 +173,14 @@ struct ReadDate {
     Calendar calendar = Calendar::gregorian;
     CalendarDate date;
     bool doubtful = false;
+    bool yearAlone = false;  // day and month are there, in an order that is not certain
 };
 
 // A year with its second form: "1731/32" is the year 1732, "1699/00" 1700. What does not fit makes it
 // doubtful.
 bool readDualYear(std::string_view first, std::string_view second, ReadDate& result) {
+    constexpr std::size_t kFewestDigits = 3;
+    if (first.size() < kFewestDigits) return false;
     const auto year = wholeNumber(first, 4);
     const auto later = wholeNumber(second, 4);
     if (!year || !later) return false;
@@ -189,6 +193,7 @@ bool readDualYear(std::string_view first, std::string_view second, ReadDate& res
 
 bool takeYear(Words& words, ReadDate& result) {
     std::string_view word = words.peek();
+    while (word.size() > 1 && (word.back() == '.' || word.back() == ',')) word.remove_suffix(1);
     if (word.size() > 1 && word.back() == '?') {
         result.doubtful = true;
         word.remove_suffix(1);
@@ -205,11 +210,32 @@ bool takeYear(Words& words, ReadDate& result) {
     return result.date.year != 0;
 }
 
-bool takeEpoch(Words& words, ReadDate& result) {
-    if (words.atEnd() || !words.skipIf({"BC", "B.C", "BCE", "B.C.E"})) return true;
-    const bool counted = result.calendar == Calendar::gregorian || result.calendar == Calendar::julian;
-    result.date.year = -result.date.year;
-    return counted;
+// The letters of up to so many words, without what stands between them; empty if a digit or a phrase is among them.
+std::string lettersAhead(Words words, int count) {
+    constexpr std::size_t kLongest = 16;
+    std::string letters;
+    for (int i = 0; i < count; ++i, words.skip()) {
+        if (words.atEnd()) return {};
+        for (const char c : words.peek()) {
+            if (isDigit(c) || c == '(' || letters.size() == kLongest) return {};
+            if (isWordLetter(c)) letters += c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+        }
+    }
+    return letters;
+}
+
+// False for a year before Christ in a calendar that has none.
+bool takeEra(Words& words, ReadDate& result) {
+    constexpr int kMostWords = 3;
+    for (int count = kMostWords; count > 0 && !words.atEnd(); --count) {
+        const Era era = eraNamed(lettersAhead(words, count));
+        if (era == Era::none) continue;
+        for (int i = 0; i < count; ++i) words.skip();
+        if (era == Era::afterChrist) return true;
+        result.date.year = -result.date.year;
+        return result.calendar == Calendar::gregorian || result.calendar == Calendar::julian;
+    }
+    return true;
 }
 
 // A day that the month does not have is left out; the month and year still tell something.
@@ -234,30 +260,151 @@ bool readIsoDate(std::string_view word, ReadDate& result) {
     return true;
 }
 
-// [calendar] [[day] month] year [B.C.]
+// Numbers between joints of one sort: "06.05.1900", "24/01/1915", "1915/1/24", "01/1915".
+struct NumberGroups {
+    std::array<int, 3> values{};
+    std::array<std::size_t, 3> digits{};
+    std::size_t count = 0;
+    char joint = '\0';
+};
+
+std::optional<NumberGroups> readGroups(std::string_view word) {
+    NumberGroups groups;
+    while (groups.count < groups.values.size()) {
+        std::size_t length = 0;
+        while (length < word.size() && isDigit(word[length])) ++length;
+        const auto number = wholeNumber(word.substr(0, length), 4);
+        if (!number) return {};
+        groups.values[groups.count] = *number;
+        groups.digits[groups.count++] = length;
+        word.remove_prefix(length);
+        if (word.empty() || (word == "." && groups.count == 3)) break;
+        if (!isJoint(word.front()) || (groups.joint != '\0' && groups.joint != word.front())) return {};
+        groups.joint = word.front();
+        word.remove_prefix(1);
+    }
+    return word.size() <= 1 && groups.count >= 2 ? std::optional(groups) : std::nullopt;
+}
+
+// Points are set where the day comes first. Strokes are set in both orders, so the day comes first only where the other
+// order is impossible; else the year alone is certain.
+bool readDayMonthYear(const NumberGroups& groups, ReadDate& result) {
+    const auto [first, second, year] = groups.values;
+    const bool secondIsMonth = second >= 1 && second <= 12;
+    const bool either = groups.joint != '.' && first <= 12 && first != second;
+    if (year == 0 || first < 1 || first > 31 || second < 1 || second > 31 || (first > 12 && !secondIsMonth))
+        return false;
+    result.yearAlone = !secondIsMonth || either;
+    result.date = result.yearAlone ? CalendarDate{year, 0, 0} : CalendarDate{year, second, first};
+    if (!result.yearAlone) dropImpossibleDay(result);
+    return true;
+}
+
+bool readNumericDate(std::string_view word, ReadDate& result) {
+    const auto groups = readGroups(word);
+    if (!groups) return false;
+    const auto& values = groups->values;
+    const auto& digits = groups->digits;
+    if (groups->count == 2) {
+        const bool isMonthAndYear =
+            digits[0] <= 2 && digits[1] >= 3 && values[0] >= 1 && values[0] <= 12 && values[1] != 0;
+        if (isMonthAndYear) result.date = {values[1], values[0], 0};
+        return isMonthAndYear;
+    }
+    if (digits[0] <= 2 && digits[1] <= 2 && digits[2] >= 3) return readDayMonthYear(*groups, result);
+    if (digits[0] < 3 || digits[1] > 2 || digits[2] > 2 || values[0] == 0 || values[1] < 1 || values[1] > 12)
+        return false;
+    result.date = {values[0], values[1], values[2]};
+    dropImpossibleDay(result);
+    return true;
+}
+
+// Also in three words: "6. 5. 1900".
+bool takeNumericDate(Words& words, ReadDate& result) {
+    if (!isDigit(words.front())) return false;
+    if (words.peek().find_first_of("./-") == std::string_view::npos) return false;
+    if (readNumericDate(words.peek(), result)) {
+        words.skip();
+        return true;
+    }
+    if (words.peek().back() != '.') return false;
+    Words ahead = words;
+    std::string joined;
+    for (int i = 0; i < 3 && joined.size() < 16; ++i, ahead.skip()) joined += ahead.peek();
+    if (!readNumericDate(joined, result)) return false;
+    words = ahead;
+    return true;
+}
+
+// A day's number of one or two digits, with a point or an ending behind it: "24", "24.", "1st", "1er".
+std::optional<int> takeDay(Words& words) {
+    std::string_view word = words.peek();
+    if (!isDigit(words.front())) return {};
+    while (isJoint(word.back()) || word.back() == ',') word.remove_suffix(1);
+    const auto day = wholeNumber(word, 2);
+    if (!day) return {};
+    words.skip();
+    words.skipIf({"ST", "ND", "RD", "TH", "ER", "RE", "E", "O"});
+    if (words.peek() == "\u00BA" || words.peek() == "\u00B0") words.skip();
+    words.skipIf({"OF", "DE", "DEL", "DI", "DO"});
+    return day;
+}
+
+// "7bre" to "10bre" are September to December.
+int takeMonth(Words& words, Calendar calendar) {
+    Words ahead = words;
+    const auto number = isDigit(words.front()) ? wholeNumber(words.peek(), 2) : std::nullopt;
+    ahead.skip();
+    const bool counted = number && *number >= 7 && *number <= 10 && ahead.skipIf({"BRE"});
+    const int month = counted ? *number + 2 : monthOf(calendar, words.peek());
+    if (month != 0) words = ahead;
+    return month;
+}
+
+// "May 24, 1819": the day behind the month, if a year follows it.
+void takeDayBehindMonth(Words& words, ReadDate& result) {
+    Words ahead = words;
+    const auto day = takeDay(ahead);
+    if (!day || !isDigit(ahead.front())) return;
+    result.date.day = *day;
+    words = ahead;
+}
+
+// [weekday] [day] month, or month day; nothing where no month is.
+void takeDayAndMonth(Words& words, ReadDate& result) {
+    const Words start = words;
+    const auto day = takeDay(words);
+    result.date.month = takeMonth(words, result.calendar);
+    if (result.date.month == 0) {
+        words = start;
+        return;
+    }
+    if (day) result.date.day = *day;
+    words.skipIf({"OF", "DE", "DEL", "DI", "DO"});
+    if (!day) takeDayBehindMonth(words, result);
+}
+
+// [calendar] [weekday] [[day] month] year [B.C.]
 std::optional<ReadDate> takeDate(Words& words) {
     ReadDate result;
     const auto calendar = takeCalendar(words);
     if (!calendar) return {};
     result.calendar = *calendar;
+    const bool plain = result.calendar == Calendar::gregorian || result.calendar == Calendar::julian;
     if (readIsoDate(words.peek(), result)) {
         words.skip();
         return result;
     }
-    const Words start = words;
-    if (const auto day = isDigit(words.front()) ? wholeNumber(words.peek(), 2) : std::nullopt) {
+    if (plain && isWordLetter(words.front()) && isWeekday(DateWord(words.peek()))) {
         words.skip();
-        result.date.month = monthOf(result.calendar, words.peek());
-        result.date.day = *day;
-        if (result.date.month == 0) {
-            words = start;
-            result.date.day = 0;
-        }
-    } else {
-        result.date.month = monthOf(result.calendar, words.peek());
+        words.skipIf({"DEN", "LE", "EL", "IL", "THE"});
     }
-    if (result.date.month != 0) words.skip();
-    if (!takeYear(words, result) || !takeEpoch(words, result)) return {};
+    if (plain && takeNumericDate(words, result)) {
+        return takeEra(words, result) ? std::optional(result) : std::nullopt;
+    }
+    words.skipIf({"AD", "A.D"});
+    takeDayAndMonth(words, result);
+    if (!takeYear(words, result) || !takeEra(words, result)) return {};
     dropImpossibleDay(result);
     return result;
 }
@@ -273,6 +420,7 @@ void store(const ReadDate& read, DateMark mark, GedcomDate& date) {
     date.month = static_cast<std::uint8_t>(gregorian.month);
     date.day = static_cast<std::uint8_t>(gregorian.day);
     date.mark = mark == DateMark::exact && read.doubtful ? DateMark::about : mark;
+    date.isYearAlone = read.yearAlone;
 }
 
 bool onlyPhraseLeft(const Words& words) {
@@ -334,21 +482,61 @@ CalendarDate justBefore(const CalendarDate& date) {
 
 }  // namespace
 
+namespace {
+
+// "1850-1860", which the standard has no word for.
+bool readYearRange(std::string_view word, GedcomDate& date) {
+    constexpr std::size_t kYearDigits = 4;
+    if (word.size() != 2 * kYearDigits + 1 || word[kYearDigits] != '-') return false;
+    const auto first = wholeNumber(word.substr(0, kYearDigits), kYearDigits);
+    const auto last = wholeNumber(word.substr(kYearDigits + 1), kYearDigits);
+    if (!first || !last || *first == 0 || *last < *first) return false;
+    date.year = static_cast<std::int16_t>(*first);
+    date.lastYear = static_cast<std::int16_t>(*last);
+    date.mark = DateMark::between;
+    return true;
+}
+
+// Takes the signs off that some programs set around a date or before it: "<1590>", "[1590]" and "~1590" are about that
+// year, "<1590" is before it and ">1590" after it.
+DateMark takeSigns(std::string_view& text) {
+    while (!text.empty() && isSpace(text.front())) text.remove_prefix(1);
+    while (!text.empty() && isSpace(text.back())) text.remove_suffix(1);
+    if (text.size() < 2) return DateMark::exact;
+    const char first = text.front();
+    const char last = text.back();
+    if ((first == '<' && last == '>') || (first == '[' && last == ']')) {
+        text = text.substr(1, text.size() - 2);
+        return DateMark::about;
+    }
+    if (first != '<' && first != '>' && first != '~') return DateMark::exact;
+    text.remove_prefix(1);
+    if (first == '~') return DateMark::about;
+    return first == '<' ? DateMark::before : DateMark::after;
+}
+
+}  // namespace
+
 GedcomDate parseGedcomDate(std::string_view written) {
     GedcomDate date;
     date.written = written;
-    Words words(written);
-    if (words.skipIf({"BET", "BETWEEN"})) {
+    std::string_view text = written;
+    const DateMark signs = takeSigns(text);
+    Words words(text);
+    if (signs != DateMark::exact) {
+        readSingle(words, signs, date);
+    } else if (words.skipIf({"BET", "BETWEEN"})) {
         readRange(words, "AND", DateMark::after, date);
     } else if (words.skipIf({"FROM"})) {
         readRange(words, "TO", DateMark::after, date);
-    } else if (words.skipIf({"TO", "BEF", "BEFORE"})) {
+    } else if (words.skipIf({"TO", "BEF", "BEFORE", "VOR", "AVANT", "VOOR", "ANTES"})) {
         readSingle(words, DateMark::before, date);
-    } else if (words.skipIf({"AFT", "AFTER"})) {
+    } else if (words.skipIf({"AFT", "AFTER", "NACH", "APRES", "NA", "DOPO", "EFTER"})) {
         readSingle(words, DateMark::after, date);
-    } else if (words.skipIf({"ABT", "ABOUT", "CAL", "EST", "CIRCA", "CA", "C"})) {
+    } else if (words.skipIf({"ABT", "ABOUT", "CAL", "EST", "CIRCA", "CA", "C", "UM", "ENV", "ENVIRON", "VERS",
+                             "OMSTREEKS", "APPROX", "AROUND"})) {
         readSingle(words, DateMark::about, date);
-    } else {
+    } else if (!readYearRange(text, date)) {
         words.skipIf({"INT"});
         readSingle(words, DateMark::exact, date);
     }

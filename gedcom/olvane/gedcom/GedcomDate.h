@@ -32,13 +32,16 @@ struct GedcomDate {
     std::uint8_t month = 0;
     std::uint8_t day = 0;
     DateMark mark = DateMark::exact;
+    bool isYearAlone = false;  // a day and a month are written, in an order that is not certain: "05/06/1900"
 
     bool isGiven() const { return !written.empty(); }
     bool isRead() const { return year != 0; }
 };
 
-// Reads a DATE value in any of the standard's calendars and forms, of version 5.5, 5.5.1 or 7.0; also ISO
-// dates, small letters and months in full. Never fails: what cannot be read comes back with year 0.
+// Reads a DATE value in any of the standard's calendars and forms, of version 5.5, 5.5.1 or 7.0; also ISO dates, small
+// letters, months in full and in twelve languages, weekdays, "6.5.1900", "24/01/1915", "May 24, 1819", "12MAY1900",
+// "<1590>", "1850-1860" and "44 v. Chr.". With strokes or hyphens between numbers the day comes first only where it
+// cannot be the month; else the year alone is read. Never fails: what cannot be read comes back with year 0.
 GedcomDate parseGedcomDate(std::string_view written);
 
 // Text that sorts as the dates do, by plain comparison of bytes: "1819-05-24", "1819-05", "1819"; a "~" at

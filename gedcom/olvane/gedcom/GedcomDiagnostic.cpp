@@ -43,6 +43,7 @@ constexpr const char* kKindNames[] = {
     "link of one side alone",
     "links that contradict each other",
     "partner in the slot of the other sex",
+    "date with day and month in doubt",
 };
 
 std::string printable(std::string_view raw) {

@@ -39,6 +39,7 @@ enum class DiagnosticKind : std::uint8_t {
     oneSidedLink,       // a person and a family of which one alone names the other
     contradictingLink,  // a link beside which the other side names somebody else
     wrongSlot,          // a man as WIFE, or a woman as HUSB
+    ambiguousDate,      // a date whose day and month may be either way round
 };
 
 // One thing that was wrong with a file, and what was done about it.

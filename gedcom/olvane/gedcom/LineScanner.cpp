@@ -57,6 +57,13 @@ std::uint32_t takeNumber(std::string_view& rest) {
     return number;
 }
 
+// The digits as written, but for zeros in front; those of a line of digits are cut.
+std::string shownLevel(std::string_view digits) {
+    constexpr std::size_t kShown = 60;
+    while (digits.size() > 1 && digits.front() == '0') digits.remove_prefix(1);
+    return std::string(digits.substr(0, kShown)) + (digits.size() > kShown ? "..." : "");
+}
+
 // Whether a text may begin with a CONC or CONT line: a look at a few characters that spares looking for the
 // line's end.
 bool mayContinue(std::string_view rest) {
@@ -94,8 +101,9 @@ std::string_view trimmed(std::string_view text) {
 
 std::size_t findConcText(std::string_view rest) {
     std::size_t at = 0;
-    if (at < rest.size() && rest[at] == '\r') ++at;
+    while (at < 2 && at < rest.size() && rest[at] == '\r') ++at;
     if (at < rest.size() && rest[at] == '\n') ++at;
+    if (at == 1 && rest.front() == '\n' && at < rest.size() && rest[at] == '\r') ++at;
     if (at == 0) return std::string_view::npos;
     while (at < rest.size() && (isDigit(rest[at]) || isBlank(rest[at]))) ++at;
     return rest.substr(at, 5) == "CONC " ? at + 5 : std::string_view::npos;
@@ -113,10 +121,21 @@ bool LineCutter::next(std::string_view& text) {
     const std::size_t end = nearestEnd();
     text = bytes_.substr(at_, end - at_);
     at_ = end;
-    if (at_ < bytes_.size() && bytes_[at_] == '\r') ++at_;
-    if (at_ < bytes_.size() && bytes_[at_] == '\n') ++at_;
+    skipEnd();
     ++number_;
     return true;
+}
+
+// "LF CR LF" may be an LF and an empty line that ends in CRLF; the first line end of the file decides.
+void LineCutter::skipEnd() {
+    if (standsAt('\n', 0)) {
+        const bool lfCr = standsAt('\r', 1) && (endsInLfCr_ || !standsAt('\n', 2));
+        if (number_ == 0) endsInLfCr_ = lfCr;
+        at_ += lfCr ? 2 : 1;
+    } else if (standsAt('\r', 0)) {
+        if (standsAt('\r', 1) && standsAt('\n', 2)) ++at_;
+        at_ += standsAt('\n', 1) ? 2 : 1;
+    }
 }
 
 LineScanner::LineScanner(std::string_view bytes, DiagnosticList& diagnostics)
@@ -156,6 +175,7 @@ bool LineScanner::refuse(std::string_view text, const GedcomLine& line) {
 bool LineScanner::takeLevel(std::string_view& rest, GedcomLine& line) {
     if (rest.size() < 3 || !isDigit(rest[0]) || rest[1] != ' ') return takeUnusualLevel(rest, line);
     writtenLevel_ = static_cast<std::uint32_t>(rest[0] - '0');
+    levelDigits_ = rest.substr(0, 1);
     rest.remove_prefix(2);
     if (isBlank(rest.front())) rest = withoutLeadingBlanks(rest);
     return true;
@@ -166,13 +186,17 @@ bool LineScanner::takeUnusualLevel(std::string_view& rest, GedcomLine& line) {
     std::string_view digits = rest.substr(negative ? 1 : 0);
     if (digits.empty() || !isDigit(digits.front())) return false;
     const bool padded = digits.size() > 1 && digits[0] == '0' && isDigit(digits[1]);
-    const std::string_view written = rest.substr(0, 12);
+    const std::string_view allDigits = digits;
     writtenLevel_ = takeNumber(digits);
+    levelDigits_ = allDigits.substr(0, allDigits.size() - digits.size());
+    const std::string_view written = rest.substr(0, levelDigits_.size() + (negative ? 1 : 0));
     const bool parted = !digits.empty() && isBlank(digits.front());
     if (!parted && (digits.empty() || (digits.front() != '@' && !isTagLetter(digits.front())))) return false;
     if (negative || padded || !parted) {
         diagnostics_.add(DiagnosticKind::wrongLevel, Severity::warning, line.number, "level badly written",
-                         "read as level " + std::to_string(writtenLevel_), written);
+                         writtenLevel_ < kHighestLevel ? "read as level " + std::to_string(writtenLevel_)
+                                                       : std::string("read as one below the line before"),
+                         written);
     }
     rest = withoutLeadingBlanks(digits);
     return true;
@@ -210,7 +234,7 @@ void LineScanner::settleDepth(GedcomLine& line) {
     if (writtenLevel_ > previousLevel_ + 1) {
         diagnostics_.add(
             DiagnosticKind::levelJump, Severity::warning, line.number,
-            "level jumps from " + std::to_string(previousLevel_) + " to " + std::to_string(writtenLevel_),
+            "level jumps from " + std::to_string(previousLevel_) + " to " + shownLevel(levelDigits_),
             "read as one below the line before", line.tag);
     }
     previousLevel_ = writtenLevel_;

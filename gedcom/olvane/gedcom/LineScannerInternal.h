@@ -30,7 +30,8 @@ struct GedcomLine {
     std::uint32_t number = 0;  // of the line, from 1
 };
 
-// Cuts bytes into lines at LF, CR and CRLF, in any mixture.
+// Cuts bytes into lines at LF, CR and CRLF, in any mixture; also at LFCR and CRCRLF, which are what careless conversions
+// leave, as at one line end.
 //
 // Holds: time is linear however far apart the line ends of either sort are.
 class LineCutter {
@@ -45,8 +46,13 @@ public:
 
 private:
     std::size_t nearestEnd();
+    void skipEnd();
+    bool standsAt(char wanted, std::size_t ahead) const {
+        return at_ + ahead < bytes_.size() && bytes_[at_ + ahead] == wanted;
+    }
 
     std::string_view bytes_;
+    bool endsInLfCr_ = false;  // the first line does
     std::size_t at_ = 0;
     std::uint32_t number_ = 0;
     // Where the next one is, at or behind at_ once asked for; the size of the bytes if there is none.
@@ -89,6 +95,7 @@ private:
     DiagnosticList& diagnostics_;
     std::string joined_;
     std::uint32_t writtenLevel_ = 0;   // of the line in hand
+    std::string_view levelDigits_;     // the same as written
     std::uint32_t previousLevel_ = 0;  // as written
     // Written levels of the lines that the next one may lie under, from the record down. Rises strictly.
     std::array<std::uint32_t, GedcomLine::kDeep> ancestors_{};

@@ -513,6 +513,11 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
     date = parseGedcomDate(value);
     date.line = line.number;
     lastDate_ = date;
+    if (date.isYearAlone) {
+        diagnostics_.add(DiagnosticKind::ambiguousDate, Severity::note, line.number,
+                         "a date whose day and month may be either way round", "its year alone is read",
+                         value);
+    }
     if (date.isRead() || value.front() == '(') return;
     diagnostics_.add(DiagnosticKind::unreadableDate, Severity::note, line.number,
                      "a date that cannot be read", "shown as written", value);

@@ -188,5 +188,15 @@ TEST(BrokenFiles, quotedTextIsShortAndFitToPrint) {
               std::string("6: not a line with level and tag (?[2J?").append(55, 'x').append("...); skipped"));
 }
 
+TEST(BrokenFiles, aDateWithDayAndMonthInDoubtIsReported) {
+    const GedcomData data =
+        read(document("0 @I1@ INDI\n1 BIRT\n2 DATE 05/06/1900\n1 DEAT\n2 DATE 24/01/1915\n"));
+    ASSERT_EQ(told(data, DiagnosticKind::ambiguousDate).size(), 1U);
+    EXPECT_EQ(told(data, DiagnosticKind::ambiguousDate)[0],
+              "8: a date whose day and month may be either way round (05/06/1900); its year alone is read");
+    EXPECT_EQ(data.diagnostics().size(), 1U);
+    EXPECT_EQ(data.diagnostics()[0].severity, Severity::note);
+}
+
 }  // namespace
 }  // namespace olvane::gedcom::test

@@ -167,6 +167,180 @@ TEST(Dates, anImpossibleDayLeavesTheMonth) {
     });
 }
 
+TEST(Dates, yearsBeforeChristInAllTheirSpellings) {
+    for (const char* written :
+         {"972B.C.", "972 BC", "972BC", "972 B.C.", "972 B. C.", "972 BCE", "972 b.c.e.", "972 v. Chr.",
+          "972 v.Chr.", "972 av. J.-C.", "972 a.C.", "972 f.Kr.", "972 p.n.e."}) {
+        EXPECT_EQ(displayYear(parseGedcomDate(written)), "972 BC") << written;
+    }
+    for (const char* written : {"972 A.D.", "972 AD", "AD 972", "A.D. 972", "972 n. Chr.", "972 CE"}) {
+        EXPECT_EQ(displayYear(parseGedcomDate(written)), "972") << written;
+    }
+    expectRows({{"BET 100 B.C. AND 44 B.C.", "100 BC-44 BC", "-9899"},
+                {"15 MAR 44B.C. (Ides)", "44 BC", "-9955-03-15"}});
+}
+
+TEST(Dates, numbersWithPointsHaveTheDayFirst) {
+    expectRows({
+        {"06.05.1900", "1900", "1900-05-06"},
+        {"6.5.1900", "1900", "1900-05-06"},
+        {"6. 5. 1900", "1900", "1900-05-06"},
+        {"24.12.1915.", "1915", "1915-12-24"},
+        {"05.1900", "1900", "1900-05"},
+        {"1915.12.24", "1915", "1915-12-24"},
+        {"30.02.1900", "1900", "1900-02"},
+        {"ABT 06.05.1900", "~1900", "1900-05-06"},
+        {"BET 06.05.1900 AND 07.05.1901", "1900-1901", "1900-05-06"},
+    });
+}
+
+TEST(Dates, numbersWithStrokesAreReadWhereTheirOrderIsCertain) {
+    expectRows({
+        {"24/01/1915", "1915", "1915-01-24"},
+        {"24-01-1915", "1915", "1915-01-24"},
+        {"05/05/1900", "1900", "1900-05-05"},
+        {"05/06/1900", "1900", "1900"},
+        {"01/24/1915", "1915", "1915"},
+        {"1915/01/24", "1915", "1915-01-24"},
+        {"01/1915", "1915", "1915-01"},
+        {"24/01/1915 B.C.", "1915 BC", "-8084-01-24"},
+    });
+    EXPECT_FALSE(parseGedcomDate("24/01/1915").isYearAlone);
+    EXPECT_FALSE(parseGedcomDate("05/05/1900").isYearAlone);
+    EXPECT_TRUE(parseGedcomDate("05/06/1900").isYearAlone);
+    EXPECT_TRUE(parseGedcomDate("01/24/1915").isYearAlone);
+    for (const char* written : {"24/13/1915", "00/01/1915", "32/01/1915", "1/2/3/1900", "24/01.1915",
+                                "24//1915", "13/1915", "24/01/0000", "24/01/15", "1.2.3.", "1915/13/01"}) {
+        EXPECT_FALSE(parseGedcomDate(written).isRead()) << written;
+    }
+}
+
+TEST(Dates, monthsAreKnownInTwelveLanguages) {
+    struct Months {
+        const char* language;
+        std::vector<const char*> names;
+    };
+    const Months rows[] = {
+        {"en",
+         {"January", "February", "March", "April", "May", "June", "July", "August", "September", "October",
+          "November", "December"}},
+        {"fr",
+         {"janvier", "février", "mars", "avril", "mai", "juin", "juillet", "août", "septembre", "octobre",
+          "novembre", "décembre"}},
+        {"fr abbreviated",
+         {"janv.", "févr.", "mars", "avr.", "mai", "juin", "juil.", "août", "sept.", "oct.", "nov.", "déc."}},
+        {"de",
+         {"Januar", "Februar", "März", "April", "Mai", "Juni", "Juli", "August", "September", "Oktober",
+          "November", "Dezember"}},
+        {"de abbreviated",
+         {"Jan.", "Feb.", "Mrz.", "Apr.", "Mai", "Jun.", "Jul.", "Aug.", "Sep.", "Okt.", "Nov.", "Dez."}},
+        {"nl",
+         {"januari", "februari", "maart", "april", "mei", "juni", "juli", "augustus", "september", "oktober",
+          "november", "december"}},
+        {"nl abbreviated",
+         {"jan.", "feb.", "mrt.", "apr.", "mei", "jun.", "jul.", "aug.", "sep.", "okt.", "nov.", "dec."}},
+        {"es",
+         {"enero", "febrero", "marzo", "abril", "mayo", "junio", "julio", "agosto", "septiembre", "octubre",
+          "noviembre", "diciembre"}},
+        {"es abbreviated",
+         {"ene.", "feb.", "mar.", "abr.", "may.", "jun.", "jul.", "ago.", "sept.", "oct.", "nov.", "dic."}},
+        {"it",
+         {"gennaio", "febbraio", "marzo", "aprile", "maggio", "giugno", "luglio", "agosto", "settembre",
+          "ottobre", "novembre", "dicembre"}},
+        {"it abbreviated",
+         {"gen", "feb", "mar", "apr", "mag", "giu", "lug", "ago", "set", "ott", "nov", "dic"}},
+        {"pt",
+         {"janeiro", "fevereiro", "março", "abril", "maio", "junho", "julho", "agosto", "setembro", "outubro",
+          "novembro", "dezembro"}},
+        {"pt abbreviated",
+         {"jan.", "fev.", "mar.", "abr.", "mai.", "jun.", "jul.", "ago.", "set.", "out.", "nov.", "dez."}},
+        {"pl",
+         {"stycznia", "lutego", "marca", "kwietnia", "maja", "czerwca", "lipca", "sierpnia", "września",
+          "października", "listopada", "grudnia"}},
+        {"pl nominative",
+         {"styczeń", "luty", "marzec", "kwiecień", "maj", "czerwiec", "lipiec", "sierpień", "wrzesień",
+          "październik", "listopad", "grudzień"}},
+        {"pl abbreviated",
+         {"sty", "lut", "mar", "kwi", "maj", "cze", "lip", "sie", "wrz", "paź", "lis", "gru"}},
+        {"sv",
+         {"januari", "februari", "mars", "april", "maj", "juni", "juli", "augusti", "september", "oktober",
+          "november", "december"}},
+        {"no",
+         {"januar", "februar", "mars", "april", "mai", "juni", "juli", "august", "september", "oktober",
+          "november", "desember"}},
+        {"da",
+         {"januar", "februar", "marts", "april", "maj", "juni", "juli", "august", "september", "oktober",
+          "november", "december"}},
+        {"fi",
+         {"tammikuuta", "helmikuuta", "maaliskuuta", "huhtikuuta", "toukokuuta", "kesäkuuta", "heinäkuuta",
+          "elokuuta", "syyskuuta", "lokakuuta", "marraskuuta", "joulukuuta"}},
+        {"fi nominative",
+         {"tammikuu", "helmikuu", "maaliskuu", "huhtikuu", "toukokuu", "kesäkuu", "heinäkuu", "elokuu",
+          "syyskuu", "lokakuu", "marraskuu", "joulukuu"}},
+        {"old",
+         {"Jänner", "Feber", "Maerz", "APR", "MAI", "JUN", "JUL", "AUG", "7bre", "8bre", "9bre", "Xbre"}},
+    };
+    for (const Months& row : rows) {
+        ASSERT_EQ(row.names.size(), 12U);
+        for (std::size_t month = 0; month < row.names.size(); ++month) {
+            const GedcomDate date =
+                parseGedcomDate(std::string("24 ").append(row.names[month]).append(" 1819"));
+            EXPECT_EQ(date.month, month + 1) << row.language << " " << row.names[month];
+            EXPECT_EQ(date.day, 24) << row.language << " " << row.names[month];
+        }
+    }
+}
+
+TEST(Dates, wordsAroundADateAreNoTrouble) {
+    for (const char* written : {"24. Mai 1819",
+                                "24.Mai 1819",
+                                "24.Mai.1819",
+                                "24-MAY-1819",
+                                "24MAY1819",
+                                "24/May/1819",
+                                "May 24, 1819",
+                                "May 24 1819",
+                                "May 24th, 1819",
+                                "24th of May 1819",
+                                "24 de mayo de 1819",
+                                "Mon 24 MAY 1819",
+                                "Monday, 24 May 1819",
+                                "Montag, 24. Mai 1819",
+                                "Montag, den 24. Mai 1819",
+                                "lundi 24 mai 1819",
+                                "poniedziałek 24 maja 1819",
+                                "måndag 24 maj 1819",
+                                "segunda-feira 24 maio 1819",
+                                "24º mayo 1819"}) {
+        EXPECT_EQ(sortText(parseGedcomDate(written)), "1819-05-24") << written;
+    }
+    EXPECT_EQ(sortText(parseGedcomDate("1er mai 1819")), "1819-05-01");
+    EXPECT_EQ(sortText(parseGedcomDate("MAY 14")), "0014-05");
+    EXPECT_FALSE(parseGedcomDate("Monday").isRead());
+    EXPECT_FALSE(parseGedcomDate("Monday May").isRead());
+}
+
+TEST(Dates, signsAroundAYearSayHowFirmItIs) {
+    expectRows({
+        {"<1590>", "~1590", "1590"},
+        {"< 1590 >", "~1590", "1590"},
+        {"<12 MAY 1590>", "~1590", "1590-05-12"},
+        {"[1590]", "~1590", "1590"},
+        {"~1590", "~1590", "1590"},
+        {"<1590", "<1590", "1589~"},
+        {">1590", ">1590", "1590~"},
+        {"c1590", "~1590", "1590"},
+        {"ca.1590", "~1590", "1590"},
+        {"abt1590", "~1590", "1590"},
+        {"um 1590", "~1590", "1590"},
+        {"vor 1590", "<1590", "1589~"},
+        {"1850-1860", "1850-1860", "1850"},
+    });
+    for (const char* written : {"<>", "<", "[]", "<<1590>>", "1860-1850", "1850-1860-1870", "<1590)"}) {
+        EXPECT_FALSE(parseGedcomDate(written).isRead()) << written;
+    }
+}
+
 TEST(Dates, sortTextsSortAsTheDatesDo) {
     const std::vector<const char*> inOrder = {
         "100 BC",      "44 BC",           "15 MAR 44 BC", "BEF 1",

@@ -129,5 +129,27 @@ TEST(Names, doubledAtsAreUndoneAsTheVersionHasThem) {
     EXPECT_EQ(namesOf(read(document7("0 @I1@ INDI\n1 NAME @@home a@@b @ c /Doe/\n"))), "@home a@@b @ c Doe");
 }
 
+TEST(Names, aLongNameIsCutInWholeCharacters) {
+    PersonName name;
+    name.written = "Jürgen /Müller/";
+    EXPECT_EQ(displayName(name, 100), "Jürgen Müller");
+    EXPECT_EQ(displayName(name, 15), "Jürgen Müller");
+    EXPECT_EQ(displayName(name, 10), "Jürgen M");
+    EXPECT_EQ(displayName(name, 9), "Jürgen M");
+    EXPECT_EQ(displayName(name, 2), "J");
+    EXPECT_EQ(displayName(name, 0), "");
+    name.written = {};
+    name.given = "Jürgen";
+    name.surname = "Müller";
+    EXPECT_EQ(displayName(name, 10), "Jürgen M");
+    name.given = name.surname = {};
+    name.nickname = "ü";
+    EXPECT_EQ(displayName(name, 1), "");
+    const std::string longName(1000000, 'x');
+    name.written = longName;
+    EXPECT_EQ(displayName(name, 10), "xxxxxxxxxx");
+    EXPECT_LT(displayName(name, 10).capacity(), 100U);
+}
+
 }  // namespace
 }  // namespace olvane::gedcom::test
