@@ -35,6 +35,7 @@ public:
         findOtherBonds(kinship, limit);
         MarriageWays marriages = marriages_.find(a, b, limit);
         kinship.marriage = std::move(marriages.ways);
+        for (MarriageWay& way : kinship.marriage) way.steps = stepsOf(links_, way.persons);
         kinship.marriageCount = marriages.count;
         return kinship;
     }

@@ -30,9 +30,21 @@ struct KinWay {
     int length() const { return up + down; }
 };
 
+// A part of a way over marriages: up to an ancestor and down again, or from one partner to the other.
+struct KinStep {
+    bool isCouple = false;
+    UnionState state = UnionState::unknown;  // of a couple
+    int up = 0;
+    int down = 0;
+    bool half = false;
+    Bond bond = Bond::blood;
+    Place to = kNobody;  // whom the step leads to
+};
+
 // A way over partners, parents and children that is no KinWay.
 struct MarriageWay {
     std::vector<Place> persons;  // from A to B
+    std::vector<KinStep> steps;  // as few as the way can be told in
 
     int links() const { return static_cast<int>(persons.size()) - 1; }
 };

@@ -26,6 +26,9 @@ constexpr Readings kReadsMore = 4;
 // The readings of a way that goes on to a neighbor of these kinds.
 Readings readingsAfter(Readings readings, std::uint8_t kinds);
 
+// The steps that a way consists of: partner links, and climbs with the descents behind them.
+std::vector<KinStep> stepsOf(const KinLinks& links, const std::vector<Place>& persons);
+
 // The ways from one side, as said below.
 MarriageWays findFartherMarriageWays(const KinLinks& links, Place a, Place b, std::size_t limit);
 

@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <string>
+
+#include <olvane/Export.h>
+#include <olvane/kin/Kinship.h>
+
+namespace olvane::kin {
+
+// A kinship as one line of JSON, with persons by their ids:
+//
+//   {"a": 52, "b": 113, "words": {"en": "...", "de": "...", "es": "..."}, "phi": 0.0078125, "degree": 7,
+//    "blood": [{"up": 3, "down": 4, "half": false, "ancestors": [19, 20], "persons": [52, ...], "words": {...}}],
+//    "bloodCount": 1, "legal": [the same with "bond": "adopted"], "legalCount": 0,
+//    "marriage": [{"links": 3, "persons": [52, 30, 31, 113], "words": {...}}], "marriageCount": 1}
+//
+// Numbers that nobody can say are null; behind them, "reason" is "loop" where somebody among the ancestors is their
+// own ancestor. Units: phi is written with as few digits as give the same number back.
+OLVANE_API std::string kinshipJson(const KinGraph& graph, const Kinship& kinship);
+
+}  // namespace olvane::kin

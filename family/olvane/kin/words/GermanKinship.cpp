@@ -1,0 +1,226 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// German words for relatives. A cousin of a parent is an "Onkel zweiten Grades", a cousin's child a "Neffe zweiten
+// Grades", and only whoever is of one's own generation a cousin.
+
+#include <algorithm>
+#include <array>
+#include <cstdlib>
+
+#include <olvane/kin/words/KinshipWordsInternal.h>
+
+namespace olvane::kin {
+
+namespace {
+
+enum class Gender : std::uint8_t { masculine, feminine, neuter };
+
+struct Word {
+    std::string word;
+    std::string genitive;
+    Gender gender;
+};
+
+using Words = BySex<Word>;
+
+constexpr Gender kM = Gender::masculine;
+constexpr Gender kF = Gender::feminine;
+constexpr Gender kN = Gender::neuter;
+
+const Words& parent() {
+    static const Words kWords{
+        {"Vater", "Vaters", kM}, {"Mutter", "Mutter", kF}, {"Elternteil", "Elternteils", kM}};
+    return kWords;
+}
+const Words& child() {
+    static const Words kWords{{"Sohn", "Sohnes", kM}, {"Tochter", "Tochter", kF}, {"Kind", "Kindes", kN}};
+    return kWords;
+}
+const Words& grandchild() {
+    static const Words kWords{
+        {"Enkel", "Enkels", kM}, {"Enkelin", "Enkelin", kF}, {"Enkelkind", "Enkelkindes", kN}};
+    return kWords;
+}
+const Words& sibling() {
+    static const Words kWords{
+        {"Bruder", "Bruders", kM}, {"Schwester", "Schwester", kF}, {"Geschwister", "Geschwisters", kN}};
+    return kWords;
+}
+const Words& parentsSibling() {
+    static const Words kWords{
+        {"Onkel", "Onkels", kM}, {"Tante", "Tante", kF}, {"Onkel/Tante", "Onkels/Tante", kM}};
+    return kWords;
+}
+const Words& siblingsChild() {
+    static const Words kWords{
+        {"Neffe", "Neffen", kM}, {"Nichte", "Nichte", kF}, {"Neffe/Nichte", "Neffen/Nichte", kM}};
+    return kWords;
+}
+const Words& cousin() {
+    static const Words kWords{
+        {"Cousin", "Cousins", kM}, {"Cousine", "Cousine", kF}, {"Cousin/Cousine", "Cousins/Cousine", kM}};
+    return kWords;
+}
+const Words& siblingInLaw() {
+    static const Words kWords{{"Schwager", "Schwagers", kM},
+                              {"Schwägerin", "Schwägerin", kF},
+                              {"Schwager/Schwägerin", "Schwagers/Schwägerin", kM}};
+    return kWords;
+}
+const Words& spouseWords(UnionState state) {
+    static const Words kSpouse{
+        {"Ehemann", "Ehemannes", kM}, {"Ehefrau", "Ehefrau", kF}, {"Ehepartner", "Ehepartners", kM}};
+    static const Words kFormer{{"früherer Ehemann", "früheren Ehemannes", kM},
+                               {"frühere Ehefrau", "früheren Ehefrau", kF},
+                               {"früherer Ehepartner", "früheren Ehepartners", kM}};
+    static const Words kPartner{
+        {"Partner", "Partners", kM}, {"Partnerin", "Partnerin", kF}, {"Partner", "Partners", kM}};
+    if (state == UnionState::divorced) return kFormer;
+    return state == UnionState::unmarried ? kPartner : kSpouse;
+}
+
+constexpr std::array kOrdinals{"ersten",   "zweiten", "dritten", "vierten", "fünften",
+                               "sechsten", "siebten", "achten",  "neunten"};
+// More of them than this are counted.
+constexpr int kUrsInWords = 3;
+
+Noun noun(const Word& word) {
+    const bool isFeminine = word.gender == Gender::feminine;
+    return {word.word, (isFeminine ? "einer " : "eines ") + word.genitive,
+            (isFeminine ? "der " : "des ") + word.genitive};
+}
+
+// "Halb" before "Onkel/Tante" is "Halbonkel/Halbtante", and before "4×Urgroßonkel" "4×Halburgroßonkel". The words
+// begin with ASCII letters.
+std::string compound(const std::string& prefix, const std::string& words) {
+    std::string text;
+    std::size_t start = 0;
+    while (start <= words.size()) {
+        const std::size_t end = std::min(words.find('/', start), words.size());
+        const std::string part = words.substr(start, end - start);
+        const std::size_t times = part.find("×");
+        const std::size_t head = times == std::string::npos ? 0 : times + std::string_view("×").size();
+        if (start > 0) text += '/';
+        text += part.substr(0, head) + prefix;
+        text +=
+            static_cast<char>(part[head] >= 'A' && part[head] <= 'Z' ? part[head] - 'A' + 'a' : part[head]);
+        text += part.substr(head + 1);
+        start = end + 1;
+    }
+    return text;
+}
+
+Word compound(const std::string& prefix, const Word& word) {
+    if (prefix.empty()) return word;
+    return {compound(prefix, word.word), compound(prefix, word.genitive), word.gender};
+}
+
+// "Ur", "Urur", "Ururur", and then "4×Ur".
+Word ur(int count, const Word& word) {
+    if (count <= 0) return word;
+    if (count <= kUrsInWords) {
+        std::string prefix = "Ur";
+        for (int i = 1; i < count; ++i) prefix += "ur";
+        return compound(prefix, word);
+    }
+    const Word one = compound("Ur", word);
+    const std::string times = std::to_string(count) + "×";
+    return {times + one.word, times + one.genitive, one.gender};
+}
+
+Word great(int generations, const Word& word) {
+    return generations == 0 ? word : ur(generations - 1, compound("Groß", word));
+}
+
+Word ofDegree(int degree, const Word& word) {
+    const auto ordinal = static_cast<std::size_t>(degree - 1);
+    const std::string ending =
+        " " + (ordinal < kOrdinals.size() ? std::string(kOrdinals[ordinal]) : std::to_string(degree) + ".") +
+        " Grades";
+    return {word.word + ending, word.genitive + ending, word.gender};
+}
+
+std::string manner(const BloodWords& way) {
+    if (way.bond == Bond::foster) return "Pflege";
+    if (way.bond == Bond::adopted) return "Adoptiv";
+    if (way.bond == Bond::step) return "Stief";
+    if (way.doubled) return "Doppel";
+    return way.half ? "Halb" : "";
+}
+
+// The common ancestors' children are siblings, of the first degree; their children cousins of the first degree, and
+// so on.
+Word collateral(const BloodWords& way) {
+    const int later = std::abs(way.up - way.down);
+    const int degree = std::min(way.up, way.down);
+    if (later == 0) {
+        if (degree == 3) return compound(manner(way), compound("Groß", cousin()[way.sex]));
+        return ofDegree(degree - 1, compound(manner(way), cousin()[way.sex]));
+    }
+    const Words& words = way.up > way.down ? parentsSibling() : siblingsChild();
+    const Word word = compound(manner(way), great(later - 1, words[way.sex]));
+    return degree == 1 ? word : ofDegree(degree, word);
+}
+
+Word relativeWord(const BloodWords& way) {
+    if (way.up == 1 && way.down == 1) return compound(manner(way), sibling()[way.sex]);
+    if (way.up > 0 && way.down > 0) return collateral(way);
+    if (way.down == 0) return compound(manner(way), great(way.up - 1, parent()[way.sex]));
+    return compound(manner(way), way.down == 1 ? child()[way.sex] : ur(way.down - 2, grandchild()[way.sex]));
+}
+
+class German : public KinshipWords {
+public:
+    std::string self() const override { return "dieselbe Person"; }
+    Noun relative(const BloodWords& way) const override { return noun(relativeWord(way)); }
+    std::string relativeOnSide(const BloodWords& way) const override {
+        const std::string word = relativeWord(way).word;
+        if (way.up < 2 || way.down > 1 || way.side == KinSide::none) return word;
+        return word + (way.side == KinSide::father ? " väterlicherseits" : " mütterlicherseits");
+    }
+    Noun spouse(UnionState state, Sex sex) const override { return noun(spouseWords(state)[sex]); }
+    Noun inLaw(InLaw which, Sex sex) const override {
+        switch (which) {
+            case InLaw::parent:
+                return noun(compound("Schwieger", parent()[sex]));
+            case InLaw::child:
+                return noun(compound("Schwieger", child()[sex]));
+            case InLaw::sibling:
+                return noun(siblingInLaw()[sex]);
+            case InLaw::stepparent:
+                return noun(compound("Stief", parent()[sex]));
+            case InLaw::stepchild:
+                return noun(compound("Stief", child()[sex]));
+            case InLaw::stepsibling:
+                break;
+        }
+        return noun(compound("Stief", sibling()[sex]));
+    }
+    Noun owned(const Noun& owner, const Noun& relative) const override {
+        return {relative.plain + " " + owner.owner, relative.ofOne + " " + owner.owner,
+                relative.owner + " " + owner.owner};
+    }
+    Noun spouseOf(const Noun& spouse, const Noun& relative) const override {
+        return {spouse.plain + " " + relative.ofOne, spouse.ofOne + " " + relative.ofOne,
+                spouse.owner + " " + relative.ofOne};
+    }
+    std::string both(const std::string& near, const std::string& far) const override {
+        return near + " und " + far;
+    }
+    std::string inWays(const std::string& relation, const std::string& count) const override {
+        return relation + ", auf " + count + " Wegen";
+    }
+    std::string byMarriage(const std::string& links) const override {
+        return "verschwägert über " + links + " Verbindungen";
+    }
+};
+
+}  // namespace
+
+const KinshipWords& germanKinship() {
+    static const German kGerman;
+    return kGerman;
+}
+
+}  // namespace olvane::kin
