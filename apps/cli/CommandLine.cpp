@@ -316,6 +316,7 @@ private:
     LayoutOptions completedLayoutOptions() const {
         LayoutOptions options = layoutOptions_;
         completeViewOptions(*layout_, options.request);
+        options.request.unknownParents = true;  // they are in the layout
         if (isEngineView(options.request.view)) return options;
         if (!isGiven(*layout_, "--format")) options.format = LayoutFormat::json;
         if (options.format != LayoutFormat::json) {

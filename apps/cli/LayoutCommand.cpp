@@ -16,7 +16,7 @@ namespace olvane::cli {
 namespace {
 
 std::string outputOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options) {
-    if (!isEngineView(options.request.view)) {
+    if (options.format == LayoutFormat::json) {
         return PictureRun(data, options.request, hiddenPersons(data, options.hiding)).jsonOf(focus);
     }
     const std::string text = layoutText(data, focus, options.request);

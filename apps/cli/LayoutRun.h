@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include <olvane/boundary/TypedLayout.h>
 #include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/layouter/TreeSize.h>
@@ -24,8 +25,9 @@ struct LayoutRequest {
     int generations = 5;           // columns of a pedigree, the focus's own included
     charts::ChartRequest chart{};  // of the other views; view, focus and sizes are filled in by PictureRun
     BoxForm boxes = BoxForm::tall;
-    // Relatives that a family view leaves out, by the engine's option keys.
-    std::vector<std::string> keysOff;
+    // Which relatives a family view shows; sizes and generations are filled in by typedLayout.
+    olvane::LayoutOptions engine{};
+    bool unknownParents = false;  // a picture of a view of the engine has boxes for parents who are not known
 };
 
 // Whether the engine makes the view, so that it has a result text.
@@ -35,9 +37,12 @@ inline bool isEngineView(View view) {
 
 TreeSize sizeOf(BoxForm boxes);
 
-// The result text of one layout, of a view of the engine. Safe to call on several threads with the same data.
+// One layout of a view of the engine, as values and as text. Safe to call on several threads with the same data.
 // Fails: std::length_error, with a sentence for the user, where the layout asks for more than 5 million relatives;
 //        passes on what the engine throws; an id that is no person throws std::out_of_range.
+TypedLayout typedLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
+
+// Its text alone. Fails as typedLayout does.
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
 
 }  // namespace olvane::cli

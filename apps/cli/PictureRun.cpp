@@ -10,6 +10,7 @@
 #include <utility>
 
 #include <olvane/charts/Charts.h>
+#include <olvane/picture/LayoutPicture.h>
 #include <olvane/source/GedcomKin.h>
 
 #include <cli/PersonJson.h>
@@ -46,11 +47,22 @@ bool PictureRun::isHidden(std::int64_t id) const {
 }
 
 picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
-    charts::ChartRequest chart = request_.chart;
-    chart.focus = graph_.placeOf(focus);
-    picture::Picture picture = charts::chartOf(graph_, chart);
+    picture::Picture picture = isEngineView(request_.view) ? enginePictureOf(focus) : chartOf(focus);
     if (!hidden_.empty()) hideIn(picture);
     return picture;
+}
+
+picture::Picture PictureRun::enginePictureOf(gedcom::PersonId focus) const {
+    picture::LayoutPictureOptions options;
+    options.known = &graph_;
+    options.unknownParents = request_.unknownParents;
+    return picture::pictureOf(typedLayout(data_, focus, request_), options);
+}
+
+picture::Picture PictureRun::chartOf(gedcom::PersonId focus) const {
+    charts::ChartRequest chart = request_.chart;
+    chart.focus = graph_.placeOf(focus);
+    return charts::chartOf(graph_, chart);
 }
 
 void PictureRun::hideIn(picture::Picture& picture) const {

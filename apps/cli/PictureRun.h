@@ -15,10 +15,10 @@
 
 namespace olvane::cli {
 
-// Pictures of one file in one view: of any that is made by charts.
+// Pictures of one file in one view.
 //
 // Holds: refers to the data, which must outlive it. Safe to ask on several threads.
-// Fails: what charts throw passes on.
+// Fails: passes on what typedLayout and charts throw.
 class PictureRun {
 public:
     // hidden: whom nothing is told of, an entry for each person; empty for nobody.
@@ -35,6 +35,8 @@ public:
     std::string jsonOf(gedcom::PersonId focus) const;
 
 private:
+    picture::Picture enginePictureOf(gedcom::PersonId focus) const;
+    picture::Picture chartOf(gedcom::PersonId focus) const;
     bool isHidden(std::int64_t id) const;
     void hideIn(picture::Picture& picture) const;
 

@@ -12,8 +12,6 @@
 
 #include <CLI/CLI.hpp>
 
-#include <olvane/family/FamilyOptions.h>
-
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -24,26 +22,22 @@ constexpr int kMostPedigreeGenerations = 12;
 
 struct FamilySwitch {
     const char* name;
-    const std::string& key;
+    bool olvane::LayoutOptions::*shown;
     const char* help;
 };
 
-const std::vector<FamilySwitch>& familySwitches() {
-    using namespace SharedTreeViewer;
-    static const std::vector<FamilySwitch> kSwitches = {
-        {"--no-aunts-uncles", kTreeViewFamShowAuntsUnclesKey,
-         "Leave out siblings of the parents, and so cousins too"},
-        {"--no-cousins", kTreeViewFamShowCousinsKey, "Leave out children of the parents' siblings"},
-        {"--no-siblings", kTreeViewFamShowSiblingsKey, "Leave out siblings and half siblings"},
-        {"--no-sibling-spouses", kTreeViewFamShowSiblingSpousesKey, "Leave out spouses of the siblings"},
-        {"--no-nieces-nephews", kTreeViewFamShowNeicesNephewsKey, "Leave out children of the siblings"},
-        {"--no-grandchildren", kTreeViewFamShowGrandchildrenKey, "Leave out grandchildren"},
-        {"--no-great-grandparents", kTreeViewFamShowGreatGrandparentsKey, "Leave out great-grandparents"},
-        {"--no-spouses-of-children", kTreeViewFamShowSpousesOfChildrenKey,
-         "Leave out spouses of the children"},
-    };
-    return kSwitches;
-}
+constexpr FamilySwitch kFamilySwitches[] = {
+    {"--no-aunts-uncles", &olvane::LayoutOptions::auntsUncles,
+     "Leave out siblings of the parents, and so cousins too"},
+    {"--no-cousins", &olvane::LayoutOptions::cousins, "Leave out children of the parents' siblings"},
+    {"--no-siblings", &olvane::LayoutOptions::siblings, "Leave out siblings and half siblings"},
+    {"--no-sibling-spouses", &olvane::LayoutOptions::siblingSpouses, "Leave out spouses of the siblings"},
+    {"--no-nieces-nephews", &olvane::LayoutOptions::niecesNephews, "Leave out children of the siblings"},
+    {"--no-grandchildren", &olvane::LayoutOptions::grandchildren, "Leave out grandchildren"},
+    {"--no-great-grandparents", &olvane::LayoutOptions::greatGrandparents, "Leave out great-grandparents"},
+    {"--no-spouses-of-children", &olvane::LayoutOptions::spousesOfChildren,
+     "Leave out spouses of the children"},
+};
 
 const std::map<std::string, View>& views() {
     static const std::map<std::string, View> kViews = {
@@ -126,11 +120,8 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
 }
 
 void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
-    for (const FamilySwitch& option : familySwitches()) {
-        const std::string& key = option.key;
-        command
-            .add_flag_callback(
-                option.name, [&request, &key] { request.keysOff.push_back(key); }, option.help)
+    for (const FamilySwitch& option : kFamilySwitches) {
+        command.add_flag("!" + std::string(option.name), request.engine.*option.shown, option.help)
             ->group("Family view");
     }
 }
@@ -159,7 +150,7 @@ void refuseIdle(const CLI::App& command, const char* option, std::span<const Vie
 void refuseIdleOptions(const CLI::App& command, View view) {
     constexpr View kFamilyAlone[] = {View::family};
     for (const OptionUse& use : optionUses()) refuseIdle(command, use.option, use.views, view);
-    for (const FamilySwitch& option : familySwitches()) refuseIdle(command, option.name, kFamilyAlone, view);
+    for (const FamilySwitch& option : kFamilySwitches) refuseIdle(command, option.name, kFamilyAlone, view);
 }
 
 // Counted with the focus's own in --generations, and from the focus on in a chart.

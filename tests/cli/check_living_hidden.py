@@ -111,7 +111,7 @@ class Outputs:
         for person in self.people:
             if person[0] in seen:
                 continue
-            layout = json.loads(run(self.command, "layout", self.path, "--focus", person[0], "--format", "json", *self.hiding))
+            layout = json.loads(run(self.command, "layout", self.path, "--focus", person[0], "--format", "json1", *self.hiding))
             for box in layout["boxes"]:
                 seen.add(str(box["id"]))
                 if box.get("living"):
@@ -125,10 +125,10 @@ class Outputs:
 
     def add_pictures(self, focus):
         name = f"of {focus}"
-        layout = run(self.command, "layout", self.path, "--focus", focus, "--format", "json", *self.hiding)
+        layout = run(self.command, "layout", self.path, "--focus", focus, "--format", "json1", *self.hiding)
         self.texts["json " + name] = layout.decode()
-        for view in ("hourglass", "relatives"):
-            chart = run(self.command, "layout", self.path, "--focus", focus, "--view", view, *self.hiding)
+        for view in ("family", "hourglass", "relatives"):
+            chart = run(self.command, "layout", self.path, "--focus", focus, "--view", view, "--format", "json", *self.hiding)
             self.texts[view + " " + name] = chart.decode()
         for ending in (".svg", ".pdf", ".png"):
             picture = self.folder / ("out" + ending)
