@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // layouts-at-once FILE.ged CASEFILE...: lays out on four threads at once, and compares each result with the one
-// that was made alone. Each person of the file is a focus in both views, over data that all threads read; each
+// that was made alone. Each person of the file is a focus in both views, over data that all threads read and over
+// copies of its table that each thread changes; each
 // case is laid out with its graph and its questions. The threads begin at different places, so that different
 // layouts meet.
 //
@@ -21,8 +22,10 @@
 #include <olvane/boundary/LayoutPieces.h>
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/kin/FamilyDataSource.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 #include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/GedcomFamily.h>
 #include <support/CaseFile.h>
 #include <support/CaseRun.h>
 
@@ -62,6 +65,25 @@ void addLayoutsOfFile(const GedcomData& data, std::vector<Layout>& layouts) {
         layouts.emplace_back(
             [&data, focus] { return FamilyViewLayout(focus, std::make_shared<GedcomDataSource>(data)); });
         layouts.emplace_back([&data, focus] { return pedigreeText(data, focus); });
+    }
+}
+
+// The same of a table that all threads read, and of copies of it that each changes for itself.
+void addLayoutsOfTable(const olvane::Family& table, std::vector<Layout>& layouts) {
+    for (const olvane::FamilyId id : table.personIds()) {
+        layouts.emplace_back([&table, id] {
+            return FamilyViewLayout(std::to_string(id), std::make_shared<olvane::FamilyDataSource>(table));
+        });
+        layouts.emplace_back([&table, id] {
+            olvane::Family copy = table;
+            copy.setField(id, "note", "changed");
+            olvane::PersonRow row = copy.person(id);
+            row.father = 0;
+            copy.setPerson(row);
+            const olvane::Family other = copy;
+            copy.removePerson(id);
+            return FamilyViewLayout(std::to_string(id), std::make_shared<olvane::FamilyDataSource>(other));
+        });
     }
 }
 
@@ -111,6 +133,8 @@ int run(const std::vector<std::string>& files) {
     const GedcomData data = olvane::gedcom::readGedcomFile(files.front());
     std::vector<Layout> layouts;
     addLayoutsOfFile(data, layouts);
+    const olvane::Family table = olvane::gedcom::familyOf(data);
+    addLayoutsOfTable(table, layouts);
     for (std::size_t i = 1; i < files.size(); ++i) addLayoutOfCase(files[i], layouts);
     const std::vector<std::string> alone = makeAlone(layouts);
     const std::size_t differences = differencesAtOnce(layouts, alone);
