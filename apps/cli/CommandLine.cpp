@@ -111,6 +111,7 @@ public:
         addDraw();
         addBatch();
         addCheck();
+        addKin();
         addJudge();
         addPage();
     }
@@ -128,6 +129,7 @@ public:
         if (layout_->parsed()) return runLayout(completedLayoutOptions());
         if (batch_->parsed()) return runBatch(completedBatchOptions());
         if (check_->parsed()) return runCheck(completedCheckOptions());
+        if (kin_->parsed()) return runKin(kinOptions_);
         if (judge_->parsed()) return runJudge(judgeOptions_);
         if (page_->parsed()) return runPage(pageOptions_);
         return runDraw(completedDrawOptions());
@@ -139,7 +141,8 @@ private:
         const std::vector<std::string> strangers = app_.remaining();
         if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
             return "there is no command '" + strangers.front() +
-                   "', but people, layout, draw, batch, check, judge and page; 'olvane --help' tells more";
+                   "', but people, layout, draw, batch, check, kin, judge and page; 'olvane --help' tells "
+                   "more";
         }
         return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' tells more";
     }
@@ -256,6 +259,33 @@ private:
                        "default tall, and wide in a pedigree and in charts that lie sideways");
     }
 
+    void addKin() {
+        kin_ = app_.add_subcommand("kin", "Say how two persons are related, and list the ways between them");
+        addFile(*kin_, kinOptions_.input);
+        const char* const who = "an xref, a number of 'olvane people' or words of the name";
+        kin_->add_option("A", kinOptions_.a, std::string("The person to start from: ") + who)
+            ->required()
+            ->type_name("");
+        kin_->add_option("B", kinOptions_.b, std::string("The person who is a relative of A: ") + who)
+            ->required()
+            ->type_name("");
+        static const std::map<std::string, bool> kFormats = {{"text", false}, {"json", true}};
+        kin_->add_option(
+                "--format", kinOptions_.json,
+                "text: what B is to A, then a line for each way (default); json: the ways, how many there "
+                "are, and the kinship coefficient")
+            ->transform(CLI::CheckedTransformer(kFormats))
+            ->type_name("text|json");
+        kin_->add_option("--ways", kinOptions_.ways, "The most ways of each sort that are listed; default 50")
+            ->check(CLI::Range(1, 1000000))
+            ->type_name("N");
+        kin_->add_option(
+                "--language", kinOptions_.language,
+                "Language of the words: en, de or es; that of the environment when not given, or English")
+            ->check(CLI::IsMember({"en", "de", "es"}))
+            ->type_name("en|de|es");
+    }
+
     void addJudge() {
         judge_ = app_.add_subcommand("judge", "Count what makes a picture hard to read, in pictures as JSON");
         judge_
@@ -362,6 +392,7 @@ private:
     CLI::App* draw_ = nullptr;
     CLI::App* batch_ = nullptr;
     CLI::App* check_ = nullptr;
+    CLI::App* kin_ = nullptr;
     CLI::App* judge_ = nullptr;
     CLI::App* page_ = nullptr;
     PeopleOptions peopleOptions_;
@@ -369,6 +400,7 @@ private:
     DrawOptions drawOptions_;
     BatchOptions batchOptions_;
     CheckOptions checkOptions_;
+    KinOptions kinOptions_;
     JudgeOptions judgeOptions_;
     PageOptions pageOptions_;
 };

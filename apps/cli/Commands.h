@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -61,6 +62,15 @@ struct CheckOptions {
     LayoutRequest request;
 };
 
+struct KinOptions {
+    InputOptions input;
+    std::string a;
+    std::string b;
+    bool json = false;
+    std::size_t ways = 50;  // of each sort, at least 1
+    std::string language;   // code of the words; empty for that of the environment
+};
+
 struct JudgeOptions {
     std::vector<std::string> files;  // pictures as JSON, "-" for the standard input
     InputOptions family;             // what is known, without a file for nothing
@@ -81,6 +91,7 @@ int runLayout(const LayoutOptions& options);
 int runDraw(const DrawOptions& options);
 int runBatch(const BatchOptions& options);
 int runCheck(const CheckOptions& options);
+int runKin(const KinOptions& options);
 int runJudge(const JudgeOptions& options);
 int runPage(const PageOptions& options);
 

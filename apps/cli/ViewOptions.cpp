@@ -41,9 +41,14 @@ constexpr FamilySwitch kFamilySwitches[] = {
 
 const std::map<std::string, View>& views() {
     static const std::map<std::string, View> kViews = {
-        {"family", View::family},       {"pedigree", View::pedigree},       {"near", View::near},
-        {"ancestors", View::ancestors}, {"descendants", View::descendants}, {"hourglass", View::hourglass},
+        {"family", View::family},
+        {"pedigree", View::pedigree},
+        {"near", View::near},
+        {"ancestors", View::ancestors},
+        {"descendants", View::descendants},
+        {"hourglass", View::hourglass},
         {"relatives", View::relatives},
+        {"fan", View::fan},
     };
     return kViews;
 }
@@ -59,13 +64,15 @@ const std::vector<OptionUse>& optionUses() {
                                              View::relatives};
     static const std::vector<OptionUse> kUses = {
         {"--generations",
-         {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives}},
-        {"--up", {View::ancestors, View::hourglass, View::relatives}},
-        {"--down", {View::descendants, View::hourglass, View::relatives}},
+         {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives, View::fan}},
+        {"--up", {View::ancestors, View::hourglass, View::relatives, View::fan}},
+        {"--down", {View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--direction", kTrees},
         {"--siblings", {View::ancestors, View::hourglass}},
-        {"--no-spouses", {View::descendants, View::hourglass, View::relatives}},
+        {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--compact", kTrees},
+        {"--of", {View::fan}},
+        {"--angle", {View::fan}},
     };
     return kUses;
 }
@@ -80,7 +87,8 @@ void addView(CLI::App& command, LayoutRequest& request) {
             "--view", request.view,
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
             "the relatives of family, placed anew without overlaps; ancestors, descendants, hourglass (both) "
-            "and relatives (the descendants of every ancestor): any number of generations, each person once")
+            "and relatives (the descendants of every ancestor): any number of generations, each person once; "
+            "fan: ancestors or descendants in rings")
         ->transform(CLI::CheckedTransformer(views()))
         ->type_name("VIEW");
     command
@@ -115,6 +123,19 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
     command.add_flag("--siblings", chart.siblings, "Show siblings of the focus and of its ancestors")
         ->group(group);
     command.add_flag("!--no-spouses", chart.spouses, "Leave out spouses of descendants")->group(group);
+    static const std::map<std::string, charts::FanOf> kFansOf = {{"ancestors", charts::FanOf::ancestors},
+                                                                 {"descendants", charts::FanOf::descendants}};
+    command
+        .add_option("--of", chart.fanOf, "Whom a fan shows in its rings: ancestors (default) or descendants")
+        ->transform(CLI::CheckedTransformer(kFansOf))
+        ->type_name("ancestors|descendants")
+        ->group(group);
+    command
+        .add_option("--angle", chart.fanAngle,
+                    "How far a fan reaches around its middle: 90 to 360 (default) degrees")
+        ->check(CLI::Range(90.0, 360.0))
+        ->type_name("DEGREES")
+        ->group(group);
     command.add_flag("--compact", chart.compact, "Pack generations tighter where the boxes allow it")
         ->group(group);
 }

@@ -20,7 +20,7 @@ def options_of(command, subcommand):
 def main():
     command, folder = sys.argv[1], pathlib.Path(sys.argv[2])
     options = options_of(command, [])
-    for subcommand in ("people", "layout", "draw", "batch", "check", "judge", "page"):
+    for subcommand in ("people", "layout", "draw", "batch", "check", "kin", "judge", "page"):
         options |= options_of(command, [subcommand])
     if "--focus" not in options or "--version" not in options:
         raise SystemExit(f"the help tells too little: {sorted(options)}")

@@ -10,15 +10,19 @@ _olvane() {
     else
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
-    local commands="people layout draw batch check judge page"
-    local view="--view --generations --boxes --up --down --direction --siblings --no-spouses --compact"
+    local commands="people layout draw batch check kin judge page"
+    local view="--view --generations --boxes --up --down --direction --siblings --no-spouses --compact --of --angle"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"
     local encodings="UTF-8 UTF-16LE UTF-16BE ANSEL windows-1250 windows-1251 windows-1252 windows-1253 ISO-8859-2 \
         ISO-8859-15 KOI8-R GB18030 Big5 Shift_JIS EUC-JP EUC-KR IBM437 IBM850"
     case $prev in
-        --view) COMPREPLY=($(compgen -W "family pedigree near ancestors descendants hourglass relatives" -- "$cur")); return ;;
+        --view) COMPREPLY=($(compgen -W "family pedigree near ancestors descendants hourglass relatives fan" -- "$cur")); return ;;
+        --of) COMPREPLY=($(compgen -W "ancestors descendants" -- "$cur")); return ;;
+        --angle) COMPREPLY=($(compgen -W "90 180 270 360" -- "$cur")); return ;;
+        --language) COMPREPLY=($(compgen -W "en de es" -- "$cur")); return ;;
+        --ways) return ;;
         --direction) COMPREPLY=($(compgen -W "down up left right" -- "$cur")); return ;;
         --up | --down) COMPREPLY=($(compgen -W "0 1 2 3 4 5 6 7 8" -- "$cur")); return ;;
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
@@ -44,6 +48,7 @@ _olvane() {
         draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --encoding --focus --all $view $family" -- "$cur")) ;;
+        kin) COMPREPLY=($(compgen -W "--help --encoding --format --ways --language" -- "$cur")) ;;
         judge) COMPREPLY=($(compgen -W "--help --encoding --family --format" -- "$cur")) ;;
         page) COMPREPLY=($(compgen -W "--help --encoding --focus --output --title --view $living" -- "$cur")) ;;
     esac
