@@ -45,12 +45,24 @@ export class Olvane {
     }
 }
 
-// Node reads files otherwise than a browser; the name stands apart so that no bundler looks for it.
+// Node reads files otherwise than a browser; bundlers leave its module alone.
 async function moduleBesideThisFile() {
     const place = new URL("olvane.wasm", import.meta.url);
-    if (place.protocol !== "file:") return (await fetch(place)).arrayBuffer();
-    const files = "node:fs/promises";
-    return (await import(files)).readFile(place);
+    if (place.protocol === "file:") {
+        const files = "node:fs/promises";
+        return (await import(/* webpackIgnore: true */ /* @vite-ignore */ files)).readFile(place);
+    }
+    const response = await fetch(place);
+    if (!response.ok) throw new Error(`${place.href}: ${response.status} ${response.statusText}`.trimEnd());
+    const bytes = await response.arrayBuffer();
+    checkMagic(new Uint8Array(bytes, 0, Math.min(4, bytes.byteLength)), place.href);
+    return bytes;
+}
+
+// A server that answers everything with its start page answers this, too.
+function checkMagic(bytes, address) {
+    if ([0x00, 0x61, 0x73, 0x6d].every((byte, i) => bytes[i] === byte)) return;
+    throw new Error(`${address}: what came is no WebAssembly module`);
 }
 
 export async function loadOlvane(module) {

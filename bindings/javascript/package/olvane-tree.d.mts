@@ -1,0 +1,91 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+/** What is looked at. Numbers of persons count from 1 in the order of the file. */
+export interface ViewState {
+    readonly focus: number;
+    readonly view:
+        | "family"
+        | "pedigree"
+        | "near"
+        | "ancestors"
+        | "descendants"
+        | "hourglass"
+        | "relatives"
+        | "fan"
+        | "kinship"
+        | "everybody";
+    /** Columns of the pedigree, the focus's own included. */
+    readonly generations: number;
+    /** Of the other charts: generations above and below the focus, 0 for all. */
+    readonly up: number;
+    readonly down: number;
+    readonly direction: "down" | "up" | "left" | "right";
+    /** The other person of the kinship view; 0 for nobody. */
+    readonly to: number;
+    /** Groups of relatives that the family view leaves out. */
+    readonly hidden: ReadonlySet<string>;
+}
+
+/** A person of the family that is shown. */
+export interface Person {
+    readonly id: number;
+    /** The record's own name in the file, without its @; empty without one. */
+    readonly xref: string;
+    readonly name: string;
+    readonly given: string;
+    readonly surname: string;
+    readonly sex: "male" | "female" | "other";
+    readonly father: number;
+    readonly mother: number;
+    readonly spouses: readonly number[];
+    readonly children: readonly number[];
+}
+
+export interface OlvaneTreeEventMap {
+    /** Another person is selected: the panel is about them. */
+    select: CustomEvent<{ person: Person }>;
+    /** Another picture is shown. byUser is false where the program asked for it. */
+    focuschange: CustomEvent<{ state: ViewState; person: Person; boxes: number; byUser: boolean }>;
+    /** The box of an unknown parent was chosen. */
+    action: CustomEvent<{ child: Person; parent: "father" | "mother" }>;
+    /** A picture could not be laid out; the one before stays. */
+    refused: CustomEvent<{ tooLarge: boolean }>;
+}
+
+/** <olvane-tree src="family.ged" focus="I1" view="hourglass">; importing this package makes it known. */
+export declare class OlvaneTree extends HTMLElement {
+    /** What is shown; null before any picture. */
+    readonly state: ViewState | null;
+    /** The selected person: the one that the panel is about. */
+    readonly selected: Person | null;
+    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be had or read. */
+    load(address: string): Promise<void>;
+    /** Shows the bytes of a GEDCOM file. Rejects where they are none. */
+    open(bytes: Uint8Array, name?: string): Promise<void>;
+    /** Shows a person, a view or options; what is left out stays as it is. False where that was not possible. */
+    show(wanted: Partial<ViewState>): boolean;
+    /** Selects a person without changing the picture. */
+    select(person: number): void;
+    fit(): void;
+    home(): void;
+    zoomBy(factor: number): void;
+    /** The whole picture as the text of an SVG file; null before any. */
+    saveSvg(): string | null;
+    addEventListener<Name extends keyof OlvaneTreeEventMap>(
+        type: Name,
+        listener: (this: OlvaneTree, event: OlvaneTreeEventMap[Name]) => unknown,
+        options?: boolean | AddEventListenerOptions,
+    ): void;
+    addEventListener(
+        type: string,
+        listener: EventListenerOrEventListenerObject,
+        options?: boolean | AddEventListenerOptions,
+    ): void;
+}
+
+declare global {
+    interface HTMLElementTagNameMap {
+        "olvane-tree": OlvaneTree;
+    }
+}

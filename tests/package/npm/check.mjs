@@ -1,0 +1,184 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The packages for npm as programs use them: installed from their archives, built by each bundler, and opened in a
+// real browser or run in Node.
+//
+//     node check.mjs --packages DIR [--quick] [--work DIR]
+//
+// DIR holds olvane-VERSION.tgz and olvane-tree-VERSION.tgz. --quick takes Node and one bundler alone.
+
+import assert from "node:assert/strict";
+import { execFileSync, spawn } from "node:child_process";
+import { existsSync, mkdirSync, mkdtempSync, readdirSync, readFileSync, rmSync, writeFileSync } from "node:fs";
+import { createServer } from "node:http";
+import { createRequire } from "node:module";
+import { tmpdir } from "node:os";
+import { extname, join, resolve } from "node:path";
+import { parseArgs } from "node:util";
+
+const { values } = parseArgs({ options: { packages: { type: "string" }, quick: { type: "boolean" }, work: { type: "string" } } });
+const work = values.work ? resolve(values.work) : mkdtempSync(join(tmpdir(), "olvane-npm-"));
+mkdirSync(work, { recursive: true });
+const archives = readdirSync(values.packages).filter((name) => name.endsWith(".tgz")).map((name) => resolve(values.packages, name));
+
+const kTools = values.quick
+    ? ["esbuild@0.28", "playwright-core@1.58"]
+    : ["esbuild@0.28", "playwright-core@1.58", "vite@7", "webpack@5", "webpack-cli@6", "rollup@4", "@rollup/plugin-node-resolve@16", "publint@0.3", "@arethetypeswrong/cli@0.18"];
+
+const kFamily = "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n0 @I1@ INDI\n1 NAME Ada /Berg/\n1 FAMC @F1@\n0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I3@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I2@\n1 WIFE @I3@\n1 CHIL @I1@\n0 TRLR\n";
+const kUse = `const olvane = await loadOlvane();
+const file = olvane.readGedcom(new TextEncoder().encode(${JSON.stringify(kFamily)}), "family.ged");
+const boxes = file.picture(1, { view: "ancestors" }).boxes.length;`;
+
+function run(command, args, cwd = work) {
+    return execFileSync(command, args, { cwd, encoding: "utf8", stdio: ["ignore", "pipe", "pipe"] });
+}
+function write(path, text) {
+    mkdirSync(join(work, path, ".."), { recursive: true });
+    writeFileSync(join(work, path), text);
+}
+const bin = (name) => join(work, "node_modules/.bin", name);
+
+write("package.json", JSON.stringify({ private: true, type: "module" }));
+run("npm", ["install", "--no-audit", "--no-fund", "--loglevel=error", ...archives, ...kTools]);
+
+// A page that says in its title what it found: 3, the boxes of a child and its parents.
+const kPage = (script) => `<!doctype html><meta charset="utf-8"><title>waiting</title>${script}`;
+const kReport = `${kUse}\ndocument.title = String(boxes);`;
+const kMain = (from) => `import { loadOlvane } from "${from}";\n(async () => { ${kReport} })().catch((error) => (document.title = String(error)));\n`;
+const kWorker = `import { loadOlvane } from "olvane";\nonmessage = async () => { try { ${kUse} postMessage(boxes); } catch (error) { postMessage(String(error)); } };\n`;
+const kWorkerPage = `const worker = new Worker(new URL("./worker.js", import.meta.url), { type: "module" });\nworker.onmessage = ({ data }) => (document.title = String(data));\nworker.postMessage(0);\n`;
+
+const kTypes = { ".html": "text/html", ".js": "text/javascript", ".mjs": "text/javascript", ".wasm": "application/wasm", ".ged": "text/plain" };
+const server = createServer((request, response) => {
+    const path = join(work, decodeURIComponent(new URL(request.url, "http://localhost").pathname));
+    if (!path.startsWith(work) || !existsSync(path)) return response.writeHead(404).end();
+    response.writeHead(200, { "content-type": kTypes[extname(path)] ?? "application/octet-stream" }).end(readFileSync(path));
+});
+await new Promise((done) => server.listen(0, "127.0.0.1", done));
+const address = `http://127.0.0.1:${server.address().port}`;
+const { chromium } = createRequire(join(work, "package.json"))("playwright-core");
+const browser = await chromium.launch({ executablePath: process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium", args: ["--no-sandbox", "--disable-gpu"] });
+
+async function titleOf(url) {
+    const page = await browser.newPage();
+    try {
+        await page.goto(url);
+        await page.waitForFunction(() => document.title !== "waiting", undefined, { timeout: 20_000 });
+        return await page.title();
+    } finally {
+        await page.close();
+    }
+}
+
+const kRoads = {
+    "node, import"() {
+        write("node.mjs", `import { loadOlvane } from "olvane";\n${kUse}\nconsole.log(boxes);`);
+        return run("node", ["node.mjs"]).trim();
+    },
+    "node, require"() {
+        write("node.cjs", `const { loadOlvane } = require("olvane");\n(async () => { ${kUse} console.log(boxes); })();`);
+        return run("node", ["node.cjs"]).trim();
+    },
+    "node, require of the inline one"() {
+        write("inline.cjs", `const { loadOlvane } = require("olvane/inline");\n(async () => { ${kUse} console.log(boxes); })();`);
+        return run("node", ["inline.cjs"]).trim();
+    },
+    async esbuild() {
+        write("esbuild/main.js", kMain("olvane/inline"));
+        run(bin("esbuild"), ["esbuild/main.js", "--bundle", "--format=esm", "--outfile=esbuild/out.js", "--log-level=error"]);
+        write("esbuild/index.html", kPage('<script type="module" src="out.js"></script>'));
+        return titleOf(`${address}/esbuild/index.html`);
+    },
+    async "plain module script"() {
+        const map = '<script type="importmap">{"imports": {"olvane": "/node_modules/olvane/olvane.mjs"}}</script>';
+        write("plain/index.html", kPage(`${map}<script type="module">${kMain("olvane")}</script>`));
+        return titleOf(`${address}/plain/index.html`);
+    },
+    async "plain script (IIFE)"() {
+        const use = `(async () => { const { loadOlvane } = olvane; { ${kUse.replace("const olvane =", "const engine =").replaceAll("olvane.readGedcom", "engine.readGedcom")} document.title = String(boxes); } })()`;
+        write("iife/index.html", kPage(`<script src="/node_modules/olvane/olvane.iife.js"></script><script>${use}</script>`));
+        return titleOf(`${address}/iife/index.html`);
+    },
+    async "a wrong response for the module is named"() {
+        write("wrong/olvane.mjs", readFileSync(join(work, "node_modules/olvane/olvane.mjs"), "utf8"));
+        write("wrong/index.html", kPage(`<script type="module">${kMain("./olvane.mjs")}</script>`));
+        const missing = await titleOf(`${address}/wrong/index.html`);
+        assert.match(missing, /wrong\/olvane\.wasm: 404/);
+        write("wrong/olvane.wasm", "<!doctype html>");
+        const wrong = await titleOf(`${address}/wrong/index.html`);
+        assert.match(wrong, /wrong\/olvane\.wasm: .*no WebAssembly/);
+        return "3";
+    },
+    async "the element, plain"() {
+        write("element/family.ged", kFamily);
+        write("element/index.html", kPage(`<olvane-tree src="family.ged" view="ancestors" style="height: 400px"></olvane-tree>
+<script type="module">import "/node_modules/olvane-tree/olvane-tree.mjs";
+document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail }) => (document.title = String(detail.boxes)));</script>`));
+        return titleOf(`${address}/element/index.html`);
+    },
+    ...(values.quick ? {} : {
+        async rollup() {
+            write("rollup/main.js", kMain("olvane/inline"));
+            run(bin("rollup"), ["rollup/main.js", "-p", "@rollup/plugin-node-resolve", "-f", "es", "-o", "rollup/out.js", "--silent"]);
+            write("rollup/index.html", kPage('<script type="module" src="out.js"></script>'));
+            return titleOf(`${address}/rollup/index.html`);
+        },
+        async "webpack, without warnings"() {
+            write("webpack/main.js", kMain("olvane"));
+            write("webpack/webpack.config.cjs", `module.exports = { mode: "production", entry: ${JSON.stringify(join(work, "webpack/main.js"))}, output: { path: ${JSON.stringify(join(work, "webpack/out"))}, filename: "main.js", publicPath: "auto" } };`);
+            const said = run(bin("webpack"), ["--config", "webpack/webpack.config.cjs", "--no-color", "--stats", "errors-warnings"]);
+            assert.doesNotMatch(said.replace(/WARNING in (asset|entrypoint) size limit[\s\S]*/g, "").replace(/WARNING in webpack performance[\s\S]*/g, ""), /WARNING/);
+            write("webpack/index.html", kPage('<script src="out/main.js"></script>'));
+            return titleOf(`${address}/webpack/index.html`);
+        },
+        async "vite build, with a worker"() {
+            write("vite/worker.js", kWorker);
+            write("vite/main.js", kWorkerPage);
+            write("vite/index.html", kPage('<script type="module" src="./main.js"></script>'));
+            write("vite/vite.config.js", 'export default { base: "./", worker: { format: "es" }, build: { outDir: "out" }, optimizeDeps: { exclude: ["olvane"] } };');
+            run(bin("vite"), ["build", "--logLevel", "error"], join(work, "vite"));
+            return titleOf(`${address}/vite/out/index.html`);
+        },
+        async "vite dev, with a worker"() {
+            const port = 5300 + Math.floor(Math.random() * 500);
+            const dev = spawn(bin("vite"), ["--port", String(port), "--strictPort", "--logLevel", "error"], { cwd: join(work, "vite"), stdio: "ignore" });
+            try {
+                for (let tries = 0; tries < 100; ++tries) {
+                    if (await fetch(`http://localhost:${port}/`).then(() => true, () => false)) break;
+                    await new Promise((next) => setTimeout(next, 100));
+                }
+                return await titleOf(`http://localhost:${port}/`);
+            } finally {
+                dev.kill();
+            }
+        },
+        "publint and the types"() {
+            for (const archive of archives) {
+                run(bin("publint"), [archive, "--strict"]);
+                run(bin("attw"), [archive, "--exclude-entrypoints", "olvane.wasm", "custom-elements.json"]);
+            }
+            return "3";
+        },
+    }),
+};
+
+let passed = 0;
+let failed = 0;
+for (const [road, take] of Object.entries(kRoads)) {
+    let found = "";
+    try {
+        found = await take();
+    } catch (error) {
+        found = [error.message, error.stdout, error.stderr].filter(Boolean).join("\n");
+    }
+    if (found === "3") ++passed;
+    else ++failed;
+    console.log(found === "3" ? `ok      ${road}` : `NOT OK  ${road}: ${found}`);
+}
+await browser.close();
+server.close();
+if (!values.work) rmSync(work, { recursive: true, force: true });
+console.log(`${passed} passed, ${failed} failed`);
+process.exitCode = failed > 0 ? 1 : 0;
