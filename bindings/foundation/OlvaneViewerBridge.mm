@@ -21,12 +21,30 @@ namespace {
 
 typedef id<OlvaneViewerManagerWrapProtocol> Host;
 
-// The list is asked for its count at each place anew, so one that changes while it is read is read to its
-// present end. All entries are read before the first question about one of them, since the engine takes a list
-// as a whole: a host must not change a list when it is asked for a date.
+// Holds a host's object for as long as it stands itself.
+class Held {
+public:
+    explicit Held(id object) : object_([object retain]) {}
+    ~Held() { [object_ release]; }
+    Held(const Held&) = delete;
+    Held& operator=(const Held&) = delete;
+
+private:
+    id object_;
+};
+
+// The list is asked for its count at each place anew, and the questions about an entry come before the next one,
+// so a list that changes meanwhile is read to its present end. It is held, since a question may make the host let
+// go of it.
+void visitEntries(NSArray* list, const PersonIdVisitor& visit) {
+    const Held held(list);
+    for (NSUInteger i = 0; i < [list count]; ++i) visit([[list objectAtIndex:i] integerValue]);
+}
+
 std::vector<std::int64_t> idsOf(NSArray* list) {
     std::vector<std::int64_t> ids;
-    for (NSUInteger i = 0; i < [list count]; ++i) ids.push_back([[list objectAtIndex:i] integerValue]);
+    const auto add = [&ids](std::int64_t person) { ids.push_back(person); };
+    visitEntries(list, PersonIdVisitor(add));
     return ids;
 }
 
@@ -45,7 +63,8 @@ std::string narrowDate(NSString* date) {
 
 class FoundationManager final : public OlvaneViewerManagerWrapProtocol {
 public:
-    explicit FoundationManager(Host host) : host_(host) {}
+    // Held for the whole layout: a callback may release the bridge, and with it the host.
+    explicit FoundationManager(Host host) : host_(host), held_((id)host) {}
 
     std::int64_t fatherForPersonWithID(std::int64_t personId) override {
         return [host_ fatherForPersonWithID:personId];
@@ -59,6 +78,12 @@ public:
     std::vector<std::int64_t> childrenForPersonWithID(std::int64_t personId) override {
         return idsOf([host_ childrenForPersonWithID:personId]);
     }
+    void visitSpousesOfPerson(std::int64_t personId, const PersonIdVisitor& visit) override {
+        visitEntries([host_ spousesForPersonWithID:personId], visit);
+    }
+    void visitChildrenOfPerson(std::int64_t personId, const PersonIdVisitor& visit) override {
+        visitEntries([host_ childrenForPersonWithID:personId], visit);
+    }
     bool isPreferredSpouse(std::int64_t personId, std::int64_t spouseId) override {
         return [host_ isPreferredSpouse:personId ofPerson:spouseId] != 0;
     }
@@ -71,23 +96,11 @@ public:
     }
 
 private:
-    Host host_;  // not owned: the bridge holds it for longer than a layout takes
-};
-
-// What the host's answers leave behind goes when the layout ends, not when the caller's pool does.
-class AnswerPool {
-public:
-    AnswerPool() : pool_([[NSAutoreleasePool alloc] init]) {}
-    ~AnswerPool() { [pool_ release]; }
-    AnswerPool(const AnswerPool&) = delete;
-    AnswerPool& operator=(const AnswerPool&) = delete;
-
-private:
-    NSAutoreleasePool* pool_;
+    Host host_;
+    Held held_;
 };
 
 std::string familyText(int64_t personId, Host host) {
-    const AnswerPool pool;
     const auto lowBits = static_cast<std::uint32_t>(static_cast<std::uint64_t>(personId));
     return FamilyViewLayout(intToString(static_cast<int>(lowBits)),
                             std::make_shared<FoundationManager>(host));
@@ -99,15 +112,22 @@ std::string familyText(int64_t personId, Host host) {
 
 - (id)initWithManagerWrap:(id<OlvaneViewerManagerWrapProtocol>)manager {
     self = [super init];
-    if (self) _manager = [(id)manager retain];
+    if (self) {
+        const id before = (id)_manager;  // of an init before this one
+        _manager = [(id)manager retain];
+        [before release];
+    }
     return self;
 }
 
 - (void)dealloc {
-    [(id)_manager release];
+    const id before = (id)_manager;
+    _manager = nil;
+    [before release];
     [super dealloc];
 }
 
+// A callback may release this object, so it is not looked at again once the layout has begun.
 - (NSString*)valuesForPersonId:(int64_t)personId {
     const std::string text = familyText(personId, _manager);
     return [NSString stringWithCString:text.c_str() encoding:[NSString defaultCStringEncoding]];

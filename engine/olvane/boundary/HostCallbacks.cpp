@@ -68,18 +68,28 @@ void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int&
 void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, SpouseSet& spouses) {
     const int id = glue.numberOfKey(key);
     if (id < 1) return;
+    // Places follow one another, so in a set that was empty each record comes last. Records that were there before
+    // may lack a place, and then the way by which a record comes in decides where it goes.
+    const bool endFirst = spouses.empty();
     OlvaneViewerManagerWrapProtocol& source = host(manager);
     int place = 0;
-    for (const std::int64_t entry : source.spousesForPersonWithID(id)) {
+    const auto addEntry = [&](std::int64_t entry) {
         const int spouseId = lowBits(entry);
         const int spouseKey = glue.keyOfNumber(spouseId);
         const bool preferred = source.isPreferredSpouse(id, spouseId);
         const bool alive = !source.isPersonDead(spouseId);
         const std::string date = source.dateForPersonWithID(spouseId, false);
         ViewerGlue::NumberRoom room;
-        spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, firstCharacterOf(date),
-                             glue.textOfKey(spouseKey, room), ++place);
-    }
+        const std::string_view text = glue.textOfKey(spouseKey, room);
+        ++place;
+        if (endFirst) {
+            spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, firstCharacterOf(date), text,
+                                 place);
+        } else {
+            spouses.emplace(spouseKey, preferred, alive, firstCharacterOf(date), text, place);
+        }
+    };
+    source.visitSpousesOfPerson(id, PersonIdVisitor(addEntry));
 }
 
 // An add-node has one child: the person for whom it stands.
@@ -95,12 +105,11 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
         getChildOfAddNode(glue, key, children);
         return;
     }
-    // Children met for the first time come in the order of the set. Records that were there before may lack a
-    // place, and then the way by which a record comes in decides where it goes.
+    // Children met for the first time come in the order of the set; the rest is as with spouses.
     const bool endFirst = children.empty();
     OlvaneViewerManagerWrapProtocol& source = host(manager);
     int place = 0;
-    for (const std::int64_t entry : source.childrenForPersonWithID(id)) {
+    const auto addEntry = [&](std::int64_t entry) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
         const std::string date = source.dateForPersonWithID(lowBits(entry), true);
         ViewerGlue::NumberRoom room;
@@ -111,7 +120,8 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
         } else {
             children.emplace(childKey, firstCharacterOf(date), text, place);
         }
-    }
+    };
+    source.visitChildrenOfPerson(id, PersonIdVisitor(addEntry));
 }
 
 bool isMale(const ViewerGlue& glue, const ManagerReference& manager, int key) {

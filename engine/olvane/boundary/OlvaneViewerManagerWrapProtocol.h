@@ -8,6 +8,22 @@
 #include <string>
 #include <vector>
 
+// Takes the entries of a host's list one by one: a reference to a callable, which must outlive it.
+class PersonIdVisitor {
+public:
+    template <class Visit>
+    explicit PersonIdVisitor(const Visit& visit)
+        : visit_(&visit), call_([](const void* callable, std::int64_t person) {
+              (*static_cast<const Visit*>(callable))(person);
+          }) {}
+
+    void operator()(std::int64_t person) const { call_(visit_, person); }
+
+private:
+    const void* visit_;
+    void (*call_)(const void*, std::int64_t);
+};
+
 // The host's data source: eight questions about persons. All that the engine knows of a family comes through
 // these.
 //
@@ -41,4 +57,14 @@ public:
     virtual std::string dateForPersonWithID(std::int64_t personId, bool isBirth) = 0;
     // 0 for male; any other number counts as female.
     virtual std::int32_t sexOfPersonWithID(std::int64_t personId) = 0;
+
+    // How the engine reads the two lists: the questions about an entry come before the next entry is read. A
+    // data source whose own lists may change while they are read overrides these; for others the whole list is
+    // there before the first question.
+    virtual void visitSpousesOfPerson(std::int64_t personId, const PersonIdVisitor& visit) {
+        for (const std::int64_t spouse : spousesForPersonWithID(personId)) visit(spouse);
+    }
+    virtual void visitChildrenOfPerson(std::int64_t personId, const PersonIdVisitor& visit) {
+        for (const std::int64_t child : childrenForPersonWithID(personId)) visit(child);
+    }
 };

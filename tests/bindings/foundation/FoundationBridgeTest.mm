@@ -17,6 +17,41 @@
 #include <support/FamilyMaker.h>
 #include <support/FamilyText.h>
 
+// Says whether it still holds a host.
+@interface LookingBridge : OlvaneViewerBridge
+- (BOOL)hasHost;
+@end
+
+@implementation LookingBridge
+
+- (BOOL)hasHost {
+    return _manager != nil;
+}
+
+@end
+
+// Looks at its bridge when it goes.
+@interface PartingHost : CaseFoundationHost {
+    LookingBridge* _bridge;  // not held
+    BOOL* _bridgeHadHost;
+}
+- (void)lookAt:(LookingBridge*)bridge into:(BOOL*)bridgeHadHost;
+@end
+
+@implementation PartingHost
+
+- (void)lookAt:(LookingBridge*)bridge into:(BOOL*)bridgeHadHost {
+    _bridge = bridge;
+    _bridgeHadHost = bridgeHadHost;
+}
+
+- (void)dealloc {
+    *_bridgeHadHost = [_bridge hasHost];
+    [super dealloc];
+}
+
+@end
+
 namespace {
 
 using support::CaseFile;
@@ -88,11 +123,34 @@ TEST_F(FoundationBridge, readsTheCountOfAListAtEachPlaceAnew) {
               valuesOf(hostOf<ShrinkingListHost>(family("17+42: 5 6 7")), 17));
 }
 
-TEST_F(FoundationBridge, leavesNothingOfAHostsAnswersBehind) {
+// The children of a childless focus are looked at once; the wife's questions stand between the looks at her list.
+TEST_F(FoundationBridge, readsAListEntryByEntryWithTheQuestionsBetween) {
+    WatchedListHost* host = hostOf<WatchedListHost>(family("17+42: 5 6"));
+    std::vector<std::string> looks;
+    [host writeLooksTo:&looks];
+    valuesOf(host, 17);
+    const auto standsTogether = [&looks](const std::vector<std::string>& wanted) {
+        return std::search(looks.begin(), looks.end(), wanted.begin(), wanted.end()) != looks.end();
+    };
+    EXPECT_TRUE(standsTogether({"count", "entry 42", "preferred 42", "dead 42", "date 42", "count"}));
+    EXPECT_TRUE(standsTogether({"count", "entry 5", "date 5", "count", "entry 6", "date 6", "count"}));
+}
+
+TEST_F(FoundationBridge, readsAListThatGrowsWhileAnEntryIsAskedAboutToItsEnd) {
+    CaseFile grown = family("17+42: 5 6");
+    CaseFile told = grown;
+    told.children[17] = {5};
+    EXPECT_EQ(familyOf(grown), valuesOf(hostOf<GrowingListHost>(told), 17));
+}
+
+TEST_F(FoundationBridge, leavesAHostsAnswersToThePoolOfTheCaller) {
     BareListHost* host = hostOf<BareListHost>(family(kThreeGenerations));
     OlvaneViewerBridge* bridge = [[[OlvaneViewerBridge alloc] initWithManagerWrap:host] autorelease];
     const int before = [BareListHost listsAlive];
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     EXPECT_LT(0u, [[bridge valuesForPersonId:17] length]);
+    EXPECT_LT(before, [BareListHost listsAlive]);
+    [pool release];
     EXPECT_EQ(before, [BareListHost listsAlive]);
 }
 
@@ -177,6 +235,43 @@ TEST_F(FoundationBridge, holdsItsHostAsLongAsItLives) {
     [bridge release];
     EXPECT_EQ(0, [CaseFoundationHost alive]);
     EXPECT_TRUE([text hasPrefix:@"17:27:0:0:"]);
+}
+
+// The bridge holds the only reference to the host, and goes in the first question for children.
+TEST_F(FoundationBridge, holdsTheHostToTheEndOfACallThatReleasesTheBridge) {
+    const CaseFile told = family(kThreeGenerations);
+    ReleasingHost* host = [[ReleasingHost alloc] initWithCase:told];
+    OlvaneViewerBridge* bridge = [[OlvaneViewerBridge alloc] initWithManagerWrap:host];
+    [host setBridge:bridge];
+    [host release];
+    NSString* text = [bridge valuesForPersonId:17];
+    EXPECT_EQ(0, [ReleasingHost alive]);
+    EXPECT_EQ(familyOf(told), [text UTF8String]);
+}
+
+TEST_F(FoundationBridge, aSecondInitLetsTheFirstHostGo) {
+    CaseFoundationHost* first = [[CaseFoundationHost alloc] initWithCase:family("17")];
+    CaseFoundationHost* second = [[CaseFoundationHost alloc] initWithCase:family("17+42")];
+    OlvaneViewerBridge* bridge = [[OlvaneViewerBridge alloc] initWithManagerWrap:first];
+    [first release];
+    bridge = [bridge initWithManagerWrap:second];
+    EXPECT_EQ(1, [CaseFoundationHost alive]);
+    bridge = [bridge initWithManagerWrap:second];
+    [second release];
+    EXPECT_EQ(1, [CaseFoundationHost alive]);
+    const std::string text = [[bridge valuesForPersonId:17] UTF8String];
+    EXPECT_EQ(familyOf(family("17+42")), text);
+    [bridge release];
+}
+
+TEST_F(FoundationBridge, holdsNoHostAnyMoreWhenItLetsItGo) {
+    PartingHost* host = [[PartingHost alloc] initWithCase:family("17")];
+    LookingBridge* bridge = [[LookingBridge alloc] initWithManagerWrap:host];
+    BOOL bridgeHadHost = YES;
+    [host lookAt:bridge into:&bridgeHadHost];
+    [host release];
+    [bridge release];
+    EXPECT_EQ(NO, bridgeHadHost);
 }
 
 }  // namespace

@@ -47,6 +47,28 @@
 @interface NullListHost : CaseFoundationHost
 @end
 
+// The same, writing the looks at its lists down between the questions: "count", "entry 42", "date 42".
+@interface WatchedListHost : CaseFoundationHost {
+    std::vector<std::string>* _looks;
+}
+- (void)writeLooksTo:(std::vector<std::string>*)looks;
+- (void)note:(const std::string&)look;
+@end
+
+// The same, with lists of children that grow by one child while the first child's date is asked for.
+@interface GrowingListHost : CaseFoundationHost {
+    NSMutableArray* _list;
+}
+@end
+
+// The same, releasing a bridge that it was given when it is asked for children, and remembering whether it outlived
+// that.
+@interface ReleasingHost : CaseFoundationHost {
+    NSObject* _bridge;
+}
+- (void)setBridge:(NSObject*)bridge;  // takes the caller's reference over
+@end
+
 // The same, throwing an object that is no NSException where it is asked for children.
 @interface ThrowingHost : CaseFoundationHost
 @end

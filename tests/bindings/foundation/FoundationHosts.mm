@@ -268,3 +268,102 @@ NSString* textOf(const std::string& date) {
 }
 
 @end
+
+// A list that writes down how it is looked at.
+@interface WatchedList : BareList {
+    WatchedListHost* _watcher;  // not held
+}
++ (NSArray*)listOf:(NSArray*)numbers watcher:(WatchedListHost*)watcher;
+@end
+
+@implementation WatchedList
+
++ (NSArray*)listOf:(NSArray*)numbers watcher:(WatchedListHost*)watcher {
+    WatchedList* list = (WatchedList*)[self listOf:numbers];
+    list->_watcher = watcher;
+    return (NSArray*)list;
+}
+
+- (NSUInteger)count {
+    [_watcher note:"count"];
+    return [super count];
+}
+
+- (id)objectAtIndex:(NSUInteger)index {
+    id number = [super objectAtIndex:index];
+    [_watcher note:"entry " + std::to_string([number integerValue])];
+    return number;
+}
+
+@end
+
+@implementation WatchedListHost
+
+- (void)writeLooksTo:(std::vector<std::string>*)looks {
+    _looks = looks;
+}
+
+- (void)note:(const std::string&)look {
+    _looks->push_back(look);
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    return [WatchedList listOf:[super childrenForPersonWithID:personId] watcher:self];
+}
+
+- (NSArray*)spousesForPersonWithID:(int64_t)personId {
+    return [WatchedList listOf:[super spousesForPersonWithID:personId] watcher:self];
+}
+
+- (BOOL)isPreferredSpouse:(int64_t)personId ofPerson:(int64_t)spouseId {
+    [self note:"preferred " + std::to_string(spouseId)];
+    return [super isPreferredSpouse:personId ofPerson:spouseId];
+}
+
+- (BOOL)isPersonDead:(int64_t)personId {
+    [self note:"dead " + std::to_string(personId)];
+    return [super isPersonDead:personId];
+}
+
+- (NSString*)dateForPersonWithID:(int64_t)personId isBirth:(BOOL)isBirth {
+    [self note:"date " + std::to_string(personId)];
+    return [super dateForPersonWithID:personId isBirth:isBirth];
+}
+
+@end
+
+@implementation GrowingListHost
+
+- (void)dealloc {
+    [_list release];
+    [super dealloc];
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    NSArray* told = [super childrenForPersonWithID:personId];
+    if (personId != 17) return told;
+    [_list release];
+    _list = [told mutableCopy];
+    return _list;
+}
+
+- (NSString*)dateForPersonWithID:(int64_t)personId isBirth:(BOOL)isBirth {
+    if (isBirth && personId == 5 && [_list count] == 1) [_list addObject:[NSNumber numberWithInt:6]];
+    return [super dateForPersonWithID:personId isBirth:isBirth];
+}
+
+@end
+
+@implementation ReleasingHost
+
+- (void)setBridge:(NSObject*)bridge {
+    _bridge = bridge;
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    [_bridge release];
+    _bridge = nil;
+    return [super childrenForPersonWithID:personId];
+}
+
+@end

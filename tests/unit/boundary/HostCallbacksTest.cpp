@@ -111,6 +111,19 @@ TEST(SpousesOfAPerson, personWithoutAnyLeavesTheSetAsItCame) {
     EXPECT_EQ((Calls{"spousesForPersonWithID 17"}), request.newCalls());
 }
 
+// 98 has no place, so 43, who lives, stands ahead of it; 42 has the place of 99 and is left out. Records with and
+// without places have no one order among them, so where 43 comes in decides.
+TEST(SpousesOfAPerson, goAmongRecordsWithoutAPlaceWhereTheSetsOwnOrderHasThem) {
+    CaseFile told = family("17+42; 17+43");
+    told.preferredSpouses[17] = 43;
+    Request request(told);
+    SpouseSet set;
+    set.insert(SpouseAdapter(98, true, false, "", "98", 0));
+    set.insert(SpouseAdapter(99, false, true, "", "99", 1));
+    request.callbacks.getSpouses(request.key(17), set);
+    EXPECT_EQ((Texts{"43", "98", "99"}), idTexts(set));
+}
+
 TEST(SpousesOfAPerson, addNodeHasNoneAndTheHostIsNotAsked) {
     Request request(family("17"));
     giveParents(request, 17);
