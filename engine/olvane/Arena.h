@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 #include <new>
 #include <type_traits>
 
@@ -97,6 +98,15 @@ public:
             ::operator delete(piece);
         } else {
             arena_->giveBack(piece, bytesOf(count));
+        }
+    }
+    // The elements of a container are of its very type, so their destructor is called without a look at theirs.
+    template <class Object>
+    void destroy(Object* object) noexcept {
+        if constexpr (std::is_class_v<Object>) {
+            object->Object::~Object();
+        } else {
+            std::destroy_at(object);
         }
     }
     ArenaAllocator select_on_container_copy_construction() const { return ArenaAllocator(); }

@@ -11,6 +11,7 @@
 #include <exception>
 #include <filesystem>
 #include <iostream>
+#include <regex>
 #include <string>
 #include <utility>
 #include <vector>
@@ -164,6 +165,22 @@ TEST(GoldenFolder, tellsOfEveryQuirkOnThePage) {
         const std::string picture = file.parent_path().filename().string() + "/" + name + ".svg";
         EXPECT_NE(page.find(picture), std::string::npos) << OLVANE_QUIRKS_PAGE << " lacks " << picture;
     }
+}
+
+// A quirk that no layout shows names the tests that hold it, as `Suite.test` or `Suite.*`.
+TEST(QuirksPage, namesTestsThatThereAre) {
+    const std::string page = support::readWhole(OLVANE_QUIRKS_PAGE);
+    std::string sources;
+    for (const fs::directory_entry& entry : fs::recursive_directory_iterator(OLVANE_UNIT_TESTS)) {
+        if (entry.path().extension() == ".cpp") sources += support::readWhole(entry.path().string());
+    }
+    const std::regex named("`([A-Z][A-Za-z]+)\\.([a-z][A-Za-z0-9]+|\\*)`");
+    int count = 0;
+    for (std::sregex_iterator it(page.begin(), page.end(), named), end; it != end; ++it, ++count) {
+        const std::string test = (*it)[2] == "*" ? "" : (*it)[2].str() + ")";
+        EXPECT_NE(sources.find("(" + (*it)[1].str() + ", " + test), std::string::npos) << it->str();
+    }
+    EXPECT_LT(15, count);
 }
 
 }  // namespace

@@ -3,13 +3,11 @@
 
 #pragma once
 
-#include <functional>
-#include <set>
 #include <string>
 #include <string_view>
 
-#include <olvane/Arena.h>
 #include <olvane/Export.h>
+#include <olvane/adapters/RecordSet.h>
 
 // One child of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
 // order in which children are drawn.
@@ -43,5 +41,4 @@ private:
     bool isLessWithoutPlaces(const ChildrenAdapter& other) const;
 };
 
-typedef std::set<ChildrenAdapter, std::less<ChildrenAdapter>, olvane::ArenaAllocator<ChildrenAdapter>>
-    ChildrenSet;
+typedef olvane::RecordSet<ChildrenAdapter> ChildrenSet;

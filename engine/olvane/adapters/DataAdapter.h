@@ -16,9 +16,9 @@
 // Fails: calling a field that was left empty throws boost::bad_function_call ("call to empty
 //        boost::function"); whatever a callback throws passes through the layouter unchanged.
 struct DataAdapter {
-    typedef boost::function<void(int, SpouseSet&)> SpousesCallback;
+    typedef olvane::RecordsCallback<SpouseAdapter> SpousesCallback;  // also of std::set<SpouseAdapter>
     typedef boost::function<void(int, int&, int&)> ParentsCallback;
-    typedef boost::function<void(int, ChildrenSet&)> ChildrenCallback;
+    typedef olvane::RecordsCallback<ChildrenAdapter> ChildrenCallback;
     typedef boost::function<bool(int)> KeyTest;
     typedef boost::function<void(int)> KeyTouch;
 

@@ -3,13 +3,11 @@
 
 #pragma once
 
-#include <functional>
-#include <set>
 #include <string>
 #include <string_view>
 
-#include <olvane/Arena.h>
 #include <olvane/Export.h>
+#include <olvane/adapters/RecordSet.h>
 
 // One spouse of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
 // order in which spouses are drawn.
@@ -42,4 +40,4 @@ private:
     bool isLessWithoutPlaces(const SpouseAdapter& other) const;
 };
 
-typedef std::set<SpouseAdapter, std::less<SpouseAdapter>, olvane::ArenaAllocator<SpouseAdapter>> SpouseSet;
+typedef olvane::RecordSet<SpouseAdapter> SpouseSet;

@@ -9,6 +9,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -46,6 +47,22 @@ public:
             (glue_.*fill_)(map_);
             return map_;
         }
+        operator const Map&() const { return map(); }
+
+        typedef typename Map::key_type key_type;
+        typedef typename Map::mapped_type mapped_type;
+        typedef typename Map::value_type value_type;
+        typedef typename Map::const_iterator const_iterator;
+        typedef const_iterator iterator;
+
+        // Fails as at() does: only the operations of the glue add entries.
+        const Value& operator[](const Key& key) const { return at(key); }
+        const_iterator cbegin() const { return begin(); }
+        const_iterator cend() const { return end(); }
+        std::pair<const_iterator, const_iterator> equal_range(const Key& key) const {
+            return map().equal_range(key);
+        }
+        float load_factor() const { return map().load_factor(); }
         typename Map::const_iterator begin() const { return map().begin(); }
         typename Map::const_iterator end() const { return map_.end(); }
         typename Map::const_iterator find(const Key& key) const { return map().find(key); }

@@ -25,7 +25,7 @@ namespace SharedTreeViewer {
 //
 // The operations are public so that each act can be run and looked at alone. Hosts call layoutForFocusNID
 // once, then graphIterator.
-class OLVANE_API TreeViewFamilyLayouter final : public TreeViewLayouter {
+class OLVANE_API TreeViewFamilyLayouter : public TreeViewLayouter {
 public:
     TreeViewFamilyLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                            const TreeSize& sizes);

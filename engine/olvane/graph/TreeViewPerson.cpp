@@ -40,6 +40,21 @@ TreeViewPerson& TreeViewPerson::addSiblingHelper(int id, Persons& list, bool mal
     return addPerson(id, list, male);
 }
 
+// The new person is built bare and moved in, so that a failed allocation leaves the list untouched.
+TreeViewPerson& TreeViewPerson::addPerson(int id, std::vector<TreeViewPerson>& list, bool male) {
+    list.emplace_back(id);
+    list.back().gender = male;
+    return list.back();
+}
+
+TreeViewPerson& TreeViewPerson::addChild(int id, std::vector<TreeViewPerson>& list, bool male) {
+    return addPerson(id, list, male);
+}
+
+TreeViewPerson& TreeViewPerson::addSiblingHelper(int id, std::vector<TreeViewPerson>& list, bool male) {
+    return addPerson(id, list, male);
+}
+
 TreeViewPerson& TreeViewPerson::addParent(int id, bool male) {
     return addPerson(id, parents, male);
 }

@@ -9,11 +9,13 @@
 
 #include <cstddef>
 #include <functional>
+#include <map>
 #include <span>
 #include <utility>
 #include <vector>
 
 #include <olvane/Arena.h>
+#include <olvane/ArenaList.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/ChildrenAdapter.h>
 #include <olvane/adapters/SpouseAdapter.h>
@@ -44,19 +46,22 @@ public:
     typedef boost::function<void(const Visitor&)> Iterator;  // walks some relation when it is called
     typedef boost::function<void(TreeViewPerson&, TreeViewPerson&)> PairVisitor;
     typedef boost::function<void(TreeViewPerson&, int)> ReverseVisitor;
-    typedef boost::function<void(int, SpouseSet&)> SpousesLoader;
-    typedef boost::function<void(int, ChildrenSet&)> ChildrenLoader;
+    typedef olvane::RecordsCallback<SpouseAdapter> SpousesLoader;  // also of std::set<SpouseAdapter>
+    typedef olvane::RecordsCallback<ChildrenAdapter> ChildrenLoader;
     typedef boost::function<void(TreeLineSegment&)> SegmentVisitor;
     typedef boost::function<void(TreeViewGenerationEdge*)> GenerationEdgeVisitor;
     typedef boost::function<void(TreeViewSpouseEdge*)> SpouseEdgeVisitor;
     template <class Element>
-    using List = std::vector<Element, olvane::ArenaAllocator<Element>>;
+    using List = olvane::ArenaList<Element>;
     // A few entries side by side: a new one moves those behind it, though never what a list in them holds.
     template <class Value>
     using ByKey =
         boost::container::flat_map<int, Value, std::less<int>, olvane::ArenaAllocator<std::pair<int, Value>>>;
     typedef List<TreeViewPerson> Persons;
     typedef List<TreeLineSegment> Segments;
+    // A list in it stays where it is when another key is added.
+    typedef std::map<int, Persons, std::less<int>, olvane::ArenaAllocator<std::pair<const int, Persons>>>
+        ChildrenByKey;
 
     static constexpr int kNoKey = -1;  // unset, or no other parent
 
@@ -66,7 +71,7 @@ public:
     // How a list grows: the relatives come along as they lie.
     TreeViewPerson(TreeViewPerson&&) noexcept = default;
     TreeViewPerson& operator=(const TreeViewPerson&) = delete;
-    ~TreeViewPerson();  // deletes the spouse edges that this person owns, first of all
+    virtual ~TreeViewPerson();  // deletes the spouse edges that this person owns, first of all
 
     // --- Adding relatives. A bool is the new person's gender, true for male. Nothing looks for an entry that
     // is already there: the same key added twice stands twice. Each returns the new element of its list.
@@ -74,6 +79,10 @@ public:
     TreeViewPerson& addPerson(int id, Persons& list, bool male);
     TreeViewPerson& addChild(int id, Persons& list, bool male);
     TreeViewPerson& addSiblingHelper(int id, Persons& list, bool male);
+    // The same on a list of the host's own.
+    TreeViewPerson& addPerson(int id, std::vector<TreeViewPerson>& list, bool male);
+    TreeViewPerson& addChild(int id, std::vector<TreeViewPerson>& list, bool male);
+    TreeViewPerson& addSiblingHelper(int id, std::vector<TreeViewPerson>& list, bool male);
     TreeViewPerson& addParent(int id, bool male);  // leaves the preferred indices alone
     void setParents(int fatherId, int motherId);
     void setParentsFatherOnly(int fatherId);
@@ -86,7 +95,7 @@ public:
     TreeViewPerson& addNonDisplayedSpouse(int id);
     TreeViewPerson& addChildWithSpouse(int childId, int spouseId, bool male);
     TreeViewPerson& addChildWithNoOtherSpouse(int childId, bool male);
-    // The list under that key, with room for so many more children. Making a list under another key moves it.
+    // The list under that key, with room for so many more children.
     Persons& childrenWithSpouse(int spouseId, std::size_t more);
 
     // --- Plain reads and writes.
@@ -201,7 +210,7 @@ public:
     Persons parents;
     Persons spouses;
     Persons nonDisplayedSpouses;  // every spouse that the host knows; never drawn
-    ByKey<Persons> children;      // by the other parent's key; kNoKey without one
+    ChildrenByKey children;       // by the other parent's key; kNoKey without one
     Persons siblings;             // with an entry for the person itself
     Segments lineSegments;        // in the order added; what the result text writes
     ByKey<Segments> spouseLines;

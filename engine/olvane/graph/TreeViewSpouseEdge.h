@@ -6,6 +6,7 @@
 #include <boost/shared_ptr.hpp>
 
 #include <cstddef>
+#include <new>
 #include <vector>
 
 #include <olvane/Export.h>
@@ -59,9 +60,17 @@ public:
     // An edge lies on a tray, or by itself where none is given. Deleting it is the same for both. The forms with a
     // place stand here for those who make an edge in memory of their own.
     static void* operator new(std::size_t bytes) { return olvane::Trays::takeAlone(bytes); }
+    static void* operator new(std::size_t bytes, const std::nothrow_t&) noexcept {
+        try {
+            return olvane::Trays::takeAlone(bytes);
+        } catch (...) {
+            return nullptr;
+        }
+    }
     static void* operator new(std::size_t bytes, olvane::Trays& trays) { return trays.take(bytes); }
     static void* operator new(std::size_t, void* place) { return place; }
     static void operator delete(void* edge) { olvane::Trays::giveBack(edge); }
+    static void operator delete(void* edge, const std::nothrow_t&) { olvane::Trays::giveBack(edge); }
     static void operator delete(void* edge, olvane::Trays&) { olvane::Trays::giveBack(edge); }
     static void operator delete(void*, void*) {}
 

@@ -20,12 +20,22 @@ namespace SharedTreeViewer {
 class AdmittedKeys {
 public:
     typedef std::map<int, bool, std::less<int>, olvane::ArenaAllocator<std::pair<const int, bool>>> Map;
+    typedef Map::key_type key_type;
+    typedef Map::mapped_type mapped_type;
+    typedef Map::value_type value_type;
+    typedef Map::iterator iterator;
     typedef Map::const_iterator const_iterator;
 
     explicit AdmittedKeys(olvane::Arena* arena) : map_(arena), waiting_(arena) {}
     AdmittedKeys& operator=(std::initializer_list<Map::value_type> entries) {
         clear();
         map_.insert(entries);
+        return *this;
+    }
+
+    AdmittedKeys& operator=(const std::map<int, bool>& entries) {
+        clear();
+        map_.insert(entries.begin(), entries.end());
         return *this;
     }
 
@@ -46,8 +56,27 @@ public:
     const bool& at(int key) const { return map().at(key); }
     std::size_t count(int key) const { return map().count(key); }
     const_iterator find(int key) const { return map().find(key); }
+    iterator find(int key) { return map().find(key); }
+    const_iterator lower_bound(int key) const { return map().lower_bound(key); }
+    const_iterator upper_bound(int key) const { return map().upper_bound(key); }
     const_iterator begin() const { return map().begin(); }
     const_iterator end() const { return map().end(); }
+    const_iterator cbegin() const { return begin(); }
+    const_iterator cend() const { return end(); }
+    iterator begin() { return map().begin(); }
+    iterator end() { return map().end(); }
+    std::pair<iterator, bool> insert(const value_type& entry) { return map().insert(entry); }
+    template <class Input>
+    void insert(Input first, Input last) {
+        map().insert(first, last);
+    }
+    template <class... Arguments>
+    std::pair<iterator, bool> emplace(Arguments&&... arguments) {
+        return map().emplace(std::forward<Arguments>(arguments)...);
+    }
+    std::size_t erase(int key) { return map().erase(key); }
+    iterator erase(const_iterator entry) { return map().erase(entry); }
+    operator std::map<int, bool>() const { return std::map<int, bool>(begin(), end()); }
     std::size_t size() const { return map().size(); }
     bool empty() const { return map_.empty() && waiting_.empty(); }
     void clear() {

@@ -26,7 +26,7 @@ namespace SharedTreeViewer {
 //
 // The operations are public so that each act can be run and looked at alone. Hosts call layoutForFocusNID
 // once, then graphIterator.
-class OLVANE_API TreeViewPedigreeLayouter final : public TreeViewLayouter {
+class OLVANE_API TreeViewPedigreeLayouter : public TreeViewLayouter {
 public:
     TreeViewPedigreeLayouter(DataAdapter* data, int focusKey, int isMale, OptionMap optionValues,
                              const TreeSize& sizes, int generations, int stackDepth);

@@ -12,11 +12,13 @@
 #include <gtest/gtest.h>
 
 #include <cstdint>
+#include <functional>
 #include <limits>
 #include <memory>
 #include <ostream>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <olvane/boundary/FamilyViewLayout.h>
@@ -237,29 +239,38 @@ TEST(TypedLayout, aFailureOfTheHostReachesTheCaller) {
                  support::HostFailure);
 }
 
-// Within an operation of a layout, once.
+// Lays out within its first question for children.
 class NestingManager : public support::CaseManager {
 public:
-    using CaseManager::CaseManager;
+    NestingManager(std::function<std::string()> layOut)
+        : CaseManager(family("17+42: 5")), layOut_(std::move(layOut)) {}
 
     std::vector<std::int64_t> childrenForPersonWithID(std::int64_t personId) override {
-        if (!hasNested_) {
-            hasNested_ = true;
-            inner = olvane::familyLayout(5, hostOf("17+42: 5")).text;
-        }
+        if (inner.empty()) inner = layOut_();
         return CaseManager::childrenForPersonWithID(personId);
     }
 
     std::string inner;
 
 private:
-    bool hasNested_ = false;
+    std::function<std::string()> layOut_;
 };
 
-TEST(TypedLayout, aLayoutWithinAnotherLeavesItsUnknownParentsTheirIds) {
-    const auto host = std::make_shared<NestingManager>(family("17+42: 5"));
+TEST(NestedLayouts, thatAreTypedLeaveTheOuterOneItsAddNodes) {
+    const auto host =
+        std::make_shared<NestingManager>([] { return olvane::familyLayout(5, hostOf("17+42: 5")).text; });
     EXPECT_EQ(FamilyViewLayout("17", hostOf("17+42: 5")), FamilyViewLayout("17", host));
     EXPECT_EQ(FamilyViewLayout("5", hostOf("17+42: 5")), host->inner);
+}
+
+// The focus's unknown parents come after the question for children, so they go on where the inner layout ended.
+TEST(NestedLayouts, byTheEntryCallStartTheAddNodesOfTheOuterOneAnew) {
+    const auto host =
+        std::make_shared<NestingManager>([] { return FamilyViewLayout("5", hostOf("17+42: 5")); });
+    const std::string outer = FamilyViewLayout("17", host);
+    EXPECT_EQ(FamilyViewLayout("5", hostOf("17+42: 5")), host->inner);
+    EXPECT_NE(std::string::npos, FamilyViewLayout("17", hostOf("17+42: 5")).find(";-1:"));
+    EXPECT_EQ(std::string::npos, outer.find(";-1:"));
 }
 
 }  // namespace
