@@ -3,14 +3,14 @@
 
 // The one file that sees both sides: C structs and callbacks on the left, the engine on the right. A host's
 // callbacks become a data source for the length of a call; a failure that one of them reports travels through
-// the engine as an exception and becomes a status at the entry. The records are read from the result text, so
-// text and records can't disagree.
+// the engine as an exception and becomes a status at the entry. Records and pictures are made from the typed layout
+// that the engine fills beside the text.
 
 #include <olvane.h>
 
 #include <cmath>
 #include <cstdint>
-#include <exception>
+#include <limits>
 #include <memory>
 #include <new>
 #include <string>
@@ -18,13 +18,7 @@
 #include <vector>
 
 #include "FamilyInternal.h"
-
-#include <olvane/boundary/HostText.h>
-#include <olvane/boundary/LayoutPieces.h>
-#include <olvane/family/FamilyOptions.h>
-#include <olvane/family/TreeViewFamilyLayouter.h>
-#include <olvane/host/LayoutText.h>
-#include <olvane/pedigree/TreeViewPedigreeLayouter.h>
+#include "LayoutInternal.h"
 
 // The opaque answers are what the engine takes, so nothing is copied twice. An append that found no memory is
 // remembered: a callback that does not look at its status must not hand in a shorter list unnoticed.
@@ -38,25 +32,35 @@ struct olvane_date {
     bool lacksMemory = false;
 };
 
-// Holds: records point into segments, which never grow after they were linked.
-struct olvane_layout {
-    std::string text;
-    std::vector<olvane_segment> segments;
-    std::vector<olvane_record> records;
-    int hostCode = 0;
-};
-
 namespace {
 
-using SharedTreeViewer::OptionMap;
+using olvane::TypedLayout;
 
 constexpr int kThrownCode = -1;
+
+bool isPersonId(std::int64_t id) {
+    return id >= 1 && id <= std::numeric_limits<std::int32_t>::max();
+}
+
 constexpr int kDefaultGenerations = 5;
 constexpr int kDefaultFlagDepth = 4;  // as the family view's own
 
-// Travels through the engine only; never leaves this file.
+// These travel through the engine only and never leave this file.
 struct HostFailure {
     int code;
+    std::string what;
+};
+
+struct WrongId {
+    std::string what;
+};
+
+// The operation and the person that a failure is about: "spouses_of(17)".
+struct Question {
+    const char* operation;
+    std::int64_t person;
+
+    std::string text() const { return std::string(operation) + "(" + std::to_string(person) + ")"; }
 };
 
 // A data source that asks C callbacks.
@@ -65,42 +69,44 @@ public:
     explicit CallbackManager(const olvane_host& host) : host_(host) {}
 
     std::int64_t fatherForPersonWithID(std::int64_t personId) override {
-        return parentFrom(host_.father_of, personId);
+        return parentFrom(host_.father_of, {"father_of", personId});
     }
 
     std::int64_t motherForPersonWithID(std::int64_t personId) override {
-        return parentFrom(host_.mother_of, personId);
+        return parentFrom(host_.mother_of, {"mother_of", personId});
     }
 
     std::vector<std::int64_t> spousesForPersonWithID(std::int64_t personId) override {
-        return listFrom(host_.spouses_of, personId);
+        return listFrom(host_.spouses_of, {"spouses_of", personId});
     }
 
     std::vector<std::int64_t> childrenForPersonWithID(std::int64_t personId) override {
-        return listFrom(host_.children_of, personId);
+        return listFrom(host_.children_of, {"children_of", personId});
     }
 
     bool isPreferredSpouse(std::int64_t personId, std::int64_t spouseId) override {
         int preferred = 0;
-        ask([&] { return host_.is_preferred_spouse(host_.context, personId, spouseId, &preferred); });
+        ask({"is_preferred_spouse", personId},
+            [&] { return host_.is_preferred_spouse(host_.context, personId, spouseId, &preferred); });
         return preferred != 0;
     }
 
     bool isPersonDead(std::int64_t personId) override {
         int dead = 0;
-        ask([&] { return host_.is_dead(host_.context, personId, &dead); });
+        ask({"is_dead", personId}, [&] { return host_.is_dead(host_.context, personId, &dead); });
         return dead != 0;
     }
 
     std::string dateForPersonWithID(std::int64_t personId, bool isBirth) override {
         olvane_date date;
-        askInto(date, [&] { return host_.date_of(host_.context, personId, isBirth ? 1 : 0, &date); });
+        askInto(date, {"date_of", personId},
+                [&] { return host_.date_of(host_.context, personId, isBirth ? 1 : 0, &date); });
         return std::move(date.text);
     }
 
     std::int32_t sexOfPersonWithID(std::int64_t personId) override {
         std::int32_t sex = 0;
-        ask([&] { return host_.sex_of(host_.context, personId, &sex); });
+        ask({"sex_of", personId}, [&] { return host_.sex_of(host_.context, personId, &sex); });
         return sex;
     }
 
@@ -109,37 +115,48 @@ private:
     typedef int (*ListCallback)(void*, std::int64_t, olvane_person_list*);
 
     // A callback in C++ may throw in spite of what it was told.
-    template <class Question>
-    static void ask(Question question) {
+    template <class Call>
+    static void ask(const Question& question, const Call& call) {
         int code = kThrownCode;
+        bool hasThrown = false;
         try {
-            code = question();
+            code = call();
         } catch (...) {
-            throw HostFailure{kThrownCode};
+            hasThrown = true;
         }
-        if (code != 0) throw HostFailure{code};
+        if (hasThrown) throw HostFailure{kThrownCode, question.text() + " threw an exception"};
+        if (code != 0) throw HostFailure{code, question.text() + " returned " + std::to_string(code)};
     }
 
     // For the opaque answers. One that found no memory is why the callback failed, if it did.
-    template <class OpaqueAnswer, class Question>
-    static void askInto(const OpaqueAnswer& answer, Question question) {
+    template <class OpaqueAnswer, class Call>
+    static void askInto(const OpaqueAnswer& answer, const Question& question, const Call& call) {
         try {
-            ask(question);
+            ask(question, call);
         } catch (const HostFailure&) {
             if (!answer.lacksMemory) throw;
         }
         if (answer.lacksMemory) throw std::bad_alloc();
     }
 
-    std::int64_t parentFrom(ParentCallback callback, std::int64_t personId) const {
+    // The engine would cut any other number to 32 bits, and draw another person.
+    static void checkId(const Question& question, std::int64_t id) {
+        if (isPersonId(id)) return;
+        throw WrongId{question.text() + " answered " + std::to_string(id) +
+                      ", which is no id: ids are 1 to 2147483647"};
+    }
+
+    std::int64_t parentFrom(ParentCallback callback, const Question& question) const {
         std::int64_t parent = kPersonNotFound;
-        ask([&] { return callback(host_.context, personId, &parent); });
+        ask(question, [&] { return callback(host_.context, question.person, &parent); });
+        if (parent != kPersonNotFound) checkId(question, parent);
         return parent;
     }
 
-    std::vector<std::int64_t> listFrom(ListCallback callback, std::int64_t personId) const {
+    std::vector<std::int64_t> listFrom(ListCallback callback, const Question& question) const {
         olvane_person_list list;
-        askInto(list, [&] { return callback(host_.context, personId, &list); });
+        askInto(list, question, [&] { return callback(host_.context, question.person, &list); });
+        for (const std::int64_t id : list.ids) checkId(question, id);
         return std::move(list.ids);
     }
 
@@ -206,27 +223,29 @@ TreeSize treeSizeOf(const olvane_sizes& sizes) {
     return size;
 }
 
-OptionMap familyOptionsOf(const olvane_options& options) {
-    using namespace SharedTreeViewer;
-    OptionMap map;
-    map[IndicateNonDisplayedRelationships] = true;
-    map[kTreeViewFamShowAuntsUnclesKey] = (options.shown & OLVANE_SHOW_AUNTS_UNCLES) != 0;
-    map[kTreeViewFamShowCousinsKey] = (options.shown & OLVANE_SHOW_COUSINS) != 0;
-    map[kTreeViewFamShowSiblingsKey] = (options.shown & OLVANE_SHOW_SIBLINGS) != 0;
-    map[kTreeViewFamShowSiblingSpousesKey] = (options.shown & OLVANE_SHOW_SIBLING_SPOUSES) != 0;
-    map[kTreeViewFamShowNeicesNephewsKey] = (options.shown & OLVANE_SHOW_NIECES_NEPHEWS) != 0;
-    map[kTreeViewFamShowGrandchildrenKey] = (options.shown & OLVANE_SHOW_GRANDCHILDREN) != 0;
-    map[kTreeViewFamShowGreatGrandparentsKey] = (options.shown & OLVANE_SHOW_GREAT_GRANDPARENTS) != 0;
-    map[kTreeViewFamShowSpousesOfChildrenKey] = (options.shown & OLVANE_SHOW_SPOUSES_OF_CHILDREN) != 0;
-    return map;
+olvane::LayoutOptions layoutOptionsOf(const olvane_options& options) {
+    olvane::LayoutOptions result;
+    result.sizes = treeSizeOf(options.sizes);
+    result.auntsUncles = (options.shown & OLVANE_SHOW_AUNTS_UNCLES) != 0;
+    result.cousins = (options.shown & OLVANE_SHOW_COUSINS) != 0;
+    result.siblings = (options.shown & OLVANE_SHOW_SIBLINGS) != 0;
+    result.siblingSpouses = (options.shown & OLVANE_SHOW_SIBLING_SPOUSES) != 0;
+    result.niecesNephews = (options.shown & OLVANE_SHOW_NIECES_NEPHEWS) != 0;
+    result.grandchildren = (options.shown & OLVANE_SHOW_GRANDCHILDREN) != 0;
+    result.greatGrandparents = (options.shown & OLVANE_SHOW_GREAT_GRANDPARENTS) != 0;
+    result.spousesOfChildren = (options.shown & OLVANE_SHOW_SPOUSES_OF_CHILDREN) != 0;
+    result.generations = options.generations;
+    result.flagDepth = options.flag_depth;
+    return result;
 }
 
 // What both views ask for. Exactly one of host and family is there.
 struct Request {
     const olvane_host* host;
     const olvane_family* family;
-    int focus;
+    std::int64_t focus;
     const olvane_options& options;
+    TypedLayout::View view;
 };
 
 std::shared_ptr<OlvaneViewerManagerWrapProtocol> managerOf(const Request& request) {
@@ -234,47 +253,17 @@ std::shared_ptr<OlvaneViewerManagerWrapProtocol> managerOf(const Request& reques
     return std::make_shared<olvane::FamilyDataSource>(request.family->table);
 }
 
-template <class Layouter>
-void writeLayout(Layouter& layouter, ViewerGlue& glue, std::string& text) {
-    layouter.layoutForFocusNID();
-    olvane::ResultBounds bounds;
-    layouter.graphIterator(olvane::resultWriter(glue, bounds, text));
-}
-
-void writeFamily(const Request& request, DataAdapter& adapter, ViewerGlue& glue, int focusKey,
-                 std::string& text) {
-    const int isMale = adapter.isMale(focusKey) ? 1 : 0;
-    SharedTreeViewer::TreeViewFamilyLayouter layouter(
-        &adapter, focusKey, isMale, familyOptionsOf(request.options), treeSizeOf(request.options.sizes));
-    writeLayout(layouter, glue, text);
-}
-
-void writePedigree(const Request& request, DataAdapter& adapter, ViewerGlue& glue, int focusKey,
-                   std::string& text) {
-    const int isMale = adapter.isMale(focusKey) ? 1 : 0;
-    SharedTreeViewer::TreeViewPedigreeLayouter layouter(
-        &adapter, focusKey, isMale, OptionMap(), treeSizeOf(request.options.sizes),
-        request.options.generations, request.options.flag_depth);
-    writeLayout(layouter, glue, text);
-}
-
-typedef void (*ViewWriter)(const Request&, DataAdapter&, ViewerGlue&, int, std::string&);
-
-void runRequest(const Request& request, ViewWriter writeView, std::string& text) {
-    ViewerGlue glue;
-    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> manager = managerOf(request);
-    const olvane::HostCallbacks callbacks(glue, manager);
-    olvane::resetAddParentId();
-    DataAdapter adapter = callbacks.dataAdapter();
-    writeView(request, adapter, glue, glue.getKeyFromPerson(intToString(request.focus)), text);
-}
-
-olvane_status statusOfRun(const Request& request, ViewWriter writeView, olvane_layout& layout) {
+olvane_status statusOfRun(const Request& request, olvane_layout& layout) {
     try {
-        runRequest(request, writeView, layout.text);
+        olvane::layOut(request.view, request.focus, managerOf(request), layoutOptionsOf(request.options),
+                       layout.typed);
     } catch (const HostFailure& failure) {
         layout.hostCode = failure.code;
+        layout.failure = failure.what;
         return OLVANE_HOST_FAILED;
+    } catch (const WrongId& wrong) {
+        layout.failure = wrong.what;
+        return OLVANE_INVALID_ID;
     } catch (const std::bad_alloc&) {
         return OLVANE_OUT_OF_MEMORY;
     } catch (...) {
@@ -283,72 +272,69 @@ olvane_status statusOfRun(const Request& request, ViewWriter writeView, olvane_l
     return OLVANE_OK;
 }
 
-olvane_record_kind kindOf(const olvane::LayoutRecord& record) {
-    if (!record.addNode) return OLVANE_PERSON;
-    return record.addNode->male ? OLVANE_MISSING_FATHER : OLVANE_MISSING_MOTHER;
+olvane_record_kind kindOf(TypedLayout::BoxKind kind) {
+    switch (kind) {
+        case TypedLayout::BoxKind::unknownFather:
+            return OLVANE_MISSING_FATHER;
+        case TypedLayout::BoxKind::unknownMother:
+            return OLVANE_MISSING_MOTHER;
+        case TypedLayout::BoxKind::person:
+            break;
+    }
+    return OLVANE_PERSON;
 }
 
-olvane_record recordOf(const olvane::LayoutRecord& record) {
+olvane_record recordOf(const TypedLayout::Box& box, const olvane_segment* segments) {
     olvane_record result = {};
-    result.id = record.id;
-    result.x = record.x;
-    result.y = record.y;
-    result.has_hidden_relatives = record.hasHiddenRelatives ? 1 : 0;
-    result.kind = kindOf(record);
-    result.child = record.addNode ? record.addNode->childId : 0;
-    result.segment_count = record.segments.size();
+    result.id = box.id;
+    result.x = box.x;
+    result.y = box.y;
+    result.has_hidden_relatives = box.hasHiddenRelatives ? 1 : 0;
+    result.kind = kindOf(box.kind);
+    result.child = box.childId;
+    result.segments = box.lineCount == 0 ? nullptr : segments + box.firstLine;
+    result.segment_count = box.lineCount;
     return result;
 }
 
-void linkSegments(olvane_layout& layout) {
-    const olvane_segment* next = layout.segments.data();
-    for (olvane_record& record : layout.records) {
-        record.segments = record.segment_count == 0 ? nullptr : next;
-        next += record.segment_count;
+void addRecords(olvane_layout& layout) {
+    layout.segments.reserve(layout.typed.lines.size());
+    for (const TypedLayout::Line& line : layout.typed.lines) {
+        layout.segments.push_back({line.x1, line.y1, line.x2, line.y2});
+    }
+    layout.records.reserve(layout.typed.boxes.size());
+    for (const TypedLayout::Box& box : layout.typed.boxes) {
+        layout.records.push_back(recordOf(box, layout.segments.data()));
     }
 }
 
-void readRecords(olvane_layout& layout) {
-    for (const olvane::LayoutRecord& record : olvane::readWholeRecords(layout.text).records) {
-        layout.records.push_back(recordOf(record));
-        for (const olvane::LayoutSegment& piece : record.segments) {
-            layout.segments.push_back({piece.x1, piece.y1, piece.x2, piece.y2});
-        }
-    }
-    linkSegments(layout);
-}
-
-int lowBits(std::int64_t hostId) {
-    return static_cast<int>(static_cast<std::uint32_t>(static_cast<std::uint64_t>(hostId)));
-}
-
-olvane_status fillLayout(const Request& request, ViewWriter writeView, olvane_layout& layout) {
-    if (request.focus < 1) return OLVANE_INVALID_PERSON;
-    const olvane_status status = statusOfRun(request, writeView, layout);
-    readRecords(layout);
+olvane_status fillLayout(const Request& request, olvane_layout& layout) {
+    if (!isPersonId(request.focus)) return OLVANE_INVALID_PERSON;
+    const olvane_status status = statusOfRun(request, layout);
+    addRecords(layout);
     return status;
 }
 
-olvane_status layOut(const Request& request, ViewWriter writeView, olvane_layout** layout) noexcept {
+olvane_status layOut(const Request& request, olvane_layout** layout) noexcept {
     const RunningLayout running;
     if (!running.isFirst()) return OLVANE_NESTED_CALL;
     try {
         auto filled = std::make_unique<olvane_layout>();
-        const olvane_status status = fillLayout(request, writeView, *filled);
+        const olvane_status status = fillLayout(request, *filled);
         *layout = filled.release();
         return status;
     } catch (...) {
-        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here: the text is the writer's own
+        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
     }
 }
 
 olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olvane_options* options,
-                         ViewWriter writeView, olvane_layout** layout) noexcept {
+                         TypedLayout::View view, olvane_layout** layout) noexcept {
     if (!layout) return OLVANE_INVALID_ARGUMENT;
     *layout = nullptr;
     const olvane_options chosen = options ? *options : defaultOptions();
     if (!host || !isComplete(*host) || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
-    return layOut({host, nullptr, lowBits(focus), chosen}, writeView, layout);
+    return layOut({host, nullptr, focus, chosen, view}, layout);
 }
 
 }  // namespace
@@ -360,7 +346,7 @@ const char* olvane_status_text(olvane_status status) {
         case OLVANE_INVALID_ARGUMENT:
             return "A pointer or a callback is missing, or an option is out of its range.";
         case OLVANE_INVALID_PERSON:
-            return "The id of the focus is not that of a person: ids are 1 and more in their low 32 bits.";
+            return "The id of the focus is not that of a person: ids are 1 to 2147483647.";
         case OLVANE_HOST_FAILED:
             return "A callback of the host failed; the layout holds what came before.";
         case OLVANE_LAYOUT_FAILED:
@@ -371,6 +357,8 @@ const char* olvane_status_text(olvane_status status) {
             return "A callback asked for a layout while its own is still running on this thread.";
         case OLVANE_REFUSED:
             return "Rows of a family are wrong; nothing has changed, and the error says where.";
+        case OLVANE_INVALID_ID:
+            return "A callback answered a number that is no id of a person: ids are 1 to 2147483647.";
     }
     return "This number is not a status of this version.";
 }
@@ -409,12 +397,12 @@ olvane_status olvane_options_default(olvane_options* options) {
 
 olvane_status olvane_layout_family(const olvane_host* host, int64_t focus, const olvane_options* options,
                                    olvane_layout** layout) {
-    return layOutHost(host, focus, options, writeFamily, layout);
+    return layOutHost(host, focus, options, TypedLayout::View::family, layout);
 }
 
 olvane_status olvane_layout_pedigree(const olvane_host* host, int64_t focus, const olvane_options* options,
                                      olvane_layout** layout) {
-    return layOutHost(host, focus, options, writePedigree, layout);
+    return layOutHost(host, focus, options, TypedLayout::View::pedigree, layout);
 }
 
 olvane_status olvane_view(const olvane_family* family, int32_t view, int64_t focus,
@@ -422,11 +410,12 @@ olvane_status olvane_view(const olvane_family* family, int32_t view, int64_t foc
     if (!layout) return OLVANE_INVALID_ARGUMENT;
     *layout = nullptr;
     const olvane_options chosen = options ? *options : defaultOptions();
-    const bool isView = view == OLVANE_VIEW_FAMILY || view == OLVANE_VIEW_PEDIGREE;
-    if (!family || !isView || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
-    const int known = family->table.hasPerson(focus) ? static_cast<int>(focus) : 0;
-    return layOut({nullptr, family, known, chosen}, view == OLVANE_VIEW_FAMILY ? writeFamily : writePedigree,
-                  layout);
+    const bool isFamilyView = view == OLVANE_VIEW_FAMILY;
+    if (!family || !(isFamilyView || view == OLVANE_VIEW_PEDIGREE) || !areInRange(chosen))
+        return OLVANE_INVALID_ARGUMENT;
+    const std::int64_t known = family->table.hasPerson(focus) ? focus : 0;
+    const auto chosenView = isFamilyView ? TypedLayout::View::family : TypedLayout::View::pedigree;
+    return layOut({nullptr, family, known, chosen, chosenView}, layout);
 }
 
 void olvane_layout_free(olvane_layout* layout) {
@@ -435,8 +424,8 @@ void olvane_layout_free(olvane_layout* layout) {
 
 olvane_status olvane_layout_text(const olvane_layout* layout, const char** text, size_t* length) {
     if (!layout || !text) return OLVANE_INVALID_ARGUMENT;
-    *text = layout->text.c_str();
-    if (length) *length = layout->text.size();
+    *text = layout->typed.text.c_str();
+    if (length) *length = layout->typed.text.size();
     return OLVANE_OK;
 }
 
@@ -451,5 +440,11 @@ olvane_status olvane_layout_records(const olvane_layout* layout, const olvane_re
 olvane_status olvane_layout_host_code(const olvane_layout* layout, int* code) {
     if (!layout || !code) return OLVANE_INVALID_ARGUMENT;
     *code = layout->hostCode;
+    return OLVANE_OK;
+}
+
+olvane_status olvane_layout_failure(const olvane_layout* layout, const char** text) {
+    if (!layout || !text) return OLVANE_INVALID_ARGUMENT;
+    *text = layout->failure.c_str();
     return OLVANE_OK;
 }

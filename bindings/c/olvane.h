@@ -38,12 +38,14 @@ extern "C" {
 typedef enum olvane_status {
     OLVANE_OK = 0,
     OLVANE_INVALID_ARGUMENT = 1, /* a null pointer, a missing callback, or an option out of its range */
-    OLVANE_INVALID_PERSON = 2,   /* the low 32 bits of the focus's id say no number of 1 or more */
+    OLVANE_INVALID_PERSON = 2,   /* the focus's id is not 1 to 2147483647 */
     OLVANE_HOST_FAILED = 3,      /* a callback reported failure; the layout holds what came before */
-    OLVANE_LAYOUT_FAILED = 4,    /* the data leave no picture: relatives with ids below 1 may do that */
+    OLVANE_LAYOUT_FAILED = 4,    /* the data leave no picture */
     OLVANE_OUT_OF_MEMORY = 5,
     OLVANE_NESTED_CALL = 6, /* asked for by a callback of a layout that is still running on this thread */
-    OLVANE_REFUSED = 7      /* rows of a family are wrong; nothing has changed, and the error says where */
+    OLVANE_REFUSED = 7,     /* rows of a family are wrong; nothing has changed, and the error says where */
+    OLVANE_INVALID_ID =
+        8 /* a callback answered an id that is not 1 to 2147483647; the layout holds what came before */
 } olvane_status;
 
 /* A sentence in English for every status, and for any other number one that says so. Lives for ever. */
@@ -71,11 +73,9 @@ OLVANE_C_API olvane_status olvane_date_set(olvane_date* date, const char* text);
 /*
  * The host's data source: eight questions about persons.
  *
- * Units: ids are the host's own, 1 and more for real persons; only their low 32 bits count. A callback is
- *     never asked about an id below 1.
- * Nobody: an unknown parent is OLVANE_PERSON_NOT_FOUND, and lists hold known persons alone. An answer below 1
- *     is not refused: it may be drawn as a box too many, be taken for an add-node of the engine's own, or end
- *     the layout with OLVANE_LAYOUT_FAILED.
+ * Units: ids are the host's own, 1 to 2147483647.
+ * Nobody: an unknown parent is OLVANE_PERSON_NOT_FOUND, and lists hold known persons alone. Any other number
+ *     ends the layout with OLVANE_INVALID_ID, and olvane_layout_failure names it.
  * Holds: all eight are set. They are asked many times for the same person, since no answer is kept, and must
  *     agree with themselves within one layout. They may contradict each other: the layout takes them as told.
  * Fails: a callback returns 0, or any other number to report a failure. The layout then ends with what it
@@ -209,6 +209,10 @@ OLVANE_C_API olvane_status olvane_layout_records(const olvane_layout* layout, co
 
 /* The number with which a callback failed, and 0 where none did. */
 OLVANE_C_API olvane_status olvane_layout_host_code(const olvane_layout* layout, int* code);
+
+/* After OLVANE_HOST_FAILED and OLVANE_INVALID_ID: the callback, the person and what was wrong, in English, as in
+   "spouses_of(17) returned 5". Else the empty text. */
+OLVANE_C_API olvane_status olvane_layout_failure(const olvane_layout* layout, const char** text);
 
 #ifdef __cplusplus
 }

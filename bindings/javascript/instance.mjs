@@ -18,9 +18,13 @@ function decoderOf(label) {
     }
 }
 
+const GREATEST_ID = 2 ** 31 - 1;
+
 function wholeId(id) {
-    if (Number.isSafeInteger(id)) return id;
-    throw new TypeError(`a host answered ${String(id)} where an id is a whole number`);
+    if (Number.isInteger(id) && id >= 1 && id <= GREATEST_ID) return id;
+    const shown = typeof id === "string" ? JSON.stringify(id) : String(id);
+    const Kind = typeof id === "number" ? RangeError : TypeError;
+    throw new Kind(`a host answered ${shown} where an id is a whole number of 1 to ${GREATEST_ID}`);
 }
 
 function parentId(answer) {

@@ -131,6 +131,7 @@ export class LayoutError extends Error {
         | "layoutFailed"
         | "outOfMemory"
         | "nestedCall"
+        | "invalidId"
         | "tooLarge";
     readonly text: string;
     readonly records: readonly LayoutRecord[];

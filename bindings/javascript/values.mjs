@@ -26,6 +26,7 @@ export const STATUSES = [
     "outOfMemory",
     "nestedCall",
     "refused",
+    "invalidId",
 ];
 
 export const SEXES = ["male", "female", "unknown"];

@@ -100,13 +100,14 @@ function linesOf(text) {
     return lines;
 }
 
-// Not what hosts of JavaScript can't ask for: a bare adapter, a chosen failure, other options, ids beyond 2^53.
+// Not what hosts of JavaScript can't ask for: a bare adapter, a chosen failure, other options, ids out of range.
 function canBeAsked(lines) {
     if (lines.get("adapter") === "bare") return false;
     return [...lines].every(([key, value]) => {
         if (key.startsWith("throw ")) return false;
         if (key.startsWith("option ")) return Object.hasOwn(RELATIVES, key.slice("option ".length));
-        return key.startsWith("birth") || key.startsWith("date") || !/\d{16}/.test(`${key} ${value}`);
+        if (!/^(focus|father|mother|spouses|children)\b/.test(key)) return true;
+        return value.split(" ").every((id) => id === "" || (Number(id) >= 1 && Number(id) < 2 ** 31));
     });
 }
 

@@ -135,15 +135,35 @@ for (const question of Object.getOwnPropertyNames(TableHost.prototype).filter((n
     });
 }
 
-test("an id that is no whole number is refused", () => {
-    for (const id of [1.5, NaN, "2", 2n, 2 ** 60, {}]) {
-        assert.throws(() => olvane.layout(hostOf({ childrenOf: () => [id] }), 1), { name: "HostError" });
+test("an answered id that is not 1 to 2147483647 is refused by its value", () => {
+    const refusals = [
+        [1.5, "RangeError", "1.5"],
+        [NaN, "RangeError", "NaN"],
+        [0, "RangeError", "0"],
+        [-5, "RangeError", "-5"],
+        [2 ** 31, "RangeError", "2147483648"],
+        [2 ** 32 + 4, "RangeError", "4294967300"],
+        [2 ** 53 + 2, "RangeError", "9007199254740994"],
+        ["2", "TypeError", '"2"'],
+        [2n, "TypeError", "2"],
+    ];
+    for (const [id, name, shown] of refusals) {
+        for (const answers of [{ childrenOf: () => [id] }, { spousesOf: () => [id] }, { fatherOf: () => id }]) {
+            assert.throws(
+                () => olvane.layout(hostOf(answers), 1),
+                (error) =>
+                    error instanceof HostError &&
+                    error.cause.name === name &&
+                    error.cause.message ===
+                        `a host answered ${shown} where an id is a whole number of 1 to 2147483647`,
+            );
+        }
     }
     assert.throws(() => olvane.layout(hostOf({ childrenOf: () => null }), 1), { name: "HostError" });
 });
 
 test("a focus that is nobody is refused", () => {
-    for (const focus of [0, -1, 1.5, 2 ** 53, Infinity, NaN]) {
+    for (const focus of [0, -1, 1.5, 2 ** 31, 2 ** 32 + 1, 2 ** 53, Infinity, NaN]) {
         assert.throws(() => olvane.layout(new TableHost(henry), focus), {
             name: "LayoutError",
             status: "invalidPerson",

@@ -21,6 +21,7 @@ class Status(IntEnum):
     OUT_OF_MEMORY = 5
     NESTED_CALL = 6
     REFUSED = 7
+    INVALID_ID = 8
 
 
 class LayoutError(Exception):

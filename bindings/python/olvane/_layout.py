@@ -117,6 +117,9 @@ class _Answers:
         return 0
 
 
+_GREATEST_ID = 2**31 - 1
+
+
 class _StrayHook:
     """A sys.unraisablehook that keeps what leaves a callback, which ctypes would print and forget.
 
@@ -158,13 +161,21 @@ def _set_sex(slot: Any, sex: int) -> None:
     slot[0] = 0 if operator.index(sex) == 0 else 1
 
 
+def _person_id(answer: int) -> int:
+    """The id of a person. C would take the low bits of any other number, and draw another person."""
+    whole = operator.index(answer)
+    if not 1 <= whole <= _GREATEST_ID:
+        raise ValueError(f"a host answered {answer!r} where an id is 1 to {_GREATEST_ID}")
+    return whole
+
+
 def _set_parent(slot: Any, parent: int | None) -> None:
     if parent is not None:
-        slot[0] = parent
+        slot[0] = _person_id(parent)
 
 
 def _append(ids: Any, people: Iterable[int]) -> None:
-    known = list(people)
+    known = [_person_id(person) for person in people]
     _check(_native.library.olvane_person_list_append(ids, (c_int64 * len(known))(*known), len(known)))
 
 
@@ -188,7 +199,7 @@ class _Request:
 
     def __init__(self, host: Host, focus: int, view: View, options: Options | None) -> None:
         self._answers = _Answers(host)
-        self._focus = operator.index(focus)
+        self._focus = _focus_number(focus)
         self._ask = _asking(view)
         self._options = _options_struct(options)
         self._layout = c_void_p()
@@ -235,7 +246,7 @@ class _FamilyRequest(_Request):
 
     def __init__(self, family: Family, focus: int, view: View, options: Options | None) -> None:
         self._family = family
-        self._focus = _family_focus(focus)
+        self._focus = _focus_number(focus)
         self._view = _view_number(view)
         self._chosen = None if options is None else byref(_options_struct(options))
         self._layout = c_void_p()
@@ -257,9 +268,10 @@ def _request(host: Host | Family, focus: int, view: View, options: Options | Non
     return _Request(host, focus, view, options)
 
 
-def _family_focus(focus: int) -> int:
+def _focus_number(focus: int) -> int:
+    """The focus, or 0, which is nobody, for a number that is no person's."""
     whole = operator.index(focus)
-    return whole if 0 < whole < 2**31 else 0
+    return whole if 1 <= whole <= _GREATEST_ID else 0
 
 
 def _view_number(view: View) -> int:

@@ -96,11 +96,18 @@ def lines_of(text: str) -> dict[str, str]:
 
 
 def can_be_asked(lines: dict[str, str]) -> bool:
-    """Not what hosts of Python can't ask for: a bare adapter, a chosen failure, other options."""
-    if lines.get("adapter") == "bare":
+    """Not what hosts of Python can't ask for: a bare adapter, a chosen failure, other options, ids out of range."""
+    if lines.get("adapter") == "bare" or not all(1 <= id < 2**31 for id in ids_in(lines)):
         return False
     options = [key.removeprefix("option ") for key in lines if key.startswith("option ")]
     return all(option in RELATIVES for option in options) and not any(key.startswith("throw ") for key in lines)
+
+
+def ids_in(lines: dict[str, str]) -> list[int]:
+    """The focus and all ids that the case answers."""
+    relatives = ("focus", "father", "mother", "spouses", "children")
+    answers = [value for key, value in lines.items() if key.split(" ")[0] in relatives]
+    return [int(id) for answer in answers for id in answer.split()]
 
 
 def case_of(file: Path, lines: dict[str, str]) -> Case:

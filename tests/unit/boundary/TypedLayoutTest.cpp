@@ -239,6 +239,21 @@ TEST(TypedLayout, aFailureOfTheHostReachesTheCaller) {
                  support::HostFailure);
 }
 
+// An uncle's wife -99, who is nobody's add-node: her record is cut behind its segments.
+TEST(TypedLayout, ofAFailureHoldsTheWholeBoxesAndTheCutText) {
+    support::CaseFile told = family("17; 1+2: 17; 101+102: 1 11");
+    told.spouses[11] = {-99};
+    TypedLayout layout;
+    EXPECT_THROW(olvane::layOut(TypedLayout::View::family, 17, std::make_shared<support::CaseManager>(told),
+                                LayoutOptions(), layout),
+                 std::out_of_range);
+    const std::string whole = olvane::writeLayoutText(olvane::recordsOf(layout));
+    EXPECT_LT(0u, layout.boxes.size());
+    EXPECT_TRUE(layout.text.starts_with(whole));
+    EXPECT_NE(whole, layout.text);
+    EXPECT_EQ(layout.boxes.size(), olvane::readWholeRecords(layout.text).records.size());
+}
+
 // Lays out within its first question for children.
 class NestingManager : public support::CaseManager {
 public:
