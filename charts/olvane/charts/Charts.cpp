@@ -3,6 +3,7 @@
 
 #include <olvane/charts/Charts.h>
 
+#include <olvane/charts/Everybody.h>
 #include <olvane/charts/FanInternal.h>
 #include <olvane/charts/GapTracksInternal.h>
 #include <olvane/charts/PlanBuilderInternal.h>
@@ -53,6 +54,18 @@ picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& reque
     return PlanPicture(graph, request, sizes, plan, gaps).make();
 }
 
+EverybodyOptions everybodyOptions(const ChartRequest& request) {
+    EverybodyOptions options;
+    options.focus = request.focus;
+    options.marks = request.marks;
+    options.effort = request.effort;
+    options.onePart = request.onePart;
+    options.direction = request.direction;
+    options.sizes = request.sizes;
+    options.boxSizes = request.boxSizes;
+    return options;
+}
+
 }  // namespace
 
 const char* nameOf(View view) {
@@ -93,6 +106,8 @@ picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request
             return treeChart(graph, request);
         case View::fan:
             return fanChart(graph, request);
+        case View::everybody:
+            return everybodyChart(graph, everybodyOptions(request));
         default:
             break;
     }

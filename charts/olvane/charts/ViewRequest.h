@@ -70,8 +70,9 @@ struct ChartRequest {
     WayChoice ways = WayChoice::both;
     int mostWays = 8;  // kinship: no more ways than this are drawn, the nearest first; 0 means all
 
-    int mostMarks = -1;  // everybody: how many second parent links may become marks; -1 for as many as serve
-    int effort = 1;      // everybody: 0 is quickest, each step more takes about twice the time
+    int marks = 0;        // everybody: how many second links become marks; -1 for all of them
+    int effort = 1;       // everybody: 0 is quickest, each step more takes up to twice the time
+    bool onePart = true;  // everybody: only the part of the family that the focus is in
 };
 
 }  // namespace olvane::charts

@@ -1,0 +1,73 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/charts/EverybodyFoldInternal.h>
+
+#include <algorithm>
+
+namespace olvane::charts {
+
+namespace {
+
+std::size_t at(std::int32_t place) {
+    return static_cast<std::size_t>(place);
+}
+
+constexpr int kMostRows = 3;
+
+int rowsFor(double width, double limit) {
+    return width <= limit ? 1 : width <= 2 * limit ? 2 : kMostRows;
+}
+
+// The width of a row that makes the picture as wide as it should be for its height; found by halving, since a
+// smaller limit only makes the picture narrower and higher.
+double limitFor(const std::vector<double>& widths, const FoldSizes& sizes) {
+    double low = 0;
+    double high = *std::max_element(widths.begin(), widths.end());
+    for (int i = 0; i < 40; ++i) {
+        const double limit = (low + high) / 2;
+        double widest = 0;
+        double height = 0;
+        for (const double width : widths) {
+            const int count = rowsFor(width, limit);
+            widest = std::max(widest, width / count);
+            height += sizes.rowPitch * count;
+        }
+        (widest > sizes.aspect * height ? high : low) = limit;
+    }
+    return high;
+}
+
+// The union that a chain hangs from first; -1 for a chain without known parents.
+std::int32_t unionAbove(const Rows& rows, std::int32_t chain) {
+    const auto strands = rows.strandsAbove[chain];
+    return strands.empty() ? -1 : rows.strands[at(strands[0])].unionPlace;
+}
+
+}  // namespace
+
+std::vector<std::int32_t> foldRows(const Rows& rows, const RowOrder& order, const FoldSizes& sizes) {
+    std::vector<double> widths(at(rows.rowCount), 0);
+    for (std::int32_t chain = 0; chain < rows.chainCount; ++chain) {
+        widths[at(rows.row[at(chain)])] += sizes.width[at(chain)];
+    }
+    const double limit = limitFor(widths, sizes);
+    std::vector<std::int32_t> folded(at(rows.chainCount));
+    std::int32_t first = 0;
+    for (std::int32_t row = 0; row < rows.rowCount; ++row) {
+        const int count = rowsFor(widths[at(row)], limit);
+        std::int32_t before = -1;
+        int turn = count - 1;
+        for (const std::int32_t node : order.nodes[at(row)]) {
+            if (rows.isPass(node)) continue;
+            const std::int32_t above = unionAbove(rows, node);
+            if (above < 0 || above != before) turn = (turn + 1) % count;
+            before = above;
+            folded[at(node)] = first + turn;
+        }
+        first += count;
+    }
+    return folded;
+}
+
+}  // namespace olvane::charts

@@ -1,0 +1,285 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/charts/EverybodyLayoutInternal.h>
+
+#include <algorithm>
+#include <utility>
+
+#include <olvane/charts/EverybodyFoldInternal.h>
+#include <olvane/charts/EverybodyLevelsInternal.h>
+#include <olvane/charts/EverybodyMarksInternal.h>
+
+namespace olvane::charts {
+
+namespace {
+
+std::size_t at(std::int32_t place) {
+    return static_cast<std::size_t>(place);
+}
+
+// What lies between a row and the first track under it, and between two tracks. Units: points.
+constexpr double kTrackMargin = 9;
+constexpr double kTrackGap = 4;
+// How near to the side of its box a line may end.
+constexpr double kBoxMargin = 5;
+// How far a line that runs between boxes may be moved to keep it off others.
+constexpr double kMostPassMove = 20;
+
+class PartLayouter {
+public:
+    PartLayouter(PartLayout& layout, const BoxSizes& boxes, const EverybodyOptions& options)
+        : l_(layout), boxes_(boxes), options_(options) {}
+
+    // Couples first, since who stands side by side is in one row. Then rows, which need the couples; then the order
+    // in the rows, which decides over crossings; then places, which keep the order; lines last.
+    void layOut() {
+        l_.chains = weldCouples(l_.part);
+        const std::vector<std::int32_t> rows = chooseRows(l_.part, l_.chains, levelEffort());
+        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
+        if (options_.marks < 0) markAllSecondLinks(l_.part, l_.chains, rows, l_.marked);
+        measureChains();
+        orderRows(rows);
+        measureEnds();
+        l_.left = placeNodes(l_.rows, l_.order, l_.sizes, 0, kSweeps);
+        l_.lines = routeGaps(l_.rows, endRanges());
+        stackRows();
+    }
+
+private:
+    static constexpr int kSweeps = 24;
+
+    std::int64_t levelEffort() const { return 20'000'000 + 40 * std::int64_t{l_.part.personCount()}; }
+    std::int64_t orderEffort() const {
+        const std::int64_t once = 60'000'000 + 400 * std::int64_t{l_.part.personCount()};
+        return options_.effort <= 0 ? 0 : once << std::min(options_.effort - 1, 16);
+    }
+
+    void measureChains() {
+        l_.sizes.gap = boxes_.gapX;
+        l_.sizes.passRoom = boxes_.gapX / 2;
+        for (std::int32_t chain = 0; chain < l_.chains.count(); ++chain) {
+            double width = -l_.sizes.gap;
+            for (const std::int32_t person : l_.chains.persons[chain])
+                width += boxes_.width(l_.part, person) + l_.sizes.gap;
+            l_.sizes.width.push_back(width);
+        }
+    }
+
+    void orderRows(const std::vector<std::int32_t>& unfolded) {
+        l_.rows = makeRows(l_.part, l_.chains, unfolded, l_.marked);
+        l_.order = walkOrder(l_.rows);
+        fold();
+        if (options_.marks < 0) return;
+        l_.order = findOrder(l_.rows, orderEffort(), starts());
+        for (std::int32_t left = options_.marks, batch = (left + 2) / 3; left > 0; left -= batch) {
+            const std::int32_t count = std::min(left, batch);
+            const std::int32_t made = markWorstLinks(l_.part, l_.chains, l_.rows, l_.order, count, l_.marked);
+            if (made == 0) break;
+            l_.marksMade += made;
+            rebuildRows();
+            reduceCrossings(l_.rows, l_.order, orderEffort() / 3);
+        }
+    }
+
+    int starts() const {
+        constexpr std::int32_t kSmall = 200;
+        return l_.rows.nodeCount() <= kSmall ? 4 : std::clamp(options_.effort, 1, 4);
+    }
+
+    void fold() {
+        if (options_.foldAspect <= 0 || l_.rows.rowCount == 0) return;
+        FoldSizes sizes;
+        sizes.aspect = options_.foldAspect;
+        for (const double width : l_.sizes.width) sizes.width.push_back(width + l_.sizes.gap);
+        sizes.rowPitch = 1.15 * (boxes_.mostHeight(l_.part) + boxes_.gapY);
+        l_.rows = makeRows(l_.part, l_.chains, foldRows(l_.rows, l_.order, sizes), l_.marked);
+        l_.order = walkOrder(l_.rows);
+    }
+
+    // With more marks there are fewer passes; all other nodes stay in their order.
+    void rebuildRows() {
+        const std::vector<std::int32_t> chainRows(l_.rows.row.begin(),
+                                                  l_.rows.row.begin() + l_.rows.chainCount);
+        Rows rows = makeRows(l_.part, l_.chains, chainRows, l_.marked);
+        for (auto& nodes : l_.order.nodes) {
+            std::size_t kept = 0;
+            for (std::int32_t node : nodes) {
+                if (l_.rows.isPass(node))
+                    node = passAt(rows, l_.rows.passUnion[at(node - rows.chainCount)], l_.rows.row[at(node)]);
+                if (node >= 0) nodes[kept++] = node;
+            }
+            nodes.resize(kept);
+        }
+        l_.rows = std::move(rows);
+    }
+
+    static std::int32_t passAt(const Rows& rows, std::int32_t u, std::int32_t row) {
+        if (rows.firstPass[at(u)] < 0 || row < rows.passRow[at(u)]) return -1;
+        const std::int32_t node = rows.firstPass[at(u)] + row - rows.passRow[at(u)];
+        if (node >= rows.nodeCount() || rows.passUnion[at(node - rows.chainCount)] != u) return -1;
+        return node;
+    }
+
+    // Where ends lie in their nodes, now that it is known which chains are turned round.
+    void measureEnds() {
+        l_.sizes.width.resize(at(l_.rows.nodeCount()), 0);
+        l_.sizes.endPlace.assign(l_.rows.ends.size(), 0);
+        for (std::size_t e = 0; e < l_.rows.ends.size(); ++e) {
+            const Rows::End& end = l_.rows.ends[e];
+            if (l_.rows.isPass(end.node)) continue;
+            const Box box = boxOf(l_.chains.persons[end.node][at(end.sub / 2)]);
+            double place = (box.left + box.right) / 2;
+            if (end.sub % 2 == 1) {
+                place = l_.order.flipped[at(end.node)] != 0 ? box.left - l_.sizes.gap / 2
+                                                            : box.right + l_.sizes.gap / 2;
+            }
+            l_.sizes.endPlace[e] = place;
+        }
+    }
+
+    struct Box {
+        double left;
+        double right;
+    };
+
+    // In its chain.
+    Box boxOf(std::int32_t person) const {
+        const std::int32_t chain = l_.chains.chain[at(person)];
+        const auto persons = l_.chains.persons[chain];
+        const bool flipped = l_.order.flipped[at(chain)] != 0;
+        const auto slot = at(l_.chains.slot[at(person)]);
+        double left = 0;
+        for (std::size_t i = flipped ? persons.size() - 1 : 0; i != slot; flipped ? --i : ++i) {
+            left += boxes_.width(l_.part, persons[i]) + l_.sizes.gap;
+        }
+        return {left, left + boxes_.width(l_.part, person)};
+    }
+
+    std::vector<EndRange> endRanges() const {
+        std::vector<EndRange> ranges;
+        ranges.reserve(l_.rows.ends.size());
+        for (std::size_t e = 0; e < l_.rows.ends.size(); ++e) {
+            const Rows::End& end = l_.rows.ends[e];
+            const double wanted = l_.left[at(end.node)] + l_.sizes.endPlace[e];
+            double room = 0;
+            if (!l_.rows.isPass(end.node)) {
+                const std::int32_t person = l_.chains.persons[end.node][at(end.sub / 2)];
+                room =
+                    end.sub % 2 == 1 ? l_.sizes.gap / 2 - 4 : boxes_.width(l_.part, person) / 2 - kBoxMargin;
+            }
+            room = std::max(0.0, room);
+            ranges.push_back({wanted, wanted - room, wanted + room});
+        }
+        for (std::int32_t chain = 0; chain < l_.rows.chainCount; ++chain) spreadEnds(chain, ranges);
+        for (const auto& nodes : l_.order.nodes) givePassesRoom(nodes, ranges);
+        return ranges;
+    }
+
+    // A pass may be moved between its neighbours, half of the way if that is another pass.
+    void givePassesRoom(const std::vector<std::int32_t>& nodes, std::vector<EndRange>& ranges) const {
+        const auto room = [this](std::int32_t beside, double apart) {
+            return std::max(0.0,
+                            l_.rows.isPass(beside) ? (apart - GapLines::kApart) / 2 : apart - kBoxMargin);
+        };
+        for (std::size_t i = 0; i < nodes.size(); ++i) {
+            if (!l_.rows.isPass(nodes[i])) continue;
+            const double x = l_.left[at(nodes[i])];
+            double before = kMostPassMove;
+            double behind = kMostPassMove;
+            if (i > 0) {
+                const double edge = l_.left[at(nodes[i - 1])] + l_.sizes.width[at(nodes[i - 1])];
+                before = std::min(before, room(nodes[i - 1], x - edge));
+            }
+            if (i + 1 < nodes.size())
+                behind = std::min(behind, room(nodes[i + 1], l_.left[at(nodes[i + 1])] - x));
+            for (const std::int32_t e : l_.rows.endsAt[nodes[i]]) ranges[at(e)] = {x, x - before, x + behind};
+        }
+    }
+
+    // Ends at one side of one box, or of one couple, stand beside one another in the order of where they lead to.
+    void spreadEnds(std::int32_t chain, std::vector<EndRange>& ranges) const {
+        std::vector<std::int32_t> ends(l_.rows.endsAt[chain].begin(), l_.rows.endsAt[chain].end());
+        if (ends.size() < 2) return;
+        const auto sameSide = [this](std::int32_t a, std::int32_t b) {
+            return l_.rows.isBelow(a) == l_.rows.isBelow(b) &&
+                   l_.rows.ends[at(a)].sub == l_.rows.ends[at(b)].sub;
+        };
+        std::stable_sort(ends.begin(), ends.end(), [&](std::int32_t a, std::int32_t b) {
+            if (l_.rows.isBelow(a) != l_.rows.isBelow(b)) return l_.rows.isBelow(a);
+            if (l_.rows.ends[at(a)].sub != l_.rows.ends[at(b)].sub)
+                return l_.rows.ends[at(a)].sub < l_.rows.ends[at(b)].sub;
+            return otherSide(a, ranges) < otherSide(b, ranges);
+        });
+        for (std::size_t first = 0, last = 0; first < ends.size(); first = last) {
+            for (last = first; last < ends.size() && sameSide(ends[first], ends[last]); ++last) {
+            }
+            const auto steps = static_cast<double>(last - first - 1);
+            if (steps == 0) continue;
+            const EndRange range = ranges[at(ends[first])];
+            const double step = std::min(9.0, (range.high - range.low) / steps);
+            for (std::size_t i = first; i < last; ++i) {
+                ranges[at(ends[i])].wanted += step * (static_cast<double>(i - first) - steps / 2);
+                ranges[at(ends[i])].low = ranges[at(ends[i])].wanted - (step - GapLines::kApart) / 2;
+                ranges[at(ends[i])].high = ranges[at(ends[i])].wanted + (step - GapLines::kApart) / 2;
+            }
+        }
+    }
+
+    // The outermost places that the strand of an end has on the other side of its gap; far left where it has none.
+    std::pair<double, double> otherSide(std::int32_t e, const std::vector<EndRange>& ranges) const {
+        const Rows::Strand& strand = l_.rows.strands[at(l_.rows.strandOfEnd[at(e)])];
+        const bool below = l_.rows.isBelow(e);
+        const std::uint32_t first = strand.firstEnd + (below ? 0 : strand.aboveCount);
+        const std::uint32_t count = below ? strand.aboveCount : strand.belowCount;
+        if (count == 0) return {-1, -1};
+        std::pair<double, double> places(ranges[first].wanted, ranges[first].wanted);
+        for (std::uint32_t i = first; i < first + count; ++i) {
+            places.first = std::min(places.first, ranges[i].wanted);
+            places.second = std::max(places.second, ranges[i].wanted);
+        }
+        return places;
+    }
+
+    void stackRows() {
+        l_.rowHeight.assign(at(l_.rows.rowCount), 0);
+        for (std::int32_t person = 0; person < l_.part.personCount(); ++person) {
+            double& height = l_.rowHeight[at(l_.rows.row[at(l_.chains.chain[at(person)])])];
+            height = std::max(height, boxes_.height(l_.part, person));
+        }
+        l_.gapTop.assign(at(l_.rows.rowCount + 1), 0);
+        double y = 0;
+        for (std::int32_t gap = -1; gap < l_.rows.rowCount; ++gap) {
+            if (gap >= 0) {
+                l_.rowTop.push_back(y);
+                y += l_.rowHeight[at(gap)];
+            }
+            const std::int32_t tracks = l_.lines.tracks[at(gap + 1)];
+            const bool outside = gap < 0 || gap + 1 == l_.rows.rowCount;
+            const double used = tracks > 0 ? (tracks - 1) * kTrackGap : 0;
+            const double height = outside ? (tracks > 0 ? used + kTrackMargin : 0)
+                                          : std::max(double{boxes_.gapY}, used + 2 * kTrackMargin);
+            l_.gapTop[at(gap + 1)] = outside ? y + (gap < 0 ? 0 : kTrackMargin) : y + (height - used) / 2;
+            y += height;
+        }
+        l_.height = y;
+        for (std::int32_t node = 0; node < l_.rows.nodeCount(); ++node) {
+            l_.width = std::max(l_.width, l_.left[at(node)] + l_.sizes.width[at(node)]);
+        }
+    }
+
+    PartLayout& l_;
+    const BoxSizes& boxes_;
+    const EverybodyOptions& options_;
+};
+
+}  // namespace
+
+PartLayout layOutPart(Component part, const BoxSizes& boxes, const EverybodyOptions& options) {
+    PartLayout layout;
+    layout.part = std::move(part);
+    PartLayouter(layout, boxes, options).layOut();
+    return layout;
+}
+
+}  // namespace olvane::charts

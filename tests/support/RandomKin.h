@@ -1,0 +1,19 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+
+#include <olvane/kin/KinGraph.h>
+
+namespace olvane::test {
+
+// A made-up family, the same for the same seed on every machine. A sound one has generations: people marry
+// within theirs, once or more often, cousins among them, and children come after their parents. A hostile one is
+// unions of anybody with anybody: loops, people who are their own ancestors or partners, children of several
+// unions, and parts that are not connected.
+kin::KinGraph soundKin(std::uint64_t seed, int persons);
+kin::KinGraph hostileKin(std::uint64_t seed, int persons, int unions);
+
+}  // namespace olvane::test

@@ -1,0 +1,226 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// What holds of the chart of everybody for any family: sound ones, and ones that contradict themselves.
+
+#include <olvane/charts/Everybody.h>
+#include <olvane/picture/Judge.h>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <map>
+#include <numeric>
+#include <set>
+#include <string>
+#include <tuple>
+#include <vector>
+
+#include <PlainJudge.h>
+#include <RandomKin.h>
+
+namespace {
+
+using olvane::charts::Direction;
+using olvane::charts::everybodyChart;
+using olvane::charts::EverybodyOptions;
+using olvane::kin::KinGraph;
+using olvane::picture::Judgement;
+using olvane::picture::Picture;
+
+struct Made {
+    std::string name;
+    KinGraph graph;
+};
+
+std::vector<Made> families(int count) {
+    std::vector<Made> made;
+    for (int seed = 0; seed < count; ++seed) {
+        const auto number = static_cast<std::uint64_t>(seed);
+        const int persons = 1 + seed % 60;
+        made.push_back({"sound " + std::to_string(seed), olvane::test::soundKin(number, persons)});
+        made.push_back({"hostile " + std::to_string(seed),
+                        olvane::test::hostileKin(number, persons, 1 + seed * 7 % 50)});
+    }
+    return made;
+}
+
+Picture chart(const KinGraph& graph, int marks, bool onePart = false) {
+    EverybodyOptions options;
+    options.marks = marks;
+    options.onePart = onePart;
+    return everybodyChart(graph, options);
+}
+
+// By repeated looking, until nobody is added: slow and plain.
+std::set<std::int64_t> connectedWith(const KinGraph& graph, olvane::kin::Place first) {
+    std::set<olvane::kin::Place> in = {first};
+    for (bool grown = true; grown;) {
+        grown = false;
+        for (olvane::kin::UnionPlace u = 0; u < graph.unionCount(); ++u) {
+            std::vector<olvane::kin::Place> members(graph.children(u).begin(), graph.children(u).end());
+            for (const olvane::kin::Place partner : graph.partners(u)) {
+                if (partner != olvane::kin::kNobody) members.push_back(partner);
+            }
+            const bool touches =
+                std::any_of(members.begin(), members.end(), [&](auto m) { return in.count(m) > 0; });
+            for (const olvane::kin::Place member : members) grown |= touches && in.insert(member).second;
+        }
+    }
+    std::set<std::int64_t> ids;
+    for (const olvane::kin::Place place : in) ids.insert(graph.id(place));
+    return ids;
+}
+
+TEST(Everybody, showsEachPersonOfTheFamilyOfTheFocusOnce) {
+    for (const Made& made : families(40)) {
+        const Picture picture = chart(made.graph, 0, true);
+        std::multiset<std::int64_t> shown;
+        for (const auto& box : picture.boxes) shown.insert(box.id);
+        const std::set<std::int64_t> expected = connectedWith(made.graph, 0);
+        EXPECT_EQ(std::vector(shown.begin(), shown.end()), std::vector(expected.begin(), expected.end()))
+            << made.name;
+        ASSERT_GE(picture.focus, 0) << made.name;
+        EXPECT_EQ(picture.boxes[static_cast<std::size_t>(picture.focus)].id, made.graph.id(0)) << made.name;
+    }
+}
+
+TEST(Everybody, drawsEveryLinkAndNothingThatCanBeMisread) {
+    for (const Made& made : families(40)) {
+        for (const int marks : {0, 3, -1}) {
+            const Judgement j = olvane::picture::judge(chart(made.graph, marks), &made.graph);
+            const std::vector<std::size_t> counts = {j.overlaps, j.hits,    j.tracks,  j.touches,
+                                                     j.unjoined, *j.untold, j.slanted, j.repeats};
+            EXPECT_EQ(counts, std::vector<std::size_t>(8, 0)) << made.name << ", marks " << marks;
+            EXPECT_EQ(j.persons, static_cast<std::size_t>(made.graph.personCount())) << made.name;
+        }
+    }
+}
+
+TEST(Everybody, isJudgedAlikeByThePlainCounts) {
+    for (const Made& made : families(30)) {
+        const Picture picture = chart(made.graph, 0);
+        const Judgement fast = olvane::picture::judge(picture, &made.graph);
+        const Judgement plain = olvane::test::plainJudgement(picture, &made.graph);
+        EXPECT_EQ(
+            std::tie(fast.overlaps, fast.hits, fast.crossings, fast.tracks, fast.touches, fast.unjoined),
+            std::tie(plain.overlaps, plain.hits, plain.crossings, plain.tracks, plain.touches,
+                     plain.unjoined))
+            << made.name;
+    }
+}
+
+TEST(Everybody, crossesNoLinesWhenEverySecondLinkIsAMark) {
+    for (const Made& made : families(40)) {
+        const Picture picture = chart(made.graph, -1);
+        EXPECT_EQ(olvane::picture::judge(picture).crossings, 0U) << made.name;
+    }
+}
+
+TEST(Everybody, makesNoMoreMarksThanAreAskedFor) {
+    for (const Made& made : families(40)) {
+        if (made.name[0] == 'h') continue;  // in these, boxes may have no room for all of their lines
+        EXPECT_EQ(chart(made.graph, 0).marks.size(), 0U) << made.name;
+        EXPECT_LE(chart(made.graph, 2).marks.size(), 2U) << made.name;
+    }
+}
+
+// The middle of each box down the picture: rows have one middle.
+std::map<std::int64_t, double> middles(const Picture& picture) {
+    std::map<std::int64_t, double> middles;
+    for (const auto& box : picture.boxes) middles[box.id] = box.y + static_cast<double>(box.height) / 2;
+    return middles;
+}
+
+// Without contradictions between couples and generations, parents stand above their children; whether there are such is
+// found by pushing children down, couples side by side together, until nothing moves or a row below all is reached.
+TEST(Everybody, putsParentsAboveTheirChildren) {
+    int tried = 0;
+    for (const Made& made : families(60)) {
+        const Picture picture = chart(made.graph, 0);
+        const std::map<std::int64_t, double> y = middles(picture);
+        std::map<std::int64_t, int> row;
+        bool moved = true;
+        int rounds = 0;
+        for (; moved && rounds <= made.graph.personCount(); ++rounds) {
+            moved = false;
+            for (olvane::kin::UnionPlace u = 0; u < made.graph.unionCount(); ++u) {
+                for (const auto partner : made.graph.partners(u)) {
+                    if (partner == olvane::kin::kNobody) continue;
+                    for (const auto other : made.graph.partners(u)) {
+                        if (other == olvane::kin::kNobody) continue;
+                        int& mine = row[made.graph.id(partner)];
+                        if (mine < row[made.graph.id(other)]) mine = row[made.graph.id(other)], moved = true;
+                    }
+                    for (const auto child : made.graph.children(u)) {
+                        int& below = row[made.graph.id(child)];
+                        if (below < row[made.graph.id(partner)] + 1)
+                            below = row[made.graph.id(partner)] + 1, moved = true;
+                    }
+                }
+            }
+        }
+        if (moved) continue;
+        ++tried;
+        for (olvane::kin::UnionPlace u = 0; u < made.graph.unionCount(); ++u) {
+            for (const auto partner : made.graph.partners(u)) {
+                if (partner == olvane::kin::kNobody) continue;
+                for (const auto child : made.graph.children(u)) {
+                    EXPECT_LT(y.at(made.graph.id(partner)), y.at(made.graph.id(child))) << made.name;
+                }
+            }
+        }
+    }
+    EXPECT_GT(tried, 40);
+}
+
+TEST(Everybody, isTheSameForTheSameFamily) {
+    for (const Made& made : families(20)) {
+        const Picture one = chart(made.graph, 2);
+        const Picture other = chart(made.graph, 2);
+        ASSERT_EQ(one.lines.size(), other.lines.size()) << made.name;
+        for (std::size_t i = 0; i < one.lines.size(); ++i) {
+            EXPECT_EQ(std::tie(one.lines[i].x1, one.lines[i].y1, one.lines[i].x2, one.lines[i].y2),
+                      std::tie(other.lines[i].x1, other.lines[i].y1, other.lines[i].x2, other.lines[i].y2));
+        }
+    }
+}
+
+TEST(Everybody, runsInFourDirectionsAlike) {
+    for (const Made& made : families(20)) {
+        EverybodyOptions options;
+        options.onePart = false;
+        const Judgement down = olvane::picture::judge(everybodyChart(made.graph, options), &made.graph);
+        for (const Direction direction : {Direction::up, Direction::left, Direction::right}) {
+            options.direction = direction;
+            const Judgement j = olvane::picture::judge(everybodyChart(made.graph, options), &made.graph);
+            EXPECT_EQ(
+                std::tuple(j.overlaps, j.hits, j.tracks, j.touches, j.unjoined, *j.untold),
+                std::tuple(down.overlaps, down.hits, down.tracks, down.touches, down.unjoined, *down.untold))
+                << made.name;
+            if (direction == Direction::up) {
+                EXPECT_EQ(j.crossings, down.crossings) << made.name;
+            }
+        }
+    }
+}
+
+TEST(Everybody, takesBoxesOfAnySize) {
+    for (const Made& made : families(20)) {
+        std::vector<olvane::charts::BoxSize> sizes;
+        for (int i = 0; i < made.graph.personCount(); ++i) {
+            sizes.push_back({static_cast<float>(30 + i * 37 % 90), static_cast<float>(20 + i * 53 % 70)});
+        }
+        EverybodyOptions options;
+        options.onePart = false;
+        options.boxSizes = sizes;
+        const Picture picture = everybodyChart(made.graph, options);
+        const Judgement j = olvane::picture::judge(picture, &made.graph);
+        EXPECT_EQ(std::tuple(j.overlaps, j.hits, j.unjoined, *j.untold), std::tuple(0U, 0U, 0U, 0U))
+            << made.name;
+        for (std::size_t i = 0; i < sizes.size(); ++i)
+            EXPECT_EQ(picture.boxes[i].width, sizes[i].width) << made.name;
+    }
+}
+
+}  // namespace
