@@ -124,7 +124,7 @@ Word ur(int count, const Word& word) {
         for (int i = 1; i < count; ++i) prefix += "ur";
         return compound(prefix, word);
     }
-    const Word one = compound("Ur", word);
+    Word one = compound("Ur", word);
     const std::string times = std::to_string(count) + "×";
     return {times + one.word, times + one.genitive, one.gender};
 }
@@ -159,7 +159,7 @@ Word collateral(const BloodWords& way) {
         return ofDegree(degree - 1, compound(manner(way), cousin()[way.sex]));
     }
     const Words& words = way.up > way.down ? parentsSibling() : siblingsChild();
-    const Word word = compound(manner(way), great(later - 1, words[way.sex]));
+    Word word = compound(manner(way), great(later - 1, words[way.sex]));
     return degree == 1 ? word : ofDegree(degree, word);
 }
 
