@@ -6,6 +6,7 @@
 
 #include <olvane.h>
 #include <olvane_family.h>
+#include <olvane_picture.h>
 
 #include <stdio.h>
 #include <string.h>

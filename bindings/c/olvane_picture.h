@@ -1,0 +1,142 @@
+/* SPDX-FileCopyrightText: The Olvane developers */
+/* SPDX-License-Identifier: MIT */
+
+#pragma once
+
+/*
+ * A layout as a picture: boxes, the families that join them, and lines that are routed around all boxes, as plain
+ * arrays.
+ *
+ *     olvane_picture *picture = NULL;
+ *     olvane_picture_arrays arrays = {sizeof arrays};
+ *     olvane_picture_create(layout, family, 1, &picture);
+ *     olvane_picture_read(picture, &arrays);
+ *     for (size_t i = 0; i < arrays.line_count; ++i) draw(&arrays.lines[i]);
+ *     olvane_picture_free(picture);
+ *
+ * Units: points; x grows right, y grows down. Places in an array count from 0, and OLVANE_NO_PLACE is nowhere.
+ * Ownership: a picture belongs to whoever asked for it and needs neither the layout nor the family any more. Its arrays
+ *     live as long as it does.
+ * Threads: a picture never changes, so several threads may read one.
+ */
+
+#include <olvane.h>
+#include <olvane_family.h>
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+#define OLVANE_NO_PLACE (-1)
+
+/* The numbers of these enumerations never change; later versions may add some. */
+typedef enum olvane_box_kind { OLVANE_BOX_PERSON = 0, OLVANE_BOX_UNKNOWN_PARENT = 1 } olvane_box_kind;
+
+typedef enum olvane_line_role {
+    OLVANE_LINE_MARRIAGE = 0, /* from parent to parent */
+    OLVANE_LINE_DROP = 1,     /* from the parents to the bar */
+    OLVANE_LINE_BAR = 2,      /* along the children */
+    OLVANE_LINE_STEM = 3,     /* to one child */
+    OLVANE_LINE_LINK = 4      /* where there are no levels */
+} olvane_line_role;
+
+typedef enum olvane_mark_kind {
+    OLVANE_MARK_SAME_PERSON = 0, /* two boxes of one person */
+    OLVANE_MARK_PARENTS_ELSEWHERE =
+        1, /* a child, and the one or two parents whose family is drawn elsewhere */
+    OLVANE_MARK_PARTNERS_ELSEWHERE = 2
+} olvane_mark_kind;
+
+/* repeat is 0 for a person with one box; else it counts the person's boxes from 1, the nearest to the focus first. */
+typedef struct olvane_picture_box {
+    int64_t id; /* 0 for an unknown parent */
+    double x;   /* of the upper-left corner */
+    double y;
+    float width;
+    float height;
+    int32_t kind;     /* olvane_box_kind */
+    int32_t sex;      /* 0 male, 1 female, 2 unknown */
+    int32_t child_of; /* of an unknown parent: the box whose parent it is */
+    int32_t repeat;
+    int32_t flag;           /* 1 for a person who has relatives without a box, by the layout's own count */
+    int32_t hidden_parents; /* relatives without a box; 0 where no family was given */
+    int32_t hidden_partners;
+    int32_t hidden_children;
+} olvane_picture_box;
+
+/* Persons joined by lines. Its members lie side by side in members, one or two parents first, the father or the
+   husband ahead, then the children; child_kinds lies beside members. */
+typedef struct olvane_picture_family {
+    uint32_t first_member;
+    uint32_t parent_count;
+    uint32_t child_count;
+    uint32_t first_line; /* in lines */
+    uint32_t line_count;
+    uint32_t number; /* of the family in olvane_family; 0 without one */
+    int32_t state;   /* 0 married, 1 divorced, 2 unmarried, 3 unknown */
+} olvane_picture_family;
+
+/* A straight piece, horizontal or vertical. Its bridges are where it jumps over another family's line: the x of each on
+   a horizontal piece, the y on a vertical one. */
+typedef struct olvane_picture_line {
+    double x1;
+    double y1;
+    double x2;
+    double y2;
+    int32_t role;          /* olvane_line_role */
+    int32_t child;         /* the box of the child to whom the piece belongs alone, or OLVANE_NO_PLACE */
+    uint32_t first_bridge; /* in bridges */
+    uint32_t bridge_count;
+} olvane_picture_line;
+
+/* What is expressed without a line. Marks of one number, from 1, have one sign at each of their boxes. */
+typedef struct olvane_picture_mark {
+    int32_t kind; /* olvane_mark_kind */
+    int32_t number;
+    int32_t boxes[3]; /* OLVANE_NO_PLACE where there are fewer */
+} olvane_picture_mark;
+
+/* All arrays of a picture; those of no entries are null. */
+typedef struct olvane_picture_arrays {
+    size_t
+        struct_size; /* sizeof(olvane_picture_arrays), set by the caller: a later version fills what it knows */
+    const olvane_picture_box* boxes; /* in the order of the layout's records */
+    size_t box_count;
+    const olvane_picture_family* families;
+    size_t family_count;
+    const int32_t* members; /* places of boxes */
+    const int32_t*
+        child_kinds;     /* 0 birth, 1 adopted, 2 foster, 3 step, 4 sealing, 5 unknown; nothing at a parent */
+    size_t member_count; /* of both */
+    const olvane_picture_line* lines;
+    size_t line_count;
+    const double* bridges;
+    size_t bridge_count;
+    const olvane_picture_mark* marks;
+    size_t mark_count;
+    int32_t focus; /* place of its box, or OLVANE_NO_PLACE in an empty picture */
+} olvane_picture_arrays;
+
+typedef struct olvane_picture olvane_picture;
+
+/*
+ * The picture of a layout, also of what a failed one holds. With the family of which the layout is, families of the
+ * picture have its numbers, states and kinds of children, and boxes their counts of hidden relatives; family may be
+ * null. unknown_parents is 0 to leave out the boxes of parents who are not known.
+ */
+OLVANE_C_API olvane_status olvane_picture_create(const olvane_layout* layout, const olvane_family* family,
+                                                 int unknown_parents, olvane_picture** picture);
+/* A null picture is allowed. */
+OLVANE_C_API void olvane_picture_free(olvane_picture* picture);
+
+/* OLVANE_INVALID_ARGUMENT for a struct_size of no version. */
+OLVANE_C_API olvane_status olvane_picture_read(const olvane_picture* picture, olvane_picture_arrays* arrays);
+
+/* The picture as JSON of format 2, ended by a zero byte that length does not count; it lives as long as the picture.
+   length may be null. */
+OLVANE_C_API olvane_status olvane_picture_json(const olvane_picture* picture, const char** text,
+                                               size_t* length);
+
+#ifdef __cplusplus
+}
+#endif
