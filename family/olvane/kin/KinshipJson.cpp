@@ -4,7 +4,8 @@
 #include <olvane/kin/KinshipJson.h>
 
 #include <array>
-#include <charconv>
+#include <cstdio>
+#include <cstdlib>
 
 #include <olvane/kin/KinshipText.h>
 
@@ -14,10 +15,15 @@ namespace {
 
 constexpr std::array kBonds{"blood", "adopted", "foster", "step", "other"};
 
+// With as few digits as give the same number back. The library for browsers writes no fractions by to_chars.
 std::string number(double value) {
-    std::array<char, 32> digits{};
-    const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), value).ptr;
-    return std::string(digits.data(), end);
+    constexpr int kMostDigits = 17;
+    std::array<char, 32> text{};
+    for (int digits = 1; digits <= kMostDigits; ++digits) {
+        std::snprintf(text.data(), text.size(), "%.*g", digits, value);
+        if (std::strtod(text.data(), nullptr) == value) break;
+    }
+    return text.data();
 }
 
 template <class Value>
