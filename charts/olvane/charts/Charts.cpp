@@ -5,10 +5,8 @@
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/FanInternal.h>
-#include <olvane/charts/GapTracksInternal.h>
-#include <olvane/charts/PlanBuilderInternal.h>
-#include <olvane/charts/PlanPictureInternal.h>
-#include <olvane/charts/PlanPlacementInternal.h>
+#include <olvane/charts/SelectionInternal.h>
+#include <olvane/charts/TreeChartInternal.h>
 
 #include <cmath>
 #include <stdexcept>
@@ -36,22 +34,6 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("there must be one box size for each person");
     }
-}
-
-// A second line to parents may be so many times as long as the way from one box to the next.
-constexpr double kReachOfShortLinks = 4;
-
-// The view of the near is narrowed to this part of the width that its lines would like best.
-constexpr double kShareOfNear = 0.8;
-
-picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& request) {
-    const PlanSizes sizes(request);
-    Plan plan = PlanBuilder(graph, sizes, selectPersons(graph, request)).build(request.focus);
-    PlanPlacement(plan, sizes.gapX(), request.view == View::near ? kShareOfNear : 1).place();
-    GapTracks gaps(plan);
-    gaps.addShortLinks(kReachOfShortLinks * (request.sizes.boxWidth + request.sizes.gapX));
-    gaps.assignTracks();
-    return PlanPicture(graph, request, sizes, plan, gaps).make();
 }
 
 EverybodyOptions everybodyOptions(const ChartRequest& request) {
@@ -103,11 +85,14 @@ picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request
         case View::descendants:
         case View::hourglass:
         case View::relatives:
-            return treeChart(graph, request);
+            return treeChart(graph, request, selectPersons(graph, request));
         case View::fan:
             return fanChart(graph, request);
         case View::everybody:
             return everybodyChart(graph, everybodyOptions(request));
+        case View::kinship:
+            checkPerson(graph, request.to);
+            return kinshipChart(graph, request);
         default:
             break;
     }

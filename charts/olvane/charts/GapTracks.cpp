@@ -12,8 +12,6 @@ namespace olvane::charts {
 namespace {
 
 constexpr double kMargin = 4;                // between lines of different families that could touch
-constexpr std::int8_t kStemShift = 6;        // of a second stem on one box
-constexpr float kLeastWidthForTwo = 20;      // of a box with two stems
 constexpr std::size_t kMostNeighbours = 64;  // without drawn children, looked at in vain
 
 // What stands on the top edge of a box.
@@ -131,7 +129,7 @@ void GapTracks::take(const Candidate& candidate) {
     const Index box = plan_.childBox(candidate.link);
     const std::int8_t shift = shiftFor(candidate);
     const std::uint8_t used = topUsed_[at(box)];
-    if (shift != 0 && (plan_.boxWidth[at(box)] < kLeastWidthForTwo || (used & kOverLine) != 0)) return;
+    if (shift != 0 && (plan_.boxWidth[at(box)] < kLeastWidthForTwoStems || (used & kOverLine) != 0)) return;
     if ((used & placeOnTop(shift)) != 0) return;
     const double stem = stemOf(plan_, link) + shift;
     if (!canTake(candidate, stem)) return;

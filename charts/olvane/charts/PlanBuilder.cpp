@@ -7,6 +7,12 @@
 
 namespace olvane::charts {
 
+namespace {
+
+constexpr std::int8_t kNoRoom = 127;
+
+}  // namespace
+
 PlanBuilder::PlanBuilder(const kin::KinGraph& graph, const PlanSizes& sizes, const Selection& selection)
     : graph_(graph), selection_(selection), builder_(graph, sizes, plan_) {
     plan_.boxOf.assign(at(graph.personCount()), kNone);
@@ -29,6 +35,7 @@ Plan PlanBuilder::build(kin::Place focus) {
 // The parents of those who are in the line. A household is asked once.
 void PlanBuilder::growUpFrom(Index household, bool fromEverybody) {
     const Index first = static_cast<Index>(plan_.households.size());
+    firstParents_ = first;
     const Index end = plan_.boxEnd(household);
     for (Index box = plan_.households[at(household)].firstBox; box < end; ++box) {
         const kin::Place person = plan_.persons[at(box)];
@@ -47,25 +54,60 @@ void PlanBuilder::growUpFrom(Index household, bool fromEverybody) {
 void PlanBuilder::addParents(Index household, Index box, kin::UnionPlace u, bool joined) {
     kin::Place lead = kin::kNobody;
     kin::Place other = kin::kNobody;
+    bool isInLine = false;
     for (const kin::Place parent : graph_.partners(u)) {
         if (parent == kin::kNobody || plan_.boxOf[at(parent)] == kNone) continue;
         if (plan_.boxOf[at(parent)] != kAwaitsBox) return;
         (lead == kin::kNobody ? lead : other) = parent;
+        isInLine = isInLine || selection_.isLine[at(parent)];
     }
-    if (lead == kin::kNobody) return;
+    if (lead == kin::kNobody || (joined && !isInLine)) return;
     const std::int32_t row = plan_.households[at(household)].row - 1;
     const Index added = builder_.add(lead, row, other);
     Household& above = plan_.households[at(added)];
     above.isAbove = true;
     if (!joined || plan_.isCovered[at(box)]) return;
+    const std::int8_t shift = makeRoomFor(added, box);
+    if (shift == kNoRoom) return;
     for (Index family = above.firstFamily; family < plan_.familyEnd(added); ++family) {
         if (plan_.families[at(family)].u != u || !plan_.families[at(family)].hasDrop) continue;
         const std::uint32_t link = linkOf(family, plan_.persons[at(box)]);
         plan_.links[link].drawn = true;
+        plan_.links[link].shift = shift;
         above.treeParent = household;
         above.treeFamily = family;
         above.treeLink = static_cast<Index>(link);
     }
+}
+
+// Where a line from further parents may meet the top of a child's box: in the middle for the first, and for the
+// second on the right of the first, which moves to the left.
+std::int8_t PlanBuilder::makeRoomFor(Index added, Index box) {
+    const Index household = plan_.householdOf[at(box)];
+    std::uint32_t before = 0;
+    int count = 0;
+    for (Index other = firstParents_; other < added; ++other) {
+        const Household& parents = plan_.households[at(other)];
+        if (parents.treeParent != household) continue;
+        const auto link = static_cast<std::uint32_t>(parents.treeLink);
+        if (plan_.childBox(link) != box) continue;
+        before = link;
+        ++count;
+    }
+    if (count == 0) return 0;
+    if (count > 1 || plan_.boxWidth[at(box)] < kLeastWidthForTwoStems || hasOverLine(box)) return kNoRoom;
+    plan_.links[before].shift = -kStemShift;
+    return kStemShift;
+}
+
+bool PlanBuilder::hasOverLine(Index box) const {
+    const Index household = plan_.householdOf[at(box)];
+    for (Index family = plan_.households[at(household)].firstFamily; family < plan_.familyEnd(household);
+         ++family) {
+        const PlannedFamily& one = plan_.families[at(family)];
+        if (one.joint == Joint::over && (one.parents[0] == box || one.parents[1] == box)) return true;
+    }
+    return false;
 }
 
 std::uint32_t PlanBuilder::linkOf(Index family, kin::Place child) const {

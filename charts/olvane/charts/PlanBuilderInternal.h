@@ -29,6 +29,8 @@ private:
     void growAll(Index first);
     void addLeftOver();
     void addParents(Index household, Index box, kin::UnionPlace u, bool joined);
+    std::int8_t makeRoomFor(Index added, Index box);
+    bool hasOverLine(Index box) const;
     std::uint32_t linkOf(Index family, kin::Place child) const;
 
     const kin::KinGraph& graph_;
@@ -36,6 +38,7 @@ private:
     Plan plan_;
     HouseholdBuilder builder_;
     Index aboveEnd_ = 0;
+    Index firstParents_ = 0;  // of the household whose parents are being added
 };
 
 }  // namespace olvane::charts

@@ -27,6 +27,11 @@ inline std::size_t at(std::int32_t place) {
 constexpr double kTrackStep = 5;
 constexpr float kLeastLineGap = 3;
 
+// Where two lines from different parents meet the top of one box: so far from its centre on either side, in points,
+// if it has this width.
+constexpr std::int8_t kStemShift = 6;
+constexpr float kLeastWidthForTwoStems = 20;
+
 // How the two partners of a family are joined.
 //
 //   direct   [A]-+-[B]        over   +-----------+       alone   [A]
@@ -114,6 +119,10 @@ struct Plan {
     }
     float centreOf(Index box) const { return boxX[at(box)] + boxWidth[at(box)] / 2; }
     Index childBox(std::uint32_t link) const { return boxOf[at(links[link].child)]; }
+    // Where the stem of a link meets its child's box, from the left edge of the child's household.
+    double stemX(std::uint32_t link) const {
+        return static_cast<double>(centreOf(childBox(link)) + static_cast<float>(links[link].shift));
+    }
     std::uint32_t linkEnd(Index family) const {
         return at(family) + 1 < families.size() ? families[at(family) + 1].firstLink
                                                 : static_cast<std::uint32_t>(links.size());
@@ -132,6 +141,8 @@ public:
     float width(kin::Place person) const { return sideways_ ? heightOnPaper(person) : widthOnPaper(person); }
     // From row to row.
     float height(kin::Place person) const { return sideways_ ? widthOnPaper(person) : heightOnPaper(person); }
+    // Along the row, of a box without a size of its own.
+    float usualWidth() const { return sideways_ ? sizes_.boxHeight : sizes_.boxWidth; }
     float gapX() const { return sizes_.gapX; }
     float gapY() const { return sizes_.gapY; }
 

@@ -42,7 +42,7 @@ void RowRelaxation::measureLinks() {
     for (const Index h : byRow_) {
         const Household& household = plan_.households[at(h)];
         if (household.treeParent == kNone) continue;
-        const double stem = plan_.centreOf(plan_.childBox(static_cast<std::uint32_t>(household.treeLink)));
+        const double stem = plan_.stemX(static_cast<std::uint32_t>(household.treeLink));
         const double drop = plan_.families[at(household.treeFamily)].dropX;
         toParent_[at(h)] = household.isAbove ? stem - drop : drop - stem;
     }

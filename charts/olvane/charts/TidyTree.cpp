@@ -145,9 +145,8 @@ void TidyTree::setOverChildren(Index node) {
         double to = 0;
         for (const Index end : {children_.front(), children_.back()}) {
             const Household& child = plan_.households[at(end)];
-            const Index box = plan_.childBox(static_cast<std::uint32_t>(child.treeLink));
             const double drop = plan_.families[at(child.treeFamily)].dropX;
-            const double stem = plan_.centreOf(box);
+            const double stem = plan_.stemX(static_cast<std::uint32_t>(child.treeLink));
             to += frame_[at(end)] + position_[at(end)] + (above_ ? drop : stem);
             from += above_ ? stem : drop;
         }

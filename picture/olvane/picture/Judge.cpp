@@ -317,11 +317,12 @@ private:
         }
     }
 
-    // The middle borders on every cell of the ring around it.
-    bool cellsBorder(Index a, Index b) const {
+    // The middle borders on every cell of the ring around it. Cells that are one ring farther apart are joined by
+    // a line across that ring.
+    bool cellsBorder(Index a, Index b, int ringsApart = 1) const {
         const std::int32_t ringA = picture_.arcs[at(a)].ring;
         const std::int32_t ringB = picture_.arcs[at(b)].ring;
-        if (std::abs(ringA - ringB) != 1) return false;
+        if (std::abs(ringA - ringB) != ringsApart) return false;
         if (ringA == 0 || ringB == 0) return true;
         const Cell one = cellOf(a);
         const Cell other = cellOf(b);
@@ -331,7 +332,7 @@ private:
         return false;
     }
 
-    // Each parent against each child; two parents of one child are joined by it.
+    // Each parent against each child and the other parent; two parents of one child are joined by it.
     void joinCells(std::size_t f) {
         const Family& family = picture_.families[f];
         const std::size_t first = picture_.lines.size();
@@ -340,6 +341,13 @@ private:
                 if (!cellsBorder(parent, child)) continue;
                 groups_.join(first + members_.placeOf(f, parent), first + members_.placeOf(f, child));
             }
+            for (const Line& line : picture_.linesOf(family)) {
+                if (line.child == kNone || !cellsBorder(parent, line.child, 2)) continue;
+                groups_.join(first + members_.placeOf(f, parent), first + members_.placeOf(f, line.child));
+            }
+            const Index other = picture_.parents(family).back();
+            if (!cellsBorder(parent, other)) continue;
+            groups_.join(first + members_.placeOf(f, parent), first + members_.placeOf(f, other));
         }
     }
 

@@ -96,6 +96,20 @@ struct Mark {
     MarkKind kind = MarkKind::samePerson;
 };
 
+// How two persons are related by a way that a picture shows.
+enum class WayKind : std::uint8_t { blood, legal, marriage };
+
+// A way from one person to another.
+//
+// Holds: its boxes lie in Picture::wayBoxes, from the one person to the other; behind them, the common ancestors at
+//        its top, one or both of a couple. A way by marriage has none.
+struct Way {
+    std::uint32_t firstBox = 0;
+    std::uint32_t boxCount = 0;
+    std::uint32_t ancestorCount = 0;
+    WayKind kind = WayKind::blood;
+};
+
 // What is drawn, as data: boxes, families and the lines of each family. Every view ends in one.
 //
 // Holds: places are valid; boxes stand in a stable order; a family's members, kinds and lines lie side by
@@ -115,6 +129,8 @@ struct Picture {
     std::vector<Line> lines;
     std::vector<double> bridges;
     std::vector<Mark> marks;
+    std::vector<Way> ways;  // of a picture of kinship, the nearest first
+    std::vector<Index> wayBoxes;
 
     bool isRound() const { return !arcs.empty(); }
     std::span<const Index> parents(const Family& f) const {
@@ -127,6 +143,12 @@ struct Picture {
         return {childKinds.data() + f.firstMember + f.parentCount, f.childCount};
     }
     std::span<const Line> linesOf(const Family& f) const { return {lines.data() + f.firstLine, f.lineCount}; }
+    std::span<const Index> boxesOf(const Way& way) const {
+        return {wayBoxes.data() + way.firstBox, way.boxCount};
+    }
+    std::span<const Index> ancestorsOf(const Way& way) const {
+        return {wayBoxes.data() + way.firstBox + way.boxCount, way.ancestorCount};
+    }
     std::span<const double> bridgesOf(const Line& line) const {
         return {bridges.data() + line.firstBridge, line.bridgeCount};
     }

@@ -88,6 +88,11 @@ public:
         json_ += ",\n";
         addList("marks", picture_.marks.size(),
                 [this](std::size_t i) { return markJson(picture_.marks[i]); });
+        if (!picture_.ways.empty()) {
+            json_ += ",\n";
+            addList("ways", picture_.ways.size(),
+                    [this](std::size_t i) { return wayJson(picture_.ways[i]); });
+        }
         return std::move(json_) + "\n}\n";
     }
 
@@ -158,6 +163,12 @@ private:
                field("x2", line.x2) + field("y2", line.y2) +
                ", \"child\": " + (line.child == kNone ? "null" : std::to_string(line.child)) +
                ", \"bridges\": " + listOf(picture_.bridgesOf(line), number) + "}";
+    }
+
+    std::string wayJson(const Way& way) const {
+        return "{\"kind\": " + quoted(nameOf(way.kind)) +
+               ", \"boxes\": " + placesJson(picture_.boxesOf(way)) +
+               ", \"ancestors\": " + placesJson(picture_.ancestorsOf(way)) + "}";
     }
 
     static std::string markJson(const Mark& mark) {

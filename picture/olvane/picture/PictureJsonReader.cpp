@@ -121,6 +121,7 @@ public:
         findFocus(integerAt<std::int64_t>(json, "focus"));
         for (const Json& family : listAt(json, "families")) readFamily(family);
         for (const Json& mark : listAt(json, "marks")) readMark(mark);
+        for (const Json& way : listAt(json, "ways")) readWay(way);
         return std::move(picture_);
     }
 
@@ -133,6 +134,19 @@ private:
     Index placeAt(const Json& object, const char* name) const {
         const Json* value = find(object, name);
         return value == nullptr ? kNone : placeOf(*value, name);
+    }
+
+    void readWay(const Json& json) {
+        Way way;
+        way.kind = namedValue(find(json, "kind"), 3, WayKind::blood);
+        way.firstBox = static_cast<std::uint32_t>(picture_.wayBoxes.size());
+        for (const Json& box : listAt(json, "boxes")) picture_.wayBoxes.push_back(placeOf(box, "a way"));
+        way.boxCount = static_cast<std::uint32_t>(picture_.wayBoxes.size()) - way.firstBox;
+        for (const Json& box : listAt(json, "ancestors")) {
+            picture_.wayBoxes.push_back(placeOf(box, "a way"));
+            ++way.ancestorCount;
+        }
+        picture_.ways.push_back(way);
     }
 
     void readRings(const Json& json) {

@@ -45,4 +45,8 @@ std::string_view nameOf(MarkKind kind) {
                   kind);
 }
 
+std::string_view nameOf(WayKind kind) {
+    return nameIn(std::to_array<std::string_view>({"blood", "legal", "marriage"}), kind);
+}
+
 }  // namespace olvane::picture

@@ -16,5 +16,6 @@ std::string_view nameOf(kin::UnionState state);
 std::string_view nameOf(BoxKind kind);
 std::string_view nameOf(LineRole role);
 std::string_view nameOf(MarkKind kind);
+std::string_view nameOf(WayKind kind);
 
 }  // namespace olvane::picture

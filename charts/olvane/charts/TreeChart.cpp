@@ -1,0 +1,34 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/charts/TreeChartInternal.h>
+
+#include <olvane/charts/GapTracksInternal.h>
+#include <olvane/charts/PlanBuilderInternal.h>
+#include <olvane/charts/PlanPictureInternal.h>
+#include <olvane/charts/PlanPlacementInternal.h>
+
+namespace olvane::charts {
+
+namespace {
+
+// A second line to parents may be so many times as long as the way from one box to the next.
+constexpr float kReachOfShortLinks = 4;
+
+// The view of the near is narrowed to this part of the width that its lines would like best.
+constexpr double kShareOfNear = 0.8;
+
+}  // namespace
+
+picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& request,
+                           const Selection& selection) {
+    const PlanSizes sizes(request);
+    Plan plan = PlanBuilder(graph, sizes, selection).build(request.focus);
+    PlanPlacement(plan, sizes.gapX(), request.view == View::near ? kShareOfNear : 1).place();
+    GapTracks gaps(plan);
+    gaps.addShortLinks(static_cast<double>(kReachOfShortLinks * (sizes.usualWidth() + sizes.gapX())));
+    gaps.assignTracks();
+    return PlanPicture(graph, request, sizes, plan, gaps).make();
+}
+
+}  // namespace olvane::charts

@@ -1,0 +1,523 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <gtest/gtest.h>
+
+#include <olvane/charts/Charts.h>
+#include <olvane/picture/Judge.h>
+
+#include <algorithm>
+#include <limits>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "KinFamily.h"
+
+using namespace olvane::kin;
+using namespace olvane::charts;
+using olvane::picture::Box;
+using olvane::picture::judge;
+using olvane::picture::Judgement;
+using olvane::picture::Line;
+using olvane::picture::LineRole;
+using olvane::picture::MarkKind;
+using olvane::picture::Picture;
+
+namespace {
+
+ChartRequest requestFor(View view, Place focus) {
+    ChartRequest request;
+    request.view = view;
+    request.focus = focus;
+    return request;
+}
+
+const Box& boxOf(const Picture& picture, const KinGraph& graph, Place person) {
+    const auto found = std::find_if(picture.boxes.begin(), picture.boxes.end(),
+                                    [&](const Box& box) { return graph.placeOf(box.id) == person; });
+    if (found == picture.boxes.end()) throw std::out_of_range("nobody of that name is shown");
+    return *found;
+}
+
+// A family, one chart of it, and its boxes by name.
+struct Drawn {
+    Drawn(const KinFamily& of, const ChartRequest& request)
+        : family(of), picture(chartOf(of.graph(), request)) {}
+
+    const Box& operator[](const std::string& name) const {
+        return boxOf(picture, family.graph(), family[name]);
+    }
+    std::size_t faults() const {
+        const Judgement judged = judge(picture, &family.graph());
+        return judged.overlaps + judged.hits + judged.crossings + judged.tracks + judged.touches +
+               judged.unjoined + judged.untold.value_or(1) + judged.unmarked + judged.slanted;
+    }
+    std::size_t marksOf(MarkKind kind) const {
+        return static_cast<std::size_t>(
+            std::count_if(picture.marks.begin(), picture.marks.end(),
+                          [kind](const auto& mark) { return mark.kind == kind; }));
+    }
+
+    const KinFamily& family;
+    Picture picture;
+};
+
+// A line of people, each the only child of the one before.
+KinGraph lineOf(int generations) {
+    KinGraphBuilder builder;
+    Place last = builder.addPerson(1, Sex::male);
+    for (int i = 1; i < generations; ++i) {
+        const Place child = builder.addPerson(i + 1, Sex::male);
+        builder.addChild(builder.addUnion(last, kNobody, UnionState::unknown), child, ChildKind::birth);
+        last = child;
+    }
+    return builder.build();
+}
+
+// Everybody has two parents, to so many generations; person 0 is the focus.
+KinGraph fullAncestry(int generations) {
+    KinGraphBuilder builder;
+    std::vector<Place> level{builder.addPerson(1, Sex::male)};
+    std::int64_t id = 1;
+    for (int generation = 0; generation < generations; ++generation) {
+        std::vector<Place> next;
+        for (const Place child : level) {
+            const Place father = builder.addPerson(++id, Sex::male);
+            const Place mother = builder.addPerson(++id, Sex::female);
+            builder.addChild(builder.addUnion(father, mother, UnionState::married), child, ChildKind::birth);
+            next.push_back(father);
+            next.push_back(mother);
+        }
+        level.swap(next);
+    }
+    return builder.build();
+}
+
+const std::vector<View> kRowViews{View::near, View::ancestors, View::descendants, View::hourglass,
+                                  View::relatives};
+
+}  // namespace
+
+// --- What each view shows, and where.
+
+TEST(Descendants, aCoupleStandsOverTheMiddleOfItsChildren) {
+    const KinFamily family{"Adam + Eva: Kain.m Abel.m Seth.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Adam"]));
+    // Boxes are 55 wide, 25 apart: three children take 215, and the couple's 135 stand over their middle.
+    EXPECT_EQ(drawn["Kain"].x, 0);
+    EXPECT_EQ(drawn["Abel"].x, 80);
+    EXPECT_EQ(drawn["Seth"].x, 160);
+    EXPECT_EQ(drawn["Adam"].x, 40);
+    EXPECT_EQ(drawn["Eva"].x, 120);
+    EXPECT_EQ(drawn["Adam"].y, 0);
+    EXPECT_EQ(drawn["Abel"].y, 110);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Descendants, linesRunFromTheCoupleOverABarToEachChild) {
+    const KinFamily family{"Adam + Eva: Kain.m Abel.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Adam"]));
+    ASSERT_EQ(drawn.picture.families.size(), 1U);
+    const auto lines = drawn.picture.linesOf(drawn.picture.families[0]);
+    ASSERT_EQ(lines.size(), 5U);
+    const auto is = [](const Line& line, LineRole role, double x1, double y1, double x2, double y2) {
+        return line.role == role && line.x1 == x1 && line.y1 == y1 && line.x2 == x2 && line.y2 == y2;
+    };
+    EXPECT_TRUE(is(lines[0], LineRole::marriage, 55, 40, 80, 40));
+    EXPECT_TRUE(is(lines[1], LineRole::drop, 67.5, 40, 67.5, 95));
+    EXPECT_TRUE(is(lines[2], LineRole::bar, 27.5, 95, 107.5, 95));
+    EXPECT_TRUE(is(lines[3], LineRole::stem, 27.5, 95, 27.5, 110));
+    EXPECT_TRUE(is(lines[4], LineRole::stem, 107.5, 95, 107.5, 110));
+}
+
+TEST(Descendants, aManStandsBetweenHisTwoWivesWithTheChildrenOfEachUnderThem) {
+    const KinFamily family{"Jakob + Lea: Ruben.m Levi.m", "Jakob + Rahel: Josef.m Benjamin.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Jakob"]));
+    EXPECT_LT(drawn["Lea"].x, drawn["Jakob"].x);
+    EXPECT_LT(drawn["Jakob"].x, drawn["Rahel"].x);
+    EXPECT_LT(drawn["Ruben"].x, drawn["Levi"].x);
+    EXPECT_LT(drawn["Levi"].x, drawn["Josef"].x);
+    EXPECT_LT(drawn["Josef"].x, drawn["Benjamin"].x);
+    EXPECT_EQ(drawn.faults(), 0U);
+    EXPECT_TRUE(drawn.picture.marks.empty());
+}
+
+TEST(Descendants, aLineToTheThirdWifePassesOverTheSecond) {
+    const KinFamily family{"Ein + Erste: Anna.f", "Ein + Zweite: Berta.f", "Ein + Dritte: Clara.f"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Ein"]));
+    EXPECT_LT(drawn["Erste"].x, drawn["Ein"].x);
+    EXPECT_LT(drawn["Ein"].x, drawn["Zweite"].x);
+    EXPECT_LT(drawn["Zweite"].x, drawn["Dritte"].x);
+    EXPECT_LT(drawn["Berta"].x, drawn["Clara"].x);
+    EXPECT_EQ(drawn.faults(), 0U);
+    EXPECT_TRUE(drawn.picture.marks.empty());
+    // The line leaves at the top of the first row, above everything.
+    EXPECT_TRUE(std::any_of(drawn.picture.lines.begin(), drawn.picture.lines.end(),
+                            [](const Line& line) { return line.y1 < 0 && line.y2 < 0; }));
+}
+
+TEST(Descendants, cousinsWhoMarryHaveOneBoxEachAndAMarkLeadsToTheSecondParents) {
+    const KinFamily family{"Opa + Oma: Vater.m Mitte.m Onkel.m", "Vater + Mutter: Sohn.m",
+                           "Mitte + Frau: Kind.m", "Onkel + Tante: Base.f", "Sohn + Base: Enkel.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Opa"]));
+    EXPECT_EQ(drawn.picture.boxes.size(), 12U);
+    EXPECT_EQ(drawn["Sohn"].y, drawn["Base"].y);
+    ASSERT_EQ(drawn.marksOf(MarkKind::parentsElsewhere), 1U);
+    EXPECT_EQ(drawn.picture.marks[0].number, 1);
+    const Box& marked = drawn.picture.boxes[static_cast<std::size_t>(drawn.picture.marks[0].boxes[0])];
+    EXPECT_EQ(marked.id, drawn["Base"].id);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Descendants, aSecondLineIsDrawnWhereItIsShortAndCrossesNone) {
+    const KinFamily family{"Opa + Oma: Vater.m Onkel.m", "Vater + Mutter: Sohn.m", "Onkel + Tante: Base.f",
+                           "Sohn + Base: Enkel.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Opa"]));
+    EXPECT_TRUE(drawn.picture.marks.empty());
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Descendants, spousesCanBeLeftOut) {
+    const KinFamily family{"Adam + Eva: Kain.m", "Kain + Awan: Henoch.m"};
+    ChartRequest request = requestFor(View::descendants, family["Adam"]);
+    request.spouses = false;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 3U);
+    EXPECT_EQ(drawn["Kain"].hiddenPartners, 1);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Descendants, endAfterTheGenerationsAskedFor) {
+    const KinFamily family{"A + ?: B.m", "B + ?: C.m", "C + ?: D.m"};
+    ChartRequest request = requestFor(View::descendants, family["A"]);
+    request.down = 2;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 3U);
+    EXPECT_EQ(drawn["C"].hiddenChildren, 1);
+}
+
+TEST(Descendants, childrenOfAParentAloneHangFromThatParent) {
+    const KinFamily family{"? + Hagar: Ismael.m Kedar.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Hagar"]));
+    EXPECT_EQ(drawn.picture.families[0].parentCount, 1);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Ancestors, parentsStandAboveTheirChildFatherLeft) {
+    const KinFamily family{"Vater + Mutter: Ich.m", "Opa + Oma: Vater"};
+    const Drawn drawn(family, requestFor(View::ancestors, family["Ich"]));
+    EXPECT_EQ(drawn["Ich"].y, 220);
+    EXPECT_EQ(drawn["Vater"].y, 110);
+    EXPECT_EQ(drawn["Opa"].y, 0);
+    EXPECT_LT(drawn["Vater"].x, drawn["Mutter"].x);
+    EXPECT_EQ(drawn["Opa"].x + drawn["Oma"].x, 2 * drawn["Vater"].x);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Ancestors, anAncestorReachedTwiceStandsOnce) {
+    const KinFamily family{"Ahn + Ahne: Vater.m Mutter.f", "Vater + Mutter: Ich.m"};
+    const Drawn drawn(family, requestFor(View::ancestors, family["Ich"]));
+    EXPECT_EQ(drawn.picture.boxes.size(), 5U);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Ancestors, siblingsStandBesideThemOnDemand) {
+    const KinFamily family{"Vater + Mutter: Alt.m Ich.m Jung.f", "Opa + Oma: Onkel.m Vater"};
+    ChartRequest request = requestFor(View::ancestors, family["Ich"]);
+    EXPECT_EQ(Drawn(family, request).picture.boxes.size(), 5U);
+    request.siblings = true;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 8U);
+    EXPECT_LT(drawn["Alt"].x, drawn["Ich"].x);
+    EXPECT_LT(drawn["Ich"].x, drawn["Jung"].x);
+    EXPECT_LT(drawn["Onkel"].x, drawn["Vater"].x);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Hourglass, hasAncestorsAboveAndDescendantsBelow) {
+    const KinFamily family{"Vater + Mutter: Ich.m", "Ich + Frau: Kind.m"};
+    const Drawn drawn(family, requestFor(View::hourglass, family["Ich"]));
+    EXPECT_EQ(drawn["Vater"].y, 0);
+    EXPECT_EQ(drawn["Ich"].y, 110);
+    EXPECT_EQ(drawn["Kind"].y, 220);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Relatives, reachFromAncestorsDownToTheGenerationAskedFor) {
+    const KinFamily family{"Opa + Oma: Onkel.m Vater.m", "Vater + Mutter: Ich.m", "Onkel + Tante: Vetter.m",
+                           "Vetter + Base: Neffe.m"};
+    ChartRequest request = requestFor(View::relatives, family["Ich"]);
+    request.up = 2;
+    request.down = 1;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 10U);
+    EXPECT_EQ(drawn["Vetter"].y, drawn["Ich"].y);
+    EXPECT_EQ(drawn.faults(), 0U);
+    request.up = 1;
+    EXPECT_EQ(Drawn(family, request).picture.boxes.size(), 3U);
+}
+
+TEST(Relatives, whatHangsBetweenBothParentsAncestorsStartsATreeOfItsOwn) {
+    const KinFamily family{"FV + FM: Vater.m", "MV + MM: Mutter.f",    "FMV + FMM: FM Bruder.m",
+                           "? + X: MV",        "Bruder + Y: Vetter.m", "Vater + Mutter: Ich.m",
+                           "Z + ZZ: MM",       "FVV + FVM: FV"};
+    ChartRequest request = requestFor(View::relatives, family["Ich"]);
+    request.up = 3;
+    request.down = 1;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.marksOf(MarkKind::parentsElsewhere), 1U);
+    EXPECT_EQ(drawn["Bruder"].y, drawn["FM"].y);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(Near, showsThePersonsOfTheFamilyView) {
+    const KinFamily family{"Opa + Oma: Onkel.m Vater.m", "Vater + Mutter: Ich.m Bruder.m",
+                           "Ich + Frau: Kind.m", "Onkel + Tante: Vetter.m", "Vetter + Base: Neffe.m"};
+    const Drawn drawn(family, requestFor(View::near, family["Ich"]));
+    EXPECT_NO_THROW(drawn["Vetter"]);
+    EXPECT_NO_THROW(drawn["Kind"]);
+    EXPECT_THROW(drawn["Neffe"], std::out_of_range);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(KinshipChart, showsTheWaysBetweenTwoPersonsAndNobodyElse) {
+    const KinFamily family{"Opa + Oma: Vater.m Onkel.m Tante.f", "Vater + Mutter: Ich.m Bruder.m",
+                           "Onkel + Frau: Vetter.m"};
+    ChartRequest request = requestFor(View::kinship, family["Ich"]);
+    request.to = family["Vetter"];
+    request.ways = WayChoice::blood;
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 6U);
+    ASSERT_EQ(drawn.picture.ways.size(), 1U);
+    EXPECT_EQ(drawn.picture.boxesOf(drawn.picture.ways[0]).size(), 5U);
+    EXPECT_EQ(drawn.picture.ancestorsOf(drawn.picture.ways[0]).size(), 2U);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(KinshipChart, ofStrangersShowsTheTwoWithoutAWay) {
+    const KinFamily family{"Adam + Eva", "Romeo + Julia"};
+    ChartRequest request = requestFor(View::kinship, family["Adam"]);
+    request.to = family["Romeo"];
+    const Drawn drawn(family, request);
+    EXPECT_EQ(drawn.picture.boxes.size(), 2U);
+    EXPECT_TRUE(drawn.picture.ways.empty());
+}
+
+// --- Fans.
+
+TEST(FanOfAncestors, fathersHaveTheLeftHalfOfTheirChildsCell) {
+    const KinFamily family{"Vater + Mutter: Ich.m", "? + Oma: Vater"};
+    ChartRequest request = requestFor(View::fan, family["Ich"]);
+    request.fanAngle = 180;
+    const Drawn drawn(family, request);
+    const auto arcOf = [&](const std::string& name) {
+        return drawn.picture.arcs[static_cast<std::size_t>(&drawn[name] - drawn.picture.boxes.data())];
+    };
+    EXPECT_EQ(arcOf("Vater").from, -90);
+    EXPECT_EQ(arcOf("Vater").to, 0);
+    EXPECT_EQ(arcOf("Mutter").to, 90);
+    // The grandfather is not known: his cell stays free.
+    EXPECT_EQ(arcOf("Oma").from, -45);
+    EXPECT_EQ(arcOf("Oma").to, 0);
+    EXPECT_EQ(arcOf("Oma").ring, 2);
+    EXPECT_EQ(arcOf("Oma").line, &drawn["Oma"] - drawn.picture.boxes.data());
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(FanOfAncestors, theMiddleOfTheTopRingTouchesTheTopOfThePicture) {
+    const KinFamily family{"Vater + Mutter: Ich.m"};
+    ChartRequest request = requestFor(View::fan, family["Ich"]);
+    request.fanAngle = 180;
+    const Drawn drawn(family, request);
+    // The middle has the radius 40, half of a box's height; the ring around it is 55 thick.
+    EXPECT_DOUBLE_EQ(drawn.picture.middleX, 95);
+    EXPECT_DOUBLE_EQ(drawn.picture.middleY, 95);
+    EXPECT_NEAR(drawn["Vater"].y, 0, 1e-9);
+    EXPECT_NEAR(drawn["Vater"].x, 0, 1e-9);
+    EXPECT_NEAR(static_cast<double>(drawn["Vater"].width), 95, 1e-4);
+}
+
+TEST(FanOfDescendants, spousesHaveARingOfTheirOwnUnderWhichTheirChildrenStand) {
+    const KinFamily family{"Jakob + Lea: Ruben.m Levi.m", "Jakob + Rahel: Josef.m"};
+    ChartRequest request = requestFor(View::fan, family["Jakob"]);
+    request.fanOf = FanOf::descendants;
+    request.fanAngle = 180;
+    const Drawn drawn(family, request);
+    const auto arcOf = [&](const std::string& name) {
+        return drawn.picture.arcs[static_cast<std::size_t>(&drawn[name] - drawn.picture.boxes.data())];
+    };
+    EXPECT_EQ(arcOf("Lea").ring, 1);
+    EXPECT_EQ(arcOf("Ruben").ring, 2);
+    EXPECT_DOUBLE_EQ(arcOf("Lea").from, -90);
+    EXPECT_DOUBLE_EQ(arcOf("Lea").to, 30);  // two of three children
+    EXPECT_DOUBLE_EQ(arcOf("Ruben").to, -30);
+    EXPECT_DOUBLE_EQ(arcOf("Josef").from, 30);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(FanOfAncestors, twentyFiveGenerationsTakeKnownCellsOnly) {
+    const KinGraph graph = lineOf(40);
+    ChartRequest request = requestFor(View::fan, graph.personCount() - 1);
+    EXPECT_EQ(chartOf(graph, request).boxes.size(), 26U);
+}
+
+// --- Directions.
+
+TEST(Direction, turnsTheChartAndNotTheBoxes) {
+    const KinFamily family{"Adam + Eva: Kain.m Abel.m"};
+    ChartRequest request = requestFor(View::descendants, family["Adam"]);
+    const Drawn down(family, request);
+    for (const Direction direction : {Direction::up, Direction::left, Direction::right}) {
+        request.direction = direction;
+        const Drawn turned(family, request);
+        EXPECT_EQ(turned.faults(), 0U);
+        EXPECT_EQ(turned["Kain"].width, 55);
+        EXPECT_EQ(turned["Kain"].height, 80);
+    }
+    request.direction = Direction::up;
+    EXPECT_GT(Drawn(family, request)["Adam"].y, Drawn(family, request)["Kain"].y);
+    request.direction = Direction::left;
+    EXPECT_GT(Drawn(family, request)["Adam"].x, Drawn(family, request)["Kain"].x);
+    request.direction = Direction::right;
+    // Sideways, a couple stands one below the other, 25 apart, and generations are 30 apart.
+    EXPECT_EQ(Drawn(family, request)["Eva"].y, 105);
+    EXPECT_EQ(Drawn(family, request)["Kain"].x, 85);
+}
+
+// --- Awkward families.
+
+TEST(AwkwardFamilies, somebodyTheirOwnFatherIsDrawnOnce) {
+    const KinFamily family{"Ouroboros + ?: Ouroboros"};
+    for (const View view : kRowViews) {
+        const Drawn drawn(family, requestFor(view, family["Ouroboros"]));
+        EXPECT_EQ(drawn.picture.boxes.size(), 1U);
+        EXPECT_EQ(drawn.faults(), 0U);
+    }
+}
+
+TEST(AwkwardFamilies, somebodyTheirOwnGrandfatherIsDrawnOnce) {
+    const KinFamily family{"A + B: C.m", "C + D: A"};
+    for (const View view : kRowViews) {
+        const Drawn drawn(family, requestFor(view, family["A"]));
+        EXPECT_EQ(drawn.faults(), 0U) << nameOf(view);
+    }
+}
+
+TEST(AwkwardFamilies, marriedToOneselfTakesOneBox) {
+    KinGraphBuilder builder;
+    const Place self = builder.addPerson(1, Sex::unknown);
+    const Place child = builder.addPerson(2, Sex::male);
+    builder.addChild(builder.addUnion(self, self, UnionState::married), child, ChildKind::birth);
+    const KinGraph graph = builder.build();
+    for (const View view : kRowViews) {
+        const Picture picture = chartOf(graph, requestFor(view, self));
+        const Judgement judged = judge(picture, &graph);
+        EXPECT_EQ(judged.overlaps + judged.unjoined + judged.untold.value_or(1), 0U) << nameOf(view);
+    }
+}
+
+TEST(AwkwardFamilies, aCoupleOfOneSexStandsInTheOrderOfTheData) {
+    const KinFamily family{"Anna.f + Berta.f: Kind.x(adopted)"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Berta"]));
+    EXPECT_LT(drawn["Anna"].x, drawn["Berta"].x);
+    EXPECT_EQ(drawn.picture.kinds(drawn.picture.families[0])[0], ChildKind::adopted);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(AwkwardFamilies, aCoupleThatMarriedTwiceKeepsItsSecondFamilyByAMark) {
+    const KinFamily family{"Liz + Dick: Erst.m", "Liz + Dick: Zweit.m"};
+    const Drawn drawn(family, requestFor(View::descendants, family["Liz"]));
+    EXPECT_EQ(drawn.picture.families.size(), 2U);
+    EXPECT_EQ(drawn.marksOf(MarkKind::partnersElsewhere), 1U);
+    EXPECT_EQ(drawn.faults(), 0U);
+}
+
+TEST(AwkwardFamilies, anAdoptedChildHasBothItsParentFamilies) {
+    const KinFamily family{"Vater + Mutter: Kind.m", "Wahlvater + Wahlmutter: Kind(adopted)"};
+    const Drawn drawn(family, requestFor(View::ancestors, family["Kind"]));
+    EXPECT_EQ(drawn.picture.boxes.size(), 5U);
+    EXPECT_EQ(drawn.faults(), 0U);
+    EXPECT_TRUE(drawn.picture.marks.empty());
+}
+
+TEST(AwkwardFamilies, twelveHundredSpousesAreDrawn) {
+    KinGraphBuilder builder;
+    const Place man = builder.addPerson(1, Sex::male);
+    for (int i = 0; i < 1200; ++i) {
+        const Place wife = builder.addPerson(2 * i + 2, Sex::female);
+        const Place child = builder.addPerson(2 * i + 3, Sex::male);
+        builder.addChild(builder.addUnion(man, wife, UnionState::married), child, ChildKind::birth);
+    }
+    const KinGraph graph = builder.build();
+    const Picture picture = chartOf(graph, requestFor(View::descendants, man));
+    EXPECT_EQ(picture.boxes.size(), 2401U);
+    const Judgement judged = judge(picture, &graph);
+    EXPECT_EQ(judged.overlaps + judged.hits + judged.crossings + judged.tracks + judged.touches +
+                  judged.unjoined + judged.untold.value_or(1),
+              0U);
+}
+
+TEST(AwkwardFamilies, aLineOfTwoHundredThousandGenerationsNeedsNoStack) {
+    const KinGraph graph = lineOf(200000);
+    const Picture up = chartOf(graph, requestFor(View::ancestors, graph.personCount() - 1));
+    EXPECT_EQ(up.boxes.size(), 200000U);
+    EXPECT_EQ(up.boxes.back().y, 0);
+    const Picture down = chartOf(graph, requestFor(View::descendants, 0));
+    EXPECT_EQ(down.boxes.back().y, 199999.0 * 110);
+    const Picture both = chartOf(graph, requestFor(View::relatives, 100000));
+    EXPECT_EQ(both.boxes.size(), 200000U);
+}
+
+TEST(AwkwardFamilies, aChainOfMarriagesStandsInOneRowWithoutAStack) {
+    KinGraphBuilder builder;
+    constexpr int kPersons = 20000;
+    for (int i = 0; i < kPersons; ++i) builder.addPerson(i + 1, Sex::unknown);
+    for (int i = 0; i + 1 < kPersons; ++i) builder.addUnion(i, i + 1, UnionState::married);
+    // All have one child, so that all are shown.
+    builder.addPerson(kPersons + 1, Sex::male);
+    for (int i = 0; i < kPersons; ++i) {
+        builder.addChild(builder.addUnion(i, kNobody, UnionState::unknown), kPersons, ChildKind::birth);
+    }
+    const KinGraph graph = builder.build();
+    EXPECT_EQ(chartOf(graph, requestFor(View::ancestors, kPersons)).boxes.size(), kPersons + 1U);
+}
+
+TEST(AwkwardFamilies, everyGenerationOfAFullAncestryStandsInOneRow) {
+    const KinGraph graph = fullAncestry(8);
+    const Picture picture = chartOf(graph, requestFor(View::ancestors, 0));
+    EXPECT_EQ(picture.boxes.size(), 511U);
+    // The uppermost row has 256 boxes side by side, and nothing is wider.
+    double right = 0;
+    for (const Box& box : picture.boxes) right = std::max(right, box.x + static_cast<double>(box.width));
+    EXPECT_EQ(right, 256 * 80 - 25);
+    EXPECT_EQ(judge(picture).crossings, 0U);
+}
+
+// --- What is refused.
+
+TEST(Charts, refuseWhoeverIsNotThere) {
+    const KinFamily family{"Adam + Eva"};
+    EXPECT_THROW(chartOf(family.graph(), requestFor(View::descendants, 2)), std::out_of_range);
+    EXPECT_THROW(chartOf(family.graph(), requestFor(View::descendants, -1)), std::out_of_range);
+    EXPECT_THROW(chartOf(family.graph(), requestFor(View::kinship, 0)), std::out_of_range);
+}
+
+TEST(Charts, refuseTheViewsOfTheEngine) {
+    const KinFamily family{"Adam + Eva"};
+    EXPECT_THROW(chartOf(family.graph(), requestFor(View::family, 0)), std::invalid_argument);
+    EXPECT_THROW(chartOf(family.graph(), requestFor(View::pedigree, 0)), std::invalid_argument);
+}
+
+TEST(Charts, refuseSizesThatAreNone) {
+    const KinFamily family{"Adam + Eva"};
+    ChartRequest request = requestFor(View::descendants, 0);
+    request.sizes.boxWidth = std::numeric_limits<float>::quiet_NaN();
+    EXPECT_THROW(chartOf(family.graph(), request), std::invalid_argument);
+    request.sizes.boxWidth = -1;
+    EXPECT_THROW(chartOf(family.graph(), request), std::invalid_argument);
+    request.sizes.boxWidth = 55;
+    const std::vector<BoxSize> one(1);
+    request.boxSizes = one;
+    EXPECT_THROW(chartOf(family.graph(), request), std::invalid_argument);
+}

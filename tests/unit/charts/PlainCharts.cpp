@@ -1,0 +1,129 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include "PlainCharts.h"
+
+#include <algorithm>
+
+namespace plain {
+
+using namespace olvane::kin;
+using olvane::charts::ChartRequest;
+using olvane::charts::View;
+
+namespace {
+
+constexpr int kFar = 1000000;
+
+std::set<Place> parentsOf(const KinGraph& graph, Place person) {
+    std::set<Place> parents;
+    for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
+        const auto children = graph.children(u);
+        if (std::find(children.begin(), children.end(), person) == children.end()) continue;
+        for (const Place parent : graph.partners(u)) {
+            if (parent != kNobody) parents.insert(parent);
+        }
+    }
+    return parents;
+}
+
+std::set<Place> childrenOf(const KinGraph& graph, Place person) {
+    std::set<Place> children;
+    for (Place child = 0; child < graph.personCount(); ++child) {
+        if (parentsOf(graph, child).contains(person)) children.insert(child);
+    }
+    return children;
+}
+
+std::set<Place> spousesOf(const KinGraph& graph, Place person) {
+    std::set<Place> spouses;
+    for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
+        const auto& two = graph.partners(u);
+        if (two[0] == person && two[1] != kNobody) spouses.insert(two[1]);
+        if (two[1] == person && two[0] != kNobody) spouses.insert(two[0]);
+    }
+    return spouses;
+}
+
+// The least number of steps to everybody within reach, by a rule that says who is one step away.
+template <class Step>
+std::map<Place, int> stepsFrom(std::map<Place, int> steps, int most, const Step& step) {
+    for (bool grown = true; grown;) {
+        grown = false;
+        const std::map<Place, int> before = steps;
+        for (const auto& [person, distance] : before) {
+            if (distance >= most) continue;
+            for (const Place next : step(person)) {
+                const auto [found, isNew] = steps.emplace(next, distance + 1);
+                if (!isNew && found->second <= distance + 1) continue;
+                found->second = distance + 1;
+                grown = true;
+            }
+        }
+    }
+    return steps;
+}
+
+int limitOf(int generations) {
+    return generations == 0 ? kFar : generations;
+}
+
+}  // namespace
+
+std::set<Place> personsOf(const KinGraph& graph, const ChartRequest& request) {
+    const auto up = [&graph](Place person) { return parentsOf(graph, person); };
+    const auto down = [&graph](Place person) { return childrenOf(graph, person); };
+    std::map<Place, int> ancestors{{request.focus, 0}};
+    if (request.view != View::descendants) ancestors = stepsFrom(ancestors, limitOf(request.up), up);
+    std::map<Place, int> descendants{{request.focus, 0}};
+    if (request.view == View::relatives) {
+        // From an ancestor of n generations one has n generations more to go down.
+        for (const auto& [person, distance] : ancestors) descendants[person] = -distance;
+    }
+    if (request.view != View::ancestors) {
+        descendants = stepsFrom(descendants, limitOf(request.down), down);
+    }
+    std::set<Place> persons;
+    for (const auto& [person, distance] : ancestors) persons.insert(person);
+    for (const auto& [person, distance] : descendants) persons.insert(person);
+    if (request.spouses && request.view != View::ancestors) {
+        for (const Place person : std::set<Place>(persons)) persons.merge(spousesOf(graph, person));
+    }
+    return persons;
+}
+
+std::map<Place, int> generationsOf(const KinGraph& graph, const ChartRequest& request) {
+    const std::set<Place> persons = personsOf(graph, request);
+    const bool downwards = request.view == View::descendants;
+    // Everybody of one couple after another.
+    std::map<Place, std::set<Place>> group;
+    for (const Place person : persons) {
+        std::set<Place> joined{person};
+        for (bool grown = true; grown;) {
+            grown = false;
+            for (const Place one : std::set<Place>(joined)) {
+                for (const Place spouse : spousesOf(graph, one)) {
+                    if (persons.contains(spouse)) grown = joined.insert(spouse).second || grown;
+                }
+            }
+        }
+        group[person] = joined;
+    }
+    std::map<Place, int> generations;
+    for (const Place person : group.at(request.focus)) generations[person] = 0;
+    for (int generation = 0; generation < graph.personCount(); ++generation) {
+        const std::map<Place, int> before = generations;
+        for (const auto& [person, own] : before) {
+            if (own != (downwards ? generation : -generation)) continue;
+            for (const Place next : downwards ? childrenOf(graph, person) : parentsOf(graph, person)) {
+                if (!persons.contains(next) || before.contains(next)) continue;
+                for (const Place joined : group.at(next)) {
+                    generations.emplace(joined, downwards ? generation + 1 : -generation - 1);
+                }
+            }
+        }
+    }
+    return generations;
+}
+
+}  // namespace plain
