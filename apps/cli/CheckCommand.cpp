@@ -8,13 +8,14 @@
 
 #include <algorithm>
 
-#include <cli/DataCheck.h>
+#include <cli/CheckJson.h>
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/LayoutFindings.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
 #include <cli/PictureRun.h>
+#include <cli/RemarkList.h>
 
 namespace olvane::cli {
 
@@ -27,29 +28,10 @@ std::string counted(std::size_t count, const char* one, const char* many) {
 }
 
 std::string summaryOf(const gedcom::GedcomData& data) {
-    const std::string version = data.version().empty() ? "of no told version" : data.version();
+    const std::string version = data.version().empty() ? "version not stated" : data.version();
     return data.file() + ": GEDCOM " + version + ", " + data.encoding() + ", " +
            counted(data.personCount(), "person", "persons") + ", " +
            counted(data.familyCount(), "family", "families") + "\n";
-}
-
-// Answers how many problems were told; notes are told and not counted.
-std::size_t tellDiagnostics(const gedcom::GedcomData& data, std::string& text) {
-    std::size_t problems = 0;
-    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
-        if (isFoundInData(diagnostic.kind)) continue;
-        text += gedcom::formatDiagnostic(diagnostic) + "\n";
-        if (diagnostic.severity != gedcom::Severity::note) ++problems;
-    }
-    return problems;
-}
-
-std::size_t tellOddities(const gedcom::GedcomData& data, std::string& text) {
-    const std::vector<DataFinding> findings = checkData(data);
-    for (const DataFinding& finding : findings) {
-        text += data.file() + ":" + std::to_string(finding.line) + ": odd: " + finding.text + "\n";
-    }
-    return findings.size();
 }
 
 // One line for each person as focus, and one for all of them; returns how many layouts have trouble.
@@ -85,12 +67,46 @@ bool printOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, cons
     return findings.hasTrouble();
 }
 
-// Answers how many problems were told.
-std::size_t tellData(const gedcom::GedcomData& data) {
-    std::string text = summaryOf(data);
-    const std::size_t problems = tellDiagnostics(data, text) + tellOddities(data, text);
-    writeReport(text);
-    return problems;
+bool hasProblem(const std::vector<Remark>& remarks) {
+    return std::any_of(remarks.begin(), remarks.end(),
+                       [](const Remark& remark) { return remark.isProblem(); });
+}
+
+// For people: the data, then the layouts as they come. Returns whether there is anything to see to.
+bool printText(const gedcom::GedcomData& data, gedcom::PersonId focus, const CheckOptions& options) {
+    const std::vector<Remark> remarks = remarksOf(data);
+    writeReport(summaryOf(data) + remarksText(data, remarks));
+    bool anyTrouble = hasProblem(remarks);
+    if (focus != 0) anyTrouble = printOneLayout(data, focus, options.request) || anyTrouble;
+    if (options.all) anyTrouble = printAllLayouts(data, options.request) > 0 || anyTrouble;
+    return anyTrouble;
+}
+
+bool printTable(const gedcom::GedcomData& data) {
+    const std::vector<Remark> remarks = remarksOf(data);
+    writeReport(remarksTable(data, remarks));
+    return hasProblem(remarks);
+}
+
+std::vector<CheckedLayout> checkedLayouts(const gedcom::GedcomData& data, gedcom::PersonId focus,
+                                          const CheckOptions& options) {
+    std::vector<CheckedLayout> layouts(options.all ? data.personCount() : (focus != 0 ? 1 : 0));
+    if (layouts.empty()) return layouts;
+    const PictureRun pictures(data, options.request, {});
+    inParallel(layouts.size(), [&](std::size_t i) {
+        layouts[i].focus = options.all ? static_cast<gedcom::PersonId>(i + 1) : focus;
+        layouts[i].findings = findingsOf(pictures.pictureOf(layouts[i].focus));
+    });
+    return layouts;
+}
+
+bool printJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const CheckOptions& options) {
+    const std::vector<Remark> remarks = remarksOf(data);
+    const std::vector<CheckedLayout> layouts = checkedLayouts(data, focus, options);
+    writeReport(checkJson(data, remarks, layouts));
+    return hasProblem(remarks) ||
+           std::any_of(layouts.begin(), layouts.end(),
+                       [](const CheckedLayout& layout) { return layout.findings.hasTrouble(); });
 }
 
 }  // namespace
@@ -99,10 +115,9 @@ std::size_t tellData(const gedcom::GedcomData& data) {
 int runCheck(const CheckOptions& options) {
     const gedcom::GedcomData data = readFileQuietly(options.input);
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
-    bool anyTrouble = tellData(data) > 0;
-    if (focus != 0) anyTrouble = printOneLayout(data, focus, options.request) || anyTrouble;
-    if (options.all) anyTrouble = printAllLayouts(data, options.request) > 0 || anyTrouble;
-    return anyTrouble ? 1 : 0;
+    if (options.format == ListFormat::tsv) return printTable(data) ? 1 : 0;
+    if (options.format == ListFormat::json) return printJson(data, focus, options) ? 1 : 0;
+    return printText(data, focus, options) ? 1 : 0;
 }
 
 }  // namespace olvane::cli

@@ -255,6 +255,10 @@ private:
                 "--all", checkOptions_.all,
                 "Look at everybody's layout as well: a line of counts for each, with ids, and the totals")
             ->excludes(focus);
+        addListFormat(
+            *check_, checkOptions_.format,
+            "text: for people (default); tsv: the remarks on the data, with all fields; json: these and what "
+            "is hard to read in the layouts");
         addViewOptions(*check_, checkOptions_.request,
                        "default tall, and wide in a pedigree and in charts that lie sideways");
     }
@@ -372,6 +376,10 @@ private:
 
     CheckOptions completedCheckOptions() const {
         CheckOptions options = checkOptions_;
+        if (options.format == ListFormat::tsv && (options.all || !options.focus.empty())) {
+            throw UsageError(
+                "--format tsv lists the remarks on the data alone; text and json list layouts as well");
+        }
         completeViewOptions(*check_, options.request);
         widenSideways(*check_, options.request);
         return options;

@@ -59,6 +59,7 @@ struct CheckOptions {
     InputOptions input;
     std::string focus;  // empty for the data alone
     bool all = false;   // the layouts of everybody
+    ListFormat format = ListFormat::text;
     LayoutRequest request;
 };
 

@@ -8,11 +8,13 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <initializer_list>
 #include <limits>
 #include <span>
 #include <string_view>
 #include <utility>
 
+#include <cli/AgeLimits.h>
 #include <cli/OwnAncestors.h>
 
 namespace olvane::cli {
@@ -22,12 +24,9 @@ namespace {
 using gedcom::FamilyId;
 using gedcom::GedcomData;
 using gedcom::PersonId;
+using Kind = DataFindingKind;
 
 constexpr int kAboutYears = 5;
-constexpr int kLongestLife = 120;
-constexpr int kYoungestParent = 12;
-constexpr int kOldestMother = 60;
-constexpr int kOldestFather = 90;
 
 // Years that a date may stand for; all of them for one that is not known.
 struct Years {
@@ -73,7 +72,17 @@ public:
     }
 
 private:
-    void tell(gedcom::LineNumber line, const std::string& text) { findings_.push_back({line, text}); }
+    void report(Kind kind, gedcom::LineNumber line, std::initializer_list<std::string_view> xrefs,
+                std::string text) {
+        DataFinding finding{kind, line, {}, std::move(text)};
+        for (const std::string_view xref : xrefs) {
+            if (!xref.empty()) finding.xrefs.emplace_back(xref);
+        }
+        findings_.push_back(std::move(finding));
+    }
+
+    std::string_view xrefOf(PersonId id) const { return data_.person(id).xref; }
+    std::string_view xrefOfFamily(FamilyId id) const { return data_.family(id).xref; }
 
     std::string named(PersonId id) const {
         return tagOf(data_.person(id).xref) + " " + gedcom::displayName(data_.firstName(id));
@@ -94,13 +103,15 @@ private:
         for (const gedcom::FamilyLink& link : links) {
             if (link.family == 0) continue;
             if (link.isFamilysAlone) {
-                tell(link.line, namedFamily(link.family) + " lists " + named(id) +
-                                    " as a child, who does not name the family");
+                report(Kind::parentsNotNamed, link.line, {xrefOfFamily(link.family), xrefOf(id)},
+                       namedFamily(link.family) + " lists " + named(id) +
+                           " as a child, who does not name the family");
             }
             const bool byBirth =
                 link.pedigree == gedcom::Pedigree::birth || link.pedigree == gedcom::Pedigree::notGiven;
             if (byBirth && ++births == 2) {
-                tell(link.line, named(id) + " is a child in two families; the first one is drawn");
+                report(Kind::severalBirthFamilies, link.line, {xrefOf(id)},
+                       named(id) + " is a child in two families; the first one is drawn");
             }
         }
     }
@@ -109,11 +120,13 @@ private:
         for (const gedcom::FamilyLink& link : data_.coupleLinks(id)) {
             if (link.family == 0) continue;
             if (link.isFamilysAlone) {
-                tell(link.line, namedFamily(link.family) + " names " + named(id) +
-                                    " as partner, who does not name the family");
+                report(Kind::marriageNotNamed, link.line, {xrefOfFamily(link.family), xrefOf(id)},
+                       namedFamily(link.family) + " names " + named(id) +
+                           " as partner, who does not name the family");
             } else if (!namesPartner(data_.family(link.family), id, link.line)) {
-                tell(link.line, named(id) + " names " + namedFamily(link.family) +
-                                    " as marriage, which does not name the partner");
+                report(Kind::partnerNotNamed, link.line, {xrefOf(id), xrefOfFamily(link.family)},
+                       named(id) + " names " + namedFamily(link.family) +
+                           " as marriage, which does not name the partner");
             }
         }
     }
@@ -130,9 +143,10 @@ private:
         const Years birth = yearsOf(person.birth);
         const Years death = yearsOf(person.death);
         if (death.last < birth.first) {
-            tell(person.line, named(id) + " died before being born");
+            report(Kind::diedBeforeBirth, person.line, {xrefOf(id)}, named(id) + " died before being born");
         } else if (death.first - birth.last > kLongestLife) {
-            tell(person.line, named(id) + " lived for more than " + std::to_string(kLongestLife) + " years");
+            report(Kind::livedTooLong, person.line, {xrefOf(id)},
+                   named(id) + " lived for more than " + std::to_string(kLongestLife) + " years");
         }
     }
 
@@ -144,15 +158,18 @@ private:
         const Years parentDeath = yearsOf(data_.person(parent).death);
         const gedcom::LineNumber line = data_.person(id).line;
         if (birth.last < parentBirth.first) {
-            tell(line, named(id) + " was born before the parent " + named(parent));
+            report(Kind::bornBeforeParent, line, {xrefOf(id), xrefOf(parent)},
+                   named(id) + " was born before the parent " + named(parent));
         } else if (birth.last - parentBirth.first < kYoungestParent) {
-            tell(line, named(id) + " has a parent younger than " + std::to_string(kYoungestParent) + ", " +
-                           named(parent));
+            report(Kind::parentTooYoung, line, {xrefOf(id), xrefOf(parent)},
+                   named(id) + " has a parent younger than " + std::to_string(kYoungestParent) + ", " +
+                       named(parent));
         } else if (birth.first - parentBirth.last > oldest) {
-            tell(line,
-                 named(id) + " has a parent older than " + std::to_string(oldest) + ", " + named(parent));
+            report(Kind::parentTooOld, line, {xrefOf(id), xrefOf(parent)},
+                   named(id) + " has a parent older than " + std::to_string(oldest) + ", " + named(parent));
         } else if (birth.first > parentDeath.last + yearsAfterDeath) {
-            tell(line, named(id) + " was born after the death of the parent " + named(parent));
+            report(Kind::bornAfterParentsDeath, line, {xrefOf(id), xrefOf(parent)},
+                   named(id) + " was born after the death of the parent " + named(parent));
         }
     }
 
@@ -168,23 +185,27 @@ private:
         const gedcom::Family& family = data_.family(id);
         if (family.marriage.isRead() &&
             yearsOf(family.marriage).last < yearsOf(data_.person(partner).birth).first) {
-            tell(family.line, named(partner) + " married before being born");
+            report(Kind::marriedBeforeBirth, family.line, {xrefOf(partner), xrefOfFamily(id)},
+                   named(partner) + " married before being born");
         }
         if (family.marriage.isRead() &&
             yearsOf(family.marriage).first > yearsOf(data_.person(partner).death).last) {
-            tell(family.line, named(partner) + " married after dying");
+            report(Kind::marriedAfterDeath, family.line, {xrefOf(partner), xrefOfFamily(id)},
+                   named(partner) + " married after dying");
         }
     }
 
     void checkChild(FamilyId id, const gedcom::ChildLink& link) {
         if (link.child == 0 || !link.isChildsAlone) return;
-        tell(link.line,
-             named(link.child) + " names " + namedFamily(id) + " as parents, which does not list the child");
+        report(
+            Kind::childNotListed, link.line, {xrefOf(link.child), xrefOfFamily(id)},
+            named(link.child) + " names " + namedFamily(id) + " as parents, which does not list the child");
     }
 
     void findOwnAncestors() {
         for (const PersonId id : ownAncestors(data_))
-            tell(data_.person(id).line, named(id) + " is their own ancestor");
+            report(Kind::ownAncestor, data_.person(id).line, {xrefOf(id)},
+                   named(id) + " is their own ancestor");
     }
 
     const GedcomData& data_;
@@ -192,6 +213,40 @@ private:
 };
 
 }  // namespace
+
+const char* nameOf(DataFindingKind kind) {
+    switch (kind) {
+        case Kind::childNotListed:
+            return "childNotListed";
+        case Kind::parentsNotNamed:
+            return "parentsNotNamed";
+        case Kind::partnerNotNamed:
+            return "partnerNotNamed";
+        case Kind::marriageNotNamed:
+            return "marriageNotNamed";
+        case Kind::severalBirthFamilies:
+            return "severalBirthFamilies";
+        case Kind::diedBeforeBirth:
+            return "diedBeforeBirth";
+        case Kind::livedTooLong:
+            return "livedTooLong";
+        case Kind::bornBeforeParent:
+            return "bornBeforeParent";
+        case Kind::parentTooYoung:
+            return "parentTooYoung";
+        case Kind::parentTooOld:
+            return "parentTooOld";
+        case Kind::bornAfterParentsDeath:
+            return "bornAfterParentsDeath";
+        case Kind::marriedBeforeBirth:
+            return "marriedBeforeBirth";
+        case Kind::marriedAfterDeath:
+            return "marriedAfterDeath";
+        case Kind::ownAncestor:
+            return "ownAncestor";
+    }
+    return "";
+}
 
 bool isFoundInData(gedcom::DiagnosticKind kind) {
     return kind == gedcom::DiagnosticKind::oneSidedLink || kind == gedcom::DiagnosticKind::contradictingLink;

@@ -67,24 +67,6 @@ std::string textOf(const Json& value) {
     return value.is_null() ? "" : value.dump();
 }
 
-const char* nameOf(FindingKind kind) {
-    switch (kind) {
-        case FindingKind::overlap:
-            return "overlap";
-        case FindingKind::hit:
-            return "hit";
-        case FindingKind::crossing:
-            return "crossing";
-        case FindingKind::track:
-            return "track";
-        case FindingKind::touch:
-            return "touch";
-        case FindingKind::unjoined:
-            break;
-    }
-    return "unjoined";
-}
-
 // Which two things a finding is about.
 std::array<const char*, 2> placesOf(FindingKind kind) {
     if (kind == FindingKind::overlap) return {"box", "otherBox"};
@@ -94,7 +76,7 @@ std::array<const char*, 2> placesOf(FindingKind kind) {
 
 Json findingJson(const picture::Finding& finding) {
     const auto places = placesOf(finding.kind);
-    return {{"kind", nameOf(finding.kind)}, {places[0], finding.one}, {places[1], finding.other}};
+    return {{"kind", findingName(finding.kind)}, {places[0], finding.one}, {places[1], finding.other}};
 }
 
 Json pictureJson(const JudgedPicture& picture) {
@@ -115,6 +97,24 @@ std::string padded(const std::string& text, std::size_t width) {
 }
 
 }  // namespace
+
+const char* findingName(FindingKind kind) {
+    switch (kind) {
+        case FindingKind::overlap:
+            return "overlap";
+        case FindingKind::hit:
+            return "hit";
+        case FindingKind::crossing:
+            return "crossing";
+        case FindingKind::track:
+            return "track";
+        case FindingKind::touch:
+            return "touch";
+        case FindingKind::unjoined:
+            break;
+    }
+    return "unjoined";
+}
 
 bool hasTrouble(const Judgement& counts) {
     return counts.overlaps + counts.hits + counts.tracks + counts.touches + counts.unjoined +

@@ -18,6 +18,9 @@ struct JudgedPicture {
     std::vector<picture::Finding> findings;
 };
 
+// "overlap", "hit", "crossing" and so on.
+const char* findingName(picture::FindingKind kind);
+
 // Whether something in the picture can be misread: boxes that overlap, lines through boxes of others, lines of two
 // families on one track or ending on one another, members whom no line reaches, relations that nothing expresses, a
 // person's several boxes without a mark.

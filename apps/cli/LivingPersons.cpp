@@ -8,11 +8,12 @@
 
 #include <cstdint>
 
+#include <cli/AgeLimits.h>
+
 namespace olvane::cli {
 
 namespace {
 
-constexpr int kLongestLife = 110;  // years
 constexpr int kSteps = 2;
 
 enum class Sign : std::uint8_t { alive, dead, cannotTell };

@@ -47,7 +47,7 @@ _olvane() {
         layout) COMPREPLY=($(compgen -W "--help --encoding --focus --format $view $living $family" -- "$cur")) ;;
         draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
-        check) COMPREPLY=($(compgen -W "--help --encoding --focus --all $view $family" -- "$cur")) ;;
+        check) COMPREPLY=($(compgen -W "--help --encoding --focus --all --format $view $family" -- "$cur")) ;;
         kin) COMPREPLY=($(compgen -W "--help --encoding --format --ways --language" -- "$cur")) ;;
         judge) COMPREPLY=($(compgen -W "--help --encoding --family --format" -- "$cur")) ;;
         page) COMPREPLY=($(compgen -W "--help --encoding --focus --output --title --view $living" -- "$cur")) ;;

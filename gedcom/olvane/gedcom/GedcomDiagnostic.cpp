@@ -57,6 +57,60 @@ std::string printable(std::string_view raw) {
 
 }  // namespace
 
+const char* kindName(DiagnosticKind kind) {
+    switch (kind) {
+        case DiagnosticKind::missingHeader:
+            return "missingHeader";
+        case DiagnosticKind::missingTrailer:
+            return "missingTrailer";
+        case DiagnosticKind::afterTrailer:
+            return "afterTrailer";
+        case DiagnosticKind::notALine:
+            return "notALine";
+        case DiagnosticKind::emptyLine:
+            return "emptyLine";
+        case DiagnosticKind::wrongLevel:
+            return "wrongLevel";
+        case DiagnosticKind::levelJump:
+            return "levelJump";
+        case DiagnosticKind::brokenXref:
+            return "brokenXref";
+        case DiagnosticKind::duplicateXref:
+            return "duplicateXref";
+        case DiagnosticKind::danglingPointer:
+            return "danglingPointer";
+        case DiagnosticKind::wrongPointer:
+            return "wrongPointer";
+        case DiagnosticKind::tooManyPartners:
+            return "tooManyPartners";
+        case DiagnosticKind::samePartners:
+            return "samePartners";
+        case DiagnosticKind::encodingMismatch:
+            return "encodingMismatch";
+        case DiagnosticKind::encodingUnknown:
+            return "encodingUnknown";
+        case DiagnosticKind::badCharacter:
+            return "badCharacter";
+        case DiagnosticKind::controlCharacter:
+            return "controlCharacter";
+        case DiagnosticKind::unreadableDate:
+            return "unreadableDate";
+        case DiagnosticKind::archiveMember:
+            return "archiveMember";
+        case DiagnosticKind::moreOfAKind:
+            return "moreOfAKind";
+        case DiagnosticKind::oneSidedLink:
+            return "oneSidedLink";
+        case DiagnosticKind::contradictingLink:
+            return "contradictingLink";
+        case DiagnosticKind::wrongSlot:
+            return "wrongSlot";
+        case DiagnosticKind::ambiguousDate:
+            return "ambiguousDate";
+    }
+    return "";
+}
+
 const char* severityName(Severity severity) {
     switch (severity) {
         case Severity::note:

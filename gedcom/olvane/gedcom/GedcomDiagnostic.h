@@ -57,6 +57,9 @@ struct Diagnostic {
 // "royal.ged:12: warning: level jumps from 1 to 4; read as level 2"
 std::string formatDiagnostic(const Diagnostic& diagnostic);
 
+// "missingHeader" and so on: the name of the kind, for other programs.
+const char* kindName(DiagnosticKind kind);
+
 // "note", "warning", "error"
 const char* severityName(Severity severity);
 

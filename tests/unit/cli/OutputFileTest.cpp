@@ -77,7 +77,7 @@ TEST(OutputFile, isWrittenToWhereALinkLeadsEvenIfNothingIsThere) {
 
 TEST(OutputFile, keepsThePermissionsOfTheFileThatItReplaces) {
     const ScratchFolder folder;
-    for (const mode_t mode : {0600, 0640, 0444, 0755}) {
+    for (const mode_t mode : {0600U, 0640U, 0444U, 0755U}) {
         const std::string path = folder.write("a.svg", "before");
         ASSERT_EQ(::chmod(path.c_str(), mode), 0);
         if (::faccessat(AT_FDCWD, path.c_str(), W_OK, AT_EACCESS) != 0) {

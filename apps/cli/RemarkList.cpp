@@ -1,0 +1,63 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// One list of what reading and looking at the data bring up.
+
+#include <cli/RemarkList.h>
+
+#include <cli/DataCheck.h>
+#include <cli/TableCells.h>
+
+namespace olvane::cli {
+
+namespace {
+
+std::string joined(const std::vector<std::string>& words) {
+    std::string text;
+    for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
+    return text;
+}
+
+std::string lineText(const Remark& remark) {
+    return remark.line == 0 ? std::string() : std::to_string(remark.line);
+}
+
+}  // namespace
+
+std::vector<Remark> remarksOf(const gedcom::GedcomData& data) {
+    std::vector<Remark> remarks;
+    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
+        if (isFoundInData(diagnostic.kind)) continue;
+        const std::string text =
+            diagnostic.done.empty() ? diagnostic.what : diagnostic.what + "; " + diagnostic.done;
+        remarks.push_back({gedcom::kindName(diagnostic.kind),
+                           gedcom::severityName(diagnostic.severity),
+                           diagnostic.line,
+                           {},
+                           text});
+    }
+    for (const DataFinding& finding : checkData(data)) {
+        remarks.push_back({nameOf(finding.kind), "odd", finding.line, finding.xrefs, finding.text});
+    }
+    return remarks;
+}
+
+std::string remarksText(const gedcom::GedcomData& data, const std::vector<Remark>& remarks) {
+    std::string text;
+    for (const Remark& remark : remarks) {
+        text += data.file() + ":" + (remark.line == 0 ? "" : lineText(remark) + ":") + " " + remark.severity +
+                ": " + remark.text + "\n";
+    }
+    return text;
+}
+
+std::string remarksTable(const gedcom::GedcomData& data, const std::vector<Remark>& remarks) {
+    std::string text = "kind\tseverity\tfile\tline\txrefs\ttext\n";
+    for (const Remark& remark : remarks) {
+        text += tableLine(
+            {remark.kind, remark.severity, data.file(), lineText(remark), joined(remark.xrefs), remark.text});
+    }
+    return text;
+}
+
+}  // namespace olvane::cli
