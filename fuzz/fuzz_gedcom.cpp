@@ -16,6 +16,7 @@
 #include <vector>
 
 #include <olvane/gedcom/GedcomDate.h>
+#include <olvane/gedcom/GedcomDetails.h>
 #include <olvane/gedcom/GedcomDiagnostic.h>
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/gedcom/GedcomWriter.h>
@@ -86,7 +87,7 @@ void lookAtText(std::string_view text) {
 
 void lookAtName(const PersonName& name) {
     for (const std::string_view piece :
-         {name.written, name.prefix, name.given, name.surname, name.suffix, name.nickname}) {
+         {name.written, name.prefix, name.given, name.surname, name.suffix, name.nickname, name.type}) {
         lookAtText(piece);
     }
     HOLDS(isUtf8(displayName(name)));
@@ -175,7 +176,17 @@ void lookAtAll(const GedcomData& data) {
 
 bool areEqual(const PersonName& one, const PersonName& other) {
     return one.written == other.written && one.prefix == other.prefix && one.given == other.given &&
-           one.surname == other.surname && one.suffix == other.suffix && one.nickname == other.nickname;
+           one.surname == other.surname && one.suffix == other.suffix && one.nickname == other.nickname &&
+           one.type == other.type;
+}
+
+bool areEqual(const Citation& one, const Citation& other) {
+    return one.title == other.title && one.author == other.author && one.publication == other.publication &&
+           one.page == other.page && one.text == other.text && one.quality == other.quality;
+}
+
+bool areEqual(const MediaFile& one, const MediaFile& other) {
+    return one.title == other.title && one.file == other.file && one.format == other.format;
 }
 
 bool areEqual(const GedcomDate& one, const GedcomDate& other) {
@@ -238,6 +249,37 @@ void holdEqualRelatives(const GedcomData& data, const GedcomData& again, const s
     }
 }
 
+void holdEqualDetails(const Details& one, const Details& other) {
+    HOLDS(one.type == other.type && one.cause == other.cause && one.age == other.age);
+    HOLDS(one.husbandAge == other.husbandAge && one.wifeAge == other.wifeAge && one.agency == other.agency);
+    HOLDS(one.address == other.address && one.notes == other.notes && one.links == other.links);
+    HOLDS(allEqual(std::span(one.citations), std::span(other.citations)));
+    HOLDS(allEqual(std::span(one.media), std::span(other.media)));
+    for (const std::string_view note : one.notes) HOLDS(isUtf8(note));
+}
+
+void holdEqualFactDetails(const GedcomData& data, std::span<const Fact> facts, const GedcomData& again,
+                          std::span<const Fact> same) {
+    for (std::size_t i = 0; i < facts.size(); ++i) {
+        holdEqualDetails(factDetails(data, facts[i]), factDetails(again, same[i]));
+    }
+}
+
+void holdEqualDetails(const GedcomData& data, const GedcomData& again) {
+    for (PersonId id = 1; id <= data.personCount(); ++id) {
+        holdEqualDetails(personDetails(data, id), personDetails(again, id));
+        holdEqualFactDetails(data, data.factsOfPerson(id), again, again.factsOfPerson(id));
+        const auto names = data.names(id);
+        for (std::size_t i = 0; i < names.size(); ++i) {
+            holdEqualDetails(nameDetails(data, names[i]), nameDetails(again, again.names(id)[i]));
+        }
+    }
+    for (FamilyId id = 1; id <= data.familyCount(); ++id) {
+        holdEqualDetails(familyDetails(data, id), familyDetails(again, id));
+        holdEqualFactDetails(data, data.factsOfFamily(id), again, again.factsOfFamily(id));
+    }
+}
+
 void holdEqualFacts(const GedcomData& data, const GedcomData& again) {
     for (PersonId id = 1; id <= data.personCount(); ++id) {
         const Person& person = data.person(id);
@@ -259,7 +301,7 @@ GedcomData writtenAndRead(const GedcomData& data, const WriteOptions& options) {
     const std::string text = writeGedcom(data, options);
     HOLDS(isUtf8(text));
     ReadOptions reading;
-    reading.facts = true;
+    reading.details = true;
     GedcomData again = readGedcomBytes(text, "written", reading);
     const bool wasSound = data.diagnostics().empty();
     for (const Diagnostic& diagnostic : again.diagnostics())
@@ -267,14 +309,15 @@ GedcomData writtenAndRead(const GedcomData& data, const WriteOptions& options) {
     return again;
 }
 
-void writeAll(const GedcomData& data, bool withFacts) {
+void writeAll(const GedcomData& data, const ReadOptions& options) {
     const GedcomData again = writtenAndRead(data, {});
     holdEqualRelatives(data, again, {});
     for (PersonId id = 1; id <= data.personCount(); ++id) {
         HOLDS(allEqual(data.names(id), again.names(id)));
         HOLDS(familiesOf(data.parentLinks(id)) == familiesOf(again.parentLinks(id)));
     }
-    if (withFacts) holdEqualFacts(data, again);
+    if (options.facts || options.details) holdEqualFacts(data, again);
+    if (options.details) holdEqualDetails(data, again);
 }
 
 bool isLetter(char c) {
@@ -343,6 +386,7 @@ void holdHidden(const GedcomData& data, const GedcomData& again, const std::vect
         }
         HOLDS(again.names(id).size() == 1 && again.firstName(id).written == kHiddenName);
         HOLDS(again.factsOfPerson(id).empty() && !again.person(id).dead);
+        HOLDS(again.detailsOfPerson(id).empty());
         HOLDS(!again.person(id).birth.isGiven() && !again.person(id).death.isGiven());
         if (++sought <= kSoughtPersons) holdNamedNowhere(again, data.firstName(id));
     }
@@ -350,7 +394,7 @@ void holdHidden(const GedcomData& data, const GedcomData& again, const std::vect
         const Family& family = data.family(id);
         const bool isHidden = (family.husband != 0 && hidden[family.husband - 1]) ||
                               (family.wife != 0 && hidden[family.wife - 1]);
-        HOLDS(!isHidden || again.factsOfFamily(id).empty());
+        HOLDS(!isHidden || (again.factsOfFamily(id).empty() && again.detailsOfFamily(id).empty()));
     }
 }
 
@@ -418,16 +462,18 @@ void readAsDate(std::string_view bytes) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
     const std::string text(reinterpret_cast<const char*>(bytes), size);
     readAsDate(text);
-    // Three sizes in four read facts; of these, seven in eight hide every person, every second one, and so on.
+    // Three sizes in four read facts, and one of them details; of these, seven in eight hide every person, every second
+    // one, and so on.
     ReadOptions options;
     options.facts = size % 4 != 0;
+    options.details = size % 4 == 3;
     const std::size_t hiddenStep = size / 4 % 8;
     try {
         const GedcomData data = readGedcomBytes(text, "f", options);
         lookAtAll(data);
         lookAtSource(data);
         lookAtLimit(data);
-        writeAll(data, options.facts);
+        writeAll(data, options);
         if (options.facts && hiddenStep != 0) writeHidden(data, hiddenStep);
     } catch (const GedcomError& error) {
         HOLDS(isOneLine(error.what()));

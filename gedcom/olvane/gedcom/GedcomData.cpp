@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <array>
+#include <functional>
 #include <limits>
 #include <stdexcept>
 #include <utility>
@@ -144,6 +145,53 @@ std::span<const Fact> GedcomData::factsOfFamily(FamilyId id) const {
     if (id < 1 || id > familyCount()) throw std::out_of_range("no family " + std::to_string(id));
     return tables_.factsOfFamilies.empty() ? std::span<const Fact>()
                                            : part(tables_.facts, tables_.factsOfFamilies[id - 1]);
+}
+
+namespace {
+
+// The place in the list of an item that lies in it.
+template <typename Item>
+std::size_t placeIn(const std::vector<Item>& list, const Item& item, const char* what) {
+    const std::less<const Item*> before;
+    if (list.empty() || before(&item, list.data()) || !before(&item, list.data() + list.size())) {
+        throw std::out_of_range(std::string("a ") + what + " of other data");
+    }
+    return static_cast<std::size_t>(&item - list.data());
+}
+
+}  // namespace
+
+std::span<const DetailLine> GedcomData::detailsOfPerson(PersonId id) const {
+    if (!hasPerson(id)) throw std::out_of_range("no person " + std::to_string(id));
+    return tables_.detailsOfPersons.empty() ? std::span<const DetailLine>()
+                                            : part(tables_.details, tables_.detailsOfPersons[id - 1]);
+}
+
+std::span<const DetailLine> GedcomData::detailsOfFamily(FamilyId id) const {
+    if (id < 1 || id > familyCount()) throw std::out_of_range("no family " + std::to_string(id));
+    return tables_.detailsOfFamilies.empty() ? std::span<const DetailLine>()
+                                             : part(tables_.details, tables_.detailsOfFamilies[id - 1]);
+}
+
+std::span<const DetailLine> GedcomData::detailsOfFact(const Fact& fact) const {
+    const std::size_t place = placeIn(tables_.facts, fact, "fact");
+    return place < tables_.detailsOfFacts.size() ? part(tables_.details, tables_.detailsOfFacts[place])
+                                                 : std::span<const DetailLine>();
+}
+
+std::span<const DetailLine> GedcomData::detailsOfName(const PersonName& name) const {
+    const std::size_t place = placeIn(tables_.names, name, "name");
+    return place < tables_.detailsOfNames.size() ? part(tables_.details, tables_.detailsOfNames[place])
+                                                 : std::span<const DetailLine>();
+}
+
+std::span<const DetailLine> GedcomData::detailsOfShared(const SharedRecord& record) const {
+    return part(tables_.details, record.detailSlice);
+}
+
+const SharedRecord* GedcomData::sharedByXref(std::string_view xref) const {
+    const auto found = tables_.sharedByXref.find(xref);
+    return found == tables_.sharedByXref.end() ? nullptr : &tables_.sharedRecords[found->second];
 }
 
 PersonId GedcomData::personByXref(std::string_view xref) const {

@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <map>
 #include <memory>
 #include <span>
 #include <string>
@@ -26,7 +27,8 @@ enum class Sex : std::uint8_t { male = 0, female = 1, other = 2 };
 enum class Pedigree : std::uint8_t { notGiven, birth, adopted, foster, sealing, other, step };
 
 // One NAME of a person. Pieces come from the record's own pieces (GIVN, SURN with SPFX, NPFX, NSFX, NICK);
-// given name, surname and suffix come from the slashes of the value where the record has none.
+// given name, surname and suffix come from the slashes of the value where the record has none. A married name or an alias
+// that stands in a line of its own (_MARNM, _AKA, ALIA) is a name too, behind the one it stands with.
 //
 // Holds: valid UTF-8 without control characters, trimmed; empty where not given.
 struct PersonName {
@@ -36,6 +38,7 @@ struct PersonName {
     std::string_view surname;
     std::string_view suffix;
     std::string_view nickname;
+    std::string_view type;  // "birth", "married", "aka" and so on, as the file has it; empty where not given
 };
 
 // The whole name for a person to read: the value without its slashes, or else the pieces in order.
@@ -123,6 +126,29 @@ struct Fact {
     LineNumber line = 0;
 };
 
+// A line of the file that no other table has: a note, a source, a page, a media file and so on, with the lines below it
+// behind it.
+//
+// Holds: tag is as written, in ASCII. value is valid UTF-8 without control characters but line ends: of several lines
+//        where the file has it so. Of a pointer value is the identifier, without its @.
+struct DetailLine {
+    std::string_view tag;
+    std::string_view value;
+    LineNumber line = 0;
+    std::uint8_t level = 0;  // below the record: 1 for a line of its own, 2 for one of a fact or name
+    bool isPointer = false;
+    bool isOfPart = false;  // below a fact or a name, not below the record itself
+};
+
+// A record that others point to: a NOTE, SNOTE, SOUR, OBJE or REPO.
+struct SharedRecord {
+    std::string_view xref;  // without its @
+    std::string_view tag;
+    std::string_view value;  // the text of a note
+    Slice detailSlice;
+    LineNumber line = 0;
+};
+
 class XrefTable;
 
 // The lists behind the records, as the reader fills them.
@@ -141,6 +167,14 @@ struct GedcomTables {
     std::vector<Fact> facts;
     std::vector<Slice> factsOfPersons;
     std::vector<Slice> factsOfFamilies;
+    // Empty, all of them, unless details were asked for; else a slice for each person, family, fact and name.
+    std::vector<DetailLine> details;
+    std::vector<Slice> detailsOfPersons;
+    std::vector<Slice> detailsOfFamilies;
+    std::vector<Slice> detailsOfFacts;
+    std::vector<Slice> detailsOfNames;
+    std::vector<SharedRecord> sharedRecords;
+    std::map<std::string_view, std::uint32_t> sharedByXref;  // places in sharedRecords
     // Which records the identifiers stand for.
     std::shared_ptr<const XrefTable> xrefs;
     std::vector<Diagnostic> diagnostics;
@@ -190,6 +224,18 @@ public:
     // In the order of the record; empty unless the facts were asked for when the file was read.
     std::span<const Fact> factsOfPerson(PersonId id) const;
     std::span<const Fact> factsOfFamily(FamilyId id) const;
+
+    // Every detail in the record of the person or family, those of facts and names among them; empty unless details
+    // were asked for when the file was read.
+    std::span<const DetailLine> detailsOfPerson(PersonId id) const;
+    std::span<const DetailLine> detailsOfFamily(FamilyId id) const;
+    // Of a fact or name of this data. Fails: std::out_of_range for any other.
+    std::span<const DetailLine> detailsOfFact(const Fact& fact) const;
+    std::span<const DetailLine> detailsOfName(const PersonName& name) const;
+    std::span<const SharedRecord> sharedRecords() const { return tables_.sharedRecords; }
+    std::span<const DetailLine> detailsOfShared(const SharedRecord& record) const;
+    // Null if there is none. xref is without @.
+    const SharedRecord* sharedByXref(std::string_view xref) const;
 
     // By xref, with or without @; 0 if there is none. Of several records of one xref the first is found.
     PersonId personByXref(std::string_view xref) const;

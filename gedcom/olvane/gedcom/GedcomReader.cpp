@@ -9,6 +9,7 @@
 #include <memory>
 #include <utility>
 
+#include <olvane/gedcom/DetailKeeperInternal.h>
 #include <olvane/gedcom/DiagnosticListInternal.h>
 #include <olvane/gedcom/GedcomArchiveInternal.h>
 #include <olvane/gedcom/LineScannerInternal.h>
@@ -31,7 +32,9 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     GedcomTables tables;
     LineScanner scanner(store->bytes, diagnostics);
     TextKeeper keeper(*store, form, diagnostics);
-    RecordReader records(scanner, keeper, tables, *xrefs, diagnostics, options.facts);
+    DetailKeeper details(scanner, keeper, tables);
+    RecordReader records(scanner, keeper, tables, *xrefs, diagnostics, options.facts || options.details,
+                         options.details ? &details : nullptr);
     if (!records.readAll()) throw GedcomError(name, "holds nothing that looks like GEDCOM");
     resolveLinks(tables, *xrefs, diagnostics);
 

@@ -16,6 +16,9 @@ struct ReadOptions {
     // Whether events and attributes are kept beyond birth, death and marriage, with their places. They take
     // memory, and a layout needs none of them.
     bool facts = false;
+    // Whether notes, sources, media, addresses, causes, ages and links are kept too, with the records that they lie in.
+    // Implies facts.
+    bool details = false;
     // The encoding of the file, by any name that GedcomEncodings.h knows. Empty: as the file says and its bytes allow.
     std::string encoding = {};
 };

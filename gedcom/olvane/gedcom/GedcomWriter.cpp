@@ -8,10 +8,14 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <cstdint>
+#include <span>
 #include <unordered_set>
 #include <utility>
 
+#include <olvane/gedcom/GedcomDetails.h>
 #include <olvane/gedcom/NameSpotterInternal.h>
+#include <olvane/gedcom/TagCodeInternal.h>
 
 namespace olvane::gedcom {
 namespace {
@@ -77,6 +81,7 @@ public:
         writeHeader();
         for (PersonId id = 1; id <= data_.personCount(); ++id) writePerson(id);
         for (FamilyId id = 1; id <= data_.familyCount(); ++id) writeFamily(id);
+        for (std::size_t next = 0; next < sharedInUse_.size(); ++next) writeShared(sharedInUse_[next]);
         line(0, "TRLR");
         return std::move(text_);
     }
@@ -106,6 +111,8 @@ private:
         return anybodyHidden_ && hiddenNames_.isHintedAtIn(text) ? std::string_view() : shown(text);
     }
 
+    bool isTold(std::string_view text) const { return text.empty() || !shownText(text).empty(); }
+
     // Identifiers that stay are settled first, so that none that is made meets one of them, nor one that is hidden.
     void nameRecords() {
         personXrefs_.resize(data_.personCount());
@@ -116,10 +123,23 @@ private:
         for (FamilyId id = 1; id <= data_.familyCount(); ++id) {
             if (!isBare(id)) keepXref(familyXrefs_[id - 1], data_.family(id).xref);
         }
+        nameSharedRecords();
         for (const Person& person : data_.persons()) taken_.insert(std::string(person.xref));
         for (const Family& family : data_.families()) taken_.insert(std::string(family.xref));
         for (PersonId id = 1; id <= data_.personCount(); ++id) makeXref(personXrefs_[id - 1], "P", id);
         for (FamilyId id = 1; id <= data_.familyCount(); ++id) makeXref(familyXrefs_[id - 1], "U", id);
+        for (std::size_t i = 0; i < sharedXrefs_.size(); ++i) {
+            makeXref(sharedXrefs_[i], "R", static_cast<std::uint32_t>(i + 1));
+        }
+    }
+
+    void nameSharedRecords() {
+        const auto shared = data_.sharedRecords();
+        sharedXrefs_.resize(shared.size());
+        sharedIsInUse_.resize(shared.size(), false);
+        for (std::size_t i = 0; i < shared.size(); ++i) {
+            if (isTold(shared[i].value)) keepXref(sharedXrefs_[i], shared[i].xref);
+        }
     }
 
     void keepXref(std::string& name, std::string_view xref) {
@@ -171,15 +191,18 @@ private:
             for (const FamilyLink& link : data_.parentLinks(id)) writeLink("FAMC", link);
         }
         for (const FamilyLink& link : data_.coupleLinks(id)) writeLink("FAMS", link);
+        if (!isHidden(id)) writeDetails(data_.detailsOfPerson(id), 1);
     }
 
     void writeName(const PersonName& name) {
         line(1, "NAME", name.written);
+        piece("TYPE", name.type);
         piece("NPFX", name.prefix);
         piece("GIVN", name.given);
         piece("SURN", name.surname);
         piece("NSFX", name.suffix);
         piece("NICK", shownText(name.nickname));
+        writeDetails(data_.detailsOfName(name), 2);
     }
 
     void piece(std::string_view tag, std::string_view value) {
@@ -201,6 +224,82 @@ private:
         }
         if (!date.empty()) writeDate(date);
         piece("PLAC", place);
+        writeDetails(data_.detailsOfFact(fact), 2);
+    }
+
+    // The trees of that level, which are the owner's own.
+    void writeDetails(std::span<const DetailLine> lines, std::uint8_t level) {
+        while (!lines.empty()) {
+            const auto tree = takeDetailTree(lines);
+            if (tree.front().level == level) writeDetailTree(tree);
+        }
+    }
+
+    // A line that is left out takes along the lines below it.
+    void writeDetailTree(std::span<const DetailLine> tree) {
+        constexpr std::uint8_t kNone = 0xFF;
+        std::uint8_t leftOut = kNone;
+        for (const DetailLine& detail : tree) {
+            if (leftOut != kNone && detail.level > leftOut) continue;
+            leftOut = writeDetail(detail) ? kNone : detail.level;
+        }
+    }
+
+    bool writeDetail(const DetailLine& detail) {
+        if (!isWanted(detail.tag)) return false;
+        if (!detail.isPointer) {
+            if (!isTold(detail.value)) return false;
+            writeText(detail.level, detail.tag, detail.value);
+            return true;
+        }
+        const SharedRecord* const shared = data_.sharedByXref(detail.value);
+        if (shared == nullptr || !isTold(shared->value)) return false;
+        const auto place = static_cast<std::size_t>(shared - data_.sharedRecords().data());
+        if (!sharedIsInUse_[place]) sharedInUse_.push_back(place);
+        sharedIsInUse_[place] = true;
+        pointer(detail.level, detail.tag, sharedXrefs_[place]);
+        return true;
+    }
+
+    bool isWanted(std::string_view tag) const {
+        const std::uint64_t code = tagCode(tag);
+        if (code == tagCode("NOTE") || code == tagCode("SNOTE")) return options_.notes;
+        if (code == tagCode("OBJE")) return options_.media;
+        return code != tagCode("SOUR") || options_.sources;
+    }
+
+    void writeShared(std::size_t place) {
+        const SharedRecord& shared = data_.sharedRecords()[place];
+        text_.append("0 @").append(sharedXrefs_[place]).append("@ ");
+        writeValue(0, shared.tag, shared.value);
+        writeDetails(data_.detailsOfShared(shared), 1);
+    }
+
+    // Lines of a text stand in lines of their own.
+    void writeText(int level, std::string_view tag, std::string_view text) {
+        text_ += static_cast<char>('0' + level);
+        text_ += ' ';
+        writeValue(level, tag, text);
+    }
+
+    void writeValue(int level, std::string_view tag, std::string_view text) {
+        std::size_t end = text.find('\n');
+        text_ += tag;
+        appendValue(text.substr(0, end));
+        while (end != std::string_view::npos) {
+            const std::size_t begin = end + 1;
+            end = text.find('\n', begin);
+            start(level + 1, "CONT");
+            appendValue(text.substr(begin, end == std::string_view::npos ? end : end - begin));
+        }
+    }
+
+    void appendValue(std::string_view value) {
+        if (!value.empty()) {
+            text_ += ' ';
+            appendDoubled(value);
+        }
+        text_ += '\n';
     }
 
     void writeDate(std::string_view date) {
@@ -239,6 +338,7 @@ private:
         }
         if (isBare(id)) return;
         for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);
+        writeDetails(data_.detailsOfFamily(id), 1);
     }
 
     void record(std::string_view xref, std::string_view tag) {
@@ -258,11 +358,7 @@ private:
 
     void line(int level, std::string_view tag, std::string_view value = {}) {
         start(level, tag);
-        if (!value.empty()) {
-            text_ += ' ';
-            appendDoubled(value);
-        }
-        text_ += '\n';
+        appendValue(value);
     }
 
     void start(int level, std::string_view tag) {
@@ -282,6 +378,9 @@ private:
     std::unordered_set<std::string> taken_;
     std::vector<std::string> personXrefs_;
     std::vector<std::string> familyXrefs_;
+    std::vector<std::string> sharedXrefs_;  // by place in the data's shared records, as all of these
+    std::vector<bool> sharedIsInUse_;
+    std::vector<std::size_t> sharedInUse_;  // in the order in which they were pointed to
     std::string text_;
 };
 

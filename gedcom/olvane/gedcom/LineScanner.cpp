@@ -3,7 +3,7 @@
 
 // Lines of GEDCOM: level, perhaps an identifier, tag, perhaps a value. The depth of a line is one more than
 // that of the nearest line before it with a smaller number, which for sound files is the number itself. Only
-// the four topmost depths matter to the reader, so nothing grows with the depth of a file.
+// the topmost depths matter to the reader, so nothing grows with the depth of a file.
 
 #include <olvane/gedcom/LineScannerInternal.h>
 

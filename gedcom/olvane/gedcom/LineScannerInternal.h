@@ -20,7 +20,7 @@ std::size_t findConcText(std::string_view rest);
 
 // A line taken apart. Views into the scanned bytes, in the encoding of the file.
 struct GedcomLine {
-    static constexpr std::size_t kDeep = 4;
+    static constexpr std::size_t kDeep = 8;
 
     std::size_t level =
         0;  // how deep the line lies, whatever number it has; kDeep stands for that and beyond

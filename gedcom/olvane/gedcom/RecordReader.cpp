@@ -15,23 +15,17 @@
 #include <string>
 #include <vector>
 
+#include <olvane/gedcom/TagCodeInternal.h>
+
 namespace olvane::gedcom {
 namespace {
 
 constexpr std::string_view kVoid = "VOID";
 
-// A tag as a number, in capitals; longer tags than any known one are 0.
-constexpr std::uint64_t tagCode(std::string_view tag) {
-    if (tag.size() > 8) return 0;
-    std::uint64_t code = 0;
-    for (const char c : tag) {
-        const char capital = c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
-        code = code << 8 | static_cast<unsigned char>(capital);
-    }
-    return code;
-}
-
 constexpr std::uint64_t kAdoption = tagCode("ADOP");
+constexpr std::uint64_t kAlias = tagCode("ALIA");
+constexpr std::uint64_t kAlsoKnownAs = tagCode("_AKA");
+constexpr std::uint64_t kAlsoKnownAsName = tagCode("_AKAN");
 constexpr std::uint64_t kBirth = tagCode("BIRT");
 constexpr std::uint64_t kBurial = tagCode("BURI");
 constexpr std::uint64_t kChild = tagCode("CHIL");
@@ -48,6 +42,8 @@ constexpr std::uint64_t kHeader = tagCode("HEAD");
 constexpr std::uint64_t kHusband = tagCode("HUSB");
 constexpr std::uint64_t kIndividual = tagCode("INDI");
 constexpr std::uint64_t kMarriage = tagCode("MARR");
+constexpr std::uint64_t kMarriedName = tagCode("_MARNM");
+constexpr std::uint64_t kMarriedNameInFull = tagCode("_MARNAME");
 constexpr std::uint64_t kMotherTie = tagCode("_MREL");
 constexpr std::uint64_t kName = tagCode("NAME");
 constexpr std::uint64_t kNamePrefix = tagCode("NPFX");
@@ -209,23 +205,51 @@ bool RecordReader::readAll() {
 void RecordReader::readLine(const GedcomLine& line) {
     if (!anyLine_) checkBeginning(line);
     anyLine_ = true;
-    if (line.level > 3 || (line.level > 0 && record_ == Record::other)) return;
+    if (details_ != nullptr && line.level > 0 && record_ == Record::other)
+        details_->add(line, tagCode(line.tag));
+    if (line.level > 0 && record_ == Record::other) return;
     const std::uint64_t tag = tagCode(line.tag);
+    if (line.level > 3) {
+        if (details_ != nullptr) details_->add(line, tag);
+        return;
+    }
     if (line.level == 0) return beginRecord(line);
     if (line.level == 1) {
         endName();
         openDate_ = nullptr;
         fact_ = tag;
         if (keepsFacts_) beginFact(line, tag);
-        return record_ == Record::person ? readPersonFact(line, tag) : readFamilyFact(line, tag);
+        record_ == Record::person ? readPersonFact(line, tag) : readFamilyFact(line, tag);
+        if (details_ != nullptr) beginDetails(line, tag);
+        return;
     }
     if (line.level == 2) {
         openDate_ = nullptr;
         record_ == Record::person ? readPersonDetail(line, tag) : readFamilyDetail(line, tag);
         if (factOpen_) readFactDetail(line, tag);
+        if (details_ != nullptr) keepDetail(line, tag);
         return;
     }
+    if (details_ != nullptr) details_->add(line, tag);
     if (tag == kPhrase && openDate_ != nullptr) readDatePhrase(line);
+}
+
+void RecordReader::beginDetails(const GedcomLine& line, std::uint64_t tag) {
+    if (nameOpen_) {
+        details_->beginName();
+    } else if (factOpen_) {
+        details_->beginFact();
+    } else {
+        details_->beginOwn(line, tag);
+    }
+}
+
+// What the tables of names and facts have is not kept again.
+void RecordReader::keepDetail(const GedcomLine& line, std::uint64_t tag) {
+    const bool keptWithFact =
+        factOpen_ && (tag == kDate || tag == kPlace || (tag == kType && valueFromType_));
+    const bool keptWithName = nameOpen_ && tag == kType;
+    keptWithFact || keptWithName ? details_->leaveOut(line) : details_->add(line, tag);
 }
 
 void RecordReader::beginRecord(const GedcomLine& line) {
@@ -241,6 +265,7 @@ void RecordReader::beginRecord(const GedcomLine& line) {
     } else {
         record_ = Record::other;
         claimXref(line);
+        if (details_ != nullptr) details_->beginShared(line, tag);
     }
 }
 
@@ -292,12 +317,19 @@ void RecordReader::beginPerson(const GedcomLine& line) {
     fresh.coupleLinkSlice.first = static_cast<std::uint32_t>(tables_.coupleLinks.size());
     addForeseeing(tables_.persons, fresh, scanner_.share());
     if (keepsFacts_) tables_.factsOfPersons.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
+    if (details_ != nullptr) details_->beginPerson();
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->person == 0) entry->person = static_cast<PersonId>(tables_.persons.size());
 }
 
+std::string_view RecordReader::givenNameOfPerson() const {
+    const Person& last = tables_.persons.back();
+    return last.nameSlice.count == 0 ? std::string_view() : tables_.names[last.nameSlice.first].given;
+}
+
 // An adoption says of a link to the adoptive family what its PEDI did not.
 void RecordReader::endPerson() {
+    if (!furtherNames_.empty()) addFurtherNames(givenNameOfPerson());
     if (adoptiveFamilies_.empty()) return;
     const Slice slice = person().parentLinkSlice;
     for (FamilyLink& link : std::span(tables_.parentLinks).subspan(slice.first, slice.count)) {
@@ -320,6 +352,7 @@ void RecordReader::beginFamily(const GedcomLine& line) {
     fresh.childLinkSlice.first = static_cast<std::uint32_t>(tables_.childLinks.size());
     addForeseeing(tables_.families, fresh, scanner_.share());
     if (keepsFacts_) tables_.factsOfFamilies.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
+    if (details_ != nullptr) details_->beginFamily();
     XrefTable::Entry* entry = claimXref(line);
     if (entry != nullptr && entry->family == 0)
         entry->family = static_cast<FamilyId>(tables_.families.size());
@@ -342,6 +375,14 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
         case kProbate:
             person().dead = !passOverIfNot(line) || person().dead;
             return;
+        case kAlias:
+        case kAlsoKnownAs:
+        case kAlsoKnownAsName:
+            if (!trimmed(line.value).starts_with('@')) addFurtherName(line, "aka");
+            return;
+        case kMarriedName:
+        case kMarriedNameInFull:
+            return addFurtherName(line, "married");
         case kFamilyAsChild:
             tables_.parentLinks.push_back({readPointer(line), line.number});
             ++person().parentLinkSlice.count;
@@ -437,9 +478,23 @@ void RecordReader::readNamePiece(const GedcomLine& line, std::uint64_t tag) {
             return addPiece(name_.suffix, line, " ");
         case kNickname:
             return addPiece(name_.nickname, line, ", ");
+        case kType:
+            if (name_.type.empty()) name_.type = keptValue(line);
+            return;
+        case kMarriedName:
+        case kMarriedNameInFull:
+            return addFurtherName(line, "married");
+        case kAlsoKnownAs:
+        case kAlsoKnownAsName:
+            return addFurtherName(line, "aka");
         default:
             return;
     }
+}
+
+void RecordReader::addFurtherName(const GedcomLine& line, std::string_view type) {
+    const std::string_view value = keptValue(line);
+    if (!value.empty()) furtherNames_.push_back({value, type});
 }
 
 void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint) {
@@ -466,12 +521,38 @@ void RecordReader::endName() {
         whole.joined = std::string(keptPiece(whole)) + " " + std::string(keptPiece(name_.surname));
         name_.surname = whole;
     }
-    PersonName name = {name_.written,           keptPiece(name_.prefix),
-                       keptPiece(name_.given),  keptPiece(name_.surname),
-                       keptPiece(name_.suffix), keptPiece(name_.nickname)};
+    PersonName name;
+    name.written = name_.written;
+    name.prefix = keptPiece(name_.prefix);
+    name.given = keptPiece(name_.given);
+    name.surname = keptPiece(name_.surname);
+    name.suffix = keptPiece(name_.suffix);
+    name.nickname = keptPiece(name_.nickname);
+    name.type = name_.type;
     fillFromSlashes(name);
     addForeseeing(tables_.names, name, scanner_.share());
     ++person().nameSlice.count;
+    addFurtherNames(name.given);
+}
+
+// A married name is often the surname alone; the given name is that of the name it stands with then.
+void RecordReader::addFurtherNames(std::string_view given) {
+    for (const FurtherName& further : furtherNames_) {
+        PersonName name;
+        name.type = further.type;
+        const bool surnameAlone =
+            further.type == "married" && further.value.find_first_of("/ ") == std::string_view::npos;
+        if (surnameAlone) {
+            name.given = given;
+            name.surname = further.value;
+        } else {
+            name.written = further.value;
+            fillFromSlashes(name);
+        }
+        addForeseeing(tables_.names, name, scanner_.share());
+        ++person().nameSlice.count;
+    }
+    furtherNames_.clear();
 }
 
 void RecordReader::beginFact(const GedcomLine& line, std::uint64_t tag) {

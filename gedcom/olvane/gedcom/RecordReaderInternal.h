@@ -9,6 +9,7 @@
 #include <string_view>
 #include <vector>
 
+#include <olvane/gedcom/DetailKeeperInternal.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/LineScannerInternal.h>
 #include <olvane/gedcom/TextKeeperInternal.h>
@@ -16,20 +17,22 @@
 
 namespace olvane::gedcom {
 
-// Fills the tables from the lines of a file, in one pass and without a tree of lines.
+// Fills the tables from the lines of a file, in one pass and without a tree of lines. What the tables have no place for
+// goes to details, if there is one.
 //
 // Holds: until links are resolved, each id in parentLinks, coupleLinks, childLinks and a family's partners is
 //        an XrefPlace. Spouses, children, fathers and mothers are not filled in here.
 class RecordReader {
 public:
     RecordReader(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables, XrefTable& xrefs,
-                 DiagnosticList& diagnostics, bool keepsFacts)
+                 DiagnosticList& diagnostics, bool keepsFacts, DetailKeeper* details)
         : scanner_(scanner),
           keeper_(keeper),
           tables_(tables),
           xrefs_(xrefs),
           diagnostics_(diagnostics),
-          keepsFacts_(keepsFacts) {}
+          keepsFacts_(keepsFacts),
+          details_(details) {}
 
     // False if there was no record that GEDCOM knows.
     bool readAll();
@@ -52,6 +55,13 @@ private:
         PieceDraft surname;
         PieceDraft suffix;
         PieceDraft nickname;
+        std::string_view type;
+    };
+
+    // A married name or another by which somebody is known, which stands in a line of its own.
+    struct FurtherName {
+        std::string_view value;
+        std::string_view type;
     };
 
     // The HUSB, or the WIFE, of a family: the first two that point to anybody.
@@ -84,11 +94,16 @@ private:
     void readNamePiece(const GedcomLine& line, std::uint64_t tag);
     void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint);
     std::string_view keptPiece(const PieceDraft& piece);
+    void addFurtherName(const GedcomLine& line, std::string_view type);
+    void addFurtherNames(std::string_view given);
+    std::string_view givenNameOfPerson() const;
     void endName();
 
     void beginFact(const GedcomLine& line, std::uint64_t tag);
     void readFactDetail(const GedcomLine& line, std::uint64_t tag);
     Slice& factsInHand();
+    void beginDetails(const GedcomLine& line, std::uint64_t tag);
+    void keepDetail(const GedcomLine& line, std::uint64_t tag);
 
     void readDate(const GedcomLine& line, GedcomDate& date);
     void readDatePhrase(const GedcomLine& line);
@@ -112,6 +127,7 @@ private:
     XrefTable& xrefs_;
     DiagnosticList& diagnostics_;
     bool keepsFacts_;
+    DetailKeeper* details_;  // null if no details are kept
 
     Record record_ = Record::other;
     std::uint64_t fact_ = 0;          // tag of the line on level 1 that the one in hand lies under
@@ -121,6 +137,7 @@ private:
     bool valueFromType_ = false;
     NameDraft name_;
     bool nameOpen_ = false;
+    std::vector<FurtherName> furtherNames_;  // behind the name in hand, or behind all names of the person
     bool sexRead_ = false;
     std::vector<XrefPlace> adoptiveFamilies_;  // that ADOP events of the person in hand name
     std::uint32_t tiesOfChild_ = 0;            // of the CHIL in hand: _FREL and _MREL so far

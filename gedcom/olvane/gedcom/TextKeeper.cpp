@@ -51,11 +51,19 @@ bool TextKeeper::liesInBytes(std::string_view text) const {
 }
 
 std::string_view TextKeeper::keep(std::string_view raw, std::uint32_t line) {
+    return keepAs(raw, line, false);
+}
+
+std::string_view TextKeeper::keepLines(std::string_view raw, std::uint32_t line) {
+    return keepAs(raw, line, true);
+}
+
+std::string_view TextKeeper::keepAs(std::string_view raw, std::uint32_t line, bool keepsLineEnds) {
     raw = trimmed(raw);
     if (isPlain(raw)) return liesInBytes(raw) ? raw : store_.arena.keep(raw);
     std::string text = decoded(raw, line);
     undouble(text);
-    removeControls(text, line);
+    removeControls(text, line, keepsLineEnds);
     return store_.arena.keep(trimmed(text));
 }
 
@@ -84,9 +92,11 @@ void TextKeeper::undouble(std::string& text) const {
     text.resize(kept);
 }
 
-void TextKeeper::removeControls(std::string& text, std::uint32_t line) {
-    std::replace_if(text.begin(), text.end(), isWhiteControl, ' ');
-    const std::size_t removed = std::erase_if(text, isControl);
+void TextKeeper::removeControls(std::string& text, std::uint32_t line, bool keepsLineEnds) {
+    const auto isKept = [keepsLineEnds](char c) { return keepsLineEnds && c == '\n'; };
+    std::replace_if(
+        text.begin(), text.end(), [&](char c) { return isWhiteControl(c) && !isKept(c); }, ' ');
+    const std::size_t removed = std::erase_if(text, [&](char c) { return isControl(c) && !isKept(c); });
     if (removed == 0) return;
     diagnostics_.add(DiagnosticKind::controlCharacter, Severity::warning, line,
                      std::to_string(removed) + " control characters", "left out", text);

@@ -29,15 +29,18 @@ public:
         : store_(store), form_(form), diagnostics_(diagnostics) {}
 
     std::string_view keep(std::string_view raw, std::uint32_t line);
+    // The same, but with its line ends.
+    std::string_view keepLines(std::string_view raw, std::uint32_t line);
     // For text that was made of kept texts.
     std::string_view keepMade(std::string_view text) { return store_.arena.keep(text); }
 
 private:
+    std::string_view keepAs(std::string_view raw, std::uint32_t line, bool keepsLineEnds);
     bool isPlain(std::string_view raw) const;
     bool liesInBytes(std::string_view text) const;
     std::string decoded(std::string_view raw, std::uint32_t line);
     void undouble(std::string& text) const;
-    void removeControls(std::string& text, std::uint32_t line);
+    void removeControls(std::string& text, std::uint32_t line, bool keepsLineEnds);
 
     TextStore& store_;
     const TextForm& form_;
