@@ -4,6 +4,7 @@
 
 python host text, python host typed      eight methods
 python table text, python table typed    the table; typed are the records
+python table typed lazily               the table; records are made when they are looked at
 """
 
 from __future__ import annotations
@@ -67,7 +68,7 @@ def main() -> None:
     with open(lines, encoding="utf-8") as file:
         host = Host(file.readlines())
     family = host.table() if "table" in road else host
-    lay_out = olvane.layout_text if road.endswith("text") else olvane.layout
+    lay_out = {"text": olvane.layout_text, "typed": olvane.layout, "lazily": olvane.family_layout}[road.split()[-1]]
     print("ready", flush=True)
     for line in sys.stdin:
         times = []

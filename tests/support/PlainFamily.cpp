@@ -142,7 +142,7 @@ std::string differenceOf(const olvane::Family& table, const PlainFamily& plain) 
     if (ids.size() != plain.persons.size() || table.personCount() != ids.size()) return "number of persons";
     for (const auto& [id, person] : plain.persons) {
         if (!table.hasPerson(id)) return "no person " + std::to_string(id);
-        const std::string difference = differenceOfPerson(table, id, person);
+        std::string difference = differenceOfPerson(table, id, person);
         if (!difference.empty()) return difference;
     }
     if (table.familyCount() != plain.families.size()) return "number of families";

@@ -20,9 +20,9 @@ Layouts may run on several threads at once, if their hosts may be asked so; a ho
 from olvane._errors import HostError, LayoutError, Status
 from olvane._family import ChildKind, Family, FamilyError, FamilyRow, FamilyState, NameKind, Person
 from olvane._host import Host
-from olvane._layout import layout, layout_text, version
+from olvane._layout import MOST_RELATIVES, family_layout, layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
-from olvane._records import Record, RecordKind, Segment
+from olvane._records import Layout, Record, RecordKind, Segment
 
 __all__ = [
     "ChildKind",
@@ -32,7 +32,9 @@ __all__ = [
     "FamilyState",
     "Host",
     "HostError",
+    "Layout",
     "LayoutError",
+    "MOST_RELATIVES",
     "NameKind",
     "Options",
     "Person",
@@ -43,6 +45,7 @@ __all__ = [
     "Sizes",
     "Status",
     "View",
+    "family_layout",
     "layout",
     "layout_text",
     "version",

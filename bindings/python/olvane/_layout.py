@@ -8,12 +8,16 @@ again when the layout has ended.
 
 from __future__ import annotations
 
+import contextlib
 import ctypes
 import inspect
+import itertools
 import operator
 import sys
-from collections.abc import Callable, Iterable
-from ctypes import byref, c_char_p, c_int64, c_size_t, c_void_p
+import threading
+import weakref
+from collections.abc import Callable, Iterable, Iterator
+from ctypes import byref, c_int64, c_size_t, c_void_p
 from typing import Any, TypeVar
 
 from olvane import _native
@@ -21,9 +25,11 @@ from olvane._errors import HostError, LayoutError, Status
 from olvane._family import Family
 from olvane._host import Host
 from olvane._options import Options, View
-from olvane._records import Record, RecordKind, Segment
+from olvane._records import Layout, Record
 
 _FAILED = 1
+# Persons in one list that a host answers: an endless generator ends there.
+MOST_RELATIVES = 1000000
 
 _Result = TypeVar("_Result")
 
@@ -39,8 +45,15 @@ def layout(host: Host | Family, focus: int, view: View = View.FAMILY, options: O
     return _laid_out(_request(host, focus, view, options), _Request.records)
 
 
+def family_layout(family: Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> Layout:
+    """The layout of a Family as one object, whose records are made when they are looked at."""
+    return _family_laid_out(family, focus, view, options, _records_of)
+
+
 def layout_text(host: Host | Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> str:
     """The same layout as one line of text."""
+    if isinstance(host, Family):
+        return _family_laid_out(host, focus, view, options, _text_of)
     return _laid_out(_request(host, focus, view, options), _Request.text)
 
 
@@ -58,6 +71,7 @@ class _Answers:
     def __init__(self, host: Host) -> None:
         self._host = host
         self._raised: BaseException | None = None
+        self._question = ""
 
     def callbacks(self) -> _native.HostStruct:
         """The eight callbacks, which must outlive the call that uses them."""
@@ -77,42 +91,52 @@ class _Answers:
         if self._raised is None:
             self._raised = raised
 
+    def failure(self, raised: BaseException) -> str:
+        """The question that failed, and why: "spouses_of(17): ValueError: no row"."""
+        where = f"{self._question}: " if self._question else ""
+        return f"{where}{type(raised).__name__}: {raised}"
+
     def take_raised(self) -> BaseException | None:
         """What was kept, which is not kept any longer: its frames hold this object."""
         raised, self._raised = self._raised, None
         return raised
 
     def _father_of(self, _context: Any, person: int, parent: Any) -> int:
-        return self._answer(lambda: _set_parent(parent, self._host.father_of(person)))
+        return self._answer("father_of", (person,), lambda: _set_parent(parent, self._host.father_of(person)))
 
     def _mother_of(self, _context: Any, person: int, parent: Any) -> int:
-        return self._answer(lambda: _set_parent(parent, self._host.mother_of(person)))
+        return self._answer("mother_of", (person,), lambda: _set_parent(parent, self._host.mother_of(person)))
 
     def _spouses_of(self, _context: Any, person: int, spouses: Any) -> int:
-        return self._answer(lambda: _append(spouses, self._host.spouses_of(person)))
+        return self._answer("spouses_of", (person,), lambda: _append(spouses, self._host.spouses_of(person)))
 
     def _children_of(self, _context: Any, person: int, children: Any) -> int:
-        return self._answer(lambda: _append(children, self._host.children_of(person)))
+        return self._answer("children_of", (person,), lambda: _append(children, self._host.children_of(person)))
 
     def _is_preferred_spouse(self, _context: Any, person: int, spouse: int, preferred: Any) -> int:
-        return self._answer(lambda: _set_truth(preferred, self._host.is_preferred_spouse(person, spouse)))
+        question = (person, spouse)
+        return self._answer(
+            "is_preferred_spouse", question, lambda: _set_truth(preferred, self._host.is_preferred_spouse(*question))
+        )
 
     def _is_dead(self, _context: Any, person: int, dead: Any) -> int:
-        return self._answer(lambda: _set_truth(dead, self._host.is_dead(person)))
+        return self._answer("is_dead", (person,), lambda: _set_truth(dead, self._host.is_dead(person)))
 
     def _date_of(self, _context: Any, person: int, is_birth: int, date: Any) -> int:
-        return self._answer(lambda: _set_date(date, self._host.date_of(person, is_birth != 0)))
+        question = (person, is_birth != 0)
+        return self._answer("date_of", question, lambda: _set_date(date, self._host.date_of(*question)))
 
     def _sex_of(self, _context: Any, person: int, sex: Any) -> int:
-        return self._answer(lambda: _set_sex(sex, self._host.sex_of(person)))
+        return self._answer("sex_of", (person,), lambda: _set_sex(sex, self._host.sex_of(person)))
 
-    def _answer(self, question: Callable[[], None]) -> int:
+    def _answer(self, operation: str, asked: tuple[object, ...], question: Callable[[], None]) -> int:
         if self._raised is not None:  # kept where C could not be told of it
             return _FAILED
         try:
             question()
         except BaseException as raised:  # nothing may pass through C; the request raises it again
             self.keep(raised)
+            self._question = f"{operation}({', '.join(map(str, asked))})"
             return _FAILED
         return 0
 
@@ -125,16 +149,20 @@ class _StrayHook:
 
     The handler of a signal runs between any two steps of a program, so also at a callback's first one, before its try.
     What C makes of such a callback is undefined, but the layout ends with what was kept. All else goes to the hook
-    before this one. It stays in place: another thread may lay out when this one has ended.
+    before this one, which is put back when the last layout of all threads has ended.
     """
 
+    # Weak, so that answers whose end a signal's handler has cut off keep nothing in place.
+    running: weakref.WeakSet[_Answers] = weakref.WeakSet()
+    lock = threading.Lock()
+
     def __init__(self, before: Callable[[Any], object]) -> None:
-        self._before = before
+        self.before = before
 
     def __call__(self, unraisable: Any) -> None:
         answers = _answers_left_by(unraisable)
         if answers is None:
-            self._before(unraisable)
+            self.before(unraisable)
         else:
             answers.keep(unraisable.exc_value)
 
@@ -146,9 +174,20 @@ def _answers_left_by(unraisable: Any) -> _Answers | None:
     return left if isinstance(left, _Answers) else None
 
 
-def _watch_for_strays() -> None:
-    if not isinstance(sys.unraisablehook, _StrayHook):
-        sys.unraisablehook = _StrayHook(sys.unraisablehook)
+@contextlib.contextmanager
+def _watching_for_strays(answers: _Answers) -> Iterator[None]:
+    with _StrayHook.lock:
+        _StrayHook.running.add(answers)
+        if not isinstance(sys.unraisablehook, _StrayHook):
+            sys.unraisablehook = _StrayHook(sys.unraisablehook)
+    try:
+        yield
+    finally:
+        with _StrayHook.lock:
+            _StrayHook.running.discard(answers)
+            hook: object = sys.unraisablehook
+            if not _StrayHook.running and isinstance(hook, _StrayHook):
+                sys.unraisablehook = hook.before
 
 
 def _set_truth(slot: Any, answer: object) -> None:
@@ -175,7 +214,9 @@ def _set_parent(slot: Any, parent: int | None) -> None:
 
 
 def _append(ids: Any, people: Iterable[int]) -> None:
-    known = [_person_id(person) for person in people]
+    known = [_person_id(person) for person in itertools.islice(people, MOST_RELATIVES + 1)]
+    if len(known) > MOST_RELATIVES:
+        raise ValueError(f"a host answered more than {MOST_RELATIVES} persons in one list")
     _check(_native.library.olvane_person_list_append(ids, (c_int64 * len(known))(*known), len(known)))
 
 
@@ -206,9 +247,9 @@ class _Request:
         self._status = Status.OK
 
     def run(self) -> None:
-        _watch_for_strays()
         callbacks = self._answers.callbacks()
-        status = self._ask(byref(callbacks), self._focus, byref(self._options), byref(self._layout))
+        with _watching_for_strays(self._answers):
+            status = self._ask(byref(callbacks), self._focus, byref(self._options), byref(self._layout))
         self._status = Status(status)
 
     def free(self) -> None:
@@ -220,7 +261,7 @@ class _Request:
             if raised is not None and not isinstance(raised, Exception):
                 raise raised
             if raised is not None and self._status != Status.OUT_OF_MEMORY:
-                message = f"{type(raised).__name__}: {raised}"
+                message = self._answers.failure(raised)
                 raise HostError(Status.HOST_FAILED, message, self.text(), self.records()) from raised
             if self._status != Status.OK:
                 raise LayoutError(self._status, _message(self._status), self.text(), self.records())
@@ -228,17 +269,10 @@ class _Request:
             del raised  # whose frames may hold this one
 
     def text(self) -> str:
-        text = c_char_p()
-        if self._layout:
-            _native.library.olvane_layout_text(self._layout, byref(text), None)
-        return (text.value or b"").decode("ascii")
+        return _text_of(self._layout)
 
     def records(self) -> list[Record]:
-        records = ctypes.POINTER(_native.RecordStruct)()
-        count = c_size_t()
-        if self._layout:
-            _native.library.olvane_layout_records(self._layout, byref(records), byref(count))
-        return [_record(records[i]) for i in range(count.value)]
+        return list(_records_of(self._layout))
 
 
 class _FamilyRequest(_Request):
@@ -246,6 +280,7 @@ class _FamilyRequest(_Request):
 
     def __init__(self, family: Family, focus: int, view: View, options: Options | None) -> None:
         self._family = family
+        self._asked = focus
         self._focus = _focus_number(focus)
         self._view = _view_number(view)
         self._chosen = None if options is None else byref(_options_struct(options))
@@ -259,7 +294,38 @@ class _FamilyRequest(_Request):
 
     def raise_failure(self) -> None:
         if self._status != Status.OK:
-            raise LayoutError(self._status, _message(self._status), self.text(), self.records())
+            message = f"layout of person {self._asked!r}: {_message(self._status)}"
+            raise LayoutError(self._status, message, self.text(), self.records())
+
+
+def _family_laid_out(
+    family: Family, focus: int, view: View, options: Options | None, read: Callable[[c_void_p], _Result]
+) -> _Result:
+    """A _FamilyRequest in as few steps as there are: a small family is laid out in less time than one takes."""
+    layout = c_void_p()
+    chosen = None if options is None else _options_struct(options)
+    number = _view_number(view)
+    try:
+        if _native.library.olvane_view(family._pointer, number, _focus_number(focus), chosen, layout) == Status.OK:
+            return read(layout)
+    finally:
+        _native.library.olvane_layout_free(layout)
+    request = _FamilyRequest(family, focus, view, options)
+    return _laid_out(request, lambda _: read(request._layout))  # which raises
+
+
+def _text_of(layout: c_void_p) -> str:
+    text, length = c_void_p(), c_size_t()
+    if layout:
+        _native.library.olvane_layout_text(layout, text, length)
+    return _native.decoded(text, length)
+
+
+def _records_of(layout: c_void_p) -> Layout:
+    records, count = c_void_p(), c_size_t()
+    if layout:
+        _native.library.olvane_layout_records(layout, records, count)
+    return Layout.copied_from(records.value, count.value)
 
 
 def _request(host: Host | Family, focus: int, view: View, options: Options | None) -> _Request:
@@ -315,20 +381,3 @@ def _options_struct(options: Options | None) -> _native.OptionsStruct:
         options.generations,
         options.flag_depth,
     )
-
-
-def _record(struct: _native.RecordStruct) -> Record:
-    kind = RecordKind(struct.kind)
-    return Record(
-        id=struct.id,
-        x=struct.x,
-        y=struct.y,
-        has_hidden_relatives=struct.has_hidden_relatives != 0,
-        kind=kind,
-        child=None if kind is RecordKind.PERSON else struct.child,
-        segments=tuple(_segment(struct.segments[i]) for i in range(struct.segment_count)),
-    )
-
-
-def _segment(struct: _native.SegmentStruct) -> Segment:
-    return Segment(struct.x1, struct.y1, struct.x2, struct.y2)

@@ -61,27 +61,6 @@ class OptionsStruct(ctypes.Structure):
     ]
 
 
-class SegmentStruct(ctypes.Structure):
-    """olvane_segment"""
-
-    _fields_ = [("x1", c_int32), ("y1", c_int32), ("x2", c_int32), ("y2", c_int32)]
-
-
-class RecordStruct(ctypes.Structure):
-    """olvane_record"""
-
-    _fields_ = [
-        ("id", c_int64),
-        ("x", c_int32),
-        ("y", c_int32),
-        ("has_hidden_relatives", c_int32),
-        ("kind", c_int),
-        ("child", c_int64),
-        ("segments", POINTER(SegmentStruct)),
-        ("segment_count", c_size_t),
-    ]
-
-
 def _load() -> ctypes.CDLL:
     name = os.environ.get("OLVANE_LIBRARY", _SONAME)
     try:
@@ -101,8 +80,8 @@ def _declare(loaded: ctypes.CDLL) -> None:
         "olvane_layout_family": ([POINTER(HostStruct), c_int64, POINTER(OptionsStruct), layout_pointer], c_int),
         "olvane_layout_pedigree": ([POINTER(HostStruct), c_int64, POINTER(OptionsStruct), layout_pointer], c_int),
         "olvane_layout_free": ([c_void_p], None),
-        "olvane_layout_text": ([c_void_p, POINTER(c_char_p), POINTER(c_size_t)], c_int),
-        "olvane_layout_records": ([c_void_p, POINTER(POINTER(RecordStruct)), POINTER(c_size_t)], c_int),
+        "olvane_layout_text": ([c_void_p, layout_pointer, POINTER(c_size_t)], c_int),
+        "olvane_layout_records": ([c_void_p, layout_pointer, POINTER(c_size_t)], c_int),
         "olvane_layout_host_code": ([c_void_p, POINTER(c_int)], c_int),
     }
     for name, (arguments, result) in signatures.items():
@@ -110,6 +89,16 @@ def _declare(loaded: ctypes.CDLL) -> None:
         function.argtypes = arguments
         function.restype = result
 
+
+def decoded(text: c_void_p, length: c_size_t) -> str:
+    """The library's own ASCII text as a str, copied once."""
+    made: str = _decode(text, length, None) if text else ""
+    return made
+
+
+_decode = ctypes.pythonapi.PyUnicode_DecodeASCII
+_decode.argtypes = [c_void_p, c_size_t, c_char_p]
+_decode.restype = ctypes.py_object
 
 library = _load()
 _declare(library)

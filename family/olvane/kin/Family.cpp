@@ -246,7 +246,7 @@ std::size_t Family::memoryBytes() const {
     std::size_t bytes = sizeof(State) + state().persons.memoryBytes() + state().families.memoryBytes() +
                         state().personIndex.memoryBytes() + state().familyIndex.memoryBytes() +
                         state().blobs.memoryBytes();
-    for (const std::string& key : state().fieldKeys) bytes += sizeof key + key.capacity();
+    for (const std::string& key : state().fieldKeys) bytes += sizeof(std::string) + key.capacity();
     return bytes;
 }
 

@@ -95,6 +95,7 @@ private:
     static std::vector<FamilyId> answeredList(const Met& person, std::string_view field,
                                               const std::vector<std::int64_t>& answers) {
         std::vector<FamilyId> list;
+        list.reserve(answers.size());
         for (const std::int64_t answer : answers) list.push_back(answered(person, field, answer));
         std::vector<std::size_t> repeats;
         detail::findRepeats(list, repeats);

@@ -288,6 +288,19 @@ class Layouts(unittest.TestCase):
             text = olvane.layout_text(family, 3, view)
             self.assertEqual(text.count(";"), len(olvane.layout(family, 3, view)))
 
+    def test_records_made_one_by_one_are_those_of_the_list(self) -> None:
+        family = olvane.Family(ROWS)
+        for focus in family.ids:
+            records = olvane.layout(family, focus)
+            lazily = olvane.family_layout(family, focus)
+            self.assertEqual(records, list(lazily))
+            self.assertEqual(records, [lazily[place] for place in range(len(lazily))])
+            self.assertEqual((records[-1], records[:2]), (lazily[-1], lazily[:2]))
+            self.assertEqual(lazily, olvane.family_layout(family, focus))
+            self.assertGreater(sum(len(record.segments) for record in records), 0)
+        with self.assertRaises(IndexError):
+            lazily[len(lazily)]
+
     def test_options_count(self) -> None:
         family = olvane.Family(ROWS)
         options = olvane.Options(generations=1)

@@ -8,6 +8,7 @@ import copy
 import ctypes
 import dataclasses
 import gc
+import itertools
 import os
 import pickle
 import signal
@@ -176,6 +177,29 @@ class Failures(unittest.TestCase):
                 with self.assertRaises(olvane.HostError) as caught:
                     olvane.layout(host, 17)
                 self.assertIsInstance(caught.exception.__cause__, TypeError)
+
+    def test_a_failure_names_the_question_and_the_person(self) -> None:
+        for method, question in (
+            ("spouses_of", "spouses_of(17)"),
+            ("sex_of", "sex_of(17)"),
+            ("date_of", "date_of(42, False)"),
+            ("is_preferred_spouse", "is_preferred_spouse(17, 42)"),
+        ):
+            host = Family(THREE_GENERATIONS)
+            setattr(host, method, raiser(ValueError("no row")))
+            with self.subTest(method), self.assertRaises(olvane.HostError) as caught:
+                olvane.layout(host, 17)
+            self.assertEqual(f"{question}: ValueError: no row", str(caught.exception))
+
+    def test_an_endless_list_ends_at_a_limit(self) -> None:
+        host = Family({})
+        setattr(host, "children_of", lambda _person: itertools.count(2))
+        with self.assertRaises(olvane.HostError) as caught:
+            olvane.layout(host, 1)
+        self.assertEqual(
+            f"children_of(1): ValueError: a host answered more than {olvane.MOST_RELATIVES} persons in one list",
+            str(caught.exception),
+        )
 
     def test_an_interrupt_passes_as_it_is(self) -> None:
         host = Family({})
@@ -458,6 +482,34 @@ class Signals(unittest.TestCase):
         self.assertEqual(text, olvane.layout_text(Loud(THREE_GENERATIONS), 17))
         self.assertNotEqual([], self.printed)
         self.assertEqual({ValueError}, {getattr(unraisable, "exc_type") for unraisable in self.printed})
+
+
+    def test_the_hook_is_put_back_after_the_last_layout(self) -> None:
+        before = sys.unraisablehook
+        during: list[object] = []
+
+        class Watching(Family):
+            def sex_of(self, person: int) -> int:
+                during.append(sys.unraisablehook)
+                return super().sex_of(person)
+
+        olvane.layout(Watching(THREE_GENERATIONS), 17)
+        self.assertNotIn(before, during)
+        self.assertIs(before, sys.unraisablehook)
+        with self.assertRaises(olvane.HostError):
+            olvane.layout(object(), 17)  # type: ignore[arg-type]
+        self.assertIs(before, sys.unraisablehook)
+
+    def test_a_hook_that_came_meanwhile_stays(self) -> None:
+        class Replacing(Family):
+            def sex_of(self, person: int) -> int:
+                sys.unraisablehook = other
+                return super().sex_of(person)
+
+        def other(_unraisable: object) -> None: ...
+
+        olvane.layout(Replacing(THREE_GENERATIONS), 17)
+        self.assertIs(other, sys.unraisablehook)
 
 
 class Memory(unittest.TestCase):
