@@ -20,8 +20,9 @@
 #include <olvane/gedcom/GedcomDiagnostic.h>
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/gedcom/GedcomWriter.h>
-#include <olvane/gedcom/PersonSearch.h>
+#include <olvane/kin/PersonIndex.h>
 #include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/GedcomFamily.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "Holds.h"
@@ -145,18 +146,19 @@ void lookAtFamily(const GedcomData& data, FamilyId id) {
     data.familyByXref(family.xref);
 }
 
-void search(const GedcomData& data, std::string_view text) {
-    const std::vector<PersonId> all = findPersons(data, text);
+void search(const GedcomData& data, const olvane::kin::PersonIndex& index, std::string_view text) {
+    const auto all = index.find(text);
     HOLDS(all.size() <= data.personCount());
-    for (const PersonId id : all) HOLDS(data.hasPerson(id));
-    HOLDS(findPersons(data, text, 1).size() == std::min<std::size_t>(all.size(), 1));
+    for (const auto& hit : all) HOLDS(hit.id >= 1 && data.hasPerson(static_cast<PersonId>(hit.id)));
+    HOLDS(index.find(text, 1).size() == std::min<std::size_t>(all.size(), 1));
 }
 
 void searchForNames(const GedcomData& data) {
-    search(data, "anna b");
-    search(data, "");
+    const olvane::kin::PersonIndex index(familyOf(data));
+    search(data, index, "anna b");
+    search(data, index, "");
     const std::size_t searched = std::min(data.personCount(), kSearchedPersons);
-    for (PersonId id = 1; id <= searched; ++id) search(data, displayName(data.firstName(id)));
+    for (PersonId id = 1; id <= searched; ++id) search(data, index, displayName(data.firstName(id)));
 }
 
 void lookAtDiagnostics(const GedcomData& data) {

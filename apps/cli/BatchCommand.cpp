@@ -17,13 +17,12 @@
 
 #include <unistd.h>
 
-#include <olvane/gedcom/PersonSearch.h>
-
 #include <cli/FileReading.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
+#include <cli/PersonFinder.h>
 #include <cli/PictureRun.h>
 #include <cli/TableCells.h>
 #include <cli/UsageError.h>
@@ -57,7 +56,7 @@ public:
 
 struct BatchFocus {
     std::string written;      // as the stream has it; empty where everybody is taken
-    gedcom::PersonId id = 0;  // 0 where the words are still to be searched
+    gedcom::PersonId id = 0;  // 0 where the words mean nobody, or several persons
 };
 
 // The person of a bare number; 0 for other words and for numbers beyond the last person.
@@ -75,7 +74,7 @@ class FocusList {
 public:
     // perBlock: how many focuses a block has; with 1, a line is answered before the next one is waited for.
     FocusList(const gedcom::GedcomData& data, const std::string& from, std::size_t perBlock)
-        : data_(data), from_(from), perBlock_(perBlock) {
+        : data_(data), finder_(data), from_(from), perBlock_(perBlock) {
         if (from.empty()) return;
         if (from != "-") {
             if (std::filesystem::is_directory(from)) {
@@ -102,11 +101,20 @@ private:
         std::string& written = focus.written;
         if (std::getline(*lines_, written)) {
             if (!written.empty() && written.back() == '\r') written.pop_back();
-            focus.id = idOfNumber(data_, written);
+            focus.id = personOf(written);
             return true;
         }
         if (lines_->bad() && interrupted == 0) throw UsageError(from_ + ": cannot be read to its end");
         return false;
+    }
+
+    // A number is an id first, as this command itself and the list of persons print it, even where a file has
+    // numbers for xrefs. Then xrefs; a name serves where it means one person.
+    gedcom::PersonId personOf(const std::string& written) {
+        const gedcom::PersonId id = idOfNumber(data_, written);
+        if (id != 0 || written.empty()) return id;
+        const std::vector<gedcom::PersonId> found = finder_.meant(written);
+        return found.size() == 1 ? found.front() : 0;
     }
 
     bool nextPerson(BatchFocus& focus) {
@@ -116,6 +124,7 @@ private:
     }
 
     const gedcom::GedcomData& data_;
+    PersonFinder finder_;
     std::string from_;
     std::size_t perBlock_;
     std::unique_ptr<std::ifstream> file_;
@@ -157,14 +166,6 @@ struct BatchLine {
     bool isKnown = false;
 };
 
-// A number is an id first, as this command itself and the list of persons print it, even where a file has
-// numbers for xrefs. Then xrefs; a name serves where it means one person.
-gedcom::PersonId personOf(const gedcom::GedcomData& data, const BatchFocus& focus) {
-    if (focus.id != 0 || focus.written.empty()) return focus.id;
-    const auto found = gedcom::findPersons(data, focus.written, 2);
-    return found.size() == 1 ? found.front() : 0;
-}
-
 // JSON has line ends between its values alone.
 std::string onOneLine(std::string json) {
     std::string line;
@@ -178,10 +179,9 @@ std::string onOneLine(std::string json) {
     return line;
 }
 
-BatchLine lineFor(const gedcom::GedcomData& data, const BatchFocus& focus, const Answer& answer) {
-    const gedcom::PersonId id = personOf(data, focus);
-    if (id == 0) return {escapedField(focus.written) + "\t\n", false};
-    return {std::to_string(id) + "\t" + answer(id) + "\n", true};
+BatchLine lineFor(const BatchFocus& focus, const Answer& answer) {
+    if (focus.id == 0) return {escapedField(focus.written) + "\t\n", false};
+    return {std::to_string(focus.id) + "\t" + answer(focus.id) + "\n", true};
 }
 
 // The result text of a view of the engine, or else the picture.
@@ -210,7 +210,7 @@ int runBatch(const BatchOptions& options) {
     for (auto block = focuses.nextBlock(); !block.empty() && interrupted == 0; block = focuses.nextBlock()) {
         std::vector<BatchLine> lines(block.size());
         inParallel(block.size(), [&](std::size_t i) {
-            if (interrupted == 0) lines[i] = lineFor(data, block[i], answer);
+            if (interrupted == 0) lines[i] = lineFor(block[i], answer);
         });
         for (std::size_t i = 0; i < lines.size() && interrupted == 0; ++i, ++done) {
             writeStandardOutput(lines[i].text);

@@ -9,8 +9,7 @@
 #include <sstream>
 #include <vector>
 
-#include <olvane/gedcom/PersonSearch.h>
-
+#include <cli/PersonFinder.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -39,26 +38,28 @@ bool isAscii(const std::string& word) {
     return std::all_of(word.begin(), word.end(), [](char c) { return static_cast<unsigned char>(c) < 0x80; });
 }
 
-void addMatches(const gedcom::GedcomData& data, const std::string& word,
-                std::vector<gedcom::PersonId>& found) {
-    for (const gedcom::PersonId id : gedcom::findPersons(data, word, kMostCandidates)) {
+void addMatches(PersonFinder& finder, const std::string& word, std::vector<gedcom::PersonId>& found) {
+    for (const gedcom::PersonId id : finder.find(word, kMostCandidates)) {
         if (std::find(found.begin(), found.end(), id) == found.end()) found.push_back(id);
     }
 }
 
-// Persons whom a mistyped name may mean: by one of its words, or else by how a word begins.
-std::vector<gedcom::PersonId> similarPersons(const gedcom::GedcomData& data, const std::string& who) {
-    std::vector<gedcom::PersonId> found;
-    for (const std::string& word : wordsOf(who)) addMatches(data, word, found);
+// Persons whom a mistyped name may mean: by all of its words as they are written nearly, by one of them, or else by
+// how a word begins.
+std::vector<gedcom::PersonId> similarPersons(PersonFinder& finder, const std::string& who) {
+    std::vector<gedcom::PersonId> found = finder.find(who, kMostCandidates);
+    if (!found.empty()) return found;
+    for (const std::string& word : wordsOf(who)) addMatches(finder, word, found);
     if (!found.empty()) return found;
     for (const std::string& word : wordsOf(who)) {
-        if (word.size() > kBeginning && isAscii(word)) addMatches(data, word.substr(0, kBeginning), found);
+        if (word.size() > kBeginning && isAscii(word)) addMatches(finder, word.substr(0, kBeginning), found);
     }
     return found;
 }
 
-[[noreturn]] void refuseUnknown(const gedcom::GedcomData& data, const std::string& who) {
-    const std::vector<gedcom::PersonId> similar = similarPersons(data, who);
+[[noreturn]] void refuseUnknown(const gedcom::GedcomData& data, PersonFinder& finder,
+                                const std::string& who) {
+    const std::vector<gedcom::PersonId> similar = similarPersons(finder, who);
     const std::string start = data.file() + ": no person is called '" + who + "'";
     if (similar.empty()) throw UsageError(start + "; 'olvane people' lists them all");
     throw UsageError(start + "; perhaps one of these is meant:" + candidateList(data, similar));
@@ -75,8 +76,9 @@ std::string years(const gedcom::Person& person) {
 }  // namespace
 
 gedcom::PersonId chooseFocus(const gedcom::GedcomData& data, const std::string& who) {
-    const std::vector<gedcom::PersonId> found = gedcom::findPersons(data, who);
-    if (found.empty()) refuseUnknown(data, who);
+    PersonFinder finder(data);
+    const std::vector<gedcom::PersonId> found = finder.meant(who);
+    if (found.empty()) refuseUnknown(data, finder, who);
     if (found.size() > 1) {
         throw UsageError(data.file() + ": '" + who + "' may be any of " + std::to_string(found.size()) +
                          " persons; name one by its id:" + candidateList(data, found));

@@ -5,13 +5,12 @@
 
 #include <cli/Commands.h>
 
-#include <olvane/gedcom/PersonSearch.h>
-
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PeopleList.h>
+#include <cli/PersonFinder.h>
 
 namespace olvane::cli {
 
@@ -41,10 +40,10 @@ std::string textOf(const gedcom::GedcomData& data, const std::vector<gedcom::Per
 }  // namespace
 
 int runPeople(const PeopleOptions& options) {
-    const bool isForPeople = options.format == ListFormat::text;
-    const gedcom::GedcomData data = isForPeople ? readFile(options.input) : readFileWithFacts(options.input);
     const std::string words = joined(options.words);
-    const auto persons = words.empty() ? everybody(data) : gedcom::findPersons(data, words);
+    const bool needsFacts = options.format != ListFormat::text || !words.empty();
+    const gedcom::GedcomData data = needsFacts ? readFileWithFacts(options.input) : readFile(options.input);
+    const auto persons = words.empty() ? everybody(data) : PersonFinder(data).find(words);
     writeReport(textOf(data, persons, options.format));
     if (!persons.empty()) return 0;
     tell(options.input.file + ": " +

@@ -9,7 +9,6 @@
 
 #include <gtest/gtest.h>
 
-#include <olvane/gedcom/PersonSearch.h>
 #include "GedcomText.h"
 
 namespace olvane::gedcom::test {
@@ -135,7 +134,7 @@ std::size_t touchAll(const GedcomData& data) {
         for (const ChildLink& link : data.childLinks(id)) touched += link.line;
     }
     for (const Diagnostic& diagnostic : data.diagnostics()) touched += formatDiagnostic(diagnostic).size();
-    return touched + findPersons(data, "a").size();
+    return touched;
 }
 
 TEST(HostileInput, changedBytesAreReadOrRefused) {
