@@ -22,21 +22,35 @@ namespace {
 
 constexpr int kLastYear = 9999;
 
-bool isSpace(char c) {
+constexpr bool isSpace(char c) {
     return c == ' ' || c == '\t' || c == '\n' || c == '\r';
 }
 
-bool isDigit(char c) {
+constexpr bool isDigit(char c) {
     return c >= '0' && c <= '9';
 }
 
-bool isWordLetter(char c) {
+constexpr bool isWordLetter(char c) {
     return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || static_cast<unsigned char>(c) >= 0x80;
 }
 
-bool isJoint(char c) {
+constexpr bool isJoint(char c) {
     return c == '.' || c == '-' || c == '/';
 }
+
+enum class CharacterSort : unsigned char { other, space, letter, digit, joint };
+
+constexpr auto kSorts = [] {
+    std::array<CharacterSort, 256> sorts{};
+    for (std::size_t c = 0; c < sorts.size(); ++c) {
+        const char character = static_cast<char>(c);
+        if (isSpace(character)) sorts[c] = CharacterSort::space;
+        if (isDigit(character)) sorts[c] = CharacterSort::digit;
+        if (isWordLetter(character)) sorts[c] = CharacterSort::letter;
+        if (isJoint(character)) sorts[c] = CharacterSort::joint;
+    }
+    return sorts;
+}();
 
 // Words of a value from left to right. A word ends at a space, and between letters and digits: "12MAY1900", "c.1590",
 // "972B.C.", "24-JAN-1915".
@@ -63,17 +77,19 @@ public:
 private:
     void findWord() {
         while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
-        wordLength_ = 0;
-        while (wordLength_ < rest_.size() && !isSpace(rest_[wordLength_]) && !beginsOther(wordLength_))
-            ++wordLength_;
-    }
-
-    // Whether a letter stands behind a digit at this place, or a digit behind a letter, with at most a joint between.
-    bool beginsOther(std::size_t at) const {
-        const bool letter = isWordLetter(rest_[at]);
-        if (at == 0 || (!letter && !isDigit(rest_[at]))) return false;
-        const std::size_t before = at >= 2 && isJoint(rest_[at - 1]) ? at - 2 : at - 1;
-        return letter ? isDigit(rest_[before]) : isWordLetter(rest_[before]);
+        CharacterSort last = CharacterSort::space;  // of the last letter or digit
+        bool isClose = false;                       // it stands here but for one joint
+        for (wordLength_ = 0; wordLength_ < rest_.size(); ++wordLength_) {
+            const CharacterSort sort = kSorts[static_cast<unsigned char>(rest_[wordLength_])];
+            if (sort == CharacterSort::space) return;
+            if (sort == CharacterSort::letter || sort == CharacterSort::digit) {
+                if (isClose && sort != last) return;
+                last = sort;
+                isClose = true;
+            } else {
+                isClose = isClose && sort == CharacterSort::joint && !isJoint(rest_[wordLength_ - 1]);
+            }
+        }
     }
 
     std::string_view rest_;
@@ -321,8 +337,10 @@ bool readNumericDate(std::string_view word, ReadDate& result) {
 
 // Also in three words: "6. 5. 1900".
 bool takeNumericDate(Words& words, ReadDate& result) {
-    if (!isDigit(words.front())) return false;
-    if (words.peek().find_first_of("./-") == std::string_view::npos) return false;
+    constexpr std::size_t kDayDigits = 2;
+    const std::string_view word = words.peek();
+    const bool mayHaveJoint = isDigit(words.front()) && (word.size() > kDayDigits || isJoint(word.back()));
+    if (!mayHaveJoint || std::none_of(word.begin(), word.end(), isJoint)) return false;
     if (readNumericDate(words.peek(), result)) {
         words.skip();
         return true;
@@ -343,10 +361,10 @@ std::optional<int> takeDay(Words& words) {
     while (isJoint(word.back()) || word.back() == ',') word.remove_suffix(1);
     const auto day = wholeNumber(word, 2);
     if (!day) return {};
+    const bool isOrdinal = words.rest().size() > word.size() && isWordLetter(words.rest()[word.size()]);
     words.skip();
-    words.skipIf({"ST", "ND", "RD", "TH", "ER", "RE", "E", "O"});
-    if (words.peek() == "\u00BA" || words.peek() == "\u00B0") words.skip();
-    words.skipIf({"OF", "DE", "DEL", "DI", "DO"});
+    if (isOrdinal) words.skipIf({"ST", "ND", "RD", "TH", "ER", "RE", "E", "O"});
+    if (isOrdinal && (words.peek() == "\u00BA" || words.peek() == "\u00B0")) words.skip();
     return day;
 }
 
@@ -355,10 +373,16 @@ int takeMonth(Words& words, Calendar calendar) {
     Words ahead = words;
     const auto number = isDigit(words.front()) ? wholeNumber(words.peek(), 2) : std::nullopt;
     ahead.skip();
+    if (isDigit(words.front()) && !number) return 0;
     const bool counted = number && *number >= 7 && *number <= 10 && ahead.skipIf({"BRE"});
     const int month = counted ? *number + 2 : monthOf(calendar, words.peek());
     if (month != 0) words = ahead;
     return month;
+}
+
+// "of" and the like, between a day, a month and a year.
+bool skipParticle(Words& words) {
+    return words.skipIf({"OF", "DE", "DEL", "DI", "DO"});
 }
 
 // "May 24, 1819": the day behind the month, if a year follows it.
@@ -370,18 +394,31 @@ void takeDayBehindMonth(Words& words, ReadDate& result) {
     words = ahead;
 }
 
-// [weekday] [day] month, or month day; nothing where no month is.
+// [day] month, or month day; nothing where no month is.
 void takeDayAndMonth(Words& words, ReadDate& result) {
     const Words start = words;
     const auto day = takeDay(words);
     result.date.month = takeMonth(words, result.calendar);
+    if (result.date.month == 0 && day && skipParticle(words)) {
+        result.date.month = takeMonth(words, result.calendar);
+    }
     if (result.date.month == 0) {
         words = start;
         return;
     }
     if (day) result.date.day = *day;
-    words.skipIf({"OF", "DE", "DEL", "DI", "DO"});
+    if (!isDigit(words.front())) skipParticle(words);
     if (!day) takeDayBehindMonth(words, result);
+}
+
+// What may stand before a day: a weekday, with or without an article; AD before a year.
+void skipWordsAhead(Words& words) {
+    if (isWeekday(DateWord(words.peek()))) {
+        words.skip();
+        words.skipIf({"DEN", "LE", "EL", "IL", "THE"});
+    } else {
+        words.skipIf({"AD", "A.D"});
+    }
 }
 
 // [calendar] [weekday] [[day] month] year [B.C.]
@@ -395,14 +432,11 @@ std::optional<ReadDate> takeDate(Words& words) {
         words.skip();
         return result;
     }
-    if (plain && isWordLetter(words.front()) && isWeekday(DateWord(words.peek()))) {
-        words.skip();
-        words.skipIf({"DEN", "LE", "EL", "IL", "THE"});
-    }
+    if (plain && isWordLetter(words.front()) && monthOf(result.calendar, words.peek()) == 0)
+        skipWordsAhead(words);
     if (plain && takeNumericDate(words, result)) {
         return takeEra(words, result) ? std::optional(result) : std::nullopt;
     }
-    words.skipIf({"AD", "A.D"});
     takeDayAndMonth(words, result);
     if (!takeYear(words, result) || !takeEra(words, result)) return {};
     dropImpossibleDay(result);
@@ -484,6 +518,39 @@ CalendarDate justBefore(const CalendarDate& date) {
 
 namespace {
 
+enum class Qualifier : unsigned char { none, between, from, before, after, about, interpreted };
+
+struct QualifierWord {
+    std::string_view word;
+    Qualifier qualifier;
+};
+
+// The standard's words first, then what people write.
+constexpr QualifierWord kQualifiers[] = {
+    {"ABT", Qualifier::about},       {"BEF", Qualifier::before},    {"AFT", Qualifier::after},
+    {"BET", Qualifier::between},     {"FROM", Qualifier::from},     {"TO", Qualifier::before},
+    {"CAL", Qualifier::about},       {"EST", Qualifier::about},     {"INT", Qualifier::interpreted},
+    {"BETWEEN", Qualifier::between}, {"BEFORE", Qualifier::before}, {"VOR", Qualifier::before},
+    {"AVANT", Qualifier::before},    {"VOOR", Qualifier::before},   {"ANTES", Qualifier::before},
+    {"AFTER", Qualifier::after},     {"NACH", Qualifier::after},    {"APRES", Qualifier::after},
+    {"NA", Qualifier::after},        {"DOPO", Qualifier::after},    {"EFTER", Qualifier::after},
+    {"ABOUT", Qualifier::about},     {"CIRCA", Qualifier::about},   {"CA", Qualifier::about},
+    {"C", Qualifier::about},         {"UM", Qualifier::about},      {"ENV", Qualifier::about},
+    {"ENVIRON", Qualifier::about},   {"VERS", Qualifier::about},    {"OMSTREEKS", Qualifier::about},
+    {"APPROX", Qualifier::about},    {"AROUND", Qualifier::about},
+};
+
+Qualifier takeQualifier(Words& words) {
+    if (!isWordLetter(words.front())) return Qualifier::none;
+    const DateWord word(words.peek());
+    for (const QualifierWord& known : kQualifiers) {
+        if (known.word != word.text()) continue;
+        words.skip();
+        return known.qualifier;
+    }
+    return Qualifier::none;
+}
+
 // "1850-1860", which the standard has no word for.
 bool readYearRange(std::string_view word, GedcomDate& date) {
     constexpr std::size_t kYearDigits = 4;
@@ -523,22 +590,26 @@ GedcomDate parseGedcomDate(std::string_view written) {
     std::string_view text = written;
     const DateMark signs = takeSigns(text);
     Words words(text);
-    if (signs != DateMark::exact) {
-        readSingle(words, signs, date);
-    } else if (words.skipIf({"BET", "BETWEEN"})) {
-        readRange(words, "AND", DateMark::after, date);
-    } else if (words.skipIf({"FROM"})) {
-        readRange(words, "TO", DateMark::after, date);
-    } else if (words.skipIf({"TO", "BEF", "BEFORE", "VOR", "AVANT", "VOOR", "ANTES"})) {
-        readSingle(words, DateMark::before, date);
-    } else if (words.skipIf({"AFT", "AFTER", "NACH", "APRES", "NA", "DOPO", "EFTER"})) {
-        readSingle(words, DateMark::after, date);
-    } else if (words.skipIf({"ABT", "ABOUT", "CAL", "EST", "CIRCA", "CA", "C", "UM", "ENV", "ENVIRON", "VERS",
-                             "OMSTREEKS", "APPROX", "AROUND"})) {
-        readSingle(words, DateMark::about, date);
-    } else if (!readYearRange(text, date)) {
-        words.skipIf({"INT"});
-        readSingle(words, DateMark::exact, date);
+    const Qualifier qualifier = signs != DateMark::exact ? Qualifier::none : takeQualifier(words);
+    switch (qualifier) {
+        case Qualifier::between:
+            readRange(words, "AND", DateMark::after, date);
+            break;
+        case Qualifier::from:
+            readRange(words, "TO", DateMark::after, date);
+            break;
+        case Qualifier::before:
+            readSingle(words, DateMark::before, date);
+            break;
+        case Qualifier::after:
+            readSingle(words, DateMark::after, date);
+            break;
+        case Qualifier::about:
+            readSingle(words, DateMark::about, date);
+            break;
+        case Qualifier::interpreted:
+        case Qualifier::none:
+            if (!readYearRange(text, date)) readSingle(words, signs, date);
     }
     return date;
 }

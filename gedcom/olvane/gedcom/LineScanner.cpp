@@ -109,19 +109,18 @@ std::size_t findConcText(std::string_view rest) {
     return rest.substr(at, 5) == "CONC " ? at + 5 : std::string_view::npos;
 }
 
-std::size_t LineCutter::nearestEnd() {
-    if (!knowsLf_ || nextLf_ < at_) nextLf_ = find(bytes_, at_, '\n');
-    if (!knowsCr_ || nextCr_ < at_) nextCr_ = find(bytes_, at_, '\r');
-    knowsLf_ = knowsCr_ = true;
-    return std::min(nextLf_, nextCr_);
-}
+LineCutter::LineCutter(std::string_view bytes)
+    : bytes_(bytes), nextLf_(find(bytes, 0, '\n')), nextCr_(find(bytes, 0, '\r')) {}
 
 bool LineCutter::next(std::string_view& text) {
     if (at_ >= bytes_.size()) return false;
-    const std::size_t end = nearestEnd();
+    if (nextLf_ < at_) nextLf_ = find(bytes_, at_, '\n');
+    if (nextCr_ < at_) nextCr_ = find(bytes_, at_, '\r');
+    const std::size_t end = std::min(nextLf_, nextCr_);
     text = bytes_.substr(at_, end - at_);
     at_ = end;
-    skipEnd();
+    const bool isPlainLf = standsAt('\n', 0) && !standsAt('\r', 1);
+    isPlainLf ? static_cast<void>(++at_) : skipEnd();
     ++number_;
     return true;
 }

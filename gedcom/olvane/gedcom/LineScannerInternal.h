@@ -36,7 +36,7 @@ struct GedcomLine {
 // Holds: time is linear however far apart the line ends of either sort are.
 class LineCutter {
 public:
-    explicit LineCutter(std::string_view bytes) : bytes_(bytes) {}
+    explicit LineCutter(std::string_view bytes);
 
     bool next(std::string_view& text);
     std::uint32_t number() const { return number_; }
@@ -45,7 +45,6 @@ public:
     double share() const { return static_cast<double>(at_) / static_cast<double>(bytes_.size()); }
 
 private:
-    std::size_t nearestEnd();
     void skipEnd();
     bool standsAt(char wanted, std::size_t ahead) const {
         return at_ + ahead < bytes_.size() && bytes_[at_ + ahead] == wanted;
@@ -55,11 +54,9 @@ private:
     bool endsInLfCr_ = false;  // the first line does
     std::size_t at_ = 0;
     std::uint32_t number_ = 0;
-    // Where the next one is, at or behind at_ once asked for; the size of the bytes if there is none.
-    std::size_t nextLf_ = 0;
-    std::size_t nextCr_ = 0;
-    bool knowsLf_ = false;
-    bool knowsCr_ = false;
+    // Where the next one is, at or behind at_ once a line was asked for; the size of the bytes if there is none.
+    std::size_t nextLf_;
+    std::size_t nextCr_;
 };
 
 // Walks over the lines of a GEDCOM text, in an encoding that has ASCII in it. What is no line is reported and
