@@ -219,6 +219,16 @@ private:
                 "refused")
             ->check(CLI::IsMember({"A4", "A3", "letter"}))
             ->type_name("A4|A3|letter");
+        draw_->add_flag("--unknown-parents", drawOptions_.request.unknownParents,
+                        "Draw dashed boxes for parents who are not known, in family and pedigree");
+        draw_
+            ->add_option(
+                "--show", drawShown_,
+                "What boxes say beside names and years, a list of dates (in full), places, occupation, "
+                "and marriage for its year at the line of the couple")
+            ->delimiter(',')
+            ->check(CLI::IsMember({"dates", "places", "occupation", "marriage"}))
+            ->type_name("WHAT,...");
         addHideLiving(*draw_, drawOptions_.hiding);
     }
 
@@ -371,6 +381,12 @@ private:
         DrawOptions options = drawOptions_;
         completeViewOptions(*draw_, options.request);
         widenSideways(*draw_, options.request);
+        for (const std::string& what : drawShown_) {
+            options.shown.dates = options.shown.dates || what == "dates";
+            options.shown.places = options.shown.places || what == "places";
+            options.shown.occupation = options.shown.occupation || what == "occupation";
+            options.shown.marriage = options.shown.marriage || what == "marriage";
+        }
         return options;
     }
 
@@ -406,6 +422,7 @@ private:
     PeopleOptions peopleOptions_;
     LayoutOptions layoutOptions_;
     DrawOptions drawOptions_;
+    std::vector<std::string> drawShown_;
     BatchOptions batchOptions_;
     CheckOptions checkOptions_;
     KinOptions kinOptions_;

@@ -11,6 +11,7 @@
 #include <cli/FileReading.h>
 #include <cli/HiddenPersons.h>
 #include <cli/LayoutRun.h>
+#include <cli/PictureLabels.h>
 
 namespace olvane::cli {
 
@@ -45,6 +46,7 @@ struct DrawOptions {
     std::string theme = "light";
     std::string title;  // empty for one made of the focus's name
     std::string page;   // name of a paper; empty for a picture of its own size
+    ShownFacts shown{};
     HidingOptions hiding;
 };
 

@@ -12,7 +12,6 @@
 #include <sstream>
 
 #include <olvane/draw/PageSplit.h>
-#include <olvane/host/LayoutText.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
@@ -20,6 +19,7 @@
 #include <cli/OutputFile.h>
 #include <cli/PictureConversion.h>
 #include <cli/PictureLabels.h>
+#include <cli/PictureRun.h>
 #include <cli/SourceDate.h>
 #include <cli/UsageError.h>
 
@@ -61,26 +61,29 @@ const char* endingOf(Form form) {
     return ".svg";
 }
 
+// "Family of Ada Berg", "Ancestors of Ada Berg".
+std::string titleOf(const DrawOptions& options, const draw::DrawingContent& content) {
+    std::string view = charts::nameOf(options.request.view);
+    if (view[0] >= 'a' && view[0] <= 'z') view[0] = static_cast<char>(view[0] - 'a' + 'A');
+    const picture::Index focus = content.picture.focus;
+    if (focus == picture::kNone) return view;
+    return view + " of " +
+           draw::fullName(content.labelOf(content.picture.boxes[static_cast<std::size_t>(focus)].id));
+}
+
 draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::DrawingContent& content) {
-    const TreeSize size = sizeOf(options.request.boxes);
-    const bool isPedigree = options.request.view == View::pedigree;
     draw::DrawingOptions drawing;
-    drawing.direction = isPedigree ? draw::LineDirection::sideways : draw::LineDirection::downward;
-    drawing.box = {static_cast<int>(size.nodeWidth), static_cast<int>(size.nodeHeight)};
     drawing.theme = draw::themeOfName(options.theme);
     drawing.headline = !options.title.empty();
-    drawing.title = options.title;
-    if (!drawing.headline) {
-        drawing.title =
-            (isPedigree ? "Pedigree of " : "Family of ") + draw::fullName(content.labelOf(content.focusId));
-    }
+    drawing.title = drawing.headline ? options.title : titleOf(options, content);
     return drawing;
 }
 
 draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options) {
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    const std::string text = layoutText(data, focus, options.request);
-    return pictureContent(data, readLayoutText(text), focus, hiddenPersons(data, options.hiding));
+    const std::vector<bool> hidden = hiddenPersons(data, options.hiding);
+    picture::Picture picture = PictureRun(data, options.request, hidden).pictureOf(focus);
+    return pictureContent(data, std::move(picture), options.shown, hidden);
 }
 
 // "tree.svg" and sheet 3 of 12 give "tree-03.svg".
@@ -152,14 +155,10 @@ std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::S
 
 int runDraw(const DrawOptions& options) {
     const Form form = formOf(options.output);
-    if (!isEngineView(options.request.view)) {
-        throw UsageError(
-            std::string("the view ") + charts::nameOf(options.request.view) +
-            " is not drawn, but printed as data by 'olvane layout'; family and pedigree are drawn");
-    }
     const OutputRules rules{InputFiles({options.input.file}), {endingOf(form)}};
     checkOutput(options.output, rules);
-    const gedcom::GedcomData data = readFile(options.input);
+    const gedcom::GedcomData data =
+        options.shown.needFacts() ? readFileWithFacts(options.input) : readFile(options.input);
     const draw::DrawingContent content = contentOf(data, options);
     const draw::DrawingOptions drawing = drawingOptions(options, content);
     const auto sheets = sheetsOf(options, draw::drawSvg(content, drawing), drawing.title);

@@ -7,14 +7,11 @@
 // picture that says so.
 
 #include <olvane/draw/SvgDrawing.h>
-#include <olvane/host/LayoutText.h>
-
-#include <olvane/graph/WholePoint.h>
+#include <olvane/picture/LayoutPicture.h>
 
 #include <support/CaseRun.h>
 #include <support/GoldenCase.h>
 
-#include <algorithm>
 #include <exception>
 #include <filesystem>
 #include <fstream>
@@ -39,19 +36,12 @@ olvane::draw::PersonLabel labelOf(const CaseFile& source, std::int64_t id) {
     return label;
 }
 
-// A box is at least one point wide and high, whatever the case asks for.
-int boxSide(float size) {
-    return std::max(1, olvane::wholePoint(size));
-}
-
 std::string pictureOf(const CaseFile& source, const std::string& name) {
     DrawingContent content;
-    content.records = olvane::readWholeRecords(support::layoutText(source)).records;
-    content.focusId = source.focus;
+    content.picture = olvane::picture::pictureOf(support::runTypedCase(source).layout);
     content.labelOf = [&source](std::int64_t id) { return labelOf(source, id); };
     DrawingOptions options;
     options.title = name;
-    options.box = {boxSide(source.size.nodeWidth), boxSide(source.size.nodeHeight)};
     return olvane::draw::drawSvg(content, options).svg;
 }
 

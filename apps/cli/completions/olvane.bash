@@ -28,6 +28,7 @@ _olvane() {
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
         --boxes) COMPREPLY=($(compgen -W "tall wide" -- "$cur")); return ;;
         --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
+        --show) COMPREPLY=($(compgen -W "dates places occupation marriage" -- "$cur")); return ;;
         --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
         --format) COMPREPLY=($(compgen -W "text tsv json json1" -- "$cur")); return ;;
         --encoding) COMPREPLY=($(compgen -W "$encodings" -- "$cur")); return ;;
@@ -45,7 +46,7 @@ _olvane() {
     case ${words[1]} in
         people) COMPREPLY=($(compgen -W "--help --encoding --format" -- "$cur")) ;;
         layout) COMPREPLY=($(compgen -W "--help --encoding --focus --format $view $living $family" -- "$cur")) ;;
-        draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page $view $living $family" -- "$cur")) ;;
+        draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page --unknown-parents --show $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --encoding --focus --all --format $view $family" -- "$cur")) ;;
         kin) COMPREPLY=($(compgen -W "--help --encoding --format --ways --language" -- "$cur")) ;;

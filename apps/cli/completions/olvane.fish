@@ -39,6 +39,8 @@ complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-spouses-of-ch
 complete -c olvane -n '__fish_seen_subcommand_from layout draw check page' -l focus -x -d 'The person in the middle'
 complete -c olvane -n '__fish_seen_subcommand_from layout draw page' -l hide-living -d 'Tell nothing of the living'
 complete -c olvane -n '__fish_seen_subcommand_from layout draw page' -l year -x -d 'The year to count from'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -l unknown-parents -d 'Draw boxes for parents who are not known'
+complete -c olvane -n '__fish_seen_subcommand_from draw' -l show -x -a 'dates places occupation marriage' -d 'What boxes say beside names and years'
 complete -c olvane -n '__fish_seen_subcommand_from layout' -l format -x -a 'text json json1' -d 'Form of the output'
 complete -c olvane -n '__fish_seen_subcommand_from draw page' -s o -l output -r -d 'Picture or page to write'
 complete -c olvane -n '__fish_seen_subcommand_from draw' -l theme -x -a 'light dark print' -d 'Colours'

@@ -31,7 +31,7 @@ constexpr double kBadgeInset = 6;
 constexpr double kFocusBorder = 4;
 constexpr std::array<double, 4> kNameSizes = {13, 12, 11, 10};
 
-bool isWide(const Box& box) {
+bool isWide(const BoxFrame& box) {
     return box.width > box.height;
 }
 
@@ -44,7 +44,7 @@ struct TextRoom {
     bool centred = true;
 };
 
-TextRoom textRoomOf(const Box& box) {
+TextRoom textRoomOf(const BoxFrame& box) {
     if (isWide(box)) {
         const double left = kInset + kSilhouetteWidth + kInset;
         return {left, box.width - left - kInset, 4, box.height - 5, false};
@@ -114,6 +114,19 @@ std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& r
     return parts;
 }
 
+// Years, then as many details as leave room for two lines of a name.
+std::vector<std::string> factLinesOf(const PersonLabel& label, const TextRoom& room) {
+    const Font font{kYearsSize, false};
+    std::vector<std::string> lines = yearLinesOf(label, room);
+    const double spare = room.bottom - room.top - 2 * (kNameSizes.back() + 3);
+    const auto most = static_cast<std::size_t>(std::max(0.0, spare / kYearsPitch));
+    for (const std::string& detail : label.details) {
+        if (lines.size() >= most) break;
+        lines.push_back(fitLine(cleanText(detail), font, room.width));
+    }
+    return lines;
+}
+
 void appendTextLine(std::string& svg, double x, double y, std::string_view text,
                     std::string_view attributes) {
     svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\"";
@@ -150,9 +163,9 @@ void appendYears(std::string& svg, const std::vector<std::string>& lines, const 
 }
 
 // Names in the middle of what the years leave.
-void appendTexts(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+void appendTexts(std::string& svg, const BoxFrame& box, const PersonLabel& label, const DrawingTheme& theme) {
     const TextRoom room = textRoomOf(box);
-    const std::vector<std::string> years = yearLinesOf(label, room);
+    const std::vector<std::string> years = factLinesOf(label, room);
     const double namesBottom =
         room.bottom - kYearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : 2);
     const double namesHeight = namesBottom - room.top;
@@ -186,7 +199,7 @@ std::string_view silhouetteOf(LabelSex sex) {
     return "olvane-person";
 }
 
-void appendFrame(std::string& svg, const Box& box, LabelSex sex, const DrawingTheme& theme) {
+void appendFrame(std::string& svg, const BoxFrame& box, LabelSex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double corner = cornerOf(sex);
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" + px(corner) +
@@ -200,7 +213,7 @@ void appendFrame(std::string& svg, const Box& box, LabelSex sex, const DrawingTh
            "\" stroke-width=\"1.4\"/>\n";
 }
 
-void appendSilhouette(std::string& svg, const Box& box, LabelSex sex, const DrawingTheme& theme) {
+void appendSilhouette(std::string& svg, const BoxFrame& box, LabelSex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double x = isWide(box) ? kInset : (box.width - kSilhouetteWidth) / 2;
     const double y = isWide(box) ? (box.height - kSilhouetteHeight) / 2 : 11;
@@ -212,25 +225,26 @@ std::string counted(int count, const char* one, const char* many) {
     return std::to_string(count) + " " + (count == 1 ? one : many);
 }
 
-std::string hiddenSentence(const PersonLabel& label) {
+std::string hiddenSentence(const BoxFrame& frame, bool isLiving) {
     std::string list;
     const auto add = [&list](const std::string& part) { list += (list.empty() ? "" : ", ") + part; };
-    const HiddenRelatives hidden = label.hidden.value_or(HiddenRelatives());
-    if (hidden.parents > 0) add(counted(hidden.parents, "parent", "parents"));
-    if (hidden.spouses > 0) add(counted(hidden.spouses, "spouse", "spouses"));
-    if (hidden.children > 0) add(counted(hidden.children, "child", "children"));
+    const picture::Box& box = *frame.box;
+    if (frame.countsHidden && !isLiving) {
+        if (box.hiddenParents > 0) add(counted(box.hiddenParents, "parent", "parents"));
+        if (box.hiddenPartners > 0) add(counted(box.hiddenPartners, "spouse", "spouses"));
+        if (box.hiddenChildren > 0) add(counted(box.hiddenChildren, "child", "children"));
+    }
     if (!list.empty()) return "Not shown: " + list;
-    return label.hidden ? "Has relatives who stand elsewhere in this picture"
-                        : "Has relatives who are not shown";
+    return frame.countsHidden && !isLiving ? "Has relatives who stand elsewhere in this picture"
+                                           : "Has relatives who are not shown";
 }
 
-std::string hiddenMark(const PersonLabel& label) {
-    const HiddenRelatives hidden = label.hidden.value_or(HiddenRelatives());
-    const int count = hidden.parents + hidden.spouses + hidden.children;
+std::string hiddenMark(const BoxFrame& frame, bool isLiving) {
+    const int count = frame.countsHidden && !isLiving ? frame.hiddenCount() : 0;
     return count > 0 ? "+" + std::to_string(count) : "+";
 }
 
-std::string repeatSentence(const Box& box) {
+std::string repeatSentence(const BoxFrame& box) {
     return "Stands in " + std::to_string(box.repeatCount) + " boxes, all marked " +
            std::to_string(box.repeatNumber);
 }
@@ -244,10 +258,8 @@ struct Badge {
     double width() const { return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9); }
 };
 
-// A pill with a title of its own: on top of a tall box, where the silhouette leaves room, and at the foot of
-// a wide one, beside the years.
-void appendBadge(std::string& svg, const Box& box, const Badge& badge, const DrawingTheme& theme) {
-    const double y = isWide(box) ? box.height - kBadgeHeight - kBadgeInset : kBadgeInset;
+// A pill with a title of its own.
+void appendBadgeAt(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
     const std::string fill(badge.hollow ? theme.page : theme.badge);
     const std::string ink(badge.hollow ? theme.text : theme.badgeText);
     svg += "<g><title>" + escaped(badge.title) + "</title>\n<rect x=\"" + px(badge.x) + "\" y=\"" + px(y) +
@@ -259,12 +271,18 @@ void appendBadge(std::string& svg, const Box& box, const Badge& badge, const Dra
     svg += "</g>\n";
 }
 
+// On top of a tall box, where the silhouette leaves room, and at the foot of a wide one, beside the years.
+void appendBadge(std::string& svg, const BoxFrame& box, const Badge& badge, const DrawingTheme& theme) {
+    appendBadgeAt(svg, isWide(box) ? box.height - kBadgeHeight - kBadgeInset : kBadgeInset, badge, theme);
+}
+
 // The count of hidden relatives in the right corner; the repeat mark in the left one, or before it in a wide
 // box.
-void appendBadges(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+void appendBadges(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+                  const DrawingTheme& theme) {
     double right = box.width - kBadgeInset;
-    if (box.record->hasHiddenRelatives) {
-        Badge badge{hiddenMark(label), hiddenSentence(label)};
+    if (box.hasHidden()) {
+        Badge badge{hiddenMark(box, label.living), hiddenSentence(box, label.living)};
         badge.x = right - badge.width();
         right = badge.x - kBadgeInset / 2;
         appendBadge(svg, box, badge, theme);
@@ -276,17 +294,43 @@ void appendBadges(std::string& svg, const Box& box, const PersonLabel& label, co
     }
 }
 
-std::string titleOf(const Box& box, const PersonLabel& label) {
+// Side by side in the middle of the upper or lower edge, half outside.
+void appendMarks(std::string& svg, const BoxFrame& box, MarkPlace place, const DrawingTheme& theme) {
+    double width = 0;
+    std::vector<Badge> badges;
+    for (const BoxMark& mark : box.marks) {
+        if (mark.place != place) continue;
+        badges.push_back({mark.text, mark.title, true});
+        width += badges.back().width() + (badges.size() > 1 ? kBadgeInset / 2 : 0);
+    }
+    double x = (box.width - width) / 2;
+    for (Badge& badge : badges) {
+        badge.x = x;
+        x += badge.width() + kBadgeInset / 2;
+        appendBadgeAt(svg, (place == MarkPlace::top ? 0 : box.height) - kBadgeHeight / 2, badge, theme);
+    }
+}
+
+void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
+    appendMarks(svg, box, MarkPlace::top, theme);
+    appendMarks(svg, box, MarkPlace::bottom, theme);
+}
+
+std::string titleOf(const BoxFrame& box, const PersonLabel& label) {
     std::string title = fullName(label);
     if (!label.living && !label.birth.empty()) title += ", * " + label.birth;
     if (!label.living && !label.death.empty()) title += ", \xE2\x80\xA0 " + label.death;
+    if (!label.living) {
+        for (const std::string& detail : label.details) title += ", " + detail;
+    }
     if (box.isFocus) title += " (focus of this picture)";
     if (box.repeatNumber > 0) title += ". " + repeatSentence(box);
-    if (box.record->hasHiddenRelatives) title += ". " + hiddenSentence(label);
+    if (box.hasHidden()) title += ". " + hiddenSentence(box, label.living);
+    for (const BoxMark& mark : box.marks) title += ". " + mark.title;
     return title;
 }
 
-void openBox(std::string& svg, const Box& box, const std::string& title) {
+void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
     svg += "<g role=\"img\" transform=\"translate(" + px(box.x) + " " + px(box.y) + ")\"><title>" +
            escaped(title) + "</title>\n";
 }
@@ -328,20 +372,23 @@ void appendBoxDefinitions(std::string& svg) {
         "</defs>\n";
 }
 
-void appendPersonBox(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme) {
+void appendPersonBox(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+                     const DrawingTheme& theme) {
     const PersonLabel shown = shownLabel(label);
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
     appendSilhouette(svg, box, shown.sex, theme);
     appendTexts(svg, box, shown, theme);
     appendBadges(svg, box, label, theme);
+    appendMarks(svg, box, theme);
     svg += "</g>\n";
 }
 
-void appendPlaceholderBox(std::string& svg, const Box& box, const std::string& childName,
+void appendPlaceholderBox(std::string& svg, const BoxFrame& box, const std::string& childName,
                           const DrawingTheme& theme) {
-    const char* invitation = box.record->addNode->male ? "add father" : "add mother";
-    const LabelSex sex = box.record->addNode->male ? LabelSex::male : LabelSex::female;
+    const bool isFather = box.box->sex == kin::Sex::male;
+    const char* invitation = isFather ? "add father" : "add mother";
+    const LabelSex sex = isFather ? LabelSex::male : LabelSex::female;
     openBox(svg, box, std::string(invitation) + " of " + childName);
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" +
            px(cornerOf(sex)) + "\" fill=\"" + std::string(theme.page) + "\" stroke=\"" +

@@ -3,8 +3,10 @@
 
 #pragma once
 
+#include <span>
 #include <string>
 
+#include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgDrawing.h>
 
 namespace olvane::draw {
@@ -12,27 +14,32 @@ namespace olvane::draw {
 // One box of a picture: where it stands, and what is special about it.
 //
 // Units: px.
-struct Box {
-    const LayoutRecord* record = nullptr;
+struct BoxFrame {
+    const picture::Box* box = nullptr;
     double x = 0;
     double y = 0;
     double width = 0;
     double height = 0;
     bool isFocus = false;
-    // A person who stands in several boxes has a number, the same in each, counted from 1; 0 for everybody
-    // else.
+    // A person with several boxes has a number, the same in each; 0 for everybody else.
     int repeatNumber = 0;
     int repeatCount = 0;
+    bool countsHidden = false;  // the box's numbers of hidden relatives are known
+    std::span<const BoxMark> marks;
+
+    int hiddenCount() const { return box->hiddenParents + box->hiddenPartners + box->hiddenChildren; }
+    bool hasHidden() const { return box->hasFlag ? box->flag : hiddenCount() > 0; }
 };
 
 // The definitions that boxes refer to. Once, ahead of all boxes.
 void appendBoxDefinitions(std::string& svg);
 
 // A person's box: silhouette, name, years, marks, and a title that says it all in words.
-void appendPersonBox(std::string& svg, const Box& box, const PersonLabel& label, const DrawingTheme& theme);
+void appendPersonBox(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+                     const DrawingTheme& theme);
 
-// The dashed box of an add-node; childName tells whose parent is missing.
-void appendPlaceholderBox(std::string& svg, const Box& box, const std::string& childName,
+// The dashed box of an unknown parent; childName says whose parent.
+void appendPlaceholderBox(std::string& svg, const BoxFrame& box, const std::string& childName,
                           const DrawingTheme& theme);
 
 }  // namespace olvane::draw

@@ -3,32 +3,29 @@
 
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <string>
+#include <string_view>
 
-#include <olvane/draw/FamilyLinesInternal.h>
 #include <olvane/draw/SvgDrawing.h>
 
 namespace olvane::draw {
 
-// Which kinds of line a picture holds beside the plain one, for its legend.
-struct LineStylesUsed {
-    bool divorced = false;
-    bool adopted = false;
-    bool foster = false;
+enum class LineStyle : std::uint8_t { plain, divorced, unmarried, adopted, foster, step, sealing };
+inline constexpr std::size_t kLineStyles = 7;
 
-    bool any() const { return divorced || adopted || foster; }
-};
+// Which styles a picture uses, for its legend.
+using LineStylesUsed = std::array<bool, kLineStyles>;
 
-enum class LineStyle : std::uint8_t { plain, divorced, adopted, foster };
-
-// The dashes of a style as a stroke-dasharray; empty for the plain one.
-const char* dashesOf(LineStyle style);
+// The dashes of a style as a stroke-dasharray, and what it means; empty for the plain one.
+std::string_view dashesOf(LineStyle style);
+std::string_view meaningOf(LineStyle style);
 
 // From points of the layout to px of the picture.
 struct Frame {
-    int left = 0;  // point that lies at px (marginX, marginY)
-    int top = 0;
+    double left = 0;  // point that lies at px (marginX, marginY)
+    double top = 0;
     int marginX = 0;
     int marginY = 0;
 
@@ -37,9 +34,9 @@ struct Frame {
     double y(double points) const { return (points - top) * kScale + marginY; }
 };
 
-// Appends all lines of a layout to the picture. Where a line crosses another family's, that one gives way
-// with a small gap, so that a crossing cannot be read as a joint.
-LineStylesUsed appendLines(SvgPicture& picture, const DrawingContent& content, const DrawingOptions& options,
+// Appends the lines of all families, each an element of its own. A line that crosses another family's jumps
+// over it where the picture says so. Labels stand over the marriage lines.
+LineStylesUsed appendLines(SvgPicture& svg, const DrawingContent& content, const DrawingOptions& options,
                            const Frame& frame);
 
 }  // namespace olvane::draw

@@ -4,21 +4,14 @@
 #pragma once
 
 #include <cstdint>
-#include <optional>
 #include <string>
+#include <vector>
 
 namespace olvane::draw {
 
 enum class LabelSex : std::uint8_t { male, female, other };
 
-// How many relatives of a person have no box in the picture.
-struct HiddenRelatives {
-    int parents = 0;
-    int spouses = 0;
-    int children = 0;
-};
-
-// What a box tells about its person. UTF-8; any text is allowed, it is data and never markup.
+// What a box says about its person. UTF-8; any text is allowed, it is data and never markup.
 struct PersonLabel {
     std::string given;
     std::string surname;
@@ -29,11 +22,8 @@ struct PersonLabel {
     LabelSex sex = LabelSex::other;
     // Drawn as "Living", with nothing else of this label in the picture.
     bool living = false;
-    // For the mark on a box whose person has hidden relatives; without it the mark tells no numbers.
-    std::optional<HiddenRelatives> hidden;
+    // Further lines below the years, each shortened to its box: places, an occupation.
+    std::vector<std::string> details;
 };
-
-// How a child came to the parents whom its line leads to.
-enum class ParentLink : std::uint8_t { birth, adopted, foster };
 
 }  // namespace olvane::draw

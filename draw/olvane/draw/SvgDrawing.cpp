@@ -1,15 +1,17 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Composes a picture: page, headline, lines, boxes, legend. The page takes the bounds of the boxes; lines of
-// a layout run between them, but for those that lead around a lone row, so segments count for the bounds too.
+// Composes a picture: page, headline, lines, boxes, legend.
 
 #include <olvane/draw/SvgDrawing.h>
 
 #include <algorithm>
+#include <cmath>
 #include <unordered_map>
+#include <vector>
 
 #include <olvane/draw/BoxArtInternal.h>
+#include <olvane/draw/FanArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/draw/TextFitInternal.h>
@@ -29,12 +31,12 @@ constexpr int kLegendStroke = 44;
 constexpr double kLegendSize = 11.5;
 
 struct Bounds {
-    int left = 0;
-    int top = 0;
-    int right = 0;
-    int bottom = 0;
+    double left = 0;
+    double top = 0;
+    double right = 0;
+    double bottom = 0;
 
-    void include(int x, int y) {
+    void include(double x, double y) {
         left = std::min(left, x);
         right = std::max(right, x);
         top = std::min(top, y);
@@ -42,18 +44,25 @@ struct Bounds {
     }
 };
 
-Bounds boundsOf(const std::vector<LayoutRecord>& records, const BoxSize& box) {
-    if (records.empty()) return {0, 0, box.width, box.height};
-    Bounds bounds{records[0].x, records[0].y, records[0].x, records[0].y};
-    for (const LayoutRecord& record : records) {
-        bounds.include(record.x, record.y);
-        bounds.include(record.x + box.width, record.y + box.height);
-        for (const LayoutSegment& segment : record.segments) {
-            bounds.include(segment.x1, segment.y1);
-            bounds.include(segment.x2, segment.y2);
-        }
+// Of boxes and lines; of an empty picture, the room that its sentence needs.
+Bounds boundsOf(const picture::Picture& picture) {
+    if (picture.boxes.empty()) return {0, 0, 55, 80};
+    const picture::Box& first = picture.boxes.front();
+    Bounds bounds{first.x, first.y, first.x, first.y};
+    for (const picture::Box& box : picture.boxes) {
+        bounds.include(box.x, box.y);
+        bounds.include(box.x + static_cast<double>(box.width), box.y + static_cast<double>(box.height));
+    }
+    for (const picture::Line& line : picture.lines) {
+        bounds.include(line.x1, line.y1);
+        bounds.include(line.x2, line.y2);
     }
     return bounds;
+}
+
+// Up to the next whole px; a picture is at most as large as a renderer's numbers.
+int wholePx(double size) {
+    return static_cast<int>(std::ceil(std::clamp(size, 0.0, 1e9)));
 }
 
 class Composer {
@@ -62,72 +71,57 @@ public:
         : content_(content), options_(options) {}
 
     SvgPicture compose() {
-        const Bounds bounds = boundsOf(content_.records, options_.box);
+        const Bounds bounds = boundsOf(content_.picture);
         const int headline = options_.headline ? kHeadlineHeight : 0;
         frame_ = {bounds.left, bounds.top, kMargin, kMargin + headline};
-        picture_.width = (bounds.right - bounds.left) * Frame::kScale + 2 * kMargin;
-        picture_.height = (bounds.bottom - bounds.top) * Frame::kScale + 2 * kMargin + headline;
+        picture_.width = wholePx((bounds.right - bounds.left) * Frame::kScale) + 2 * kMargin;
+        picture_.height = wholePx((bounds.bottom - bounds.top) * Frame::kScale) + 2 * kMargin + headline;
 
         SvgPicture lines;
         const LineStylesUsed styles = appendLines(lines, content_, options_, frame_);
         picture_.lines = std::move(lines.lines);
         const std::string legend = legendFor(styles);
-        openPicture();
-        appendHeadline();
+        openPage(picture_, options_);
         for (PictureBox& stroke : lines.strokes) stroke.start += picture_.svg.size();
         picture_.strokes = std::move(lines.strokes);
         picture_.svg += lines.svg;
         appendBoxes();
-        picture_.svg += legend + "</g>\n</svg>\n";
+        picture_.svg += legend;
+        closePage(picture_);
         return std::move(picture_);
     }
 
 private:
     const DrawingTheme& theme() const { return *options_.theme; }
 
-    void openPicture() {
-        const std::string width = std::to_string(picture_.width);
-        const std::string height = std::to_string(picture_.height);
-        picture_.svg +=
-            "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
-            width + "\" height=\"" + height + "\" viewBox=\"0 0 " + width + " " + height +
-            "\" role=\"group\" aria-label=\"" + escaped(options_.title) + "\">\n<title>" +
-            escaped(options_.title) + "</title>\n";
-        appendBoxDefinitions(picture_.svg);
-        picture_.svg += "<rect width=\"" + width + "\" height=\"" + height + "\" fill=\"" +
-                        std::string(theme().page) + "\"/>\n<g font-family=\"" + std::string(kFontFamilies) +
-                        "\">\n";
-    }
+    // The number of each person with several boxes, and how many those are.
+    struct Repeats {
+        int number = 0;
+        int boxes = 0;
+    };
 
-    void appendHeadline() {
-        if (!options_.headline) return;
-        const Font font{kHeadlineSize, true};
-        const std::string text = fitLine(cleanText(options_.title), font, picture_.width - 2 * kMargin);
-        picture_.svg += "<text x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(kMargin + 12) +
-                        "\" font-weight=\"bold\" font-size=\"" + px(kHeadlineSize) + "\" fill=\"" +
-                        std::string(theme().text) + "\">" + escaped(text) + "</text>\n";
-    }
-
-    // How often each person has a box, and a number for each who has several, in the order of the records.
     void numberRepeats() {
-        for (const LayoutRecord& record : content_.records) {
-            if (!record.addNode) ++boxCount_[record.id];
+        std::unordered_map<std::int64_t, int> boxes;
+        for (const picture::Box& box : content_.picture.boxes) {
+            if (box.kind == picture::BoxKind::person) ++boxes[box.id];
         }
-        for (const LayoutRecord& record : content_.records) {
-            if (record.addNode || boxCount_[record.id] < 2) continue;
-            repeatNumber_.emplace(record.id, static_cast<int>(repeatNumber_.size()) + 1);
+        for (const picture::Mark& mark : content_.picture.marks) {
+            if (mark.kind != picture::MarkKind::samePerson || mark.boxes[0] == picture::kNone) continue;
+            const std::int64_t id = content_.picture.boxes[static_cast<std::size_t>(mark.boxes[0])].id;
+            repeats_.emplace(id, Repeats{mark.number, boxes[id]});
         }
     }
 
     void appendBoxes() {
+        const picture::Picture& picture = content_.picture;
         numberRepeats();
-        if (content_.records.empty()) appendNobody();
-        bool focusSeen = false;
-        for (const LayoutRecord& record : content_.records) {
-            Box box = boxOf(record);
-            box.isFocus = !focusSeen && record.id == content_.focusId;
-            focusSeen = focusSeen || box.isFocus;
-            appendBox(record, box);
+        if (picture.boxes.empty()) appendNobody();
+        const auto marks = boxMarksOf(picture);
+        for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
+            BoxFrame frame = frameOf(picture.boxes[i]);
+            frame.isFocus = picture.focus == static_cast<picture::Index>(i);
+            frame.marks = marks[i];
+            appendBox(frame);
         }
     }
 
@@ -137,40 +131,49 @@ private:
                         std::string(theme().quietText) + "\">Nobody to show</text>\n";
     }
 
-    Box boxOf(const LayoutRecord& record) const {
-        Box box;
-        box.record = &record;
-        box.x = frame_.x(record.x);
-        box.y = frame_.y(record.y);
-        box.width = options_.box.width * Frame::kScale;
-        box.height = options_.box.height * Frame::kScale;
-        const auto repeat = repeatNumber_.find(record.id);
-        if (repeat != repeatNumber_.end()) {
-            box.repeatNumber = repeat->second;
-            box.repeatCount = boxCount_.at(record.id);
+    BoxFrame frameOf(const picture::Box& box) const {
+        BoxFrame frame;
+        frame.box = &box;
+        frame.x = frame_.x(box.x);
+        frame.y = frame_.y(box.y);
+        frame.width = static_cast<double>(box.width) * Frame::kScale;
+        frame.height = static_cast<double>(box.height) * Frame::kScale;
+        frame.countsHidden = content_.countsHidden;
+        const auto repeat = repeats_.find(box.id);
+        if (box.kind == picture::BoxKind::person && repeat != repeats_.end()) {
+            frame.repeatNumber = repeat->second.number;
+            frame.repeatCount = repeat->second.boxes;
         }
-        return box;
+        return frame;
     }
 
-    void appendBox(const LayoutRecord& record, const Box& box) {
+    void appendBox(const BoxFrame& frame) {
         const std::size_t start = picture_.svg.size();
-        if (record.addNode) {
-            appendPlaceholderBox(picture_.svg, box, fullName(content_.labelOf(record.addNode->childId)),
-                                 theme());
+        if (frame.box->kind == picture::BoxKind::unknownParent) {
+            appendPlaceholderBox(picture_.svg, frame, nameOfChild(*frame.box), theme());
         } else {
-            appendPersonBox(picture_.svg, box, content_.labelOf(record.id), theme());
+            appendPersonBox(picture_.svg, frame, content_.labelOf(frame.box->id), theme());
         }
-        picture_.boxes.push_back({{box.x, box.y, box.width, box.height}, start, picture_.svg.size() - start});
+        picture_.boxes.push_back(
+            {{frame.x, frame.y, frame.width, frame.height}, start, picture_.svg.size() - start});
+    }
+
+    std::string nameOfChild(const picture::Box& unknown) const {
+        if (unknown.childOf == picture::kNone) return fullName(PersonLabel());
+        const picture::Box& child = content_.picture.boxes[static_cast<std::size_t>(unknown.childOf)];
+        return fullName(child.kind == picture::BoxKind::person ? content_.labelOf(child.id) : PersonLabel());
     }
 
     // Below the picture, as wide as it needs; tells only what is there.
     std::string legendFor(const LineStylesUsed& styles) {
-        if (!styles.any()) return std::string();
+        std::vector<LineStyle> rows;
+        for (std::size_t i = 1; i < kLineStyles; ++i) {
+            if (styles[i]) rows.push_back(static_cast<LineStyle>(i));
+        }
+        if (rows.empty()) return std::string();
         std::string legend = "<g>\n<title>Legend</title>\n";
         int row = 0;
-        if (styles.divorced) appendLegendLine(legend, row++, LineStyle::divorced, "divorced");
-        if (styles.adopted) appendLegendLine(legend, row++, LineStyle::adopted, "adopted child");
-        if (styles.foster) appendLegendLine(legend, row++, LineStyle::foster, "foster child");
+        for (const LineStyle style : rows) appendLegendLine(legend, row++, style);
         picture_.height += row * kLegendPitch + kLegendGap;
         picture_.width = std::max(picture_.width, kLegendWidth + 2 * kMargin);
         const double height = row * kLegendPitch;
@@ -178,27 +181,55 @@ private:
         return legend + "</g>\n";
     }
 
-    void appendLegendLine(std::string& legend, int row, LineStyle style, const char* meaning) const {
+    void appendLegendLine(std::string& legend, int row, LineStyle style) const {
         const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * row + kLegendPitch / 2;
         legend += "<path d=\"M" + std::to_string(kMargin) + " " + std::to_string(y) + "h" +
                   std::to_string(kLegendStroke) + "\" fill=\"none\" stroke=\"" + std::string(theme().line) +
-                  "\" stroke-width=\"1.6\" stroke-dasharray=\"" + dashesOf(style) + "\"/>\n<text x=\"" +
-                  std::to_string(kMargin + kLegendStroke + 10) + "\" y=\"" + std::to_string(y + 4) +
-                  "\" font-size=\"" + px(kLegendSize) + "\" fill=\"" + std::string(theme().quietText) +
-                  "\">" + meaning + "</text>\n";
+                  "\" stroke-width=\"1.6\" stroke-dasharray=\"" + std::string(dashesOf(style)) +
+                  "\"/>\n<text x=\"" + std::to_string(kMargin + kLegendStroke + 10) + "\" y=\"" +
+                  std::to_string(y + 4) + "\" font-size=\"" + px(kLegendSize) + "\" fill=\"" +
+                  std::string(theme().quietText) + "\">" + std::string(meaningOf(style)) + "</text>\n";
     }
 
     const DrawingContent& content_;
     const DrawingOptions& options_;
     Frame frame_;
     SvgPicture picture_;
-    std::unordered_map<std::int64_t, int> boxCount_;
-    std::unordered_map<std::int64_t, int> repeatNumber_;
+    std::unordered_map<std::int64_t, Repeats> repeats_;
 };
+
+void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
+    if (!options.headline) return;
+    const Font font{kHeadlineSize, true};
+    const std::string text = fitLine(cleanText(options.title), font, picture.width - 2 * kMargin);
+    picture.svg += "<text x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(kMargin + 12) +
+                   "\" font-weight=\"bold\" font-size=\"" + px(kHeadlineSize) + "\" fill=\"" +
+                   std::string(options.theme->text) + "\">" + escaped(text) + "</text>\n";
+}
 
 }  // namespace
 
+void openPage(SvgPicture& picture, const DrawingOptions& options) {
+    const std::string width = std::to_string(picture.width);
+    const std::string height = std::to_string(picture.height);
+    picture.svg +=
+        "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
+        width + "\" height=\"" + height + "\" viewBox=\"0 0 " + width + " " + height +
+        "\" role=\"group\" aria-label=\"" + escaped(options.title) + "\">\n<title>" + escaped(options.title) +
+        "</title>\n";
+    appendBoxDefinitions(picture.svg);
+    picture.svg += "<rect width=\"" + width + "\" height=\"" + height + "\" fill=\"" +
+                   std::string(options.theme->page) + "\"/>\n<g font-family=\"" + std::string(kFontFamilies) +
+                   "\">\n";
+    appendHeadline(picture, options);
+}
+
+void closePage(SvgPicture& picture) {
+    picture.svg += "</g>\n</svg>\n";
+}
+
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options) {
+    if (content.picture.isRound()) return drawFan(content, options);
     return Composer(content, options).compose();
 }
 

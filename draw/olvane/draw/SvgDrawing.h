@@ -9,31 +9,27 @@
 #include <string>
 #include <vector>
 
-#include <olvane/draw/DrawingShape.h>
 #include <olvane/draw/DrawingTheme.h>
 #include <olvane/draw/PersonLabel.h>
-#include <olvane/host/LayoutText.h>
+#include <olvane/picture/Picture.h>
 
 namespace olvane::draw {
 
-// What a picture shows: a layout, and what its host knows of the persons in it.
+// What is drawn: a picture, and what its host knows of the persons and families in it.
 //
-// Holds: the questions are asked for persons of the records and for the children of add-nodes, never for an
-//        add-node, and must give the same answer to the same question. labelOf is required.
+// Holds: the questions are asked for persons and families of the picture, and must give the same answer to the
+//        same question. labelOf is required.
 // Fails: whatever a question throws passes on.
 struct DrawingContent {
-    std::vector<LayoutRecord> records;
-    std::int64_t focusId = 0;
+    picture::Picture picture;
     std::function<PersonLabel(std::int64_t id)> labelOf;
-    // How the person came to its parents; by birth where not set.
-    std::function<ParentLink(std::int64_t id)> parentLinkOf;
-    // The marriage of the two ended by divorce; none did where not set.
-    std::function<bool(std::int64_t id, std::int64_t spouseId)> isDivorced;
+    // What stands at the marriage line of a family that has a number, such as a year; nothing where not set.
+    std::function<std::string(std::uint32_t family)> familyLabelOf;
+    // Whether the picture's numbers of hidden relatives are known; else the boxes' flags are all there is.
+    bool countsHidden = false;
 };
 
 struct DrawingOptions {
-    LineDirection direction = LineDirection::downward;
-    BoxSize box;
     const DrawingTheme* theme = &lightTheme();
     // What the picture is called, for a screen reader. UTF-8, data like every other text.
     std::string title = "Family tree";
@@ -49,7 +45,7 @@ struct PictureArea {
     double height = 0;
 };
 
-// A box or stroke of a picture: where it is to be seen, and which bytes of the text draw it.
+// An element of a picture, a box or the lines of a family: where it is seen, and which bytes draw it.
 struct PictureBox {
     PictureArea area;
     std::size_t start = 0;
@@ -58,9 +54,9 @@ struct PictureBox {
 
 // A finished picture.
 //
-// Units: px, two for each point of the layout.
-// Holds: strokes and boxes come in the order of the text, all strokes before the first box; without the bytes
-//        of some of them the rest is still a picture.
+// Units: px, two for each point of the picture.
+// Holds: strokes, one for each family with lines, and boxes come in the order of the text, all strokes before
+//        the first box; without the bytes of some of them the rest is still a picture.
 struct SvgPicture {
     std::string svg;
     int width = 0;
@@ -74,11 +70,11 @@ struct SvgPicture {
 // A person's name for a sentence; "Living" or "Name not known" where there is none to tell.
 std::string fullName(const PersonLabel& label);
 
-// Draws a layout as SVG: lines below, boxes with names above, a legend where lines of a special kind are
-// used.
+// Draws a picture as SVG: lines below, boxes with names above, marks at their edges, a legend where lines of a
+// special kind are used. A round chart is drawn as rings of cells.
 //
 // Holds: the same content gives the same bytes. Texts stay texts; they are measured and fit into their boxes.
-//        Nothing in a label or title becomes markup. A picture without records is a page that says so.
+//        Nothing in a label or title becomes markup. A picture without boxes is a page that says so.
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options);
 
 }  // namespace olvane::draw

@@ -221,8 +221,8 @@ private:
         return place;
     }
 
-    // The stretches at the ends of a bar that lead to one child alone, who did not come by birth: they are
-    // pieces of their own, so that they can be drawn like the child's stem.
+    // The stretches at the ends of a bar that lead to one child alone: they are pieces of their own, so that they
+    // can be drawn like the child's stem.
     struct ChildEnds {
         Index childLo = kNone;
         Index childHi = kNone;
@@ -232,15 +232,13 @@ private:
 
     std::vector<ChildEnds> childEnds() const {
         std::vector<ChildEnds> ends(plan_.bars.size());
-        const std::vector<bool> ordinary = ordinaryFamilies();
         for (const Vertical& v : plan_.verticals) {
             if (v.isMerged) continue;
             for (const VerticalEnd& end : {v.top, v.bottom}) {
                 if (end.bar == kNone) continue;
                 const Bar& bar = plan_.bars[at(end.bar)];
                 ChildEnds& e = ends[at(end.bar)];
-                const bool isStem =
-                    v.role == LineRole::stem && !ordinary[at(v.family)] && !isOrdinary(v.family, v.child);
+                const bool isStem = v.role == LineRole::stem;
                 if (v.x > bar.lo) e.innerLo = std::min(e.innerLo, v.x);
                 if (v.x < bar.hi) e.innerHi = std::max(e.innerHi, v.x);
                 if (v.x == bar.lo) e.childLo = isStem && e.childLo == kNone ? v.child : kShared;
@@ -250,26 +248,7 @@ private:
         return ends;
     }
 
-    static constexpr Index kShared = -2;  // of several pieces, or of none that is special
-
-    bool isOrdinary(Index family, Index child) const {
-        const Family& f = picture_.families[at(family)];
-        const auto children = picture_.children(f);
-        const auto kinds = picture_.kinds(f);
-        const auto found = std::find(children.begin(), children.end(), child);
-        return kinds[static_cast<std::size_t>(found - children.begin())] == kin::ChildKind::birth;
-    }
-
-    std::vector<bool> ordinaryFamilies() const {
-        std::vector<bool> ordinary;
-        for (const Family& f : picture_.families) {
-            const auto kinds = picture_.kinds(f);
-            ordinary.push_back(std::all_of(kinds.begin(), kinds.end(), [](kin::ChildKind kind) {
-                return kind == kin::ChildKind::birth;
-            }));
-        }
-        return ordinary;
-    }
+    static constexpr Index kShared = -2;  // of several pieces, or of none of a child
 
     void addBar(const Bar& bar, const ChildEnds& ends) {
         barPieces_.emplace_back(static_cast<Index>(pieces_.size()), 0);
@@ -280,11 +259,11 @@ private:
             addPiece(bar.family, {x1, bar.y, x2, bar.y, child, 0, 0, bar.role});
             ++barPieces_.back().second;
         };
-        if (ends.childLo >= 0 && ends.innerLo < hi) {
+        if (ends.childLo >= 0 && ends.innerLo <= hi) {
             add(lo, ends.innerLo, ends.childLo);
             lo = ends.innerLo;
         }
-        const bool splitsHi = ends.childHi >= 0 && ends.innerHi > lo;
+        const bool splitsHi = ends.childHi >= 0 && ends.innerHi >= lo && lo < hi;
         if (splitsHi) hi = ends.innerHi;
         if (lo < hi) add(lo, hi, kNone);
         if (splitsHi) add(hi, bar.hi, ends.childHi);

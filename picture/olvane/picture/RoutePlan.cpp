@@ -360,12 +360,24 @@ private:
         takenSides_.take(sideLane(r, gap), *y, kNone);
         plan_.rowPieces.push_back({net.family, static_cast<Index>(r), *y, left.x2, right.x1});
         if (!x) return true;
+        straighten(net.family, *x, channel);
         taken_.take(rowLane(r), *x, net.family);
         taken_.take(channelLane(channel), *x, net.family);
         const Index bar = addBar(net, channel, LineRole::bar);
         addVertical({net.family, kNone, LineRole::drop, *x, atRow(static_cast<Index>(r), *y), onBar(bar)});
         net.x = *x;
         return true;
+    }
+
+    // An only child who is nearly below the drop gets its stem right below: better off the middle of the box than
+    // with a slight bend.
+    void straighten(Index f, double x, std::size_t channel) {
+        if (stemsOf(f).size() != 1) return;
+        Stem& stem = stems_[firstStem_[at(f)]];
+        const Rect& box = rows_.rect(stem.child);
+        const bool isNear =
+            std::abs(stem.x - x) <= kPortPitch && x > box.x1 + kPortInset && x < box.x2 - kPortInset;
+        if (isNear && rows_.row(stem.child) == channel) stem.x = x;
     }
 
     // A place beside a box from which a line leads up to the channel above, and down to the one below where

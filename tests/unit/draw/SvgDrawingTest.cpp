@@ -8,9 +8,13 @@
 
 #include <map>
 #include <regex>
+#include <stdexcept>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include <olvane/draw/SvgDrawing.h>
+#include <olvane/picture/LineRouter.h>
 
 namespace olvane::draw {
 namespace {
@@ -26,7 +30,7 @@ PersonLabel label(const std::string& given, const std::string& surname, LabelSex
     return result;
 }
 
-// A couple with two children and an add-node, drawn with labels that a test may change.
+// A couple with two children and an unknown parent, drawn with labels that a test may change.
 class Picture : public testing::Test {
 protected:
     Picture() {
@@ -36,11 +40,65 @@ protected:
         labels_[2] = label("Ada", "Lund", LabelSex::female);
         labels_[3] = label("Olga", "Berg", LabelSex::female);
         labels_[4] = label("Nils", "Berg", LabelSex::other);
-        content_.records = readLayoutText(
-            "1:0:0:0:55,40,80,40|;-1:0:-110:0:27,-30,27,-15|:M:1;2:80:0:0:67,40,67,95|67,40,67,95|;"
-            "3:0:110:0:27,95,67,95|27,110,27,95|;4:80:110:1:107,95,67,95|107,110,107,95|;");
-        content_.focusId = 1;
+        addBox(1, 0, 0);
+        addBox(0, 0, -110);
+        addBox(2, 80, 0);
+        addBox(3, 0, 110);
+        addBox(4, 80, 110);
+        boxOf(0).kind = picture::BoxKind::unknownParent;
+        boxOf(0).sex = kin::Sex::male;
+        boxOf(0).childOf = 0;
+        boxOf(4).flag = true;
+        addFamily({0, 2}, {3, 4});
+        addFamily({1}, {0});
+        content_.picture.focus = 0;
+        picture::routeLines(content_.picture);
         content_.labelOf = [this](std::int64_t id) { return labels_.at(id); };
+    }
+
+    picture::Box& boxOf(std::int64_t id) {
+        for (picture::Box& box : content_.picture.boxes) {
+            if (box.id == id) return box;
+        }
+        throw std::out_of_range("no box");
+    }
+
+    void addBox(std::int64_t id, double x, double y) {
+        picture::Box box;
+        box.id = id;
+        box.x = x;
+        box.y = y;
+        box.width = 55;
+        box.height = 80;
+        box.hasFlag = true;
+        content_.picture.boxes.push_back(box);
+    }
+
+    // Members by their places in boxes.
+    void addFamily(const std::vector<picture::Index>& parents, const std::vector<picture::Index>& children) {
+        picture::Picture& picture = content_.picture;
+        picture::Family family;
+        family.firstMember = static_cast<std::uint32_t>(picture.members.size());
+        family.parentCount = static_cast<std::uint8_t>(parents.size());
+        family.childCount = static_cast<std::uint32_t>(children.size());
+        family.number = static_cast<std::uint32_t>(picture.families.size()) + 1;
+        picture.members.insert(picture.members.end(), parents.begin(), parents.end());
+        picture.members.insert(picture.members.end(), children.begin(), children.end());
+        picture.childKinds.resize(picture.members.size());
+        picture.families.push_back(family);
+    }
+
+    // A second box of a person, with the mark for both.
+    void repeat(std::int64_t id, picture::Index first) {
+        addBox(id, 400, 0);
+        const auto second = static_cast<picture::Index>(content_.picture.boxes.size()) - 1;
+        content_.picture.marks.push_back({{first, second, picture::kNone}, 1, picture::MarkKind::samePerson});
+    }
+
+    // Of the children of the couple.
+    void setKinds(kin::ChildKind first, kin::ChildKind second) {
+        content_.picture.childKinds[2] = first;
+        content_.picture.childKinds[3] = second;
     }
 
     std::string draw() const { return drawSvg(content_, options_).svg; }
@@ -74,7 +132,7 @@ TEST_F(Picture, everyBoxHasATitleForScreenReaders) {
     EXPECT_THAT(svg, HasSubstr("<title>Family tree</title>"));
 }
 
-TEST_F(Picture, addNodeInvitesInADashedBox) {
+TEST_F(Picture, unknownParentInvitesInADashedBox) {
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr(">add father</text>"));
     EXPECT_THAT(svg, HasSubstr("<title>add father of Karl Berg</title>"));
@@ -90,7 +148,10 @@ TEST_F(Picture, onlyAFlaggedPersonCarriesTheMark) {
 }
 
 TEST_F(Picture, markCountsWhatIsNotShown) {
-    labels_[4].hidden = HiddenRelatives{2, 1, 3};
+    content_.countsHidden = true;
+    boxOf(4).hiddenParents = 2;
+    boxOf(4).hiddenPartners = 1;
+    boxOf(4).hiddenChildren = 3;
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr(">+6</text>"));
     EXPECT_THAT(svg, HasSubstr("Not shown: 2 parents, 1 spouse, 3 children"));
@@ -103,8 +164,17 @@ TEST_F(Picture, sexIsToldByTheSilhouetteToo) {
     EXPECT_EQ(countOf(svg, "href=\"#olvane-person\""), 1u);
 }
 
-TEST_F(Picture, repeatedSegmentsAreDrawnOnce) {
-    EXPECT_EQ(countOf(draw(), "M162 "), 1u);  // the drop at x 67: (67 - 0) * 2 + 28
+TEST_F(Picture, eachFamilyIsAnElementOfItsOwn) {
+    const SvgPicture drawn = drawSvg(content_, options_);
+    ASSERT_EQ(drawn.strokes.size(), 2u);
+    for (const PictureBox& stroke : drawn.strokes) {
+        const std::string text = drawn.svg.substr(stroke.start, stroke.length);
+        EXPECT_TRUE(text.starts_with("<g><path")) << text;
+        EXPECT_TRUE(text.ends_with("</g>\n")) << text;
+        EXPECT_LT(stroke.start, drawn.boxes.front().start);
+    }
+    EXPECT_THAT(drawn.svg.substr(drawn.strokes[0].start, drawn.strokes[0].length), HasSubstr("M138 328H188"))
+        << "the marriage line, from 55 to 80 at y 40: (x - 0) * 2 + 28, (y + 110) * 2 + 28";
 }
 
 TEST_F(Picture, linesComeBeforeBoxesAndBoxesAreOpaque) {
@@ -130,11 +200,14 @@ TEST_F(Picture, markupInNamesStaysText) {
 TEST_F(Picture, livingPersonLeavesNoTrace) {
     labels_[2].birth = "1990";
     labels_[2].living = true;
-    labels_[2].hidden = HiddenRelatives{0, 0, 7};
+    content_.countsHidden = true;
+    boxOf(2).flag = true;
+    boxOf(2).hiddenChildren = 7;
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr(">Living</text>"));
-    EXPECT_THAT(svg, HasSubstr("<title>Living</title>"));
-    for (const char* trace : {"Ada", "Lund", "1990"}) EXPECT_THAT(svg, Not(HasSubstr(trace)));
+    EXPECT_THAT(svg, HasSubstr("<title>Living. Has relatives who are not shown</title>"));
+    for (const char* trace : {"Ada", "Lund", "1990", "+7", "7 children"})
+        EXPECT_THAT(svg, Not(HasSubstr(trace)));
 }
 
 TEST_F(Picture, placeholderOfALivingPersonDoesNotNameThem) {
@@ -145,48 +218,85 @@ TEST_F(Picture, placeholderOfALivingPersonDoesNotNameThem) {
 }
 
 TEST_F(Picture, personInSeveralBoxesCarriesANumberInEach) {
-    content_.records.push_back(content_.records[3]);
-    content_.records.back().x = 400;
+    repeat(3, 3);
     const std::string svg = draw();
     EXPECT_EQ(countOf(svg, ">=1</text>"), 2u);
     EXPECT_THAT(svg, HasSubstr("Stands in 2 boxes, all marked 1"));
 }
 
 TEST_F(Picture, secondBoxOfTheFocusIsNotDrawnAsFocus) {
-    content_.records.push_back(content_.records[0]);
-    content_.records.back().x = 400;
+    repeat(1, 0);
     EXPECT_EQ(countOf(draw(), std::string(lightTheme().focus)), 2u);
 }
 
 TEST_F(Picture, legendAppearsOnlyWhenAStyleIsUsed) {
     EXPECT_THAT(draw(), Not(HasSubstr("Legend")));
-    content_.isDivorced = [](std::int64_t, std::int64_t) { return true; };
+    content_.picture.families[0].style = kin::UnionState::divorced;
     EXPECT_THAT(draw(), HasSubstr(">divorced</text>"));
     EXPECT_THAT(draw(), Not(HasSubstr("adopted")));
 }
 
 TEST_F(Picture, adoptedAndFosterChildrenHaveLinesOfTheirOwn) {
-    content_.parentLinkOf = [](std::int64_t id) {
-        return id == 3 ? ParentLink::adopted : ParentLink::foster;
-    };
+    setKinds(kin::ChildKind::adopted, kin::ChildKind::foster);
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr(">adopted child</text>"));
     EXPECT_THAT(svg, HasSubstr(">foster child</text>"));
     EXPECT_EQ(countOf(svg, "stroke-dasharray=\"2 4\""), 2u);  // the line and the legend
 }
 
-TEST_F(Picture, styledChildrenShareAPlainTrunk) {
-    // Both children are on the left; the near one's way along the trunk serves the far one too.
-    content_.records = readLayoutText(
-        "1:200:0:0:227,80,227,95|;3:0:110:0:27,95,227,95|27,110,27,95|;4:80:110:0:107,95,227,95|107,110,107,"
-        "95|;");
-    content_.parentLinkOf = [](std::int64_t id) {
-        return id == 3 ? ParentLink::adopted : ParentLink::foster;
-    };
+TEST_F(Picture, everyKindAndStateHasDashesOfItsOwn) {
+    setKinds(kin::ChildKind::step, kin::ChildKind::sealing);
+    content_.picture.families[0].style = kin::UnionState::unmarried;
     const std::string svg = draw();
-    EXPECT_THAT(svg, HasSubstr("M242 218H482"));      // plain, from the near child to the joint
-    EXPECT_THAT(svg, HasSubstr("M242 218H82V248"));   // the far child's own
-    EXPECT_THAT(svg, HasSubstr("M242 218H242V248"));  // the near child's own
+    for (const char* meaning : {"step child", "sealed child", "not married"}) {
+        EXPECT_THAT(svg, HasSubstr(">" + std::string(meaning) + "</text>"));
+    }
+}
+
+TEST_F(Picture, aLabelStandsAtTheMarriageLine) {
+    EXPECT_THAT(draw(), Not(HasSubstr(">1839</text>")));
+    content_.familyLabelOf = [](std::uint32_t family) { return family == 1 ? "1839" : ""; };
+    EXPECT_EQ(countOf(draw(), ">1839</text>"), 1u);
+}
+
+TEST_F(Picture, detailsStandBelowTheYears) {
+    labels_[1].details = {"* Uppsala", "\xE2\x80\xA0 Bergen", "smith"};
+    const std::string svg = draw();
+    EXPECT_LT(svg.find("* 1801"), svg.find(">* Uppsala</text>"));
+    EXPECT_LT(svg.find(">* Uppsala</text>"), svg.find(">smith</text>"));
+    labels_[1].living = true;
+    EXPECT_THAT(draw(), Not(HasSubstr("Uppsala")));
+}
+
+// The child of the second family is drawn elsewhere: the same number at it and at its parent.
+TEST_F(Picture, whatIsElsewhereHasANumberAtBothEnds) {
+    content_.picture.marks.push_back({{4, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
+    content_.picture.marks.push_back({{0, 3, picture::kNone}, 8, picture::MarkKind::partnersElsewhere});
+    const std::string svg = draw();
+    EXPECT_EQ(countOf(svg,
+                      ">\xE2\x86\x91"
+                      "7</text>"),
+              1u);
+    EXPECT_EQ(countOf(svg,
+                      ">\xE2\x86\x93"
+                      "7</text>"),
+              1u);
+    EXPECT_EQ(countOf(svg,
+                      ">\xE2\x86\x94"
+                      "8</text>"),
+              2u);
+}
+
+TEST_F(Picture, manyMarksOfOneBoxAreCounted) {
+    for (int i = 1; i <= 9; ++i) {
+        content_.picture.marks.push_back({{4, 2, picture::kNone}, i, picture::MarkKind::parentsElsewhere});
+    }
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr(">\xE2\x86\x91"
+                               "2</text>"));
+    EXPECT_THAT(svg, Not(HasSubstr(">\xE2\x86\x91"
+                                   "3</text>")));
+    EXPECT_EQ(countOf(svg, ">+7</text>"), 2u) << "at the child and at the parent";
 }
 
 TEST_F(Picture, nameNotKnownIsAQuestionMark) {
@@ -234,21 +344,8 @@ TEST_F(Picture, boxesTellWhereTheyAreInPictureAndText) {
     EXPECT_THAT(text, HasSubstr(">Karl</text>"));
 }
 
-TEST_F(Picture, strokesTellTheirBytesOfThePaths) {
-    const SvgPicture picture = drawSvg(content_, options_);
-    ASSERT_FALSE(picture.strokes.empty());
-    for (const PictureBox& stroke : picture.strokes) {
-        const std::string text = picture.svg.substr(stroke.start, stroke.length);
-        EXPECT_EQ(text.find_first_not_of("MHV0123456789. "), std::string::npos) << text;
-        EXPECT_EQ(text.rfind('M'), 0u) << text;
-        const char behind = picture.svg[stroke.start + stroke.length];
-        EXPECT_TRUE(behind == 'M' || behind == '"') << behind;
-        EXPECT_LT(stroke.start, picture.boxes.front().start);
-    }
-}
-
 TEST_F(Picture, emptyLayoutIsAPageThatSaysSo) {
-    content_.records.clear();
+    content_.picture = picture::Picture();
     EXPECT_THAT(draw(), HasSubstr(">Nobody to show</text>"));
 }
 
@@ -256,12 +353,66 @@ TEST_F(Picture, numbersArePlain) {
     EXPECT_FALSE(std::regex_search(draw(), std::regex("(nan|inf|e[-+][0-9])\"")));
 }
 
-TEST_F(Picture, crossingOfTwoFamiliesLeavesAGap) {
-    // A second family's drop comes down through the first one's trunk.
-    content_.records = readLayoutText(
-        "1:0:0:0:27,80,27,87|;2:80:0:0:107,80,107,95|;3:160:110:0:187,87,27,87|187,110,187,87|;"
-        "4:80:110:0:107,95,107,95|107,110,107,95|;");
-    EXPECT_EQ(countOf(draw(), "stroke=\"" + std::string(lightTheme().page) + "\" stroke-width=\"8\""), 1u);
+// A parent at the left whose child is at the right, and the other way round.
+TEST_F(Picture, aLineThatCrossesAnotherFamilyJumpsOverIt) {
+    content_.picture = picture::Picture();
+    addBox(1, 0, 0);
+    addBox(2, 200, 0);
+    addBox(3, 200, 110);
+    addBox(4, 0, 110);
+    addFamily({0}, {2});
+    addFamily({1}, {3});
+    picture::routeLines(content_.picture);
+    EXPECT_EQ(countOf(draw(), "a4 4 0 0 1 4 -4a4 4 0 0 1 4 4H"), 1u);
+}
+
+// Two rings around the focus; the outer cells belong to the lines of the inner ones.
+class Fan : public Picture {
+protected:
+    Fan() {
+        content_.picture = picture::Picture();
+        const std::pair<double, double> cells[] = {{0, 360}, {-90, 0}, {0, 90}, {-90, -45}};
+        for (std::int64_t id = 1; id <= 4; ++id) {
+            addBox(id, 0, 0);
+            const auto& [from, to] = cells[id - 1];
+            content_.picture.arcs.push_back({id == 1   ? 0
+                                             : id == 4 ? 2
+                                                       : 1,
+                                             from, to, id == 4 ? 1 : picture::kNone});
+        }
+        content_.picture.ringRadii = {0, 40, 95, 150};
+        for (picture::Box& box : content_.picture.boxes) {
+            box.x = -150;
+            box.y = -150;
+            box.width = 300;
+            box.height = 300;
+        }
+        content_.picture.focus = 0;
+    }
+};
+
+TEST_F(Fan, eachBoxIsACellWithItsName) {
+    const SvgPicture drawn = drawSvg(content_, options_);
+    ASSERT_EQ(drawn.boxes.size(), 4u);
+    for (const char* name : {">Karl</text>", ">Ada</text>", ">Olga</text>"})
+        EXPECT_THAT(drawn.svg, HasSubstr(name));
+    EXPECT_EQ(countOf(drawn.svg, "(focus of this picture)"), 1u);
+    EXPECT_THAT(drawn.svg, Not(HasSubstr("textPath"))) << "some renderers have none";
+}
+
+TEST_F(Fan, linesOfDescentHaveColoursThatTheLegendNames) {
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr("<title>Legend</title>"));
+    EXPECT_THAT(svg, HasSubstr(">Ada Lund</text>"));
+    EXPECT_EQ(countOf(svg, "fill=\"#dbe9f6\""), 3u) << "two cells and the legend";
+}
+
+TEST_F(Fan, aNameThatHasNoRoomIsShortenedOrLeftToTheTitle) {
+    content_.picture.arcs[3].to = -89;
+    labels_[4] = label("Maximilian Alexander Theodor", "von und zu Hohenberg");
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr("<title>Maximilian Alexander Theodor von und zu Hohenberg"));
+    EXPECT_THAT(svg, Not(HasSubstr(">Maximilian Alexander Theodor von und zu Hohenberg</text>")));
 }
 
 }  // namespace

@@ -148,9 +148,17 @@ TEST(LineRouter, siblingsHangFromOneBar) {
     const Index c = addBox(picture, 160, 110);
     addFamily(picture, {father}, {a, b, c});
     routeLines(picture);
+    // The bar in two pieces, each of the child at its end.
     EXPECT_THAT(rolesOf(picture, 0),
-                testing::UnorderedElementsAre(LineRole::drop, LineRole::bar, LineRole::stem, LineRole::stem,
-                                              LineRole::stem));
+                testing::UnorderedElementsAre(LineRole::drop, LineRole::bar, LineRole::bar, LineRole::stem,
+                                              LineRole::stem, LineRole::stem));
+    double y = 0;
+    for (const Line& line : picture.lines) {
+        if (line.role != LineRole::bar) continue;
+        EXPECT_TRUE(line.child == a || line.child == c);
+        EXPECT_TRUE(y == 0 || y == line.y1);
+        y = line.y1;
+    }
     EXPECT_EQ(faultsOf(judge(picture)), 0u);
 }
 
@@ -209,13 +217,12 @@ TEST(LineRouter, barsStandInTheOrderOfFewestCrossings) {
     EXPECT_EQ(judge(picture).crossings, 0u);
 }
 
-TEST(LineRouter, anAdoptedChildAtTheEndHasAPieceOfTheBarOfItsOwn) {
+TEST(LineRouter, aChildAtTheEndHasAPieceOfTheBarOfItsOwn) {
     Picture picture;
     const Index father = addBox(picture, 80, 0);
     const Index a = addBox(picture, 0, 110);
     const Index b = addBox(picture, 160, 110);
     addFamily(picture, {father}, {a, b});
-    picture.childKinds = {kin::ChildKind::birth, kin::ChildKind::birth, kin::ChildKind::adopted};
     routeLines(picture);
     const auto lines = picture.linesOf(picture.families[0]);
     const auto own = std::count_if(lines.begin(), lines.end(), [b](const Line& line) {
@@ -294,4 +301,19 @@ TEST(LineRouter, randomFamiliesAreDrawnWithoutAFaultInEveryDirection) {
         }
     }
     EXPECT_LT(marks, families / 100) << "marks are for what finds no place";
+}
+
+// The second wife's line takes the middle of the space beside the man, so the first one's drop stands aside.
+TEST(LineRouter, anOnlyChildNearlyBelowHasAStraightLine) {
+    Picture picture;
+    const Index man = addBox(picture, 0, 0);
+    const Index first = addBox(picture, 80, 0);
+    const Index second = addBox(picture, 160, 0);
+    const Index child = addBox(picture, 40, 110);
+    addFamily(picture, {man, first}, {child});
+    addFamily(picture, {man, second}, {});
+    routeLines(picture);
+    EXPECT_THAT(rolesOf(picture, 0), testing::ElementsAre(LineRole::marriage, LineRole::stem));
+    EXPECT_NE(picture.lines[1].x1, 67.5);
+    EXPECT_EQ(faultsOf(judge(picture)), 0u);
 }

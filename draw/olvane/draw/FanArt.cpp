@@ -1,0 +1,359 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A straight line of text across a cell has to stay within the ring: at radius r its corners reach out to
+// sqrt(r^2 + (width / 2)^2), and the sides of the cell close in towards the middle. Text along the radius has
+// the depth of the ring. Renderers differ in text on paths, and some have none, so no path is asked for.
+
+#include <olvane/draw/FanArtInternal.h>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <vector>
+
+#include <olvane/draw/LineArtInternal.h>
+#include <olvane/draw/MarkArtInternal.h>
+#include <olvane/draw/SvgTextInternal.h>
+#include <olvane/draw/TextFitInternal.h>
+#include <olvane/picture/Circle.h>
+
+namespace olvane::draw {
+
+namespace {
+
+using picture::Arc;
+using picture::Index;
+
+// All in px.
+constexpr int kMargin = 28;
+constexpr int kHeadlineHeight = 40;
+constexpr double kPad = 4;
+constexpr double kBorder = 1;
+constexpr double kFocusBorder = 4;
+constexpr double kLargestName = 13;
+constexpr double kLeastName = 6;
+constexpr double kLeastAcross = 44;   // less room than this across a cell, and the name follows the radius
+constexpr double kYearsShare = 0.85;  // of the size of names
+constexpr int kLegendPitch = 22;
+constexpr double kLegendSize = 11.5;
+
+// Fills for lines of descent, dark text on light and light text on dark pages, all with a contrast of 4.5.
+constexpr auto kLightFills = std::to_array<std::string_view>(
+    {"#dbe9f6", "#fde3c8", "#dcefd3", "#f6d9e0", "#e6def2", "#f4edc4", "#d3eeec", "#e9e4dd"});
+constexpr auto kDarkFills = std::to_array<std::string_view>(
+    {"#24405c", "#5a3d1f", "#2b4a26", "#5a2b3a", "#40325a", "#4d4719", "#1f4a48", "#453f37"});
+
+bool isDark(std::string_view colour) {
+    return colour.size() == 7 && colour[1] < '8';
+}
+
+struct TextLine {
+    std::string text;
+    bool bold = false;
+};
+
+class FanDrawer {
+public:
+    FanDrawer(const DrawingContent& content, const DrawingOptions& options)
+        : content_(content), fan_(content.picture), options_(options) {}
+
+    SvgPicture draw() {
+        placeFrame();
+        listLines();
+        const std::string legend = legendText();
+        openPage(svg_, options_);
+        const auto marks = boxMarksOf(fan_);
+        for (std::size_t i = 0; i < fan_.boxes.size(); ++i) appendCell(i, marks[i]);
+        if (!fan_.lines.empty()) appendLinks();
+        svg_.svg += legend;
+        closePage(svg_);
+        return std::move(svg_);
+    }
+
+private:
+    const DrawingTheme& theme() const { return *options_.theme; }
+
+    void placeFrame() {
+        double left = fan_.boxes[0].x, top = fan_.boxes[0].y, right = left, bottom = top;
+        for (const picture::Box& box : fan_.boxes) {
+            left = std::min(left, box.x);
+            top = std::min(top, box.y);
+            right = std::max(right, box.x + static_cast<double>(box.width));
+            bottom = std::max(bottom, box.y + static_cast<double>(box.height));
+        }
+        const int headline = options_.headline ? kHeadlineHeight : 0;
+        frame_ = {left, top, kMargin, kMargin + headline};
+        svg_.width = static_cast<int>(std::ceil(std::min(1e9, (right - left) * Frame::kScale))) + 2 * kMargin;
+        svg_.height = static_cast<int>(std::ceil(std::min(1e9, (bottom - top) * Frame::kScale))) +
+                      2 * kMargin + headline;
+        middleX_ = frame_.x(fan_.middleX);
+        middleY_ = frame_.y(fan_.middleY);
+    }
+
+    // The boxes at which lines of descent begin, in the order of the boxes.
+    void listLines() {
+        for (const Arc& arc : fan_.arcs) {
+            if (arc.line != picture::kNone) lines_.push_back(arc.line);
+        }
+        std::sort(lines_.begin(), lines_.end());
+        lines_.erase(std::unique(lines_.begin(), lines_.end()), lines_.end());
+    }
+
+    std::string_view fillOf(std::size_t i) const {
+        const Index own = fan_.arcs[i].line;
+        const Index line = own == picture::kNone ? static_cast<Index>(i) : own;
+        const auto found = std::lower_bound(lines_.begin(), lines_.end(), line);
+        if (found == lines_.end() || *found != line) return coloursOf(i).fill;
+        const auto place = static_cast<std::size_t>(found - lines_.begin());
+        return isDark(theme().page) ? kDarkFills[place % kDarkFills.size()]
+                                    : kLightFills[place % kLightFills.size()];
+    }
+
+    const BoxColours& coloursOf(std::size_t i) const {
+        switch (fan_.boxes[i].sex) {
+            case kin::Sex::male:
+                return theme().coloursOf(LabelSex::male);
+            case kin::Sex::female:
+                return theme().coloursOf(LabelSex::female);
+            case kin::Sex::unknown:
+                break;
+        }
+        return theme().coloursOf(LabelSex::other);
+    }
+
+    double innerOf(std::size_t i) const { return radius(fan_.arcs[i].ring); }
+    double outerOf(std::size_t i) const { return radius(fan_.arcs[i].ring + 1); }
+    double radius(std::int32_t ring) const {
+        const auto r = static_cast<std::size_t>(std::max(0, ring));
+        return r < fan_.ringRadii.size() ? fan_.ringRadii[r] * Frame::kScale : 0;
+    }
+
+    std::string point(double degrees, double r) const {
+        const picture::CirclePoint p = picture::onCircle(degrees, r);
+        return px(middleX_ + p.x) + " " + px(middleY_ + p.y);
+    }
+
+    std::string arcTo(double r, double span, double end, bool clockwise) const {
+        return "A" + px(r) + " " + px(r) + " 0 " + (span > 180 ? "1 " : "0 ") + (clockwise ? "1 " : "0 ") +
+               point(end, r);
+    }
+
+    std::string shapeOf(std::size_t i) const {
+        const Arc& arc = fan_.arcs[i];
+        const double r0 = innerOf(i);
+        const double r1 = outerOf(i);
+        const double span = arc.to - arc.from;
+        if (span >= 360) return ringShape(r0, r1);
+        std::string d = "M" + point(arc.from, r1) + arcTo(r1, span, arc.to, true);
+        if (r0 > 0) {
+            d += "L" + point(arc.to, r0) + arcTo(r0, span, arc.from, false);
+        } else {
+            d += "L" + px(middleX_) + " " + px(middleY_);
+        }
+        return d + "Z";
+    }
+
+    std::string ringShape(double r0, double r1) const {
+        std::string d = "M" + point(0, r1) + arcTo(r1, 180, 180, true) + arcTo(r1, 180, 360, true) + "Z";
+        if (r0 > 0) d += "M" + point(0, r0) + arcTo(r0, 180, 180, false) + arcTo(r0, 180, 360, false) + "Z";
+        return d;
+    }
+
+    void appendCell(std::size_t i, const std::vector<BoxMark>& marks) {
+        const picture::Box& box = fan_.boxes[i];
+        const bool isFocus = fan_.focus == static_cast<Index>(i);
+        const PersonLabel label =
+            box.kind == picture::BoxKind::person ? content_.labelOf(box.id) : PersonLabel();
+        const std::size_t start = svg_.svg.size();
+        svg_.svg += "<g role=\"img\"><title>" + escaped(titleOf(label, isFocus, marks)) +
+                    "</title>\n<path d=\"" + shapeOf(i) + "\" fill=\"" + std::string(fillOf(i)) +
+                    "\" stroke=\"" + std::string(isFocus ? theme().focus : coloursOf(i).border) +
+                    "\" stroke-width=\"" + px(isFocus ? kFocusBorder : kBorder) + "\"/>\n";
+        appendTexts(i, textOf(label, marks));
+        svg_.svg += "</g>\n";
+        const PictureArea area{frame_.x(box.x), frame_.y(box.y),
+                               static_cast<double>(box.width) * Frame::kScale,
+                               static_cast<double>(box.height) * Frame::kScale};
+        svg_.boxes.push_back({area, start, svg_.svg.size() - start});
+    }
+
+    static std::string yearsOf(const PersonLabel& label) {
+        std::string years;
+        if (label.living) return years;
+        if (!label.birth.empty()) years = "* " + cleanText(label.birth);
+        if (!label.death.empty())
+            years += (years.empty() ? "" : "  ") + ("\xE2\x80\xA0 " + cleanText(label.death));
+        return years;
+    }
+
+    static std::string titleOf(const PersonLabel& label, bool isFocus, const std::vector<BoxMark>& marks) {
+        std::string title = fullName(label);
+        const std::string years = yearsOf(label);
+        if (!years.empty()) title += ", " + years;
+        if (isFocus) title += " (focus of this picture)";
+        for (const BoxMark& mark : marks) title += ". " + mark.title;
+        return title;
+    }
+
+    // Names as two lines, years with the signs of marks as the third.
+    static std::vector<TextLine> textOf(const PersonLabel& label, const std::vector<BoxMark>& marks) {
+        std::vector<TextLine> lines;
+        if (label.living) {
+            lines.push_back({"Living", true});
+        } else {
+            const std::string& first = label.surnameFirst ? label.surname : label.given;
+            const std::string& second = label.surnameFirst ? label.given : label.surname;
+            if (!first.empty()) lines.push_back({cleanText(first), true});
+            if (!second.empty()) lines.push_back({cleanText(second), true});
+            if (lines.empty()) lines.push_back({"?", true});
+        }
+        std::string facts = yearsOf(label);
+        for (const BoxMark& mark : marks) facts += (facts.empty() ? "" : " ") + mark.text;
+        if (!facts.empty()) lines.push_back({facts, false});
+        return lines;
+    }
+
+    void appendTexts(std::size_t i, const std::vector<TextLine>& lines) {
+        if (fan_.arcs[i].ring == 0) return appendMiddle(i, lines);
+        const double depth = outerOf(i) - innerOf(i) - 2 * kPad;
+        const double middle = (innerOf(i) + outerOf(i)) / 2;
+        const bool across = roomAcross(i, middle, kLargestName) >= std::min(kLeastAcross, depth);
+        if (across) {
+            appendAcross(i, lines, depth);
+        } else {
+            appendAlong(i, lines, depth);
+        }
+    }
+
+    // The width of a line of text of that height at that radius.
+    double roomAcross(std::size_t i, double r, double height) const {
+        const double outer = outerOf(i) - kPad;
+        const double reach = r + height / 2;
+        if (reach >= outer) return 0;
+        double room = 2 * std::sqrt(outer * outer - reach * reach);
+        const double span = fan_.arcs[i].to - fan_.arcs[i].from;
+        if (span < 170) {
+            const double half = span / 2;
+            const double slope = picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
+            room = std::min(room, 2 * ((r - height / 2) * slope - kPad));
+        }
+        return std::max(0.0, room);
+    }
+
+    void appendMiddle(std::size_t i, const std::vector<TextLine>& lines) {
+        const double r = outerOf(i) - kPad;
+        const double size = kLargestName;
+        const double pitch = size + 3;
+        double y = -pitch * (static_cast<double>(lines.size()) - 1) / 2;
+        for (const TextLine& line : lines) {
+            const double reach = std::abs(y) + size / 2;
+            const double room = reach < r ? 2 * std::sqrt(r * r - reach * reach) : 0;
+            const double used = line.bold ? size : size * kYearsShare;
+            appendLine(fitLine(line.text, {used, line.bold}, room), line.bold, used, middleX_, middleY_ + y,
+                       0, "middle");
+            y += pitch;
+        }
+    }
+
+    // One below the other as it is read; in the lower half of the circle that is from the inside out.
+    void appendAcross(std::size_t i, const std::vector<TextLine>& lines, double depth) {
+        const double angle = (fan_.arcs[i].from + fan_.arcs[i].to) / 2;
+        const bool below = picture::sineOfDegrees(angle + 90) < -1e-9;
+        const auto count = static_cast<double>(lines.size());
+        const double size = std::clamp(depth / count - 3, kLeastName, kLargestName);
+        const double pitch = size + 3;
+        const double middle = (innerOf(i) + outerOf(i)) / 2 - 2;
+        double offset = -pitch * (count - 1) / 2;
+        for (const TextLine& line : lines) {
+            const double r = below ? middle + offset : middle - offset;
+            const double used = line.bold ? size : size * kYearsShare;
+            const picture::CirclePoint p = picture::onCircle(angle, r);
+            appendLine(fitLine(line.text, {used, line.bold}, roomAcross(i, r, used)), line.bold, used,
+                       middleX_ + p.x, middleY_ + p.y, below ? angle + 180 : angle, "middle");
+            offset += pitch;
+        }
+    }
+
+    // Along the radius, read from the left: names in one line, years behind them or below.
+    void appendAlong(std::size_t i, const std::vector<TextLine>& lines, double depth) {
+        const Arc& arc = fan_.arcs[i];
+        const double angle = (arc.from + arc.to) / 2;
+        const bool onTheRight = picture::sineOfDegrees(angle) >= -1e-9;
+        const double half = std::min(89.0, (arc.to - arc.from) / 2);
+        const double breadth =
+            2 * (innerOf(i) + kPad) * picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
+        std::string names;
+        std::string facts;
+        for (const TextLine& line : lines) {
+            std::string& text = line.bold ? names : facts;
+            text += (text.empty() ? "" : " ") + line.text;
+        }
+        const bool twoLines = !facts.empty() && breadth >= 2 * (kLeastName + 3);
+        const double size = std::min(kLargestName, (twoLines ? breadth / 2 : breadth) - 2);
+        if (size < kLeastName) return;
+        const auto append = [&](const std::string& text, bool bold, double used, double shift) {
+            const picture::CirclePoint p = picture::onCircle(angle, (innerOf(i) + outerOf(i)) / 2);
+            const picture::CirclePoint side = picture::onCircle(angle + (onTheRight ? 90 : -90), shift);
+            appendLine(fitLine(text, {used, bold}, depth), bold, used, middleX_ + p.x + side.x,
+                       middleY_ + p.y + side.y, onTheRight ? angle - 90 : angle + 90, "middle");
+        };
+        append(names, true, size, twoLines ? -size * 0.6 : 0);
+        if (twoLines) append(facts, false, size * kYearsShare, size * 0.6);
+    }
+
+    void appendLine(const std::string& text, bool bold, double size, double x, double y, double turn,
+                    const char* anchor) {
+        if (text.empty()) return;
+        const std::string transform =
+            turn == 0 ? std::string() : " transform=\"rotate(" + px(turn) + " " + px(x) + " " + px(y) + ")\"";
+        svg_.svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\" dy=\"" + px(size * 0.36) +
+                    "\" text-anchor=\"" + anchor + "\"" + transform + (bold ? " font-weight=\"bold\"" : "") +
+                    " font-size=\"" + px(size) + "\" fill=\"" + std::string(theme().text) + "\"" +
+                    (runsRightToLeft(text) ? " direction=\"rtl\"" : "") + ">" + escaped(text) + "</text>\n";
+    }
+
+    void appendLinks() { appendLines(svg_, content_, options_, frame_); }
+
+    // Whose line each colour is.
+    std::string legendText() {
+        if (lines_.empty()) return std::string();
+        std::string legend = "<g>\n<title>Legend</title>\n";
+        const int top = svg_.height - kMargin + 12;
+        double widest = 0;
+        for (std::size_t i = 0; i < lines_.size(); ++i) {
+            const auto box = static_cast<std::size_t>(lines_[i]);
+            const std::string name = cleanText(fullName(content_.labelOf(fan_.boxes[box].id)));
+            const std::string text = fitLine(name, {kLegendSize, false}, 300);
+            widest = std::max(widest, textWidth(text, {kLegendSize, false}));
+            const int y = top + kLegendPitch * static_cast<int>(i);
+            legend += "<rect x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(y) +
+                      "\" width=\"28\" height=\"14\" fill=\"" + std::string(fillOf(box)) + "\" stroke=\"" +
+                      std::string(theme().line) + "\"/>\n<text x=\"" + std::to_string(kMargin + 38) +
+                      "\" y=\"" + std::to_string(y + 11) + "\" font-size=\"" + px(kLegendSize) +
+                      "\" fill=\"" + std::string(theme().quietText) + "\">" + escaped(text) + "</text>\n";
+        }
+        const double height = static_cast<double>(lines_.size()) * kLegendPitch;
+        svg_.height += static_cast<int>(height) + 12;
+        svg_.width = std::max(svg_.width, static_cast<int>(widest) + 38 + 2 * kMargin);
+        svg_.legend = {kMargin, static_cast<double>(top), widest + 38, height};
+        return legend + "</g>\n";
+    }
+
+    const DrawingContent& content_;
+    const picture::Picture& fan_;
+    const DrawingOptions& options_;
+    SvgPicture svg_;
+    Frame frame_;
+    double middleX_ = 0;
+    double middleY_ = 0;
+    std::vector<Index> lines_;
+};
+
+}  // namespace
+
+SvgPicture drawFan(const DrawingContent& content, const DrawingOptions& options) {
+    return FanDrawer(content, options).draw();
+}
+
+}  // namespace olvane::draw

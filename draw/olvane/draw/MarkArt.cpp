@@ -1,0 +1,85 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// An arrow up stands at a child whose parents are elsewhere, an arrow down at those parents, an arrow to both
+// sides at partners, each with the number of its mark.
+
+#include <olvane/draw/MarkArtInternal.h>
+
+#include <cstddef>
+
+namespace olvane::draw {
+
+namespace {
+
+using picture::Index;
+using picture::Mark;
+using picture::MarkKind;
+
+constexpr std::size_t kMostMarks = 3;
+constexpr const char* kUp = "\xE2\x86\x91";
+constexpr const char* kDown = "\xE2\x86\x93";
+constexpr const char* kBoth = "\xE2\x86\x94";
+
+class MarkList {
+public:
+    explicit MarkList(const picture::Picture& picture) : marks_(picture.boxes.size()) {
+        for (const Mark& mark : picture.marks) {
+            if (mark.kind == MarkKind::parentsElsewhere) addParents(mark);
+            if (mark.kind == MarkKind::partnersElsewhere) addPartners(mark);
+        }
+        for (std::vector<BoxMark>& marks : marks_) shorten(marks);
+    }
+
+    std::vector<std::vector<BoxMark>> take() { return std::move(marks_); }
+
+private:
+    void add(Index box, const char* sign, const Mark& mark, const std::string& title, MarkPlace place) {
+        if (box == picture::kNone) return;
+        marks_[static_cast<std::size_t>(box)].push_back({sign + std::to_string(mark.number), title, place});
+    }
+
+    void addParents(const Mark& mark) {
+        const std::string number = std::to_string(mark.number);
+        add(mark.boxes[0], kUp, mark, "Child of whoever is marked " + (kDown + number), MarkPlace::top);
+        for (const Index parent : {mark.boxes[1], mark.boxes[2]}) {
+            add(parent, kDown, mark, "Parent of who is marked " + (kUp + number), MarkPlace::bottom);
+        }
+    }
+
+    void addPartners(const Mark& mark) {
+        const std::string number = std::to_string(mark.number);
+        for (const Index partner : {mark.boxes[0], mark.boxes[1]}) {
+            add(partner, kBoth, mark, "Partner of who is marked " + (kBoth + number) + " as well",
+                MarkPlace::bottom);
+        }
+    }
+
+    static void shorten(std::vector<BoxMark>& marks) {
+        for (const MarkPlace place : {MarkPlace::top, MarkPlace::bottom}) {
+            std::size_t count = 0;
+            for (const BoxMark& mark : marks) {
+                if (mark.place == place) ++count;
+            }
+            if (count <= kMostMarks) continue;
+            std::string title;
+            std::size_t kept = 0;
+            std::erase_if(marks, [&](const BoxMark& mark) {
+                if (mark.place != place || ++kept < kMostMarks) return false;
+                title += (title.empty() ? "" : "; ") + mark.title;
+                return true;
+            });
+            marks.push_back({"+" + std::to_string(count - kMostMarks + 1), title, place});
+        }
+    }
+
+    std::vector<std::vector<BoxMark>> marks_;
+};
+
+}  // namespace
+
+std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture) {
+    return MarkList(picture).take();
+}
+
+}  // namespace olvane::draw

@@ -1,0 +1,20 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+namespace olvane::picture {
+
+// The sine of an angle in degrees, to about 1e-15, by Taylor's series: the same bits from every library, which
+// std::sin does not promise.
+double sineOfDegrees(double degrees);
+
+struct CirclePoint {
+    double x = 0;
+    double y = 0;
+};
+
+// The point at that angle, clockwise from the top, on a circle around (0, 0); y grows down.
+CirclePoint onCircle(double degrees, double radius);
+
+}  // namespace olvane::picture
