@@ -5,8 +5,8 @@
 
 #include <cli/FileReading.h>
 
-#include <array>
 #include <cstddef>
+#include <map>
 
 #include <olvane/gedcom/GedcomReader.h>
 
@@ -24,12 +24,12 @@ constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are told as 
 
 // The first of each kind, and how many were kept back. Notes are for those who ask.
 void report(const gedcom::GedcomData& data) {
-    std::array<std::size_t, static_cast<std::size_t>(gedcom::DiagnosticKind::moreOfAKind) + 1> seen{};
+    std::map<gedcom::DiagnosticKind, std::size_t> seen;
     std::size_t keptBack = 0;
     bool isWhole = true;
     for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
         if (diagnostic.severity == gedcom::Severity::note) continue;
-        const std::size_t ofKind = ++seen[static_cast<std::size_t>(diagnostic.kind)];
+        const std::size_t ofKind = ++seen[diagnostic.kind];
         if (ofKind > kPerKind) {
             ++keptBack;
             isWhole = isWhole && ofKind < kCounted;

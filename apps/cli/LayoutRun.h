@@ -23,6 +23,7 @@ enum class BoxForm : std::uint8_t { tall, wide };
 struct LayoutRequest {
     View view = View::family;
     int generations = 5;           // columns of a pedigree, the focus's own included
+    std::string to;                // of the kinship view, as the user names the person; checked by PictureRun
     charts::ChartRequest chart{};  // of the other views; view, focus and sizes are filled in by PictureRun
     BoxForm boxes = BoxForm::tall;
     // Which relatives a family view shows; sizes and generations are filled in by typedLayout.

@@ -13,6 +13,7 @@
 #include <olvane/picture/LayoutPicture.h>
 #include <olvane/source/GedcomKin.h>
 
+#include <cli/FocusChoice.h>
 #include <cli/PersonJson.h>
 
 namespace olvane::cli {
@@ -39,6 +40,7 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, LayoutRequest request, st
       graph_(gedcom::kinGraphOf(data)) {
     request_.chart.view = request_.view;
     request_.chart.sizes = sizesOf(request_.boxes);
+    if (request_.view == View::kinship) request_.chart.to = graph_.placeOf(chooseFocus(data, request_.to));
 }
 
 bool PictureRun::isHidden(std::int64_t id) const {

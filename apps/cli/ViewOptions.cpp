@@ -49,6 +49,8 @@ const std::map<std::string, View>& views() {
         {"hourglass", View::hourglass},
         {"relatives", View::relatives},
         {"fan", View::fan},
+        {"kinship", View::kinship},
+        {"everybody", View::everybody},
     };
     return kViews;
 }
@@ -60,17 +62,23 @@ struct OptionUse {
 };
 
 const std::vector<OptionUse>& optionUses() {
-    static const std::vector<View> kTrees = {View::ancestors, View::descendants, View::hourglass,
-                                             View::relatives};
+    static const std::vector<View> kDirected = {View::near,      View::ancestors, View::descendants,
+                                                View::hourglass, View::relatives, View::kinship,
+                                                View::everybody};
     static const std::vector<OptionUse> kUses = {
         {"--generations",
          {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--up", {View::ancestors, View::hourglass, View::relatives, View::fan}},
         {"--down", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--direction", kTrees},
+        {"--direction", kDirected},
         {"--siblings", {View::ancestors, View::hourglass}},
         {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--compact", kTrees},
+        {"--to", {View::kinship}},
+        {"--by", {View::kinship}},
+        {"--ways", {View::kinship}},
+        {"--marks", {View::everybody}},
+        {"--effort", {View::everybody}},
+        {"--all-parts", {View::everybody}},
         {"--of", {View::fan}},
         {"--angle", {View::fan}},
     };
@@ -88,7 +96,8 @@ void addView(CLI::App& command, LayoutRequest& request) {
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
             "the relatives of family, placed anew without overlaps; ancestors, descendants, hourglass (both) "
             "and relatives (the descendants of every ancestor): any number of generations, each person once; "
-            "fan: ancestors or descendants in rings")
+            "fan: ancestors or descendants in rings; kinship: everybody on the ways to --to; everybody: the "
+            "whole connected family")
         ->transform(CLI::CheckedTransformer(views()))
         ->type_name("VIEW");
     command
@@ -136,7 +145,49 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
         ->check(CLI::Range(90.0, 360.0))
         ->type_name("DEGREES")
         ->group(group);
-    command.add_flag("--compact", chart.compact, "Pack generations tighter where the boxes allow it")
+}
+
+void addKinshipOptions(CLI::App& command, LayoutRequest& request) {
+    static const std::map<std::string, charts::WayChoice> kChoices = {
+        {"blood", charts::WayChoice::blood},
+        {"marriage", charts::WayChoice::marriage},
+        {"both", charts::WayChoice::both}};
+    const std::string group = "Kinship view";
+    command.add_option("--to", request.to, "The other person, named like the one of --focus")
+        ->type_name("WHO")
+        ->group(group);
+    command
+        .add_option("--by", request.chart.ways,
+                    "Which ways are shown: by blood, by marriage or both (default)")
+        ->transform(CLI::CheckedTransformer(kChoices))
+        ->type_name("blood|marriage|both")
+        ->group(group);
+    command
+        .add_option("--ways", request.chart.mostWays,
+                    "The most ways shown, the nearest first; default 8, 0 for all")
+        ->check(CLI::NonNegativeNumber)
+        ->type_name("N")
+        ->group(group);
+}
+
+void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
+    const std::string group = "View of everybody";
+    command
+        .add_option("--marks", chart.marks,
+                    "How many second links to parents may become marks, for fewer crossings; default 0, all "
+                    "for all of "
+                    "them")
+        ->transform(CLI::Transformer(std::map<std::string, int>{{"all", -1}}).description(""))
+        ->type_name("N|all")
+        ->group(group);
+    command
+        .add_option("--effort", chart.effort,
+                    "0 is quickest; each step more takes up to twice the time; default 1")
+        ->check(CLI::Range(0, 10))
+        ->type_name("N")
+        ->group(group);
+    command
+        .add_flag("!--all-parts", chart.onePart, "Show those as well who are not connected with the focus")
         ->group(group);
 }
 
@@ -195,12 +246,15 @@ void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string
     addView(command, request);
     addBoxes(command, request, boxDefaults);
     addChartOptions(command, request.chart);
+    addKinshipOptions(command, request);
+    addEverybodyOptions(command, request.chart);
     addFamilySwitches(command, request);
 }
 
 void completeViewOptions(const CLI::App& command, LayoutRequest& request) {
     refuseIdleOptions(command, request.view);
     applyGenerations(command, request);
+    if (request.view == View::kinship && request.to.empty()) throw UsageError("the view kinship needs --to");
 }
 
 }  // namespace olvane::cli

@@ -29,6 +29,8 @@ def commands_for(file, number):
         ["layout", file, "--focus", "1", "--format", "json", "--hide-living"],
         ["layout", file, "--focus", "2", "--view", "pedigree"], ["layout", file, "--focus", "1", "--view", "relatives"],
         ["batch", file, "--view", "hourglass"], ["check", file, "--all", "--view", "near"],
+        ["layout", file, "--focus", "1", "--view", "everybody"], ["layout", file, "--focus", "1", "--view", "fan"],
+        ["layout", file, "--focus", "1", "--view", "kinship", "--to", "3"], ["kin", file, "1", "2", "--format", "json"],
         ["draw", file, "--focus", "1", "-o", "out.svg"], ["draw", file, "--focus", "1", "-o", file],
         ["draw", file, "--focus", "1", "--page", "A4", "-o", "sheets.svg", "--hide-living"],
         ["page", file, "-o", "out.html", "--hide-living"], ["page", file, "-o", file],

@@ -11,18 +11,20 @@ _olvane() {
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
     local commands="people layout draw batch check kin judge page"
-    local view="--view --generations --boxes --up --down --direction --siblings --no-spouses --compact --of --angle"
+    local view="--view --generations --boxes --up --down --direction --siblings --no-spouses --to --by --ways --marks --effort --all-parts --of --angle"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"
     local encodings="UTF-8 UTF-16LE UTF-16BE ANSEL windows-1250 windows-1251 windows-1252 windows-1253 ISO-8859-2 \
         ISO-8859-15 KOI8-R GB18030 Big5 Shift_JIS EUC-JP EUC-KR IBM437 IBM850"
     case $prev in
-        --view) COMPREPLY=($(compgen -W "family pedigree near ancestors descendants hourglass relatives fan" -- "$cur")); return ;;
+        --view) COMPREPLY=($(compgen -W "family pedigree near ancestors descendants hourglass relatives fan kinship everybody" -- "$cur")); return ;;
         --of) COMPREPLY=($(compgen -W "ancestors descendants" -- "$cur")); return ;;
         --angle) COMPREPLY=($(compgen -W "90 180 270 360" -- "$cur")); return ;;
         --language) COMPREPLY=($(compgen -W "en de es" -- "$cur")); return ;;
-        --ways) return ;;
+        --by) COMPREPLY=($(compgen -W "blood marriage both" -- "$cur")); return ;;
+        --effort) COMPREPLY=($(compgen -W "0 1 2 3 4" -- "$cur")); return ;;
+        --ways | --marks | --to) return ;;
         --direction) COMPREPLY=($(compgen -W "down up left right" -- "$cur")); return ;;
         --up | --down) COMPREPLY=($(compgen -W "0 1 2 3 4 5 6 7 8" -- "$cur")); return ;;
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;
