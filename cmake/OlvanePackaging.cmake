@@ -32,7 +32,7 @@ function(olvane_package component package section depends description)
     RENAME copyright COMPONENT ${component})
 endfunction()
 
-set(library_package libolvane-c${PROJECT_VERSION_MAJOR})
+set(library_package libolvane-c${OLVANE_SOVERSION})
 set(same_library "${library_package} (= ${PROJECT_VERSION})")
 
 olvane_package(dev libolvane-dev libdevel "${same_library}, libboost-dev (>= 1.74)"

@@ -24,6 +24,11 @@
 #include <stddef.h>
 #include <stdint.h>
 
+/* The version of this header; olvane_version says that of the library. */
+#define OLVANE_VERSION_MAJOR 0
+#define OLVANE_VERSION_MINOR 1
+#define OLVANE_VERSION_PATCH 0
+
 #if defined(__GNUC__)
 #define OLVANE_C_API __attribute__((visibility("default")))
 #else

@@ -11,7 +11,7 @@ import ctypes
 import os
 from ctypes import POINTER, c_char_p, c_float, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
 
-_SONAME = "libolvane_c.so.0"
+_SONAME = "libolvane_c.so.0.1"
 
 ParentCallback = ctypes.CFUNCTYPE(c_int, c_void_p, c_int64, POINTER(c_int64))
 ListCallback = ctypes.CFUNCTYPE(c_int, c_void_p, c_int64, c_void_p)

@@ -16,6 +16,7 @@
 
 #include <gtest/gtest.h>
 
+#include <olvane/Version.h>
 #include <olvane/family/FamilyOptions.h>
 #include <support/CaseRun.h>
 #include <support/FamilyMaker.h>
@@ -443,6 +444,13 @@ TEST(CThreads, withHalfAMegabyteOfStackHoldMostGenerations) {
 
 TEST(CVersion, hasThreeNumbers) {
     EXPECT_EQ(std::string(OLVANE_EXPECTED_VERSION), olvane_version());
+}
+
+TEST(CVersion, ofTheHeadersIsThatOfTheLibrary) {
+    const std::string macros = std::to_string(OLVANE_VERSION_MAJOR) + "." +
+                               std::to_string(OLVANE_VERSION_MINOR) + "." +
+                               std::to_string(OLVANE_VERSION_PATCH);
+    EXPECT_EQ(macros, olvane_version());
 }
 
 }  // namespace
