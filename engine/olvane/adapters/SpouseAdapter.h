@@ -7,7 +7,7 @@
 #include <string_view>
 
 #include <olvane/Export.h>
-#include <olvane/adapters/RecordSet.h>
+#include <olvane/detail/RecordSet.h>
 
 // One spouse of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
 // order in which spouses are drawn.

@@ -79,8 +79,8 @@ void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, Spou
         const bool preferred = source.isPreferredSpouse(id, spouseId);
         const bool alive = !source.isPersonDead(spouseId);
         const std::string date = source.dateForPersonWithID(spouseId, false);
-        ViewerGlue::NumberRoom room;
-        const std::string_view text = glue.textOfKey(spouseKey, room);
+        ViewerGlue::DecimalBuffer buffer;
+        const std::string_view text = glue.textOfKey(spouseKey, buffer);
         ++place;
         if (endFirst) {
             spouses.emplace_hint(spouses.end(), spouseKey, preferred, alive, firstCharacterOf(date), text,
@@ -112,8 +112,8 @@ void getChildren(ViewerGlue& glue, const ManagerReference& manager, int key, Chi
     const auto addEntry = [&](std::int64_t entry) {
         const int childKey = glue.keyOfNumber(lowBits(entry));
         const std::string date = source.dateForPersonWithID(lowBits(entry), true);
-        ViewerGlue::NumberRoom room;
-        const std::string_view text = glue.textOfKey(childKey, room);
+        ViewerGlue::DecimalBuffer buffer;
+        const std::string_view text = glue.textOfKey(childKey, buffer);
         ++place;
         if (endFirst) {
             children.emplace_hint(children.end(), childKey, firstCharacterOf(date), text, place);

@@ -132,8 +132,8 @@ void appendSexAndChild(std::string& text, const ViewerGlue& glue, int key) {
 }
 
 void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text, TreeViewPerson& person) {
-    ViewerGlue::NumberRoom room;
-    const std::string_view personText = glue.textOfKey(person.personId, room);
+    ViewerGlue::DecimalBuffer buffer;
+    const std::string_view personText = glue.textOfKey(person.personId, buffer);
     const int x = wholePoint(person.getNodeCenter().x);
     const int y = wholePoint(person.getNodeCenter().y);
     updateBounds(bounds, x, y);

@@ -34,9 +34,9 @@ ViewerGlue::ViewerGlue()
 int ViewerGlue::getKeyFromPerson(std::string personText) {
     const int number = stringToInt(personText);
     if (personText == intToString(number)) return keyOfNumber(number);
-    const auto known = oddTexts_.find(personText);
-    if (known != oddTexts_.end()) return known->second;
-    const auto entry = oddTexts_.emplace(personText, static_cast<int>(entries_.size())).first;
+    const auto known = nonCanonicalIds_.find(personText);
+    if (known != nonCanonicalIds_.end()) return known->second;
+    const auto entry = nonCanonicalIds_.emplace(personText, static_cast<int>(entries_.size())).first;
     return addEntry(number, &entry->first);
 }
 
@@ -61,35 +61,36 @@ void ViewerGlue::growSlots() {
 }
 
 std::string ViewerGlue::personOfKey(int key) const {
-    NumberRoom room;
-    return std::string(textOfKey(key, room));
+    DecimalBuffer buffer;
+    return std::string(textOfKey(key, buffer));
 }
 
-std::string_view ViewerGlue::textOfKey(int key, NumberRoom& room) const {
-    static_assert(sizeof room >= olvane::kLongestDecimal);
+std::string_view ViewerGlue::textOfKey(int key, DecimalBuffer& buffer) const {
+    static_assert(sizeof buffer >= olvane::kLongestDecimal);
     const KeyEntry& entry = entryOfKey(key);
-    if (entry.oddText != nullptr) return *entry.oddText;
-    return std::string_view(room, static_cast<std::size_t>(olvane::writeDecimal(room, entry.number) - room));
+    if (entry.nonCanonicalId != nullptr) return *entry.nonCanonicalId;
+    return std::string_view(buffer,
+                            static_cast<std::size_t>(olvane::writeDecimal(buffer, entry.number) - buffer));
 }
 
 // kNone for a text that has no key.
 int ViewerGlue::knownKeyOf(const std::string& personText) const {
     const int number = stringToInt(personText);
     if (personText == intToString(number)) return slotOf(number).key;
-    const auto known = oddTexts_.find(personText);
-    return known != oddTexts_.end() ? known->second : kNone;
+    const auto known = nonCanonicalIds_.find(personText);
+    return known != nonCanonicalIds_.end() ? known->second : kNone;
 }
 
 void ViewerGlue::addAddNodeValue(const std::string& addNodeText, bool male, const std::string& childText,
                                  const std::string& otherParentText) {
     const int key = knownKeyOf(addNodeText);
     if (key != kNone && recordOfKey(key) != nullptr) return;
-    toldRecords_.emplace(addNodeText, AddNodeValues{male, addNodeText, childText, otherParentText});
+    textAddNodes_.emplace(addNodeText, AddNodeValues{male, addNodeText, childText, otherParentText});
 }
 
 void ViewerGlue::addAddNode(int key, bool male, int childKey, int otherParentKey) {
     if (recordOfKey(key) != nullptr) return;
-    if (!toldRecords_.empty() && toldRecords_.count(personOfKey(key)) != 0) return;
+    if (!textAddNodes_.empty() && textAddNodes_.count(personOfKey(key)) != 0) return;
     if (records_.empty()) records_.reserve(kFirstAddNodes);
     records_.push_back(AddNodeRecord{key, childKey, otherParentKey, male});
     entries_[static_cast<std::size_t>(key)].addNode = static_cast<int>(records_.size()) - 1;
@@ -98,17 +99,17 @@ void ViewerGlue::addAddNode(int key, bool male, int childKey, int otherParentKey
 AddNodeValues ViewerGlue::getAddNodeValue(std::string personText) const {
     const int key = knownKeyOf(personText);
     const AddNodeRecord* const record = key != kNone ? recordOfKey(key) : nullptr;
-    return record != nullptr ? valuesOf(*record) : toldRecord(personText);
+    return record != nullptr ? valuesOf(*record) : textAddNode(personText);
 }
 
 bool ViewerGlue::addNodeIsMale(int key) const {
     const AddNodeRecord* const record = recordOfKey(key);
-    return record != nullptr ? record->male : toldRecord(personOfKey(key)).male;
+    return record != nullptr ? record->male : textAddNode(personOfKey(key)).male;
 }
 
 std::string ViewerGlue::childTextOfAddNode(int key) const {
     const AddNodeRecord* const record = recordOfKey(key);
-    return record != nullptr ? personOfKey(record->childKey) : toldRecord(personOfKey(key)).childText;
+    return record != nullptr ? personOfKey(record->childKey) : textAddNode(personOfKey(key)).childText;
 }
 
 int ViewerGlue::childNumberOfAddNode(int key) const {
@@ -122,9 +123,9 @@ const ViewerGlue::AddNodeRecord* ViewerGlue::recordOfKey(int key) const {
     return place != kNone ? &records_[static_cast<std::size_t>(place)] : nullptr;
 }
 
-const AddNodeValues& ViewerGlue::toldRecord(const std::string& personText) const {
-    const auto entry = toldRecords_.find(personText);
-    if (entry == toldRecords_.end()) failToFind();
+const AddNodeValues& ViewerGlue::textAddNode(const std::string& personText) const {
+    const auto entry = textAddNodes_.find(personText);
+    if (entry == textAddNodes_.end()) failToFind();
     return entry->second;
 }
 
@@ -147,7 +148,7 @@ void ViewerGlue::fillPersonToKey(boost::unordered_map<std::string, int>& map) co
 
 // An add-node is in one of the two collections, so as many entries as both have together is all of them.
 void ViewerGlue::fillAddNodes(boost::unordered_map<std::string, AddNodeValues>& map) const {
-    if (map.size() == records_.size() + toldRecords_.size()) return;
+    if (map.size() == records_.size() + textAddNodes_.size()) return;
     for (const AddNodeRecord& record : records_) map.emplace(personOfKey(record.key), valuesOf(record));
-    for (const auto& told : toldRecords_) map.insert(told);
+    for (const auto& told : textAddNodes_) map.insert(told);
 }

@@ -95,9 +95,9 @@ public:
 
     // The id text under a key, and the number that it says (0 for none).
     std::string personOfKey(int key) const;
-    // The same text where it lies, or written into the room, which must outlive what is returned.
-    typedef char NumberRoom[11];
-    std::string_view textOfKey(int key, NumberRoom& room) const;
+    // The same text where it lies, or written into the buffer, which must outlive what is returned.
+    typedef char DecimalBuffer[11];
+    std::string_view textOfKey(int key, DecimalBuffer& buffer) const;
     int numberOfKey(int key) const { return entryOfKey(key).number; }
 
     // The first record of an add-node stands; a later one for the same text is dropped.
@@ -119,8 +119,8 @@ private:
 
     struct KeyEntry {
         int number;
-        int addNode;                 // into records_
-        const std::string* oddText;  // null where the text is the plain decimal form of the number
+        int addNode;                        // into records_
+        const std::string* nonCanonicalId;  // null where the text is the plain decimal form of the number
     };
     struct AddNodeRecord {
         int key;
@@ -153,15 +153,15 @@ private:
 
     [[noreturn]] static void failToFind();
     int addNumber(NumberSlot& slot, int number);
-    int addEntry(int number, const std::string* oddText) {
+    int addEntry(int number, const std::string* nonCanonicalId) {
         const int key = static_cast<int>(entries_.size());
-        entries_.push_back(KeyEntry{number, kNone, oddText});
+        entries_.push_back(KeyEntry{number, kNone, nonCanonicalId});
         return key;
     }
     void growSlots();
     int knownKeyOf(const std::string& personText) const;
     const AddNodeRecord* recordOfKey(int key) const;
-    const AddNodeValues& toldRecord(const std::string& personText) const;
+    const AddNodeValues& textAddNode(const std::string& personText) const;
     AddNodeValues valuesOf(const AddNodeRecord& record) const;
 
     void fillKeyToPerson(boost::unordered_map<int, std::string>& map) const;
@@ -172,7 +172,7 @@ private:
     std::vector<NumberSlot> slots_;  // a power of two; open addressing, one step at a time
     std::size_t slotMask_;           // their number less one
     std::size_t usedSlots_ = 0;
-    boost::unordered_map<std::string, int> oddTexts_;  // to keys
+    boost::unordered_map<std::string, int> nonCanonicalIds_;  // to keys
     std::vector<AddNodeRecord> records_;
-    boost::unordered_map<std::string, AddNodeValues> toldRecords_;  // those that came as texts
+    boost::unordered_map<std::string, AddNodeValues> textAddNodes_;  // those that came as texts
 };

@@ -27,7 +27,7 @@ float TreeViewFamilyLayouter::couplesWidth() const {
 void TreeViewFamilyLayouter::calculateLayoutWidthForDescendantsOfProximalPerson(TreeViewPerson& person) {
     person.isProximalPerson = true;
     for (TreeViewPerson& spouse : person.spouses) measureSpouse(person, spouse);
-    const float unknown = unknownChildrenWidth(person);
+    const float unknown = widthWithoutSecondParent(person);
     person.layoutWidth = treeSize.nodeWidth > unknown ? treeSize.nodeWidth : unknown;
 }
 
@@ -52,13 +52,13 @@ void TreeViewFamilyLayouter::measureSpouseWithSharedChildren(TreeViewPerson& per
 
 // A lone childless child gets the width of a couple, so that it comes out under the middle of the pair.
 float TreeViewFamilyLayouter::sharedChildrenWidth(TreeViewPerson& person, TreeViewPerson& spouse) {
-    const bool loneChild =
+    const bool onlyChild =
         countOfChildren(person, spouse.personId) == 1 && countOfChildren(spouse, TreeViewPerson::kNoKey) == 0;
     float shared = 0.0f;
     for (TreeViewPerson& child : person.childrenBy(spouse.personId)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);
         shared = shared + familyUnitWidthForProximalPerson(child);
-        if (loneChild && shared == treeSize.nodeWidth) {
+        if (onlyChild && shared == treeSize.nodeWidth) {
             shared = shared + (treeSize.nodeWidth + treeSize.horzPadding);
             child.layoutWidth = shared;
         }
@@ -81,7 +81,7 @@ float TreeViewFamilyLayouter::addWidthsForStepChildrenFromSpouse(TreeViewPerson&
     return sum;
 }
 
-float TreeViewFamilyLayouter::unknownChildrenWidth(TreeViewPerson& person) {
+float TreeViewFamilyLayouter::widthWithoutSecondParent(TreeViewPerson& person) {
     float unknown = 0.0f;
     for (TreeViewPerson& child : person.childrenBy(TreeViewPerson::kNoKey)) {
         calculateLayoutWidthForDescendantsOfProximalPerson(child);

@@ -7,8 +7,8 @@
 #include <vector>
 
 #include <olvane/Export.h>
+#include <olvane/detail/KeySet.h>
 #include <olvane/layouter/DirectLine.h>
-#include <olvane/layouter/KeySet.h>
 #include <olvane/layouter/TreeViewLayouter.h>
 
 namespace SharedTreeViewer {
@@ -118,7 +118,7 @@ private:
     void measureSpouseWithSharedChildren(TreeViewPerson& person, TreeViewPerson& spouse);
     void measureSpouseWithoutSharedChildren(TreeViewPerson& spouse);
     float sharedChildrenWidth(TreeViewPerson& person, TreeViewPerson& spouse);
-    float unknownChildrenWidth(TreeViewPerson& person);
+    float widthWithoutSecondParent(TreeViewPerson& person);
 
     // Placement.
     void placeManAndNonCombinedSpouses(TreeViewPerson& man, float x, float y, int offset);

@@ -20,7 +20,7 @@ TreeViewSpouseEdge* TreeViewPerson::spouseEdge(TreeViewPerson* spouse, TreeLine 
     TreeViewPerson* const first = gender ? this : spouse;
     TreeViewPerson* const second = gender ? spouse : this;
     std::unique_ptr<TreeViewSpouseEdge> edge(
-        arena() != nullptr ? new (arena()->trays()) TreeViewSpouseEdge(std::move(line), first, second)
+        arena() != nullptr ? new (arena()->slabs()) TreeViewSpouseEdge(std::move(line), first, second)
                            : new TreeViewSpouseEdge(std::move(line), first, second));
     spouseEdges.emplace(spouseKey, edge.get());
     TreeViewSpouseEdge* const made = edge.release();

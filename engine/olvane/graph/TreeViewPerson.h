@@ -14,11 +14,11 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/Arena.h>
-#include <olvane/ArenaList.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/ChildrenAdapter.h>
 #include <olvane/adapters/SpouseAdapter.h>
+#include <olvane/detail/Arena.h>
+#include <olvane/detail/ArenaList.h>
 #include <olvane/graph/TreeLineSegment.h>
 #include <olvane/graph/TreePoint.h>
 #include <olvane/graph/TreeViewGenerationEdge.h>

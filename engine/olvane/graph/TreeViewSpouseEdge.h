@@ -10,7 +10,7 @@
 #include <vector>
 
 #include <olvane/Export.h>
-#include <olvane/Trays.h>
+#include <olvane/detail/RefCountedSlabs.h>
 #include <olvane/graph/TreeViewEdge.h>
 #include <olvane/graph/TreeViewGenerationEdge.h>
 
@@ -57,21 +57,27 @@ public:
 
     bool isSpouseMale() const;  // the gender of the second partner
 
-    // An edge lies on a tray, or by itself where none is given. Deleting it is the same for both. The forms with a
-    // place stand here for those who make an edge in memory of their own.
-    static void* operator new(std::size_t bytes) { return olvane::Trays::takeAlone(bytes); }
+    // An edge lies on a slab, or on the heap where none is given; it is deleted in the same way. The forms with a
+    // place are for callers who make an edge in memory of their own.
+    static void* operator new(std::size_t bytes) { return olvane::RefCountedSlabs::allocateSingle(bytes); }
     static void* operator new(std::size_t bytes, const std::nothrow_t&) noexcept {
         try {
-            return olvane::Trays::takeAlone(bytes);
+            return olvane::RefCountedSlabs::allocateSingle(bytes);
         } catch (...) {
             return nullptr;
         }
     }
-    static void* operator new(std::size_t bytes, olvane::Trays& trays) { return trays.take(bytes); }
+    static void* operator new(std::size_t bytes, olvane::RefCountedSlabs& slabs) {
+        return slabs.allocate(bytes);
+    }
     static void* operator new(std::size_t, void* place) { return place; }
-    static void operator delete(void* edge) { olvane::Trays::giveBack(edge); }
-    static void operator delete(void* edge, const std::nothrow_t&) { olvane::Trays::giveBack(edge); }
-    static void operator delete(void* edge, olvane::Trays&) { olvane::Trays::giveBack(edge); }
+    static void operator delete(void* edge) { olvane::RefCountedSlabs::deallocate(edge); }
+    static void operator delete(void* edge, const std::nothrow_t&) {
+        olvane::RefCountedSlabs::deallocate(edge);
+    }
+    static void operator delete(void* edge, olvane::RefCountedSlabs&) {
+        olvane::RefCountedSlabs::deallocate(edge);
+    }
     static void operator delete(void*, void*) {}
 
     ChildEdges childEdges;

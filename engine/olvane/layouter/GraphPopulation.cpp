@@ -28,7 +28,7 @@ bool allHavePlaces(const ChildrenSet& set) {
 // The children of several persons, for asking whether a record is among them.
 //
 // Records that all have a place are in one order, by key, so they are looked up in the sets where they lie.
-// Others may contradict each other's order (see above), and then an answer depends on the road by which one
+// Others may contradict each other's order (see above), and then an answer depends on the insertion order by which one
 // set was filled with all of them: one plain insert after another.
 class ChildrenOfOthers {
 public:
@@ -131,15 +131,15 @@ bool TreeViewLayouter::hasParents(TreeViewPerson& person) {
 void TreeViewLayouter::addAllChildrenToPerson(TreeViewPerson& person) {
     const ChildrenSet& children = person.getAllChildrenVector(dataAdapter->getChildren);
     if (children.empty()) return;
-    addLoneChildren(person, childrenOfPersonAlone(person, walkOver(person.spouses)));
+    addChildrenWithoutSecondParent(person, childrenWithoutSecondParent(person, walkOver(person.spouses)));
     for (TreeViewPerson& spouse : person.spouses) addChildrenWithSpousesToPerson(person, spouse, children);
 }
 
 void TreeViewLayouter::addBastardChildrenToPerson(TreeViewPerson& person, Iterator iterator) {
-    addLoneChildren(person, childrenOfPersonAlone(person, iterator));
+    addChildrenWithoutSecondParent(person, childrenWithoutSecondParent(person, iterator));
 }
 
-void TreeViewLayouter::addLoneChildren(TreeViewPerson& person, const Records& alone) {
+void TreeViewLayouter::addChildrenWithoutSecondParent(TreeViewPerson& person, const Records& alone) {
     if (alone.empty()) return;
     TreeViewPerson::Persons& list = person.childrenWithSpouse(TreeViewPerson::kNoKey, alone.size());
     for (const ChildrenAdapter* record : alone) {
@@ -149,11 +149,12 @@ void TreeViewLayouter::addLoneChildren(TreeViewPerson& person, const Records& al
 }
 
 ChildrenSet TreeViewLayouter::getBastardChildrenOfPerson(TreeViewPerson& person, Iterator iterator) {
-    return copyOf(childrenOfPersonAlone(person, iterator));
+    return copyOf(childrenWithoutSecondParent(person, iterator));
 }
 
 template <class Walk>
-TreeViewLayouter::Records TreeViewLayouter::childrenOfPersonAlone(TreeViewPerson& person, const Walk& walk) {
+TreeViewLayouter::Records TreeViewLayouter::childrenWithoutSecondParent(TreeViewPerson& person,
+                                                                        const Walk& walk) {
     Records alone(&memory);
     const ChildrenSet& own = person.getAllChildrenVector(dataAdapter->getChildren);
     if (own.empty()) return alone;
@@ -225,7 +226,7 @@ void TreeViewLayouter::addSiblingsToPerson(TreeViewPerson& person) {
 void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) {
     TreeViewPerson& father = person.getPreferredFather();
     bool personIsAmongThem = false;
-    const Records alone = childrenOfPersonAlone(father, walkOver(person.parents));
+    const Records alone = childrenWithoutSecondParent(father, walkOver(person.parents));
     person.siblings.reserve(person.siblings.size() + alone.size());
     for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {
@@ -249,7 +250,7 @@ void TreeViewLayouter::addFatherSide(TreeViewPerson& person, bool motherIsReal) 
 
 void TreeViewLayouter::addMotherSide(TreeViewPerson& person) {
     TreeViewPerson& mother = person.getPreferredMother();
-    const Records alone = childrenOfPersonAlone(mother, walkOver(person.parents));
+    const Records alone = childrenWithoutSecondParent(mother, walkOver(person.parents));
     person.siblings.reserve(person.siblings.size() + alone.size());
     for (const ChildrenAdapter* record : alone) {
         if (record->key == person.personId) {

@@ -10,12 +10,12 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/Arena.h>
 #include <olvane/Export.h>
 #include <olvane/adapters/DataAdapter.h>
+#include <olvane/detail/AdmittedKeys.h>
+#include <olvane/detail/Arena.h>
 #include <olvane/graph/TreeViewGenerationEdge.h>
 #include <olvane/graph/TreeViewPerson.h>
-#include <olvane/layouter/AdmittedKeys.h>
 #include <olvane/layouter/LineRecord.h>
 #include <olvane/layouter/TreeSize.h>
 
@@ -108,7 +108,7 @@ protected:
     boost::shared_ptr<TreeViewGenerationEdge> makeGenerationEdge(TreeLine&& line, TreeViewPerson& child,
                                                                  Above* above) {
         return boost::allocate_shared<TreeViewGenerationEdge>(
-            olvane::TrayAllocator<TreeViewGenerationEdge>(memory.trays()), std::move(line), &child, above);
+            olvane::SlabAllocator<TreeViewGenerationEdge>(memory.slabs()), std::move(line), &child, above);
     }
 
     void admit(int key) { shownPersons.admit(key); }
@@ -121,8 +121,8 @@ private:
 
     // Walk calls a visitor for each of the others, as an Iterator does.
     template <class Walk>
-    Records childrenOfPersonAlone(TreeViewPerson& person, const Walk& walk);
-    void addLoneChildren(TreeViewPerson& person, const Records& alone);
+    Records childrenWithoutSecondParent(TreeViewPerson& person, const Walk& walk);
+    void addChildrenWithoutSecondParent(TreeViewPerson& person, const Records& alone);
     void addFatherSide(TreeViewPerson& person, bool motherIsReal);
     void addMotherSide(TreeViewPerson& person);
 };

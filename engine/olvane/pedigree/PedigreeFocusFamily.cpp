@@ -62,7 +62,7 @@ void TreeViewPedigreeLayouter::addAndLayoutChildrenAndSpousesOfFocusPerson(TreeV
         placeOtherFamilies(focus, stack);
         if (stack.count() == 0) stack.startAt(topWithoutChildren);
     }
-    placeUnknownChildren(focus, stack);
+    placeChildrenWithoutSecondParent(focus, stack);
 }
 
 float TreeViewPedigreeLayouter::childrenX(const TreeViewPerson& focus) const {
@@ -120,7 +120,8 @@ void TreeViewPedigreeLayouter::placeOtherFamilies(TreeViewPerson& focus, Childre
 }
 
 // The block goes upward from the stack without a break: its last child stands one step above the top.
-void TreeViewPedigreeLayouter::placeUnknownChildren(TreeViewPerson& focus, const ChildrenStack& stack) {
+void TreeViewPedigreeLayouter::placeChildrenWithoutSecondParent(TreeViewPerson& focus,
+                                                                const ChildrenStack& stack) {
     const std::vector<TreeViewPerson*> unknown =
         collectShown(focus.getChildrenIterator(TreeViewPerson::kNoKey));
     const float blockHeight = heightForNodeCount(static_cast<int>(unknown.size()));

@@ -75,7 +75,7 @@ private:
     void placePreferredFamily(TreeViewPerson& focus, ChildrenStack& stack);
     void placeOtherFamilies(TreeViewPerson& focus, ChildrenStack& stack);
     std::vector<SpouseWithChildren> collectOtherFamilies(TreeViewPerson& focus);
-    void placeUnknownChildren(TreeViewPerson& focus, const ChildrenStack& stack);
+    void placeChildrenWithoutSecondParent(TreeViewPerson& focus, const ChildrenStack& stack);
     float childrenX(const TreeViewPerson& focus) const;
     void placeAncestor(TreeViewPerson& ancestor, int generation, int index);
 

@@ -8,7 +8,7 @@
 
 #include <gtest/gtest.h>
 
-#include <olvane/layouter/AdmittedKeys.h>
+#include <olvane/detail/AdmittedKeys.h>
 
 namespace {
 

@@ -8,7 +8,7 @@
 
 #include <gtest/gtest.h>
 
-#include <olvane/layouter/KeySet.h>
+#include <olvane/detail/KeySet.h>
 
 namespace {
 

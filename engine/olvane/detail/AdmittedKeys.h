@@ -10,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/Arena.h>
+#include <olvane/detail/Arena.h>
 
 namespace SharedTreeViewer {
 
@@ -40,16 +40,16 @@ public:
     }
 
     void admit(int key) { waiting_.push_back(key); }
-    // No fewer than there are; takes no look.
+    // Upper bound on size(); does not flush.
     std::size_t sizeAtMost() const { return map_.size() + waiting_.size(); }
 
     // --- The map.
     const Map& map() const {
-        enterWaiting();
+        flush();
         return map_;
     }
     Map& map() {
-        enterWaiting();
+        flush();
         return map_;
     }
     bool& operator[](int key) { return map()[key]; }
@@ -86,7 +86,7 @@ public:
 
 private:
     // Mostly in the order of the keys, so the end is the place to look first.
-    void enterWaiting() const {
+    void flush() const {
         for (const int key : waiting_) map_.emplace_hint(map_.end(), key, true);
         waiting_.clear();
     }

@@ -10,7 +10,7 @@
 #include <type_traits>
 #include <utility>
 
-#include <olvane/Arena.h>
+#include <olvane/detail/Arena.h>
 
 namespace olvane {
 

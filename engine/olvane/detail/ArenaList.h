@@ -5,7 +5,7 @@
 
 #include <vector>
 
-#include <olvane/Arena.h>
+#include <olvane/detail/Arena.h>
 
 namespace olvane {
 

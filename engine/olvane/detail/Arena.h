@@ -9,16 +9,16 @@
 #include <type_traits>
 
 #include <olvane/Export.h>
-#include <olvane/Trays.h>
+#include <olvane/detail/RefCountedSlabs.h>
 
 namespace olvane {
 
-// Memory for the many small pieces of one picture. It comes from the system in blocks that go back all at
-// once, when the arena does; pieces returned before that are handed out again, by size.
+// Memory for the many small blocks of one picture. It comes from the system in chunks that are released together, with the
+// arena; a block that is deallocated before that goes to the free list of its size.
 //
-// Units: bytes. A piece is aligned for every fundamental type.
-// Holds: the arena outlives whatever lies in it; no piece is longer than PTRDIFF_MAX, as containers see to.
-// Fails: take throws std::bad_alloc and changes nothing.
+// Units: bytes. A block is aligned for every fundamental type.
+// Holds: the arena outlives whatever lies in it; no block is longer than PTRDIFF_MAX, as containers see to.
+// Fails: allocate throws std::bad_alloc and changes nothing.
 class OLVANE_API Arena {
 public:
     Arena() = default;
@@ -26,51 +26,51 @@ public:
     Arena& operator=(const Arena&) = delete;
     ~Arena();
 
-    void* take(std::size_t bytes) {
+    void* allocate(std::size_t bytes) {
         const std::size_t granules = granulesOf(bytes);
-        if (granules < kReusedSizes && returned_[granules] != nullptr) {
-            Link* const piece = returned_[granules];
-            returned_[granules] = piece->next;
-            return piece;
+        if (granules < kReusedSizes && freeLists_[granules] != nullptr) {
+            Link* const block = freeLists_[granules];
+            freeLists_[granules] = block->next;
+            return block;
         }
         const std::size_t size = granules * kGranule;
-        if (size > left_) return takeAnew(bytes);
-        char* const piece = place_;
+        if (size > left_) return allocateSlow(bytes);
+        char* const block = place_;
         place_ += size;
         left_ -= size;
-        return piece;
+        return block;
     }
     // The size must be the one that was asked for.
-    void giveBack(void* piece, std::size_t bytes) noexcept {
-        if (blocks_ == nullptr) return freeAlone(piece);
+    void deallocate(void* block, std::size_t bytes) noexcept {
+        if (chunks_ == nullptr) return freeSingle(block);
         const std::size_t granules = granulesOf(bytes);
-        if (granules < kReusedSizes) returned_[granules] = new (piece) Link{returned_[granules]};
+        if (granules < kReusedSizes) freeLists_[granules] = new (block) Link{freeLists_[granules]};
     }
 
-    // For what belongs to the picture and may outlive it.
-    Trays& trays() { return trays_; }
+    // For objects that belong to the picture and may outlive it.
+    RefCountedSlabs& slabs() { return slabs_; }
 
 private:
     struct Link {
         Link* next;
     };
     static constexpr std::size_t kGranule = 16;
-    static constexpr std::size_t kReusedSizes = 64;  // in granules; larger pieces wait for the end
+    static constexpr std::size_t kReusedSizes = 64;  // in granules; larger blocks wait for the end
 
     static std::size_t granulesOf(std::size_t bytes) {
         return bytes == 0 ? 1 : (bytes + kGranule - 1) / kGranule;
     }
-    static void freeAlone(void* piece) noexcept;  // where each piece is an allocation of its own
-    void* takeAnew(std::size_t bytes);  // where nothing that was returned and no rest of a block serves
-    void* cutFromNewBlock(std::size_t size);
-    char* addBlock(std::size_t size);
+    static void freeSingle(void* block) noexcept;  // where pooling is disabled
+    void* allocateSlow(std::size_t bytes);         // where no free list and no rest of a chunk serves
+    void* carveFromNewChunk(std::size_t size);
+    char* addChunk(std::size_t size);
 
-    Link* returned_[kReusedSizes] = {};  // by size in granules
-    char* place_ = nullptr;              // where the free rest of the newest block begins
-    std::size_t left_ = 0;               // length of that rest
-    std::size_t taken_ = 0;              // of all blocks
-    Link* blocks_ = nullptr;
-    Trays trays_;
+    Link* freeLists_[kReusedSizes] = {};  // by size in granules
+    char* place_ = nullptr;               // where the free rest of the newest chunk begins
+    std::size_t left_ = 0;                // length of that rest
+    std::size_t reserved_ = 0;            // of all chunks
+    Link* chunks_ = nullptr;
+    RefCountedSlabs slabs_;
 };
 
 // The allocator of containers in an arena; without one it is the heap.
@@ -91,13 +91,13 @@ public:
 
     T* allocate(std::size_t count) {
         if (arena_ == nullptr) return static_cast<T*>(::operator new(bytesOf(count)));
-        return static_cast<T*>(arena_->take(bytesOf(count)));
+        return static_cast<T*>(arena_->allocate(bytesOf(count)));
     }
-    void deallocate(T* piece, std::size_t count) noexcept {
+    void deallocate(T* block, std::size_t count) noexcept {
         if (arena_ == nullptr) {
-            ::operator delete(piece);
+            ::operator delete(block);
         } else {
-            arena_->giveBack(piece, bytesOf(count));
+            arena_->deallocate(block, bytesOf(count));
         }
     }
     // The elements of a container are of its very type, so their destructor is called without a look at theirs.
