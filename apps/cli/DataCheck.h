@@ -3,34 +3,17 @@
 
 #pragma once
 
-#include <cstdint>
 #include <string>
 #include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/kin/DataCheck.h>
 
 namespace olvane::cli {
 
 // The rules of the data check.
-enum class DataFindingKind : std::uint8_t {
-    childNotListed,        // a person names a family as parents, which does not list the child
-    parentsNotNamed,       // a family lists a child who does not name the family
-    partnerNotNamed,       // a person names a marriage, which does not name the partner
-    marriageNotNamed,      // a family names a partner who does not name the family
-    severalBirthFamilies,  // a child by birth in two families
-    diedBeforeBirth,
-    livedTooLong,  // kLongestLife
-    bornBeforeParent,
-    parentTooYoung,  // kYoungestParent
-    parentTooOld,    // kOldestMother, kOldestFather
-    bornAfterParentsDeath,
-    marriedBeforeBirth,
-    marriedAfterDeath,
-    ownAncestor,
-};
-
-// "childNotListed" and so on, as in docs/check.schema.json.
-const char* nameOf(DataFindingKind kind);
+using DataFindingKind = kin::RemarkKind;
+using kin::nameOf;
 
 // Something in the data that will make a tree look odd, and the line that it comes from.
 struct DataFinding {
