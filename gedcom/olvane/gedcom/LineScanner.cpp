@@ -159,8 +159,8 @@ bool LineScanner::parse(std::string_view text, GedcomLine& line) {
         diagnostics_.count(DiagnosticKind::emptyLine, line.number);
         return false;
     }
-    if (!takeLevel(rest, line) || !takeXref(rest, line) || !takeTag(rest, line)) return refuse(text, line);
-    line.value = rest;
+    if (!takeLevel(rest, line) || !takeXref(rest, line) || !takeTagAndValue(rest, line))
+        return refuse(text, line);
     return true;
 }
 
@@ -216,12 +216,13 @@ bool LineScanner::takeXref(std::string_view& rest, GedcomLine& line) {
     return true;
 }
 
-bool LineScanner::takeTag(std::string_view& rest, GedcomLine& line) {
+// rest comes by value, in registers: a copy of both its halves at once would wait for the stores of each.
+bool LineScanner::takeTagAndValue(std::string_view rest, GedcomLine& line) {
     std::size_t length = 0;
     while (length < rest.size() && isTagLetter(rest[length])) ++length;
     if (length == 0 || (length < rest.size() && !isBlank(rest[length]))) return false;
     line.tag = rest.substr(0, length);
-    rest.remove_prefix(std::min(length + 1, rest.size()));
+    line.value = rest.substr(std::min(length + 1, rest.size()));
     return true;
 }
 

@@ -84,7 +84,7 @@ private:
     bool takeLevel(std::string_view& rest, GedcomLine& line);
     bool takeUnusualLevel(std::string_view& rest, GedcomLine& line);
     bool takeXref(std::string_view& rest, GedcomLine& line);
-    bool takeTag(std::string_view& rest, GedcomLine& line);
+    bool takeTagAndValue(std::string_view rest, GedcomLine& line);
     void settleDepth(GedcomLine& line);
     bool refuse(std::string_view text, const GedcomLine& line);
 
