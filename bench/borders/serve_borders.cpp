@@ -71,6 +71,7 @@ const bench::MadeFamily::Person& personOf(void* context, std::int64_t id) {
 
 olvane_host hostOf(bench::MadeFamily& family) {
     olvane_host host = {};
+    host.struct_size = sizeof host;
     host.context = &family;
     host.father_of = [](void* context, std::int64_t id, std::int64_t* parent) {
         if (personOf(context, id).father != 0) *parent = personOf(context, id).father;

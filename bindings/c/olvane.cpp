@@ -186,6 +186,7 @@ thread_local bool RunningLayout::isRunning_ = false;
 olvane_options defaultOptions() {
     const TreeSize size = olvane::familyTreeSize();
     olvane_options options;
+    options.struct_size = sizeof(olvane_options);
     options.sizes = {size.nodeWidth,   size.nodeHeight,     size.horzPadding,
                      size.vertPadding, size.spouseLineStep, size.lineInset};
     options.shown = OLVANE_SHOW_ALL;
@@ -195,8 +196,8 @@ olvane_options defaultOptions() {
 }
 
 bool isComplete(const olvane_host& host) {
-    return host.father_of && host.mother_of && host.spouses_of && host.children_of &&
-           host.is_preferred_spouse && host.is_dead && host.date_of && host.sex_of;
+    return host.struct_size == sizeof(olvane_host) && host.father_of && host.mother_of && host.spouses_of &&
+           host.children_of && host.is_preferred_spouse && host.is_dead && host.date_of && host.sex_of;
 }
 
 bool areFinite(const olvane_sizes& sizes) {
@@ -208,7 +209,8 @@ bool areFinite(const olvane_sizes& sizes) {
 }
 
 bool areInRange(const olvane_options& options) {
-    return areFinite(options.sizes) && (options.shown & ~OLVANE_SHOW_ALL) == 0 && options.generations >= 1 &&
+    return options.struct_size == sizeof(olvane_options) && areFinite(options.sizes) &&
+           (options.shown & ~OLVANE_SHOW_ALL) == 0 && options.generations >= 1 &&
            options.generations <= OLVANE_MOST_GENERATIONS && options.flag_depth >= 0;
 }
 

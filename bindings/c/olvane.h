@@ -81,7 +81,7 @@ OLVANE_C_API olvane_status olvane_date_set(olvane_date* date, const char* text);
  * Units: ids are the host's own, 1 to 2147483647.
  * Nobody: an unknown parent is OLVANE_PERSON_NOT_FOUND, and lists hold known persons alone. Any other number
  *     ends the layout with OLVANE_INVALID_ID, and olvane_layout_failure names it.
- * Holds: all eight are set. They are asked many times for the same person, since no answer is kept, and must
+ * Holds: struct_size is set, else OLVANE_INVALID_ARGUMENT. All eight are set. They are asked many times for the same person, since no answer is kept, and must
  *     agree with themselves within one layout. They may contradict each other: the layout takes them as told.
  * Fails: a callback returns 0, or any other number to report a failure. The layout then ends with what it
  *     has, with OLVANE_HOST_FAILED, and keeps the number for olvane_layout_host_code. A C++ callback that
@@ -90,7 +90,8 @@ OLVANE_C_API olvane_status olvane_date_set(olvane_date* date, const char* text);
  *     OLVANE_OUT_OF_MEMORY, whatever the callback returns.
  */
 typedef struct olvane_host {
-    void* context; /* handed to every callback, and otherwise left alone */
+    size_t struct_size; /* sizeof(olvane_host), set by the host: a later version may have more callbacks */
+    void* context;      /* handed to every callback, and otherwise left alone */
 
     /* *parent is OLVANE_PERSON_NOT_FOUND when the callback begins. */
     int (*father_of)(void* context, int64_t person, int64_t* parent);
@@ -136,6 +137,7 @@ typedef struct olvane_sizes {
 } olvane_sizes;
 
 typedef struct olvane_options {
+    size_t struct_size; /* sizeof(olvane_options); olvane_options_default sets it */
     olvane_sizes sizes;
     uint32_t shown; /* Family view: OLVANE_SHOW_ bits. */
     /* Pedigree: columns, the focus's own included; 1 to OLVANE_MOST_GENERATIONS. Full ancestry of n is 2^n - 1

@@ -40,7 +40,7 @@ static int male(void* context, int64_t person, int32_t* sex) {
 }
 
 int main(void) {
-    const olvane_host host = {NULL,          no_parent, no_parent, no_list, no_list,
+    const olvane_host host = {sizeof host, NULL, no_parent, no_parent, no_list, no_list,
                               not_preferred, alive,     no_date,   male};
     olvane_layout* layout = NULL;
     int code = 0;

@@ -74,7 +74,8 @@ int sexOf(void* context, std::int64_t person, std::int32_t* sex) {
 }  // namespace
 
 olvane_host hostOfSource(OlvaneViewerManagerWrapProtocol& source) {
-    return {&source, fatherOf, motherOf, spousesOf, childrenOf, isPreferredSpouse, isDead, dateOf, sexOf};
+    return {sizeof(olvane_host), &source,           fatherOf, motherOf, spousesOf,
+            childrenOf,          isPreferredSpouse, isDead,   dateOf,   sexOf};
 }
 
 }  // namespace olvane::js

@@ -91,7 +91,8 @@ int sexOf(void*, std::int64_t person, std::int32_t* sex) {
 }  // namespace
 
 olvane_host hostOfJavaScript() {
-    return {nullptr, fatherOf, motherOf, spousesOf, childrenOf, isPreferredSpouse, isDead, dateOf, sexOf};
+    return {sizeof(olvane_host), nullptr,           fatherOf, motherOf, spousesOf,
+            childrenOf,          isPreferredSpouse, isDead,   dateOf,   sexOf};
 }
 
 }  // namespace olvane::js

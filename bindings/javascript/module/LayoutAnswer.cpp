@@ -70,7 +70,8 @@ using olvane::js::LayoutAnswer;
 OLVANE_EXPORT("set_options")
 void setOptions(float nodeWidth, float nodeHeight, float horzPadding, float vertPadding, float spouseLineStep,
                 float lineInset, std::uint32_t shown, std::int32_t generations, std::int32_t flagDepth) {
-    olvane::js::optionsToUse = {{nodeWidth, nodeHeight, horzPadding, vertPadding, spouseLineStep, lineInset},
+    olvane::js::optionsToUse = {sizeof(olvane_options),
+                                {nodeWidth, nodeHeight, horzPadding, vertPadding, spouseLineStep, lineInset},
                                 shown,
                                 generations,
                                 flagDepth};

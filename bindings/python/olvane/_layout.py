@@ -76,6 +76,7 @@ class _Answers:
     def callbacks(self) -> _native.HostStruct:
         """The eight callbacks, which must outlive the call that uses them."""
         return _native.HostStruct(
+            ctypes.sizeof(_native.HostStruct),
             None,
             _native.ParentCallback(self._father_of),
             _native.ParentCallback(self._mother_of),
@@ -369,6 +370,7 @@ def _options_struct(options: Options | None) -> _native.OptionsStruct:
     options = options or Options()
     sizes = options.sizes
     return _native.OptionsStruct(
+        ctypes.sizeof(_native.OptionsStruct),
         _native.SizesStruct(
             sizes.node_width,
             sizes.node_height,

@@ -25,6 +25,7 @@ class HostStruct(ctypes.Structure):
     """olvane_host"""
 
     _fields_ = [
+        ("struct_size", c_size_t),
         ("context", c_void_p),
         ("father_of", ParentCallback),
         ("mother_of", ParentCallback),
@@ -54,6 +55,7 @@ class OptionsStruct(ctypes.Structure):
     """olvane_options"""
 
     _fields_ = [
+        ("struct_size", c_size_t),
         ("sizes", SizesStruct),
         ("shown", c_uint32),
         ("generations", c_int32),

@@ -22,6 +22,7 @@ using unit::CallbackHost;
 // A host that allocates nothing of its own, so that every allocation is the library's.
 olvane_host bareHost() {
     olvane_host host = {};
+    host.struct_size = sizeof host;
     host.father_of = [](void*, std::int64_t, std::int64_t*) { return 0; };
     host.mother_of = host.father_of;
     host.spouses_of = [](void*, std::int64_t person, olvane_person_list* spouses) {

@@ -442,6 +442,22 @@ TEST(CThreads, withHalfAMegabyteOfStackHoldMostGenerations) {
 }
 #endif
 
+TEST(CStructs, ofAnotherSizeAreRefused) {
+    CallbackHost host(family("17"));
+    olvane_host callbacks = host.callbacks();
+    olvane_options options;
+    ASSERT_EQ(OLVANE_OK, olvane_options_default(&options));
+    EXPECT_EQ(OLVANE_OK, familyOf(callbacks, 17, &options).status);
+    for (const std::size_t change : {std::size_t{8}, ~std::size_t{7}, ~sizeof(olvane_host) + 1}) {
+        olvane_host wrongHost = callbacks;
+        wrongHost.struct_size += change;
+        EXPECT_EQ(OLVANE_INVALID_ARGUMENT, familyOf(wrongHost, 17).status);
+        olvane_options wrongOptions = options;
+        wrongOptions.struct_size += change;
+        EXPECT_EQ(OLVANE_INVALID_ARGUMENT, familyOf(callbacks, 17, &wrongOptions).status);
+    }
+}
+
 TEST(CVersion, hasThreeNumbers) {
     EXPECT_EQ(std::string(OLVANE_EXPECTED_VERSION), olvane_version());
 }

@@ -54,6 +54,7 @@ std::uint32_t shownOf(const support::CaseFile& request) {
 
 olvane_options optionsOf(const support::CaseFile& request) {
     olvane_options options;
+    options.struct_size = sizeof options;
     options.sizes = {request.size.nodeWidth,   request.size.nodeHeight,     request.size.horzPadding,
                      request.size.vertPadding, request.size.spouseLineStep, request.size.lineInset};
     options.shown = shownOf(request);
@@ -69,6 +70,7 @@ CallbackHost::CallbackHost(support::CaseFile family, bool recordTrace)
 
 olvane_host CallbackHost::callbacks() {
     olvane_host host = {};
+    host.struct_size = sizeof host;
     host.context = &source;
     host.father_of = [](void* context, std::int64_t person, std::int64_t* parent) {
         return answered([&] { *parent = sourceOf(context).fatherForPersonWithID(person); });
