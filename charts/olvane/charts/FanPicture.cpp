@@ -217,12 +217,14 @@ private:
         const Index cellOfSecond = fan_.cellOf(two[1]);
         const std::size_t before = picture_.marks.size();
         const std::int32_t number = lastNumber_ + 1;
-        bool coupleShown = !isCouple || partnersBorder(cellOfFirst, cellOfSecond, u);
+        const bool coupleBorders = !isCouple || partnersBorder(cellOfFirst, cellOfSecond, u);
+        bool coupleShown = coupleBorders;
         for (const kin::Place child : graph_.children(u)) {
             const Index cell = fan_.cellOf(child);
             if (cell == kNone) continue;
+            // A child of two of whom one has a cell elsewhere has a mark as well.
             const bool below = cells()[at(cell)].u == u && !cells()[at(cell)].isPartner && cell != 0 &&
-                               request_.fanOf == FanOf::descendants;
+                               coupleBorders && request_.fanOf == FanOf::descendants;
             const bool above = request_.fanOf == FanOf::ancestors &&
                                (cellOfFirst == kNone || borders(cellOfFirst, cell, u)) &&
                                (cellOfSecond == kNone || borders(cellOfSecond, cell, u));

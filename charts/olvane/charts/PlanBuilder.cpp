@@ -16,9 +16,18 @@ constexpr std::int8_t kNoRoom = 127;
 PlanBuilder::PlanBuilder(const kin::KinGraph& graph, const PlanSizes& sizes, const Selection& selection)
     : graph_(graph), selection_(selection), builder_(graph, sizes, plan_) {
     plan_.boxOf.assign(at(graph.personCount()), kNone);
+    std::size_t persons = 0;
     for (kin::Place person = 0; person < graph.personCount(); ++person) {
-        if (selection.shown[at(person)]) plan_.boxOf[at(person)] = kAwaitsBox;
+        if (!selection.shown[at(person)]) continue;
+        plan_.boxOf[at(person)] = kAwaitsBox;
+        ++persons;
     }
+    // At most so many; a list that grows by doubling would take more than what stays unused here.
+    plan_.households.reserve(persons);
+    plan_.persons.reserve(persons);
+    plan_.householdOf.reserve(persons);
+    plan_.boxX.reserve(persons);
+    plan_.boxWidth.reserve(persons);
 }
 
 Plan PlanBuilder::build(kin::Place focus) {
