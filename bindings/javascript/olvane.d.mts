@@ -187,7 +187,7 @@ export interface PictureOptions {
     ways?: "blood" | "marriage" | "both" | undefined;
     /** Kinship: how many ways are drawn, the nearest first, and 0 for all; 8. */
     mostWays?: number | undefined;
-    /** Everybody: how many second parent links may become marks, -1 for as many as serve; -1. */
+    /** Everybody: how many second parent links become marks, -1 for all of them; 0. */
     marks?: number | undefined;
     /** Everybody: steps of work, 0 to 100; 1. */
     effort?: number | undefined;
@@ -230,6 +230,15 @@ export interface PictureArc {
     readonly ring: number;
     readonly from: number;
     readonly to: number;
+    /** The box at which its line of descent begins: a grandparent's; null nearer to the middle. */
+    readonly line: PictureIndex | null;
+}
+
+/** Ring i of a round chart reaches from radii[i] to radii[i + 1] around its middle. */
+export interface PictureRings {
+    readonly radii: readonly number[];
+    readonly middleX: number;
+    readonly middleY: number;
 }
 
 export interface PictureLine {
@@ -268,6 +277,8 @@ export interface Picture {
     readonly focus: PictureIndex;
     readonly boxes: readonly PictureBox[];
     readonly arcs: readonly PictureArc[];
+    /** Of a round chart; else null. */
+    readonly rings: PictureRings | null;
     readonly families: readonly PictureFamily[];
     readonly marks: readonly PictureMark[];
 }

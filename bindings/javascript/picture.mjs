@@ -9,7 +9,7 @@ const ROLES = ["marriage", "drop", "bar", "stem", "link"];
 const STYLES = ["married", "divorced", "unmarried", "unknown"];
 const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
-const HEAD = 8;
+const HEAD = 11;
 
 function boxAt(n, at, index) {
     return {
@@ -62,7 +62,8 @@ function markAt(n, at) {
 
 /** The picture of a view; numbers may be memory of the module's, which is not kept. */
 export function pictureFrom(view, numbers) {
-    const [boxCount, arcCount, familyCount, memberCount, lineCount, bridgeCount, markCount, focus] = numbers;
+    const [boxCount, arcCount, familyCount, memberCount, lineCount, bridgeCount, markCount, focus, ringCount, middleX, middleY] =
+        numbers;
     // Lists refer to those behind them, so each is read where it lies before any is put together.
     const starts = {};
     let at = HEAD;
@@ -71,7 +72,8 @@ export function pictureFrom(view, numbers) {
         at += count * size;
     };
     place("boxes", boxCount, 13);
-    place("arcs", arcCount, 3);
+    place("arcs", arcCount, 4);
+    place("rings", ringCount, 1);
     place("families", familyCount, 7);
     place("members", memberCount, 2);
     place("lines", lineCount, 8);
@@ -86,11 +88,16 @@ export function pictureFrom(view, numbers) {
         view,
         focus,
         boxes: list("boxes", boxCount, 13, (start, index) => boxAt(numbers, start, index)),
-        arcs: list("arcs", arcCount, 3, (start) => ({
+        arcs: list("arcs", arcCount, 4, (start) => ({
             ring: numbers[start],
             from: numbers[start + 1],
             to: numbers[start + 2],
+            line: numbers[start + 3] < 0 ? null : numbers[start + 3],
         })),
+        rings:
+            ringCount === 0
+                ? null
+                : { radii: Array.from(numbers.subarray(starts.rings, starts.rings + ringCount)), middleX, middleY },
         families: list("families", familyCount, 7, (start) => familyAt(numbers, start, members, lines)),
         marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
     };

@@ -39,7 +39,7 @@ const OPTIONS = {
     angle: { least: 90, most: 360, usual: 360 },
     ways: { words: WAYS, usual: "both" },
     mostWays: { least: 0, most: MOST, usual: 8 },
-    marks: { least: -1, most: MOST, usual: -1 },
+    marks: { least: -1, most: MOST, usual: 0 },
     effort: { least: 0, most: 100, usual: 1 },
     unknownParents: { flag: true, usual: true },
     width: { size: true, usual: 55 },

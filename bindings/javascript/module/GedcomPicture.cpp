@@ -68,7 +68,7 @@ charts::ViewRequest requestOf(kin::Place focus) {
     chart.fanAngle = options.next<int>();
     chart.ways = options.next<charts::WayChoice>();
     chart.mostWays = options.next<int>();
-    chart.mostMarks = options.next<int>();
+    chart.marks = options.next<int>();
     chart.effort = options.next<int>();
     request.unknownParents = options.flag();
     chart.sizes.boxWidth = static_cast<float>(options.number());

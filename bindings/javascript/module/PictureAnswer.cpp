@@ -49,17 +49,19 @@ void appendMark(std::vector<double>& numbers, const picture::Mark& mark) {
 
 std::vector<double> numbersOf(const picture::Picture& picture) {
     std::vector<double> numbers;
-    numbers.reserve(8 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
+    numbers.reserve(11 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
                     kLineNumbers * picture.lines.size());
     append(numbers,
            {static_cast<double>(picture.boxes.size()), static_cast<double>(picture.arcs.size()),
             static_cast<double>(picture.families.size()), static_cast<double>(picture.members.size()),
             static_cast<double>(picture.lines.size()), static_cast<double>(picture.bridges.size()),
-            static_cast<double>(picture.marks.size()), static_cast<double>(picture.focus)});
+            static_cast<double>(picture.marks.size()), static_cast<double>(picture.focus),
+            static_cast<double>(picture.ringRadii.size()), picture.middleX, picture.middleY});
     for (const picture::Box& box : picture.boxes) appendBox(numbers, box);
     for (const picture::Arc& arc : picture.arcs) {
-        append(numbers, {static_cast<double>(arc.ring), arc.from, arc.to});
+        append(numbers, {static_cast<double>(arc.ring), arc.from, arc.to, static_cast<double>(arc.line)});
     }
+    numbers.insert(numbers.end(), picture.ringRadii.begin(), picture.ringRadii.end());
     for (const picture::Family& family : picture.families) appendFamily(numbers, family);
     for (std::size_t i = 0; i < picture.members.size(); ++i) {
         append(numbers,

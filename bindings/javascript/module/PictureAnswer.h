@@ -10,8 +10,8 @@
 namespace olvane::js {
 
 // A picture as one run of numbers, which JavaScript reads faster than structs or text: first how many boxes,
-// arcs, families, members, lines, bridges and marks there are and the box of the focus, then each of them in the
-// order that picture.mjs reads.
+// arcs, families, members, lines, bridges and marks there are, the box of the focus, how many rings and their
+// middle; then each of them in the order that picture.mjs reads.
 std::vector<double> numbersOf(const picture::Picture& picture);
 
 }  // namespace olvane::js

@@ -10,6 +10,7 @@
 import { prefersStillness, svg } from "../base/dom";
 import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
+import { arcPath } from "./arcArt";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 import { drawFamily } from "./familyLines";
@@ -368,7 +369,7 @@ export class Scene {
         if (this.activeBox) this.handle(this.activeBox)?.focus({ preventScroll: true });
     }
 
-    private handle(box: Box): SVGRectElement | undefined {
+    private handle(box: Box): SVGElement | undefined {
         const element = this.elements.get(box);
         return element && handleOf(element);
     }
@@ -420,10 +421,11 @@ export class Scene {
 // All boxes of a picture, with nothing in them: a path for each sex.
 export function overviewPaths(picture: Picture): SVGPathElement[] {
     const paths = new Map<string, string[]>();
-    for (const { person, sex, x, y, width, height } of picture.boxes) {
+    for (const box of picture.boxes) {
+        const { person, sex, x, y, width, height } = box;
         const kind = person ? sex : "missing";
         const list = paths.get(kind) ?? [];
-        list.push(`M${x} ${y}h${width}v${height}h${-width}z`);
+        list.push(box.arc ? arcPath(box.arc, { x: 0, y: 0 }) : `M${x} ${y}h${width}v${height}h${-width}z`);
         paths.set(kind, list);
     }
     return [...paths].map(([kind, list]) => svg("path", { class: kind, d: list.join("") }));

@@ -7,6 +7,8 @@
 
 import type { Sex } from "olvane";
 import { svg } from "../base/dom";
+import type { Box } from "../view/Picture";
+import { appendArc, lineClass } from "./arcArt";
 import { kSilhouettes } from "../base/silhouettes";
 import { fitLine, fitName, textWidth } from "./textFit";
 
@@ -47,18 +49,23 @@ const kFigureScale = 0.56;
 // Square corners for men, round ones for women, in between for everybody else.
 const kCorners: Record<Sex, number> = { male: 3, female: 16, other: 8 };
 
-export function drawBox(look: BoxLook, sizes: Extent): SVGGElement {
+export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     const classes = [
         "box",
         look.person ? look.sex : "missing",
         look.isFocus && "focus",
         look.repeated && "repeated",
+        sizes.arc && lineClass(sizes.arc),
     ];
     const box = svg("g", {
         class: classes.filter(Boolean).join(" "),
         "data-person-id": look.person || null,
         "data-xref": look.xref || null,
     });
+    if (sizes.arc) {
+        appendArc(box, look, sizes, sizes.arc);
+        return box;
+    }
     appendFrame(box, look, sizes);
     if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
@@ -69,7 +76,7 @@ export function drawBox(look: BoxLook, sizes: Extent): SVGGElement {
 }
 
 // Draws a box anew without letting go of its element, on which the keys may stand.
-export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Extent): void {
+export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Box): void {
     const fresh = drawBox(look, sizes);
     const handle = handleOf(box);
     handle.setAttribute("aria-label", look.label);
@@ -79,8 +86,8 @@ export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Extent): void
 }
 
 // What takes the keys and is read out: the frame. The texts beside it are for the eye alone.
-export function handleOf(box: SVGGElement): SVGRectElement {
-    return box.querySelector<SVGRectElement>(":scope > .frame")!;
+export function handleOf(box: SVGGElement): SVGElement {
+    return box.querySelector<SVGElement>(":scope > .frame")!;
 }
 
 function appendFrame(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {

@@ -5,7 +5,7 @@
 // box to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
 // upper-left corner.
 
-import type { PictureArc, PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
+import type { PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
 import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
 import type { ChartDirection, ViewName } from "../base/views";
 
@@ -28,6 +28,20 @@ export interface Box {
     readonly hidden: PictureBox["hidden"];
     // Numbers of the marks that stand at the box.
     readonly marks: readonly number[];
+    // Its piece of a ring, in a round chart.
+    readonly arc: BoxArc | null;
+}
+
+/** A piece of a ring: angles in degrees clockwise from the top, radii and middle in points. */
+export interface BoxArc {
+    readonly from: number;
+    readonly to: number;
+    readonly inner: number;
+    readonly outer: number;
+    readonly middleX: number;
+    readonly middleY: number;
+    // Counts the lines of descent of the chart from 0; -1 for the boxes near the middle.
+    readonly line: number;
 }
 
 /** A family as the scene draws it: its lines, and the rectangle that they fill. */
@@ -39,7 +53,6 @@ export interface FamilyLines {
 
 export class Picture {
     readonly boxes: readonly Box[];
-    readonly arcs: readonly PictureArc[];
     readonly families: readonly FamilyLines[];
     readonly marks: readonly PictureMark[];
     readonly bounds: Rectangle;
@@ -58,8 +71,8 @@ export class Picture {
         values: PictureValues,
     ) {
         const numbers = markNumbers(values.marks);
-        this.boxes = values.boxes.map((box) => this.boxOf(box, values.boxes, numbers));
-        this.arcs = values.arcs;
+        const lines = [...new Set(values.arcs.map((arc) => arc.line))].filter((line) => line !== null);
+        this.boxes = values.boxes.map((box, i) => this.boxOf(box, values, numbers, arcOf(values, i, lines)));
         this.marks = values.marks;
         this.families = values.families.map((family, index) => this.linesOf(family, index));
         const drawn = this.families.filter(({ family }) => family.lines.length > 0);
@@ -70,7 +83,7 @@ export class Picture {
     }
 
     get isRound(): boolean {
-        return this.arcs.length > 0;
+        return this.boxes[0]?.arc !== null;
     }
 
     areaOf(box: Box): Rectangle {
@@ -103,13 +116,18 @@ export class Picture {
         return this.byPerson.has(person);
     }
 
-    private boxOf(from: PictureBox, all: readonly PictureBox[], marks: ReadonlyMap<number, number[]>): Box {
+    private boxOf(
+        from: PictureBox,
+        { boxes: all }: PictureValues,
+        marks: ReadonlyMap<number, number[]>,
+        arc: BoxArc | null,
+    ): Box {
         const { index, id: person, sex, x, y, width, height, flag, hidden } = from;
         const child = from.childOf === null ? 0 : all[from.childOf]!.id;
         const base = person ? String(person) : `${sex} parent of ${child}`;
         let key = base;
         for (let copy = 1; this.byKey.has(key); ++copy) key = base + "#" + copy;
-        const box = { index, key, person, child, sex, x, y, width, height, flag, hidden, marks: marks.get(index) ?? [] };
+        const box = { index, key, person, child, sex, x, y, width, height, flag, hidden, marks: marks.get(index) ?? [], arc };
         this.byKey.set(key, box);
         const copies = this.byPerson.get(person);
         if (copies) copies.push(box);
@@ -134,6 +152,21 @@ export class Picture {
         }
         return lines;
     }
+}
+
+function arcOf({ arcs, rings }: PictureValues, index: number, lines: readonly number[]): BoxArc | null {
+    const arc = arcs[index];
+    if (!arc || !rings) return null;
+    const { radii, middleX, middleY } = rings;
+    return {
+        from: arc.from,
+        to: arc.to,
+        inner: radii[arc.ring] ?? 0,
+        outer: radii[arc.ring + 1] ?? 0,
+        middleX,
+        middleY,
+        line: arc.line === null ? -1 : lines.indexOf(arc.line),
+    };
 }
 
 function markNumbers(marks: readonly PictureMark[]): ReadonlyMap<number, number[]> {
