@@ -99,7 +99,7 @@ private:
     Index boxOf(TypedLayout::Index box) const {
         if (box < 0 || at(box) >= layout_.boxes.size()) return kNone;
         const TypedLayout::Index first = layout_.boxes[at(box)].repeatOf;
-        if (first != TypedLayout::kNone && first >= 0 && first < box) return boxOf_[at(first)];
+        if (first >= 0 && first < box) return boxOf_[at(first)];
         return boxOf_[at(box)];
     }
 
