@@ -21,7 +21,8 @@ Json segmentJson(const LayoutSegment& segment) {
     return {{"x1", segment.x1}, {"y1", segment.y1}, {"x2", segment.x2}, {"y2", segment.y2}};
 }
 
-Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const std::vector<bool>& living) {
+Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const std::vector<bool>& living,
+             const gedcom::HiddenNames& hiddenNames) {
     Json json;
     json["id"] = record.id;
     json["x"] = record.x;
@@ -35,7 +36,7 @@ Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const s
     } else if (!living.empty() && living[static_cast<std::size_t>(record.id - 1)]) {
         json["living"] = true;
     } else {
-        json["person"] = personJson(data, static_cast<gedcom::PersonId>(record.id));
+        json["person"] = personJson(data, static_cast<gedcom::PersonId>(record.id), hiddenNames);
     }
     return json;
 }
@@ -45,6 +46,7 @@ Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const s
 std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
                        const std::vector<LayoutRecord>& records, const std::vector<bool>& living) {
     const TreeSize size = sizeOf(request.boxes);
+    const gedcom::HiddenNames hiddenNames(data, living);
     Json json;
     json["format"] = kFormatVersion;
     json["view"] = request.view == View::pedigree ? "pedigree" : "family";
@@ -52,7 +54,8 @@ std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, c
     json["boxWidth"] = static_cast<int>(size.nodeWidth);
     json["boxHeight"] = static_cast<int>(size.nodeHeight);
     json["boxes"] = Json::array();
-    for (const LayoutRecord& record : records) json["boxes"].push_back(boxJson(data, record, living));
+    for (const LayoutRecord& record : records)
+        json["boxes"].push_back(boxJson(data, record, living, hiddenNames));
     return json.dump(1, ' ', false, Json::error_handler_t::replace);
 }
 

@@ -14,9 +14,9 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 void addEvent(const gedcom::GedcomData& data, gedcom::PersonId id, const char* name, std::string_view tag,
-              const gedcom::GedcomDate& date, Json& json) {
-    if (date.isGiven()) json[name] = dateJson(date);
-    const std::string_view place = placeOf(data, id, tag);
+              const gedcom::GedcomDate& date, const gedcom::HiddenNames& hiddenNames, Json& json) {
+    if (!hiddenNames.shownPlace(date.written).empty()) json[name] = dateJson(date);
+    const std::string_view place = hiddenNames.shownPlace(placeOf(data, id, tag));
     if (!place.empty()) json[std::string(name) + "Place"] = std::string(place);
 }
 
@@ -58,18 +58,18 @@ Json dateJson(const gedcom::GedcomDate& date) {
     return json;
 }
 
-Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id) {
+Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id, const gedcom::HiddenNames& hiddenNames) {
     const gedcom::Person& person = data.person(id);
     const gedcom::PersonName& name = data.firstName(id);
     Json json;
-    json["xref"] = std::string(person.xref);
+    json["xref"] = std::string(hiddenNames.shownText(person.xref));
     json["name"] = gedcom::displayName(name);
     json["given"] = std::string(name.given);
     json["surname"] = std::string(name.surname);
     json["sex"] = sexName(person.sex);
     json["dead"] = person.dead;
-    addEvent(data, id, "birth", "BIRT", person.birth, json);
-    addEvent(data, id, "death", "DEAT", person.death, json);
+    addEvent(data, id, "birth", "BIRT", person.birth, hiddenNames, json);
+    addEvent(data, id, "death", "DEAT", person.death, hiddenNames, json);
     return json;
 }
 

@@ -8,6 +8,7 @@
 #include <nlohmann/json.hpp>
 
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/gedcom/HiddenNames.h>
 
 namespace olvane::cli {
 
@@ -22,7 +23,8 @@ std::string_view placeOf(const gedcom::GedcomData& data, gedcom::PersonId id, st
 nlohmann::ordered_json dateJson(const gedcom::GedcomDate& date);
 
 // What a file says of a person, each field by name; birth and death only where it gives a date, their places only where
-// facts were read.
-nlohmann::ordered_json personJson(const gedcom::GedcomData& data, gedcom::PersonId id);
+// facts were read. Texts that name somebody hidden are left out.
+nlohmann::ordered_json personJson(const gedcom::GedcomData& data, gedcom::PersonId id,
+                                  const gedcom::HiddenNames& hiddenNames = {});
 
 }  // namespace olvane::cli

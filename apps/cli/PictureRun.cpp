@@ -37,6 +37,7 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, LayoutRequest request, st
     : data_(data),
       request_(std::move(request)),
       hidden_(std::move(hidden)),
+      hiddenNames_(data, hidden_),
       graph_(gedcom::kinGraphOf(data)) {
     request_.chart.view = request_.view;
     request_.chart.sizes = sizesOf(request_.boxes);
@@ -89,13 +90,16 @@ picture::PictureFacts PictureRun::facts() const {
     picture::PictureFacts facts;
     facts.person = [this](std::int64_t id) {
         if (isHidden(id)) return std::string(kLivingJson);
-        return personJson(data_, static_cast<gedcom::PersonId>(id))
+        return personJson(data_, static_cast<gedcom::PersonId>(id), hiddenNames_)
             .dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);
     };
-    facts.familyXref = [this](std::uint32_t number) { return std::string(data_.family(number).xref); };
+    facts.familyXref = [this](std::uint32_t number) {
+        return std::string(hiddenNames_.shownText(data_.family(number).xref));
+    };
     facts.familyLabel = [this](std::uint32_t number) {
         const gedcom::GedcomDate& marriage = data_.family(number).marriage;
-        return marriage.isGiven() ? gedcom::displayYear(marriage) : std::string();
+        return hiddenNames_.shownPlace(marriage.written).empty() ? std::string()
+                                                                 : gedcom::displayYear(marriage);
     };
     return facts;
 }

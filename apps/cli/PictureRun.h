@@ -7,6 +7,7 @@
 #include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/gedcom/HiddenNames.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/picture/Picture.h>
 #include <olvane/picture/PictureJson.h>
@@ -43,6 +44,7 @@ private:
     const gedcom::GedcomData& data_;
     LayoutRequest request_;
     std::vector<bool> hidden_;
+    gedcom::HiddenNames hiddenNames_;
     kin::KinGraph graph_;
 };
 

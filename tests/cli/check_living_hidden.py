@@ -132,7 +132,8 @@ class Outputs:
             self.texts[view + " " + name] = chart.decode()
         for ending in (".svg", ".pdf", ".png"):
             picture = self.folder / ("out" + ending)
-            words = [self.command, "draw", self.path, "--focus", focus, "-o", str(picture), *self.hiding]
+            words = [self.command, "draw", self.path, "--focus", focus, "-o", str(picture),
+                     "--show", "dates,places,occupation,marriage", *self.hiding]
             if subprocess.run(words, capture_output=True, timeout=120).returncode == 0:
                 data = picture.read_bytes()
                 self.texts[ending + " " + name] = unpacked_pdf(data) if ending == ".pdf" else data.decode("utf-8", "replace")

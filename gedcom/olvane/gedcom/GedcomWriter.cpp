@@ -14,7 +14,7 @@
 #include <utility>
 
 #include <olvane/gedcom/GedcomDetails.h>
-#include <olvane/gedcom/NameSpotterInternal.h>
+#include <olvane/gedcom/HiddenNames.h>
 #include <olvane/gedcom/TagCodeInternal.h>
 
 namespace olvane::gedcom {
@@ -69,12 +69,7 @@ bool isYesOrNo(std::string_view value) {
 class Writer {
 public:
     Writer(const GedcomData& data, const WriteOptions& options)
-        : data_(data),
-          options_(options),
-          anybodyHidden_(std::find(options.hidden.begin(), options.hidden.end(), true) !=
-                         options.hidden.end()) {
-        if (anybodyHidden_) hiddenNames_ = spotHiddenNames();
-    }
+        : data_(data), options_(options), hiddenNames_(data, options.hidden) {}
 
     std::string text() && {
         nameRecords();
@@ -91,25 +86,8 @@ private:
         return id != 0 && id <= options_.hidden.size() && options_.hidden[id - 1];
     }
 
-    NameSpotter spotHiddenNames() const {
-        NameSpotter names;
-        for (PersonId id = 1; id <= data_.personCount(); ++id) {
-            isHidden(id) ? names.add(data_, id) : names.addOther(data_, id);
-        }
-        names.settle();
-        return names;
-    }
-
-    // What may be told: the text, or nothing where it names somebody hidden.
-    std::string_view shown(std::string_view text) const {
-        return anybodyHidden_ && hiddenNames_.isNamedIn(text) ? std::string_view() : text;
-    }
-
-    // As shown, and nothing either where a single word is a name of somebody hidden and of nobody else. For texts
-    // that may be about anybody; a place or a date may bear a name by chance.
-    std::string_view shownText(std::string_view text) const {
-        return anybodyHidden_ && hiddenNames_.isHintedAtIn(text) ? std::string_view() : shown(text);
-    }
+    std::string_view shown(std::string_view text) const { return hiddenNames_.shownPlace(text); }
+    std::string_view shownText(std::string_view text) const { return hiddenNames_.shownText(text); }
 
     bool isTold(std::string_view text) const { return text.empty() || !shownText(text).empty(); }
 
@@ -210,7 +188,7 @@ private:
     }
 
     void writeFact(const Fact& fact) {
-        const bool untold = anybodyHidden_ && isFreeText(fact);
+        const bool untold = hiddenNames_.isAnybodyHidden() && isFreeText(fact);
         const std::string_view value = untold ? std::string_view() : shownText(fact.value);
         const std::string_view place = shown(fact.place);
         const std::string_view date = shown(fact.date.written);
@@ -373,8 +351,7 @@ private:
 
     const GedcomData& data_;
     const WriteOptions& options_;
-    bool anybodyHidden_;
-    NameSpotter hiddenNames_;
+    HiddenNames hiddenNames_;
     std::unordered_set<std::string> taken_;
     std::vector<std::string> personXrefs_;
     std::vector<std::string> familyXrefs_;
