@@ -22,7 +22,7 @@ std::size_t at(std::int32_t place) {
 // Two uprights that would lie on one another cost more than any number of crossings.
 constexpr std::int32_t kCollision = 1 << 20;
 // Beyond this many overlapping pairs in one gap, bars are only kept apart.
-constexpr std::size_t kMostPairs = std::size_t{1} << 23;
+constexpr std::size_t kMostPairs = std::size_t{1} << 21;
 
 class GapRouting {
 public:
@@ -49,7 +49,6 @@ private:
         std::int32_t strand;
         double low;
         double high;
-        std::int32_t order = 0;
         std::int32_t track = -1;
     };
     // Two bars that overlap: what it costs to have one above the other.
@@ -220,51 +219,64 @@ private:
         return cost;
     }
 
-    // The bars from top to bottom: always one that no other should be above, or of which the least would be
-    // violated.
+    // The bars from top to bottom: always one that no other should be above; where they wait for one another in a
+    // ring, one of those that the fewest should be above.
     void sortBars() {
         const auto n = bars_.size();
         later_.fill(n, [this](const auto& visit) {
             for (std::size_t p = 0; p < pairs_.size(); ++p) {
-                const Pair& pair = pairs_[p];
-                if (pair.oneAbove < pair.otherAbove) visit(pair.one, static_cast<std::int32_t>(p));
-                if (pair.otherAbove < pair.oneAbove) visit(pair.other, static_cast<std::int32_t>(p));
+                if (isImportant(pairs_[p])) visit(upperOf(pairs_[p]), static_cast<std::int32_t>(p));
             }
         });
-        std::vector<std::int64_t> waiting(n, 0);
+        waiting_.assign(n, 0);
         for (const Pair& pair : pairs_) {
-            if (pair.oneAbove < pair.otherAbove) waiting[at(pair.other)] += importance(pair);
-            if (pair.otherAbove < pair.oneAbove) waiting[at(pair.one)] += importance(pair);
+            if (isImportant(pair)) waiting_[at(lowerOf(pair))] += weight(pair);
         }
-        using Entry = std::pair<std::int64_t, std::int32_t>;
-        std::priority_queue<Entry, std::vector<Entry>, std::greater<>> next;
-        for (std::size_t i = 0; i < n; ++i) next.push({waiting[i], static_cast<std::int32_t>(i)});
+        std::priority_queue<std::int32_t, std::vector<std::int32_t>, std::greater<>> ready;
+        for (std::size_t i = 0; i < n; ++i) {
+            if (waiting_[i] == 0) ready.push(static_cast<std::int32_t>(i));
+        }
         std::vector<std::uint8_t> taken(n, 0);
         byOrder_.clear();
-        while (!next.empty()) {
-            const auto [left, bar] = next.top();
-            next.pop();
-            if (taken[at(bar)] != 0 || left != waiting[at(bar)]) continue;
+        while (byOrder_.size() < n) {
+            if (ready.empty()) ready.push(leastWaiting(taken));
+            const std::int32_t bar = ready.top();
+            ready.pop();
             taken[at(bar)] = 1;
-            bars_[at(bar)].order = static_cast<std::int32_t>(byOrder_.size());
             byOrder_.push_back(bar);
             for (const std::int32_t p : later_[bar]) {
-                const Pair& pair = pairs_[at(p)];
-                const std::int32_t below = pair.one == bar ? pair.other : pair.one;
+                const std::int32_t below = lowerOf(pairs_[at(p)]);
                 if (taken[at(below)] != 0) continue;
-                waiting[at(below)] -= importance(pair);
-                next.push({waiting[at(below)], below});
+                waiting_[at(below)] -= weight(pairs_[at(p)]);
+                if (waiting_[at(below)] == 0) ready.push(below);
             }
         }
     }
 
-    // A pair that need not cross, or must not lie on one another, before all that cross either way.
-    static std::int64_t importance(const Pair& pair) {
-        const std::int32_t least = std::min(pair.oneAbove, pair.otherAbove);
-        const std::int32_t most = std::max(pair.oneAbove, pair.otherAbove);
-        if (most >= kCollision && least < kCollision) return std::int64_t{1} << 40;
-        return least == 0 ? std::int64_t{1} << 20 : 1;
+    std::int32_t leastWaiting(const std::vector<std::uint8_t>& taken) const {
+        std::int32_t least = -1;
+        for (std::size_t i = 0; i < waiting_.size(); ++i) {
+            if (taken[i] == 0 && (least < 0 || waiting_[i] < waiting_[at(least)]))
+                least = static_cast<std::int32_t>(i);
+        }
+        return least;
     }
+
+    static std::int32_t upperOf(const Pair& pair) {
+        return pair.oneAbove < pair.otherAbove ? pair.one : pair.other;
+    }
+    static std::int32_t lowerOf(const Pair& pair) {
+        return pair.oneAbove < pair.otherAbove ? pair.other : pair.one;
+    }
+
+    // A pair that need not cross, or whose uprights would lie on one another; which of two that cross either way is
+    // above does not matter.
+    static bool isImportant(const Pair& pair) {
+        const std::int32_t least = std::min(pair.oneAbove, pair.otherAbove);
+        return pair.oneAbove != pair.otherAbove && (least == 0 || collides(pair));
+    }
+    static bool collides(const Pair& pair) { return std::max(pair.oneAbove, pair.otherAbove) >= kCollision; }
+    static std::int64_t weight(const Pair& pair) { return collides(pair) ? std::int64_t{1} << 30 : 1; }
 
     std::int32_t takeTracks() {
         around_.fill(bars_.size(), [this](const auto& visit) {
@@ -283,7 +295,7 @@ private:
                 const Bar& other = bars_[at(pair.one == bar ? pair.other : pair.one)];
                 if (other.track < 0) continue;
                 used.push_back(other.track);
-                if (pair.oneAbove != pair.otherAbove) first = std::max(first, other.track + 1);
+                if (isImportant(pair)) first = std::max(first, other.track + 1);
             }
             std::sort(used.begin(), used.end());
             for (const std::int32_t track : used) {
@@ -324,6 +336,7 @@ private:
     NumberLists later_;
     NumberLists around_;
     std::vector<std::int32_t> byOrder_;
+    std::vector<std::int64_t> waiting_;  // by bar: for those that should be above it
 };
 
 }  // namespace

@@ -143,6 +143,19 @@ public:
         }
     }
 
+    // Everybody as far right as the number of strands from one end of the family to them. The end is the last
+    // that a first such walk meets (George and Liu 1979).
+    void startFromOneEnd() {
+        std::vector<std::int32_t> met(x_.size(), -1);
+        std::vector<std::int32_t> queue;
+        walkInBreadth(0, met, queue);
+        const std::int32_t end = queue.back();
+        std::fill(met.begin(), met.end(), -1);
+        queue.clear();
+        walkInBreadth(end, met, queue);
+        for (std::size_t i = 0; i < x_.size(); ++i) x_[i] = met[i];
+    }
+
     const std::vector<double>& run(int rounds) {
         normalise();
         for (int i = 0; i < rounds; ++i) {
@@ -155,6 +168,29 @@ public:
     }
 
 private:
+    void walkInBreadth(std::int32_t first, std::vector<std::int32_t>& met,
+                       std::vector<std::int32_t>& queue) const {
+        std::vector<std::uint8_t> strandMet(rows_.strands.size(), 0);
+        met[at(first)] = 0;
+        queue.push_back(first);
+        for (std::size_t next = 0; next < queue.size(); ++next) {
+            const std::int32_t node = queue[next];
+            for (const std::int32_t e : rows_.endsAt[node]) {
+                const std::int32_t s = rows_.strandOfEnd[at(e)];
+                if (strandMet[at(s)] != 0) continue;
+                strandMet[at(s)] = 1;
+                const Rows::Strand& strand = rows_.strands[at(s)];
+                const std::uint32_t count = strand.aboveCount + strand.belowCount;
+                for (std::uint32_t i = strand.firstEnd; i < strand.firstEnd + count; ++i) {
+                    const std::int32_t other = rows_.ends[i].node;
+                    if (met[at(other)] >= 0) continue;
+                    met[at(other)] = met[at(node)] + 1;
+                    queue.push_back(other);
+                }
+            }
+        }
+    }
+
     double middleOf(const Rows::Strand& strand) const {
         const std::uint32_t count = strand.aboveCount + strand.belowCount;
         double sum = 0;
@@ -370,8 +406,12 @@ RowOrder walkOrder(const Rows& rows) {
     return Walk(rows).run();
 }
 
+// Beyond this, so many rounds as would straighten a walk are too many, and distances are a better start.
+constexpr std::int32_t kMostNodesOfAWalk = 5'000;
+
 void straightenOrder(const Rows& rows, RowOrder& order, int rounds) {
     Straightening straightening(rows, order);
+    if (rows.nodeCount() > kMostNodesOfAWalk) straightening.startFromOneEnd();
     const std::vector<double>& x = straightening.run(rounds);
     for (auto& nodes : order.nodes) {
         std::stable_sort(nodes.begin(), nodes.end(),
@@ -391,12 +431,22 @@ std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t eff
     return sifting.effort();
 }
 
+// Whether every chain hangs from one strand at most, and every strand from one end: a walk then crosses nothing.
+bool isForest(const Rows& rows) {
+    for (std::int32_t node = 0; node < rows.nodeCount(); ++node) {
+        if (rows.strandsAbove[node].size() > 1) return false;
+    }
+    return std::all_of(rows.strands.begin(), rows.strands.end(),
+                       [](const Rows::Strand& strand) { return strand.aboveCount == 1; });
+}
+
 RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
-    // From a few rounds of straightening on, parts of the picture are straight; after many, all of it is.
+    // After a few rounds of straightening, parts of the picture are straight; after many, all of it is.
     constexpr std::array<int, 4> kShares = {1, 0, 30, 6};
-    constexpr std::int64_t kStepsOfARound = 4'000'000;
-    const std::int64_t most = std::clamp<std::int64_t>(kStepsOfARound / (rows.nodeCount() + 1), 60, 600);
+    constexpr std::int64_t kStepsOfRounds = 40'000'000;
+    const std::int64_t most = std::clamp<std::int64_t>(kStepsOfRounds / (rows.nodeCount() + 1), 60, 1500);
     const RowOrder walk = walkOrder(rows);
+    if (isForest(rows)) return walk;
     RowOrder best;
     std::int64_t fewest = -1;
     for (int i = 0; i < starts && i < static_cast<int>(kShares.size()) && fewest != 0; ++i) {
