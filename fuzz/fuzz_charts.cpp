@@ -49,6 +49,7 @@ ChartRequest requestFrom(const Bytes& choose, const KinGraph& graph) {
     request.fanOf = static_cast<FanOf>(choose(2));
     request.fanAngle = 90 + 10 * choose(28);
     request.ways = static_cast<WayChoice>(choose(3));
+    request.compact = choose(2) == 0;
     return request;
 }
 

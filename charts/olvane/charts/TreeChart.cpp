@@ -15,8 +15,14 @@ namespace {
 // A second line to parents may be so many times as long as the way from one box to the next.
 constexpr float kReachOfShortLinks = 4;
 
-// The view of the near is narrowed to this part of the width that its lines would like best.
+// Charts are narrowed to this part of the width that their lines would like best.
 constexpr double kShareOfNear = 0.8;
+constexpr double kShareOfCompact = 0.6;
+
+double shareOf(const ChartRequest& request) {
+    if (request.compact) return kShareOfCompact;
+    return request.view == View::near ? kShareOfNear : 1;
+}
 
 }  // namespace
 
@@ -24,7 +30,7 @@ picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& reque
                            const Selection& selection) {
     const PlanSizes sizes(request);
     Plan plan = PlanBuilder(graph, sizes, selection).build(request.focus);
-    PlanPlacement(plan, sizes.gapX(), request.view == View::near ? kShareOfNear : 1).place();
+    PlanPlacement(plan, sizes.gapX(), shareOf(request)).place();
     GapTracks gaps(plan);
     gaps.addShortLinks(static_cast<double>(kReachOfShortLinks * (sizes.usualWidth() + sizes.gapX())));
     gaps.assignTracks();

@@ -62,7 +62,8 @@ struct ChartRequest {
     std::span<const BoxSize> boxSizes;
     bool spouses = true;    // descendants, hourglass, relatives, fan of descendants
     bool siblings = false;  // ancestors, hourglass: the siblings of the focus and of its ancestors
-    bool compact = false;   // generations packed tighter, where the boxes allow it
+    bool compact =
+        false;  // generations packed tighter: parents need not stand over the middle of their children
 
     FanOf fanOf = FanOf::ancestors;
     double fanAngle = 360;  // degrees, 90 to 360

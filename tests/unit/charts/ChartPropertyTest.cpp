@@ -57,6 +57,7 @@ ChartRequest requestOf(unsigned seed, View view, const KinGraph& graph) {
     request.down = choose(4);
     request.direction = static_cast<Direction>(choose(4));
     request.spouses = choose(4) != 0;
+    request.compact = choose(4) == 0;
     return request;
 }
 

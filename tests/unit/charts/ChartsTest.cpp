@@ -204,6 +204,24 @@ TEST(Descendants, childrenOfAParentAloneHangFromThatParent) {
     EXPECT_EQ(drawn.faults(), 0U);
 }
 
+TEST(Descendants, areNarrowerWhenTheyArePackedTighter) {
+    // The two families below are four wide each, and their parents stand over the outer ends otherwise.
+    const KinFamily family{"A + B: C.m D.m E.m", "C + ?: f.m g.m h.m i.m", "E + ?: j.m k.m l.m m.m",
+                           "i + ?: n.m o.m p.m q.m", "j + ?: r.m s.m t.m u.m"};
+    ChartRequest request = requestFor(View::descendants, family["A"]);
+    const auto widthOf = [&] {
+        double right = 0;
+        for (const Box& box : chartOf(family.graph(), request).boxes) {
+            right = std::max(right, box.x + static_cast<double>(box.width));
+        }
+        return right;
+    };
+    const double usual = widthOf();
+    request.compact = true;
+    EXPECT_LT(widthOf(), usual);
+    EXPECT_EQ(Drawn(family, request).faults(), 0U);
+}
+
 TEST(Ancestors, parentsStandAboveTheirChildFatherLeft) {
     const KinFamily family{"Vater + Mutter: Ich.m", "Opa + Oma: Vater"};
     const Drawn drawn(family, requestFor(View::ancestors, family["Ich"]));
