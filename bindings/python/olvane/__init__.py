@@ -22,6 +22,7 @@ from olvane._family import ChildKind, Family, FamilyError, FamilyRow, FamilyStat
 from olvane._host import Host
 from olvane._layout import MOST_RELATIVES, family_layout, layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
+from olvane._picture import LineRole, MarkKind, Picture, PictureBox, PictureFamily, PictureLine, PictureMark, picture
 from olvane._records import Layout, Record, RecordKind, Segment
 
 __all__ = [
@@ -34,10 +35,17 @@ __all__ = [
     "HostError",
     "Layout",
     "LayoutError",
+    "LineRole",
+    "MarkKind",
     "MOST_RELATIVES",
     "NameKind",
     "Options",
     "Person",
+    "Picture",
+    "PictureBox",
+    "PictureFamily",
+    "PictureLine",
+    "PictureMark",
     "Record",
     "RecordKind",
     "Segment",
@@ -48,6 +56,7 @@ __all__ = [
     "family_layout",
     "layout",
     "layout_text",
+    "picture",
     "version",
 ]
 
