@@ -358,6 +358,14 @@ std::string fullName(const PersonLabel& label) {
     return first.empty() || second.empty() ? first + second : first + " " + second;
 }
 
+PersonLabel readableLabel(const DrawingContent& content, std::int64_t id) {
+    PersonLabel label = content.labelOf(id);
+    for (std::string* text : {&label.given, &label.surname, &label.birth, &label.death})
+        *text = cutText(*text);
+    for (std::string& detail : label.details) detail = cutText(detail);
+    return label;
+}
+
 void appendBoxDefinitions(std::string& svg) {
     svg +=
         "<defs>\n"

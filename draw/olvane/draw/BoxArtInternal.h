@@ -31,6 +31,9 @@ struct BoxFrame {
     bool hasHidden() const { return box->hasFlag ? box->flag : hiddenCount() > 0; }
 };
 
+// What is said of a person, each text cut to what can be read.
+PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);
+
 // The definitions that boxes refer to. Once, ahead of all boxes.
 void appendBoxDefinitions(std::string& svg);
 

@@ -12,6 +12,7 @@
 #include <cmath>
 #include <vector>
 
+#include <olvane/draw/BoxArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
@@ -164,7 +165,7 @@ private:
         const picture::Box& box = fan_.boxes[i];
         const bool isFocus = fan_.focus == static_cast<Index>(i);
         const PersonLabel label =
-            box.kind == picture::BoxKind::person ? content_.labelOf(box.id) : PersonLabel();
+            box.kind == picture::BoxKind::person ? readableLabel(content_, box.id) : PersonLabel();
         const std::size_t start = svg_.svg.size();
         svg_.svg += "<g role=\"img\"><title>" + escaped(titleOf(label, isFocus, marks)) +
                     "</title>\n<path d=\"" + shapeOf(i) + "\" fill=\"" + std::string(fillOf(i)) +
@@ -323,7 +324,7 @@ private:
         double widest = 0;
         for (std::size_t i = 0; i < lines_.size(); ++i) {
             const auto box = static_cast<std::size_t>(lines_[i]);
-            const std::string name = cleanText(fullName(content_.labelOf(fan_.boxes[box].id)));
+            const std::string name = cleanText(fullName(readableLabel(content_, fan_.boxes[box].id)));
             const std::string text = fitLine(name, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
             const int y = top + kLegendPitch * static_cast<int>(i);

@@ -149,7 +149,7 @@ private:
         });
         const auto upright = std::find_if(lines.begin(), lines.end(),
                                           [](const Line& line) { return line.role == LineRole::marriage; });
-        const std::string text = cleanText(content_.familyLabelOf(family.number));
+        const std::string text = cleanText(cutText(content_.familyLabelOf(family.number)));
         if (text.empty() || upright == lines.end()) return;
         const bool isFlat = marriage != lines.end();
         const Line& line = isFlat ? *marriage : *upright;

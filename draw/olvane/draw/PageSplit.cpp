@@ -107,7 +107,7 @@ void appendFoot(std::string& svg, const Grid& grid, int column, int row, const s
     const std::string y = px(grid.sheet.height - kMargin + kTick + kFootSize);
     svg += "<g font-family=\"" + std::string(kFontFamilies) + "\" font-size=\"" + px(kFootSize) +
            "\" fill=\"#444444\">\n<text x=\"" + px(kMargin) + "\" y=\"" + y + "\">" +
-           escaped(fitLine(cleanText(title), font, room)) + "</text>\n<text x=\"" +
+           escaped(fitLine(cleanText(cutText(title)), font, room)) + "</text>\n<text x=\"" +
            px(grid.sheet.width - kMargin) + "\" y=\"" + y + "\" text-anchor=\"end\">" + place +
            "</text>\n</g>\n";
 }
@@ -176,7 +176,7 @@ SvgPicture sheetOf(const SvgPicture& picture, const Grid& grid, int column, int 
         "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
         px(grid.sheet.width / kPxOfMm) + "mm\" height=\"" + px(grid.sheet.height / kPxOfMm) +
         "mm\" viewBox=\"0 0 " + px(grid.sheet.width) + " " + px(grid.sheet.height) + "\">\n<title>" +
-        escaped(title) + "</title>\n<rect width=\"100%\" height=\"100%\" fill=\"#ffffff\"/>\n";
+        escaped(cutText(title)) + "</title>\n<rect width=\"100%\" height=\"100%\" fill=\"#ffffff\"/>\n";
     sheet.svg += nestedPicture(picture, grid.sheet, windowOf(grid, column, row));
     if (grid.count() > 1) {
         appendSeams(sheet.svg, grid, column, row);

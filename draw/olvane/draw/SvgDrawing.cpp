@@ -152,7 +152,7 @@ private:
         if (frame.box->kind == picture::BoxKind::unknownParent) {
             appendPlaceholderBox(picture_.svg, frame, nameOfChild(*frame.box), theme());
         } else {
-            appendPersonBox(picture_.svg, frame, content_.labelOf(frame.box->id), theme());
+            appendPersonBox(picture_.svg, frame, readableLabel(content_, frame.box->id), theme());
         }
         picture_.boxes.push_back(
             {{frame.x, frame.y, frame.width, frame.height}, start, picture_.svg.size() - start});
@@ -161,7 +161,8 @@ private:
     std::string nameOfChild(const picture::Box& unknown) const {
         if (unknown.childOf == picture::kNone) return fullName(PersonLabel());
         const picture::Box& child = content_.picture.boxes[static_cast<std::size_t>(unknown.childOf)];
-        return fullName(child.kind == picture::BoxKind::person ? content_.labelOf(child.id) : PersonLabel());
+        return fullName(child.kind == picture::BoxKind::person ? readableLabel(content_, child.id)
+                                                               : PersonLabel());
     }
 
     // Below the picture, as wide as it needs; tells only what is there.
@@ -201,7 +202,7 @@ private:
 void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
     if (!options.headline) return;
     const Font font{kHeadlineSize, true};
-    const std::string text = fitLine(cleanText(options.title), font, picture.width - 2 * kMargin);
+    const std::string text = fitLine(cleanText(cutText(options.title)), font, picture.width - 2 * kMargin);
     picture.svg += "<text x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(kMargin + 12) +
                    "\" font-weight=\"bold\" font-size=\"" + px(kHeadlineSize) + "\" fill=\"" +
                    std::string(options.theme->text) + "\">" + escaped(text) + "</text>\n";
@@ -215,8 +216,8 @@ void openPage(SvgPicture& picture, const DrawingOptions& options) {
     picture.svg +=
         "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
         width + "\" height=\"" + height + "\" viewBox=\"0 0 " + width + " " + height +
-        "\" role=\"group\" aria-label=\"" + escaped(options.title) + "\">\n<title>" + escaped(options.title) +
-        "</title>\n";
+        "\" role=\"group\" aria-label=\"" + escaped(cutText(options.title)) + "\">\n<title>" +
+        escaped(cutText(options.title)) + "</title>\n";
     appendBoxDefinitions(picture.svg);
     picture.svg += "<rect width=\"" + width + "\" height=\"" + height + "\" fill=\"" +
                    std::string(options.theme->page) + "\"/>\n<g font-family=\"" + std::string(kFontFamilies) +

@@ -46,4 +46,12 @@ std::string px(double value) {
     return text;
 }
 
+std::string cutText(std::string_view text) {
+    constexpr std::size_t kMostBytes = 1000;
+    if (text.size() <= kMostBytes) return std::string(text);
+    std::size_t end = kMostBytes;
+    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80) --end;
+    return std::string(text.substr(0, end)) + "\xE2\x80\xA6";
+}
+
 }  // namespace olvane::draw

@@ -10,10 +10,12 @@
 
 namespace olvane::draw {
 
-// Fonts that a picture asks for, in this order. The first is the one that was measured, and none of the
-// others is wider.
+// Fonts that a picture asks for, in this order. The first is the one that was measured, and no other one for its
+// scripts is wider; behind those come fonts for scripts that they lack.
 inline constexpr std::string_view kFontFamilies =
-    "'DejaVu Sans', Verdana, 'Helvetica Neue', Arial, 'Liberation Sans', sans-serif";
+    "'DejaVu Sans', Verdana, 'Helvetica Neue', Arial, 'Liberation Sans', 'Noto Sans', 'Noto Sans CJK SC', "
+    "'PingFang SC', 'Microsoft YaHei', 'Noto Sans Arabic', 'Noto Sans Hebrew', 'Noto Sans Thai', "
+    "'Noto Sans Devanagari', 'Noto Color Emoji', sans-serif";
 
 // Size in px.
 struct Font {

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <map>
+#include <set>
 #include <span>
 #include <tuple>
 #include <unordered_map>
@@ -46,6 +47,7 @@ public:
         writeFamilies();
         numberRepeats();
         countHidden();
+        markUntold();
         RouteOptions route;
         route.direction = directionOf(layout_.view);
         routeLines(picture_, route);
@@ -97,7 +99,7 @@ private:
     Index boxOf(TypedLayout::Index box) const {
         if (box < 0 || at(box) >= layout_.boxes.size()) return kNone;
         const TypedLayout::Index first = layout_.boxes[at(box)].repeatOf;
-        if (first != TypedLayout::kNone && first >= 0 && first < box) return boxOf_[at(first)];
+        if (first >= 0 && first < box) return boxOf_[at(first)];
         return boxOf_[at(box)];
     }
 
@@ -313,12 +315,81 @@ private:
         box.hiddenChildren = countOf(children);
     }
 
+    // --- relations between persons who are shown, of which the view draws nothing
+
+    // The person's first box; kNone for who is not shown.
+    Index firstBox(kin::Place person) const { return person == kin::kNobody ? kNone : firstBox_[at(person)]; }
+
+    void markUntold() {
+        if (known_ == nullptr) return;
+        firstBox_.assign(at(known_->personCount()), kNone);
+        std::set<kin::UnionPlace> unions;
+        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
+            const kin::Place person = placeOfBox(static_cast<Index>(i));
+            if (person == kin::kNobody || picture_.boxes[i].repeat > 1) continue;
+            firstBox_[at(person)] = static_cast<Index>(i);
+            for (const kin::UnionPlace u : known_->unionsAsPartner(person)) unions.insert(u);
+        }
+        listTold();
+        for (const kin::UnionPlace u : unions) markUntoldOf(u);
+    }
+
+    using Relation = std::pair<kin::Place, kin::Place>;
+
+    void listTold() {
+        for (const Family& family : picture_.families) {
+            const auto parents = picture_.parents(family);
+            if (parents.size() == 2) tell(toldPartners_, placeOfBox(parents[0]), placeOfBox(parents[1]));
+            for (const Index child : picture_.children(family)) {
+                for (const Index parent : parents)
+                    toldParents_.emplace(placeOfBox(child), placeOfBox(parent));
+            }
+        }
+    }
+
+    // Both ways.
+    static void tell(std::set<Relation>& told, kin::Place a, kin::Place b) {
+        told.emplace(a, b);
+        told.emplace(b, a);
+    }
+
+    void markUntoldOf(kin::UnionPlace u) {
+        const auto& partners = known_->partners(u);
+        const Index one = firstBox(partners[0]);
+        const Index other = firstBox(partners[1]);
+        const bool areTold = partners[0] == partners[1] || toldPartners_.contains({partners[0], partners[1]});
+        if (one != kNone && other != kNone && !areTold) {
+            addMark(one, other, kNone, MarkKind::partnersElsewhere);
+            tell(toldPartners_, partners[0], partners[1]);
+        }
+        for (const kin::Place child : known_->children(u)) {
+            if (firstBox(child) == kNone) continue;
+            std::vector<Index> untold;
+            for (const kin::Place parent : partners) {
+                if (firstBox(parent) != kNone && toldParents_.emplace(child, parent).second) {
+                    untold.push_back(firstBox(parent));
+                }
+            }
+            if (untold.empty()) continue;
+            addMark(firstBox(child), untold[0], untold.size() > 1 ? untold[1] : kNone,
+                    MarkKind::parentsElsewhere);
+        }
+    }
+
+    void addMark(Index a, Index b, Index c, MarkKind kind) {
+        const std::int32_t number = picture_.marks.empty() ? 1 : picture_.marks.back().number + 1;
+        picture_.marks.push_back({{a, b, c}, number, kind});
+    }
+
     const TypedLayout& layout_;
     const LayoutPictureOptions& options_;
     const kin::KinGraph* known_;
     Picture picture_;
     std::vector<Index> boxOf_;  // by box of the layout
     std::vector<PictureFamily> families_;
+    std::vector<Index> firstBox_;  // by person
+    std::set<Relation> toldParents_;
+    std::set<Relation> toldPartners_;
 };
 
 }  // namespace

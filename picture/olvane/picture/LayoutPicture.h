@@ -27,7 +27,8 @@ struct LayoutPictureOptions {
 // that unknown parent if there is one. Without it, families are those of the layout.
 //
 // Holds: boxes stand in the order of the layout, without those that repeat another at the same place, and
-//        without unknown parents where the options leave them out. Persons with several boxes have marks.
+//        without unknown parents where the options leave them out. Persons with several boxes have marks, and so
+//        have known relations between shown persons of which the view draws nothing.
 // Fails: never, whatever the layout holds.
 Picture pictureOf(const TypedLayout& layout, const LayoutPictureOptions& options = LayoutPictureOptions());
 

@@ -197,6 +197,17 @@ TEST_F(Picture, markupInNamesStaysText) {
     EXPECT_THAT(svg, HasSubstr("&amp;amp;"));
 }
 
+TEST_F(Picture, aNameOfAnyLengthIsCut) {
+    std::string name;
+    for (int i = 0; i < 400000; ++i) name += "\xC3\xA9";
+    labels_[1] = label(name, name);
+    options_.title = name;
+    options_.headline = true;
+    const std::string svg = draw();
+    EXPECT_LT(svg.size(), 100000u);
+    EXPECT_THAT(svg, Not(HasSubstr("\xEF\xBF\xBD"))) << "cut between two characters";
+}
+
 TEST_F(Picture, livingPersonLeavesNoTrace) {
     labels_[2].birth = "1990";
     labels_[2].living = true;

@@ -73,7 +73,7 @@ std::set<std::int64_t> connectedWith(const KinGraph& graph, olvane::kin::Place f
 }
 
 TEST(Everybody, showsEachPersonOfTheFamilyOfTheFocusOnce) {
-    for (const Made& made : families(25)) {
+    for (const Made& made : families(40)) {
         const Picture picture = chart(made.graph, 0, true);
         std::multiset<std::int64_t> shown;
         for (const auto& box : picture.boxes) shown.insert(box.id);
@@ -86,7 +86,7 @@ TEST(Everybody, showsEachPersonOfTheFamilyOfTheFocusOnce) {
 }
 
 TEST(Everybody, drawsEveryLinkAndNothingThatCanBeMisread) {
-    for (const Made& made : families(25)) {
+    for (const Made& made : families(40)) {
         for (const int marks : {0, 3, -1}) {
             const Judgement j = olvane::picture::judge(chart(made.graph, marks), &made.graph);
             const std::vector<std::size_t> counts = {j.overlaps, j.hits,    j.tracks,  j.touches,
@@ -111,14 +111,14 @@ TEST(Everybody, isJudgedAlikeByThePlainCounts) {
 }
 
 TEST(Everybody, crossesNoLinesWhenEverySecondLinkIsAMark) {
-    for (const Made& made : families(25)) {
+    for (const Made& made : families(40)) {
         const Picture picture = chart(made.graph, -1);
         EXPECT_EQ(olvane::picture::judge(picture).crossings, 0U) << made.name;
     }
 }
 
 TEST(Everybody, makesNoMoreMarksThanAreAskedFor) {
-    for (const Made& made : families(25)) {
+    for (const Made& made : families(40)) {
         if (made.name[0] == 'h') continue;  // in these, boxes may have no room for all of their lines
         EXPECT_EQ(chart(made.graph, 0).marks.size(), 0U) << made.name;
         EXPECT_LE(chart(made.graph, 2).marks.size(), 2U) << made.name;
@@ -136,7 +136,7 @@ std::map<std::int64_t, double> middles(const Picture& picture) {
 // found by pushing children down, couples side by side together, until nothing moves or a row below all is reached.
 TEST(Everybody, putsParentsAboveTheirChildren) {
     int tried = 0;
-    for (const Made& made : families(50)) {
+    for (const Made& made : families(60)) {
         const Picture picture = chart(made.graph, 0);
         const std::map<std::int64_t, double> y = middles(picture);
         std::map<std::int64_t, int> row;
@@ -171,7 +171,7 @@ TEST(Everybody, putsParentsAboveTheirChildren) {
             }
         }
     }
-    EXPECT_GT(tried, 30);
+    EXPECT_GT(tried, 40);
 }
 
 TEST(Everybody, isTheSameForTheSameFamily) {

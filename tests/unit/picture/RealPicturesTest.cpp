@@ -78,6 +78,8 @@ TEST_P(RealPictures, everyLineKeepsClearOfEverythingElse) {
         TypedLayout layout;
         olvane::layOut(GetParam(), static_cast<std::int64_t>(id), manager, layoutOptions, layout);
         const Judgement j = judge(pictureOf(layout, options), &known);
+        EXPECT_EQ(j.untold, 0u) << "person " << id;
+        EXPECT_EQ(j.unmarked, 0u) << "person " << id;
         EXPECT_EQ(j.hits + j.tracks + j.touches + j.unjoined, 0u)
             << "person " << id << ": overlaps " << j.overlaps << ", hits " << j.hits << ", tracks "
             << j.tracks << ", touches " << j.touches << ", unjoined " << j.unjoined;
