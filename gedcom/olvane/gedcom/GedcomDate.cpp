@@ -584,9 +584,57 @@ DateMark takeSigns(std::string_view& text) {
 
 }  // namespace
 
+namespace {
+
+// Number of two or four digits, or 0 where other characters stand.
+int fixedNumber(std::string_view digits) {
+    int number = 0;
+    for (const char c : digits) {
+        if (!isDigit(c)) return 0;
+        number = number * 10 + (c - '0');
+    }
+    return number;
+}
+
+// "24 MAY 1819", "MAY 1819" and "1819", behind ABT, BEF, AFT or nothing: most dates of most files, read without looking at
+// words. False, with the date as it was, for any other form.
+bool readStandardDate(std::string_view text, GedcomDate& date) {
+    constexpr std::size_t kYear = 4;
+    constexpr std::size_t kMonthAndSpace = 4;
+    DateMark mark = DateMark::exact;
+    if (text.size() >= 2 * kYear && text[3] == ' ') {
+        const std::uint32_t word = code(text.substr(0, 3));
+        if (word == code("ABT")) mark = DateMark::about;
+        if (word == code("BEF")) mark = DateMark::before;
+        if (word == code("AFT")) mark = DateMark::after;
+        if (mark != DateMark::exact) text.remove_prefix(kMonthAndSpace);
+    }
+    if (text.size() < kYear) return false;
+    CalendarDate read = {fixedNumber(text.substr(text.size() - kYear)), 0, 0};
+    text.remove_suffix(kYear);
+    if (text.size() >= kMonthAndSpace && text.back() == ' ') {
+        read.month = placeIn(kMonths, code(text.substr(text.size() - kMonthAndSpace, 3)));
+        if (read.month == 0) return false;
+        text.remove_suffix(kMonthAndSpace);
+        if (!text.empty()) {
+            if (text.size() > 3 || text.back() != ' ') return false;
+            read.day = fixedNumber(text.substr(0, text.size() - 1));
+            if (read.day < 1 || read.day > daysInMonth(Calendar::gregorian, read.year, read.month))
+                return false;
+            text = {};
+        }
+    }
+    if (!text.empty() || read.year == 0) return false;
+    store({Calendar::gregorian, read, false, false}, mark, date);
+    return true;
+}
+
+}  // namespace
+
 GedcomDate parseGedcomDate(std::string_view written) {
     GedcomDate date;
     date.written = written;
+    if (readStandardDate(written, date)) return date;
     std::string_view text = written;
     const DateMark signs = takeSigns(text);
     Words words(text);
