@@ -11,6 +11,8 @@
 
 #include <gtest/gtest.h>
 
+#include <olvane_picture.h>
+
 #include <unit/bindings-c/CallbackHost.h>
 #include <unit/boundary/AllocationCountdown.h>
 #include <unit/boundary/DisturbedRequests.h>
@@ -122,6 +124,38 @@ TEST(CMemoryOfGoldenCases, thatRunsOutAnywhereIsAStatus) {
         expectAStatusWhereverMemoryRunsOut([&] { return view(callbacks, request.told.focus, &options); },
                                            {OLVANE_OUT_OF_MEMORY, OLVANE_HOST_FAILED});
     }
+}
+
+TEST(CMemoryOfPictures, thatRunsOutAnywhereIsAStatusAndLeavesNothing) {
+    const unit::Answer answer = unit::familyOf(lookingHost(), 17);
+    const auto makeOne = [&answer] {
+        olvane_picture* picture = nullptr;
+        const olvane_status status = olvane_picture_create(answer.layout.get(), nullptr, 1, &picture);
+        EXPECT_EQ(status == OLVANE_OK, picture != nullptr);
+        olvane_picture_free(picture);
+        return status;
+    };
+    ASSERT_EQ(OLVANE_OK, makeOne());  // what happens for the first time only
+    const std::int64_t before = unit::allocationsMade();
+    makeOne();
+    const std::int64_t needed = unit::allocationsMade() - before;
+    ASSERT_GT(needed, 20);
+    int madeAllTheSame = 0;
+    for (std::int64_t n = 1; n <= needed; ++n) {
+        const std::int64_t outstanding = unit::allocationsOutstanding();
+        olvane_status status = OLVANE_OK;
+        {
+            const unit::AllocationFailure failure(n);
+            status = makeOne();
+        }
+        EXPECT_EQ(outstanding, unit::allocationsOutstanding()) << n;
+        if (status == OLVANE_OK) {
+            ++madeAllTheSame;
+        } else {
+            EXPECT_EQ(OLVANE_OUT_OF_MEMORY, status) << n;
+        }
+    }
+    EXPECT_GE(2, madeAllTheSame);  // a stable sort does without its buffer
 }
 
 INSTANTIATE_TEST_SUITE_P(Hosts, CMemory, testing::Bool(),
