@@ -20,3 +20,10 @@ struct olvane_layout {
     int hostCode = 0;
     std::string failure;  // what a callback did; empty for other failures
 };
+
+namespace olvane::c {
+
+// The options of a C host as the engine takes them.
+LayoutOptions layoutOptionsOf(const olvane_options& options);
+
+}  // namespace olvane::c

@@ -341,6 +341,10 @@ olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olva
 
 }  // namespace
 
+olvane::LayoutOptions olvane::c::layoutOptionsOf(const olvane_options& options) {
+    return ::layoutOptionsOf(options);
+}
+
 const char* olvane_status_text(olvane_status status) {
     switch (status) {
         case OLVANE_OK:

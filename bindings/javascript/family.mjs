@@ -280,7 +280,7 @@ export class Family {
         try {
             const status = STATUSES[exports.answer_status(answer)];
             const isDone = status === "ok";
-            const text = withText || !isDone ? instance.text(exports.answer_text(answer)) : "";
+            const text = withText || !isDone ? instance.text(exports.answer_text(answer), exports.answer_text_length(answer)) : "";
             const records =
                 withText && isDone
                     ? []

@@ -100,11 +100,11 @@ export class GedcomFile {
     }
 
     layout(focus, options = undefined) {
-        return this.#run(focus, options).records;
+        return this.#run(focus, options, "records").records;
     }
 
     layoutText(focus, options = undefined) {
-        return this.#run(focus, options).text;
+        return this.#run(focus, options, "text").text;
     }
 
     picture(focus, options = {}) {
@@ -141,15 +141,14 @@ export class GedcomFile {
         this.#file = 0;
     }
 
-    #run(focus, options) {
+    #run(focus, options, wanted) {
         const file = this.#opened();
         if (this.persons[focusNumber(focus) - 1] === undefined) {
             throw new LayoutError("invalidPerson", `${this.name}: there is no person ${focus}`, "", []);
         }
         try {
-            return runLayout(this.#instance, null, focus, options, (view, person) =>
-                this.#instance.exports.gedcom_layout(file, view, person),
-            );
+            const ask = (view, person) => this.#instance.exports.gedcom_layout(file, view, person);
+            return runLayout(this.#instance, null, focus, options, ask, wanted);
         } catch (error) {
             // A file answers every question; it only ends a layout that asks for too much.
             if (error.status !== "hostFailed") throw error;

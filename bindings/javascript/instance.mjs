@@ -19,6 +19,8 @@ function decoderOf(label) {
 }
 
 const GREATEST_ID = 2 ** 31 - 1;
+// Persons in one list that a host answers: an endless iterator ends there.
+const MOST_RELATIVES = 1000000;
 
 function wholeId(id) {
     if (Number.isInteger(id) && id >= 1 && id <= GREATEST_ID) return id;
@@ -77,7 +79,10 @@ export class Instance {
     #broken = null;
 
     // The module's pointers and counts have 32 bits and no sign, which JavaScript takes for one.
-    text(pointer) {
+    text(pointer, length = -1) {
+        if (length >= 0) {
+            return utf8.decoder.decode(new Uint8Array(this.exports.memory.buffer, pointer >>> 0, length));
+        }
         const bytes = new Uint8Array(this.exports.memory.buffer);
         const begin = pointer >>> 0;
         return utf8.decoder.decode(bytes.subarray(begin, bytes.indexOf(0, begin)));
@@ -106,7 +111,7 @@ export class Instance {
     }
 
     /**
-     * What run gives, and what the host threw meanwhile, in an array of one; null if nothing. What breaks out of
+     * What run gives, and what the host threw meanwhile, with the question at which it did; null if nothing. What breaks out of
      * the module itself, such as a full stack, leaves it in the middle of its work, so it answers no more.
      */
     askingHost(host, run) {
@@ -125,53 +130,108 @@ export class Instance {
         }
     }
 
-    #ask(question, failure) {
-        try {
-            return question(this.#host);
-        } catch (error) {
-            this.#thrown = [error];
-            return failure;
+    #failed(error, failure, operation, ...asked) {
+        this.#thrown = [error, `${operation}(${asked.join(", ")})`];
+        return failure;
+    }
+
+    // A view of the memory, made anew where the memory has grown.
+    #memory = new Int32Array();
+
+    #store(pointer, number) {
+        if (this.#memory.buffer !== this.exports.memory.buffer) {
+            this.#memory = new Int32Array(this.exports.memory.buffer);
         }
+        this.#memory[pointer >>> 2] = number;
+        return 0;
     }
 
-    #askParent(question) {
-        return this.#ask((host) => parentId(question(host)), NaN);
+    #appendAll(list, ids) {
+        if (typeof ids?.[Symbol.iterator] !== "function") {
+            const shown = typeof ids?.then === "function" ? "a promise" : String(ids);
+            throw new TypeError(`a host answered ${shown} where a list of ids is due at once`);
+        }
+        let left = MOST_RELATIVES;
+        for (const id of ids) {
+            if (--left < 0) throw new RangeError(`a host answered more than ${MOST_RELATIVES} persons in one list`);
+            if (this.exports.append_person(list, wholeId(id)) !== 0) throw new OutOfMemory();
+        }
+        return 0;
     }
 
-    #askList(question, list) {
-        return this.#ask((host) => {
-            for (const id of question(host)) {
-                if (this.exports.append_person(list, wholeId(id)) !== 0) throw new OutOfMemory();
-            }
-            return 0;
-        }, 1);
+    // The engine compares no more than the first character of a date, so no more goes over.
+    #storeDate(date, text) {
+        if (text === "") return 0;
+        if (this.exports.set_date(date, text.codePointAt(0)) !== 0) throw new OutOfMemory();
+        return 0;
     }
 
-    #askNumber(question, pointer) {
-        return this.#ask((host) => {
-            // Asked before the memory is looked at, which a host may let grow.
-            const answer = question(host);
-            this.numbers(pointer, 1)[0] = answer;
-            return 0;
-        }, 1);
+    /** The eight questions. Each keeps what the host threw. */
+    #questions() {
+        return {
+            father_of: (person) => {
+                try {
+                    return parentId(this.#host.fatherOf(person));
+                } catch (error) {
+                    return this.#failed(error, NaN, "fatherOf", person);
+                }
+            },
+            mother_of: (person) => {
+                try {
+                    return parentId(this.#host.motherOf(person));
+                } catch (error) {
+                    return this.#failed(error, NaN, "motherOf", person);
+                }
+            },
+            spouses_of: (person, list) => {
+                try {
+                    return this.#appendAll(list, this.#host.spousesOf(person));
+                } catch (error) {
+                    return this.#failed(error, 1, "spousesOf", person);
+                }
+            },
+            children_of: (person, list) => {
+                try {
+                    return this.#appendAll(list, this.#host.childrenOf(person));
+                } catch (error) {
+                    return this.#failed(error, 1, "childrenOf", person);
+                }
+            },
+            is_preferred_spouse: (person, spouse, answer) => {
+                try {
+                    return this.#store(answer, truthNumber(this.#host.isPreferredSpouse(person, spouse)));
+                } catch (error) {
+                    return this.#failed(error, 1, "isPreferredSpouse", person, spouse);
+                }
+            },
+            is_dead: (person, answer) => {
+                try {
+                    return this.#store(answer, truthNumber(this.#host.isDead(person)));
+                } catch (error) {
+                    return this.#failed(error, 1, "isDead", person);
+                }
+            },
+            date_of: (person, isBirth, date) => {
+                try {
+                    return this.#storeDate(date, dateText(this.#host.dateOf(person, isBirth !== 0)));
+                } catch (error) {
+                    return this.#failed(error, 1, "dateOf", person, isBirth !== 0);
+                }
+            },
+            sex_of: (person, answer) => {
+                try {
+                    return this.#store(answer, sexNumber(this.#host.sexOf(person)));
+                } catch (error) {
+                    return this.#failed(error, 1, "sexOf", person);
+                }
+            },
+        };
     }
 
     #imports(module) {
         const imports = {
             olvane: {
-                father_of: (person) => this.#askParent((host) => host.fatherOf(person)),
-                mother_of: (person) => this.#askParent((host) => host.motherOf(person)),
-                spouses_of: (person, list) => this.#askList((host) => host.spousesOf(person), list),
-                children_of: (person, list) => this.#askList((host) => host.childrenOf(person), list),
-                is_preferred_spouse: (person, spouse, answer) =>
-                    this.#askNumber((host) => truthNumber(host.isPreferredSpouse(person, spouse)), answer),
-                is_dead: (person, answer) => this.#askNumber((host) => truthNumber(host.isDead(person)), answer),
-                date_of: (person, isBirth, date) =>
-                    this.#ask((host) => {
-                        const text = dateText(host.dateOf(person, isBirth !== 0));
-                        return this.withText(text, (pointer) => this.exports.set_date(date, pointer));
-                    }, 1),
-                sex_of: (person, answer) => this.#askNumber((host) => sexNumber(host.sexOf(person)), answer),
+                ...this.#questions(),
                 compose: (pointer, length, result) => {
                     const bytes = new Uint8Array(this.exports.memory.buffer, pointer >>> 0, length >>> 0);
                     const text = utf8.decoder.decode(bytes).normalize("NFC");

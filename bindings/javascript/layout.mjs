@@ -7,16 +7,22 @@ import { HostError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
 import { STATUSES, recordsFrom } from "./values.mjs";
 
-// The answer is read before anything is thrown, since it must be freed.
-function readAnswer(instance, answer) {
+// The answer is read before anything is thrown, since it must be freed; of one that is whole, what is wanted alone.
+function readAnswer(instance, answer, wanted) {
     if (answer === 0) return { status: STATUSES.indexOf("outOfMemory"), text: "", records: [] };
     const { exports } = instance;
     try {
-        return {
-            status: exports.answer_status(answer),
-            text: instance.text(exports.answer_text(answer)),
-            records: recordsFrom(instance.numbers(exports.answer_numbers(answer), exports.answer_count(answer))),
-        };
+        const status = exports.answer_status(answer);
+        const wantsAll = status !== 0 || wanted === undefined;
+        const text =
+            wantsAll || wanted === "text"
+                ? instance.text(exports.answer_text(answer), exports.answer_text_length(answer))
+                : "";
+        const records =
+            wantsAll || wanted === "records"
+                ? recordsFrom(instance.numbers(exports.answer_numbers(answer), exports.answer_count(answer)))
+                : [];
+        return { status, text, records };
     } finally {
         exports.answer_free(answer);
     }
@@ -27,16 +33,24 @@ function statusOf(result, thrown) {
     return thrown?.[0] instanceof OutOfMemory ? STATUSES.indexOf("outOfMemory") : result.status;
 }
 
-/** ask(view number, focus) runs the layout and gives the module's answer; host may be null where none is asked. */
-export function runLayout(instance, host, focus, options, ask) {
+function reasonOf(error) {
+    return error instanceof Error ? `${error.name}: ${error.message}` : String(error);
+}
+
+/**
+ * ask(view number, focus) runs the layout and gives the module's answer; host may be null where none is asked. wanted is
+ * "text" or "records"; both without it, and of a layout that failed.
+ */
+export function runLayout(instance, host, focus, options, ask, wanted = undefined) {
     const person = focusNumber(focus);
     const view = instance.useOptions(options, optionNumbers);
-    const { result, thrown } = instance.askingHost(host, () => readAnswer(instance, ask(view, person)));
+    const { result, thrown } = instance.askingHost(host, () => readAnswer(instance, ask(view, person), wanted));
     const number = statusOf(result, thrown);
     const status = STATUSES[number];
     if (status === "ok") return result;
     const message = instance.text(instance.exports.status_text(number));
     const { text, records } = result;
     if (status !== "hostFailed" || thrown === null) throw new LayoutError(status, message, text, records);
-    throw new HostError(status, message, text, records, { cause: thrown[0] });
+    const [cause, question] = thrown;
+    throw new HostError(status, `${question}: ${reasonOf(cause)}`, text, records, { cause });
 }

@@ -27,21 +27,22 @@ export class Olvane {
 
     layout(host, focus, options = undefined) {
         if (host instanceof Family) return host.layout(focus, options);
-        return this.#run(host, focus, options).records;
+        return this.#run(host, focus, options, "records").records;
     }
 
     layoutText(host, focus, options = undefined) {
         if (host instanceof Family) return host.layoutText(focus, options);
-        return this.#run(host, focus, options).text;
+        return this.#run(host, focus, options, "text").text;
     }
 
     readGedcom(bytes, name = "family.ged", options = {}) {
         return readGedcom(this.#instance, bytes, name, options);
     }
 
-    #run(host, focus, options) {
+    #run(host, focus, options, wanted) {
         const { exports } = this.#instance;
-        return runLayout(this.#instance, host, focus, options, (view, person) => exports.layout_host(view, person));
+        const ask = (view, person) => exports.layout_host(view, person);
+        return runLayout(this.#instance, host, focus, options, ask, wanted);
     }
 }
 

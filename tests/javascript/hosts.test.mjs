@@ -302,7 +302,6 @@ test("what finds no room in the module's memory is no failure of the host", asyn
     for (const changes of [
         { spousesOf: () => endless },
         { childrenOf: () => endless },
-        { dateOf: () => "1850".repeat(1e6) },
     ]) {
         assert.throws(() => full.layout(hostOf(changes), 1), {
             name: "LayoutError",
@@ -311,6 +310,9 @@ test("what finds no room in the module's memory is no failure of the host", asyn
         });
         assert.equal(full.layoutText(new TableHost(henry), 1), plain, "the next request is unaffected");
     }
+    // Of a date no more than its first character goes over, so a long one takes no memory.
+    const dateOf = () => "1850".repeat(1e6);
+    assert.equal(full.layoutText(hostOf({ dateOf }), 1), plain);
 });
 
 test("a module that broke off answers no more", async () => {
@@ -322,4 +324,36 @@ test("a module that broke off answers no more", async () => {
     const message = "the module broke off in a layout; load it anew";
     assert.throws(() => runLayout(instance, new TableHost(henry), 1, {}, breakOff), { message, cause });
     assert.throws(() => new Olvane(instance).layout(new TableHost(henry), 1), { message, cause });
+});
+
+test("a failure names the question, the person and the cause", () => {
+    const failing = (changes) => {
+        try {
+            olvane.layout(hostOf(changes), 1);
+        } catch (error) {
+            assert.ok(error instanceof HostError);
+            return error.message;
+        }
+        return assert.fail("nothing failed");
+    };
+    const raise = () => {
+        throw new Error("no row");
+    };
+    assert.equal(failing({ sexOf: raise }), "sexOf(1): Error: no row");
+    assert.equal(failing({ isPreferredSpouse: raise }), "isPreferredSpouse(1, 2): Error: no row");
+    assert.match(failing({ dateOf: raise }), /^dateOf\(\d, (true|false)\): Error: no row$/);
+    assert.match(failing({ fatherOf: () => "4" }), /^fatherOf\(\d\): TypeError: .* answered "4" where /);
+    assert.match(failing({ fatherOf: () => 2 ** 32 + 4 }), /^fatherOf\(\d\): RangeError: .* answered 4294967300 where /);
+    assert.match(failing({ spousesOf: async () => [] }), /^spousesOf\(\d\): TypeError: .*promise/);
+    assert.match(failing({ spousesOf: () => null }), /^spousesOf\(\d\): TypeError: .* answered null where a list/);
+});
+
+test("an endless list ends at a limit", () => {
+    const spousesOf = function* () {
+        for (;;) yield 2;
+    };
+    assert.throws(
+        () => olvane.layout(hostOf({ spousesOf }), 1),
+        (error) => error.message === "spousesOf(1): RangeError: a host answered more than 1000000 persons in one list",
+    );
 });

@@ -16,10 +16,11 @@
 #include <string_view>
 #include <vector>
 
-#include <olvane/boundary/FamilyViewLayout.h>
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/Family.h>
 #include <olvane/kin/FamilyDataSource.h>
+
+#include <LayoutInternal.h>
 
 #include "JsonText.h"
 #include "LayoutAnswer.h"
@@ -294,27 +295,6 @@ const char* jsonOrNull(const Write& write) {
     }
 }
 
-LayoutOptions layoutOptionsOf(const olvane_options& options) {
-    LayoutOptions chosen;
-    chosen.sizes.nodeWidth = options.sizes.node_width;
-    chosen.sizes.nodeHeight = options.sizes.node_height;
-    chosen.sizes.horzPadding = options.sizes.horz_padding;
-    chosen.sizes.vertPadding = options.sizes.vert_padding;
-    chosen.sizes.spouseLineStep = options.sizes.spouse_line_step;
-    chosen.sizes.lineInset = options.sizes.line_inset;
-    chosen.auntsUncles = (options.shown & OLVANE_SHOW_AUNTS_UNCLES) != 0;
-    chosen.cousins = (options.shown & OLVANE_SHOW_COUSINS) != 0;
-    chosen.siblings = (options.shown & OLVANE_SHOW_SIBLINGS) != 0;
-    chosen.siblingSpouses = (options.shown & OLVANE_SHOW_SIBLING_SPOUSES) != 0;
-    chosen.niecesNephews = (options.shown & OLVANE_SHOW_NIECES_NEPHEWS) != 0;
-    chosen.grandchildren = (options.shown & OLVANE_SHOW_GRANDCHILDREN) != 0;
-    chosen.greatGrandparents = (options.shown & OLVANE_SHOW_GREAT_GRANDPARENTS) != 0;
-    chosen.spousesOfChildren = (options.shown & OLVANE_SHOW_SPOUSES_OF_CHILDREN) != 0;
-    chosen.generations = options.generations;
-    chosen.flagDepth = options.flag_depth;
-    return chosen;
-}
-
 void appendBoxes(const TypedLayout& layout, std::vector<std::int32_t>& numbers) {
     numbers.reserve(layout.boxes.size() * 7 + layout.lines.size() * 4);
     for (const TypedLayout::Box& box : layout.boxes) {
@@ -334,7 +314,7 @@ void layOutFamily(HeldFamily& family, View view, double focus, bool withText, La
         answer.status = OLVANE_INVALID_PERSON;
         return;
     }
-    LayoutOptions options = layoutOptionsOf(nextOptions());
+    LayoutOptions options = c::layoutOptionsOf(nextOptions());
     options.withText = withText;
     TypedLayout layout;
     try {

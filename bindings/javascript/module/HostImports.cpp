@@ -33,8 +33,25 @@ OLVANE_EXPORT("append_person") int appendPerson(olvane_person_list* list, double
     return olvane_person_list_append(list, &whole, 1);
 }
 
-// text ends with a zero byte.
-OLVANE_EXPORT("set_date") int setDate(olvane_date* date, const char* text) {
+// The first character of a date, which is all that the engine looks at, as its number in Unicode.
+OLVANE_EXPORT("set_date") int setDate(olvane_date* date, std::uint32_t character) {
+    const std::uint32_t code =
+        character >= 0xD800 && character < 0xE000 ? 0xFFFD : character;  // no half of a pair
+    char text[5] = {};
+    char* end = text;
+    if (code < 0x80) {
+        *end++ = static_cast<char>(code);
+    } else if (code < 0x800) {
+        *end++ = static_cast<char>(0xC0 | code >> 6);
+    } else if (code < 0x10000) {
+        *end++ = static_cast<char>(0xE0 | code >> 12);
+        *end++ = static_cast<char>(0x80 | (code >> 6 & 0x3F));
+    } else {
+        *end++ = static_cast<char>(0xF0 | code >> 18);
+        *end++ = static_cast<char>(0x80 | (code >> 12 & 0x3F));
+        *end++ = static_cast<char>(0x80 | (code >> 6 & 0x3F));
+    }
+    if (code >= 0x80) *end = static_cast<char>(0x80 | (code & 0x3F));
     return olvane_date_set(date, text);
 }
 

@@ -92,6 +92,13 @@ OLVANE_EXPORT("answer_text") const char* answerText(const LayoutAnswer* answer) 
     return text;
 }
 
+OLVANE_EXPORT("answer_text_length") std::size_t answerTextLength(const LayoutAnswer* answer) {
+    const char* text = "";
+    std::size_t length = answer->text.size();
+    if (answer->layout) olvane_layout_text(answer->layout.get(), &text, &length);
+    return length;
+}
+
 OLVANE_EXPORT("answer_numbers") const std::int32_t* answerNumbers(const LayoutAnswer* answer) {
     return answer->numbers.data();
 }
