@@ -64,7 +64,7 @@ std::vector<gedcom::PersonId> PersonFinder::find(const std::string& text, std::s
 std::vector<gedcom::PersonId> PersonFinder::meant(const std::string& text) {
     if (const gedcom::PersonId person = byIdentifier(text); person != 0) return {person};
     const std::vector<kin::SearchHit> hits = index().find(text);
-    const auto byName = idsOf(hits, [](const kin::SearchHit& hit) { return hit.isByName(); });
+    auto byName = idsOf(hits, [](const kin::SearchHit& hit) { return hit.isByName(); });
     if (!byName.empty()) return byName;
     return idsOf(hits, [](const kin::SearchHit& hit) { return hit.fit == kin::Fit::whole; });
 }

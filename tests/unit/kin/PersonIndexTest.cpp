@@ -73,6 +73,7 @@ std::string text(const SearchHit& hit) {
 
 std::vector<std::int64_t> idsOf(const std::vector<SearchHit>& hits) {
     std::vector<std::int64_t> ids;
+    ids.reserve(hits.size());
     for (const SearchHit& hit : hits) ids.push_back(hit.id);
     return ids;
 }

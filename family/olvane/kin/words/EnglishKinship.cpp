@@ -44,7 +44,7 @@ std::string cousin(const BloodWords& way) {
     const int degree = std::min(way.up, way.down) - 1;
     const auto removed = static_cast<std::size_t>(std::abs(way.up - way.down));
     const auto ordinal = static_cast<std::size_t>(degree - 1);
-    const std::string word =
+    std::string word =
         (ordinal < kOrdinals.size() ? std::string(kOrdinals[ordinal]) : numeral(degree)) + " cousin";
     if (removed == 0) return word;
     return word + " " + (removed < kTimes.size() ? kTimes[removed] : std::to_string(removed) + " times") +

@@ -175,7 +175,7 @@ public:
     std::string self() const override { return "dieselbe Person"; }
     Noun relative(const BloodWords& way) const override { return noun(relativeWord(way)); }
     std::string relativeOnSide(const BloodWords& way) const override {
-        const std::string word = relativeWord(way).word;
+        std::string word = relativeWord(way).word;
         if (way.up < 2 || way.down > 1 || way.side == KinSide::none) return word;
         return word + (way.side == KinSide::father ? " väterlicherseits" : " mütterlicherseits");
     }

@@ -96,7 +96,7 @@ public:
     std::string self() const override { return "la misma persona"; }
     Noun relative(const BloodWords& way) const override { return noun(relativeWord(way), way.sex); }
     std::string relativeOnSide(const BloodWords& way) const override {
-        const std::string word = relativeWord(way);
+        std::string word = relativeWord(way);
         if (way.up < 2 || way.down > 1 || way.side == KinSide::none) return word;
         const bool endsFeminine = way.sex == Sex::female;
         const std::string side = way.side == KinSide::father ? "patern" : "matern";
