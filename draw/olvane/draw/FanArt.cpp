@@ -219,7 +219,12 @@ private:
         if (fan_.arcs[i].ring == 0) return appendMiddle(i, lines);
         const double depth = outerOf(i) - innerOf(i) - 2 * kPad;
         const double middle = (innerOf(i) + outerOf(i)) / 2;
-        const bool across = roomAcross(i, middle, kLargestName) >= std::min(kLeastAcross, depth);
+        double widest = 0;
+        for (const TextLine& line : lines) {
+            widest = std::max(widest, textWidth(line.text, {kLargestName, line.bold}));
+        }
+        const double room = roomAcross(i, middle, kLargestName * static_cast<double>(lines.size()));
+        const bool across = room >= kLeastAcross && (room >= widest || room >= depth);
         if (across) {
             appendAcross(i, lines, depth);
         } else {

@@ -129,13 +129,15 @@ private:
         for (const double place : picture_.bridgesOf(line)) places.push_back(frame_.x(place));
         std::sort(places.begin(), places.end());
         const std::string r = px(kBridge);
+        const std::string up = "a" + r + " " + r + " 0 0 1 " + r + " -" + r;
+        const std::string down = "a" + r + " " + r + " 0 0 1 " + r + " " + r;
         std::string path;
         for (std::size_t i = 0, next = 0; i < places.size(); i = next) {
             while (next < places.size() && places[next] - places[i == next ? i : next - 1] <= 2 * kBridge)
                 ++next;
-            path += "H" + px(places[i] - kBridge) + "a" + r + " " + r + " 0 0 1 " + r + " -" + r;
-            if (next - i > 1) path += "H" + px(places[next - 1]);
-            path += "a" + r + " " + r + " 0 0 1 " + r + " " + r;
+            path.append("H").append(px(places[i] - kBridge)).append(up);
+            if (next - i > 1) path.append("H").append(px(places[next - 1]));
+            path += down;
         }
         return path;
     }

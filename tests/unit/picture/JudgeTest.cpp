@@ -85,7 +85,7 @@ private:
 const bool kPicturesAreRegistered = [] {
     for (const auto& entry : std::filesystem::directory_iterator(OLVANE_PICTURES)) {
         if (entry.path().extension() != ".json") continue;
-        const std::filesystem::path path = entry.path();
+        const std::filesystem::path& path = entry.path();
         testing::RegisterTest("JudgedPicture", path.stem().c_str(), nullptr, nullptr, path.c_str(), 1,
                               [path]() -> testing::Test* { return new JudgedPicture(path); });
     }
@@ -185,7 +185,8 @@ TEST(Judge, judgesTensOfThousandsOfBoxes) {
         Box box;
         box.id = i + 1;
         box.x = 80.0 * (i % 4000);
-        box.y = 110.0 * (i / 4000);
+        const Index row = i / 4000;
+        box.y = 110.0 * row;
         box.width = 55;
         box.height = 80;
         picture.boxes.push_back(box);

@@ -207,6 +207,7 @@ TEST(LineRouter, whatCrossesHasABridge) {
 TEST(LineRouter, barsStandInTheOrderOfFewestCrossings) {
     Picture picture;
     std::vector<Index> parents;
+    parents.reserve(3);
     for (int i = 0; i < 3; ++i) parents.push_back(addBox(picture, 160 * i, 0));
     for (int i = 0; i < 3; ++i) {
         const Index one = addBox(picture, 160 * i + 200, 110);
