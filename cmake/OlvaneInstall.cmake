@@ -5,7 +5,12 @@
 
 include(CMakePackageConfigHelpers)
 
-install(TARGETS olvane_engine olvane_family EXPORT olvaneTargets
+# The C interface holds pictures too, and so needs their library where libraries are shared.
+set(libraries olvane_engine olvane_family)
+if(TARGET olvane_picture)
+  list(APPEND libraries olvane_picture)
+endif()
+install(TARGETS ${libraries} EXPORT olvaneTargets
   ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
   LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT dev
   FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR})
