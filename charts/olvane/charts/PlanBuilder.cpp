@@ -16,12 +16,8 @@ constexpr std::int8_t kNoRoom = 127;
 PlanBuilder::PlanBuilder(const kin::KinGraph& graph, const PlanSizes& sizes, const Selection& selection)
     : graph_(graph), selection_(selection), builder_(graph, sizes, plan_) {
     plan_.boxOf.assign(at(graph.personCount()), kNone);
-    std::size_t persons = 0;
-    for (kin::Place person = 0; person < graph.personCount(); ++person) {
-        if (!selection.shown[at(person)]) continue;
-        plan_.boxOf[at(person)] = kAwaitsBox;
-        ++persons;
-    }
+    for (const kin::Place person : selection.persons) plan_.boxOf[at(person)] = kAwaitsBox;
+    const std::size_t persons = selection.persons.size();
     // At most so many; a list that grows by doubling would take more than what stays unused here.
     plan_.households.reserve(persons);
     plan_.persons.reserve(persons);
@@ -157,16 +153,20 @@ void PlanBuilder::growAll(Index first) {
 // a parent of somebody placed, then anybody.
 void PlanBuilder::addLeftOver() {
     Index asked = 0;
-    for (kin::Place person = 0; person <= graph_.personCount(); ++person) {
+    const auto addParentsOfAll = [this, &asked] {
         while (asked < static_cast<Index>(plan_.households.size())) {
             const Index first = static_cast<Index>(plan_.households.size());
             growUpFrom(asked++, true);
             growAll(first);
         }
-        if (person == graph_.personCount()) break;
+    };
+    if (plan_.persons.size() == selection_.persons.size()) return;
+    addParentsOfAll();
+    for (const kin::Place person : selection_.persons) {
         if (plan_.boxOf[at(person)] != kAwaitsBox) continue;
         const Index added = builder_.add(person, 0);
         growAll(added);
+        addParentsOfAll();
     }
 }
 

@@ -62,33 +62,38 @@ public:
             for (const kin::UnionPlace u : graph_.unionsAsChild(person)) {
                 const auto& two = graph_.partners(u);
                 if (!isShown(two[0]) && !isShown(two[1])) continue;
-                for (const kin::Place child : graph_.children(u)) chosen_.shown[at(child)] = true;
+                for (const kin::Place child : graph_.children(u)) show(child);
             }
         }
     }
 
     void addSpouses() {
-        std::vector<bool> before = chosen_.shown;
-        for (kin::Place person = 0; person < graph_.personCount(); ++person) {
-            if (!before[at(person)]) continue;
-            for (const kin::UnionPlace u : graph_.unionsAsPartner(person)) {
-                const kin::Place other = graph_.otherPartner(u, person);
-                if (other != kin::kNobody) chosen_.shown[at(other)] = true;
+        const std::size_t end = chosen_.persons.size();
+        for (std::size_t i = 0; i < end; ++i) {
+            for (const kin::UnionPlace u : graph_.unionsAsPartner(chosen_.persons[i])) {
+                const kin::Place other = graph_.otherPartner(u, chosen_.persons[i]);
+                if (other != kin::kNobody) show(other);
             }
         }
     }
 
     void addPersons(const std::vector<kin::Place>& persons) {
-        for (const kin::Place person : persons) chosen_.shown[at(person)] = true;
+        for (const kin::Place person : persons) show(person);
     }
 
     bool isShown(kin::Place person) const { return person != kin::kNobody && chosen_.shown[at(person)]; }
     Selection take() { return std::move(chosen_); }
 
 private:
-    void addToLine(kin::Place person) {
-        chosen_.isLine[at(person)] = true;
+    void show(kin::Place person) {
+        if (chosen_.shown[at(person)]) return;
         chosen_.shown[at(person)] = true;
+        chosen_.persons.push_back(person);
+    }
+
+    void addToLine(kin::Place person) {
+        show(person);
+        chosen_.isLine[at(person)] = true;
         chosen_.line.push_back(person);
     }
 
@@ -112,7 +117,7 @@ private:
                     for (const kin::Place child : graph_.children(u)) {
                         if (met[at(child)]) continue;
                         met[at(child)] = true;
-                        chosen_.shown[at(child)] = true;
+                        show(child);
                         next.push_back(child);
                     }
                 }

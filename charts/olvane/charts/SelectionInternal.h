@@ -11,9 +11,11 @@ namespace olvane::charts {
 
 // Who is shown, and who of them is the focus or one of its ancestors.
 //
-// Holds: flags by person. Breadth first from the focus, so a limit of generations counts the shortest way.
+// Holds: flags by person. Breadth first from the focus, so a limit of generations counts the shortest way. The
+//        lists do not depend on where the data have a person.
 struct Selection {
     std::vector<bool> shown;
+    std::vector<kin::Place> persons;  // who is shown, in the order in which they were found
     std::vector<bool> isLine;
     std::vector<kin::Place> line;  // the focus, then its ancestors, the nearest first
 };
