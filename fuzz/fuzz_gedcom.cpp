@@ -23,6 +23,7 @@
 #include <olvane/kin/PersonIndex.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomFamily.h>
+#include <olvane/source/GedcomKin.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "Holds.h"
@@ -433,6 +434,20 @@ void lookAtSource(const GedcomData& data) {
     }
 }
 
+// Father and mother are the partners of the first union as a child.
+void lookAtKin(const GedcomData& data) {
+    const olvane::kin::KinGraph graph = kinGraphOf(data);
+    HOLDS(graph.personCount() == static_cast<olvane::kin::Place>(data.personCount()));
+    for (olvane::kin::Place place = 0; place < graph.personCount(); ++place) {
+        const Person& person = data.person(static_cast<PersonId>(place) + 1);
+        if (person.father == 0 && person.mother == 0) continue;
+        HOLDS(!graph.unionsAsChild(place).empty());
+        const auto& partners = graph.partners(graph.unionsAsChild(place).front());
+        HOLDS(partners[0] == static_cast<olvane::kin::Place>(person.father) - 1);
+        HOLDS(partners[1] == static_cast<olvane::kin::Place>(person.mother) - 1);
+    }
+}
+
 // Whether it ends is a matter of how many relatives there are, a father and a mother for everybody included.
 void lookAtLimit(const GedcomData& data) {
     GedcomDataSource source(data);
@@ -474,6 +489,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
         const GedcomData data = readGedcomBytes(text, "f", options);
         lookAtAll(data);
         lookAtSource(data);
+        lookAtKin(data);
         lookAtLimit(data);
         writeAll(data, options);
         if (options.facts && hiddenStep != 0) writeHidden(data, hiddenStep);

@@ -15,6 +15,7 @@
 #include <zip.h>
 
 #include <olvane/gedcom/GedcomError.h>
+#include <olvane/gedcom/GedcomMedia.h>
 
 namespace olvane::gedcom {
 namespace {
@@ -91,6 +92,25 @@ std::string unpackGedcom(const std::string& bytes, const std::string& name, Diag
     }
     if (text.empty()) throw GedcomError(name, "holds a GEDCOM file that is empty");
     return text;
+}
+
+std::optional<std::string> readFromArchive(const std::string& archive, const std::string& archiveName,
+                                           std::string_view file, std::size_t mostBytes) {
+    const auto name = memberOfArchive(file);
+    const Archive opened = openArchive(archive, archiveName);
+    const zip_int64_t place = name ? zip_name_locate(opened.get(), name->c_str(), ZIP_FL_ENC_GUESS) : -1;
+    if (place < 0) return {};
+    const Member member(zip_fopen_index(opened.get(), static_cast<zip_uint64_t>(place), 0));
+    if (member == nullptr) throw GedcomError(archiveName, "holds a member that cannot be unpacked");
+    std::string bytes;
+    std::array<char, 64 * 1024> block;
+    for (;;) {
+        const zip_int64_t got = zip_fread(member.get(), block.data(), block.size());
+        if (got < 0) throw GedcomError(archiveName, "holds a member that is damaged");
+        if (got == 0) return bytes;
+        if (static_cast<std::size_t>(got) > mostBytes - bytes.size()) return {};
+        bytes.append(block.data(), static_cast<std::size_t>(got));
+    }
 }
 
 }  // namespace olvane::gedcom

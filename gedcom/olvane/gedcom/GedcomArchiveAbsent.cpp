@@ -5,6 +5,7 @@
 
 #include <olvane/gedcom/GedcomArchiveInternal.h>
 #include <olvane/gedcom/GedcomError.h>
+#include <olvane/gedcom/GedcomMedia.h>
 
 namespace olvane::gedcom {
 
@@ -14,6 +15,11 @@ bool looksLikeArchive(std::string_view bytes) {
 
 std::string unpackGedcom(const std::string&, const std::string& name, DiagnosticList&) {
     throw GedcomError(name, "is an archive, and this program was built without zip");
+}
+
+std::optional<std::string> readFromArchive(const std::string&, const std::string&, std::string_view,
+                                           std::size_t) {
+    return {};
 }
 
 }  // namespace olvane::gedcom

@@ -11,6 +11,7 @@
 #include <gtest/gtest.h>
 
 #include <olvane/gedcom/GedcomDetails.h>
+#include <olvane/gedcom/GedcomMedia.h>
 #include <olvane/gedcom/GedcomWriter.h>
 
 #include "GedcomText.h"
@@ -129,6 +130,29 @@ TEST(Details, linksAreThoseOfTheFile) {
         EXPECT_FALSE(isWebAddress(address)) << address;
     }
 }
+
+TEST(Details, noPathLeavesAnArchive) {
+    EXPECT_EQ(memberOfArchive("media/a%20b.jpg"), "media/a b.jpg");
+    EXPECT_EQ(memberOfArchive("100%.jpg"), "100%.jpg");
+    for (const char* file :
+         {"../a.jpg", "media/../../a.jpg", "media/%2E%2E/a.jpg", "/etc/passwd", "file:///etc/passwd",
+          "http://a.example/a.jpg", "C:\\a.jpg", "media\\a.jpg", "", "media//a.jpg", "./a.jpg", "a%00.jpg"}) {
+        EXPECT_FALSE(memberOfArchive(file).has_value()) << file;
+    }
+}
+
+#ifdef OLVANE_GEDCOM_ZIP
+TEST(Details, mediaComeOutOfAnArchiveUpToALimit) {
+    const std::string archive = bytesOfFile(GEDCOM_TEST_DATA "/small.gdz");
+    EXPECT_EQ(readFromArchive(archive, "small.gdz", "media/a.txt", 1).value_or("").size(), 1U);
+    EXPECT_FALSE(readFromArchive(archive, "small.gdz", "media/a.txt", 0).has_value());
+    EXPECT_FALSE(readFromArchive(archive, "small.gdz", "media/b.txt", 100).has_value());
+    EXPECT_FALSE(readFromArchive(archive, "small.gdz", "../media/a.txt", 100).has_value());
+    EXPECT_THROW(readFromArchive("PK\x03\x04", "bad.gdz", "a", 100), GedcomError);
+    const std::string swelling = bytesOfFile(GEDCOM_TEST_DATA "/swelling.gdz");
+    EXPECT_FALSE(readFromArchive(swelling, "swelling.gdz", "gedcom.ged", 1000).has_value());
+}
+#endif
 
 TEST(Details, nothingIsKeptUnlessAskedFor) {
     const std::string text = document("0 @I1@ INDI\n1 NOTE a\n1 OCCU b\n2 NOTE c\n0 @N1@ NOTE d\n");
