@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What peers take for the charts of a real family: node royal.mjs FILE.ged [STEP]. Of every STEP-th person, 10 unless
+// What peers take for the charts of a real family: node royal.mjs FILE.ged [STEP]. Of every STEP-th person, 60 unless
 // said, topola lays out the ancestors and the descendants, and family-chart three generations up and down; nothing is
 // drawn. Prints the median and the slowest in milliseconds, and the most boxes. OLVANE_PEERS names the peers' folder.
 
@@ -88,7 +88,7 @@ const familyChart = (person, input) =>
 function measure(name, layOut, input = () => undefined) {
   const times = [];
   let most = 0;
-  const step = Number(process.argv[3] ?? 10);
+  const step = Number(process.argv[3] ?? 60);
   for (let i = 0; i < indis.length; i += step) {
     let least = Infinity;
     for (let round = 0; round < 2 && !(least > 200 && least < Infinity); ++round) {
