@@ -4,6 +4,7 @@
 #include <olvane/charts/EverybodyLayoutInternal.h>
 
 #include <algorithm>
+#include <cmath>
 #include <utility>
 
 #include <olvane/charts/EverybodyFoldInternal.h>
@@ -21,6 +22,7 @@ std::size_t at(std::int32_t place) {
 // What lies between a row and the first track under it, and between two tracks. Units: points.
 constexpr double kTrackMargin = 9;
 constexpr double kTrackGap = 4;
+constexpr double kGapStep = 24;
 // How near to the side of its box a line may end.
 constexpr double kBoxMargin = 5;
 // How far a line that runs between boxes may be moved to keep it off others.
@@ -58,6 +60,7 @@ private:
     void measureChains() {
         l_.sizes.gap = boxes_.gapX;
         l_.sizes.passRoom = boxes_.gapX / 2;
+        if (boxes_.each.empty()) l_.sizes.grid = (boxes_.boxWidth + boxes_.gapX) / 4;
         for (std::int32_t chain = 0; chain < l_.chains.count(); ++chain) {
             double width = -l_.sizes.gap;
             for (const std::int32_t person : l_.chains.persons[chain])
@@ -257,8 +260,8 @@ private:
             const std::int32_t tracks = l_.lines.tracks[at(gap + 1)];
             const bool outside = gap < 0 || gap + 1 == l_.rows.rowCount;
             const double used = tracks > 0 ? (tracks - 1) * kTrackGap : 0;
-            const double height = outside ? (tracks > 0 ? used + kTrackMargin : 0)
-                                          : std::max(double{boxes_.gapY}, used + 2 * kTrackMargin);
+            const double height =
+                outside ? (tracks > 0 ? used + kTrackMargin : 0) : gapHeight(used + 2 * kTrackMargin);
             l_.gapTop[at(gap + 1)] = outside ? y + (gap < 0 ? 0 : kTrackMargin) : y + (height - used) / 2;
             y += height;
         }
@@ -266,6 +269,12 @@ private:
         for (std::int32_t node = 0; node < l_.rows.nodeCount(); ++node) {
             l_.width = std::max(l_.width, l_.left[at(node)] + l_.sizes.width[at(node)]);
         }
+    }
+
+    // In whole steps beyond the least, so that a bar more seldom moves all that lies below.
+    double gapHeight(double needed) const {
+        const double least = boxes_.gapY;
+        return needed <= least ? least : least + std::ceil((needed - least) / kGapStep) * kGapStep;
     }
 
     PartLayout& l_;

@@ -445,7 +445,7 @@ RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
     constexpr std::array<int, 4> kShares = {1, 0, 30, 6};
     constexpr std::int64_t kStepsOfRounds = 40'000'000;
     const std::int64_t most = std::clamp<std::int64_t>(kStepsOfRounds / (rows.nodeCount() + 1), 60, 1500);
-    const RowOrder walk = walkOrder(rows);
+    RowOrder walk = walkOrder(rows);
     if (isForest(rows)) return walk;
     RowOrder best;
     std::int64_t fewest = -1;

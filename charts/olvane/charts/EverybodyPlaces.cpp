@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cmath>
 
 namespace olvane::charts {
 
@@ -48,6 +49,9 @@ public:
                 const std::int32_t row = down ? step : rows_.rowCount - 1 - step;
                 placeRow(row, down, i + 2 >= sweeps);
             }
+        }
+        if (sizes_.grid > 0) {
+            for (const auto& nodes : order_.nodes) snapToGrid(nodes);
         }
         return std::move(left_);
     }
@@ -113,6 +117,23 @@ private:
             sum = weight * left_[at(node)];
         }
         wanted = sum / weight;
+    }
+
+    // Chains on whole steps of the grid: a change far away, which reaches here as a hundredth of a point, then moves
+    // nothing. What stands too near to its left neighbour is put one step further.
+    void snapToGrid(const std::vector<std::int32_t>& nodes) {
+        double end = 0;
+        std::int32_t before = -1;
+        for (const std::int32_t node : nodes) {
+            double& left = left_[at(node)];
+            const double least = before < 0 ? left : end + sizes_.between(rows_, before, node);
+            if (!rows_.isPass(node)) left = std::floor(left / sizes_.grid + 0.5) * sizes_.grid;
+            if (before >= 0 && left < least) {
+                left = rows_.isPass(node) ? least : std::ceil(least / sizes_.grid) * sizes_.grid;
+            }
+            end = left + sizes_.width[at(node)];
+            before = node;
+        }
     }
 
     struct Pool {

@@ -21,6 +21,8 @@ struct RowSizes {
     double passRoom = 12.5;  // between a pass and a box
     double passGap = 8;      // between two passes
 
+    double grid = 0;  // chains stand at whole multiples of it; 0 for anywhere
+
     double between(const Rows& rows, std::int32_t left, std::int32_t right) const {
         if (!rows.isPass(left) && !rows.isPass(right)) return gap;
         return rows.isPass(left) && rows.isPass(right) ? passGap : passRoom;

@@ -138,6 +138,7 @@ TEST_F(EverybodyCases, twelveHundredSpouses) {
 
 TEST_F(EverybodyCases, ringOfCouples) {
     std::vector<Place> ring;
+    ring.reserve(9);
     for (int i = 0; i < 9; ++i) ring.push_back(person());
     for (std::size_t i = 0; i < 9; ++i) family(ring[i], ring[(i + 1) % 9], {});
     draw();

@@ -208,6 +208,7 @@ TEST(Everybody, runsInFourDirectionsAlike) {
 TEST(Everybody, takesBoxesOfAnySize) {
     for (const Made& made : families(20)) {
         std::vector<olvane::charts::BoxSize> sizes;
+        sizes.reserve(static_cast<std::size_t>(made.graph.personCount()));
         for (int i = 0; i < made.graph.personCount(); ++i) {
             sizes.push_back({static_cast<float>(30 + i * 37 % 90), static_cast<float>(20 + i * 53 % 70)});
         }
