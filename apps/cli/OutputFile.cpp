@@ -54,7 +54,7 @@ bool isStream(const std::string& path) {
 fs::path withoutLinks(fs::path path) {
     constexpr int kMostLinks = 40;  // as the system's own
     std::error_code error;
-    const fs::path existing = fs::canonical(path, error);
+    fs::path existing = fs::canonical(path, error);
     if (!error) return existing;
     for (int i = 0; i < kMostLinks && fs::is_symlink(fs::symlink_status(path, error)); ++i) {
         const fs::path target = fs::read_symlink(path, error);

@@ -50,7 +50,7 @@ std::string withoutEnding(const std::string& name) {
 // No word of any language: the page speaks its reader's own.
 std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const PageFamily& family,
                     const std::vector<bool>& hidden) {
-    const std::string fileTitle = withoutEnding(family.name);
+    std::string fileTitle = withoutEnding(family.name);
     if (focus == 0 || (!hidden.empty() && hidden[focus - 1])) return fileTitle;
     const std::string name = gedcom::displayName(data.firstName(focus));
     return name.empty() ? fileTitle : name;
