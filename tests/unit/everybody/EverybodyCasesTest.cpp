@@ -3,6 +3,7 @@
 
 // Families that have made other programs fail.
 
+#include <olvane/charts/Charts.h>
 #include <olvane/charts/Everybody.h>
 #include <olvane/picture/Judge.h>
 
@@ -177,6 +178,20 @@ TEST_F(EverybodyCases, partsStandBesideOneAnotherTheLargestFirst) {
     EXPECT_LT(box(b).x, box(lone).x);
     options.onePart = true;
     EXPECT_EQ(everybodyChart(graph_, options).boxes.size(), 1U);
+}
+
+TEST_F(EverybodyCases, isTheViewEverybodyOfARequest) {
+    const Place a = person(), b = person(Sex::female);
+    family(a, b, {person()});
+    person();
+    graph_ = builder_.build();
+    olvane::charts::ChartRequest request;
+    request.view = olvane::charts::View::everybody;
+    request.focus = b;
+    EXPECT_EQ(olvane::charts::chartOf(graph_, request).view, "everybody");
+    EXPECT_EQ(olvane::charts::chartOf(graph_, request).boxes.size(), 3U);
+    request.onePart = false;
+    EXPECT_EQ(olvane::charts::chartOf(graph_, request).boxes.size(), 4U);
 }
 
 TEST_F(EverybodyCases, focusThatIsNotThere) {
