@@ -19,6 +19,10 @@ describe("remarks of the reader", () => {
         assert.equal(inGerman("level jumps from 1 to 4"), "die Ebene springt von 1 auf 4");
         assert.equal(inGerman("read as level 2"), "gelesen als Ebene 2");
         assert.equal(inGerman("read as windows-1252"), "gelesen als windows-1252");
+        assert.equal(
+            inGerman("read as windows-1252; it looks like windows-1251: choose that encoding"),
+            "gelesen als windows-1252; er sieht nach windows-1251 aus: wählen Sie diese Zeichenkodierung",
+        );
         assert.equal(inGerman("3 bytes that are no character in UTF-8 (Ren?)"), "3 Bytes, die in UTF-8 kein Zeichen sind (Ren?)");
     });
 

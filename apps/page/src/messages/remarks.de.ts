@@ -32,6 +32,18 @@ export const germanRemarks: RemarkTable = {
         "der Text hat nicht die Zeichenkodierung, die der Kopf nennt",
     "the header names a system, not an encoding": "der Kopf nennt ein System, keine Zeichenkodierung",
     "the text is UTF-8 but for {} places": "der Text ist UTF-8, bis auf Fehler an {} Stellen",
+    "the file names no encoding": "die Datei nennt keine Zeichenkodierung",
+    "the text does not look like the encoding that the header names":
+        "der Text sieht nicht nach der Zeichenkodierung aus, die der Kopf nennt",
+    "the text is not in the encoding that was chosen": "der Text hat nicht die gewählte Zeichenkodierung",
+    "the text is not {} in {} places": "der Text ist nicht {}, und zwar an {} Stellen",
+    "a FAMS of a family that names two others as its partners":
+        "ein FAMS zu einer Familie, die zwei andere als Partner nennt",
+    "a child whose own record names another family as that of the parents":
+        "ein Kind, dessen eigener Datensatz eine andere Familie als die der Eltern nennt",
+    "a date whose day and month may be either way round": "ein Datum, bei dem Tag und Monat vertauscht sein können",
+    "a man as the WIFE of a family": "ein Mann als WIFE einer Familie",
+    "a woman as the HUSB of a family": "eine Frau als HUSB einer Familie",
     "{} bytes that are no character in {}": "{} Bytes, die in {} kein Zeichen sind",
     "{} control characters": "{} Steuerzeichen",
     "{}, the first of {}": "{}, die erste von {}",
@@ -45,6 +57,19 @@ export const germanRemarks: RemarkTable = {
     "not their own spouse": "niemand ist mit sich selbst verheiratet",
     "its children are left out for this person": "für diese Person sind die Kinder weggelassen",
     "read up to the space": "bis zum Leerzeichen gelesen",
+    "both are kept, the child's own first": "beide bleiben, die des Kindes zuerst",
+    "its year alone is read": "nur das Jahr wird gelesen",
+    "read as its husband": "als Ehemann gelesen",
+    "read as its wife": "als Ehefrau gelesen",
+    "read as well as can be; if letters are wrong, choose another encoding":
+        "gelesen, so gut es geht; sind Buchstaben falsch, wählen Sie eine andere Zeichenkodierung",
+    "the children are kept for all of them": "die Kinder bleiben bei allen",
+    "{}; {}": "{}; {}",
+    "it looks like {}: choose that encoding": "er sieht nach {} aus: wählen Sie diese Zeichenkodierung",
+    "choose an encoding, such as GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 or windows-1256":
+        "wählen Sie eine Zeichenkodierung, etwa GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 oder windows-1256",
+    "if letters are wrong, choose an encoding, such as windows-1250, windows-1251, IBM850 or macintosh":
+        "sind Buchstaben falsch, wählen Sie eine Zeichenkodierung, etwa windows-1250, windows-1251, IBM850 oder macintosh",
     "read as if it did": "so gelesen, als ob er es täte",
     "read as well as can be": "gelesen, so gut es geht",
     "read as far as it goes": "gelesen, so weit sie reicht",
@@ -80,6 +105,10 @@ export const germanRemarks: RemarkTable = {
     "bytes that are no character": "Bytes, die kein Zeichen sind",
     "control character": "Steuerzeichen",
     "unreadable date": "unlesbares Datum",
+    "date with day and month in doubt": "Datum mit zweifelhaftem Tag und Monat",
+    "link of one side alone": "Verknüpfung nur einer Seite",
+    "links that contradict each other": "Verknüpfungen, die sich widersprechen",
+    "partner in the slot of the other sex": "Partner am Platz des anderen Geschlechts",
     "archive member of another name": "Archivinhalt unter anderem Namen",
     "more of a kind": "weitere einer Art",
 };
