@@ -23,6 +23,8 @@ export interface ViewState {
     readonly direction: "down" | "up" | "left" | "right";
     /** The other person of the kinship view; 0 for nobody. */
     readonly to: number;
+    /** Whether parents who are not known have boxes, in the family view and the pedigree. */
+    readonly unknownParents: boolean;
     /** Groups of relatives that the family view leaves out. */
     readonly hidden: ReadonlySet<string>;
 }

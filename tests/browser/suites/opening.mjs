@@ -130,6 +130,27 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("a file whose encoding is wrong can be read in another, and the picture stays with its person", async () => {
+        // In windows-1251, of which the file says nothing.
+        const bytes = Buffer.concat([
+            Buffer.from("0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR ANSI\n0 @I1@ INDI\n1 NAME Ann\n0 @I2@ INDI\n1 NAME "),
+            Buffer.from([0xc8, 0xe2, 0xe0, 0xed]),
+            Buffer.from("\n0 TRLR\n"),
+        ]);
+        const visit = await visitEmpty();
+        await visit.drop("ivan.ged", bytes);
+        await visit.untilFamily();
+        await visit.page.evaluate(() => (location.hash = "#person=I2"));
+        await visit.still();
+        assert.notEqual(await visit.page.innerText("#side-panel h2"), "Иван");
+        await visit.click("#file-button");
+        await visit.page.selectOption("#encoding", "windows-1251");
+        await visit.still();
+        assert.equal(await visit.focus(), "I2");
+        assert.equal(await visit.page.innerText("#side-panel h2"), "Иван");
+        await visit.end();
+    });
+
     test("a broken file shows what could be read, and says what could not", async () => {
         const visit = await visitEmpty();
         await visit.drop("broken.ged", brokenFamily());

@@ -42,6 +42,20 @@ describe("options", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("boxes of unknown parents are left out where nobody wants them, and a link keeps that", async () => {
+        const visit = await visitDarwins("#person=I17&view=pedigree");
+        const unknown = () => visit.page.locator("#tree .box.missing").count();
+        assert.ok((await unknown()) > 0);
+        await visit.click("#options-button");
+        await visit.click("#unknown-parents");
+        assert.equal(await unknown(), 0);
+        assert.match(await visit.hash(), /hide=unknownParents/);
+        await visit.page.reload();
+        await visit.untilFamily();
+        assert.equal(await unknown(), 0);
+        await visit.end();
+    });
+
     test("no cousins without their parents", async () => {
         const visit = await visitDarwins();
         await visit.click("#options-button");

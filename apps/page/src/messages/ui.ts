@@ -57,6 +57,9 @@ export interface UiMessages {
     };
     readonly languageLabel: string;
     readonly kinshipInBoxes: string;
+    readonly unknownParents: string;
+    readonly encoding: string;
+    readonly encodingAuto: string;
     readonly file: string;
     readonly openFile: string;
     readonly saveSvg: string;

@@ -37,6 +37,7 @@ export class App implements ChromeActions {
     private chrome!: Chrome; // made by rebuildUi()
     private welcome!: Welcome;
     private fileName = "";
+    private encoding = ""; // that was chosen; empty for the file's own word
     private remarks: readonly Diagnostic[] = [];
     private panelOpen = recall("panel") !== "no";
     private kinshipInBoxes = recall("kinship") !== "no";
@@ -84,7 +85,9 @@ export class App implements ChromeActions {
         this.welcome.showReading(file.name);
         await pause();
         try {
-            this.show(await this.files.openFile(file), null);
+            const opened = await this.files.openFile(file);
+            this.encoding = "";
+            this.show(opened, null);
             if (others.length > 0) this.notices.tell(this.ui.firstOfFiles(quoted(file.name)));
         } catch (error) {
             this.refuse(file.name, error);
@@ -92,11 +95,12 @@ export class App implements ChromeActions {
         this.welcome.showReading(null);
     }
 
-    private show({ file, name, title }: OpenedFile, embedded: EmbeddedFamily | null): void {
+    // isSame: the file that is shown already, read in another way.
+    private show({ file, name, title }: OpenedFile, embedded: EmbeddedFamily | null, isSame = false): void {
         const start = performance.now();
         // Of an empty page only a link as it was followed is meant for the first file; what we wrote named
         // persons of another.
-        const isLinked = embedded !== null || (this.tree.family === null && history.state === null);
+        const isLinked = isSame || embedded !== null || (this.tree.family === null && history.state === null);
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
         this.fileName = name;
         this.remarks = embedded?.remarks ?? file.diagnostics;
@@ -215,6 +219,20 @@ export class App implements ChromeActions {
         this.kinshipInBoxes = shown;
         remember("kinship", shown ? "yes" : "no");
         this.tree.setAttribute("kinship", shown ? "boxes" : "none");
+    }
+
+    setUnknownParents(shown: boolean): void {
+        this.travel({ unknownParents: shown });
+    }
+
+    setEncoding(encoding: string): void {
+        try {
+            const opened = this.files.readAgain(encoding);
+            this.encoding = encoding;
+            this.show(opened, null, true);
+        } catch (error) {
+            this.refuse(this.fileName, error);
+        }
     }
 
     setTheme(theme: ThemeChoice): void {
@@ -338,6 +356,7 @@ export class App implements ChromeActions {
         main.before(chrome.bar);
         this.root.append(chrome.keys, chrome.diagnostics, ...always);
         chrome.showFamily(family.title, this.ui.personCount(family.persons.length));
+        chrome.showEncoding(this.files.canReadAgain ? this.encoding : null);
         chrome.showDiagnostics(this.remarks, family.persons.length);
         this.showPanelState();
         this.showState();

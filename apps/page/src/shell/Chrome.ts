@@ -20,6 +20,9 @@ export interface ChromeActions extends SearchSource, ViewActions {
     setRelative(name: RelativeName, shown: boolean): void;
     setGenerations(generations: number): void;
     setKinshipInBoxes(shown: boolean): void;
+    setUnknownParents(shown: boolean): void;
+    // Reads the file again; empty for the file's own word.
+    setEncoding(encoding: string): void;
     setTheme(theme: ThemeChoice): void;
     setLanguage(language: string): void;
     back(): void;
@@ -36,6 +39,33 @@ export interface ChromeLooks {
     readonly kinshipInBoxes: boolean;
 }
 
+// To choose from where a file's own word on its encoding is wrong.
+const kEncodings = [
+    "UTF-8",
+    "ANSEL",
+    "windows-1252",
+    "windows-1250",
+    "windows-1251",
+    "windows-1253",
+    "windows-1254",
+    "windows-1255",
+    "windows-1256",
+    "windows-1257",
+    "windows-1258",
+    "ISO-8859-2",
+    "ISO-8859-15",
+    "KOI8-R",
+    "KOI8-U",
+    "GB18030",
+    "BIG5",
+    "Shift_JIS",
+    "EUC-JP",
+    "EUC-KR",
+    "TIS-620",
+    "IBM437",
+    "IBM850",
+    "macintosh",
+] as const;
 const kMostDiagnostics = 500; // listed; the rest is counted
 
 export class Chrome {
@@ -47,6 +77,9 @@ export class Chrome {
     private readonly diagnosticsButton: HTMLButtonElement;
     private readonly buttons: Record<"back" | "forward" | "family" | "pedigree" | "panel", HTMLButtonElement>;
     private readonly switches = new Map<RelativeName, HTMLInputElement>();
+    private readonly unknownParents: HTMLInputElement;
+    private readonly encoding = html("select", { id: "encoding" });
+    private readonly encodingRow: HTMLElement;
     private readonly generations = html("output", { id: "generations" });
     private readonly fewer: HTMLButtonElement;
     private readonly more: HTMLButtonElement;
@@ -81,6 +114,11 @@ export class Chrome {
         );
         this.diagnosticsButton.hidden = true;
         this.views = new ViewChooser(ui, actions);
+        this.unknownParents = this.checkbox("unknown-parents", (checked) => actions.setUnknownParents(checked));
+        this.encoding.append(html("option", { value: "" }, ui.encodingAuto));
+        for (const name of kEncodings) this.encoding.append(html("option", { value: name }, name));
+        this.encoding.addEventListener("change", () => actions.setEncoding(this.encoding.value));
+        this.encodingRow = html("label", { class: "row" }, html("span", {}, ui.encoding), this.encoding);
         this.options = new Popover(
             iconButton("options-button", "options", ui.options, () => {}),
             this.optionsPanel(looks),
@@ -90,6 +128,12 @@ export class Chrome {
             this.filePanel(),
         );
         this.bar = this.barElement();
+    }
+
+    // encoding is the one that was chosen, null where the bytes of the file are not at hand.
+    showEncoding(encoding: string | null): void {
+        this.encodingRow.hidden = encoding === null;
+        this.encoding.value = encoding ?? "";
     }
 
     showFamily(title: string, persons: string): void {
@@ -102,6 +146,8 @@ export class Chrome {
         this.views.show(state);
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
+        this.unknownParents.checked = state.unknownParents;
+        this.unknownParents.disabled = state.view !== "family" && state.view !== "pedigree";
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
         // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from. The
         // pedigree has none of them, and the family view has its generations by the switches.
@@ -204,6 +250,7 @@ export class Chrome {
             "div",
             { id: "options-panel", class: "sheet", role: "region", "aria-label": ui.options },
             relatives,
+            html("label", { class: "switch" }, this.unknownParents, html("span", {}, ui.unknownParents)),
             generations,
             html(
                 "fieldset",
@@ -238,6 +285,7 @@ export class Chrome {
             item("save-png", ui.savePng, () => actions.savePng()),
             item("print", ui.print, () => actions.print()),
             item("open-file", ui.openFile, () => actions.openFile()),
+            this.encodingRow,
             item("keys-button", ui.keys, () => this.keys.showModal()),
         );
     }

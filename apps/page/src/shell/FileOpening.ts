@@ -20,15 +20,31 @@ export interface OpenedFile {
 export class FileOpening {
     constructor(private readonly engine: Olvane) {}
 
+    private last: { readonly bytes: Uint8Array; readonly name: string } | null = null;
+
     openEmbedded({ bytes, name, title }: EmbeddedFamily): OpenedFile {
         return this.read(bytes, name, title);
+    }
+
+    /** Whether the file that is shown can be read in another encoding: what the page itself holds is UTF-8. */
+    get canReadAgain(): boolean {
+        return this.last !== null;
+    }
+
+    /** The file that was opened last, in another encoding; empty for the one that the file names. */
+    readAgain(encoding: string): OpenedFile {
+        const { bytes, name } = this.last!;
+        return this.read(bytes, name, "", encoding);
     }
 
     // Throws as complaint() knows.
     async openFile(file: File): Promise<OpenedFile> {
         if (file.size > kMostBytes) throw new TooLargeError();
         const bytes = new Uint8Array(await file.arrayBuffer());
-        return this.read(isArchive(bytes) ? await gedcomInArchive(bytes, kMostBytes) : bytes, file.name, "");
+        const gedcom = isArchive(bytes) ? await gedcomInArchive(bytes, kMostBytes) : bytes;
+        const opened = this.read(gedcom, file.name, "");
+        this.last = { bytes: gedcom, name: file.name };
+        return opened;
     }
 
     /** What to say of a file that could not be opened: a sentence and details. */
@@ -42,8 +58,8 @@ export class FileOpening {
         return [errors.notGedcom(file), [ui.diagnostics.remark(detail), errors.hint]];
     }
 
-    private read(bytes: Uint8Array, name: string, title: string): OpenedFile {
-        const file = this.engine.readGedcom(bytes, name);
+    private read(bytes: Uint8Array, name: string, title: string, encoding = ""): OpenedFile {
+        const file = this.engine.readGedcom(bytes, name, { encoding });
         if (file.persons.length === 0) {
             file.close();
             throw new NoPersonsError();

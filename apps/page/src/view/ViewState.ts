@@ -28,6 +28,8 @@ export interface ViewState {
     readonly direction: ChartDirection;
     // The other person of the kinship view; 0 for nobody.
     readonly to: number;
+    // Whether parents who are not known have boxes, in the engine's two views.
+    readonly unknownParents: boolean;
     // Names of kRelatives that are switched off.
     readonly hidden: ReadonlySet<RelativeName>;
 }
@@ -48,6 +50,7 @@ export const kUsualState: ViewState = {
     down: kUsualDown,
     direction: "down",
     to: 0,
+    unknownParents: true,
     hidden: new Set(),
 };
 
@@ -59,10 +62,10 @@ const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
 /** What to ask of the module for a state. */
 export function optionsOf(state: ViewState): PictureOptions {
-    const { view, generations, direction, up, down, to } = state;
+    const { view, generations, direction, up, down, to, unknownParents } = state;
     const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
     const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : kTall;
-    return { view, generations, direction, up, down, to, shown: shownBits(state), ...sizes };
+    return { view, generations, direction, up, down, to, unknownParents, shown: shownBits(state), ...sizes };
 }
 
 function shownBits(state: ViewState): number {
@@ -73,7 +76,7 @@ function shownBits(state: ViewState): number {
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
-    const same = (["focus", "view", "generations", "up", "down", "direction", "to"] as const).every(
+    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents"] as const).every(
         (name) => a[name] === b[name],
     );
     return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
@@ -92,10 +95,13 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     if (hasDown(view) && state.down !== kUsualDown) parts.set("down", String(state.down));
     if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
     if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
-    if (state.hidden.size > 0) parts.set("hide", [...state.hidden].join(","));
+    const hide = [...state.hidden, ...(state.unknownParents ? [] : [kUnknownParents])];
+    if (hide.length > 0) parts.set("hide", hide.join(","));
     return "#" + parts.toString().replaceAll("%2C", ",");
 }
 
+// What "hide" names beside the groups of relatives.
+const kUnknownParents = "unknownParents";
 const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "hide"];
 
 // Whatever an address does not name, or names wrongly, is as in the state that it is read into.
@@ -113,6 +119,7 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
         down: clampDepth(Number(parts.get("down") ?? kUsualDown), kUsualDown),
         direction: kDirections.find((name) => name === parts.get("direction")) ?? "down",
         to,
+        unknownParents: !hidden.includes(kUnknownParents),
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
     };
 }
