@@ -13,8 +13,6 @@
 namespace views {
 
 using SharedTreeViewer::OptionMap;
-using SharedTreeViewer::TreeViewFamilyLayouter;
-using SharedTreeViewer::TreeViewPedigreeLayouter;
 
 LaidOutCase::LaidOutCase(std::string_view caseText) {
     const support::CaseFile request = support::parseCase(caseText);
@@ -37,13 +35,10 @@ void LaidOutCase::lay(const support::CaseFile& request, int focusKey, int isMale
     for (const auto& [key, value] : request.options) options[key] = value;
     const TreeSize size = support::treeSizeOf(request);
     if (request.view == support::CaseView::pedigree) {
-        pedigreeLayouter = std::make_unique<TreeViewPedigreeLayouter>(
-            adapter.get(), focusKey, isMale, options, size, request.maxGenerations, request.maxStackDepth);
-        base = pedigreeLayouter.get();
+        base = &pedigreeLayouter.emplace(adapter.get(), focusKey, isMale, options, size,
+                                         request.maxGenerations, request.maxStackDepth);
     } else {
-        familyLayouter =
-            std::make_unique<TreeViewFamilyLayouter>(adapter.get(), focusKey, isMale, options, size);
-        base = familyLayouter.get();
+        base = &familyLayouter.emplace(adapter.get(), focusKey, isMale, options, size);
     }
     base->layoutForFocusNID();
 }

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <memory>
+#include <optional>
 #include <set>
 #include <string>
 #include <string_view>
@@ -55,8 +56,15 @@ private:
     std::shared_ptr<support::CaseManager> manager;
     ViewerGlue glue;
     std::unique_ptr<DataAdapter> adapter;
-    std::unique_ptr<SharedTreeViewer::TreeViewFamilyLayouter> familyLayouter;
-    std::unique_ptr<SharedTreeViewer::TreeViewPedigreeLayouter> pedigreeLayouter;
+    // Layouters have no virtual destructor: each is destroyed through its concrete type, here a final one.
+    struct FamilyLayouter final : SharedTreeViewer::TreeViewFamilyLayouter {
+        using TreeViewFamilyLayouter::TreeViewFamilyLayouter;
+    };
+    struct PedigreeLayouter final : SharedTreeViewer::TreeViewPedigreeLayouter {
+        using TreeViewPedigreeLayouter::TreeViewPedigreeLayouter;
+    };
+    std::optional<FamilyLayouter> familyLayouter;
+    std::optional<PedigreeLayouter> pedigreeLayouter;
     SharedTreeViewer::TreeViewLayouter* base = nullptr;
 };
 
