@@ -59,6 +59,17 @@ void* operator new[](std::size_t size, std::align_val_t alignment) {
     return countedMemory(size, usableAlignment(alignment));
 }
 
+// What a caller asks for who can do without it, such as a stable sort: never made to fail, since that would end no call.
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
+    void* const memory = std::malloc(size == 0 ? 1 : size);
+    if (memory != nullptr) ++outstanding;
+    return memory;
+}
+
+void operator delete(void* memory, const std::nothrow_t&) noexcept {
+    giveBack(memory);
+}
+
 void operator delete(void* memory) noexcept {
     giveBack(memory);
 }
