@@ -79,14 +79,14 @@ std::vector<MadeUpPerson> nameThem(ByteSource& bytes) {
     return family;
 }
 
-void tellTheirParents(ByteSource& bytes, std::vector<MadeUpPerson>& family) {
+void drawParents(ByteSource& bytes, std::vector<MadeUpPerson>& family) {
     for (MadeUpPerson& person : family) {
         person.father = nextParent(bytes, family);
         person.mother = nextParent(bytes, family);
     }
 }
 
-void tellTheirLists(ByteSource& bytes, std::vector<MadeUpPerson>& family) {
+void drawLists(ByteSource& bytes, std::vector<MadeUpPerson>& family) {
     for (MadeUpPerson& person : family) {
         person.spouses = nextList(bytes, family);
         person.children = nextList(bytes, family);
@@ -144,9 +144,9 @@ void makeListsAgreeWithParents(std::vector<MadeUpPerson>& family) {
 std::vector<MadeUpPerson> makeUpFamily(ByteSource& bytes) {
     const bool isTidy = bytes.nextBit();
     std::vector<MadeUpPerson> family = nameThem(bytes);
-    tellTheirParents(bytes, family);
+    drawParents(bytes, family);
     describeThem(bytes, family);
-    tellTheirLists(bytes, family);
+    drawLists(bytes, family);
     if (isTidy) makeListsAgreeWithParents(family);
     return family;
 }

@@ -28,7 +28,7 @@ private:
     std::size_t at_ = 0;
 };
 
-// One person as the bytes tell; the lists may name anybody, any number of times.
+// One person as the bytes make it; the lists may name anybody, any number of times.
 struct MadeUpPerson {
     std::int64_t id = 0;
     std::int64_t father = 0;

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Bytes as a family of up to 60 persons, contradictions and all, and as what is asked of its chart. Whatever it is,
-// each person has one box, no two boxes overlap, every link is told, and no line can be taken for another's.
+// each person has one box, no two boxes overlap, every link is expressed, and no line can be taken for another's.
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/picture/Judge.h>

@@ -35,7 +35,7 @@ using namespace olvane::gedcom;
 // Persons whose names are searched for: each search looks at all, and a file of 64 KiB has thousands.
 constexpr std::size_t kSearchedPersons = 8;
 constexpr std::size_t kSortTextBytes = 12;
-// Hidden persons whose names are looked for in all that is told of the others.
+// Hidden persons whose names are looked for in all that is written of the others.
 constexpr std::size_t kSoughtPersons = 8;
 constexpr std::size_t kMostRelatives = 100;
 constexpr std::string_view kHiddenName = "(nobody)";
@@ -132,7 +132,7 @@ void lookAtPerson(const GedcomData& data, PersonId id) {
     lookAtRelatives(data, id);
     lookAtFacts(data.factsOfPerson(id));
     HOLDS(isUtf8(person.xref));
-    // An identifier with an @ in it cannot be told from one that was given with its own.
+    // An identifier with an @ in it cannot be distinguished from one that was given with its own.
     const bool canBeAskedFor = !person.xref.empty() && person.xref.find('@') == std::string_view::npos;
     if (canBeAskedFor) HOLDS(data.personByXref(person.xref) != 0);
 }
@@ -225,8 +225,9 @@ std::vector<PersonId> childrenOf(std::span<const ChildLink> links) {
     return children;
 }
 
-// Of a hidden person, other parents than father and mother are not told.
-std::vector<PersonId> toldChildren(const GedcomData& data, FamilyId family, const std::vector<bool>& hidden) {
+// Of a hidden person, other parents than father and mother are not written.
+std::vector<PersonId> shownChildren(const GedcomData& data, FamilyId family,
+                                    const std::vector<bool>& hidden) {
     std::vector<PersonId> children = childrenOf(data.childLinks(family));
     std::erase_if(children, [&](PersonId child) {
         return !hidden.empty() && hidden[child - 1] && data.person(child).parentFamily != family;
@@ -248,7 +249,7 @@ void holdEqualRelatives(const GedcomData& data, const GedcomData& again, const s
         const Family& family = data.family(id);
         const Family& same = again.family(id);
         HOLDS(same.husband == family.husband && same.wife == family.wife);
-        HOLDS(toldChildren(data, id, hidden) == childrenOf(again.childLinks(id)));
+        HOLDS(shownChildren(data, id, hidden) == childrenOf(again.childLinks(id)));
     }
 }
 
@@ -357,8 +358,8 @@ void holdNotNamedIn(std::span<const Fact> facts, const PersonName& name) {
     const std::string given = smallLetters(name.given);
     const std::string surname = smallLetters(name.surname);
     for (const Fact& fact : facts) {
-        for (const std::string_view told : {fact.value, fact.place, fact.date.written}) {
-            const std::string text = smallLetters(told);
+        for (const std::string_view written : {fact.value, fact.place, fact.date.written}) {
+            const std::string text = smallLetters(written);
             HOLDS(given == surname || !holdsWord(text, given) || !holdsWord(text, surname));
         }
     }
@@ -370,13 +371,13 @@ void holdNamedNowhere(const GedcomData& again, const PersonName& name) {
     for (FamilyId id = 1; id <= again.familyCount(); ++id) holdNotNamedIn(again.factsOfFamily(id), name);
 }
 
-// A nickname that names somebody hidden is not told.
+// A nickname that names somebody hidden is not written.
 void holdEqualNames(std::span<const PersonName> names, std::span<const PersonName> again) {
     HOLDS(names.size() == again.size());
     for (std::size_t i = 0; i < names.size(); ++i) {
-        PersonName told = names[i];
-        if (again[i].nickname.empty()) told.nickname = {};
-        HOLDS(areEqual(told, again[i]));
+        PersonName expected = names[i];
+        if (again[i].nickname.empty()) expected.nickname = {};
+        HOLDS(areEqual(expected, again[i]));
     }
 }
 

@@ -216,7 +216,7 @@ int runBatch(const BatchOptions& options) {
             writeStandardOutput(lines[i].text);
             if (lines[i].isKnown) continue;
             ++unknown;
-            tell(options.input.file + ": '" + block[i].written + "' is not one person");
+            printMessage(options.input.file + ": '" + block[i].written + "' is not one person");
         }
         progress.show(done);
     }

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The command line: what can be asked for, and how it is told. Every option says in its help what it does and
+// The command line: what can be asked for, and what is printed when it is wrong. Every option says in its help what it does and
 // what it is when not given.
 
 #include <cli/CommandLine.h>
@@ -67,7 +67,7 @@ void addFocus(CLI::App& command, std::string& focus) {
     command
         .add_option(
             "--focus", focus,
-            "The person in the middle: an xref (I17 or @I17@), a number as 'olvane people' tells it, or "
+            "The person in the middle: an xref (I17 or @I17@), a number as 'olvane people' prints it, or "
             "words of the name")
         ->required()
         ->type_name("WHO");
@@ -121,7 +121,7 @@ public:
             app_.parse(argc, argv);
         } catch (const CLI::ParseError& error) {
             if (error.get_exit_code() == 0) return app_.exit(error);
-            tell(complaintOf(error));
+            printMessage(complaintOf(error));
             return kWrongUse;
         }
         refuseWithoutEffect();
@@ -141,10 +141,10 @@ private:
         const std::vector<std::string> strangers = app_.remaining();
         if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
             return "there is no command '" + strangers.front() +
-                   "', but people, layout, draw, batch, check, kin, judge and page; 'olvane --help' tells "
+                   "', but people, layout, draw, batch, check, kin, judge and page; 'olvane --help' lists "
                    "more";
         }
-        return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' tells more";
+        return std::string(error.what()) + "; 'olvane" + nameOfChosen() + " --help' lists more";
     }
 
     std::string nameOfChosen() const {
@@ -251,7 +251,7 @@ private:
 
     void addCheck() {
         check_ =
-            app_.add_subcommand("check", "Tell what is wrong or odd in a file, or hard to read in a layout");
+            app_.add_subcommand("check", "List what is wrong or odd in a file, or hard to read in a layout");
         addFile(*check_, checkOptions_.input);
         CLI::Option* focus = check_
                                  ->add_option("--focus", checkOptions_.focus,
@@ -451,11 +451,11 @@ int runCommand(int argc, char** argv) {
         refuseStreamsIntoInputs(InputFiles(wordsThatMayBeInput(argc, argv)));
         return CommandLine().run(argc, argv);
     } catch (const UsageError& error) {
-        tell(error.what());
+        printMessage(error.what());
     } catch (const std::bad_alloc&) {
-        tell("not enough memory");
+        printMessage("not enough memory");
     } catch (const std::exception& error) {
-        tell(error.what());
+        printMessage(error.what());
     }
     return kWrongUse;
 }

@@ -24,7 +24,7 @@ struct DataFinding {
     std::string text;  // names persons and families by their xrefs
 };
 
-// Everything odd in the data, in the order of the lines: links that one side alone tells, persons in two
+// Everything odd in the data, in the order of the lines: links that one side alone states, persons in two
 // families as a child, people who are their own ancestors, dates that cannot be.
 std::vector<DataFinding> checkData(const gedcom::GedcomData& data);
 

@@ -97,7 +97,7 @@ std::string sheetName(const std::string& output, std::size_t sheet, std::size_t 
 
 std::string pngSheet(const std::string& path, const draw::SvgPicture& sheet, double scale) {
     if (pngScale(sheet, scale) < scale) {
-        tell(path + ": made smaller, since a PNG cannot be that large; .svg and .pdf can");
+        printMessage(path + ": made smaller, since a PNG cannot be that large; .svg and .pdf can");
     }
     return pngOf(sheet, scale);
 }

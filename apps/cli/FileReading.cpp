@@ -19,8 +19,8 @@ namespace olvane::cli {
 
 namespace {
 
-constexpr std::size_t kPerKind = 10;     // told on stderr
-constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are told as a number, for memory's sake
+constexpr std::size_t kPerKind = 10;     // printed on stderr
+constexpr std::size_t kCounted = 10000;  // of a kind; those beyond are only counted, for memory's sake
 
 // The first of each kind, and how many were kept back. Notes are for those who ask.
 void report(const gedcom::GedcomData& data) {
@@ -34,15 +34,15 @@ void report(const gedcom::GedcomData& data) {
             ++keptBack;
             isWhole = isWhole && ofKind < kCounted;
         } else {
-            tell(diagnostic);
+            printMessage(diagnostic);
         }
     }
     if (keptBack == 0) return;
     const std::string command = data.file() == inputName(std::string(kStandardInput))
                                     ? "olvane check"
                                     : "olvane check " + data.file();
-    tell(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) + " more; '" +
-         command + "' lists them all");
+    printMessage(data.file() + ": and " + (isWhole ? "" : "at least ") + std::to_string(keptBack) +
+                 " more; '" + command + "' lists them all");
 }
 
 gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions& options) {

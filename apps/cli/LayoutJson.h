@@ -13,7 +13,7 @@
 
 namespace olvane::cli {
 
-// A layout as JSON, each field by name, with what the file tells of the persons. Its form is in
+// A layout as JSON, each field by name, with what the file states of the persons. Its form is in
 // docs/layout.schema.json.
 //
 // living: whose data are left out, an entry for each person; empty for nobody.

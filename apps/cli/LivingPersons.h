@@ -10,7 +10,7 @@
 namespace olvane::cli {
 
 // Who is to be taken for alive: everybody with no sign of death who was born less than 110 years before
-// thisYear, and everybody without a sign of death whose dates cannot tell and who is within two steps (to a
+// thisYear, and everybody without a sign of death whose dates do not decide it and who is within two steps (to a
 // parent, a child or a spouse) of such a person.
 //
 // Holds: one entry for each person of the file; entry 0 is person 1.

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What the user is told beside the results.
+// Messages to the user beside the results.
 
 #include <cli/Messages.h>
 
@@ -39,11 +39,11 @@ void print(const std::string& message, const char* colour) {
 
 }  // namespace
 
-void tell(const std::string& text) {
+void printMessage(const std::string& text) {
     print("olvane: " + text, kRed);
 }
 
-void tell(const gedcom::Diagnostic& diagnostic) {
+void printMessage(const gedcom::Diagnostic& diagnostic) {
     print(gedcom::formatDiagnostic(diagnostic),
           diagnostic.severity == gedcom::Severity::error ? kRed : kYellow);
 }

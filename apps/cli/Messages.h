@@ -11,7 +11,7 @@ namespace olvane::cli {
 
 // Messages on stderr: "olvane: TEXT", and diagnostics as they are. In colour on a terminal alone, and never
 // where the environment has NO_COLOR.
-void tell(const std::string& text);
-void tell(const gedcom::Diagnostic& diagnostic);
+void printMessage(const std::string& text);
+void printMessage(const gedcom::Diagnostic& diagnostic);
 
 }  // namespace olvane::cli

@@ -46,8 +46,9 @@ int runPeople(const PeopleOptions& options) {
     const auto persons = words.empty() ? everybody(data) : PersonFinder(data).find(words);
     writeReport(textOf(data, persons, options.format));
     if (!persons.empty()) return 0;
-    tell(options.input.file + ": " +
-         (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));
+    printMessage(
+        options.input.file + ": " +
+        (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));
     return 1;
 }
 

@@ -22,7 +22,7 @@ namespace olvane::cli {
 // Fails: passes on what typedLayout and charts throw.
 class PictureRun {
 public:
-    // hidden: whom nothing is told of, an entry for each person; empty for nobody.
+    // hidden: of whom nothing is stated, an entry for each person; empty for nobody.
     PictureRun(const gedcom::GedcomData& data, LayoutRequest request, std::vector<bool> hidden);
 
     // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, neither number

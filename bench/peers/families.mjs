@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The made families for the peers: the same persons, in the same order, as bench/MadeFamily.h tells. "compare" holds
+// The made families for the peers: the same persons, in the same order, as bench/MadeFamily.h makes. "compare" holds
 // both generators against each other, person by person, before it times anything.
 //
 // node families.mjs SHAPE SIZE prints a family, a line for each person, in the form of print_family.

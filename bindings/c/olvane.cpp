@@ -114,7 +114,7 @@ private:
     typedef int (*ParentCallback)(void*, std::int64_t, std::int64_t*);
     typedef int (*ListCallback)(void*, std::int64_t, olvane_person_list*);
 
-    // A callback in C++ may throw in spite of what it was told.
+    // A callback in C++ may throw in spite of the rule.
     template <class Call>
     static void ask(const Question& question, const Call& call) {
         int code = kThrownCode;

@@ -18,7 +18,7 @@
  *     is kept.
  * Threads: layouts may run on several threads at once if their hosts' data can be read so. Callbacks run on
  *     the thread that asked. A layout never changes, so several threads may read one.
- * Failures: every call tells its status; nothing is thrown, printed or aborted.
+ * Failures: every call returns its status; nothing is thrown, printed or aborted.
  */
 
 #include <stddef.h>
@@ -82,10 +82,10 @@ OLVANE_C_API olvane_status olvane_date_set(olvane_date* date, const char* text);
  * Nobody: an unknown parent is OLVANE_PERSON_NOT_FOUND, and lists hold known persons alone. Any other number
  *     ends the layout with OLVANE_INVALID_ID, and olvane_layout_failure names it.
  * Holds: struct_size is set, else OLVANE_INVALID_ARGUMENT. All eight are set. They are asked many times for the same person, since no answer is kept, and must
- *     agree with themselves within one layout. They may contradict each other: the layout takes them as told.
+ *     agree with themselves within one layout. They may contradict each other: the layout takes them as answered.
  * Fails: a callback returns 0, or any other number to report a failure. The layout then ends with what it
  *     has, with OLVANE_HOST_FAILED, and keeps the number for olvane_layout_host_code. A C++ callback that
- *     throws has failed with the number -1, and nothing tells it from one that returned -1. A callback must
+ *     throws has failed with the number -1, and nothing distinguishes it from one that returned -1. A callback must
  *     not leave by longjmp. Where the list or the date of a callback has found no memory, the layout ends with
  *     OLVANE_OUT_OF_MEMORY, whatever the callback returns.
  */

@@ -49,7 +49,7 @@ std::vector<std::int64_t> idsOf(NSArray* list) {
 }
 
 // The bytes of the 16-bit form up to the first zero byte, which ends a date of ASCII characters behind its
-// first one. Deliberately narrow: longer texts would tell records apart that have been one in every chart so
+// first one. Deliberately narrow: longer texts would separate records that have been one in every chart so
 // far. A first character whose low byte is zero, such as U+4E00, makes an empty date.
 //
 // The engine cuts these bytes again, to what it takes for their first character in UTF-8. That changes no

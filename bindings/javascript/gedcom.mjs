@@ -14,22 +14,22 @@ const SEXES = ["male", "female", "other"];
 const MARKS = ["exact", "about", "before", "after", "between"];
 const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other"];
 
-function dateFrom(told) {
-    if (told === 0) return null;
-    const [written, year, month, day, mark, lastYear, shown] = told;
+function dateFrom(values) {
+    if (values === 0) return null;
+    const [written, year, month, day, mark, lastYear, shown] = values;
     return { written, year, month, day, mark: MARKS[mark], lastYear, shown };
 }
 
-function parentFamiliesFrom(told) {
+function parentFamiliesFrom(values) {
     const families = [];
-    for (let i = 0; i < told.length; i += 2) {
-        families.push({ family: told[i], pedigree: PEDIGREES[told[i + 1]] });
+    for (let i = 0; i < values.length; i += 2) {
+        families.push({ family: values[i], pedigree: PEDIGREES[values[i + 1]] });
     }
     return families;
 }
 
-function personFrom(told, index) {
-    const [xref, names, given, surname, sex, dead, birth, death, father, mother, spouses, children] = told;
+function personFrom(values, index) {
+    const [xref, names, given, surname, sex, dead, birth, death, father, mother, spouses, children] = values;
     return {
         id: index + 1,
         xref,
@@ -45,8 +45,8 @@ function personFrom(told, index) {
         mother,
         spouses,
         children,
-        parentFamilies: parentFamiliesFrom(told[12]),
-        coupleFamilies: told[13],
+        parentFamilies: parentFamiliesFrom(values[12]),
+        coupleFamilies: values[13],
     };
 }
 
@@ -82,7 +82,7 @@ export class GedcomFile {
         this.#instance = instance;
         this.#file = file;
         this.name = name;
-        const [encoding, version, persons, families, diagnostics] = this.#told("gedcom_table");
+        const [encoding, version, persons, families, diagnostics] = this.#answer("gedcom_table");
         this.encoding = encoding;
         this.version = version;
         this.persons = persons.map(personFrom);
@@ -92,11 +92,11 @@ export class GedcomFile {
     }
 
     factsOfPerson(id) {
-        return this.#told("gedcom_person_facts", id).map(factFrom);
+        return this.#answer("gedcom_person_facts", id).map(factFrom);
     }
 
     factsOfFamily(id) {
-        return this.#told("gedcom_family_facts", id).map(factFrom);
+        return this.#answer("gedcom_family_facts", id).map(factFrom);
     }
 
     layout(focus, options = undefined) {
@@ -157,7 +157,7 @@ export class GedcomFile {
         }
     }
 
-    #told(question, ...values) {
+    #answer(question, ...values) {
         const pointer = this.#instance.exports[question](this.#opened(), ...values);
         if (pointer === 0) throw new GedcomError(this.#instance.text(this.#instance.exports.last_text()));
         return JSON.parse(this.#instance.text(pointer));

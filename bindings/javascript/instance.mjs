@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The WebAssembly module at work: its memory as texts and numbers, and what it imports. A host's error can't pass
-// through the module, so a question keeps what the host threw and tells a failure; the layout throws it on.
+// through the module, so a question keeps what the host threw and reports a failure; the layout throws it on.
 
 import { OutOfMemory } from "./errors.mjs";
 import { PERSON_NOT_FOUND } from "./values.mjs";

@@ -15,7 +15,7 @@
  * of olvane.layout. It is asked many times, and so takes longer.
  *
  * Units are points; x grows right, y grows down, and (x, y) is the upper-left corner of a box. The size of a box
- * is that of the options, 55 by 80 unless told otherwise.
+ * is that of the options, 55 by 80 unless stated otherwise.
  */
 
 /** The answer for a parent whom the host does not know; null and undefined say the same. */
@@ -303,7 +303,7 @@ export interface GedcomDate {
     readonly shown: string;
 }
 
-/** Something that a file tells of a person or a couple. */
+/** Something that a file states of a person or a couple. */
 export interface Fact {
     /** The file's own tag: BIRT, DEAT, OCCU, RESI, MARR, DIV and so on. */
     readonly tag: string;
@@ -374,7 +374,7 @@ export class GedcomFile {
     readonly encoding: string;
     /** As written: "5.5.1", "7.0"; empty if not given. */
     readonly version: string;
-    /** Everything that the file tells of a person, in its order. */
+    /** Everything that the file states of a person, in its order. */
     factsOfPerson(id: number): readonly Fact[];
     factsOfFamily(id: number): readonly Fact[];
     /** As Olvane.layout, with the file as the host. Asks for a million relatives at most, and else is tooLarge. */

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What a JavaScript host loads; olvane.d.mts tells what everything means.
+// What a JavaScript host loads; olvane.d.mts says what everything means.
 
 import { Family } from "./family.mjs";
 import { readGedcom } from "./gedcom.mjs";

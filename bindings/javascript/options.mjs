@@ -25,13 +25,13 @@ const WHOLE_NUMBERS = {
 
 const OPTIONS = ["view", "sizes", ...Object.keys(WHOLE_NUMBERS)];
 
-function told(value) {
+function described(value) {
     return typeof value === "string" ? JSON.stringify(value) : String(value);
 }
 
 function checkObject(name, value) {
     if (typeof value === "object" && value !== null) return;
-    throw new TypeError(`${name} is ${told(value)}, and takes an object`);
+    throw new TypeError(`${name} is ${described(value)}, and takes an object`);
 }
 
 function checkNames(kind, given, known) {
@@ -43,12 +43,12 @@ function checkNames(kind, given, known) {
 }
 
 function checkNumber(name, value) {
-    if (typeof value !== "number") throw new TypeError(`${name} is ${told(value)}, and takes a number`);
+    if (typeof value !== "number") throw new TypeError(`${name} is ${described(value)}, and takes a number`);
 }
 
 function viewNumber(view = "family") {
     if (typeof view === "string" && Object.hasOwn(VIEWS, view)) return VIEWS[view];
-    throw new TypeError(`there is no view ${told(view)}, but "family" and "pedigree"`);
+    throw new TypeError(`there is no view ${described(view)}, but "family" and "pedigree"`);
 }
 
 // The module reckons with single precision, in which a large number may be infinite.

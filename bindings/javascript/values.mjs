@@ -39,7 +39,7 @@ const KINDS = ["person", "missingFather", "missingMother"];
 const NUMBERS_OF_A_RECORD = 7;
 const NUMBERS_OF_A_SEGMENT = 4;
 
-/** The records that a run of numbers tells, in its order. */
+/** The records that a run of numbers holds, in its order. */
 export function recordsFrom(numbers) {
     const records = [];
     for (let at = 0; at < numbers.length; ) {

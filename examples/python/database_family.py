@@ -16,7 +16,7 @@ COUPLES = "SELECT id AS number, husband AS partner0, wife AS partner1, state, da
 
 
 def connect(name: str) -> tuple[object, str]:
-    """A connection, and how the database is told that nulls come first."""
+    """A connection, and how the database is asked that nulls come first."""
     if not name.startswith("postgresql://"):
         return sqlite3.connect(f"file:{name}?mode=ro", uri=True), ""
     import psycopg2

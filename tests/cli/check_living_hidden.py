@@ -160,8 +160,8 @@ def private_records(records, hidden_xrefs):
             private.append(record)
     while True:  # notes, sources and media that only these point to
         chosen = {id(r) for r in private}
-        told = set().union(*(r.pointers() for r in records if id(r) not in chosen), set())
-        own = set().union(*(r.pointers() for r in private), set()) - told
+        shown = set().union(*(r.pointers() for r in records if id(r) not in chosen), set())
+        own = set().union(*(r.pointers() for r in private), set()) - shown
         more = [r for r in records if r.xref in own and id(r) not in chosen and r.tag not in ("INDI", "FAM")]
         if not more:
             return private

@@ -1,7 +1,7 @@
 #!/usr/bin/env python3
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
-"""Runs one case file against the olvane command; the form is told in README.md.
+"""Runs one case file against the olvane command; the form is described in README.md.
 
 Usage: run_case.py PATH/TO/olvane CASEFILE
 """

@@ -2,7 +2,7 @@
 # SPDX-License-Identifier: MIT
 """Pages of the guides as the tests read them: their code blocks, by section.
 
-A block's first line tells what becomes of it:
+A block's first line says what becomes of it:
 
     ```c file=examples/c/first_tree.c     quotes that file, and is saved under its name by whoever follows the page
     ```sh                                 is run

@@ -69,13 +69,13 @@ std::string lineAt(const std::vector<std::string>& lines, std::size_t i) {
 
 // Equal lines once, different ones as a pair: "-" what is expected, "+" what came.
 std::string comparisonOf(const std::vector<std::string>& expected, const std::vector<std::string>& actual) {
-    std::string told;
+    std::string report;
     for (std::size_t i = 0; i < std::max(expected.size(), actual.size()); ++i) {
         const std::string wanted = lineAt(expected, i);
         const std::string came = lineAt(actual, i);
-        told += wanted == came ? "    " + wanted + "\n" : "  - " + wanted + "\n  + " + came + "\n";
+        report += wanted == came ? "    " + wanted + "\n" : "  - " + wanted + "\n  + " + came + "\n";
     }
-    return told;
+    return report;
 }
 
 std::string firstDifference(const std::vector<std::string>& expected,

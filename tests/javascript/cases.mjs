@@ -54,22 +54,22 @@ export class CaseHost {
     }
     dateOf(person, isBirth) {
         this.calls.push(`call dateForPersonWithID ${person} ${Number(isBirth)}`);
-        return this.#told(isBirth ? "birth" : "date", person);
+        return this.#answer(isBirth ? "birth" : "date", person);
     }
     sexOf(person) {
         this.calls.push(`call sexOfPersonWithID ${person}`);
         return this.#number("sex", person, 0);
     }
 
-    #told(what, person) {
+    #answer(what, person) {
         return this.lines.get(`${what} ${person}`);
     }
     #number(what, person, otherwise) {
-        const told = this.#told(what, person);
-        return told === undefined ? otherwise : Number(told);
+        const answer = this.#answer(what, person);
+        return answer === undefined ? otherwise : Number(answer);
     }
     #list(what, person) {
-        return (this.#told(what, person) ?? "").split(" ").filter(Boolean).map(Number);
+        return (this.#answer(what, person) ?? "").split(" ").filter(Boolean).map(Number);
     }
 }
 

@@ -156,7 +156,7 @@ test("a focus who is not there is named", () => {
 test("records say what the text says, with and without options", () => {
     const family = olvane.family({ persons: rows });
     for (const options of [undefined, { view: "pedigree", generations: 3 }, { shown: 0 }, {}, undefined]) {
-        const told = family
+        const text = family
             .layout(3, options)
             .map((record) => {
                 const lines = record.segments.map(({ x1, y1, x2, y2 }) => `${x1},${y1},${x2},${y2}|`).join("");
@@ -166,8 +166,8 @@ test("records say what the text says, with and without options", () => {
                 return `${record.id}:${record.x}:${record.y}:${flag}:${lines}${behind};`;
             })
             .join("");
-        assert.equal(told, family.layoutText(3, options));
-        assert.equal(told, olvane.layoutText(family, 3, options));
+        assert.equal(text, family.layoutText(3, options));
+        assert.equal(text, olvane.layoutText(family, 3, options));
     }
 });
 

@@ -45,7 +45,7 @@ const couple = `0 HEAD
 0 TRLR
 `;
 
-test("persons, families and facts are told as the file has them", () => {
+test("persons, families and facts are given as the file has them", () => {
     const file = olvane.readGedcom(bytesOf(couple), "couple.ged");
     assert.deepEqual(
         { name: file.name, encoding: file.encoding, version: file.version, diagnostics: file.diagnostics },
@@ -142,7 +142,7 @@ test("encodings are read by the platform's tables", () => {
     assert.throws(() => nameIn("ANSI", [0x41], { encoding: "KLINGON" }), /KLINGON/);
 });
 
-test("trouble in a file is told by its line, and the rest is read", () => {
+test("trouble in a file is reported by its line, and the rest is read", () => {
     const file = olvane.readGedcom(bytesOf("0 HEAD\n0 @I1@ INDI\n1 NAME A\n1 FAMS @F9@\n0 @I2@ INDI\n"), "bad.ged");
     assert.equal(file.persons.length, 2);
     assert.deepEqual(

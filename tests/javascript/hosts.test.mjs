@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A host in JavaScript is asked, laid out and told what went wrong.
+// A host in JavaScript is asked, laid out and receives what went wrong.
 
 import assert from "node:assert/strict";
 import test from "node:test";
@@ -45,7 +45,7 @@ test("a childless couple without parents stands side by side", () => {
 
 test("records say what the text says", () => {
     const host = new TableHost(henry);
-    const told = olvane
+    const text = olvane
         .layout(host, 1)
         .map((record) => {
             const lines = record.segments.map(({ x1, y1, x2, y2 }) => `${x1},${y1},${x2},${y2}|`).join("");
@@ -55,8 +55,8 @@ test("records say what the text says", () => {
             return `${record.id}:${record.x}:${record.y}:${flag}:${lines}${behind};`;
         })
         .join("");
-    assert.equal(told, olvane.layoutText(host, 1));
-    assert.match(told, /^1:27:0:0:82,40,107,40\|/);
+    assert.equal(text, olvane.layoutText(host, 1));
+    assert.match(text, /^1:27:0:0:82,40,107,40\|/);
 });
 
 test("an unknown parent is null, undefined or the constant", () => {
@@ -121,7 +121,7 @@ test("what a host throws is the cause, and what came before is kept", () => {
 });
 
 for (const question of Object.getOwnPropertyNames(TableHost.prototype).filter((name) => name !== "constructor")) {
-    test(`a failure of ${question} is told`, () => {
+    test(`a failure of ${question} is reported`, () => {
         const thrown = { not: "an Error" };
         const failing = hostOf({
             [question]() {

@@ -48,7 +48,7 @@ const family = `0 HEAD
 const file = olvane.readGedcom(new TextEncoder().encode(family), "family.ged");
 const idsOf = (picture, places) => places.map((place) => picture.boxes[place].id);
 
-test("a picture tells who belongs to which family, and how", () => {
+test("a picture says who belongs to which family, and how", () => {
     const picture = file.picture(1);
     assert.equal(picture.view, "family");
     assert.equal(picture.boxes[picture.focus].id, 1);

@@ -97,8 +97,8 @@ test("an answer counts although the memory grew while it was found", () => {
 
 test("dates come to the engine, and are asked for by their kind", () => {
     const { set_date: setDate } = instance.exports;
-    const told = [];
-    const takeDate = (date, character) => told.push(String.fromCodePoint(character)) && 0;
+    const asked = [];
+    const takeDate = (date, character) => asked.push(String.fromCodePoint(character)) && 0;
     instance.exports = { ...instance.exports, set_date: takeDate };
     const host = { dateOf: (person, isBirth) => (isBirth ? `born ${person}` : `met ${person}`) };
     instance.askingHost(host, () => questions.date_of(5, 1, 0));
@@ -108,5 +108,5 @@ test("dates come to the engine, and are asked for by their kind", () => {
     }
     instance.exports = { ...instance.exports, set_date: setDate };
     // No more than the first character goes over, and nothing of an empty date.
-    assert.deepEqual(told, ["b", "m", "一", "𝟏"]);
+    assert.deepEqual(asked, ["b", "m", "一", "𝟏"]);
 });

@@ -53,7 +53,7 @@ struct CaseSize {
     bool operator==(const CaseSize&) const = default;
 };
 
-// A family and one layout request for it, as a case file tells them.
+// A family and one layout request for it, as a case file states them.
 //
 // Holds: a person without an entry in a map has that map's default answer: no parent, no spouses, no
 //        children, no preferred spouse, alive, empty dates, sex 0.

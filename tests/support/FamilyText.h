@@ -15,8 +15,8 @@ namespace support {
 //     and 4 family("17; 42f: 9")              17, a man; 42, a woman, has a son 9 of an unknown father
 //
 // Holds: the focus is the first person named. A couple is the husband, then the wife; "f" marks every other
-//        woman. Both sides of each tie are told: lists of parents and of children, and both lists of spouses,
-//        in the order of the text. Nothing is told once only: a couple named twice stands twice in the lists.
+//        woman. Both sides of each tie are stated: lists of parents and of children, and both lists of spouses,
+//        in the order of the text. Nothing is stated once only: a couple named twice stands twice in the lists.
 // Fails: std::invalid_argument, naming the place, for a text that is not of this form.
 CaseFile family(std::string_view text);
 

@@ -7,7 +7,7 @@ import { english, factLabel, german, messagesFor } from "../src/messages";
 import { dateText, directionOf, nameOf, yearsOf } from "../src/messages/names";
 import { date, person } from "./families";
 
-test("a date is told as far as it is known", () => {
+test("a date is written as far as it is known", () => {
     const birth = date(1809, { month: 2, day: 12 });
     assert.equal(dateText(birth, english), "12 February 1809");
     assert.equal(dateText(birth, german), "12. Februar 1809");

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A GEDCOM file in the module's memory: opened from bytes, told as JSON in the order that Gedcom.mjs reads, laid
-// out, closed. What is told once per person is kept short; facts are told when somebody asks for them.
+// A GEDCOM file in the module's memory: opened from bytes, written as JSON in the order that Gedcom.mjs reads, laid
+// out, closed. What is written once per person is kept short; facts are written when somebody asks for them.
 
 #include <cstddef>
 #include <exception>
@@ -27,7 +27,7 @@ std::string lastText;
 
 namespace {
 
-void tell(JsonText& json, const gedcom::GedcomDate& date) {
+void write(JsonText& json, const gedcom::GedcomDate& date) {
     if (!date.isGiven()) return json.number(0);
     json.begin();
     json.string(date.written);
@@ -41,19 +41,19 @@ void tell(JsonText& json, const gedcom::GedcomDate& date) {
 }
 
 template <class Ids>
-void tellIds(JsonText& json, const Ids& ids) {
+void writeIds(JsonText& json, const Ids& ids) {
     json.begin();
     for (const auto id : ids) json.number(id);
     json.end();
 }
 
-void tellNames(JsonText& json, std::span<const gedcom::PersonName> names) {
+void writeNames(JsonText& json, std::span<const gedcom::PersonName> names) {
     json.begin();
     for (const gedcom::PersonName& name : names) json.string(gedcom::displayName(name));
     json.end();
 }
 
-void tellParentFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
+void writeParentFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
     json.begin();
     for (const gedcom::FamilyLink& link : links) {
         if (link.family == 0) continue;
@@ -63,7 +63,7 @@ void tellParentFamilies(JsonText& json, std::span<const gedcom::FamilyLink> link
     json.end();
 }
 
-void tellCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
+void writeCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
     json.begin();
     for (const gedcom::FamilyLink& link : links) {
         if (link.family != 0) json.number(link.family);
@@ -71,27 +71,27 @@ void tellCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> link
     json.end();
 }
 
-void tellPerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonId id) {
+void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonId id) {
     const gedcom::Person& person = data.person(id);
     json.begin();
     json.string(person.xref);
-    tellNames(json, data.names(id));
+    writeNames(json, data.names(id));
     json.string(data.firstName(id).given);
     json.string(data.firstName(id).surname);
     json.number(static_cast<int>(person.sex));
     json.number(person.dead ? 1 : 0);
-    tell(json, person.birth);
-    tell(json, person.death);
+    write(json, person.birth);
+    write(json, person.death);
     json.number(person.father);
     json.number(person.mother);
-    tellIds(json, data.spouses(id));
-    tellIds(json, data.children(id));
-    tellParentFamilies(json, data.parentLinks(id));
-    tellCoupleFamilies(json, data.coupleLinks(id));
+    writeIds(json, data.spouses(id));
+    writeIds(json, data.children(id));
+    writeParentFamilies(json, data.parentLinks(id));
+    writeCoupleFamilies(json, data.coupleLinks(id));
     json.end();
 }
 
-void tellFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyId id) {
+void writeFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyId id) {
     const gedcom::Family& family = data.family(id);
     json.begin();
     json.number(family.husband);
@@ -103,11 +103,11 @@ void tellFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyId
     json.end();
     json.number(family.married ? 1 : 0);
     json.number(family.divorced ? 1 : 0);
-    tell(json, family.marriage);
+    write(json, family.marriage);
     json.end();
 }
 
-void tell(JsonText& json, const gedcom::Diagnostic& diagnostic) {
+void write(JsonText& json, const gedcom::Diagnostic& diagnostic) {
     json.begin();
     json.number(diagnostic.line);
     json.string(gedcom::severityName(diagnostic.severity));
@@ -122,13 +122,13 @@ std::string tableOf(const gedcom::GedcomData& data) {
     json.string(data.encoding());
     json.string(data.version());
     json.begin();
-    for (gedcom::PersonId id = 1; id <= data.personCount(); ++id) tellPerson(json, data, id);
+    for (gedcom::PersonId id = 1; id <= data.personCount(); ++id) writePerson(json, data, id);
     json.end();
     json.begin();
-    for (gedcom::FamilyId id = 1; id <= data.familyCount(); ++id) tellFamily(json, data, id);
+    for (gedcom::FamilyId id = 1; id <= data.familyCount(); ++id) writeFamily(json, data, id);
     json.end();
     json.begin();
-    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) tell(json, diagnostic);
+    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) write(json, diagnostic);
     json.end();
     json.end();
     return std::move(json).take();
@@ -148,7 +148,7 @@ std::string factsText(std::span<const gedcom::Fact> facts) {
         json.begin();
         json.string(fact.tag);
         json.string(fact.value);
-        tell(json, fact.date);
+        write(json, fact.date);
         json.string(fact.place);
         json.end();
     }
@@ -214,6 +214,6 @@ OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {
     delete file;
 }
 
-OLVANE_EXPORT("last_text") const char* lastTextTold() {
+OLVANE_EXPORT("last_text") const char* lastText() {
     return js::lastText.c_str();
 }

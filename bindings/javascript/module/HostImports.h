@@ -11,7 +11,7 @@
 namespace olvane::js {
 
 // A data source whose questions JavaScript answers for the layout that is running: its functions keep what the
-// host threw and tell a failure.
+// host threw and report a failure.
 olvane_host hostOfJavaScript();
 
 }  // namespace olvane::js

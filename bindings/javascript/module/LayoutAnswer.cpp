@@ -39,7 +39,7 @@ void readRecords(LayoutAnswer& answer) {
 
 // JavaScript hands over whole numbers; what none of 64 bits could be is nobody.
 std::int64_t idFrom(double focus) {
-    constexpr double kLimit = 9007199254740992.0;  // 2^53, up to which doubles tell all whole numbers apart
+    constexpr double kLimit = 9007199254740992.0;  // 2^53, up to which doubles represent every whole number
     return std::abs(focus) < kLimit ? static_cast<std::int64_t>(focus) : 0;
 }
 

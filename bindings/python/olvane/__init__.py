@@ -12,7 +12,7 @@ A host that keeps its data elsewhere is any object with the eight methods of :cl
 asked many times, and so takes many times longer.
 
 Units are points; x grows right, y grows down, and (x, y) is the upper-left corner of a box. The size of a box is that
-of the options, 55 by 80 unless told otherwise.
+of the options, 55 by 80 unless stated otherwise.
 
 Layouts may run on several threads at once, if their hosts may be asked so; a host is asked on the thread that called.
 """

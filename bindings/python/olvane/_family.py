@@ -495,12 +495,12 @@ class _Columns:
         for name in known:
             if name not in rows:
                 continue
-            told = table.replace("_", " ")
+            label = table.replace("_", " ")
             filled: tuple[object, object]
             if name in _table.TEXT_FIELDS:
-                filled = _table.text_column(told, rows[name], name)
+                filled = _table.text_column(label, rows[name], name)
             else:
-                filled = _table.number_column(told, rows[name], name, choices.get(name))
+                filled = _table.number_column(label, rows[name], name, choices.get(name))
             setattr(group, name, filled[0])
             self._kept.append(filled[1])
 

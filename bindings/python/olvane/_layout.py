@@ -131,7 +131,7 @@ class _Answers:
         return self._answer("sex_of", (person,), lambda: _set_sex(sex, self._host.sex_of(person)))
 
     def _answer(self, operation: str, asked: tuple[object, ...], question: Callable[[], None]) -> int:
-        if self._raised is not None:  # kept where C could not be told of it
+        if self._raised is not None:  # kept where C had no way to report it
             return _FAILED
         try:
             question()

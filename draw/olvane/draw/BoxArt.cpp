@@ -207,7 +207,7 @@ void appendFrame(std::string& svg, const BoxFrame& box, LabelSex sex, const Draw
            std::string(box.isFocus ? theme.focus : colours.border) + "\" stroke-width=\"" +
            px(box.isFocus ? kFocusBorder : 1.4) + "\"/>\n";
     if (!box.isFocus) return;
-    // A second, thin frame outside tells the focus where colours are lost.
+    // A second, thin frame outside marks the focus where colours are lost.
     svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
            "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.focus) +
            "\" stroke-width=\"1.4\"/>\n";
@@ -335,7 +335,7 @@ void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
            escaped(title) + "</title>\n";
 }
 
-// What is left of a label when it must not be told.
+// What is left of a label when it must not be shown.
 PersonLabel shownLabel(const PersonLabel& label) {
     if (!label.living) {
         PersonLabel shown = label;

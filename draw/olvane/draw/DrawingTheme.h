@@ -19,7 +19,7 @@ struct BoxColours {
 // The colours of a picture, as "#rrggbb".
 //
 // Holds: texts have a contrast of 4.5 and more to everything that they can stand on, borders and lines one of
-//        3 and more to the page. Sex is also told by the corners of a box and by the silhouette, for grey
+//        3 and more to the page. Sex is also shown by the corners of a box and by the silhouette, for grey
 //        print.
 struct DrawingTheme {
     std::string_view page;
@@ -39,7 +39,7 @@ struct DrawingTheme {
 
 const DrawingTheme& lightTheme();
 const DrawingTheme& darkTheme();
-// Black, white and light greys: little ink, nothing told by colour alone.
+// Black, white and light greys: little ink, nothing shown by colour alone.
 const DrawingTheme& printTheme();
 
 // "light", "dark" or "print".

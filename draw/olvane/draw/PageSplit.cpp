@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Cuts a picture into sheets. Each sheet is a picture of its own that shows a window of the whole; a strip
-// along the right and the lower edge comes again on the next sheet, and a dashed line with ticks tells where
+// along the right and the lower edge comes again on the next sheet, and a dashed line with ticks shows where
 // that one begins.
 
 #include <olvane/draw/PageSplit.h>

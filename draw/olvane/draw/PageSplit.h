@@ -26,7 +26,7 @@ std::optional<Paper> paperOfName(std::string_view name);
 // upright or across, whichever needs fewer sheets.
 //
 // Units: the sheets are pictures in px of 1/96 inch, with their size in millimetres written in them.
-// Holds: sheets come row by row, with their places told, and without those that would be blank. A sheet holds
+// Holds: sheets come row by row, with their places stated, and without those that would be blank. A sheet holds
 //        those boxes alone that it shows.
 std::vector<SvgPicture> splitPages(const SvgPicture& picture, const Paper& paper, const std::string& title);
 

@@ -165,7 +165,7 @@ private:
                                                                : PersonLabel());
     }
 
-    // Below the picture, as wide as it needs; tells only what is there.
+    // Below the picture, as wide as it needs; lists only what is there.
     std::string legendFor(const LineStylesUsed& styles) {
         std::vector<LineStyle> rows;
         for (std::size_t i = 1; i < kLineStyles; ++i) {

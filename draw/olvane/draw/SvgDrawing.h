@@ -67,7 +67,7 @@ struct SvgPicture {
     PictureArea legend;              // of no size where there is none
 };
 
-// A person's name for a sentence; "Living" or "Name not known" where there is none to tell.
+// A person's name for a sentence; "Living" or "Name not known" where there is none to show.
 std::string fullName(const PersonLabel& label);
 
 // Draws a picture as SVG: lines below, boxes with names above, marks at their edges, a legend where lines of a

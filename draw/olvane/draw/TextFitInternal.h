@@ -20,7 +20,7 @@ struct FittedText {
 };
 
 // Breaks a clean text at spaces and behind hyphens into at most maxLines lines of at most maxWidth px each. A
-// word too long for a line is broken between two reader's characters; what does not go in is told by an
+// word too long for a line is broken between two reader's characters; what does not fit is marked by an
 // ellipsis.
 FittedText fitText(std::string_view text, const Font& font, double maxWidth, std::size_t maxLines);
 

@@ -9,7 +9,7 @@
 #include <olvane/Export.h>
 #include <olvane/detail/RecordSet.h>
 
-// One child of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
+// One child of a person, as the data source states it. Lives in ordered sets; the order of a set is the
 // order in which children are drawn.
 struct OLVANE_API ChildrenAdapter {
     int key;               // the child's person key

@@ -9,7 +9,7 @@
 #include <olvane/Export.h>
 #include <olvane/detail/RecordSet.h>
 
-// One spouse of a person, as the data source tells of it. Lives in ordered sets; the order of a set is the
+// One spouse of a person, as the data source states it. Lives in ordered sets; the order of a set is the
 // order in which spouses are drawn.
 struct OLVANE_API SpouseAdapter {
     int key;             // the spouse's person key

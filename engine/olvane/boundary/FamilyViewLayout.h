@@ -10,7 +10,7 @@
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 
 // Lays out the family view around one person and returns it as one line of text, in the form that
-// ResultWriter.cpp tells: a record for each person, in the order of the walk.
+// ResultWriter.cpp defines: a record for each person, in the order of the walk.
 //
 // personText is the decimal form of the host's id of the focus. The data source is held for the whole call.
 // Fails: never because of the data or the host. Whatever goes wrong in the layout leaves the text written so

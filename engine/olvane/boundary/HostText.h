@@ -16,7 +16,7 @@ OLVANE_API std::string intToString(int value);
 OLVANE_API int stringToInt(std::string text);
 
 // The engine's text of a host's date: its first character, and nothing for an empty date. Deliberately
-// narrow: dates are looked at only to tell two records of a child apart, and longer texts would tell apart
+// narrow: dates are looked at only to distinguish two records of a child, and longer texts would separate
 // what has been one record in every chart so far. The first byte where the text does not begin with a
 // well-formed UTF-8 character.
 OLVANE_API std::string stringToString(std::string text);

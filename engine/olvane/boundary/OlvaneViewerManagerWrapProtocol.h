@@ -32,7 +32,7 @@ private:
 // Holds: asked on the caller's thread, within a layout, and many times for the same person, since no answer
 //        is kept. Answers must agree with each other within one layout. They may contradict each other
 //        otherwise (a child that does not name its parent, a person who is their own ancestor): the layout
-//        takes them as told.
+//        takes them as answered.
 // Fails: an operation may throw anything. The layout then ends with the text written so far.
 class OlvaneViewerManagerWrapProtocol {
 public:

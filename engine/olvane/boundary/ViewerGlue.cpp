@@ -150,5 +150,5 @@ void ViewerGlue::fillPersonToKey(boost::unordered_map<std::string, int>& map) co
 void ViewerGlue::fillAddNodes(boost::unordered_map<std::string, AddNodeValues>& map) const {
     if (map.size() == records_.size() + textAddNodes_.size()) return;
     for (const AddNodeRecord& record : records_) map.emplace(personOfKey(record.key), valuesOf(record));
-    for (const auto& told : textAddNodes_) map.insert(told);
+    for (const auto& entry : textAddNodes_) map.insert(entry);
 }

@@ -37,7 +37,7 @@ void TreeViewFamilyLayouter::directLineIterator(TreeViewPerson& person, const Di
     directLineIteratorHelper(person, visitor);
 }
 
-// A sibling is told the parents of the person beside it: they are its own parents too.
+// A sibling receives the parents of the person beside it: they are its own parents too.
 void TreeViewFamilyLayouter::directLineIteratorHelper(TreeViewPerson& person,
                                                       const DirectLineVisitor& visitor) {
     walkParentsAndChildrenOnDirectLine(*this, person, visitor);

@@ -6,7 +6,7 @@
 // marriages, a woman's after all of hers, and a spouse's own such children stand on the spouse's side.
 //
 // Asking for children by key leaves an empty list under a key that is missing. An empty list behaves as no
-// list everywhere, so nobody can tell; a constant person cannot answer these questions, though.
+// list everywhere, so no caller can see the difference; a constant person cannot answer these questions, though.
 
 #include <olvane/graph/PersonWalksInternal.h>
 #include <olvane/graph/TreeViewPerson.h>

@@ -9,7 +9,7 @@
 // and a callable that the compiler sees through costs next to nothing there. Unlike a person's own walks and
 // counts, these leave no empty list under a key that is missing. Plain walks are loops over a person's lists.
 
-// The lists of children in the order of TreeViewPerson::allChildrenIterator: visit is told whose list, and the
+// The lists of children in the order of TreeViewPerson::allChildrenIterator: visit receives whose list, and the
 // key of the other parent.
 template <class VisitList>
 void visitListsOfChildren(TreeViewPerson& person, bool includeBastards, const VisitList& visit) {

@@ -42,7 +42,7 @@ public:
     TreeLineSegment frontLineSegment() const;
 
     // The segment from the last point to the one before it. The order is reversed, unlike at the front, and
-    // must stay so: TreeLinesFromLineSegments tells a turn from a straight run by it.
+    // must stay so: TreeLinesFromLineSegments distinguishes a turn from a straight run by it.
     TreeLineSegment backLineSegment() const;
 
     // Joins a segment by whichever of its ends lies on the first (or last) point; the first end is tried

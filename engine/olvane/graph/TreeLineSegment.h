@@ -6,8 +6,8 @@
 #include <olvane/Export.h>
 #include <olvane/graph/TreePoint.h>
 
-// Which way a walk along a segment goes. Lines of a tree run along the axes, so four directions are told
-// apart; every diagonal has the one code 5, whatever its slope.
+// Which way a walk along a segment goes. Lines of a tree run along the axes, so four directions exist;
+// every diagonal has the one code 5, whatever its slope.
 enum TreeLineDirection {
     kDirectionNone = 0,      // both ends are the same point
     kDirectionDown = 1,      // toward greater y

@@ -25,7 +25,7 @@ struct LayoutSegment {
     bool operator==(const LayoutSegment&) const = default;
 };
 
-// What only the record of an add-node tells: whom it stands for.
+// What only the record of an add-node states: whom it stands for.
 struct AddNodeSuffix {
     bool male = false;         // a missing father; else a missing mother
     std::int64_t childId = 0;  // the person whose parent is missing

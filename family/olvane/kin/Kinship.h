@@ -44,7 +44,7 @@ struct KinStep {
 // A way over partners, parents and children that is no KinWay.
 struct MarriageWay {
     std::vector<Place> persons;  // from A to B
-    std::vector<KinStep> steps;  // as few as the way can be told in
+    std::vector<KinStep> steps;  // as few as the way can be expressed in
 
     int links() const { return static_cast<int>(persons.size()) - 1; }
 };

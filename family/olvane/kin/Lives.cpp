@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Judges who may be living, in doubt for the person's privacy. First those whose birth says so, then from each of them
-// two steps to their kin, through whomever they lead, to those whose dates cannot tell.
+// two steps to their kin, through whomever they lead, to those whose dates do not decide it.
 
 #include <olvane/kin/Lives.h>
 
@@ -15,7 +15,7 @@ namespace {
 
 constexpr int kSteps = 2;
 
-enum class Sign : std::uint8_t { living, dead, cannotTell };
+enum class Sign : std::uint8_t { living, dead, unknown };
 
 // "Before 1950" may be any year before, and "after 1900" any year after: the one counts as living where 1950 would,
 // the other says nothing unless 1900 would.
@@ -24,7 +24,7 @@ Sign signOf(const Life& life, int thisYear) {
     const bool hasEnd = life.birth.last != Years::kOpenEnd;
     if (life.isDead || (hasEnd && life.birth.last <= oldestBirth)) return Sign::dead;
     const int year = hasEnd ? life.birth.last : life.birth.first;
-    return life.birth.isKnown() && year > oldestBirth ? Sign::living : Sign::cannotTell;
+    return life.birth.isKnown() && year > oldestBirth ? Sign::living : Sign::unknown;
 }
 
 void addKin(const KinGraph& graph, Place person, std::vector<Place>& kin) {
@@ -71,7 +71,7 @@ std::vector<bool> livingPersons(const KinGraph& graph, const Lives& lives, int t
     markWithin(graph, near);
     std::vector<bool> living(count, false);
     for (std::size_t i = 0; i < count; ++i) {
-        living[i] = signs[i] == Sign::living || (signs[i] == Sign::cannotTell && near[i]);
+        living[i] = signs[i] == Sign::living || (signs[i] == Sign::unknown && near[i]);
     }
     return living;
 }

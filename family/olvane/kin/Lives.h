@@ -46,7 +46,7 @@ struct Lives {
 };
 
 // Who is to be taken for living: everybody with no sign of death who was born less than kLongestLife years before
-// thisYear, and everybody without a sign of death whose dates cannot tell and who is within two steps, to a parent, a
+// thisYear, and everybody without a sign of death whose dates do not decide it and who is within two steps, to a parent, a
 // child or a partner, of such a person.
 //
 // Holds: one entry for each person, by place.

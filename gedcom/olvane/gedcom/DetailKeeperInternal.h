@@ -10,10 +10,10 @@
 
 namespace olvane::gedcom {
 
-// Keeps the lines that tell more of persons, families, facts and names: notes, sources, media, addresses, causes, ages and
+// Keeps the lines that state more of persons, families, facts and names: notes, sources, media, addresses, causes, ages and
 // links, and the records that they point to. Whatever else stands in a file is left out, with what lies below it.
 //
-// Holds: is told of every line below level 0, in order.
+// Holds: receives every line below level 0, in order.
 class DetailKeeper {
 public:
     DetailKeeper(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables)

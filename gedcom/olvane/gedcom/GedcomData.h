@@ -113,7 +113,7 @@ struct Family {
     bool notMarried = false;  // the record says that there was no marriage, and has none
 };
 
-// Something that a file tells of a person or a couple: an event or an attribute.
+// Something that a file states of a person or a couple: an event or an attribute.
 //
 // Holds: tag is in capitals and one of the standard's, and lives for ever. value is what stands behind the
 //        tag, or else the TYPE below it; the texts are as those of a name. An event that the file says did not

@@ -254,7 +254,7 @@ bool takeEra(Words& words, ReadDate& result) {
     return true;
 }
 
-// A day that the month does not have is left out; the month and year still tell something.
+// A day that the month does not have is left out; the month and year still say something.
 void dropImpossibleDay(ReadDate& result) {
     if (result.date.day < 1 ||
         result.date.day > daysInMonth(result.calendar, result.date.year, result.date.month)) {

@@ -14,7 +14,7 @@ enum class Severity : std::uint8_t {
     error,    // something was left out
 };
 
-// What kind of trouble a diagnostic tells of. New kinds are added at the end.
+// What kind of trouble a diagnostic reports. New kinds are added at the end.
 enum class DiagnosticKind : std::uint8_t {
     missingHeader,      // the first record is not HEAD
     missingTrailer,     // the file ends without TRLR: it may have been cut off

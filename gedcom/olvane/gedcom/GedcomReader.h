@@ -11,7 +11,7 @@
 namespace olvane::gedcom {
 
 struct ReadOptions {
-    // So many diagnostics of one kind are listed singly; one more then tells how many there were.
+    // So many diagnostics of one kind are listed singly; one more then states how many there were.
     std::size_t diagnosticsPerKind = 100;
     // Whether events and attributes are kept beyond birth, death and marriage, with their places. They take
     // memory, and a layout needs none of them.
@@ -26,7 +26,7 @@ struct ReadOptions {
 // Reads the bytes of a GEDCOM file, 5.5 to 7.0, or of a .gdz archive, in any encoding that is known.
 // name stands for the file in diagnostics and errors. Time and memory grow with the size of the bytes alone;
 // nesting depth and length of lines have no limit.
-// Fails: throws GedcomError as told there, std::bad_alloc. Everything else is a diagnostic in the result.
+// Fails: throws GedcomError as stated there, std::bad_alloc. Everything else is a diagnostic in the result.
 GedcomData readGedcomBytes(std::string bytes, const std::string& name, const ReadOptions& options = {});
 
 // Reads a file, or whatever a pipe of that name gives. Fails as readGedcomBytes does.

@@ -89,7 +89,7 @@ private:
     std::string_view shown(std::string_view text) const { return hiddenNames_.shownPlace(text); }
     std::string_view shownText(std::string_view text) const { return hiddenNames_.shownText(text); }
 
-    bool isTold(std::string_view text) const { return text.empty() || !shownText(text).empty(); }
+    bool isWritten(std::string_view text) const { return text.empty() || !shownText(text).empty(); }
 
     // Identifiers that stay are settled first, so that none that is made meets one of them, nor one that is hidden.
     void nameRecords() {
@@ -116,7 +116,7 @@ private:
         sharedXrefs_.resize(shared.size());
         sharedIsInUse_.resize(shared.size(), false);
         for (std::size_t i = 0; i < shared.size(); ++i) {
-            if (isTold(shared[i].value)) keepXref(sharedXrefs_[i], shared[i].xref);
+            if (isWritten(shared[i].value)) keepXref(sharedXrefs_[i], shared[i].xref);
         }
     }
 
@@ -131,7 +131,7 @@ private:
         while (!taken_.insert(name).second) name += 'X';
     }
 
-    // A family of which nothing is told but who belongs to it: one with a hidden partner, or without a partner and
+    // A family of which nothing is written but who belongs to it: one with a hidden partner, or without a partner and
     // with hidden children, who alone know of it.
     bool isBare(FamilyId id) const {
         const Family& family = data_.family(id);
@@ -188,12 +188,12 @@ private:
     }
 
     void writeFact(const Fact& fact) {
-        const bool untold = hiddenNames_.isAnybodyHidden() && isFreeText(fact);
-        const std::string_view value = untold ? std::string_view() : shownText(fact.value);
+        const bool omitted = hiddenNames_.isAnybodyHidden() && isFreeText(fact);
+        const std::string_view value = omitted ? std::string_view() : shownText(fact.value);
         const std::string_view place = shown(fact.place);
         const std::string_view date = shown(fact.date.written);
         const bool bare = value.empty() && place.empty() && date.empty();
-        if (bare && untold) return;
+        if (bare && omitted) return;
         if (isYesOrNo(value)) {
             line(1, fact.tag);
             line(2, "TYPE", value);
@@ -226,12 +226,12 @@ private:
     bool writeDetail(const DetailLine& detail) {
         if (!isWanted(detail.tag)) return false;
         if (!detail.isPointer) {
-            if (!isTold(detail.value)) return false;
+            if (!isWritten(detail.value)) return false;
             writeText(detail.level, detail.tag, detail.value);
             return true;
         }
         const SharedRecord* const shared = data_.sharedByXref(detail.value);
-        if (shared == nullptr || !isTold(shared->value)) return false;
+        if (shared == nullptr || !isWritten(shared->value)) return false;
         const auto place = static_cast<std::size_t>(shared - data_.sharedRecords().data());
         if (!sharedIsInUse_[place]) sharedInUse_.push_back(place);
         sharedIsInUse_[place] = true;
@@ -311,8 +311,8 @@ private:
         if (family.wife != 0) pointer(1, "WIFE", personXrefs_[family.wife - 1]);
         for (const ChildLink& link : data_.childLinks(id)) {
             if (link.child == 0) continue;
-            const bool untold = isHidden(link.child) && data_.person(link.child).parentFamily != id;
-            if (!untold) pointer(1, "CHIL", personXrefs_[link.child - 1]);
+            const bool omitted = isHidden(link.child) && data_.person(link.child).parentFamily != id;
+            if (!omitted) pointer(1, "CHIL", personXrefs_[link.child - 1]);
         }
         if (isBare(id)) return;
         for (const Fact& fact : data_.factsOfFamily(id)) writeFact(fact);

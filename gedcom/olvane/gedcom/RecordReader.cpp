@@ -85,7 +85,7 @@ struct FactTag {
     std::string_view name;
 };
 
-// What is told of persons and couples, but for numbers by which an office knows them, which are nobody's
+// What is stated of persons and couples, but for numbers by which an office knows them, which are nobody's
 // business.
 constexpr std::string_view kFactNames[] = {
     "ADOP", "ANUL", "BAPM", "BARM", "BASM", "BIRT", "BLES", "BURI", "CAST", "CENS", "CHR",
@@ -100,7 +100,7 @@ constexpr auto kFactTags = [] {
     return tags;
 }();
 
-// Empty for a tag that tells no fact.
+// Empty for a tag that states no fact.
 std::string_view factName(std::uint64_t tag) {
     const auto* const found =
         std::lower_bound(kFactTags.begin(), kFactTags.end(), tag,
@@ -396,7 +396,7 @@ void RecordReader::readPersonFact(const GedcomLine& line, std::uint64_t tag) {
     }
 }
 
-// Whatever is told below what did not happen did not happen either.
+// Whatever stands below what did not happen did not happen either.
 bool RecordReader::passOverIfNot(const GedcomLine& line) {
     if (!didNotHappen(line)) return false;
     fact_ = 0;
@@ -573,7 +573,7 @@ Slice& RecordReader::factsInHand() {
 }
 
 // Of several dates, places and types the first stands. A date that the record has kept is taken from there, so
-// that its trouble is told once.
+// that its trouble is reported once.
 void RecordReader::readFactDetail(const GedcomLine& line, std::uint64_t tag) {
     Fact& fact = tables_.facts.back();
     if (tag == kPlace && fact.place.empty()) fact.place = keptValue(line);

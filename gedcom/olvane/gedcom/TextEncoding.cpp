@@ -3,7 +3,7 @@
 
 // Which encoding a file is in, and its text in Unicode. Headers lie: files that call themselves ANSEL or ANSI
 // are often UTF-8, and those that say UTF-8 were often written by a program that only knew its system's code
-// page. UTF-8 can hardly be met by chance, so bytes that are UTF-8 are taken as such; ANSEL is told from a
+// page. UTF-8 can hardly be met by chance, so bytes that are UTF-8 are taken as such; ANSEL is distinguished from a
 // code page by whether its marks stand before letters that can bear them. The text stays as it is in the file
 // until a value is kept, because a character may be cut in two by a CONC line.
 
@@ -169,7 +169,7 @@ private:
         if (used != &kUtf8 || census_.faults == 0) return;
         diagnostics_.add(DiagnosticKind::badCharacter, Severity::warning, 0,
                          "the text is UTF-8 but for " + std::to_string(census_.faults) + " places",
-                         "those in names and dates are told below");
+                         "those in names and dates are listed below");
     }
 
     std::string_view bytes_;

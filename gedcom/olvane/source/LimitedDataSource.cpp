@@ -49,8 +49,8 @@ std::int32_t LimitedDataSource::sexOfPersonWithID(std::int64_t personId) {
 }
 
 void LimitedDataSource::count(std::size_t relatives) {
-    toldRelatives_ += relatives;
-    if (toldRelatives_ <= mostRelatives_) return;
+    countedRelatives_ += relatives;
+    if (countedRelatives_ <= mostRelatives_) return;
     throw std::length_error("the layout is too large: more than " + std::to_string(mostRelatives_ / 1000000) +
                             " million relatives are asked for; choose another focus, or leave relatives or "
                             "generations out");

@@ -12,7 +12,7 @@
 
 namespace olvane::gedcom {
 
-// A data source that ends a layout which grows without measure: it counts the relatives that it tells, each time that
+// A data source that ends a layout which grows without measure: it counts the relatives that it returns, each time that
 // they are asked for.
 //
 // Holds: refers to the other source, which must outlive it. For one layout.
@@ -36,7 +36,7 @@ private:
 
     OlvaneViewerManagerWrapProtocol& source_;
     std::size_t mostRelatives_;
-    std::size_t toldRelatives_ = 0;
+    std::size_t countedRelatives_ = 0;
 };
 
 }  // namespace olvane::gedcom

@@ -551,44 +551,44 @@ private:
     std::int64_t idAt(Index box) const { return picture_.boxes[at(box)].id; }
     bool isPerson(Index box) const { return box != kNone && picture_.boxes[at(box)].kind == BoxKind::person; }
 
-    Relations toldRelations() const {
-        Relations told;
+    Relations expressedRelations() const {
+        Relations expressed;
         for (const Family& family : picture_.families) {
             const auto parents = picture_.parents(family);
             if (parents.size() == 2 && isPerson(parents[0]) && isPerson(parents[1])) {
-                told.addPartners(idAt(parents[0]), idAt(parents[1]));
+                expressed.addPartners(idAt(parents[0]), idAt(parents[1]));
             }
-            for (const Index child : picture_.children(family)) addParents(told, child, parents);
+            for (const Index child : picture_.children(family)) addParents(expressed, child, parents);
         }
         for (const Mark& mark : picture_.marks) {
             if (mark.kind == MarkKind::partnersElsewhere && isPerson(mark.boxes[0]) &&
                 isPerson(mark.boxes[1])) {
-                told.addPartners(idAt(mark.boxes[0]), idAt(mark.boxes[1]));
+                expressed.addPartners(idAt(mark.boxes[0]), idAt(mark.boxes[1]));
             }
             if (mark.kind == MarkKind::parentsElsewhere) {
-                addParents(told, mark.boxes[0], {mark.boxes + 1, 2});
+                addParents(expressed, mark.boxes[0], {mark.boxes + 1, 2});
             }
         }
-        told.sort();
-        return told;
+        expressed.sort();
+        return expressed;
     }
 
-    void addParents(Relations& told, Index child, std::span<const Index> parents) const {
+    void addParents(Relations& expressed, Index child, std::span<const Index> parents) const {
         for (const Index parent : parents) {
-            if (isPerson(parent) && isPerson(child)) told.addParent(idAt(child), idAt(parent));
+            if (isPerson(parent) && isPerson(child)) expressed.addParent(idAt(child), idAt(parent));
         }
     }
 
     std::size_t countUntold(const kin::KinGraph& known) const {
         const Relations expected = knownRelations(known);
-        const Relations told = toldRelations();
+        const Relations expressed = expressedRelations();
         const auto missing = [](const std::vector<Relation>& all, const std::vector<Relation>& some) {
             return static_cast<std::size_t>(
                 std::count_if(all.begin(), all.end(), [&some](const Relation& relation) {
                     return !std::binary_search(some.begin(), some.end(), relation);
                 }));
         };
-        return missing(expected.parents, told.parents) + missing(expected.partners, told.partners);
+        return missing(expected.parents, expressed.parents) + missing(expected.partners, expressed.partners);
     }
 
     Relations knownRelations(const kin::KinGraph& known) const {

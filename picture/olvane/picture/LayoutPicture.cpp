@@ -47,7 +47,7 @@ public:
         writeFamilies();
         numberRepeats();
         countHidden();
-        markUntold();
+        markShownElsewhere();
         RouteOptions route;
         route.direction = directionOf(layout_.view);
         routeLines(picture_, route);
@@ -320,7 +320,7 @@ private:
     // The person's first box; kNone for who is not shown.
     Index firstBox(kin::Place person) const { return person == kin::kNobody ? kNone : firstBox_[at(person)]; }
 
-    void markUntold() {
+    void markShownElsewhere() {
         if (known_ == nullptr) return;
         firstBox_.assign(at(known_->personCount()), kNone);
         std::set<kin::UnionPlace> unions;
@@ -330,43 +330,45 @@ private:
             firstBox_[at(person)] = static_cast<Index>(i);
             for (const kin::UnionPlace u : known_->unionsAsPartner(person)) unions.insert(u);
         }
-        listTold();
-        for (const kin::UnionPlace u : unions) markUntoldOf(u);
+        listExpressed();
+        for (const kin::UnionPlace u : unions) markShownElsewhereOf(u);
     }
 
     using Relation = std::pair<kin::Place, kin::Place>;
 
-    void listTold() {
+    void listExpressed() {
         for (const Family& family : picture_.families) {
             const auto parents = picture_.parents(family);
-            if (parents.size() == 2) tell(toldPartners_, placeOfBox(parents[0]), placeOfBox(parents[1]));
+            if (parents.size() == 2)
+                addBothWays(expressedPartners_, placeOfBox(parents[0]), placeOfBox(parents[1]));
             for (const Index child : picture_.children(family)) {
                 for (const Index parent : parents)
-                    toldParents_.emplace(placeOfBox(child), placeOfBox(parent));
+                    expressedParents_.emplace(placeOfBox(child), placeOfBox(parent));
             }
         }
     }
 
     // Both ways.
-    static void tell(std::set<Relation>& told, kin::Place a, kin::Place b) {
-        told.emplace(a, b);
-        told.emplace(b, a);
+    static void addBothWays(std::set<Relation>& expressed, kin::Place a, kin::Place b) {
+        expressed.emplace(a, b);
+        expressed.emplace(b, a);
     }
 
-    void markUntoldOf(kin::UnionPlace u) {
+    void markShownElsewhereOf(kin::UnionPlace u) {
         const auto& partners = known_->partners(u);
         const Index one = firstBox(partners[0]);
         const Index other = firstBox(partners[1]);
-        const bool areTold = partners[0] == partners[1] || toldPartners_.contains({partners[0], partners[1]});
-        if (one != kNone && other != kNone && !areTold) {
+        const bool areExpressed =
+            partners[0] == partners[1] || expressedPartners_.contains({partners[0], partners[1]});
+        if (one != kNone && other != kNone && !areExpressed) {
             addMark(one, other, kNone, MarkKind::partnersElsewhere);
-            tell(toldPartners_, partners[0], partners[1]);
+            addBothWays(expressedPartners_, partners[0], partners[1]);
         }
         for (const kin::Place child : known_->children(u)) {
             if (firstBox(child) == kNone) continue;
             std::vector<Index> untold;
             for (const kin::Place parent : partners) {
-                if (firstBox(parent) != kNone && toldParents_.emplace(child, parent).second) {
+                if (firstBox(parent) != kNone && expressedParents_.emplace(child, parent).second) {
                     untold.push_back(firstBox(parent));
                 }
             }
@@ -388,8 +390,8 @@ private:
     std::vector<Index> boxOf_;  // by box of the layout
     std::vector<PictureFamily> families_;
     std::vector<Index> firstBox_;  // by person
-    std::set<Relation> toldParents_;
-    std::set<Relation> toldPartners_;
+    std::set<Relation> expressedParents_;
+    std::set<Relation> expressedPartners_;
 };
 
 }  // namespace

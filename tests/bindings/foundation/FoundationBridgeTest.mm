@@ -65,8 +65,8 @@ protected:
     void TearDown() override { [pool_ release]; }
 
     template <class Host>
-    Host* hostOf(const CaseFile& told) {
-        return [[[Host alloc] initWithCase:told] autorelease];
+    Host* hostOf(const CaseFile& input) {
+        return [[[Host alloc] initWithCase:input] autorelease];
     }
 
     std::string valuesOf(id host, std::int64_t personId) {
@@ -74,17 +74,17 @@ protected:
         return [[bridge valuesForPersonId:personId] UTF8String];
     }
 
-    std::string familyOf(const CaseFile& told) {
-        return valuesOf(hostOf<CaseFoundationHost>(told), told.focus);
+    std::string familyOf(const CaseFile& input) {
+        return valuesOf(hostOf<CaseFoundationHost>(input), input.focus);
     }
 
     // Two brothers whose father is not known: the undated child of an unknown father meets the one of the
     // mother.
     std::string textWithBirth(const std::string& date) {
-        CaseFile told = family("2f: 17 18");
-        told.focus = 17;
-        told.births[17] = date;
-        return familyOf(told);
+        CaseFile input = family("2f: 17 18");
+        input.focus = 17;
+        input.births[17] = date;
+        return familyOf(input);
     }
 
 private:
@@ -92,27 +92,27 @@ private:
 };
 
 TEST_F(FoundationBridge, givesTheTextOfTheEngine) {
-    const CaseFile told = family(kThreeGenerations);
-    EXPECT_EQ(support::layoutText(told), familyOf(told));
-    EXPECT_NE(std::string::npos, familyOf(told).find("17:"));
+    const CaseFile input = family(kThreeGenerations);
+    EXPECT_EQ(support::layoutText(input), familyOf(input));
+    EXPECT_NE(std::string::npos, familyOf(input).find("17:"));
 }
 
 TEST_F(FoundationBridge, givesTheTextOfTheEngineForManyFamilies) {
     for (std::uint64_t seed = 1; seed <= 100; ++seed) {
         support::FamilyMaker maker(seed, 25);
         if (seed % 3 == 0) maker.strewOddIds();
-        const CaseFile told = maker.any();
-        ASSERT_EQ(support::layoutText(told), familyOf(told)) << support::formatCase(told);
+        const CaseFile input = maker.any();
+        ASSERT_EQ(support::layoutText(input), familyOf(input)) << support::formatCase(input);
     }
 }
 
 TEST_F(FoundationBridge, asksTheSameQuestionsAsTheEngine) {
-    CaseFile told = family(kThreeGenerations);
-    told.births = {{5, "1850"}, {6, "1848"}, {17, "1820"}, {18, "1818"}};
-    told.dates = {{4, "1815"}, {42, "1846"}};
-    CaseFoundationHost* host = hostOf<CaseFoundationHost>(told);
-    ASSERT_EQ(support::layoutText(told), valuesOf(host, 17));
-    std::vector<std::string> calls = support::runCase(told, false, true);
+    CaseFile input = family(kThreeGenerations);
+    input.births = {{5, "1850"}, {6, "1848"}, {17, "1820"}, {18, "1818"}};
+    input.dates = {{4, "1815"}, {42, "1846"}};
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(input);
+    ASSERT_EQ(support::layoutText(input), valuesOf(host, 17));
+    std::vector<std::string> calls = support::runCase(input, false, true);
     calls.erase(calls.begin());  // the text
     EXPECT_EQ(calls, [host trace]);
     EXPECT_LT(0, std::count(calls.begin(), calls.end(), "call isPreferredSpouse 4 3"));
@@ -138,9 +138,9 @@ TEST_F(FoundationBridge, readsAListEntryByEntryWithTheQuestionsBetween) {
 
 TEST_F(FoundationBridge, readsAListThatGrowsWhileAnEntryIsAskedAboutToItsEnd) {
     CaseFile grown = family("17+42: 5 6");
-    CaseFile told = grown;
-    told.children[17] = {5};
-    EXPECT_EQ(familyOf(grown), valuesOf(hostOf<GrowingListHost>(told), 17));
+    CaseFile input = grown;
+    input.children[17] = {5};
+    EXPECT_EQ(familyOf(grown), valuesOf(hostOf<GrowingListHost>(input), 17));
 }
 
 TEST_F(FoundationBridge, leavesAHostsAnswersToThePoolOfTheCaller) {
@@ -155,21 +155,21 @@ TEST_F(FoundationBridge, leavesAHostsAnswersToThePoolOfTheCaller) {
 }
 
 TEST_F(FoundationBridge, takesANilListForAnEmptyOne) {
-    const CaseFile told = family(kThreeGenerations);
-    EXPECT_EQ(familyOf(told), valuesOf(hostOf<NilListHost>(told), 17));
+    const CaseFile input = family(kThreeGenerations);
+    EXPECT_EQ(familyOf(input), valuesOf(hostOf<NilListHost>(input), 17));
 }
 
 TEST_F(FoundationBridge, readsListsByCountObjectAtIndexAndIntegerValueAlone) {
-    const CaseFile told = family(kThreeGenerations);
-    EXPECT_EQ(familyOf(told), valuesOf(hostOf<BareListHost>(told), 17));
+    const CaseFile input = family(kThreeGenerations);
+    EXPECT_EQ(familyOf(input), valuesOf(hostOf<BareListHost>(input), 17));
 }
 
 TEST_F(FoundationBridge, endsALayoutWhereTheHostRaises) {
     for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
         for (const std::int64_t nth : {1, 3}) {
-            CaseFile told = family(kThreeGenerations);
-            told.failures[static_cast<support::HostOperation>(i)].insert(nth);
-            EXPECT_EQ(support::layoutText(told), familyOf(told)) << i;
+            CaseFile input = family(kThreeGenerations);
+            input.failures[static_cast<support::HostOperation>(i)].insert(nth);
+            EXPECT_EQ(support::layoutText(input), familyOf(input)) << i;
         }
     }
     EXPECT_NE("", familyOf(family(kThreeGenerations)));
@@ -190,11 +190,11 @@ TEST_F(FoundationBridge, endsALayoutWhereTheHostThrowsAnyObject) {
 }
 
 TEST_F(FoundationBridge, takesNoHostForOneThatAnswers0) {
-    CaseFile told;
-    told.focus = 17;
-    told.fathers[17] = 0;
-    told.mothers[17] = 0;
-    EXPECT_EQ(familyOf(told), valuesOf(nil, 17));
+    CaseFile input;
+    input.focus = 17;
+    input.fathers[17] = 0;
+    input.mothers[17] = 0;
+    EXPECT_EQ(familyOf(input), valuesOf(nil, 17));
     EXPECT_NE(std::string::npos, valuesOf(nil, 17).find(";0:"));
 }
 
@@ -219,9 +219,9 @@ TEST_F(FoundationBridge, takesADateForEmptyWhoseFirstCharacterEndsInAZeroByte) {
 }
 
 TEST_F(FoundationBridge, countsTheLow32BitsOfAnId) {
-    const CaseFile told = family(kThreeGenerations);
-    CaseFoundationHost* host = hostOf<CaseFoundationHost>(told);
-    EXPECT_EQ(familyOf(told), valuesOf(host, 17 + (std::int64_t{3} << 32)));
+    const CaseFile input = family(kThreeGenerations);
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(input);
+    EXPECT_EQ(familyOf(input), valuesOf(host, 17 + (std::int64_t{3} << 32)));
     EXPECT_EQ("", valuesOf(host, 0));
     EXPECT_EQ("", valuesOf(host, -17));
 }
@@ -239,14 +239,14 @@ TEST_F(FoundationBridge, holdsItsHostAsLongAsItLives) {
 
 // The bridge holds the only reference to the host, and goes in the first question for children.
 TEST_F(FoundationBridge, holdsTheHostToTheEndOfACallThatReleasesTheBridge) {
-    const CaseFile told = family(kThreeGenerations);
-    ReleasingHost* host = [[ReleasingHost alloc] initWithCase:told];
+    const CaseFile input = family(kThreeGenerations);
+    ReleasingHost* host = [[ReleasingHost alloc] initWithCase:input];
     OlvaneViewerBridge* bridge = [[OlvaneViewerBridge alloc] initWithManagerWrap:host];
     [host setBridge:bridge];
     [host release];
     NSString* text = [bridge valuesForPersonId:17];
     EXPECT_EQ(0, [ReleasingHost alive]);
-    EXPECT_EQ(familyOf(told), [text UTF8String]);
+    EXPECT_EQ(familyOf(input), [text UTF8String]);
 }
 
 TEST_F(FoundationBridge, aSecondInitLetsTheFirstHostGo) {

@@ -15,7 +15,7 @@
 @interface CaseFoundationHost : NSObject <OlvaneViewerManagerWrapProtocol> {
     support::CaseHost* _source;
 }
-- (id)initWithCase:(const support::CaseFile&)told;
+- (id)initWithCase:(const support::CaseFile&)input;
 + (int)alive;
 // The questions so far, in the form of the engine's own traces.
 - (const std::vector<std::string>&)trace;

@@ -32,7 +32,7 @@ NSArray* arrayOf(const std::vector<std::int64_t>& ids) {
     return list;
 }
 
-// Bytes that are no UTF-8 are told as they stand.
+// Bytes that are no UTF-8 are passed on as they stand.
 NSString* textOf(const std::string& date) {
     NSString* text = [NSString stringWithUTF8String:date.c_str()];
     return text ? text : [NSString stringWithCString:date.c_str() encoding:NSISOLatin1StringEncoding];
@@ -46,10 +46,10 @@ NSString* textOf(const std::string& date) {
     return livingHosts;
 }
 
-- (id)initWithCase:(const support::CaseFile&)told {
+- (id)initWithCase:(const support::CaseFile&)input {
     self = [super init];
     if (self) {
-        _source = new support::CaseHost(told, true);
+        _source = new support::CaseHost(input, true);
         ++livingHosts;
     }
     return self;
@@ -340,10 +340,10 @@ NSString* textOf(const std::string& date) {
 }
 
 - (NSArray*)childrenForPersonWithID:(int64_t)personId {
-    NSArray* told = [super childrenForPersonWithID:personId];
-    if (personId != 17) return told;
+    NSArray* input = [super childrenForPersonWithID:personId];
+    if (personId != 17) return input;
     [_list release];
-    _list = [told mutableCopy];
+    _list = [input mutableCopy];
     return _list;
 }
 

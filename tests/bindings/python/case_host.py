@@ -38,11 +38,11 @@ class CaseHost:
 
     def spouses_of(self, person: int) -> list[int]:
         self.calls.append(f"call spousesForPersonWithID {person}")
-        return [int(spouse) for spouse in self._told("spouses", person).split()]
+        return [int(spouse) for spouse in self._answer("spouses", person).split()]
 
     def children_of(self, person: int) -> list[int]:
         self.calls.append(f"call childrenForPersonWithID {person}")
-        return [int(child) for child in self._told("children", person).split()]
+        return [int(child) for child in self._answer("children", person).split()]
 
     def is_preferred_spouse(self, person: int, spouse: int) -> bool:
         self.calls.append(f"call isPreferredSpouse {person} {spouse}")
@@ -54,18 +54,18 @@ class CaseHost:
 
     def date_of(self, person: int, is_birth: bool) -> str:
         self.calls.append(f"call dateForPersonWithID {person} {int(is_birth)}")
-        return self._told("birth" if is_birth else "date", person)
+        return self._answer("birth" if is_birth else "date", person)
 
     def sex_of(self, person: int) -> int:
         self.calls.append(f"call sexOfPersonWithID {person}")
         return self._number("sex", person) or 0
 
-    def _told(self, what: str, person: int) -> str:
+    def _answer(self, what: str, person: int) -> str:
         return self._lines.get(f"{what} {person}", "")
 
     def _number(self, what: str, person: int) -> int | None:
-        told = self._told(what, person)
-        return int(told) if told else None
+        given = self._answer(what, person)
+        return int(given) if given else None
 
 
 class Case(NamedTuple):
@@ -79,8 +79,8 @@ class Case(NamedTuple):
 def cases_in(golden: Path) -> list[Case]:
     """All golden cases that a host can ask for."""
     files = sorted(golden.glob("*/*.case"))
-    told = [(file, lines_of(file.read_text(encoding="utf-8"))) for file in files]
-    return [case_of(file, lines) for file, lines in told if can_be_asked(lines)]
+    given = [(file, lines_of(file.read_text(encoding="utf-8"))) for file in files]
+    return [case_of(file, lines) for file, lines in given if can_be_asked(lines)]
 
 
 def lines_of(text: str) -> dict[str, str]:

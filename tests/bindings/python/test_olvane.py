@@ -337,9 +337,9 @@ class Questions(unittest.TestCase):
         for answer in (True, 1, "yes", False, 0, "", None):
             setattr(host, "is_dead", lambda _person: answer)
             self.assertEqual(1 if answer else 0, number(callbacks.is_dead, 17))
-        for sex, told in ((0, 0), (False, 0), (1, 1), (2, 1), (-1, 1), (2**32, 1)):
+        for sex, returned in ((0, 0), (False, 0), (1, 1), (2, 1), (-1, 1), (2**32, 1)):
             setattr(host, "sex_of", lambda _person: sex)
-            self.assertEqual(told, number(callbacks.sex_of, 17))
+            self.assertEqual(returned, number(callbacks.sex_of, 17))
 
     def test_a_sex_is_a_whole_number(self) -> None:
         host = Family({})
@@ -358,8 +358,8 @@ class Questions(unittest.TestCase):
             callbacks.date_of(None, 42, 0, None)
             setattr(host, "date_of", lambda *_arguments: None)
             callbacks.date_of(None, 42, 0, None)
-        told = [call.args[1] for call in date_set.call_args_list]
-        self.assertEqual([b"born 17", "一八五〇年".encode(), b""], told)
+        dates = [call.args[1] for call in date_set.call_args_list]
+        self.assertEqual([b"born 17", "一八五〇年".encode(), b""], dates)
 
     def test_a_date_is_a_string(self) -> None:
         host = Family(THREE_GENERATIONS)

@@ -12,7 +12,7 @@ import { fileFor, photograph, visitFile } from "../support/browser.mjs";
 import { livingFamily } from "../support/families.mjs";
 
 const kSecrets = /Zacharias|Geheimrat|Yolanda|Versteckt|Verborgen|Heimlichtuer|Niemandshausen|13 MAY|14 JUN|15 JUL/i;
-// Such numbers may stand in the page's own code; in what is told of the family they are theirs.
+// Such numbers may stand in the page's own code; in what is stated of the family they are theirs.
 const kYears = /1999|2001|2021/;
 const command = process.env.OLVANE_COMMAND;
 
@@ -26,8 +26,8 @@ describe("living", { skip: command ? false : "no olvane command was given" }, ()
         (text.match(/H4sI[A-Za-z0-9+/=]+/g) ?? []).map((base64) => gunzipSync(Buffer.from(base64, "base64")).toString("latin1"));
     const familyIn = (page) => {
         const block = /<script type="application\/json" id="olvane-family">([^]*?)<\/script>/.exec(readFileSync(page, "utf8"))[1];
-        const { gzip, ...told } = JSON.parse(block);
-        return JSON.stringify(told) + unpacked(gzip)[0];
+        const { gzip, ...stated } = JSON.parse(block);
+        return JSON.stringify(stated) + unpacked(gzip)[0];
     };
 
     test("without the option they are there, so that their absence means something", () => {

@@ -122,9 +122,9 @@ describe("opening", kTwoAtOnce, () => {
         assert.ok(await visit.page.isVisible("#choose-file"));
         await visit.drop("empty.ged", "0 HEAD\n0 TRLR\n");
         await visit.page.waitForFunction(() => /empty\.ged/.test(one("#notices").textContent));
-        const told = await visit.page.innerText("#notices");
-        assert.match(told, /holds no person/);
-        assert.doesNotMatch(told, /could not be read|0 HEAD/, "it is GEDCOM, and was read");
+        const shown = await visit.page.innerText("#notices");
+        assert.match(shown, /holds no person/);
+        assert.doesNotMatch(shown, /could not be read|0 HEAD/, "it is GEDCOM, and was read");
         await visit.drop("broken.gdz", Buffer.from("PK\u0003\u0004 not an archive"));
         await visit.page.waitForFunction(() => /archive/i.test(one("#notices").textContent));
         await visit.end();
@@ -162,9 +162,9 @@ describe("opening", kTwoAtOnce, () => {
         assert.equal(await visit.page.evaluate(() => holder().id), "diagnostics-button");
         await visit.page.click("#diagnostics-button");
         assert.ok(await visit.page.isVisible("#diagnostics"));
-        const told = await visit.page.innerText("#diagnostics");
-        assert.match(told, /line 8\b/i);
-        assert.match(told, /line 16\b/i);
+        const shown = await visit.page.innerText("#diagnostics");
+        assert.match(shown, /line 8\b/i);
+        assert.match(shown, /line 16\b/i);
         assert.ok((await visit.page.locator("#diagnostics li").count()) >= 4);
         await photograph(visit, "diagnostics");
         await visit.page.keyboard.press("Escape");
@@ -172,9 +172,9 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("a page opens at the person that the command was told, and speaks of the file that it was given", { skip: command ? false : "no olvane command was given" }, async () => {
+    test("a page opens at the person that the command was given, and speaks of the file that it was given", { skip: command ? false : "no olvane command was given" }, async () => {
         const file = fileFor("some.family.ged", "0 HEAD\n0 @3@ INDI\n1 NAME Abe /First/\nno line\n0 @2@ INDI\n1 NAME Bea /Second/\n0 @1@ INDI\n1 NAME Cid /Third/\n0 TRLR\n");
-        const page = fileFor("told.html", "");
+        const page = fileFor("named.html", "");
         execFileSync(command, ["page", file, "--focus", "Second", "-o", page], { stdio: "ignore" });
         const visit = await visitFile(page);
         await visit.untilFamily();
@@ -184,10 +184,10 @@ describe("opening", kTwoAtOnce, () => {
         assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can mend the file");
         await visit.end();
         execFileSync(command, ["page", file, "-o", page], { stdio: "ignore" });
-        const untold = await visitFile(page);
-        await untold.untilFamily();
-        assert.equal(await untold.page.title(), "some.family");
-        await untold.end();
+        const plain = await visitFile(page);
+        await plain.untilFamily();
+        assert.equal(await plain.page.title(), "some.family");
+        await plain.end();
     });
 
     test("a picture that asks for too much is refused in words, and others can be had", async () => {
@@ -259,8 +259,8 @@ describe("opening", kTwoAtOnce, () => {
 
     test("a link to a person who is not in the file says so, and the address is put right", async () => {
         const visit = await visitDarwins("#person=I9999&view=pedigree");
-        const told = () => visit.page.innerText('#notices [role="alert"]');
-        assert.match(await told(), /I9999.*not in this file/);
+        const shown = () => visit.page.innerText('#notices [role="alert"]');
+        assert.match(await shown(), /I9999.*not in this file/);
         const here = await visit.focus();
         assert.equal(await visit.hash(), `#person=${here}&view=pedigree`);
         await visit.page.evaluate(() => (location.hash = "#person=NOBODY"));

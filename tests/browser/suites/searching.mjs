@@ -35,7 +35,7 @@ describe("searching", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("a year tells persons of one name apart", async () => {
+    test("a year distinguishes persons of one name", async () => {
         const visit = await visitDarwins();
         await visit.page.fill("#search", "erasmus darwin 1731");
         assert.deepEqual(await found(visit), ["Erasmus Darwin"]);
@@ -43,7 +43,7 @@ describe("searching", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("the list is walked with the arrows, tells kinship, and a click chooses", async () => {
+    test("the list is walked with the arrows, names kinship, and a click chooses", async () => {
         const visit = await visitDarwins();
         const { page } = visit;
         await page.fill("#search", "emma");

@@ -167,7 +167,7 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("the panel tells facts and kinship, and its relatives are links", async () => {
+    test("the panel lists facts and kinship, and its relatives are links", async () => {
         const visit = await visitDarwins();
         const { page } = visit;
         assert.match(await page.innerText("#side-panel"), /Birth\s+12 February 1809/);

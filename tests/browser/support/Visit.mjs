@@ -88,7 +88,7 @@ export class Visit {
 
     /** Closes the short messages that went well, and the greeting. */
     async dismiss() {
-        await this.page.$$eval("#notices .told button", (buttons) => buttons.forEach((button) => button.click()));
+        await this.page.$$eval("#notices .message button", (buttons) => buttons.forEach((button) => button.click()));
     }
 
     /** Hands a file over as the browser's own dialog does. */

@@ -57,8 +57,8 @@ export async function visitEmpty(settings = {}, hash = "") {
     return visitFile(process.env.OLVANE_PAGE, settings, hash);
 }
 
-/** The page with a family in it, as the olvane command writes it. told: name, title, focus, view. */
-export async function visitFamily(gedcom, told = {}, settings = {}, hash = "") {
+/** The page with a family in it, as the olvane command writes it. stated: name, title, focus, view. */
+export async function visitFamily(gedcom, stated = {}, settings = {}, hash = "") {
     const block = JSON.stringify({
         name: "family.ged",
         title: "Family",
@@ -66,7 +66,7 @@ export async function visitFamily(gedcom, told = {}, settings = {}, hash = "") {
         view: "family",
         livingHidden: false,
         gzip: gzipSync(gedcom).toString("base64"),
-        ...told,
+        ...stated,
     }).replaceAll("<", "\\u003c");
     const page = template.replace(
         "<!-- olvane:family -->",
@@ -103,7 +103,7 @@ export async function newContext(settings = {}) {
     return context;
 }
 
-/** Keeps a picture of the window when the run was told to. */
+/** Keeps a picture of the window when the run asks for it. */
 export async function photograph(visit, name) {
     const at = process.argv.indexOf("--screenshots");
     if (at < 0) return;

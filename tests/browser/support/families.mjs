@@ -30,7 +30,7 @@ export function cousins(uncles, children) {
     return gedcom(...persons, ...families, ...ofUncles);
 }
 
-// Each tells whether it was taken for more than text.
+// Each records whether it was taken for more than text.
 const kAttempts = [
     "<script>window.wasRun=1</script>",
     "</script><script>window.wasRun=2</script>",

@@ -3,7 +3,7 @@
 
 // The family view of the plain layout: the order of the rings of relatives, the widths of family units, and
 // where each person stands. Slow and plain on purpose; it is compared with the engine on random families, so
-// the order of every float sum is the order told by the view's rules, and no sum is shared or kept.
+// the order of every float sum is the order set by the view's rules, and no sum is shared or kept.
 
 #include <support/plain/PlainFamily.h>
 

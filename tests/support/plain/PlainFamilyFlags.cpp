@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Who has relatives that the family view leaves out, told by the plain layout. The passes before the last one
+// Who has relatives that the family view leaves out, found by the plain layout. The passes before the last one
 // are overwritten by it on every real person; they are kept because they ask the host, and each question can
 // use up synthetic ids.
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The rules by which relatives enter a chart, for both views of the plain layout, told one question after the
+// The rules by which relatives enter a chart, for both views of the plain layout, written one question after the
 // other. Nothing is asked once where the rules ask twice, since every question can use up synthetic ids.
 
 #include <support/plain/PlainLayouter.h>

@@ -20,7 +20,7 @@ inline float cutPoint(double value) {
     return static_cast<float>(cut(value));
 }
 
-// A child as a host tells of it; hostOrder counts from 1, and is 0 for the child of a synthetic person.
+// A child as a host states it; hostOrder counts from 1, and is 0 for the child of a synthetic person.
 struct ChildRecord {
     int key = 0;
     std::string date;
@@ -30,7 +30,7 @@ struct ChildRecord {
 
 bool operator<(const ChildRecord& a, const ChildRecord& b);
 
-// A spouse as a host tells of it; hostOrder counts from 1.
+// A spouse as a host states it; hostOrder counts from 1.
 struct SpouseRecord {
     int key = 0;
     bool preferred = false;

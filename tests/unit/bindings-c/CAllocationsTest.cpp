@@ -113,15 +113,15 @@ TEST_P(CMemory, thatRunsOutAnywhereIsAStatusInBothViews) {
 TEST(CMemoryOfGoldenCases, thatRunsOutAnywhereIsAStatus) {
     for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
         SCOPED_TRACE(request.name);
-        CallbackHost host(request.told);
+        CallbackHost host(request.input);
         const olvane_host callbacks = host.callbacks();
         olvane_options options;
         olvane_options_default(&options);
-        options.generations = std::max(1, request.told.maxGenerations);
-        options.flag_depth = request.told.maxStackDepth;
+        options.generations = std::max(1, request.input.maxGenerations);
+        options.flag_depth = request.input.maxStackDepth;
         const auto view =
-            request.told.view == support::CaseView::pedigree ? unit::pedigreeOf : unit::familyOf;
-        expectAStatusWhereverMemoryRunsOut([&] { return view(callbacks, request.told.focus, &options); },
+            request.input.view == support::CaseView::pedigree ? unit::pedigreeOf : unit::familyOf;
+        expectAStatusWhereverMemoryRunsOut([&] { return view(callbacks, request.input.focus, &options); },
                                            {OLVANE_OUT_OF_MEMORY, OLVANE_HOST_FAILED});
     }
 }

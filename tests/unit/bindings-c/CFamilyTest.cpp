@@ -79,11 +79,11 @@ std::vector<std::uint32_t> childrenOf(const olvane_family* family, std::int64_t 
 }
 
 TEST(CFamily, hasTheTextOfAHostWithTheSameAnswers) {
-    const support::CaseFile told = support::family("1+2: 3 4f; 1: 5");
+    const support::CaseFile input = support::family("1+2: 3 4f; 1: 5");
     const Couple couple;
     const FamilyPointer family = familyOf(couple.columns());
     for (std::int64_t focus = 1; focus <= 5; ++focus) {
-        support::CaseFile request = told;
+        support::CaseFile request = input;
         request.focus = focus;
         unit::CallbackHost host(request);
         const olvane_host callbacks = host.callbacks();

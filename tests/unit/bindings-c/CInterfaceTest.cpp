@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The C interface gives what the engine gives, tells what went wrong, and lets nothing escape.
+// The C interface gives what the engine gives, reports what went wrong, and lets nothing escape.
 
 #include <algorithm>
 #include <atomic>
@@ -51,11 +51,11 @@ CaseFile randomRequest(std::uint64_t seed) {
 }
 
 TEST(CLayout, hasTheTextOfTheEngine) {
-    const CaseFile told = family(kThreeGenerations);
-    const Answer answer = layoutOf(told);
+    const CaseFile input = family(kThreeGenerations);
+    const Answer answer = layoutOf(input);
     EXPECT_EQ(OLVANE_OK, answer.status);
     EXPECT_NE("", answer.text());
-    EXPECT_EQ(support::layoutText(told), answer.text());
+    EXPECT_EQ(support::layoutText(input), answer.text());
 }
 
 TEST(CLayout, hasTheTextOfTheEngineForManyFamiliesAndRequests) {
@@ -96,7 +96,7 @@ TEST(CRecords, sayWhatTheTextSays) {
     EXPECT_GT(addNodes, 100u);
 }
 
-TEST(CRecords, tellForWhomAnAddNodeStands) {
+TEST(CRecords, stateForWhomAnAddNodeStands) {
     const Answer answer = layoutOf(family("17"));
     const std::vector<olvane_record> records = answer.records();
     ASSERT_EQ(3u, records.size());
@@ -192,19 +192,19 @@ TEST(CAnsweredIds, thatAreNot1To2147483647EndTheLayoutByName) {
     for (const std::int64_t id : {std::int64_t{0}, std::int64_t{-1}, std::int64_t{-5}, std::int64_t{1} << 31,
                                   (std::int64_t{1} << 32) + 4, (std::int64_t{1} << 53) + 1,
                                   std::numeric_limits<std::int64_t>::min()}) {
-        CaseFile told = family("17");
-        told.fathers[17] = id;
-        const Answer father = layoutOf(told);
+        CaseFile input = family("17");
+        input.fathers[17] = id;
+        const Answer father = layoutOf(input);
         EXPECT_EQ(OLVANE_INVALID_ID, father.status) << id;
         EXPECT_EQ(
             "father_of(17) answered " + std::to_string(id) + ", which is no id: ids are 1 to 2147483647",
             failureOf(father));
-        told = family("17+42");
-        told.spouses[17].push_back(id);
-        EXPECT_EQ(OLVANE_INVALID_ID, layoutOf(told).status) << id;
-        told = family("17+42: 5");
-        told.children[42].push_back(id);
-        EXPECT_EQ(OLVANE_INVALID_ID, layoutOf(told).status) << id;
+        input = family("17+42");
+        input.spouses[17].push_back(id);
+        EXPECT_EQ(OLVANE_INVALID_ID, layoutOf(input).status) << id;
+        input = family("17+42: 5");
+        input.children[42].push_back(id);
+        EXPECT_EQ(OLVANE_INVALID_ID, layoutOf(input).status) << id;
     }
 }
 
@@ -219,13 +219,13 @@ TEST(CAnsweredIds, thatAreOddNeverDrawSomebodyElse) {
     for (std::uint64_t seed = 1; seed <= 200; ++seed) {
         support::FamilyMaker maker(seed, 20);
         maker.strewOddIds();
-        const CaseFile told = maker.any();
-        if (told.focus < 1 || told.focus > std::numeric_limits<std::int32_t>::max()) continue;
-        const Answer answer = layoutOf(told);
+        const CaseFile input = maker.any();
+        if (input.focus < 1 || input.focus > std::numeric_limits<std::int32_t>::max()) continue;
+        const Answer answer = layoutOf(input);
         if (answer.status == OLVANE_OK) {
-            EXPECT_EQ(support::layoutText(told), answer.text()) << support::formatCase(told);
+            EXPECT_EQ(support::layoutText(input), answer.text()) << support::formatCase(input);
         } else {
-            EXPECT_EQ(OLVANE_INVALID_ID, answer.status) << support::formatCase(told);
+            EXPECT_EQ(OLVANE_INVALID_ID, answer.status) << support::formatCase(input);
             EXPECT_EQ("", answer.text());
             ++refused;
         }
@@ -234,15 +234,15 @@ TEST(CAnsweredIds, thatAreOddNeverDrawSomebodyElse) {
 }
 
 TEST(CNobody, isTheConstant) {
-    CaseFile told = family("17");
-    told.fathers[17] = OLVANE_PERSON_NOT_FOUND;
-    EXPECT_EQ(layoutOf(family("17")).text(), layoutOf(told).text());
+    CaseFile input = family("17");
+    input.fathers[17] = OLVANE_PERSON_NOT_FOUND;
+    EXPECT_EQ(layoutOf(family("17")).text(), layoutOf(input).text());
 }
 
 TEST(CFailures, nameTheCallbackAndThePerson) {
-    CaseFile told = family("17+42");
-    told.failures[support::HostOperation::isPersonDead] = {1};
-    const Answer answer = layoutOf(told);
+    CaseFile input = family("17+42");
+    input.failures[support::HostOperation::isPersonDead] = {1};
+    const Answer answer = layoutOf(input);
     EXPECT_EQ(OLVANE_HOST_FAILED, answer.status);
     EXPECT_EQ("is_dead(42) returned " + std::to_string(unit::kHostCode), failureOf(answer));
     EXPECT_EQ("", failureOf(layoutOf(family("17"))));
@@ -250,18 +250,18 @@ TEST(CFailures, nameTheCallbackAndThePerson) {
 }
 
 // Lets each call of a request fail in turn; behind each failure the request is whole again. The number of calls.
-std::size_t letEveryCallFail(const CaseFile& told) {
-    std::vector<std::string> calls = support::runCase(told, false, true);
+std::size_t letEveryCallFail(const CaseFile& input) {
+    std::vector<std::string> calls = support::runCase(input, false, true);
     calls.erase(calls.begin());  // the text
     for (std::string& call : calls) call.erase(0, std::string("call ").size());
-    const std::string whole = support::layoutText(told);
+    const std::string whole = support::layoutText(input);
     for (std::size_t n = 0; n < calls.size(); ++n) {
-        const CaseFile failing = unit::failingAt(told, calls, n);
+        const CaseFile failing = unit::failingAt(input, calls, n);
         const Answer answer = layoutOf(failing);
         EXPECT_EQ(OLVANE_HOST_FAILED, answer.status) << calls[n];
         EXPECT_EQ(unit::kHostCode, answer.hostCode()) << calls[n];
         EXPECT_EQ(support::layoutText(failing), answer.text()) << calls[n];
-        const Answer again = layoutOf(told);
+        const Answer again = layoutOf(input);
         EXPECT_EQ(OLVANE_OK, again.status) << "behind " << calls[n];
         EXPECT_EQ(whole, again.text()) << "behind " << calls[n];
     }
@@ -269,17 +269,17 @@ std::size_t letEveryCallFail(const CaseFile& told) {
 }
 
 TEST(CFailures, ofAnyCallbackAtAnyTimeAreReportedInBothViews) {
-    CaseFile told = family(kThreeGenerations);
-    EXPECT_LT(60u, letEveryCallFail(told));
-    told.view = CaseView::pedigree;
-    told.maxGenerations = 4;
-    EXPECT_LT(20u, letEveryCallFail(told));
+    CaseFile input = family(kThreeGenerations);
+    EXPECT_LT(60u, letEveryCallFail(input));
+    input.view = CaseView::pedigree;
+    input.maxGenerations = 4;
+    EXPECT_LT(20u, letEveryCallFail(input));
 }
 
 TEST(CFailures, ofAnyCallbackAtAnyTimeOfGoldenCasesAreReported) {
     for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
         SCOPED_TRACE(request.name);
-        EXPECT_LT(10u, letEveryCallFail(request.told));
+        EXPECT_LT(10u, letEveryCallFail(request.input));
     }
 }
 
@@ -339,7 +339,7 @@ TEST(CFailures, ofNullPointersAreStatuses) {
     olvane_layout_free(nullptr);
 }
 
-TEST(CFailures, ofNullListsAndDatesAreTold) {
+TEST(CFailures, ofNullListsAndDatesAreReported) {
     CallbackHost host(family("17+42"));
     olvane_host callbacks = host.callbacks();
     callbacks.children_of = [](void*, std::int64_t, olvane_person_list* children) {
@@ -400,9 +400,9 @@ TEST(CNesting, isRefusedAndLeavesTheOuterLayoutAlone) {
 TEST(CThreads, layOutTheirOwnFamiliesAtOnce) {
     const std::vector<CaseFile> families = {family("17"), family(kThreeGenerations)};
     std::atomic<int> differences{0};
-    const auto run = [&differences](const CaseFile& told) {
-        const std::string expected = support::layoutText(told);
-        for (int i = 0; i < 100; ++i) differences += layoutOf(told).text() == expected ? 0 : 1;
+    const auto run = [&differences](const CaseFile& input) {
+        const std::string expected = support::layoutText(input);
+        for (int i = 0; i < 100; ++i) differences += layoutOf(input).text() == expected ? 0 : 1;
     };
     std::thread first([&] { run(families[0]); });
     std::thread second([&] { run(families[1]); });
@@ -414,13 +414,13 @@ TEST(CThreads, layOutTheirOwnFamiliesAtOnce) {
 #ifdef OLVANE_FRAMES_ARE_PLAIN
 // A line of fathers, as long as a pedigree may be.
 void* layOutMostGenerations(void* status) {
-    CaseFile told;
-    told.focus = 1;
+    CaseFile input;
+    input.focus = 1;
     for (std::int64_t person = 1; person < OLVANE_MOST_GENERATIONS; ++person) {
-        told.fathers[person] = person + 1;
-        told.children[person + 1] = {person};
+        input.fathers[person] = person + 1;
+        input.children[person + 1] = {person};
     }
-    CallbackHost host(told);
+    CallbackHost host(input);
     olvane_options options;
     olvane_options_default(&options);
     options.generations = OLVANE_MOST_GENERATIONS;

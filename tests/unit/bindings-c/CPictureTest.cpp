@@ -52,11 +52,11 @@ std::string jsonOf(const PicturePointer& picture) {
 }
 
 // The same in C++, without the C interface.
-olvane::picture::Picture libraryPictureOf(const CaseFile& told, bool unknownParents = true) {
+olvane::picture::Picture libraryPictureOf(const CaseFile& input, bool unknownParents = true) {
     olvane::picture::LayoutPictureOptions options;
     options.unknownParents = unknownParents;
     return olvane::picture::pictureOf(
-        olvane::familyLayout(told.focus, std::make_shared<support::CaseManager>(told)), options);
+        olvane::familyLayout(input.focus, std::make_shared<support::CaseManager>(input)), options);
 }
 
 // A couple 1 and 2, divorced, with a son 3 and an adopted daughter 4; 1 has a son 5 by somebody unknown.
@@ -90,10 +90,10 @@ struct Couple {
 
 TEST(CPicture, isTheLibrarysPictureForManyFamilies) {
     for (std::uint64_t seed = 1; seed <= 100; ++seed) {
-        const CaseFile told = support::FamilyMaker(seed, 25).any();
-        const Answer answer = layoutOf(told);
-        ASSERT_EQ(OLVANE_OK, answer.status) << support::formatCase(told);
-        const olvane::picture::Picture expected = libraryPictureOf(told);
+        const CaseFile input = support::FamilyMaker(seed, 25).any();
+        const Answer answer = layoutOf(input);
+        ASSERT_EQ(OLVANE_OK, answer.status) << support::formatCase(input);
+        const olvane::picture::Picture expected = libraryPictureOf(input);
         const PicturePointer picture = pictureOf(answer);
         const olvane_picture_arrays arrays = arraysOf(picture);
         EXPECT_EQ(olvane::picture::pictureJson(expected), jsonOf(picture));
@@ -164,11 +164,11 @@ TEST(CPicture, countsTheRelativesWithoutABoxInTheFamilyThatItIsOf) {
 }
 
 TEST(CPicture, leavesUnknownParentsOutOnRequest) {
-    const CaseFile told = family("17+42: 5");
-    const Answer answer = layoutOf(told);
+    const CaseFile input = family("17+42: 5");
+    const Answer answer = layoutOf(input);
     const PicturePointer without = pictureOf(answer, nullptr, 0);
     EXPECT_EQ(3u, arraysOf(without).box_count);
-    EXPECT_EQ(olvane::picture::pictureJson(libraryPictureOf(told, false)), jsonOf(without));
+    EXPECT_EQ(olvane::picture::pictureJson(libraryPictureOf(input, false)), jsonOf(without));
     const PicturePointer with = pictureOf(answer);
     const olvane_picture_arrays arrays = arraysOf(with);
     ASSERT_EQ(5u, arrays.box_count);
@@ -182,9 +182,9 @@ TEST(CPicture, leavesUnknownParentsOutOnRequest) {
 }
 
 TEST(CPicture, ofALayoutThatHoldsNothingIsEmpty) {
-    CaseFile told = family("17");
-    told.failures[support::HostOperation::sexOfPersonWithID] = {1};
-    const PicturePointer picture = pictureOf(layoutOf(told));
+    CaseFile input = family("17");
+    input.failures[support::HostOperation::sexOfPersonWithID] = {1};
+    const PicturePointer picture = pictureOf(layoutOf(input));
     const olvane_picture_arrays arrays = arraysOf(picture);
     EXPECT_EQ(0u, arrays.box_count);
     EXPECT_EQ(nullptr, arrays.boxes);

@@ -50,7 +50,7 @@ Answer pedigreeOf(const olvane_host& host, std::int64_t focus, const olvane_opti
 // The layout that a case asks for, through the C interface.
 Answer layoutOf(const support::CaseFile& request);
 
-// A C record as the reader of the result text tells it.
+// A C record as the reader of the result text states it.
 olvane::LayoutRecord readerForm(const olvane_record& record);
 
 }  // namespace unit

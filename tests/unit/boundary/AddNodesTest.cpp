@@ -131,9 +131,9 @@ TEST(AddNodes, fatherIsAskedForBeforeTheMother) {
 }
 
 TEST(AddNodes, failingMotherLeavesTheFathersIdUsedUp) {
-    support::CaseFile told = family("17");
-    told.failures[support::HostOperation::motherForPersonWithID] = {1};
-    Request request(told);
+    support::CaseFile input = family("17");
+    input.failures[support::HostOperation::motherForPersonWithID] = {1};
+    Request request(input);
     EXPECT_EQ("motherForPersonWithID fails at call 1",
               failureOf<support::HostFailure>([&] { parentsOf(request, 17); }));
     EXPECT_TRUE(request.glue.addNodes.empty());
@@ -141,10 +141,10 @@ TEST(AddNodes, failingMotherLeavesTheFathersIdUsedUp) {
 }
 
 TEST(AddNodes, onlyTheNotFoundValueMeansThatAParentIsUnknown) {
-    support::CaseFile told = family("17");
-    told.fathers[17] = 0x7fffffff;
-    told.mothers[17] = 0;
-    Request request(told);
+    support::CaseFile input = family("17");
+    input.fathers[17] = 0x7fffffff;
+    input.mothers[17] = 0;
+    Request request(input);
     EXPECT_EQ((ParentTexts{"2147483647", "0"}), parentsOf(request, 17));
     EXPECT_TRUE(request.glue.addNodes.empty());
 }
@@ -154,10 +154,10 @@ TEST(AddNodes, notFoundIsTheLargest64BitNumber) {
 }
 
 TEST(AddNodes, parentsIdIsCutToItsLow32Bits) {
-    support::CaseFile told = family("17");
-    told.fathers[17] = 0x100000003;
-    told.mothers[17] = 0x7fffffff00000004;
-    Request request(told);
+    support::CaseFile input = family("17");
+    input.fathers[17] = 0x100000003;
+    input.mothers[17] = 0x7fffffff00000004;
+    Request request(input);
     EXPECT_EQ((ParentTexts{"3", "4"}), parentsOf(request, 17));
 }
 

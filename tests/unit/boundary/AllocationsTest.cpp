@@ -65,7 +65,7 @@ std::int64_t allocationsBeforeTheGuard(const Source& source) {
     return allocationsMade() - before;
 }
 
-// The first ones, so many as are told, and the last one, which makes the returned text, lie outside the guard.
+// The first ones, so many as are stated, and the last one, which makes the returned text, lie outside the guard.
 void expectEveryAllocationMayFail(const Layout& layOut, std::int64_t before) {
     const Attempt whole = layOutWithFailureAt(0, layOut);
     ASSERT_LT(100u, whole.text.size());
@@ -84,8 +84,8 @@ void expectEveryAllocationMayFail(const Layout& layOut, std::int64_t before) {
     EXPECT_LT(0, cutTexts);  // some failed while records were written
 }
 
-void expectEveryAllocationMayFail(const CaseFile& told) {
-    const Source source = std::make_shared<support::CaseManager>(told);
+void expectEveryAllocationMayFail(const CaseFile& input) {
+    const Source source = std::make_shared<support::CaseManager>(input);
     const Layout layOut = [&source] {
         std::string text = FamilyViewLayout("17", source);
         EXPECT_EQ(1, source.use_count());
@@ -99,18 +99,18 @@ TEST(MemoryRunsOut, atAnyAllocationOfASmallFamilyAPrefixComesBackAndNothingLeaks
 }
 
 TEST(MemoryRunsOut, atAnyAllocationOfAFamilyWithSiblingsStepChildrenAndUnknownParents) {
-    CaseFile told = family("17+42: 5 6f; 17+43; 42f: 8; 3+4: 17 18; 3: 20; 1+2: 3 22; 5+50: 51");
-    told.births[17] = "1850";
-    expectEveryAllocationMayFail(told);
+    CaseFile input = family("17+42: 5 6f; 17+43; 42f: 8; 3+4: 17 18; 3: 20; 1+2: 3 22; 5+50: 51");
+    input.births[17] = "1850";
+    expectEveryAllocationMayFail(input);
 }
 
 TEST(MemoryRunsOut, atAnyAllocationOfGoldenCasesOfBothViewsAPrefixComesBackAndNothingLeaks) {
     for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
         SCOPED_TRACE(request.name);
         const std::int64_t atFirst = allocationsMade();
-        const Source source = std::make_shared<support::CaseManager>(support::borrowed(request.told));
+        const Source source = std::make_shared<support::CaseManager>(support::borrowed(request.input));
         const std::int64_t before = allocationsMade() - atFirst + allocationsBeforeTheGuard(source);
-        expectEveryAllocationMayFail([&request] { return support::layoutText(request.told); }, before);
+        expectEveryAllocationMayFail([&request] { return support::layoutText(request.input); }, before);
     }
 }
 

@@ -36,12 +36,12 @@ std::vector<DisturbedRequest> disturbedRequests() {
     return requests;
 }
 
-support::CaseFile failingAt(const support::CaseFile& told, const std::vector<std::string>& calls,
+support::CaseFile failingAt(const support::CaseFile& input, const std::vector<std::string>& calls,
                             std::size_t n) {
     const auto operationOf = [&](std::size_t i) { return calls[i].substr(0, calls[i].find(' ')); };
     std::int64_t count = 0;
     for (std::size_t i = 0; i <= n; ++i) count += operationOf(i) == operationOf(n) ? 1 : 0;
-    support::CaseFile failing = told;
+    support::CaseFile failing = input;
     for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
         const auto operation = static_cast<support::HostOperation>(i);
         if (support::operationName(operation) == operationOf(n)) failing.failures[operation] = {count};

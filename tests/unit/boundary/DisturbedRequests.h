@@ -13,7 +13,7 @@ namespace unit {
 
 struct DisturbedRequest {
     std::string name;  // of the golden case, with its folder
-    support::CaseFile told;
+    support::CaseFile input;
 };
 
 // Golden cases of both views, for the tests that let a request fail at each of its calls or allocations in turn.
@@ -22,7 +22,7 @@ std::vector<DisturbedRequest> disturbedRequests();
 
 // The case again, with its n-th call of all failing, counted from 0. Calls are those of the unhurt request, each
 // "<operation> <arguments>".
-support::CaseFile failingAt(const support::CaseFile& told, const std::vector<std::string>& calls,
+support::CaseFile failingAt(const support::CaseFile& input, const std::vector<std::string>& calls,
                             std::size_t n);
 
 }  // namespace unit

@@ -20,7 +20,7 @@ void expectCase(const std::string& compact, const std::string& directives) {
     EXPECT_EQ(formatCase(parseCase(directives)), formatCase(family(compact))) << compact;
 }
 
-TEST(FamilyText, coupleWithChildrenTellsBothSidesOfEveryTie) {
+TEST(FamilyText, coupleWithChildrenStatesBothSidesOfEveryTie) {
     expectCase("17+42: 5 6f",
                "focus 17\nspouses 17 42\nspouses 42 17\nsex 42 1\nsex 6 1\nchildren 17 5 6\nchildren 42 5 6\n"
                "father 5 17\nmother 5 42\nfather 6 17\nmother 6 42\n");

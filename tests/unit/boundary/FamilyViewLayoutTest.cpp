@@ -28,12 +28,13 @@ using unit::Calls;
 using unit::failingAt;
 using unit::Request;
 
-std::string layOut(const std::string& personText, const CaseFile& told) {
-    return FamilyViewLayout(personText, std::make_shared<CaseManager>(told));
+std::string layOut(const std::string& personText, const CaseFile& input) {
+    return FamilyViewLayout(personText, std::make_shared<CaseManager>(input));
 }
 
-std::string layOutById(std::int64_t id, const CaseFile& told) {
-    return OlvaneViewerBridge::initWithManagerWrap(std::make_shared<CaseManager>(told)).valuesForPersonId(id);
+std::string layOutById(std::int64_t id, const CaseFile& input) {
+    return OlvaneViewerBridge::initWithManagerWrap(std::make_shared<CaseManager>(input))
+        .valuesForPersonId(id);
 }
 
 // The focus alone under two unknown parents; the name of the focus is what the request said.
@@ -79,8 +80,8 @@ TEST(FocusOfALayout, zeroByteInItsTextEndsTheResultThere) {
 
 TEST(FocusOfALayout, hasKeyZeroWhateverItsId) {
     for (const char* id : {"1", "17", "2147483647"}) {
-        CaseFile told = family(id);
-        const std::string firstPerson = support::runCase(told, true, false).at(1);
+        CaseFile input = family(id);
+        const std::string firstPerson = support::runCase(input, true, false).at(1);
         EXPECT_EQ("P 0 " + std::string(id) + " ", firstPerson.substr(0, 5 + std::string(id).size()));
     }
 }
@@ -135,10 +136,10 @@ TEST(Bridge, withoutADataSourceGivesTheEmptyText) {
 // --- What survives a call.
 
 TEST(Layouts, sameRequestTwiceGivesTheSameText) {
-    const CaseFile told = family("17+42: 5 6f; 17: 8; 3: 17 18 19f; 5+50: 51");
-    const std::string first = layOut("17", told);
+    const CaseFile input = family("17+42: 5 6f; 17: 8; 3: 17 18 19f; 5+50: 51");
+    const std::string first = layOut("17", input);
     EXPECT_NE(std::string::npos, first.find(":M:"));  // with add-nodes, whose ids could run on
-    EXPECT_EQ(first, layOut("17", told));
+    EXPECT_EQ(first, layOut("17", input));
 }
 
 TEST(Layouts, requestThatFailedLeavesNoMarkOnTheNext) {
@@ -171,53 +172,53 @@ TEST(Layouts, drawIn55By80BoxesWithTheirGaps) {
 }
 
 TEST(Layouts, spouseListedTwiceIsDrawnTwice) {
-    CaseFile told = family("17+42; 17+42");
-    told.spouses[42] = {17};
+    CaseFile input = family("17+42; 17+42");
+    input.spouses[42] = {17};
     EXPECT_EQ(
         "17:27:0:0:82,45,107,45|82,35,227,35|55,-15,55,-15|55,0,55,-15|;"
         "-1:-12:-110:0:55,-70,55,-15|42,-70,67,-70|:M:17;-2:67:-110:0::F:17;"
         "42:107:0:0:;42:227:0:0:;",
-        layOut("17", told));
+        layOut("17", input));
 }
 
 TEST(Layouts, idsOfRelativesAbove32BitsAreDrawnCut) {
-    CaseFile told = family("17+42: 5; 3+4: 17");
-    const std::string whole = layOut("17", told);
+    CaseFile input = family("17+42: 5; 3+4: 17");
+    const std::string whole = layOut("17", input);
     constexpr support::PersonId kAbove = 0x500000000;
-    told.spouses[17] = {kAbove + 42};
-    told.spouses[42] = {kAbove + 17};
-    told.children[17] = {kAbove + 5};
-    told.children[42] = {kAbove * 3 + 5};
-    told.children[3] = {kAbove + 17};
-    told.fathers[5] = kAbove + 17;
-    told.mothers[5] = kAbove + 42;
-    told.fathers[17] = kAbove + 3;
-    told.mothers[17] = kAbove + 4;
-    EXPECT_EQ(whole, layOut("17", told));
+    input.spouses[17] = {kAbove + 42};
+    input.spouses[42] = {kAbove + 17};
+    input.children[17] = {kAbove + 5};
+    input.children[42] = {kAbove * 3 + 5};
+    input.children[3] = {kAbove + 17};
+    input.fathers[5] = kAbove + 17;
+    input.mothers[5] = kAbove + 42;
+    input.fathers[17] = kAbove + 3;
+    input.mothers[17] = kAbove + 4;
+    EXPECT_EQ(whole, layOut("17", input));
 }
 
 TEST(Layouts, spouseOfAnIdBelowOneEndsTheLayoutWithNothingWritten) {
-    CaseFile told = family("17");
-    told.spouses[17] = {-5};
-    EXPECT_EQ("", layOut("17", told));
+    CaseFile input = family("17");
+    input.spouses[17] = {-5};
+    EXPECT_EQ("", layOut("17", input));
 }
 
 // --- Hosts that fail.
 
 // All questions come before the first record, so that nothing is written yet, whichever of them fails.
-void expectEmptyTextWhicheverCallFails(const CaseFile& told) {
-    Request unhurt(told);
+void expectEmptyTextWhicheverCallFails(const CaseFile& input) {
+    Request unhurt(input);
     const std::string whole = FamilyViewLayout("17", unhurt.source);
     const Calls calls = unhurt.newCalls();
     ASSERT_NE("", whole);
     ASSERT_LT(60u, calls.size());
     for (std::size_t n = 0; n < calls.size(); ++n) {
-        Request request(failingAt(told, calls, n));
+        Request request(failingAt(input, calls, n));
         EXPECT_EQ("", FamilyViewLayout("17", request.source)) << "call " << n << ": " << calls[n];
         EXPECT_EQ(Calls(calls.begin(), calls.begin() + static_cast<std::ptrdiff_t>(n) + 1),
                   request.newCalls());
         EXPECT_EQ(2, request.source.use_count());  // the request's own two references
-        ASSERT_EQ(whole, layOut("17", told)) << "behind a failure of call " << n;
+        ASSERT_EQ(whole, layOut("17", input)) << "behind a failure of call " << n;
     }
 }
 
@@ -226,15 +227,15 @@ TEST(FailingHost, leavesTheEmptyTextAtEveryCallAndIsNotAskedAgain) {
 }
 
 TEST(FailingHost, leavesTheEmptyTextAtEveryCallOfAFamilyWithUnknownParentsAndRemarriages) {
-    CaseFile told =
+    CaseFile input =
         family("17+42: 5 6f; 17+43: 7; 42f: 8; 3+4: 17 18 19f; 3: 20; 4f: 21; 1+2: 3 22; 5+50: 51");
-    told.births[17] = "1850";
-    expectEmptyTextWhicheverCallFails(told);
+    input.births[17] = "1850";
+    expectEmptyTextWhicheverCallFails(input);
 }
 
 // The same for a case of any view: its calls up to the one that fails, no text, and the next request is whole.
-void expectNoTextWhicheverCallFails(const CaseFile& told) {
-    const Calls whole = support::runCase(told, false, true);
+void expectNoTextWhicheverCallFails(const CaseFile& input) {
+    const Calls whole = support::runCase(input, false, true);
     ASSERT_NE("text ", whole.front());
     ASSERT_LT(15u, whole.size());
     Calls calls;
@@ -243,8 +244,8 @@ void expectNoTextWhicheverCallFails(const CaseFile& told) {
     for (std::size_t n = 0; n < calls.size(); ++n) {
         Calls expected(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(n) + 2);
         expected.front() = "text ";
-        EXPECT_EQ(expected, support::runCase(failingAt(told, calls, n), false, true)) << "call " << n;
-        ASSERT_EQ(whole, support::runCase(told, false, true)) << "behind a failure of call " << n;
+        EXPECT_EQ(expected, support::runCase(failingAt(input, calls, n), false, true)) << "call " << n;
+        ASSERT_EQ(whole, support::runCase(input, false, true)) << "behind a failure of call " << n;
     }
 }
 
@@ -252,8 +253,8 @@ TEST(FailingHost, leavesTheEmptyTextAtEveryCallOfGoldenCasesOfBothViews) {
     int pedigrees = 0;
     for (const unit::DisturbedRequest& request : unit::disturbedRequests()) {
         SCOPED_TRACE(request.name);
-        expectNoTextWhicheverCallFails(request.told);
-        pedigrees += request.told.view == support::CaseView::pedigree ? 1 : 0;
+        expectNoTextWhicheverCallFails(request.input);
+        pedigrees += request.input.view == support::CaseView::pedigree ? 1 : 0;
     }
     EXPECT_LT(1, pedigrees);
 }
@@ -271,9 +272,9 @@ TEST(FailingHost, mayThrowAnythingAtAll) {
 
 // A walk that writes a person's record and then asks the host about the person.
 TEST(FailingHost, duringTheWalkLeavesTheRecordsAlreadyWritten) {
-    CaseFile told = family("17+42: 5; 3+4: 17");
-    told.failures[support::HostOperation::isPersonDead] = {10};
-    Request request(told);
+    CaseFile input = family("17+42: 5; 3+4: 17");
+    input.failures[support::HostOperation::isPersonDead] = {10};
+    Request request(input);
     std::string text;
     int asked = 0;
     olvane::guarded([&] {

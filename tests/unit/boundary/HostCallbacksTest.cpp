@@ -54,11 +54,11 @@ void giveParents(Request& request, PersonId id) {
 // --- Spouses.
 
 TEST(SpousesOfAPerson, recordHoldsTheHostsAnswers) {
-    CaseFile told = family("17+42; 17+43");
-    told.preferredSpouses[17] = 43;
-    told.dead[43] = true;
-    told.dates[43] = "1850";
-    Request request(told);
+    CaseFile input = family("17+42; 17+43");
+    input.preferredSpouses[17] = 43;
+    input.dead[43] = true;
+    input.dates[43] = "1850";
+    Request request(input);
     const SpouseSet set = spousesOf(request, 17);
     ASSERT_EQ(2u, set.size());
     const SpouseAdapter& first = *set.begin();
@@ -87,9 +87,9 @@ TEST(SpousesOfAPerson, hostIsAskedAboutOneSpouseAfterTheOtherThePersonFirstInThe
 }
 
 TEST(SpousesOfAPerson, standInTheHostsOrderWhateverTheirKeysAndPreference) {
-    CaseFile told = family("17+43; 17+42; 17+41");
-    told.preferredSpouses[17] = 41;
-    Request request(told);
+    CaseFile input = family("17+43; 17+42; 17+41");
+    input.preferredSpouses[17] = 41;
+    Request request(input);
     request.key(41);  // met first, so it has the lowest key of the three
     EXPECT_EQ((Texts{"43", "42", "41"}), idTexts(spousesOf(request, 17)));
 }
@@ -114,9 +114,9 @@ TEST(SpousesOfAPerson, personWithoutAnyLeavesTheSetAsItCame) {
 // 98 has no place, so 43, who lives, stands ahead of it; 42 has the place of 99 and is left out. Records with and
 // without places have no one order among them, so where 43 comes in decides.
 TEST(SpousesOfAPerson, goAmongRecordsWithoutAPlaceWhereTheSetsOwnOrderHasThem) {
-    CaseFile told = family("17+42; 17+43");
-    told.preferredSpouses[17] = 43;
-    Request request(told);
+    CaseFile input = family("17+42; 17+43");
+    input.preferredSpouses[17] = 43;
+    Request request(input);
     SpouseSet set;
     set.insert(SpouseAdapter(98, true, false, "", "98", 0));
     set.insert(SpouseAdapter(99, false, true, "", "99", 1));
@@ -133,9 +133,9 @@ TEST(SpousesOfAPerson, addNodeHasNoneAndTheHostIsNotAsked) {
 }
 
 TEST(SpousesOfAPerson, listEntryIsCutToItsLow32BitsAndAskedAboutWhateverItsSign) {
-    CaseFile told = family("17");
-    told.spouses[17] = {0x10000002a, 0x80000000, -5, 0};
-    Request request(told);
+    CaseFile input = family("17");
+    input.spouses[17] = {0x10000002a, 0x80000000, -5, 0};
+    Request request(input);
     EXPECT_EQ((Texts{"42", "-2147483648", "-5", "0"}), idTexts(spousesOf(request, 17)));
     EXPECT_EQ((Calls{"spousesForPersonWithID 17", "isPreferredSpouse 17 42", "isPersonDead 42",
                      "dateForPersonWithID 42 0", "isPreferredSpouse 17 -2147483648",
@@ -148,10 +148,10 @@ TEST(SpousesOfAPerson, listEntryIsCutToItsLow32BitsAndAskedAboutWhateverItsSign)
 // --- Children.
 
 TEST(ChildrenOfAPerson, recordHoldsTheHostsAnswers) {
-    CaseFile told = family("17: 5 6");
-    told.births[6] = "1899";
-    told.dates[6] = "the other date";
-    Request request(told);
+    CaseFile input = family("17: 5 6");
+    input.births[6] = "1899";
+    input.dates[6] = "the other date";
+    Request request(input);
     const ChildrenSet set = childrenOf(request, 17);
     ASSERT_EQ(2u, set.size());
     const ChildrenAdapter& second = *set.rbegin();
@@ -189,21 +189,21 @@ TEST(ChildrenOfAPerson, focusStandsFirstAmongItsSiblingsWhateverTheHostsOrder) {
 }
 
 TEST(ChildrenOfAPerson, utf8BirthKeepsItsFirstCharacterWhole) {
-    CaseFile told = family("17: 5 6");
-    told.births[5] = "\xC3\xA9t\xC3\xA9 1850";
-    told.births[6] =
+    CaseFile input = family("17: 5 6");
+    input.births[5] = "\xC3\xA9t\xC3\xA9 1850";
+    input.births[6] =
         "\xE5\xB9\xB4"
         "1850";
-    Request request(told);
+    Request request(input);
     const ChildrenSet set = childrenOf(request, 17);
     EXPECT_EQ("\xC3\xA9", set.begin()->date);
     EXPECT_EQ("\xE5\xB9\xB4", set.rbegin()->date);
 }
 
 TEST(ChildrenOfAPerson, listEntryIsCutToItsLow32BitsAndAskedAboutWhateverItsSign) {
-    CaseFile told = family("17");
-    told.children[17] = {0x7000000000000005, -6};
-    Request request(told);
+    CaseFile input = family("17");
+    input.children[17] = {0x7000000000000005, -6};
+    Request request(input);
     EXPECT_EQ((Texts{"5", "-6"}), idTexts(childrenOf(request, 17)));
     EXPECT_EQ((Calls{"childrenForPersonWithID 17", "dateForPersonWithID 5 1", "dateForPersonWithID -6 1"}),
               request.newCalls());
@@ -227,9 +227,9 @@ TEST(ChildrenOfAPerson, eachFindsItsOwnPlaceAmongRecordsThatHaveNone) {
 }
 
 TEST(ChildrenOfAnAddNode, isTheOnePersonForWhomItStandsWithoutPlaceAndDate) {
-    CaseFile told = family("17");
-    told.births[17] = "1850";
-    Request request(told);
+    CaseFile input = family("17");
+    input.births[17] = "1850";
+    Request request(input);
     giveParents(request, 17);
     request.newCalls();
     const ChildrenSet set = childrenOf(request, -2);
@@ -256,9 +256,9 @@ TEST(ChildrenOfAnAddNode, syntheticPersonWithoutARecordFailsByName) {
 // --- Sex, add-nodes, touch.
 
 TEST(SexOfAPerson, zeroIsMaleAndEveryOtherNumberFemale) {
-    CaseFile told = family("17");
-    told.sexes = {{1, 0}, {2, 1}, {3, 2}, {4, -1}, {5, 256}};
-    Request request(told);
+    CaseFile input = family("17");
+    input.sexes = {{1, 0}, {2, 1}, {3, 2}, {4, -1}, {5, 256}};
+    Request request(input);
     EXPECT_TRUE(request.callbacks.isMale(request.key(1)));
     for (const PersonId id : {2, 3, 4, 5}) EXPECT_FALSE(request.callbacks.isMale(request.key(id))) << id;
     EXPECT_EQ("sexOfPersonWithID 1", request.newCalls().front());
@@ -322,10 +322,10 @@ TEST(Callbacks, keepNoAnswers) {
 }
 
 TEST(Callbacks, failureOfTheHostPassesThroughUnchanged) {
-    CaseFile told = family("17+42: 5");
-    told.failures[support::HostOperation::isPersonDead] = {1};
-    told.failures[support::HostOperation::dateForPersonWithID] = {1};
-    Request request(told);
+    CaseFile input = family("17+42: 5");
+    input.failures[support::HostOperation::isPersonDead] = {1};
+    input.failures[support::HostOperation::dateForPersonWithID] = {1};
+    Request request(input);
     EXPECT_EQ("isPersonDead fails at call 1",
               failureOf<support::HostFailure>([&] { spousesOf(request, 17); }));
     EXPECT_EQ("dateForPersonWithID fails at call 1",

@@ -31,7 +31,8 @@ public:
     std::vector<std::string> newCalls() {
         std::vector<std::string> calls;
         const std::vector<std::string>& lines = manager->host.trace();
-        for (; told < lines.size(); ++told) calls.push_back(lines[told].substr(std::string("call ").size()));
+        for (; input < lines.size(); ++input)
+            calls.push_back(lines[input].substr(std::string("call ").size()));
         return calls;
     }
 
@@ -41,7 +42,7 @@ public:
     olvane::HostCallbacks callbacks;
 
 private:
-    std::size_t told = 0;
+    std::size_t input = 0;
 };
 
 typedef std::vector<std::string> Calls;

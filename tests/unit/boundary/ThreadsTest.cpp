@@ -23,8 +23,8 @@ using support::family;
 
 constexpr int kRounds = 100;
 
-std::string layOut(const CaseFile& told) {
-    return FamilyViewLayout("17", std::make_shared<CaseManager>(told));
+std::string layOut(const CaseFile& input) {
+    return FamilyViewLayout("17", std::make_shared<CaseManager>(input));
 }
 
 // Both begin together; the answer counts the texts that differ from the expected one.
@@ -33,10 +33,10 @@ int differencesWhileBothRun(const CaseFile& one, const CaseFile& other) {
     const std::string expectedOfOther = layOut(other);
     std::atomic<int> ready{0};
     std::atomic<int> differences{0};
-    const auto run = [&](const CaseFile& told, const std::string& expected) {
+    const auto run = [&](const CaseFile& input, const std::string& expected) {
         ++ready;
         while (ready < 2) std::this_thread::yield();
-        for (int i = 0; i < kRounds; ++i) differences += layOut(told) == expected ? 0 : 1;
+        for (int i = 0; i < kRounds; ++i) differences += layOut(input) == expected ? 0 : 1;
     };
     std::thread first([&] { run(one, expectedOfOne); });
     std::thread second([&] { run(other, expectedOfOther); });
@@ -46,9 +46,9 @@ int differencesWhileBothRun(const CaseFile& one, const CaseFile& other) {
 }
 
 TEST(TwoThreads, giveTheSameTextsAsOne) {
-    const CaseFile told = family("17+42: 5 6f; 3: 17 18; 42f: 8");
-    ASSERT_NE("", layOut(told));
-    EXPECT_EQ(0, differencesWhileBothRun(told, told));
+    const CaseFile input = family("17+42: 5 6f; 3: 17 18; 42f: 8");
+    ASSERT_NE("", layOut(input));
+    EXPECT_EQ(0, differencesWhileBothRun(input, input));
 }
 
 TEST(TwoThreads, doNotMixTheSyntheticIdsOfTheirFamilies) {

@@ -241,10 +241,10 @@ TEST(TypedLayout, aFailureOfTheHostReachesTheCaller) {
 
 // An uncle's wife -99, who is nobody's add-node: her record is cut behind its segments.
 TEST(TypedLayout, ofAFailureHoldsTheWholeBoxesAndTheCutText) {
-    support::CaseFile told = family("17; 1+2: 17; 101+102: 1 11");
-    told.spouses[11] = {-99};
+    support::CaseFile input = family("17; 1+2: 17; 101+102: 1 11");
+    input.spouses[11] = {-99};
     TypedLayout layout;
-    EXPECT_THROW(olvane::layOut(TypedLayout::View::family, 17, std::make_shared<support::CaseManager>(told),
+    EXPECT_THROW(olvane::layOut(TypedLayout::View::family, 17, std::make_shared<support::CaseManager>(input),
                                 LayoutOptions(), layout),
                  std::out_of_range);
     const std::string whole = olvane::writeLayoutText(olvane::recordsOf(layout));

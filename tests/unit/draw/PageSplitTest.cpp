@@ -54,7 +54,7 @@ TEST(PageSplit, pictureThatNearlyFitsIsMadeSmaller) {
     EXPECT_GT(splitPages(pictureOf(2200, 1400), kA4, "").size(), 1u);
 }
 
-TEST(PageSplit, largePictureIsSplitRowByRowWithItsPlaceToldOnEachSheet) {
+TEST(PageSplit, largePictureIsSplitRowByRowWithItsPlacePrintedOnEachSheet) {
     const auto sheets = splitPages(pictureOf(3000, 3000), kA4, "Bergs");
     ASSERT_GT(sheets.size(), 4u);
     EXPECT_THAT(sheets[0].svg, HasSubstr("row 1 of "));

@@ -157,7 +157,7 @@ TEST_F(Picture, markCountsWhatIsNotShown) {
     EXPECT_THAT(svg, HasSubstr("Not shown: 2 parents, 1 spouse, 3 children"));
 }
 
-TEST_F(Picture, sexIsToldByTheSilhouetteToo) {
+TEST_F(Picture, sexShowsInTheSilhouetteToo) {
     const std::string svg = draw();
     EXPECT_EQ(countOf(svg, "href=\"#olvane-man\""), 1u);
     EXPECT_EQ(countOf(svg, "href=\"#olvane-woman\""), 2u);
@@ -343,7 +343,7 @@ TEST_F(Picture, pageTakesAllBoxes) {
     EXPECT_EQ(picture.height, 300 * 2 + 56);
 }
 
-TEST_F(Picture, boxesTellWhereTheyAreInPictureAndText) {
+TEST_F(Picture, boxesStateWhereTheyAreInPictureAndText) {
     const SvgPicture picture = drawSvg(content_, options_);
     ASSERT_EQ(picture.boxes.size(), 5u);
     const PictureBox& focus = picture.boxes[0];

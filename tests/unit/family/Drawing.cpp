@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The engine's own records have no equality that tells spouse lines apart and cannot be printed; these can.
+// The engine's own records have no equality that distinguishes spouse lines and cannot be printed; these can.
 
 #include "Drawing.h"
 

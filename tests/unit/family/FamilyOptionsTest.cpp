@@ -114,10 +114,10 @@ TEST(FamilyOptions, keysThatNothingReadsChangeNothing) {
 
 TEST(FamilyOptions, hiddenRelativesAreFlaggedWhateverTheOptionSays) {
     const std::string noSiblings = "option ACTV_Fam_ShowSiblings 0\n";
-    LaidOutCase told(noSiblings + "option INDICATE_NON_DISPLAYED_RELATIONSHIPS 1\n" + kEveryKind);
-    LaidOutCase notTold(noSiblings + "option INDICATE_NON_DISPLAYED_RELATIONSHIPS 0\n" + kEveryKind);
-    EXPECT_TRUE(told.flag(10));
-    EXPECT_TRUE(notTold.flag(10));
+    LaidOutCase flagged(noSiblings + "option INDICATE_NON_DISPLAYED_RELATIONSHIPS 1\n" + kEveryKind);
+    LaidOutCase notFlagged(noSiblings + "option INDICATE_NON_DISPLAYED_RELATIONSHIPS 0\n" + kEveryKind);
+    EXPECT_TRUE(flagged.flag(10));
+    EXPECT_TRUE(notFlagged.flag(10));
 }
 
 TEST(FamilyOptions, cousinsNeedTheirParentsToBeShown) {

@@ -13,7 +13,7 @@
 namespace views {
 
 // A family layouter around a focus of key 0, a man unless the test says otherwise, in front of a data source
-// that knows nobody until the test tells it. Tests hang relatives on the focus and run one act alone.
+// that knows nobody until the test adds somebody. Tests hang relatives on the focus and run one act alone.
 class HandMadeFamily : public testing::Test {
 protected:
     KeyFamily data;

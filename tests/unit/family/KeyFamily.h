@@ -13,7 +13,7 @@
 
 namespace views {
 
-// A family told by keys, behind the six callbacks of a layouter, so that one act can be run on a graph that a
+// A family stated by keys, behind the six callbacks of a layouter, so that one act can be run on a graph that a
 // test builds by hand.
 //
 // Holds: a person of whom nothing is said has no relatives, is a woman and is real. A parent of -1 is left at

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Broken files: every trouble is told with its line, and everything that can be read is read.
+// Broken files: every trouble is reported with its line, and everything that can be read is read.
 
 #include <string>
 
@@ -12,35 +12,35 @@
 namespace olvane::gedcom::test {
 namespace {
 
-std::string allTold(const GedcomData& data) {
+std::string allReported(const GedcomData& data) {
     std::string text;
     for (const Diagnostic& diagnostic : data.diagnostics())
         text.append(formatDiagnostic(diagnostic)).append("\n");
     return text;
 }
 
-TEST(BrokenFiles, aSoundFileHasNothingToTell) {
-    EXPECT_EQ(allTold(read(document("0 @I1@ INDI\n1 NAME Jane\n"))), "");
-    EXPECT_EQ(allTold(read(document7("0 @I1@ INDI\n1 NAME Jane\n1 _EXT x\n2 _OTHER\n"))), "");
+TEST(BrokenFiles, aSoundFileHasNothingToReport) {
+    EXPECT_EQ(allReported(read(document("0 @I1@ INDI\n1 NAME Jane\n"))), "");
+    EXPECT_EQ(allReported(read(document7("0 @I1@ INDI\n1 NAME Jane\n1 _EXT x\n2 _OTHER\n"))), "");
 }
 
-TEST(BrokenFiles, aMissingHeaderIsTold) {
+TEST(BrokenFiles, aMissingHeaderIsReported) {
     const GedcomData data = read("0 @I1@ INDI\n1 NAME John /Doe/\n0 TRLR\n");
     EXPECT_EQ(namesOf(data), "John Doe");
-    EXPECT_EQ(allTold(data),
+    EXPECT_EQ(allReported(data),
               "test.ged:1: warning: the file does not begin with HEAD (INDI); read without it\n");
 }
 
 TEST(BrokenFiles, aFileCutOffIsReadAsFarAsItGoes) {
     const GedcomData data = read("0 HEAD\n0 @I1@ INDI\n1 NAME John\n0 @I2@ INDI\n1 NAME Ja");
     EXPECT_EQ(namesOf(data), "John|Ja");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::missingTrailer), "5");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::missingTrailer), "5");
 }
 
-TEST(BrokenFiles, recordsBehindTheTrailerAreReadAndTold) {
+TEST(BrokenFiles, recordsBehindTheTrailerAreReadAndReported) {
     const GedcomData data = read(document("").append("0 @I1@ INDI\n1 NAME Late\n"));
     EXPECT_EQ(namesOf(data), "Late");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::afterTrailer), "7");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::afterTrailer), "7");
 }
 
 TEST(BrokenFiles, aLevelJumpKeepsTheLineUnderItsParent) {
@@ -49,22 +49,22 @@ TEST(BrokenFiles, aLevelJumpKeepsTheLineUnderItsParent) {
     EXPECT_EQ(data.person(1).birth.year, 1900);
     EXPECT_EQ(data.person(1).death.year, 1970);
     EXPECT_EQ(namesOf(data), "John");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::levelJump), "8 11 13");
-    EXPECT_EQ(told(data, DiagnosticKind::levelJump)[0],
+    EXPECT_EQ(linesReported(data, DiagnosticKind::levelJump), "8 11 13");
+    EXPECT_EQ(reported(data, DiagnosticKind::levelJump)[0],
               "8: level jumps from 1 to 4 (DATE); read as one below the line before");
 }
 
 TEST(BrokenFiles, aLevelThatIsNoNumberSkipsTheLine) {
     const GedcomData data = read(document("0 @I1@ INDI\nx NAME Wrong\n1 NAME Right\n1. NAME Wrong\n"));
     EXPECT_EQ(namesOf(data), "Right");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::notALine), "7 9");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::notALine), "7 9");
 }
 
 TEST(BrokenFiles, aLevelBadlyWrittenIsGuessed) {
     const GedcomData data =
         read(document("00 @I1@ INDI\n01 NAME A\n0@I2@ INDI\n1NAME B\n0 @I3@ INDI\n-1 NAME C\n"));
     EXPECT_EQ(namesOf(data), "A|B|C");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::wrongLevel), "6 7 8 9 11");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::wrongLevel), "6 7 8 9 11");
 }
 
 TEST(BrokenFiles, aLevelOutOfAllBoundsIsOneBelow) {
@@ -76,8 +76,8 @@ TEST(BrokenFiles, textWithoutLevelAndTagIsSkipped) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 NOTE a note\nthat goes on here\n1 NAME A\n12\n1 \n1 @X@\n1 (what\n"));
     EXPECT_EQ(namesOf(data), "A");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::notALine), "8 10 11 12 13");
-    EXPECT_EQ(told(data, DiagnosticKind::notALine)[0],
+    EXPECT_EQ(linesReported(data, DiagnosticKind::notALine), "8 10 11 12 13");
+    EXPECT_EQ(reported(data, DiagnosticKind::notALine)[0],
               "8: not a line with level and tag (that goes on here); skipped");
 }
 
@@ -95,17 +95,17 @@ TEST(BrokenFiles, theFirstOfTwoRecordsOfOneIdentifierIsPointedTo) {
     EXPECT_EQ(data.family(1).husband, 1U);
     EXPECT_EQ(data.family(2).wife, 1U);
     EXPECT_EQ(data.coupleLinks(1)[0].family, 1U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::duplicateXref), "9 13");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::duplicateXref), "9 13");
     EXPECT_EQ(
-        told(data, DiagnosticKind::duplicateXref)[0],
+        reported(data, DiagnosticKind::duplicateXref)[0],
         "9: identifier already used in line 6 (I1); read as a record of its own; pointers lead to the first");
 }
 
 TEST(BrokenFiles, pointersToNothingAreNobody) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 FAMS @F9@\n1 FAMC @F8@\n0 @F1@ FAM\n1 HUSB @I7@\n1 CHIL @I6@\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::danglingPointer), "7 8 10 11");
-    EXPECT_EQ(told(data, DiagnosticKind::danglingPointer)[0], "7: a pointer to no record (F9); left out");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::danglingPointer), "7 8 10 11");
+    EXPECT_EQ(reported(data, DiagnosticKind::danglingPointer)[0], "7: a pointer to no record (F9); left out");
     EXPECT_EQ(data.family(1).husband, 0U);
     EXPECT_EQ(data.childLinks(1)[0].child, 0U);
 }
@@ -114,14 +114,14 @@ TEST(BrokenFiles, pointersToRecordsOfAnotherSortAreNobody) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 FAMS @I1@\n0 @F1@ FAM\n1 HUSB @F1@\n1 CHIL @N1@\n1 WIFE Jane\n1 "
                       "CHIL\n0 @N1@ NOTE\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::wrongPointer), "7 9 10 11 12");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::danglingPointer), "");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::wrongPointer), "7 9 10 11 12");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::danglingPointer), "");
 }
 
 TEST(BrokenFiles, voidPointersNeedNoWord) {
     const GedcomData data = read(
         document7("0 @I1@ INDI\n1 FAMS @VOID@\n1 FAMC @VOID@\n0 @F1@ FAM\n1 HUSB @VOID@\n1 CHIL @VOID@\n"));
-    EXPECT_EQ(allTold(data), "");
+    EXPECT_EQ(allReported(data), "");
 }
 
 TEST(BrokenFiles, identifiersWithoutTheirSecondAtAreReadUpToTheSpace) {
@@ -129,20 +129,20 @@ TEST(BrokenFiles, identifiersWithoutTheirSecondAtAreReadUpToTheSpace) {
         read(document("0 @I1 INDI\n1 NAME A\n1 FAMS @F1\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I1@ x\n"));
     EXPECT_EQ(data.personByXref("I1"), 1U);
     EXPECT_EQ(data.coupleLinks(1)[0].family, 1U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::brokenXref), "6 8 11");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::brokenXref), "6 8 11");
 }
 
 TEST(BrokenFiles, identifiersMayHaveSpacesAndCases) {
     const GedcomData data = read(document("0 @a b@ INDI\n1 NAME A\n0 @A B@ INDI\n1 NAME B\n"));
     EXPECT_EQ(data.personByXref("@a b@"), 1U);
     EXPECT_EQ(data.personByXref("A B"), 2U);
-    EXPECT_EQ(allTold(data), "");
+    EXPECT_EQ(allReported(data), "");
 }
 
-TEST(BrokenFiles, unreadableDatesAreTold) {
+TEST(BrokenFiles, unreadableDatesAreReported) {
     const GedcomData data = read(
         document("0 @I1@ INDI\n1 BIRT\n2 DATE sometime\n1 DEAT\n2 DATE (unknown)\n1 EVEN\n2 DATE never\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::unreadableDate), "8");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::unreadableDate), "8");
     EXPECT_EQ(displayYear(data.person(1).death), "(unknown)");
 }
 
@@ -152,7 +152,7 @@ TEST(BrokenFiles, binaryRubbishAmongRecordsIsSkipped) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 NAME A\n").append(rubbish).append("\n0 @I2@ INDI\n1 NAME B\n"));
     EXPECT_EQ(namesOf(data), "A|B");
-    EXPECT_NE(linesTold(data, DiagnosticKind::notALine), "");
+    EXPECT_NE(linesReported(data, DiagnosticKind::notALine), "");
 }
 
 TEST(BrokenFiles, whatIsNoGedcomIsRefusedInOneLine) {
@@ -167,32 +167,32 @@ TEST(BrokenFiles, whatIsNoGedcomIsRefusedInOneLine) {
 
 TEST(BrokenFiles, emptyLinesAreCountedTogether) {
     const GedcomData data = read("\n\n0 HEAD\n\n0 @I1@ INDI\n1 NAME A\n0 TRLR\n\n");
-    EXPECT_EQ(allTold(data), "test.ged:1: note: empty line, the first of 4; skipped\n");
+    EXPECT_EQ(allReported(data), "test.ged:1: note: empty line, the first of 4; skipped\n");
 }
 
 TEST(BrokenFiles, ofOneKindSoManyAreListedAndTheRestCounted) {
     std::string records = "0 @I1@ INDI\n";
     for (int line = 0; line < 250; ++line) records.append("not a line\n");
     const GedcomData data = read(document(records));
-    EXPECT_EQ(told(data, DiagnosticKind::notALine).size(), 100U);
-    ASSERT_EQ(told(data, DiagnosticKind::moreOfAKind).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::moreOfAKind)[0],
+    EXPECT_EQ(reported(data, DiagnosticKind::notALine).size(), 100U);
+    ASSERT_EQ(reported(data, DiagnosticKind::moreOfAKind).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::moreOfAKind)[0],
               "0: 150 more of: line without level and tag; not listed singly");
     EXPECT_EQ(readGedcomBytes(document(records), "x", {250}).diagnostics().size(), 250U);
 }
 
 TEST(BrokenFiles, quotedTextIsShortAndFitToPrint) {
     const GedcomData data = read(document(std::string("\x1B[2J\xFF").append(1000, 'x').append("\n")));
-    ASSERT_EQ(told(data, DiagnosticKind::notALine).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::notALine)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::notALine).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::notALine)[0],
               std::string("6: not a line with level and tag (?[2J?").append(55, 'x').append("...); skipped"));
 }
 
 TEST(BrokenFiles, aDateWithDayAndMonthInDoubtIsReported) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 BIRT\n2 DATE 05/06/1900\n1 DEAT\n2 DATE 24/01/1915\n"));
-    ASSERT_EQ(told(data, DiagnosticKind::ambiguousDate).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::ambiguousDate)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::ambiguousDate).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::ambiguousDate)[0],
               "8: a date whose day and month may be either way round (05/06/1900); its year alone is read");
     EXPECT_EQ(data.diagnostics().size(), 1U);
     EXPECT_EQ(data.diagnostics()[0].severity, Severity::note);

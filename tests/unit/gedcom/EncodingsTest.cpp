@@ -28,7 +28,7 @@ struct Reading {
 
 Reading readingOf(std::string bytes) {
     const GedcomData data = read(std::move(bytes));
-    return {namesOf(data), data.encoding(), linesTold(data, DiagnosticKind::encodingMismatch)};
+    return {namesOf(data), data.encoding(), linesReported(data, DiagnosticKind::encodingMismatch)};
 }
 
 void expectReading(std::string bytes, const char* name, const char* encoding, const char* warnedLines = "") {
@@ -86,12 +86,12 @@ TEST(Encodings, surrogatesPartedByConcComeTogether) {
     expectReading(bytes, "A𒍅", "UTF-16LE");
 }
 
-TEST(Encodings, aLoneSurrogateAndAHalfUnitAreTold) {
+TEST(Encodings, aLoneSurrogateAndAHalfUnitAreReported) {
     std::string bytes = utf16("0 HEAD\n1 CHAR UTF-16\n0 @I1@ INDI\n1 NAME A", false, true);
     bytes.append("\x08\xD8", 2).append(utf16(" B\n0 TRLR\n", false, false)).append("x");
     const GedcomData data = read(bytes);
     EXPECT_TRUE(isUtf8(namesOf(data)));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::badCharacter), "0 4");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::badCharacter), "0 4");
 }
 
 TEST(Encodings, aUtf8MarkGoesBeforeTheHeader) {
@@ -151,20 +151,20 @@ TEST(Encodings, withoutAHeaderTheBytesDecide) {
     expectReading("0 @I1@ INDI\n1 NAME Jane\n0 TRLR\n", "Jane", "ASCII");
 }
 
-TEST(Encodings, anUnknownEncodingIsTold) {
+TEST(Encodings, anUnknownEncodingIsReported) {
     const GedcomData data = read(person("J\xFCrgen", "KLINGON"));
     EXPECT_EQ(namesOf(data), "Jürgen");
-    ASSERT_EQ(told(data, DiagnosticKind::encodingUnknown).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::encodingUnknown)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::encodingUnknown).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::encodingUnknown)[0],
               "5: the header names an encoding that is not known (KLINGON); read as windows-1252; if letters "
               "are wrong, "
               "choose an encoding, such as windows-1250, windows-1251, IBM850 or macintosh");
     EXPECT_EQ(data.diagnostics()[0].severity, Severity::error);
 }
 
-TEST(Encodings, namesOfSystemsAreTold) {
-    EXPECT_EQ(linesTold(read(person("J\xFCrgen", "ANSI")), DiagnosticKind::encodingUnknown), "5");
-    EXPECT_EQ(linesTold(read(person("J\xFCrgen", "CP1252")), DiagnosticKind::encodingUnknown), "");
+TEST(Encodings, namesOfSystemsAreShown) {
+    EXPECT_EQ(linesReported(read(person("J\xFCrgen", "ANSI")), DiagnosticKind::encodingUnknown), "5");
+    EXPECT_EQ(linesReported(read(person("J\xFCrgen", "CP1252")), DiagnosticKind::encodingUnknown), "");
 }
 
 TEST(Encodings, aCharacterCutByConcIsWhole) {
@@ -182,7 +182,7 @@ TEST(Encodings, aFewBadBytesDoNotUndoUtf8) {
                       "0 @I3@ INDI\n1 NAME cut \xE4\xB8\n"));
     EXPECT_EQ(data.encoding(), "UTF-8");
     EXPECT_EQ(namesOf(data), "Jürgen éè|André X|cut \xEF\xBF\xBD");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::badCharacter), "0 9 11");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::badCharacter), "0 9 11");
 }
 
 TEST(Encodings, utf8IsCheckedAsTheStandardHasIt) {
@@ -318,7 +318,7 @@ TEST(Encodings, aChosenEncodingGoesBeforeTheHeader) {
 TEST(Encodings, aMarkGoesBeforeTheChoiceAndIsReported) {
     const GedcomData data = readAs("\xEF\xBB\xBF" + person("J\xC3\xBC", "UTF-8"), "windows-1252");
     EXPECT_EQ(namesOf(data), "Jü");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::encodingMismatch), "0");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::encodingMismatch), "0");
 }
 
 TEST(Encodings, anUnknownChoiceIsRefused) {
@@ -386,7 +386,7 @@ TEST(Encodings, textThatIsNotAnselIsAnError) {
 
 TEST(Encodings, textOfNoNamedEncodingIsAGuess) {
     const GedcomData data = read("0 HEAD\n0 @I1@ INDI\n1 NAME J\xFCrgen\n0 TRLR\n");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::encodingUnknown), "0");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::encodingUnknown), "0");
     EXPECT_EQ(data.diagnostics()[0].severity, Severity::warning);
 }
 
@@ -399,9 +399,9 @@ TEST(Encodings, aCharacterOfTwoBytesCutByConcIsWhole) {
 TEST(Encodings, bytesThatANamedEncodingLacksAreReported) {
     const GedcomData page = read(person("A\x81 B\xFC", "windows-1253"));
     EXPECT_EQ(namesOf(page), "A\uFFFD Bό");
-    EXPECT_EQ(linesTold(page, DiagnosticKind::badCharacter), "7");
+    EXPECT_EQ(linesReported(page, DiagnosticKind::badCharacter), "7");
     const GedcomData multi = read(person("\xA4\xFD\xFF\xFF", "BIG5"));
-    EXPECT_EQ(linesTold(multi, DiagnosticKind::badCharacter), "0");
+    EXPECT_EQ(linesReported(multi, DiagnosticKind::badCharacter), "0");
 }
 
 struct AnselRow {

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What a file tells of persons and couples beyond birth, death and marriage.
+// What a file states of persons and couples beyond birth, death and marriage.
 
 #include <stdexcept>
 #include <string>
@@ -43,8 +43,8 @@ TEST(Facts, standInTheOrderOfTheRecordWithDateAndPlace) {
 
 TEST(Facts, aTypeIsTheValueWhereThereIsNone) {
     const GedcomData data = readWithFacts(
-        document("0 @I1@ INDI\n1 EVEN\n2 TYPE Knighted\n1 EVEN told\n2 TYPE Untold\n1 EVEN\n2 TYPE\n"));
-    EXPECT_EQ(linesOf(data.factsOfPerson(1)), "EVEN Knighted, , \nEVEN told, , \nEVEN , , \n");
+        document("0 @I1@ INDI\n1 EVEN\n2 TYPE Knighted\n1 EVEN stated\n2 TYPE Untold\n1 EVEN\n2 TYPE\n"));
+    EXPECT_EQ(linesOf(data.factsOfPerson(1)), "EVEN Knighted, , \nEVEN stated, , \nEVEN , , \n");
 }
 
 TEST(Facts, ofACoupleStandWithTheFamily) {
@@ -80,9 +80,9 @@ TEST(Facts, aPhraseStandsForADateOfVersion7) {
     EXPECT_EQ(linesOf(data.factsOfPerson(1)), "BIRT , at harvest time, \n");
 }
 
-TEST(Facts, troubleInADateIsToldOnce) {
+TEST(Facts, anUnreadableDateIsReportedOnce) {
     const GedcomData data = readWithFacts(document("0 @I1@ INDI\n1 BIRT\n2 DATE some day\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::unreadableDate), "8");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::unreadableDate), "8");
 }
 
 TEST(Facts, areLeftInTheFileUnlessAskedFor) {

@@ -36,7 +36,7 @@ std::string namesOf(const GedcomData& data) {
     return text;
 }
 
-std::vector<std::string> told(const GedcomData& data, DiagnosticKind kind) {
+std::vector<std::string> reported(const GedcomData& data, DiagnosticKind kind) {
     std::vector<std::string> texts;
     for (const Diagnostic& diagnostic : data.diagnostics()) {
         if (diagnostic.kind != kind) continue;
@@ -46,7 +46,7 @@ std::vector<std::string> told(const GedcomData& data, DiagnosticKind kind) {
     return texts;
 }
 
-std::string linesTold(const GedcomData& data, DiagnosticKind kind) {
+std::string linesReported(const GedcomData& data, DiagnosticKind kind) {
     std::vector<std::uint32_t> lines;
     for (const Diagnostic& diagnostic : data.diagnostics()) {
         if (diagnostic.kind == kind) lines.push_back(diagnostic.line);

@@ -36,10 +36,10 @@ std::string idsOf(const List& ids) {
 }
 
 // Diagnostics of a kind as "line: what; done", in order.
-std::vector<std::string> told(const GedcomData& data, DiagnosticKind kind);
+std::vector<std::string> reported(const GedcomData& data, DiagnosticKind kind);
 
 // The lines that diagnostics of a kind stand at, as "8 11".
-std::string linesTold(const GedcomData& data, DiagnosticKind kind);
+std::string linesReported(const GedcomData& data, DiagnosticKind kind);
 
 // The text of the GedcomError that reading the bytes throws; empty if it throws none.
 std::string refusal(std::string bytes);

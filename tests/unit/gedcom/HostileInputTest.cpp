@@ -89,7 +89,7 @@ TEST(HostileInput, aFamilyThatAllClaimStaysSmallInMemory) {
     EXPECT_EQ(data.children(1).size(), 50000U);
     EXPECT_EQ(data.children(2).size(), 50000U);
     EXPECT_EQ(data.children(4).size(), 0U);
-    EXPECT_EQ(told(data, DiagnosticKind::wrongPointer).size(), 100U);
+    EXPECT_EQ(reported(data, DiagnosticKind::wrongPointer).size(), 100U);
 }
 
 TEST(HostileInput, looseChildrenOfAFamilyThatAllClaimAreWalkedOnce) {

@@ -38,7 +38,7 @@ TEST(Lines, allLineEndsAreAlike) {
         const GedcomData data = read(withLineEnds(text, lineEnd));
         EXPECT_EQ(namesOf(data), "Jane Doe");
         EXPECT_EQ(data.person(1).sex, Sex::female);
-        EXPECT_EQ(linesTold(data, DiagnosticKind::notALine), "9");
+        EXPECT_EQ(linesReported(data, DiagnosticKind::notALine), "9");
     }
 }
 
@@ -96,27 +96,27 @@ TEST(Lines, numbersAreRightAfterEveryLineEnd) {
     for (const char* end : {"\n", "\r", "\r\n", "\n\r", "\r\r\n"}) {
         const GedcomData data = read(withEnds(text, end));
         EXPECT_EQ(namesOf(data), "Anna Bert") << static_cast<int>(end[0]) << static_cast<int>(end[1]);
-        EXPECT_EQ(linesTold(data, DiagnosticKind::emptyLine), "9");
-        EXPECT_EQ(linesTold(data, DiagnosticKind::notALine), "10");
-        EXPECT_EQ(linesTold(data, DiagnosticKind::danglingPointer), "11");
+        EXPECT_EQ(linesReported(data, DiagnosticKind::emptyLine), "9");
+        EXPECT_EQ(linesReported(data, DiagnosticKind::notALine), "10");
+        EXPECT_EQ(linesReported(data, DiagnosticKind::danglingPointer), "11");
     }
 }
 
 TEST(Lines, mixedLineEndsCountEachOnce) {
     const GedcomData data =
         read("0 HEAD\n1 CHAR UTF-8\r\n0 @I1@ INDI\n\r\n1 NAME A\r\r\nrubbish\n\rrubbish\r0 TRLR\n");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::emptyLine), "4");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::notALine), "6 7");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::emptyLine), "4");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::notALine), "6 7");
 }
 
 TEST(Lines, aLevelOfThirtyDigitsIsReportedAsWritten) {
     const std::string digits = "123456789012345678901234567890";
     const GedcomData data = read(document("0 @I1@ INDI\n" + digits + " NAME Anna\n0" + digits + " SEX M\n"));
-    ASSERT_EQ(told(data, DiagnosticKind::levelJump).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::levelJump)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::levelJump).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::levelJump)[0],
               "7: level jumps from 0 to " + digits + " (NAME); read as one below the line before");
-    ASSERT_EQ(told(data, DiagnosticKind::wrongLevel).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::wrongLevel)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::wrongLevel).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::wrongLevel)[0],
               "8: level badly written (0" + digits + "); read as one below the line before");
     EXPECT_EQ(namesOf(data), "Anna");
 }

@@ -116,7 +116,7 @@ TEST(Names, eastAsianNamesAreWrittenWithoutSpaceUnlessTheyHaveOne) {
 TEST(Names, controlCharactersAreTakenOut) {
     const GedcomData data = readName("1 NAME Ja\x01ne\t\x1B[31m /Doe/");
     EXPECT_EQ(namesOf(data), "Jane [31m Doe");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::controlCharacter), "7");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::controlCharacter), "7");
 }
 
 TEST(Names, markupIsTextLikeAnyOther) {

@@ -63,11 +63,11 @@ TEST(ReadingFiles, anArchiveIsReadByItsStandardMember) {
     EXPECT_TRUE(data.diagnostics().empty());
 }
 
-TEST(ReadingFiles, anArchiveWithAnotherMemberIsReadAndTold) {
+TEST(ReadingFiles, anArchiveWithAnotherMemberIsReadAndReported) {
     const GedcomData data = readGedcomFile(std::string(kData).append("/renamed.gdz"));
     EXPECT_EQ(namesOf(data), "Anna Roe|Bertil Roe");
-    ASSERT_EQ(told(data, DiagnosticKind::archiveMember).size(), 1U);
-    EXPECT_EQ(told(data, DiagnosticKind::archiveMember)[0],
+    ASSERT_EQ(reported(data, DiagnosticKind::archiveMember).size(), 1U);
+    EXPECT_EQ(reported(data, DiagnosticKind::archiveMember)[0],
               "0: the archive has no gedcom.ged (family/My Tree.GED); another member is read");
 }
 

@@ -93,7 +93,7 @@ TEST_F(RealFiles, aLargeRoyalFamilyIsWhole) {
     EXPECT_EQ(data.personByXref("@I52@"), 52U);
     EXPECT_EQ(displayYear(data.person(52).birth), "1926");
     EXPECT_FALSE(data.person(52).dead);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::unreadableDate), "6436 27126");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::unreadableDate), "6436 27126");
 }
 
 TEST_F(RealFiles, relationsAreTheirOwn) {
@@ -114,17 +114,18 @@ TEST_F(RealFiles, everyStandardDateIsReadToAYear) {
     EXPECT_EQ(sortText(data.person(3).birth), "1732-02-22");
     EXPECT_EQ(displayYear(data.person(4).death), "1105");
     for (const char* name : {"gedcom7/date.ged", "encoding/calendar-dates.ged"}) {
-        EXPECT_EQ(linesTold(file(name), DiagnosticKind::unreadableDate), "") << name;
+        EXPECT_EQ(linesReported(file(name), DiagnosticKind::unreadableDate), "") << name;
     }
 }
 
-TEST_F(RealFiles, brokenOnesTellTheirLines) {
-    EXPECT_EQ(linesTold(file("malformed/duplicate-xref.ged"), DiagnosticKind::duplicateXref), "8 11 16");
-    EXPECT_EQ(linesTold(file("malformed/invalid-level.ged"), DiagnosticKind::levelJump), "6");
-    EXPECT_EQ(linesTold(file("malformed/level-jump-skip.ged"), DiagnosticKind::levelJump), "8");
-    EXPECT_EQ(linesTold(file("malformed/missing-header.ged"), DiagnosticKind::missingHeader), "1");
+TEST_F(RealFiles, brokenOnesAreReportedByLine) {
+    EXPECT_EQ(linesReported(file("malformed/duplicate-xref.ged"), DiagnosticKind::duplicateXref), "8 11 16");
+    EXPECT_EQ(linesReported(file("malformed/invalid-level.ged"), DiagnosticKind::levelJump), "6");
+    EXPECT_EQ(linesReported(file("malformed/level-jump-skip.ged"), DiagnosticKind::levelJump), "8");
+    EXPECT_EQ(linesReported(file("malformed/missing-header.ged"), DiagnosticKind::missingHeader), "1");
     EXPECT_TRUE(file("malformed/deep-nesting-levels.ged").diagnostics().empty());
-    EXPECT_EQ(linesTold(file("malformed/circular-reference.ged"), DiagnosticKind::contradictingLink), "31");
+    EXPECT_EQ(linesReported(file("malformed/circular-reference.ged"), DiagnosticKind::contradictingLink),
+              "31");
 }
 
 TEST_F(RealFiles, filesOfOtherSortsAreRefused) {

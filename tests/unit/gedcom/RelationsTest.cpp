@@ -120,20 +120,20 @@ TEST(Relations, aCoupleOfOneSexStandsByItsPlaceInTheRecord) {
     EXPECT_EQ(parents("1 HUSB @I1@\n1 WIFE @I2@\n"), "1 2");
 }
 
-TEST(Relations, aThirdPartnerIsLeftOutAndTold) {
+TEST(Relations, aThirdPartnerIsLeftOutAndReported) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n"
                       "0 @F1@ FAM\n1 HUSB @I1@\n1 HUSB @I3@\n1 WIFE @I2@\n"));
     EXPECT_EQ(data.family(1).husband, 1U);
     EXPECT_EQ(data.family(1).wife, 2U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::tooManyPartners), "13");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::tooManyPartners), "13");
 }
 
 TEST(Relations, nobodyIsTheirOwnSpouse) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I1@\n"));
     EXPECT_EQ(idsOf(data.spouses(1)), "");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::samePartners), "10");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::samePartners), "10");
 }
 
 TEST(Relations, aFamilyThatAloneNamesItsMembersIsFollowed) {
@@ -149,7 +149,7 @@ TEST(Relations, aFamilyThatAloneNamesItsMembersIsFollowed) {
     ASSERT_EQ(data.parentLinks(4).size(), 1U);
     EXPECT_TRUE(data.parentLinks(4)[0].isFamilysAlone);
     EXPECT_EQ(data.parentLinks(4)[0].line, 14U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "12 13 14 15");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "12 13 14 15");
     EXPECT_EQ(data.diagnostics()[0].severity, Severity::note);
 }
 
@@ -164,7 +164,7 @@ TEST(Relations, personsWhoAloneNameTheirFamilyAreFollowed) {
     EXPECT_EQ(data.person(3).mother, 1U);
     ASSERT_EQ(data.childLinks(1).size(), 2U);
     EXPECT_TRUE(data.childLinks(1)[1].isChildsAlone);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "8 10 12");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "8 10 12");
 }
 
 TEST(Relations, ownLinksComeFirstThenTheFamiliesInTheirOrder) {
@@ -187,22 +187,22 @@ TEST(Relations, familiesThatContradictEachOtherAreBothKept) {
     EXPECT_EQ(idsOf(data.children(1)), "3");
     EXPECT_EQ(idsOf(data.children(2)), "3");
     EXPECT_EQ(data.parentLinks(3).size(), 2U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "14");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "11");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::contradictingLink), "14");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "11");
 }
 
 TEST(Relations, anAdoptedChildOfTwoFamiliesIsNoContradiction) {
     const GedcomData data = read(document(
         "0 @I1@ INDI\n1 FAMC @F2@\n2 PEDI adopted\n0 @F1@ FAM\n1 CHIL @I1@\n0 @F2@ FAM\n1 CHIL @I1@\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "");
-    EXPECT_EQ(linesTold(data, DiagnosticKind::oneSidedLink), "10");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::contradictingLink), "");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "10");
 }
 
 TEST(Relations, aPartnerWhomAFullFamilyDoesNotNameIsReported) {
     const GedcomData data =
         read(document("0 @I1@ INDI\n1 FAMS @F1@\n0 @I2@ INDI\n1 FAMS @F1@\n0 @I3@ INDI\n1 FAMS @F1@\n"
                       "0 @I4@ INDI\n1 FAMC @F1@\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I4@\n"));
-    EXPECT_EQ(linesTold(data, DiagnosticKind::contradictingLink), "11");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::contradictingLink), "11");
     EXPECT_EQ(idsOf(data.spouses(3)), "");
     EXPECT_EQ(idsOf(data.children(3)), "4");
 }
@@ -216,7 +216,7 @@ TEST(Relations, aLoneParentStandsInTheSlotOfTheirSex) {
                               .append(slot)
                               .append(" @I1@\n1 CHIL @I2@\n")));
         return std::to_string(data.person(2).father) + std::to_string(data.person(2).mother) + ":" +
-               linesTold(data, DiagnosticKind::wrongSlot);
+               linesReported(data, DiagnosticKind::wrongSlot);
     };
     EXPECT_EQ(parents("M", "WIFE"), "10:12");
     EXPECT_EQ(parents("F", "HUSB"), "01:12");
@@ -232,7 +232,7 @@ TEST(Relations, aCoupleInEachOthersSlotsIsPutRight) {
     EXPECT_EQ(data.family(1).husband, 2U);
     EXPECT_EQ(data.family(1).wife, 1U);
     EXPECT_EQ(data.family(1).wifeLine, 13U);
-    EXPECT_EQ(linesTold(data, DiagnosticKind::wrongSlot), "13 14");
+    EXPECT_EQ(linesReported(data, DiagnosticKind::wrongSlot), "13 14");
 }
 
 TEST(Relations, aFamilysWordOnItsChildCountsWhereTheChildHasNone) {

@@ -29,14 +29,14 @@ std::string dateOf(const GedcomDate& date) {
     return std::string(date.written) + "=" + sortText(date);
 }
 
-void tellFacts(std::span<const Fact> facts, std::string& text) {
+void appendFacts(std::span<const Fact> facts, std::string& text) {
     for (const Fact& fact : facts) {
         text.append(" ").append(fact.tag).append("[").append(fact.value).append("|").append(fact.place);
         text.append("|").append(dateOf(fact.date)).append("]");
     }
 }
 
-// Everything that a picture or a panel could tell, a line a record.
+// Everything that a picture or a panel could show, a line a record.
 std::string everythingOf(const GedcomData& data) {
     std::string text;
     for (PersonId id = 1; id <= data.personCount(); ++id) {
@@ -56,14 +56,14 @@ std::string everythingOf(const GedcomData& data) {
             text +=
                 " in " + std::to_string(link.family) + ":" + std::to_string(static_cast<int>(link.pedigree));
         }
-        tellFacts(data.factsOfPerson(id), text);
+        appendFacts(data.factsOfPerson(id), text);
         text += '\n';
     }
     for (FamilyId id = 1; id <= data.familyCount(); ++id) {
         const Family& family = data.family(id);
         text += "couple " + std::to_string(family.husband) + " " + std::to_string(family.wife) +
                 (family.married ? " married" : "") + (family.divorced ? " divorced" : "");
-        tellFacts(data.factsOfFamily(id), text);
+        appendFacts(data.factsOfFamily(id), text);
         text += '\n';
     }
     return text;
@@ -168,7 +168,7 @@ TEST(Writing, leavesOutWhatIsHidden) {
     EXPECT_EQ(dateOf(again.person(2).death), "1999=1999");
 }
 
-// What a dead person's record tells with Livia Secret hidden, who is written so.
+// What a dead person's record states with Livia Secret hidden, who is written so.
 std::string shownBeside(const std::string& livia, const std::string& facts) {
     const GedcomData data = readWithFacts(document("0 @I1@ INDI\n" + livia + "1 FAMS @F1@\n" +
                                                    "0 @I2@ INDI\n1 NAME Karl /Shown/\n1 FAMS @F1@\n" + facts +
@@ -177,7 +177,7 @@ std::string shownBeside(const std::string& livia, const std::string& facts) {
     options.hidden = {true, false};
     const GedcomData again = readWithFacts(writeGedcom(data, options));
     std::string text;
-    tellFacts(again.factsOfPerson(2), text);
+    appendFacts(again.factsOfPerson(2), text);
     return text;
 }
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The walks over a person's relatives. The order of a visit is the order on the page, so every order is told
+// The walks over a person's relatives. The order of a visit is the order on the page, so every order is stated
 // here with a family small enough to follow.
 
 #include <stdexcept>

@@ -94,7 +94,7 @@ const std::vector<BrokenText> kBrokenTexts = {
     {"17:0:0:0:;\n", 10, "expected a person's id"},
 };
 
-TEST(LayoutText, strictReaderTellsWhereAndWhy) {
+TEST(LayoutText, strictReaderReportsWhereAndWhy) {
     for (const BrokenText& broken : kBrokenTexts) {
         try {
             readLayoutText(broken.text);

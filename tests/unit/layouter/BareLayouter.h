@@ -20,10 +20,10 @@ public:
 // A bare layouter over a family, the focus with key 0. adapter says what becomes of unknown parents.
 class Population {
 public:
-    explicit Population(const support::CaseFile& told)
-        : request(told),
-          adapter(adapterOf(request, told)),
-          layouter(&adapter, request.key(told.focus), adapter.isMale(request.key(told.focus)) ? 1 : 0, {},
+    explicit Population(const support::CaseFile& input)
+        : request(input),
+          adapter(adapterOf(request, input)),
+          layouter(&adapter, request.key(input.focus), adapter.isMale(request.key(input.focus)) ? 1 : 0, {},
                    olvane::familyTreeSize()),
           focus(layouter.focusPerson) {
         request.newCalls();
@@ -45,8 +45,8 @@ public:
     TreeViewPerson& focus;
 
 private:
-    static DataAdapter adapterOf(Request& frame, const support::CaseFile& told) {
-        if (told.adapter == support::CaseAdapter::bare) {
+    static DataAdapter adapterOf(Request& frame, const support::CaseFile& input) {
+        if (input.adapter == support::CaseAdapter::bare) {
             frame.callbacks.getParents = support::bareParents(frame.glue, *frame.manager);
         }
         return frame.callbacks.dataAdapter();

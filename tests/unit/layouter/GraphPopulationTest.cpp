@@ -26,14 +26,14 @@ using unit::Population;
 
 typedef std::vector<std::string> Texts;
 
-CaseFile bare(CaseFile told) {
-    told.adapter = support::CaseAdapter::bare;
-    return told;
+CaseFile bare(CaseFile input) {
+    input.adapter = support::CaseAdapter::bare;
+    return input;
 }
 
-CaseFile bornIn(CaseFile told, PersonId id, const std::string& date) {
-    told.births[id] = date;
-    return told;
+CaseFile bornIn(CaseFile input, PersonId id, const std::string& date) {
+    input.births[id] = date;
+    return input;
 }
 
 // --- Spouses.
@@ -48,18 +48,18 @@ TEST(AddingSpouses, takesTheHostsOrderAndAdmitsEachOfThem) {
 }
 
 TEST(AddingSpouses, givesThemTheOppositeSexAndDoesNotAskTheHost) {
-    CaseFile told = family("17+42");
-    told.sexes[42] = 0;  // a man for the host
-    Population ofMan(told);
+    CaseFile input = family("17+42");
+    input.sexes[42] = 0;  // a man for the host
+    Population ofMan(input);
     ofMan.layouter.addSpousesToPerson(ofMan.focus);
     EXPECT_FALSE(ofMan.focus.spouses.at(0).gender);
     EXPECT_EQ((Calls{"spousesForPersonWithID 17", "isPreferredSpouse 17 42", "isPersonDead 42",
                      "dateForPersonWithID 42 0"}),
               ofMan.request.newCalls());
 
-    told.focus = 42;
-    told.sexes[42] = 1;
-    Population ofWoman(told);
+    input.focus = 42;
+    input.sexes[42] = 1;
+    Population ofWoman(input);
     ofWoman.layouter.addSpousesToPerson(ofWoman.focus);
     EXPECT_TRUE(ofWoman.focus.spouses.at(0).gender);
 }
@@ -118,7 +118,7 @@ TEST(AddingParents, givesAnAddNodeNone) {
     EXPECT_EQ(0, addNode.getParentCount());
 }
 
-TEST(AddingParents, entersASingleOneWhereTheDataTellOfOne) {
+TEST(AddingParents, entersASingleOneWhereTheDataNameOne) {
     Population ofFather(bare(family("17; 3: 17")));
     ofFather.layouter.addParentsToPerson(ofFather.focus);
     EXPECT_EQ((Texts{"3"}), ofFather.idTexts(ofFather.focus.parents));
@@ -137,8 +137,8 @@ TEST(AddingParents, entersASingleOneWhereTheDataTellOfOne) {
 }
 
 TEST(HavingParents, needsOneWhoIsReal) {
-    const auto hasParents = [](const CaseFile& told) {
-        Population population(told);
+    const auto hasParents = [](const CaseFile& input) {
+        Population population(input);
         return population.layouter.hasParents(population.focus);
     };
     EXPECT_TRUE(hasParents(family("17; 3+4: 17")));
@@ -227,10 +227,10 @@ TEST(AddingChildren, eachStandsUnderItsOwnCouple) {
 }
 
 TEST(AddingChildren, childThatDoesNotNameItsParentsStandsNowhere) {
-    CaseFile told = family("17+42: 5");
-    told.fathers[5] = 99;
-    told.mothers[5] = 98;
-    Population population(told);
+    CaseFile input = family("17+42: 5");
+    input.fathers[5] = 99;
+    input.mothers[5] = 98;
+    Population population(input);
     population.layouter.addSpousesToPerson(population.focus);
     population.show(5);
     population.layouter.addAllChildrenToPerson(population.focus);
@@ -257,9 +257,9 @@ TEST(AddingChildren, withASpouseNeedsChildrenAndAsksNobodyOtherwise) {
 // A child whose other parent is unknown gets a new add-node as its mother at every look. While nobody of its
 // three stands on the chart it is let through under the couple that asks; once it stands there it is not.
 TEST(AddingChildren, childOfUnknownMotherListedByAWifeIsLetThroughOnceOnly) {
-    CaseFile told = family("17+42: 5");
-    told.mothers.erase(5);
-    Population population(told);
+    CaseFile input = family("17+42: 5");
+    input.mothers.erase(5);
+    Population population(input);
     population.layouter.addSpousesToPerson(population.focus);
     population.layouter.addAllChildrenToPerson(population.focus);
     EXPECT_EQ(1, population.focus.getChildrenWithSpouseCount(population.request.key(42)));
@@ -303,9 +303,9 @@ TEST(LoneChildren, nodesOfThePersonAmongTheVisitedDoNotCount) {
 
 TEST(LoneChildren, ofTheRealParentIncludeADatedChildOfAnAddNode) {
     for (const bool dated : {false, true}) {
-        CaseFile told = family("17; 3: 17");
-        if (dated) told.births[17] = "1850";
-        Population population(told);
+        CaseFile input = family("17; 3: 17");
+        if (dated) input.births[17] = "1850";
+        Population population(input);
         population.layouter.addParentsToPerson(population.focus);
         const ChildrenSet alone = population.layouter.getBastardChildrenOfPerson(
             population.focus.getPreferredFather(), population.focus.getParentIterator());
@@ -424,8 +424,8 @@ Texts siblingsOf(const Population& population, const TreeViewPerson& person) {
     return texts;
 }
 
-Texts siblingsOfFocus(const CaseFile& told) {
-    Population population(told);
+Texts siblingsOfFocus(const CaseFile& input) {
+    Population population(input);
     population.layouter.addParentsToPerson(population.focus);
     population.layouter.addSiblingsToPerson(population.focus);
     return siblingsOf(population, population.focus);
@@ -475,16 +475,16 @@ TEST(AddingSiblings, withASingleParentOnThatSideAloneTheyAreHalfSiblings) {
 }
 
 TEST(AddingSiblings, childWhomNeitherParentListsIsNotAmongItsSiblings) {
-    CaseFile told = family("17; 3+4: 17 18");
-    told.children[3] = {18};
-    told.children[4] = {18};
-    EXPECT_EQ((Texts{"18"}), siblingsOfFocus(told));
+    CaseFile input = family("17; 3+4: 17 18");
+    input.children[3] = {18};
+    input.children[4] = {18};
+    EXPECT_EQ((Texts{"18"}), siblingsOfFocus(input));
 }
 
 TEST(AddingSiblings, childListedByOneOfTwoRealParentsIsItsOwnHalfSibling) {
-    CaseFile told = family("17; 3+4: 17 18");
-    told.children[4] = {18};
-    EXPECT_EQ((Texts{"17/3", "18"}), siblingsOfFocus(told));
+    CaseFile input = family("17; 3+4: 17 18");
+    input.children[4] = {18};
+    EXPECT_EQ((Texts{"17/3", "18"}), siblingsOfFocus(input));
 }
 
 TEST(AddingSiblings, ofASingleAddNodeAsParentAreNobody) {
@@ -507,10 +507,10 @@ TEST(AddingSiblings, ofParentsWhoAreNobodysPreferredOnesAreNobody) {
 }
 
 TEST(AddingSiblings, takesTheirSexFromTheHostAndThePersonsOwnWhereItIsAHalfSibling) {
-    CaseFile told = bornIn(family("17; 3: 18f 19"), 17, "1850");
-    told.children[3].push_back(17);
-    told.fathers[17] = 3;
-    Population population(told);
+    CaseFile input = bornIn(family("17; 3: 18f 19"), 17, "1850");
+    input.children[3].push_back(17);
+    input.fathers[17] = 3;
+    Population population(input);
     population.layouter.addParentsToPerson(population.focus);
     population.focus.setGender(false);  // unlike the host's answer
     population.request.newCalls();
@@ -545,9 +545,9 @@ TEST(GrowingTheGraph, withACallbackLeftEmptyFailsByName) {
 }
 
 TEST(GrowingTheGraph, passesAFailureOfTheHostOn) {
-    CaseFile told = family("17+42");
-    told.failures[support::HostOperation::isPersonDead] = {1};
-    Population population(told);
+    CaseFile input = family("17+42");
+    input.failures[support::HostOperation::isPersonDead] = {1};
+    Population population(input);
     EXPECT_EQ("isPersonDead fails at call 1", failureOf<support::HostFailure>([&] {
                   population.layouter.addSpousesToPerson(population.focus);
               }));

@@ -15,7 +15,7 @@
 namespace views {
 
 // A pedigree layouter around a focus of key 0, a man unless the test says otherwise, in front of a data
-// source that knows nobody until the test tells it. The focus stands where the layouter would set it.
+// source that knows nobody until the test adds somebody. The focus stands where the layouter would set it.
 class HandMadePedigree : public testing::Test {
 protected:
     KeyFamily data;
@@ -30,8 +30,8 @@ protected:
         layouter.maxGenerations = generations;
         layouter.layoutForFocusNID();
     }
-    // Tells the data of the focus's spouses and of their shared children, of 0 and of the wife.
-    void tellOfWife(int wife, const std::vector<int>& childrenWithHer) {
+    // Sets the data of the focus's spouses and of their shared children, of 0 and of the wife.
+    void addWife(int wife, const std::vector<int>& childrenWithHer) {
         data.spouses[0].push_back(wife);
         data.spouses[wife] = {0};
         for (const int child : childrenWithHer) {
@@ -40,7 +40,7 @@ protected:
             data.parents[child] = {0, wife};
         }
     }
-    void tellOfUnknownChildren(const std::vector<int>& unknown) {
+    void setChildrenWithoutSecondParent(const std::vector<int>& unknown) {
         for (const int child : unknown) {
             data.children[0].push_back(child);
             data.parents[child] = {0, -1};

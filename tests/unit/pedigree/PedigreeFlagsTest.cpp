@@ -194,7 +194,7 @@ INSTANTIATE_TEST_SUITE_P(
                     ChildRow{"ofTheWifeAndAStranger", {1}, {8, 1}, true},
                     ChildRow{"ofAStrangerAlone", {}, {8, 51}, true},
                     ChildRow{"ofAStrangeMotherAlone", {}, {51, 9}, true},
-                    // Said to be both father and mother: only a host spouse besides that one parent tells.
+                    // Said to be both father and mother: only a host spouse besides that one parent decides.
                     ChildRow{"ofOnePersonTwiceUnmarried", {}, {0, 0}, false},
                     ChildRow{"ofOnePersonTwiceMarried", {7}, {0, 0}, true}),
     [](const auto& row) { return row.param.name; });

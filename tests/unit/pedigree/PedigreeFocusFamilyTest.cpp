@@ -42,61 +42,61 @@ TEST_F(PedigreeFocusFamily, ofALoneFocusIsEmpty) {
 }
 
 TEST_F(PedigreeFocusFamily, childlessSpouseStandsBelowTheFocus) {
-    tellOfWife(1, {});
+    addWife(1, {});
     setOut();
     EXPECT_EQ((Point{27.5f, 110.0f}), placeOf(spouse()));
 }
 
 TEST_F(PedigreeFocusFamily, loneChildStandsBesideTheMiddleOfTheCouple) {
-    tellOfWife(1, {5});
+    addWife(1, {5});
     setOut();
     EXPECT_EQ((Point{-52.5f, 55.0f}), placeOf(childUnder(1)));
 }
 
 TEST_F(PedigreeFocusFamily, twoChildrenStandLevelWithTheCouple) {
-    tellOfWife(1, {5, 6});
+    addWife(1, {5, 6});
     setOut();
     EXPECT_EQ((Heights{0, 110}), childHeights(1));
 }
 
 TEST_F(PedigreeFocusFamily, threeChildrenStandAroundTheMiddleOfTheCouple) {
-    tellOfWife(1, {5, 6, 7});
+    addWife(1, {5, 6, 7});
     setOut();
     EXPECT_EQ((Heights{-55, 55, 165}), childHeights(1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildStandsOnePitchAboveTheSharedOnes) {
-    tellOfWife(1, {5});
-    tellOfUnknownChildren({6});
+    addWife(1, {5});
+    setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Heights{55}), childHeights(1));
     EXPECT_EQ((Heights{-55}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildrenContinueTheStackUpward) {
-    tellOfWife(1, {5, 6});
-    tellOfUnknownChildren({7, 8});
+    addWife(1, {5, 6});
+    setChildrenWithoutSecondParent({7, 8});
     setOut();
     EXPECT_EQ((Heights{0, 110}), childHeights(1));
     EXPECT_EQ((Heights{-220, -110}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildOfAFocusWithAChildlessSpouseStandsAboveTheFocus) {
-    tellOfWife(1, {});
-    tellOfUnknownChildren({5});
+    addWife(1, {});
+    setChildrenWithoutSecondParent({5});
     setOut();
     EXPECT_EQ((Heights{-80}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildrenOfAnUnmarriedFocusEndAtItsTop) {
-    tellOfUnknownChildren({5, 6});
+    setChildrenWithoutSecondParent({5, 6});
     setOut();
     EXPECT_EQ((Heights{-190, -80}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, secondSpouseStandsLevelWithHerOwnChildrenOrBelowTheFirst) {
-    tellOfWife(1, {5});
-    tellOfWife(2, {6});
+    addWife(1, {5});
+    addWife(2, {6});
     setOut();
     EXPECT_EQ((Heights{55}), childHeights(1));
     EXPECT_EQ((Heights{165}), childHeights(2));
@@ -105,17 +105,17 @@ TEST_F(PedigreeFocusFamily, secondSpouseStandsLevelWithHerOwnChildrenOrBelowTheF
 }
 
 TEST_F(PedigreeFocusFamily, childrenOfTheSecondSpouseStartWhereTheFirstLeftOff) {
-    tellOfWife(1, {});
-    tellOfWife(2, {5, 6, 7});
+    addWife(1, {});
+    addWife(2, {5, 6, 7});
     setOut();
     EXPECT_EQ((Heights{95, 205, 315}), childHeights(2));
     EXPECT_EQ((Point{27.5f, 220.0f}), placeOf(spouse(1)));
 }
 
 TEST_F(PedigreeFocusFamily, furtherSpousesSinkToTheMiddleOfTheirChildren) {
-    tellOfWife(1, {5});
-    tellOfWife(2, {6, 7, 8, 9, 10});
-    tellOfWife(3, {});
+    addWife(1, {5});
+    addWife(2, {6, 7, 8, 9, 10});
+    addWife(3, {});
     setOut();
     EXPECT_EQ((Heights{165, 275, 385, 495, 605}), childHeights(2));
     EXPECT_EQ((Point{27.5f, 385.0f}), placeOf(spouse(1)));
@@ -123,24 +123,24 @@ TEST_F(PedigreeFocusFamily, furtherSpousesSinkToTheMiddleOfTheirChildren) {
 }
 
 TEST_F(PedigreeFocusFamily, childlessFurtherSpousesStandOnePitchApart) {
-    for (const int wife : {1, 2, 3}) tellOfWife(wife, {});
+    for (const int wife : {1, 2, 3}) addWife(wife, {});
     setOut();
     EXPECT_EQ((Point{27.5f, 220.0f}), placeOf(spouse(1)));
     EXPECT_EQ((Point{27.5f, 330.0f}), placeOf(spouse(2)));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildFallsBackToTheFocusWhenNoSpouseHasAChild) {
-    tellOfWife(1, {});
-    tellOfWife(2, {});
-    tellOfUnknownChildren({5});
+    addWife(1, {});
+    addWife(2, {});
+    setChildrenWithoutSecondParent({5});
     setOut();
     EXPECT_EQ((Heights{-80}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildStandsAboveTheSecondSpousesChildrenToo) {
-    tellOfWife(1, {});
-    tellOfWife(2, {5});
-    tellOfUnknownChildren({6});
+    addWife(1, {});
+    addWife(2, {5});
+    setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Heights{95}), childHeights(2));
     EXPECT_EQ((Heights{-15}), childHeights(-1));
@@ -155,7 +155,7 @@ TEST_F(PedigreeFocusFamily, firstSpouseOfTheListStandsDirectlyBelow) {
 
 // The second node of the first spouse shares its key, so no step places it; the child counts twice.
 TEST_F(PedigreeFocusFamily, firstSpouseListedTwiceStandsOnceAndItsSecondNodeStaysUnplaced) {
-    tellOfWife(1, {5});
+    addWife(1, {5});
     data.spouses[0] = {1, 1};
     setOut();
     ASSERT_EQ(2u, focus.spouses.size());
@@ -167,8 +167,8 @@ TEST_F(PedigreeFocusFamily, firstSpouseListedTwiceStandsOnceAndItsSecondNodeStay
 // Both entries of the spouse set out the same two nodes of the child, so the second time counts: 315 and 425,
 // with their middle at 370 for the first entry and a pitch further for the second.
 TEST_F(PedigreeFocusFamily, laterSpouseListedTwiceSetsItsChildrenOutTwice) {
-    tellOfWife(1, {});
-    tellOfWife(2, {5});
+    addWife(1, {});
+    addWife(2, {5});
     data.spouses[0] = {1, 2, 2};
     setOut();
     EXPECT_EQ((Heights{315, 425}), childHeights(2));
@@ -177,9 +177,9 @@ TEST_F(PedigreeFocusFamily, laterSpouseListedTwiceSetsItsChildrenOutTwice) {
 }
 
 TEST_F(PedigreeFocusFamily, everyChildIsEnteredAsShown) {
-    tellOfWife(1, {5});
-    tellOfWife(2, {6});
-    tellOfUnknownChildren({7});
+    addWife(1, {5});
+    addWife(2, {6});
+    setChildrenWithoutSecondParent({7});
     setOut();
     for (const int key : {1, 2, 5, 6, 7}) EXPECT_EQ(1u, layouter.shownPersons.count(key)) << key;
 }
@@ -194,14 +194,14 @@ TEST_F(PedigreeFocusFamily, childThatHangsThereAlreadyIsEnteredAsShown) {
 
 // The record of who is shown goes by the nodes that hang there, not by who was given a place.
 TEST_F(PedigreeFocusFamily, childOfASpouseAloneIsEnteredWhereItHangsThere) {
-    tellOfWife(1, {5});
+    addWife(1, {5});
     focus.addSpouse(2, views::kFemale).addChildWithNoOtherSpouse(9, views::kMale);
     setOut();
     EXPECT_EQ(1u, layouter.shownPersons.count(9));
 }
 
 TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
-    tellOfWife(1, {5});
+    addWife(1, {5});
     data.children[1].push_back(8);
     data.parents[8] = {-1, 1};
     data.children[5] = {9};
@@ -213,8 +213,8 @@ TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
 
 TEST_F(PedigreeFocusFamily, standsWhereTheFocusStands) {
     views::place(focus, 100.0f, 50.0f);
-    tellOfWife(1, {5});
-    tellOfUnknownChildren({6});
+    addWife(1, {5});
+    setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Point{100.0f, 160.0f}), placeOf(spouse()));
     EXPECT_EQ((Point{20.0f, 105.0f}), placeOf(childUnder(1)));
@@ -224,7 +224,7 @@ TEST_F(PedigreeFocusFamily, standsWhereTheFocusStands) {
 TEST_F(PedigreeFocusFamily, followsTheSizesGiven) {
     layouter.treeSize = TreeSize{100.0f, 40.0f, 10.0f, 20.0f, 10.0f, 0.0f};
     views::place(focus, 50.0f, 0.0f);
-    tellOfWife(1, {5});
+    addWife(1, {5});
     setOut();
     EXPECT_EQ((Point{50.0f, 60.0f}), placeOf(spouse()));
     EXPECT_EQ((Point{-60.0f, 30.0f}), placeOf(childUnder(1)));

@@ -344,7 +344,7 @@ TEST_F(PedigreeLines, ofThePedigreeHaveNoSiblings) {
 }
 
 TEST_F(PedigreeLines, ofTheFocussFamilyAreDrawnBeforeThoseToItsParents) {
-    tellOfWife(7, {8});
+    addWife(7, {8});
     data.parents[0] = {1, 2};
     layOut(2);
     const Segments segments = segmentsOf(focus);

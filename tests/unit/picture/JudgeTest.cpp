@@ -117,7 +117,7 @@ TEST(Judge, countsAsThePlainOneDoesOverRandomPictures) {
     }
 }
 
-TEST(Judge, relationsThatNoEntryAndNoMarkTellAreUntold) {
+TEST(Judge, relationsThatNoEntryAndNoMarkExpressAreUntold) {
     kin::KinGraphBuilder builder;
     const kin::Place father = builder.addPerson(1, kin::Sex::male);
     const kin::Place mother = builder.addPerson(2, kin::Sex::female);

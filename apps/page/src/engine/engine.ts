@@ -14,7 +14,7 @@ export interface EmbeddedFamily {
     readonly focus: number;
     readonly view: string;
     readonly livingHidden: boolean;
-    /** On the file that the family was read from; the text in the page is another. Null where nobody told. */
+    /** On the file that the family was read from; the text in the page is another. Null where nobody stored. */
     readonly remarks: readonly Diagnostic[] | null;
     readonly bytes: Uint8Array;
 }
@@ -27,16 +27,16 @@ export async function startEngine(): Promise<Olvane> {
 export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
     const text = document.getElementById("olvane-family")?.textContent;
     if (!text) return null;
-    const told = JSON.parse(text) as Partial<
+    const stored = JSON.parse(text) as Partial<
         Record<"name" | "title" | "focus" | "view" | "livingHidden" | "remarks" | "gzip", unknown>
     >;
     return {
-        name: String(told.name ?? "family.ged"),
-        title: String(told.title ?? ""),
-        focus: Number(told.focus) || 0,
-        view: String(told.view ?? ""),
-        livingHidden: told.livingHidden === true,
-        remarks: Array.isArray(told.remarks) ? (told.remarks as Diagnostic[]) : null,
-        bytes: await gunzip(bytesOfBase64(String(told.gzip ?? ""))),
+        name: String(stored.name ?? "family.ged"),
+        title: String(stored.title ?? ""),
+        focus: Number(stored.focus) || 0,
+        view: String(stored.view ?? ""),
+        livingHidden: stored.livingHidden === true,
+        remarks: Array.isArray(stored.remarks) ? (stored.remarks as Diagnostic[]) : null,
+        bytes: await gunzip(bytesOfBase64(String(stored.gzip ?? ""))),
     };
 }

@@ -80,7 +80,7 @@ export const germanRemarks: RemarkTable = {
         "als eigener Datensatz gelesen; Verweise führen zum ersten",
     "read as level {}": "gelesen als Ebene {}",
     "read as {}": "gelesen als {}",
-    "those in names and dates are told below": "die in Namen und Daten sind unten aufgeführt",
+    "those in names and dates are listed below": "die in Namen und Daten sind unten aufgeführt",
 
     // why nothing was read
     "{}: is empty": "{}: ist leer",

@@ -135,7 +135,7 @@ export const uiEnglish: UiMessages = {
         children: "Children",
         otherNames: "Also called",
         allOf: (n) => `Show all ${n}`,
-        noFacts: "The file tells nothing more.",
+        noFacts: "The file states nothing more.",
         unknownPartner: "Unknown partner",
     },
     pedigrees: { adopted: "adopted", foster: "foster child", sealing: "sealed" },

@@ -28,7 +28,7 @@ export class PictureOutput {
         if (!whole) return;
         const name = this.subject()!.name + ".svg";
         saveFile(name, svgBlob(whole));
-        this.notices.tell(ui.saved(name));
+        this.notices.show(ui.saved(name));
     }
 
     async savePng(ui: UiMessages): Promise<void> {
@@ -38,7 +38,7 @@ export class PictureOutput {
         try {
             const { blob, part } = await pngOf(whole);
             saveFile(name, blob);
-            this.notices.tell(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
+            this.notices.show(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
         } catch {
             this.notices.fail(ui.pictureFailed, []);
         }

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What stands in each box and what is read out for it. Kinship is told only once it is known, since a search
+// What stands in each box and what is read out for it. Kinship is stated only once it is known, since a search
 // through a large family must not hold up the picture.
 
 import type { Person } from "olvane";

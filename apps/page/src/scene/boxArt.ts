@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Draws one box. A tall box has the silhouette on top and centred lines below it; a wide one has it at the
-// left and lines beside it. Sex is told by corners and silhouette as well as by colour. Colours come from the
+// left and lines beside it. Sex is shown by corners and silhouette as well as by colour. Colours come from the
 // page's themes.
 
 import type { Sex } from "olvane";

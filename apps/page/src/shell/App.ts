@@ -88,7 +88,7 @@ export class App implements ChromeActions {
             const opened = await this.files.openFile(file);
             this.encoding = "";
             this.show(opened, null);
-            if (others.length > 0) this.notices.tell(this.ui.firstOfFiles(quoted(file.name)));
+            if (others.length > 0) this.notices.show(this.ui.firstOfFiles(quoted(file.name)));
         } catch (error) {
             this.refuse(file.name, error);
         }
@@ -131,9 +131,9 @@ export class App implements ChromeActions {
     }
 
     private greet(family: OpenFamily): void {
-        if (recall("greeted") !== "yes") this.notices.tell(this.ui.firstHint);
+        if (recall("greeted") !== "yes") this.notices.show(this.ui.firstHint);
         remember("greeted", "yes");
-        if (family.livingHidden) this.notices.tell(this.ui.livingHidden);
+        if (family.livingHidden) this.notices.show(this.ui.livingHidden);
     }
 
     // A link that leads to nobody is named; one that leads somewhere takes the notice away.

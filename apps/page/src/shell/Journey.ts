@@ -18,7 +18,7 @@ export class Journey {
     private family = kOwnFamily;
     private address = "";
 
-    // goTo is told an address that the browser went to.
+    // goTo receives an address that the browser went to.
     constructor(private readonly goTo: (address: string) => void) {
         window.addEventListener("popstate", (event) => this.arrived(event.state));
     }

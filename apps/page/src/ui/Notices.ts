@@ -18,8 +18,8 @@ export class Notices {
         this.dismissLabel = dismissLabel;
     }
 
-    tell(text: string): void {
-        const notice = this.add("told", "status", text, []);
+    show(text: string): void {
+        const notice = this.add("message", "status", text, []);
         setTimeout(() => notice.remove(), kTime);
     }
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What the file tells of one person: who that is to the focus, facts with dates and places, and the
+// What the file states of one person: who that is to the focus, facts with dates and places, and the
 // relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
 // drawn up.
 
@@ -13,8 +13,8 @@ import type { OpenFamily } from "../view/OpenFamily";
 import { html, isolated, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
 
-// Told by the panel in other ways, or of no use to a reader.
-const kUntold = new Set([
+// Shown by the panel in other ways, or of no use to a reader.
+const kShownElsewhere = new Set([
     "NAME",
     "SEX",
     "FAMC",
@@ -144,7 +144,7 @@ export class SidePanel {
                 others.map((name) => isolated(name)),
             );
         for (const fact of family.file.factsOfPerson(person.id))
-            if (!kUntold.has(fact.tag)) this.appendFactOf(list, fact);
+            if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(list, fact);
         return html(
             "section",
             { class: "facts" },
@@ -215,7 +215,7 @@ export class SidePanel {
         const partner = couple.husband === person.id ? couple.wife : couple.husband;
         const facts = html("dl", {});
         for (const fact of family.file.factsOfFamily(couple.id))
-            if (!kUntold.has(fact.tag)) this.appendFactOf(facts, fact);
+            if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(facts, fact);
         const children = this.list(couple.children, (id) => this.link(family.person(id)));
         children.className = "children";
         children.setAttribute("aria-label", this.ui.panel.children);

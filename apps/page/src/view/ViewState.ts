@@ -54,7 +54,7 @@ export const kUsualState: ViewState = {
     hidden: new Set(),
 };
 
-// Boxes wide enough for most names, and rows far enough apart for the lines between them to be told from
+// Boxes wide enough for most names, and rows far enough apart for the lines between them to be distinguished from
 // another.
 const kTall = { width: 118, height: 104, gapX: 22, gapY: 42 };
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };

@@ -3,7 +3,7 @@
 # SPDX-License-Identifier: MIT
 """Every option of the command stands in its man page and in the completions of each shell.
 
-Usage: check_options_told.py PATH/TO/olvane APPS_CLI_FOLDER
+Usage: check_options_documented.py PATH/TO/olvane APPS_CLI_FOLDER
 """
 
 import pathlib
@@ -23,7 +23,7 @@ def main():
     for subcommand in ("people", "layout", "draw", "batch", "check", "kin", "judge", "page"):
         options |= options_of(command, [subcommand])
     if "--focus" not in options or "--version" not in options:
-        raise SystemExit(f"the help tells too little: {sorted(options)}")
+        raise SystemExit(f"the help lists too little: {sorted(options)}")
     man = (folder / "olvane.1").read_text(encoding="utf-8").replace("\\-", "-")
     texts = {"man page": man}
     for name in ("olvane.bash", "_olvane"):
