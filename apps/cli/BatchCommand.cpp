@@ -186,7 +186,7 @@ BatchLine lineFor(const BatchFocus& focus, const Answer& answer) {
 
 // The result text of a view of the engine, or else the picture.
 Answer answerOf(const gedcom::GedcomData& data, const LayoutRequest& request) {
-    if (isEngineView(request.view)) {
+    if (isEngineView(request.view())) {
         return [&](gedcom::PersonId id) { return layoutText(data, id, request); };
     }
     const auto run = std::make_shared<PictureRun>(data, request, std::vector<bool>());

@@ -73,18 +73,6 @@ void addFocus(CLI::App& command, std::string& focus) {
         ->type_name("WHO");
 }
 
-// Of a page, which is opened in a view of the engine and shows any.
-void addPageView(CLI::App& command, View& view) {
-    static const std::map<std::string, View> kViews = {{"family", View::family},
-                                                       {"pedigree", View::pedigree}};
-    command
-        .add_option(
-            "--view", view,
-            "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways")
-        ->transform(CLI::CheckedTransformer(kViews))
-        ->type_name("family|pedigree");
-}
-
 void addHideLiving(CLI::App& command, HidingOptions& hiding, const std::string& further = "") {
     command.add_flag(
         "--hide-living", hiding.hideLiving,
@@ -131,7 +119,7 @@ public:
         if (check_->parsed()) return runCheck(completedCheckOptions());
         if (kin_->parsed()) return runKin(kinOptions_);
         if (judge_->parsed()) return runJudge(judgeOptions_);
-        if (page_->parsed()) return runPage(pageOptions_);
+        if (page_->parsed()) return runPage(completedPageOptions());
         return runDraw(completedDrawOptions());
     }
 
@@ -341,7 +329,7 @@ private:
                     "The person in the middle when the page opens: an xref, a number of 'olvane people' "
                     "or words of the name; the page's own choice when not given")
                 ->type_name("WHO");
-        addPageView(*page_, pageOptions_.view);
+        addPageViewOptions(*page_, pageOptions_.request);
         page_
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
@@ -351,7 +339,7 @@ private:
         needsFile(page_->get_option("--encoding"));
         needsFile(page_->get_option("--hide-living"));
         needsFile(page_->get_option("--title"));
-        needsFile(page_->get_option("--view"));
+        for (const std::string& name : pageViewOptionNames()) needsFile(page_->get_option(name));
     }
 
     // Without a family these would change nothing.
@@ -361,11 +349,11 @@ private:
         LayoutOptions options = layoutOptions_;
         completeViewOptions(*layout_, options.request);
         options.request.unknownParents = true;  // they are in the layout
-        if (isEngineView(options.request.view)) return options;
+        if (isEngineView(options.request.view())) return options;
         if (!isGiven(*layout_, "--format")) options.format = LayoutFormat::json;
         if (options.format != LayoutFormat::json) {
             throw UsageError(
-                std::string("--format: the view ") + charts::nameOf(options.request.view) +
+                std::string("--format: the view ") + charts::nameOf(options.request.view()) +
                 " is printed as json alone; text and json1 are of the views family and pedigree");
         }
         return options;
@@ -401,10 +389,23 @@ private:
         return options;
     }
 
+    PageOptions completedPageOptions() const {
+        constexpr int kMostColumns = 10;
+        PageOptions options = pageOptions_;
+        completeViewOptions(*page_, options.request);
+        const int columns = options.request.chart.layout.generations;
+        if (options.request.view() == View::pedigree && (columns < 2 || columns > kMostColumns)) {
+            throw UsageError("--generations: the pedigree of a page has 2 to 10 generations");
+        }
+        if (!options.request.to.empty() && options.focus.empty()) throw UsageError("--to needs --focus");
+        options.address = pageAddressOf(*page_, options.request);
+        return options;
+    }
+
     // Pictures that lie sideways have wide boxes, and what is checked is the picture.
     static void widenSideways(const CLI::App& command, LayoutRequest& request) {
         const charts::Direction direction = request.chart.direction;
-        const bool liesSideways = request.view == View::pedigree || direction == charts::Direction::left ||
+        const bool liesSideways = request.view() == View::pedigree || direction == charts::Direction::left ||
                                   direction == charts::Direction::right;
         if (liesSideways && command.count("--boxes") == 0) request.boxes = BoxForm::wide;
     }

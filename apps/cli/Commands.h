@@ -84,8 +84,9 @@ struct PageOptions {
     InputOptions input;  // without a file for a page without a family
     std::string focus;
     std::string output;
-    std::string title;  // empty for one made of the focus's name
-    View view = View::family;
+    std::string title;      // empty for one made of the focus's name
+    LayoutRequest request;  // what the page opens with
+    std::string address;    // the same, as pageAddressOf has it
     HidingOptions hiding;
 };
 

@@ -63,7 +63,7 @@ const char* endingOf(Form form) {
 
 // "Family of Ada Berg", "Ancestors of Ada Berg".
 std::string titleOf(const DrawOptions& options, const draw::DrawingContent& content) {
-    std::string view = charts::nameOf(options.request.view);
+    std::string view = charts::nameOf(options.request.view());
     if (view[0] >= 'a' && view[0] <= 'z') view[0] = static_cast<char>(view[0] - 'a' + 'A');
     const picture::Index focus = content.picture.focus;
     if (focus == picture::kNone) return view;

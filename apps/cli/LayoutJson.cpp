@@ -49,7 +49,7 @@ std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, c
     const gedcom::HiddenNames hiddenNames(data, living);
     Json json;
     json["format"] = kFormatVersion;
-    json["view"] = request.view == View::pedigree ? "pedigree" : "family";
+    json["view"] = request.view() == View::pedigree ? "pedigree" : "family";
     json["focus"] = focus;
     json["boxWidth"] = static_cast<int>(size.nodeWidth);
     json["boxHeight"] = static_cast<int>(size.nodeHeight);

@@ -19,6 +19,8 @@ namespace {
 // quarter of a minute where one person has a hundred thousand children, which are looked up in a set that large.
 constexpr std::size_t kMostRelatives = 5000000;
 
+constexpr float kGapOfWideRows = 45;  // room for names of children over one another
+
 }  // namespace
 
 TreeSize sizeOf(BoxForm boxes) {
@@ -33,20 +35,31 @@ TreeSize sizeOf(BoxForm boxes) {
     return size;
 }
 
-TypedLayout typedLayout(const gedcom::GedcomData& data, gedcom::PersonId focus,
-                        const LayoutRequest& request) {
-    gedcom::GedcomDataSource people(data);
-    const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source =
-        std::make_shared<gedcom::LimitedDataSource>(people, kMostRelatives);
-    olvane::LayoutOptions options = request.engine;
-    options.sizes = sizeOf(request.boxes);
-    options.generations = request.generations;
-    return request.view == View::pedigree ? pedigreeLayout(focus, source, options)
-                                          : familyLayout(focus, source, options);
+charts::ChartSizes chartSizesOf(const LayoutRequest& request) {
+    const TreeSize size = sizeOf(request.boxes);
+    charts::ChartSizes sizes;
+    sizes.boxWidth = size.nodeWidth;
+    sizes.boxHeight = size.nodeHeight;
+    if (isEngineView(request.view())) {
+        sizes.gapX = size.horzPadding;
+        sizes.gapY = size.vertPadding;
+    } else if (request.boxes == BoxForm::wide) {
+        sizes.gapY = kGapOfWideRows;
+    }
+    return sizes;
+}
+
+std::shared_ptr<OlvaneViewerManagerWrapProtocol> limitedSource(OlvaneViewerManagerWrapProtocol& people) {
+    return std::make_shared<gedcom::LimitedDataSource>(people, kMostRelatives);
 }
 
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
-    return typedLayout(data, focus, request).text;
+    gedcom::GedcomDataSource people(data);
+    olvane::LayoutOptions options = request.chart.layout;
+    options.sizes = sizeOf(request.boxes);
+    const auto source = limitedSource(people);
+    return request.view() == View::pedigree ? pedigreeLayout(focus, source, options).text
+                                            : familyLayout(focus, source, options).text;
 }
 
 }  // namespace olvane::cli

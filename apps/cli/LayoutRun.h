@@ -4,10 +4,10 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <string>
-#include <vector>
 
-#include <olvane/boundary/TypedLayout.h>
+#include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/layouter/TreeSize.h>
@@ -20,15 +20,15 @@ using charts::View;
 // The form of the boxes: tall ones as hosts draw them, or wide ones, which keep a sideways chart low.
 enum class BoxForm : std::uint8_t { tall, wide };
 
+// What to lay out. chart says which view and what it shows; focus and sizes are filled in by PictureRun.
 struct LayoutRequest {
-    View view = View::family;
-    int generations = 5;           // columns of a pedigree, the focus's own included
-    std::string to;                // of the kinship view, as the user names the person; checked by PictureRun
-    charts::ChartRequest chart{};  // of the other views; view, focus and sizes are filled in by PictureRun
+    charts::ChartRequest chart{};
     BoxForm boxes = BoxForm::tall;
-    // Which relatives a family view shows; sizes and generations are filled in by typedLayout.
-    olvane::LayoutOptions engine{};
+    std::string to;               // of the kinship view, as the user names the person; checked by PictureRun
     bool unknownParents = false;  // a picture of a view of the engine has boxes for parents who are not known
+
+    LayoutRequest() { chart.view = View::family; }
+    View view() const { return chart.view; }
 };
 
 // Whether the engine makes the view, so that it has a result text.
@@ -36,14 +36,19 @@ inline bool isEngineView(View view) {
     return view == View::family || view == View::pedigree;
 }
 
+// The sizes of a layout of the engine.
 TreeSize sizeOf(BoxForm boxes);
 
-// One layout of a view of the engine, as values and as text. Safe to call on several threads with the same data.
-// Fails: std::length_error, with a sentence for the user, where the layout asks for more than 5 million relatives;
-//        passes on what the engine throws; an id that is no person throws std::out_of_range.
-TypedLayout typedLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
+// The sizes of a picture, whose engine views keep the gaps of sizeOf.
+charts::ChartSizes chartSizesOf(const LayoutRequest& request);
 
-// Its text alone. Fails as typedLayout does.
+// The same answers, up to 5 million relatives.
+// Holds: refers to people, which must outlive it; one for each layout.
+// Fails: its operations throw std::length_error, with a sentence for the user, beyond the limit.
+std::shared_ptr<OlvaneViewerManagerWrapProtocol> limitedSource(OlvaneViewerManagerWrapProtocol& people);
+
+// The result text of a view of the engine. Safe to call on several threads with the same data.
+// Fails: as limitedSource says; passes on what the engine throws; an id that is no person throws std::out_of_range.
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request);
 
 }  // namespace olvane::cli

@@ -72,7 +72,11 @@ PageFamily familyOf(const PageOptions& options) {
     family.name = fileNameOf(options);
     family.title = options.title.empty() ? titleOf(data, focus, family, hiding.hidden) : options.title;
     family.focus = focusOf(focus);
-    family.view = options.view == View::pedigree ? "pedigree" : "family";
+    family.address = options.address;
+    if (focus != 0) family.address += "&number=" + std::to_string(focus);
+    if (!options.request.to.empty()) {
+        family.address += "&to=" + std::to_string(chooseFocus(data, options.request.to));
+    }
     family.livingHidden = options.hiding.hideLiving;
     // They quote the file, and so may name whom the page does not.
     if (!options.hiding.hideLiving) family.remarks = data.diagnostics();

@@ -77,7 +77,7 @@ std::string familyBlock(const PageFamily& family) {
         {"name", family.name},
         {"title", family.title},
         {"focus", family.focus},
-        {"view", family.view},
+        {"address", family.address},
         {"livingHidden", family.livingHidden},
         {"remarks", remarksOf(family)},
         {"gzip", base64(gzipped(family.gedcom))},

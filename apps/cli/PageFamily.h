@@ -13,11 +13,11 @@ namespace olvane::cli {
 
 // What a page carries of a family, and how it opens.
 struct PageFamily {
-    std::string name;    // of the file
-    std::string title;   // above the picture and in the window's title
-    std::string focus;   // the number of a person in the text, from 1; empty for the page's own choice
-    std::string view;    // "family" or "pedigree"
-    std::string gedcom;  // UTF-8
+    std::string name;     // of the file
+    std::string title;    // above the picture and in the window's title
+    std::string focus;    // the number of a person in the text, from 1; empty for the page's own choice
+    std::string address;  // what the page opens with, in the form of its own addresses, without the #
+    std::string gedcom;   // UTF-8
     bool livingHidden = false;
     // On the file that the text was made of, with its line numbers.
     std::vector<gedcom::Diagnostic> remarks;

@@ -9,8 +9,7 @@
 #include <span>
 #include <utility>
 
-#include <olvane/charts/Charts.h>
-#include <olvane/picture/LayoutPicture.h>
+#include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
 
 #include <cli/FocusChoice.h>
@@ -22,26 +21,17 @@ namespace {
 
 constexpr const char* kLivingJson = "{\"living\": true}";
 
-charts::ChartSizes sizesOf(BoxForm boxes) {
-    const TreeSize size = sizeOf(boxes);
-    charts::ChartSizes sizes;
-    sizes.boxWidth = size.nodeWidth;
-    sizes.boxHeight = size.nodeHeight;
-    if (boxes == BoxForm::wide) sizes.gapY = 45;  // room for names of children over one another
-    return sizes;
-}
-
 }  // namespace
 
-PictureRun::PictureRun(const gedcom::GedcomData& data, LayoutRequest request, std::vector<bool> hidden)
+PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden)
     : data_(data),
-      request_(std::move(request)),
+      view_{request.chart, request.unknownParents},
       hidden_(std::move(hidden)),
       hiddenNames_(data, hidden_),
       graph_(gedcom::kinGraphOf(data)) {
-    request_.chart.view = request_.view;
-    request_.chart.sizes = sizesOf(request_.boxes);
-    if (request_.view == View::kinship) request_.chart.to = graph_.placeOf(chooseFocus(data, request_.to));
+    view_.chart.sizes = chartSizesOf(request);
+    view_.chart.layout.sizes = sizeOf(request.boxes);
+    if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
 
 bool PictureRun::isHidden(std::int64_t id) const {
@@ -50,22 +40,12 @@ bool PictureRun::isHidden(std::int64_t id) const {
 }
 
 picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
-    picture::Picture picture = isEngineView(request_.view) ? enginePictureOf(focus) : chartOf(focus);
+    gedcom::GedcomDataSource people(data_);
+    charts::ViewRequest view = view_;
+    view.chart.focus = graph_.placeOf(focus);
+    picture::Picture picture = charts::pictureOf(limitedSource(people), graph_, view);
     if (!hidden_.empty()) hideIn(picture);
     return picture;
-}
-
-picture::Picture PictureRun::enginePictureOf(gedcom::PersonId focus) const {
-    picture::LayoutPictureOptions options;
-    options.known = &graph_;
-    options.unknownParents = request_.unknownParents;
-    return picture::pictureOf(typedLayout(data_, focus, request_), options);
-}
-
-picture::Picture PictureRun::chartOf(gedcom::PersonId focus) const {
-    charts::ChartRequest chart = request_.chart;
-    chart.focus = graph_.placeOf(focus);
-    return charts::chartOf(graph_, chart);
 }
 
 void PictureRun::hideIn(picture::Picture& picture) const {

@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include <olvane/charts/Views.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/HiddenNames.h>
 #include <olvane/kin/KinGraph.h>
@@ -19,11 +20,11 @@ namespace olvane::cli {
 // Pictures of one file in one view.
 //
 // Holds: refers to the data, which must outlive it. Safe to ask on several threads.
-// Fails: passes on what typedLayout and charts throw.
+// Fails: passes on what limitedSource and charts::pictureOf throw.
 class PictureRun {
 public:
     // hidden: of whom nothing is stated, an entry for each person; empty for nobody.
-    PictureRun(const gedcom::GedcomData& data, LayoutRequest request, std::vector<bool> hidden);
+    PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden);
 
     // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, neither number
     // nor state of a family with a hidden partner or without a partner who is known.
@@ -36,13 +37,11 @@ public:
     std::string jsonOf(gedcom::PersonId focus) const;
 
 private:
-    picture::Picture enginePictureOf(gedcom::PersonId focus) const;
-    picture::Picture chartOf(gedcom::PersonId focus) const;
     bool isHidden(std::int64_t id) const;
     void hideIn(picture::Picture& picture) const;
 
     const gedcom::GedcomData& data_;
-    LayoutRequest request_;
+    charts::ViewRequest view_;
     std::vector<bool> hidden_;
     gedcom::HiddenNames hiddenNames_;
     kin::KinGraph graph_;

@@ -19,23 +19,30 @@ namespace olvane::cli {
 namespace {
 
 constexpr int kMostPedigreeGenerations = 12;
+constexpr const char* kDepthGroup = "Views to any depth";
+constexpr const char* kKinshipGroup = "Kinship view";
 
 struct FamilySwitch {
     const char* name;
     bool olvane::LayoutOptions::*shown;
+    const char* pageName;  // in an address of a page
     const char* help;
 };
 
 constexpr FamilySwitch kFamilySwitches[] = {
-    {"--no-aunts-uncles", &olvane::LayoutOptions::auntsUncles,
+    {"--no-aunts-uncles", &olvane::LayoutOptions::auntsUncles, "auntsUncles",
      "Leave out siblings of the parents, and so cousins too"},
-    {"--no-cousins", &olvane::LayoutOptions::cousins, "Leave out children of the parents' siblings"},
-    {"--no-siblings", &olvane::LayoutOptions::siblings, "Leave out siblings and half siblings"},
-    {"--no-sibling-spouses", &olvane::LayoutOptions::siblingSpouses, "Leave out spouses of the siblings"},
-    {"--no-nieces-nephews", &olvane::LayoutOptions::niecesNephews, "Leave out children of the siblings"},
-    {"--no-grandchildren", &olvane::LayoutOptions::grandchildren, "Leave out grandchildren"},
-    {"--no-great-grandparents", &olvane::LayoutOptions::greatGrandparents, "Leave out great-grandparents"},
-    {"--no-spouses-of-children", &olvane::LayoutOptions::spousesOfChildren,
+    {"--no-cousins", &olvane::LayoutOptions::cousins, "cousins",
+     "Leave out children of the parents' siblings"},
+    {"--no-siblings", &olvane::LayoutOptions::siblings, "siblings", "Leave out siblings and half siblings"},
+    {"--no-sibling-spouses", &olvane::LayoutOptions::siblingSpouses, "siblingSpouses",
+     "Leave out spouses of the siblings"},
+    {"--no-nieces-nephews", &olvane::LayoutOptions::niecesNephews, "niecesNephews",
+     "Leave out children of the siblings"},
+    {"--no-grandchildren", &olvane::LayoutOptions::grandchildren, "grandchildren", "Leave out grandchildren"},
+    {"--no-great-grandparents", &olvane::LayoutOptions::greatGrandparents, "greatGrandparents",
+     "Leave out great-grandparents"},
+    {"--no-spouses-of-children", &olvane::LayoutOptions::spousesOfChildren, "spousesOfChildren",
      "Leave out spouses of the children"},
 };
 
@@ -71,6 +78,8 @@ const std::vector<OptionUse>& optionUses() {
         {"--up", {View::ancestors, View::hourglass, View::relatives, View::fan}},
         {"--down", {View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--direction", kDirected},
+        {"--compact",
+         {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives, View::kinship}},
         {"--siblings", {View::ancestors, View::hourglass}},
         {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--to", {View::kinship}},
@@ -92,7 +101,7 @@ bool isGiven(const CLI::App& command, const char* option) {
 void addView(CLI::App& command, LayoutRequest& request) {
     command
         .add_option(
-            "--view", request.view,
+            "--view", request.chart.view,
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
             "the relatives of family, placed anew without overlaps; ancestors, descendants, hourglass (both) "
             "and relatives (the descendants of every ancestor): any number of generations, each person once; "
@@ -101,7 +110,7 @@ void addView(CLI::App& command, LayoutRequest& request) {
         ->transform(CLI::CheckedTransformer(views()))
         ->type_name("VIEW");
     command
-        .add_option("--generations", request.generations,
+        .add_option("--generations", request.chart.layout.generations,
                     "Generations, the focus's own included. Of a pedigree 1 to 12, default 5: N generations "
                     "are up to "
                     "2^N - 1 boxes. Of other views, up and down, 2 and more; 0, the default, is all of them")
@@ -109,12 +118,12 @@ void addView(CLI::App& command, LayoutRequest& request) {
         ->type_name("N");
 }
 
-void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
+void addReach(CLI::App& command, charts::ChartRequest& chart) {
     static const std::map<std::string, charts::Direction> kDirections = {{"down", charts::Direction::down},
                                                                          {"up", charts::Direction::up},
                                                                          {"left", charts::Direction::left},
                                                                          {"right", charts::Direction::right}};
-    const std::string group = "Views to any depth";
+    const std::string group = kDepthGroup;
     command.add_option("--up", chart.up, "Generations above the focus; 0, the default, is all")
         ->check(CLI::NonNegativeNumber)
         ->type_name("N")
@@ -128,6 +137,14 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
                     "Where later generations stand: down (default), up, left or right of earlier ones")
         ->transform(CLI::CheckedTransformer(kDirections))
         ->type_name("down|up|left|right")
+        ->group(group);
+}
+
+void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
+    const std::string group = kDepthGroup;
+    command
+        .add_flag("--compact", chart.compact,
+                  "Pack a tree tighter: parents need not stand over the middle of their children")
         ->group(group);
     command.add_flag("--siblings", chart.siblings, "Show siblings of the focus and of its ancestors")
         ->group(group);
@@ -147,15 +164,18 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
         ->group(group);
 }
 
+void addOtherPerson(CLI::App& command, LayoutRequest& request) {
+    command.add_option("--to", request.to, "The other person, named like the one of --focus")
+        ->type_name("WHO")
+        ->group(kKinshipGroup);
+}
+
 void addKinshipOptions(CLI::App& command, LayoutRequest& request) {
     static const std::map<std::string, charts::WayChoice> kChoices = {
         {"blood", charts::WayChoice::blood},
         {"marriage", charts::WayChoice::marriage},
         {"both", charts::WayChoice::both}};
-    const std::string group = "Kinship view";
-    command.add_option("--to", request.to, "The other person, named like the one of --focus")
-        ->type_name("WHO")
-        ->group(group);
+    const std::string group = kKinshipGroup;
     command
         .add_option("--by", request.chart.ways,
                     "Which ways are shown: by blood, by marriage or both (default)")
@@ -193,8 +213,8 @@ void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
 
 void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
     for (const FamilySwitch& option : kFamilySwitches) {
-        command.add_flag("!" + std::string(option.name), request.engine.*option.shown, option.help)
-            ->group("Family view");
+        command.add_flag("!" + std::string(option.name), request.chart.layout.*option.shown, option.help)
+            ->group("Family and near");
     }
 }
 
@@ -220,22 +240,26 @@ void refuseIdle(const CLI::App& command, const char* option, std::span<const Vie
 }
 
 void refuseIdleOptions(const CLI::App& command, View view) {
-    constexpr View kFamilyAlone[] = {View::family};
+    constexpr View kOfNearRelatives[] = {View::family, View::near};
     for (const OptionUse& use : optionUses()) refuseIdle(command, use.option, use.views, view);
-    for (const FamilySwitch& option : kFamilySwitches) refuseIdle(command, option.name, kFamilyAlone, view);
+    for (const FamilySwitch& option : kFamilySwitches) {
+        refuseIdle(command, option.name, kOfNearRelatives, view);
+    }
 }
 
 // Counted with the focus's own in --generations, and from the focus on in a chart.
 void applyGenerations(const CLI::App& command, LayoutRequest& request) {
     if (!isGiven(command, "--generations")) return;
-    if (request.view == View::pedigree) {
-        if (request.generations >= 1 && request.generations <= kMostPedigreeGenerations) return;
+    if (request.view() == View::pedigree) {
+        if (request.chart.layout.generations >= 1 &&
+            request.chart.layout.generations <= kMostPedigreeGenerations)
+            return;
         throw UsageError("--generations: a pedigree has 1 to " + std::to_string(kMostPedigreeGenerations) +
                          " generations");
     }
-    if (request.generations == 1)
+    if (request.chart.layout.generations == 1)
         throw UsageError("--generations: 1 would be the focus alone; 2 and more, or 0 for all");
-    const int others = std::max(request.generations - 1, 0);
+    const int others = std::max(request.chart.layout.generations - 1, 0);
     if (!isGiven(command, "--up")) request.chart.up = others;
     if (!isGiven(command, "--down")) request.chart.down = others;
 }
@@ -245,16 +269,57 @@ void applyGenerations(const CLI::App& command, LayoutRequest& request) {
 void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string& boxDefaults) {
     addView(command, request);
     addBoxes(command, request, boxDefaults);
+    addReach(command, request.chart);
     addChartOptions(command, request.chart);
+    addOtherPerson(command, request);
     addKinshipOptions(command, request);
     addEverybodyOptions(command, request.chart);
     addFamilySwitches(command, request);
 }
 
+void addPageViewOptions(CLI::App& command, LayoutRequest& request) {
+    addView(command, request);
+    addReach(command, request.chart);
+    addOtherPerson(command, request);
+    addFamilySwitches(command, request);
+}
+
+std::vector<std::string> pageViewOptionNames() {
+    std::vector<std::string> names{"--view", "--generations", "--up", "--down", "--direction", "--to"};
+    for (const FamilySwitch& option : kFamilySwitches) names.emplace_back(option.name);
+    return names;
+}
+
+std::string pageAddressOf(const CLI::App& command, const LayoutRequest& request) {
+    static const std::map<charts::Direction, const char*> kNames = {{charts::Direction::down, "down"},
+                                                                    {charts::Direction::up, "up"},
+                                                                    {charts::Direction::left, "left"},
+                                                                    {charts::Direction::right, "right"}};
+    const charts::ChartRequest& chart = request.chart;
+    const bool hasGenerations = isGiven(command, "--generations");
+    const bool isPedigree = request.view() == View::pedigree;
+    std::string address = std::string("view=") + charts::nameOf(request.view());
+    const auto add = [&address](const std::string& part) { address += "&" + part; };
+    if (isPedigree && hasGenerations) add("generations=" + std::to_string(chart.layout.generations));
+    if (isGiven(command, "--up") || (hasGenerations && !isPedigree)) add("up=" + std::to_string(chart.up));
+    if (isGiven(command, "--down") || (hasGenerations && !isPedigree)) {
+        add("down=" + std::to_string(chart.down));
+    }
+    if (isGiven(command, "--direction")) add(std::string("direction=") + kNames.at(chart.direction));
+    std::string hidden;
+    for (const FamilySwitch& option : kFamilySwitches) {
+        if (chart.layout.*option.shown) continue;
+        hidden += (hidden.empty() ? "" : ",") + std::string(option.pageName);
+    }
+    if (!hidden.empty()) add("hide=" + hidden);
+    return address;
+}
+
 void completeViewOptions(const CLI::App& command, LayoutRequest& request) {
-    refuseIdleOptions(command, request.view);
+    refuseIdleOptions(command, request.view());
     applyGenerations(command, request);
-    if (request.view == View::kinship && request.to.empty()) throw UsageError("the view kinship needs --to");
+    if (request.view() == View::kinship && request.to.empty())
+        throw UsageError("the view kinship needs --to");
 }
 
 }  // namespace olvane::cli

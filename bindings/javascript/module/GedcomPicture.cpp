@@ -54,9 +54,9 @@ charts::ViewRequest requestOf(kin::Place focus) {
     OptionReader options;
     chart.focus = focus;
     chart.view = options.next<charts::View>();
-    setShown(request.layout, options.next<unsigned>());
-    request.layout.generations = options.next<int>();
-    request.layout.flagDepth = std::max(1, request.layout.generations - 1);
+    setShown(chart.layout, options.next<unsigned>());
+    chart.layout.generations = options.next<int>();
+    chart.layout.flagDepth = std::max(1, chart.layout.generations - 1);
     chart.to = options.next<kin::Place>() - 1;
     chart.up = options.next<int>();
     chart.down = options.next<int>();

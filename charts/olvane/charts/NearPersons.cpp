@@ -9,8 +9,7 @@
 #include <memory>
 #include <string>
 
-#include <olvane/boundary/FamilyViewLayout.h>
-#include <olvane/host/LayoutText.h>
+#include <olvane/boundary/TypedLayout.h>
 
 namespace olvane::charts {
 
@@ -67,12 +66,14 @@ private:
 
 }  // namespace
 
-std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus) {
-    const std::string text =
-        FamilyViewLayout(std::to_string(std::int64_t{focus} + 1), std::make_shared<GraphDataSource>(graph));
+std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus, LayoutOptions options) {
+    options.sizes = familyTreeSize();
+    options.withText = false;
+    const TypedLayout layout =
+        familyLayout(std::int64_t{focus} + 1, std::make_shared<GraphDataSource>(graph), options);
     std::vector<kin::Place> persons;
-    for (const LayoutRecord& record : readWholeRecords(text).records) {
-        if (record.id > 0) persons.push_back(static_cast<kin::Place>(record.id - 1));
+    for (const TypedLayout::Box& box : layout.boxes) {
+        if (box.id > 0) persons.push_back(static_cast<kin::Place>(box.id - 1));
     }
     std::sort(persons.begin(), persons.end());
     persons.erase(std::unique(persons.begin(), persons.end()), persons.end());

@@ -9,7 +9,8 @@
 
 namespace olvane::charts {
 
-// Whom the engine's family view shows of a family, each once. Boxes for unknown parents are no persons.
-std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus);
+// Whom the engine's family view shows of a family with these options, each once. Boxes for unknown parents are no
+// persons. Sizes are of no effect.
+std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus, LayoutOptions options);
 
 }  // namespace olvane::charts

@@ -137,7 +137,7 @@ const auto kAdmitAll = [](kin::Place) { return true; };
 
 Selection selectPersons(const kin::KinGraph& graph, const ChartRequest& request) {
     if (request.view == View::near) {
-        return selectionOf(graph, request.focus, nearPersons(graph, request.focus));
+        return selectionOf(graph, request.focus, nearPersons(graph, request.focus, request.layout));
     }
     Selector selector(graph, request.focus);
     if (request.view != View::descendants) selector.addAncestors(request.up, kAdmitAll);

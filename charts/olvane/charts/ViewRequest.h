@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <span>
 
+#include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/KinGraph.h>
 
 namespace olvane::charts {
@@ -60,10 +61,12 @@ struct ChartRequest {
     Direction direction = Direction::down;
     ChartSizes sizes;
     std::span<const BoxSize> boxSizes;
+    // Family, pedigree: the engine's own options, but for the sizes; near: which relatives are shown.
+    LayoutOptions layout;
     bool spouses = true;    // descendants, hourglass, relatives, fan of descendants
     bool siblings = false;  // ancestors, hourglass: the siblings of the focus and of its ancestors
-    bool compact =
-        false;  // generations packed tighter: parents need not stand over the middle of their children
+    // Trees: generations packed tighter. Parents need not stand over the middle of their children.
+    bool compact = false;
 
     FanOf fanOf = FanOf::ancestors;
     double fanAngle = 360;  // degrees, 90 to 360

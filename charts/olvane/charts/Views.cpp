@@ -12,7 +12,7 @@ namespace olvane::charts {
 namespace {
 
 LayoutOptions layoutOptionsOf(const ViewRequest& request) {
-    LayoutOptions options = request.layout;
+    LayoutOptions options = request.chart.layout;
     const ChartSizes& sizes = request.chart.sizes;
     options.sizes.nodeWidth = sizes.boxWidth;
     options.sizes.nodeHeight = sizes.boxHeight;

@@ -7,16 +7,13 @@
 
 #include <olvane/Export.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
-#include <olvane/boundary/TypedLayout.h>
 #include <olvane/charts/Charts.h>
 
 namespace olvane::charts {
 
-// What picture to make, of any view. chart.view says which; the family view and the pedigree take their options
-// from layout, and their sizes, like all others, from chart.sizes.
+// What picture to make, of any view: chart.view says which.
 struct ViewRequest {
     ChartRequest chart;
-    LayoutOptions layout;
     bool unknownParents = true;  // family, pedigree: parents who are not known have boxes of their own
 };
 

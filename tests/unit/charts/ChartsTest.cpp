@@ -299,6 +299,32 @@ TEST(Near, showsThePersonsOfTheFamilyView) {
     EXPECT_EQ(drawn.faults(), 0U);
 }
 
+TEST(Near, leavesOutTheRelativesThatAreSwitchedOff) {
+    const KinFamily family{"Opa + Oma: Onkel.m Vater.m", "Vater + Mutter: Ich.m Bruder.m",
+                           "Ich + Frau: Kind.m", "Onkel + Tante: Vetter.m", "Kind + Braut: Enkel.m"};
+    ChartRequest request = requestFor(View::near, family["Ich"]);
+    const auto isShown = [&](const std::string& name) {
+        try {
+            (void)Drawn(family, request)[name];
+            return true;
+        } catch (const std::out_of_range&) {
+            return false;
+        }
+    };
+    for (const auto& [name, relatives] : {std::pair{"Vetter", &olvane::LayoutOptions::cousins},
+                                          std::pair{"Onkel", &olvane::LayoutOptions::auntsUncles},
+                                          std::pair{"Bruder", &olvane::LayoutOptions::siblings},
+                                          std::pair{"Braut", &olvane::LayoutOptions::spousesOfChildren},
+                                          std::pair{"Enkel", &olvane::LayoutOptions::grandchildren}}) {
+        EXPECT_TRUE(isShown(name)) << name;
+        request.layout.*relatives = false;
+        EXPECT_FALSE(isShown(name)) << name;
+        EXPECT_TRUE(isShown("Vater"));
+        EXPECT_EQ(Drawn(family, request).faults(), 0U) << name;
+        request.layout.*relatives = true;
+    }
+}
+
 TEST(KinshipChart, showsTheWaysBetweenTwoPersonsAndNobodyElse) {
     const KinFamily family{"Opa + Oma: Vater.m Onkel.m Tante.f", "Vater + Mutter: Ich.m Bruder.m",
                            "Onkel + Frau: Vetter.m"};

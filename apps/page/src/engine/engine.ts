@@ -12,7 +12,8 @@ export interface EmbeddedFamily {
     readonly title: string;
     /** The number of a person, from 1; 0 for the page's own choice. */
     readonly focus: number;
-    readonly view: string;
+    /** What the page opens with, as addressOf writes it; empty for what is usual. */
+    readonly address: string;
     readonly livingHidden: boolean;
     /** On the file that the family was read from; the text in the page is another. Null where nobody stored. */
     readonly remarks: readonly Diagnostic[] | null;
@@ -28,13 +29,13 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
     const text = document.getElementById("olvane-family")?.textContent;
     if (!text) return null;
     const stored = JSON.parse(text) as Partial<
-        Record<"name" | "title" | "focus" | "view" | "livingHidden" | "remarks" | "gzip", unknown>
+        Record<"name" | "title" | "focus" | "address" | "livingHidden" | "remarks" | "gzip", unknown>
     >;
     return {
         name: String(stored.name ?? "family.ged"),
         title: String(stored.title ?? ""),
         focus: Number(stored.focus) || 0,
-        view: String(stored.view ?? ""),
+        address: String(stored.address ?? ""),
         livingHidden: stored.livingHidden === true,
         remarks: Array.isArray(stored.remarks) ? (stored.remarks as Diagnostic[]) : null,
         bytes: await gunzip(bytesOfBase64(String(stored.gzip ?? ""))),

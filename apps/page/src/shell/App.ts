@@ -107,11 +107,10 @@ export class App implements ChromeActions {
         this.tree.setFamily(family);
         document.title = title;
         this.arrange();
-        const usual: ViewState = {
+        const usual = readAddress(embedded?.address ?? "", family.persons, {
             ...kUsualState,
             focus: family.person(embedded?.focus ?? 0)?.id ?? family.bestFocus(),
-            view: kViewNames.find((name) => name === embedded?.view) ?? "family",
-        };
+        });
         const address = isLinked ? location.hash : "";
         const state = readAddress(address, family.persons, usual);
         this.journey.begin(addressOf(state, family.persons), embedded !== null);
