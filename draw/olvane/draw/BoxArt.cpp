@@ -8,16 +8,22 @@
 #include <olvane/draw/BoxArtInternal.h>
 
 #include <algorithm>
-#include <array>
 #include <string_view>
 #include <vector>
 
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/draw/TextFitInternal.h>
+#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
+
+using picture::cleanText;
+using picture::cutText;
+using picture::fitLine;
+using picture::Font;
+using picture::runsRightToLeft;
+using picture::textWidth;
 
 // All in px.
 constexpr double kInset = 7;  // from the border to any text
@@ -29,7 +35,9 @@ constexpr double kBadgeHeight = 15;
 constexpr double kBadgeSize = 10;
 constexpr double kBadgeInset = 6;
 constexpr double kFocusBorder = 4;
-constexpr std::array<double, 4> kNameSizes = {13, 12, 11, 10};
+constexpr double kNameGap = 3;           // between lines of a name
+constexpr double kLeastNameHeight = 26;  // two lines of the smallest letters
+constexpr std::size_t kMostNameLines = 8;
 
 bool isWide(const BoxFrame& box) {
     return box.width > box.height;
@@ -52,53 +60,9 @@ TextRoom textRoomOf(const BoxFrame& box) {
     return {box.width / 2, box.width - 2 * kInset, 55, box.height - 6, true};
 }
 
-struct NameLine {
-    std::string text;
-    bool isSurname = false;
-};
-
-struct NameBlock {
-    std::vector<NameLine> lines;
-    double size = 0;
-    double pitch() const { return size + 3; }
-    double height() const { return static_cast<double>(lines.size()) * pitch(); }
-};
-
-void appendFitted(NameBlock& block, const FittedText& fitted, bool isSurname) {
-    for (const std::string& line : fitted.lines) block.lines.push_back({line, isSurname});
-}
-
-// Both names at one size; whole says that nothing was cut.
-struct NameTrial {
-    NameBlock block;
-    bool whole = false;
-};
-
-NameTrial tryNameSize(const PersonLabel& label, double size, const TextRoom& room, double height) {
-    const std::string given = cleanText(label.given);
-    const std::string surname = cleanText(label.surname);
-    const Font font{size, true};
-    NameTrial trial;
-    trial.block.size = size;
-    const auto most = static_cast<std::size_t>(std::max(2.0, height / trial.block.pitch()));
-    const std::size_t surnameNeeds = fitText(surname, font, room.width, most).lines.size();
-    const std::size_t reserved =
-        surname.empty() ? 0 : std::min<std::size_t>(surnameNeeds, std::max<std::size_t>(1, most / 2));
-    const FittedText first = fitText(given, font, room.width, most - reserved);
-    const FittedText second = fitText(surname, font, room.width, most - first.lines.size());
-    trial.whole = !first.shortened && !first.wordBroken && !second.shortened && !second.wordBroken;
-    appendFitted(trial.block, label.surnameFirst ? second : first, label.surnameFirst);
-    appendFitted(trial.block, label.surnameFirst ? first : second, !label.surnameFirst);
-    return trial;
-}
-
-NameBlock nameBlockOf(const PersonLabel& label, const TextRoom& room, double height) {
-    NameTrial trial;
-    for (const double size : kNameSizes) {
-        trial = tryNameSize(label, size, room, height);
-        if (trial.whole) return trial.block;
-    }
-    return trial.block;
+picture::FittedName nameOf(const PersonLabel& label, const TextRoom& room, double height) {
+    return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst,
+                            {room.width, std::max(height, kLeastNameHeight), kNameGap, kMostNameLines});
 }
 
 std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& room) {
@@ -118,7 +82,7 @@ std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& r
 std::vector<std::string> factLinesOf(const PersonLabel& label, const TextRoom& room) {
     const Font font{kYearsSize, false};
     std::vector<std::string> lines = yearLinesOf(label, room);
-    const double spare = room.bottom - room.top - 2 * (kNameSizes.back() + 3);
+    const double spare = room.bottom - room.top - kLeastNameHeight;
     const auto most = static_cast<std::size_t>(std::max(0.0, spare / kYearsPitch));
     for (const std::string& detail : label.details) {
         if (lines.size() >= most) break;
@@ -140,14 +104,14 @@ std::string anchorAttribute(const TextRoom& room, std::string_view text) {
     return runsRightToLeft(text) ? " text-anchor=\"end\"" : "";
 }
 
-void appendNames(std::string& svg, const NameBlock& block, const TextRoom& room, double top,
+void appendNames(std::string& svg, const picture::FittedName& name, const TextRoom& room, double top,
                  const DrawingTheme& theme) {
-    double y = top + block.size;
-    for (const NameLine& line : block.lines) {
-        appendTextLine(svg, room.x, y, line.text,
-                       anchorAttribute(room, line.text) + " font-weight=\"bold\" font-size=\"" +
-                           px(block.size) + "\" fill=\"" + std::string(theme.text) + "\"");
-        y += block.pitch();
+    double y = top + name.size;
+    for (const std::string& line : name.lines) {
+        appendTextLine(svg, room.x, y, line,
+                       anchorAttribute(room, line) + " font-weight=\"bold\" font-size=\"" + px(name.size) +
+                           "\" fill=\"" + std::string(theme.text) + "\"");
+        y += name.size + kNameGap;
     }
 }
 
@@ -169,8 +133,9 @@ void appendTexts(std::string& svg, const BoxFrame& box, const PersonLabel& label
     const double namesBottom =
         room.bottom - kYearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : 2);
     const double namesHeight = namesBottom - room.top;
-    const NameBlock names = nameBlockOf(label, room, namesHeight);
-    appendNames(svg, names, room, room.top + std::max(0.0, (namesHeight - names.height()) / 2), theme);
+    const picture::FittedName names = nameOf(label, room, namesHeight);
+    const double used = static_cast<double>(names.lines.size()) * (names.size + kNameGap);
+    appendNames(svg, names, room, room.top + std::max(0.0, (namesHeight - used) / 2), theme);
     appendYears(svg, years, room, room.bottom - 3, theme);
 }
 

@@ -16,12 +16,17 @@
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/draw/TextFitInternal.h>
 #include <olvane/picture/Circle.h>
+#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
+
+using picture::cleanText;
+using picture::fitLine;
+using picture::runsRightToLeft;
+using picture::textWidth;
 
 using picture::Arc;
 using picture::Index;

@@ -10,11 +10,14 @@
 #include <utility>
 
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/draw/TextFitInternal.h>
+#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
+
+using picture::cleanText;
+using picture::cutText;
 
 using picture::Family;
 using picture::Line;

@@ -12,12 +12,18 @@
 #include <cstddef>
 
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/draw/TextFitInternal.h>
-#include <olvane/draw/TextMeasureInternal.h>
+#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
+
+using picture::cleanText;
+using picture::cutText;
+using picture::fitLine;
+using picture::Font;
+using picture::kFontFamilies;
+using picture::textWidth;
 
 constexpr double kPxOfMm = 96 / 25.4;
 constexpr double kMargin = 10 * kPxOfMm;  // printers leave as much white

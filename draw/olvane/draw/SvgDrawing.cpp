@@ -14,11 +14,17 @@
 #include <olvane/draw/FanArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/draw/TextFitInternal.h>
+#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
+
+using picture::cleanText;
+using picture::cutText;
+using picture::fitLine;
+using picture::Font;
+using picture::kFontFamilies;
 
 // All in px.
 constexpr int kMargin = 28;

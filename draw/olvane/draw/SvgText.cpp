@@ -7,13 +7,13 @@
 
 #include <cmath>
 
-#include <olvane/draw/TextMeasureInternal.h>
+#include <olvane/picture/TextMetrics.h>
 
 namespace olvane::draw {
 
 std::string escaped(std::string_view text) {
     std::string result;
-    for (const char c : cleanText(text)) {
+    for (const char c : picture::cleanText(text)) {
         switch (c) {
             case '&':
                 result += "&amp;";
@@ -44,14 +44,6 @@ std::string px(double value) {
     text += std::to_string(size / 10);
     if (size % 10 != 0) text += "." + std::to_string(size % 10);
     return text;
-}
-
-std::string cutText(std::string_view text) {
-    constexpr std::size_t kMostBytes = 1000;
-    if (text.size() <= kMostBytes) return std::string(text);
-    std::size_t end = kMostBytes;
-    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80) --end;
-    return std::string(text.substr(0, end)) + "\xE2\x80\xA6";
 }
 
 }  // namespace olvane::draw

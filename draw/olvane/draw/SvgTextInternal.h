@@ -15,8 +15,4 @@ std::string escaped(std::string_view text);
 // A number of px with at most one decimal, the same on every machine: "12", "-0.5".
 std::string px(double value);
 
-// A text of at most about a thousand bytes, cut between two characters, with an ellipsis: names in a file may be of
-// any length, and nobody reads more.
-std::string cutText(std::string_view text);
-
 }  // namespace olvane::draw

@@ -3,7 +3,7 @@
 # SPDX-License-Identifier: MIT
 """Writes FontAdvances.cpp: how far each character moves the pen, in hundredths of an em, rounded up.
 
-Usage: make_font_advances.py REGULAR.ttf BOLD.ttf > ../olvane/draw/FontAdvances.cpp
+Usage: make_font_advances.py REGULAR.ttf BOLD.ttf > ../olvane/picture/FontAdvances.cpp
 
 Reads the tables cmap (format 4 or 12), hhea, hmtx and head of a TrueType font. Any sans-serif font that is
 at least as wide as the others of the drawing's font list serves: what fits in it fits in the narrower ones.
@@ -89,11 +89,11 @@ def write_array(name, advances, first, last):
 def main():
     regular, bold = advances_of(sys.argv[1]), advances_of(sys.argv[2])
     print("// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n")
-    print("// Written by draw/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and")
+    print("// Written by picture/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and")
     print("// bold, in hundredths of an em, rounded up. A character of a block with 0 is not in the font.\n")
     print("// clang-format off\n")
-    print("#include <olvane/draw/FontAdvancesInternal.h>\n")
-    print("namespace olvane::draw {\n\nnamespace {\n")
+    print("#include <olvane/picture/FontAdvancesInternal.h>\n")
+    print("namespace olvane::picture {\n\nnamespace {\n")
     for first, last, _ in BLOCKS:
         write_array(f"kRegular{first:04X}", regular, first, last)
         write_array(f"kBold{first:04X}", bold, first, last)
@@ -102,7 +102,7 @@ def main():
         print(f"    {{0x{first:04X}, 0x{last:04X}, kRegular{first:04X}, kBold{first:04X}}},  // {title}")
     print("};\n\n}  // namespace\n")
     print("std::span<const FontBlock> fontBlocks() { return kBlocks; }\n")
-    print("}  // namespace olvane::draw")
+    print("}  // namespace olvane::picture")
 
 
 if __name__ == "__main__":

@@ -1,14 +1,14 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Written by draw/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and
+// Written by picture/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and
 // bold, in hundredths of an em, rounded up. A character of a block with 0 is not in the font.
 
 // clang-format off
 
-#include <olvane/draw/FontAdvancesInternal.h>
+#include <olvane/picture/FontAdvancesInternal.h>
 
-namespace olvane::draw {
+namespace olvane::picture {
 
 namespace {
 
@@ -237,4 +237,4 @@ constexpr FontBlock kBlocks[] = {
 
 std::span<const FontBlock> fontBlocks() { return kBlocks; }
 
-}  // namespace olvane::draw
+}  // namespace olvane::picture

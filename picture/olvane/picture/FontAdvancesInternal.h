@@ -6,7 +6,7 @@
 #include <cstdint>
 #include <span>
 
-namespace olvane::draw {
+namespace olvane::picture {
 
 // Pen advances of a run of characters, in hundredths of an em, rounded up; 0 for a character without a glyph.
 struct FontBlock {
@@ -18,4 +18,4 @@ struct FontBlock {
 
 std::span<const FontBlock> fontBlocks();
 
-}  // namespace olvane::draw
+}  // namespace olvane::picture
