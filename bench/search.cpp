@@ -13,7 +13,7 @@
 
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/kin/PersonIndex.h>
-#include <olvane/source/GedcomFamily.h>
+#include <olvane/source/GedcomSearchTexts.h>
 
 namespace {
 
@@ -28,10 +28,12 @@ double millisecondsSince(std::chrono::steady_clock::time_point start) {
 }
 
 void measure(const std::string& path) {
-    const olvane::Family family = olvane::gedcom::familyOf(olvane::gedcom::readGedcomFile(path));
+    olvane::gedcom::ReadOptions options;
+    options.facts = true;
+    const olvane::gedcom::GedcomData data = olvane::gedcom::readGedcomFile(path, options);
     const auto start = std::chrono::steady_clock::now();
-    const olvane::kin::PersonIndex index(family);
-    std::cout << path << "\t" << family.personCount() << " persons\tindex " << millisecondsSince(start)
+    const olvane::kin::PersonIndex index{olvane::gedcom::GedcomSearchTexts(data)};
+    std::cout << path << "\t" << data.personCount() << " persons\tindex " << millisecondsSince(start)
               << " ms\n";
     double worst = 0;
     for (const char* const text : kSearches) {

@@ -24,6 +24,7 @@
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomFamily.h>
 #include <olvane/source/GedcomKin.h>
+#include <olvane/source/GedcomSearchTexts.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "Holds.h"
@@ -149,13 +150,20 @@ void lookAtFamily(const GedcomData& data, FamilyId id) {
 
 void search(const GedcomData& data, const olvane::kin::PersonIndex& index, std::string_view text) {
     const auto all = index.find(text);
+    const GedcomSearchTexts texts(data);
     HOLDS(all.size() <= data.personCount());
-    for (const auto& hit : all) HOLDS(hit.id >= 1 && data.hasPerson(static_cast<PersonId>(hit.id)));
+    for (const auto& hit : all) {
+        HOLDS(hit.id >= 1 && data.hasPerson(static_cast<PersonId>(hit.id)));
+        for (const auto& reason : hit.reasons) {
+            const bool isIdentifier = reason.in == olvane::kin::FoundIn::identifier;
+            HOLDS(writtenReason(texts, hit, reason).text.empty() == isIdentifier);
+        }
+    }
     HOLDS(index.find(text, 1).size() == std::min<std::size_t>(all.size(), 1));
 }
 
 void searchForNames(const GedcomData& data) {
-    const olvane::kin::PersonIndex index(familyOf(data));
+    const olvane::kin::PersonIndex index{GedcomSearchTexts(data)};
     search(data, index, "anna b");
     search(data, index, "");
     const std::size_t searched = std::min(data.personCount(), kSearchedPersons);

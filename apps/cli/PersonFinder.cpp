@@ -6,25 +6,11 @@
 #include <charconv>
 #include <functional>
 
-#include <olvane/source/GedcomFamily.h>
+#include <olvane/source/GedcomSearchTexts.h>
 
 namespace olvane::cli {
 
 namespace {
-
-// The table has no places and no other facts; a search finds them where the file was read with them.
-void addFacts(const gedcom::GedcomData& data, Family& family) {
-    for (gedcom::PersonId id = 1; id <= data.personCount(); ++id) {
-        std::string places;
-        std::string values;
-        for (const gedcom::Fact& fact : data.factsOfPerson(id)) {
-            if (!fact.place.empty()) places += (places.empty() ? "" : "; ") + std::string(fact.place);
-            if (!fact.value.empty()) values += (values.empty() ? "" : "; ") + std::string(fact.value);
-        }
-        if (places.size() <= Family::kMostTextBytes && !places.empty()) family.setField(id, "places", places);
-        if (values.size() <= Family::kMostTextBytes && !values.empty()) family.setField(id, "facts", values);
-    }
-}
 
 std::vector<gedcom::PersonId> idsOf(const std::vector<kin::SearchHit>& hits,
                                     const std::function<bool(const kin::SearchHit&)>& isWanted) {
@@ -48,11 +34,7 @@ gedcom::PersonId PersonFinder::byIdentifier(const std::string& text) const {
 }
 
 const kin::PersonIndex& PersonFinder::index() {
-    if (!index_) {
-        Family family = gedcom::familyOf(data_);
-        addFacts(data_, family);
-        index_ = std::make_unique<kin::PersonIndex>(family);
-    }
+    if (!index_) index_ = std::make_unique<kin::PersonIndex>(gedcom::GedcomSearchTexts(data_));
     return *index_;
 }
 

@@ -7,6 +7,7 @@ import { FamilyError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { columnsOf } from "./familyColumns.mjs";
 import { chosenNumber, idNumber, refuse, storedText } from "./familyValues.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
+import { searchWith } from "./search.mjs";
 import { CHILD_KINDS, FAMILY_STATES, NAME_KINDS, SEXES, STATUSES, recordsFrom } from "./values.mjs";
 
 const EDITS = [
@@ -192,6 +193,14 @@ export class Family {
         const pointer = this.#instance.exports.family_copy(this.#opened()) >>> 0;
         if (pointer === 0) throw new OutOfMemory();
         return new Family(this.#instance, null, pointer);
+    }
+
+    search(text, limit = Infinity) {
+        return searchWith(this.#instance, text, limit, (pointer, most) => {
+            const json = this.#instance.exports.family_search(this.#opened(), pointer, most);
+            if (json === 0) throw new OutOfMemory();
+            return JSON.parse(this.#instance.text(json));
+        });
     }
 
     layout(focus, options = undefined) {

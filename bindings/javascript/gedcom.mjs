@@ -9,10 +9,11 @@ import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { pictureFrom } from "./picture.mjs";
 import { pictureNumbers } from "./pictureOptions.mjs";
+import { searchWith } from "./search.mjs";
 
 const SEXES = ["male", "female", "other"];
 const MARKS = ["exact", "about", "before", "after", "between"];
-const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other"];
+const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other", "step"];
 
 function dateFrom(values) {
     if (values === 0) return null;
@@ -97,6 +98,10 @@ export class GedcomFile {
 
     factsOfFamily(id) {
         return this.#answer("gedcom_family_facts", id).map(factFrom);
+    }
+
+    search(text, limit = Infinity) {
+        return searchWith(this.#instance, text, limit, (pointer, most) => this.#told("gedcom_search", pointer, most));
     }
 
     layout(focus, options = undefined) {

@@ -340,7 +340,7 @@ export interface Person {
 
 export interface ParentFamily {
     readonly family: number;
-    readonly pedigree: "notGiven" | "birth" | "adopted" | "foster" | "sealing" | "other";
+    readonly pedigree: "notGiven" | "birth" | "adopted" | "foster" | "sealing" | "other" | "step";
 }
 
 /** A family of a GEDCOM file. */
@@ -352,6 +352,41 @@ export interface GedcomFamily {
     readonly married: boolean;
     readonly divorced: boolean;
     readonly marriage: GedcomDate | null;
+}
+
+/** How a word of a search fits a word of the record; better ones come first. */
+export type SearchFit = "whole" | "begins" | "within" | "similar";
+
+/** Why a word of a search has found a person. */
+export interface SearchReason {
+    readonly foundIn:
+        | "identifier"
+        | "name"
+        | "nickname"
+        | "marriedName"
+        | "title"
+        | "birth"
+        | "death"
+        | "place"
+        | "other";
+    readonly fit: SearchFit;
+    /** Of the record, in small letters without accents; of an identifier as it was typed. */
+    readonly word: string;
+    /** What stands in the record there: "Kew, Surrey, England"; empty for an identifier. */
+    readonly text: string;
+    /** The word of it that was found, "Surrey"; of a date the whole. */
+    readonly written: string;
+    /** What the data call it: a tag of GEDCOM, the key of a field; empty for a name. */
+    readonly label: string;
+}
+
+/** A person whom a search has found. */
+export interface SearchHit {
+    readonly person: number;
+    /** Of the word that fits least. */
+    readonly fit: SearchFit;
+    /** One for each word of the search. */
+    readonly reasons: readonly SearchReason[];
 }
 
 /** Something wrong or odd in a file. */
@@ -377,6 +412,13 @@ export class GedcomFile {
     /** Everything that the file states of a person, in its order. */
     factsOfPerson(id: number): readonly Fact[];
     factsOfFamily(id: number): readonly Fact[];
+    /**
+     * Whom a text may mean, the best first. The words of the text stand in the record in any order: whole, as a beginning or,
+     * from three letters on, from the middle; where nobody is found so, with one letter wrong, missing, too many or
+     * exchanged. Case, accents and apostrophes do not count. "1819-1825" is any year of birth or death in it. The first search
+     * makes an index.
+     */
+    search(text: string, limit?: number): SearchHit[];
     /** As Olvane.layout, with the file as the host. Asks for a million relatives at most, and else is tooLarge. */
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;
@@ -522,6 +564,13 @@ export class Family {
     removeFamily(number: number): void;
     /** For undo: made at once, whatever the size, and changed on its own. */
     copy(): Family;
+    /**
+     * Whom a text may mean, the best first. The words of the text stand in the record in any order: whole, as a beginning or,
+     * from three letters on, from the middle; where nobody is found so, with one letter wrong, missing, too many or
+     * exchanged. Case, accents and apostrophes do not count. "1819-1825" is any year of birth or death in it. The first search
+     * after an edit makes an index.
+     */
+    search(text: string, limit?: number): SearchHit[];
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;
     /** Releases the memory; nothing can be asked afterwards. */

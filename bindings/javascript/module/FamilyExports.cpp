@@ -11,6 +11,7 @@
 #include <exception>
 #include <memory>
 #include <new>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -19,25 +20,38 @@
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/Family.h>
 #include <olvane/kin/FamilyDataSource.h>
+#include <olvane/kin/PersonIndex.h>
 
 #include <LayoutInternal.h>
 
 #include "JsonText.h"
 #include "LayoutAnswer.h"
+#include "SearchJson.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
 namespace {
 
-// A family, and itself as a data source, so that no layout makes one.
+// A family, with what is made of it when somebody first asks: itself as a data source, and its index.
 struct HeldFamily {
     Family table;
-    std::shared_ptr<OlvaneViewerManagerWrapProtocol> source;
+    std::shared_ptr<OlvaneViewerManagerWrapProtocol> source{};
+    std::optional<kin::PersonIndex> personIndex{};
 
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& asSource() {
         if (!source) source = std::make_shared<FamilyDataSource>(table);
         return source;
+    }
+
+    const kin::PersonIndex& index() {
+        if (!personIndex) personIndex.emplace(table);
+        return *personIndex;
+    }
+
+    void forgetWhatWasMade() {
+        source.reset();  // which shares the table's rows
+        personIndex.reset();
     }
 };
 
@@ -380,11 +394,11 @@ int familyTexts(ColumnsInMaking* columns, std::size_t column, const char* place,
 // 0 with the family in *family; 1 with an error in last_family_text; 2 for want of memory.
 OLVANE_EXPORT("family_create") int familyCreate(const ColumnsInMaking* columns, HeldFamily** family) {
     *family = nullptr;
-    return js::outcomeOf([&] { *family = new HeldFamily{Family(columns->columns), nullptr}; });
+    return js::outcomeOf([&] { *family = new HeldFamily{Family(columns->columns)}; });
 }
 
 OLVANE_EXPORT("family_copy") HeldFamily* familyCopy(const HeldFamily* family) {
-    return new (std::nothrow) HeldFamily{family->table, nullptr};
+    return new (std::nothrow) HeldFamily{family->table};
 }
 
 OLVANE_EXPORT("family_free") void familyFree(HeldFamily* family) {
@@ -397,7 +411,7 @@ OLVANE_EXPORT("last_family_text") const char* lastFamilyText() {
 
 OLVANE_EXPORT("family_edit")
 int familyEdit(HeldFamily* family, int edit, const double* numbers, std::size_t count, const char* texts) {
-    family->source.reset();  // which shares the table's rows
+    family->forgetWhatWasMade();
     return js::outcomeOf([&] {
         js::Values values(numbers, count, texts);
         js::change(family->table, static_cast<js::Edit>(edit), values);
@@ -439,6 +453,18 @@ OLVANE_EXPORT("family_person") const char* familyPerson(const HeldFamily* family
 OLVANE_EXPORT("family_family") const char* familyFamily(const HeldFamily* family, double number) {
     return js::jsonOrNull(
         [&](js::JsonText& json) { js::writeFamily(json, family->table, static_cast<std::int64_t>(number)); });
+}
+
+// The first search after an edit makes the index. Null for want of memory.
+OLVANE_EXPORT("family_search")
+const char* familySearch(HeldFamily* family, const char* text, std::size_t limit) {
+    try {
+        const kin::FamilySearchTexts texts(family->table);
+        js::lastText = js::searchJson(family->index(), texts, text, limit);
+        return js::lastText.c_str();
+    } catch (const std::exception&) {
+        return nullptr;
+    }
 }
 
 OLVANE_EXPORT("family_layout")

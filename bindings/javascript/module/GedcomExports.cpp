@@ -18,6 +18,7 @@
 #include "JsonText.h"
 #include "LayoutAnswer.h"
 #include "OpenFile.h"
+#include "SearchJson.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
@@ -200,6 +201,11 @@ OLVANE_EXPORT("gedcom_person_facts") const char* gedcomPersonFacts(const OpenFil
 
 OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFile* file, std::uint32_t id) {
     return js::toldOrRefused([&] { return js::factsText(file->data.factsOfFamily(id)); });
+}
+
+// The first search makes the index.
+OLVANE_EXPORT("gedcom_search") const char* gedcomSearch(OpenFile* file, const char* text, std::size_t limit) {
+    return js::toldOrRefused([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
 }
 
 OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {

@@ -9,23 +9,32 @@
 
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/kin/KinGraph.h>
+#include <olvane/kin/PersonIndex.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
+#include <olvane/source/GedcomSearchTexts.h>
 
 namespace olvane::js {
 
 // A GEDCOM file in the module's memory, with what is made of it when somebody first asks.
 struct OpenFile {
-    explicit OpenFile(gedcom::GedcomData read) : data(std::move(read)), source(data) {}
+    explicit OpenFile(gedcom::GedcomData read) : data(std::move(read)), source(data), searchTexts(data) {}
 
     const kin::KinGraph& kin() {
         if (!graph) graph = gedcom::kinGraphOf(data);
         return *graph;
     }
 
+    const kin::PersonIndex& index() {
+        if (!personIndex) personIndex.emplace(searchTexts);
+        return *personIndex;
+    }
+
     gedcom::GedcomData data;
     gedcom::GedcomDataSource source;
+    gedcom::GedcomSearchTexts searchTexts;
     std::optional<kin::KinGraph> graph;
+    std::optional<kin::PersonIndex> personIndex;
 };
 
 // Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for so many.

@@ -50,27 +50,29 @@ const char* foldedLetter(char32_t code) {
     return found != end && found->letter == code ? kFoldedLetters[found->folded] : nullptr;
 }
 
-// Also those that Unicode counts as letters.
+// Also those that Unicode counts as letters. Asked for letters beyond ASCII alone.
 bool isApostrophe(char32_t code) {
-    constexpr char32_t kApostrophes[] = {0x27,  0x60,  0xB4,  0x2B9,  0x2BB,  0x2BC,  0x2BD,
-                                         0x2BE, 0x2BF, 0x5F3, 0x2018, 0x2019, 0x201B, 0xFF07};
+    constexpr char32_t kApostrophes[] = {0xB4,  0x2B9, 0x2BB,  0x2BC,  0x2BD,  0x2BE,
+                                         0x2BF, 0x5F3, 0x2018, 0x2019, 0x201B, 0xFF07};
     return std::find(std::begin(kApostrophes), std::end(kApostrophes), code) != std::end(kApostrophes);
 }
 
+bool isAsciiWordLetter(char32_t code) {
+    return (code >= 'a' && code <= 'z') || (code >= 'A' && code <= 'Z') || (code >= '0' && code <= '9') ||
+           code == '\'' || code == '`';
+}
+
 bool isWordLetter(char32_t code) {
-    if (code < 0x80) {
-        return (code >= 'a' && code <= 'z') || (code >= 'A' && code <= 'Z') || (code >= '0' && code <= '9') ||
-               code == '\'' || code == '`';
-    }
-    return !isIn(code, kBetweenWords, kBetweenWordsCount);
+    return code < 0x80 ? isAsciiWordLetter(code) : !isIn(code, kBetweenWords, kBetweenWordsCount);
 }
 
 void appendFolded(std::string_view bytes, char32_t code, std::string& out) {
-    if (isApostrophe(code)) return;
     if (code < 0x80) {
-        out += static_cast<char>(code >= 'A' && code <= 'Z' ? code - 'A' + 'a' : code);
+        if (code != '\'' && code != '`')
+            out += static_cast<char>(code >= 'A' && code <= 'Z' ? code - 'A' + 'a' : code);
         return;
     }
+    if (isApostrophe(code)) return;
     if (code == kNoLetter || !isIn(code, kMarks, kMarkCount)) {
         const char* const folded = code == kNoLetter ? nullptr : foldedLetter(code);
         out += folded != nullptr ? std::string_view(folded) : bytes;

@@ -7,6 +7,7 @@
 #include <olvane/kin/PersonIndex.h>
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <numeric>
 
@@ -33,9 +34,9 @@ bool isNumber(std::string_view text) {
     return !text.empty() && std::all_of(text.begin(), text.end(), isDigit);
 }
 
-int numberOf(std::string_view text) {
+int yearOf(std::string_view digits) {
     int number = -1;
-    std::from_chars(text.data(), text.data() + text.size(), number);
+    std::from_chars(digits.data(), digits.data() + digits.size(), number);
     return number;
 }
 
@@ -76,9 +77,47 @@ Fit fitOf(std::string_view word, std::string_view term, bool findsSimilar, bool&
     return Fit::similar;
 }
 
-bool isPlace(std::string_view key) {
-    const std::string folded = foldedForSearch(key);
-    return folded.find("plac") != std::string::npos || folded.find("residence") != std::string::npos;
+// The first and the last of all numbers of three and four digits, in both forms of a date; 0 where there is none.
+struct YearRange {
+    int first = 0;
+    int last = 0;
+
+    void add(int year) {
+        if (year == 0) return;
+        first = first == 0 ? year : std::min(first, year);
+        last = std::max(last, year);
+    }
+};
+
+YearRange yearsOf(const SearchText& date) {
+    YearRange years;
+    const bool isBeforeChrist = !date.sorting.empty() && date.sorting.front() == '-';
+    for (const std::string_view text : {isBeforeChrist ? std::string_view() : date.sorting, date.text}) {
+        for (std::size_t at = 0; at < text.size();) {
+            std::size_t end = at;
+            while (end < text.size() && isDigit(text[end])) ++end;
+            const std::string_view digits = text.substr(at, end - at);
+            at = std::max(end, at + 1);
+            if (digits.size() == 3 || digits.size() == 4) years.add(yearOf(digits));
+        }
+    }
+    return years;
+}
+
+// Calls use(folded, written) with each word of a text. A word with an apostrophe is found without it, and by what stands
+// behind it.
+template <class Use>
+void forEachWord(std::string_view text, const Use& use) {
+    for (const FoldedWord& word : foldedWords(text)) {
+        use(word.folded, word.written);
+        for (const char* const apostrophe : {"'", "\u2019"}) {
+            const std::size_t at = word.written.find(apostrophe);
+            if (at == std::string_view::npos) continue;
+            const std::string_view written = word.written.substr(at + std::string_view(apostrophe).size());
+            const std::string behind = foldedForSearch(written);
+            if (!behind.empty()) use(behind, written);
+        }
+    }
 }
 
 }  // namespace
@@ -90,6 +129,11 @@ struct PersonIndex::Term {
     int lastYear = 0;
 };
 
+const char* nameOf(Fit fit) {
+    constexpr std::array kNames{"whole", "begins", "within", "similar"};
+    return kNames[static_cast<std::size_t>(fit)];
+}
+
 bool SearchHit::isByName() const {
     return std::all_of(reasons.begin(), reasons.end(), [](const SearchReason& reason) {
         const bool isName =
@@ -98,85 +142,56 @@ bool SearchHit::isByName() const {
     });
 }
 
-PersonIndex::PersonIndex(const Family& family) {
-    for (const FamilyId id : family.personIds()) {
-        addPerson(family, id, static_cast<std::uint32_t>(ids_.size()));
-        ids_.push_back(id);
+PersonIndex::PersonIndex(const Family& family) : PersonIndex(FamilySearchTexts(family)) {}
+
+PersonIndex::PersonIndex(const SearchTexts& texts) {
+    const std::size_t count = texts.personCount();
+    ids_.reserve(count);
+    for (std::uint32_t place = 0; place < count; ++place) {
+        ids_.push_back(texts.id(place));
+        texts.visit(place, [this, place](const SearchText& text) { add(text, place); });
     }
     arrange();
 }
 
-void PersonIndex::addPerson(const Family& family, std::int64_t id, std::uint32_t place) {
-    for (const NamePart& part : family.names(id)) {
-        const FoundIn in = part.kind == NameKind::nickname  ? FoundIn::nickname
-                           : part.kind == NameKind::married ? FoundIn::marriedName
-                           : part.kind == NameKind::prefix || part.kind == NameKind::suffix ? FoundIn::title
-                                                                                            : FoundIn::name;
-        addText(part.text, in, place);
+void PersonIndex::add(const SearchText& text, std::uint32_t place) {
+    if (text.isDate) return addYears(text, place);
+    if (text.in == FoundIn::identifier) {
+        if (!text.text.empty()) placeOfXref_.emplace(foldedForSearch(text.text), place);
+        return;
     }
-    const PersonRow row = family.person(id);
-    if (row.sex == Sex::female) {
-        for (const FamilyId spouse : family.spouses(id)) {
-            if (family.sex(spouse) != Sex::female)
-                addText(family.name(spouse, NameKind::surname), FoundIn::marriedName, place);
-        }
-    }
-    addYears(row.birth, row.birthWritten, FoundIn::birth, place);
-    addYears(row.death, row.deathWritten, FoundIn::death, place);
-    for (const LabelField& field : family.fields(id)) {
-        if (field.key == "xref") {
-            idOfXref_.emplace(foldedForSearch(field.text), id);
-        } else {
-            addText(field.text, isPlace(field.key) ? FoundIn::place : FoundIn::other, place);
-        }
-    }
+    for (const std::uint32_t number : wordsOf(text.text)) addWord(number, text.in, place);
 }
 
-// A word with an apostrophe is found without it, and by what stands behind it.
-void PersonIndex::addText(std::string_view text, FoundIn in, std::uint32_t place) {
-    for (const FoldedWord& word : foldedWords(text)) {
-        addWord(word.folded, in, place);
-        for (const char* const apostrophe : {"'", "\u2019"}) {
-            const std::size_t at = word.written.find(apostrophe);
-            if (at == std::string_view::npos) continue;
-            const std::string behind =
-                foldedForSearch(word.written.substr(at + std::string_view(apostrophe).size()));
-            if (!behind.empty()) addWord(behind, in, place);
-        }
-    }
-}
-
-// All numbers of three and four digits, in both forms of the date.
-void PersonIndex::addYears(std::string_view sorting, std::string_view written, FoundIn in,
-                           std::uint32_t place) {
-    Years years{place, in, 0, 0};
-    const bool isBeforeChrist = !sorting.empty() && sorting.front() == '-';
-    for (const std::string_view text : {isBeforeChrist ? std::string_view() : sorting, written}) {
-        for (std::size_t at = 0; at < text.size();) {
-            std::size_t end = at;
-            while (end < text.size() && isDigit(text[end])) ++end;
-            const std::string_view digits = text.substr(at, end - at);
-            at = std::max(end, at + 1);
-            if (digits.size() != 3 && digits.size() != 4) continue;
-            const int year = numberOf(digits);
-            if (year == 0) continue;
-            years.first = years.first == 0 ? year : std::min(years.first, year);
-            years.last = std::max(years.last, year);
-        }
-    }
+void PersonIndex::addYears(const SearchText& date, std::uint32_t place) {
+    const YearRange years = yearsOf(date);
     if (years.first == 0) return;
-    years_.push_back(years);
-    addWord(std::to_string(years.first), in, place);
-    if (years.last != years.first) addWord(std::to_string(years.last), in, place);
+    years_.push_back({place, date.in, years.first, years.last});
+    addWord(numberOf(std::to_string(years.first)), date.in, place);
+    if (years.last != years.first) addWord(numberOf(std::to_string(years.last)), date.in, place);
 }
 
-void PersonIndex::addWord(const std::string& word, FoundIn in, std::uint32_t place) {
+const std::vector<std::uint32_t>& PersonIndex::wordsOf(std::string_view text) {
+    const auto [found, isNew] = wordsOfTexts_.try_emplace(std::string(text));
+    std::vector<std::uint32_t>& numbers = found->second;
+    if (isNew) {
+        forEachWord(text,
+                    [&](const std::string& word, std::string_view) { numbers.push_back(numberOf(word)); });
+    }
+    return numbers;
+}
+
+std::uint32_t PersonIndex::numberOf(const std::string& word) {
     const auto [found, isNew] = wordNumbers_.emplace(word, static_cast<std::uint32_t>(words_.size()));
     if (isNew) {
         words_.push_back(word);
         entries_.emplace_back();
     }
-    std::vector<Entry>& entries = entries_[found->second];
+    return found->second;
+}
+
+void PersonIndex::addWord(std::uint32_t number, FoundIn in, std::uint32_t place) {
+    std::vector<Entry>& entries = entries_[number];
     if (!entries.empty() && entries.back().person == place) {
         entries.back().in = std::min(entries.back().in, in);
     } else {
@@ -199,7 +214,8 @@ void PersonIndex::arrange() {
     }
     words_ = std::move(words);
     entries_ = std::move(entries);
-    wordNumbers_.clear();
+    wordNumbers_ = {};
+    wordsOfTexts_ = {};
 }
 
 // "1819-1825" and "1819–1825" are one term.
@@ -216,13 +232,13 @@ std::vector<PersonIndex::Term> PersonIndex::termsOf(std::string_view text) const
                                  (joint.ends_with("-") || joint.ends_with("\u2013")) &&
                                  !joint.ends_with(" -");
             if (isRange) {
-                before.lastYear = numberOf(word.folded);
+                before.lastYear = yearOf(word.folded);
                 if (before.lastYear < before.firstYear) std::swap(before.firstYear, before.lastYear);
                 before.word += "-" + word.folded;
                 continue;
             }
         }
-        const int year = isYear ? numberOf(word.folded) : 0;
+        const int year = isYear ? yearOf(word.folded) : 0;
         const auto isSame = [&word](const Term& term) { return term.word == word.folded; };
         if (std::none_of(terms.begin(), terms.end(), isSame)) terms.push_back({word.folded, year, year});
         if (terms.size() == kMostTerms) break;
@@ -276,6 +292,7 @@ std::vector<SearchHit> PersonIndex::findTerms(const std::vector<Term>& terms, bo
     for (std::size_t i = 0; i < count; ++i) {
         const std::uint32_t person = order[i].second;
         hits[i].id = ids_[person];
+        hits[i].place = person;
         for (std::size_t term = 0; term < terms.size(); ++term) {
             const Best& each = best[term][person];
             const auto fit = static_cast<Fit>(each.cost / kCostOfFit);
@@ -287,34 +304,64 @@ std::vector<SearchHit> PersonIndex::findTerms(const std::vector<Term>& terms, bo
     return hits;
 }
 
-// 0 for nobody.
-std::int64_t PersonIndex::findIdentifier(std::string_view text) const {
+std::uint32_t PersonIndex::findIdentifier(std::string_view text) const {
     std::string_view xref = trimmed(text);
     if (xref.size() > 2 && xref.front() == '@' && xref.back() == '@') xref = xref.substr(1, xref.size() - 2);
-    const auto found = idOfXref_.find(foldedForSearch(xref));
-    if (found != idOfXref_.end()) return found->second;
-    if (!isNumber(xref) || xref.size() > 10) return 0;
+    const auto found = placeOfXref_.find(foldedForSearch(xref));
+    if (found != placeOfXref_.end()) return found->second;
+    if (!isNumber(xref) || xref.size() > 10) return kNobodyHere;
     std::int64_t number = 0;
     std::from_chars(xref.data(), xref.data() + xref.size(), number);
-    return std::find(ids_.begin(), ids_.end(), number) != ids_.end() ? number : 0;
+    const auto id = std::find(ids_.begin(), ids_.end(), number);
+    return id != ids_.end() ? static_cast<std::uint32_t>(id - ids_.begin()) : kNobodyHere;
 }
 
 std::vector<SearchHit> PersonIndex::find(std::string_view text, std::size_t limit) const {
     std::vector<SearchHit> hits;
     if (limit == 0) return hits;
-    const std::int64_t byIdentifier = findIdentifier(text);
-    if (byIdentifier != 0) {
+    const std::uint32_t byIdentifier = findIdentifier(text);
+    if (byIdentifier != kNobodyHere) {
         const SearchReason reason{FoundIn::identifier, Fit::whole, std::string(trimmed(text))};
-        hits.push_back({byIdentifier, Fit::whole, {reason}});
+        hits.push_back({ids_[byIdentifier], byIdentifier, Fit::whole, {reason}});
     }
     const std::vector<Term> terms = termsOf(text);
     if (terms.empty()) return hits;
     std::vector<SearchHit> byWords = findTerms(terms, false, limit);
     if (byWords.empty() && hits.empty()) byWords = findTerms(terms, true, limit);
     for (SearchHit& hit : byWords) {
-        if (hits.size() < limit && hit.id != byIdentifier) hits.push_back(std::move(hit));
+        if (hits.size() < limit && hit.place != byIdentifier) hits.push_back(std::move(hit));
     }
     return hits;
+}
+
+namespace {
+
+// The word of a text, as it is written, that a reason has found; empty where it is another text.
+std::string_view foundWord(const SearchText& text, const SearchReason& reason) {
+    std::string_view found;
+    forEachWord(text.text, [&](const std::string& word, std::string_view written) {
+        if (found.empty() && word == reason.word) found = written;
+    });
+    return found;
+}
+
+bool holdsYears(const SearchText& date, const YearRange& wanted) {
+    const YearRange years = yearsOf(date);
+    return years.first != 0 && wanted.first != 0 && years.first <= wanted.last && years.last >= wanted.first;
+}
+
+}  // namespace
+
+WrittenReason writtenReason(const SearchTexts& texts, const SearchHit& hit, const SearchReason& reason) {
+    const YearRange wanted = yearsOf({reason.in, reason.word, {}, true, {}});
+    WrittenReason found;
+    texts.visit(hit.place, [&](const SearchText& text) {
+        if (!found.text.empty() || text.in != reason.in || text.in == FoundIn::identifier) return;
+        const std::string_view word = text.isDate ? text.text : foundWord(text, reason);
+        if (word.empty() || (text.isDate && !holdsYears(text, wanted))) return;
+        found = {std::string(text.text), std::string(word), std::string(text.label)};
+    });
+    return found;
 }
 
 }  // namespace olvane::kin

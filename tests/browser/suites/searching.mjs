@@ -3,10 +3,11 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
+import { gedcom } from "../support/families.mjs";
 
 async function found(visit) {
-    return visit.page.$$eval("#search-list [role=option] bdi", (names) => names.map((name) => name.textContent));
+    return visit.page.$$eval("#search-list [role=option] bdi.name", (names) => names.map((name) => name.textContent));
 }
 
 describe("searching", kTwoAtOnce, () => {
@@ -20,6 +21,40 @@ describe("searching", kTwoAtOnce, () => {
         await visit.still();
         assert.equal(await visit.focus(), "I90");
         assert.ok(!(await visit.page.isVisible("#search-list")));
+        await visit.end();
+    });
+
+    test("the list says what was found where, and marks it in the name", async () => {
+        const visit = await visitDarwins();
+        const reasons = () => visit.page.$$eval("#search-list .why", (lines) => [...new Set(lines.map((line) => line.textContent))]);
+        const marks = () => visit.page.$$eval("#search-list bdi.name mark", (parts) => [...new Set(parts.map((part) => part.textContent))]);
+        await visit.page.fill("#search", "emma darwin 1808");
+        assert.deepEqual(await found(visit), ["Emma Wedgwood"], "a wife is found by her husband's surname");
+        assert.deepEqual(await reasons(), ["Married name: Darwin"]);
+        assert.deepEqual(await marks(), ["Emma"]);
+        await visit.page.fill("#search", "edgwoo emma 1808");
+        assert.deepEqual(await found(visit), ["Emma Wedgwood"], "words are found from the middle");
+        assert.deepEqual(await reasons(), []);
+        await visit.page.fill("#search", "wegdwood emma 1808");
+        assert.deepEqual(await found(visit), ["Emma Wedgwood"], "two letters are exchanged");
+        assert.deepEqual(await reasons(), ["Similar name: Emma Wedgwood"]);
+        await visit.end();
+    });
+
+    test("places, titles and facts are found, and named as the record names them", async () => {
+        const lines = ["0 @I1@ INDI", "1 NAME Ada /Byron/", "2 NICK Countess", "1 SEX F", "1 BIRT", "2 DATE 1815"];
+        lines.push("2 PLAC Marylebone,,London", "1 TITL Lady Lovelace", "1 OCCU Mathematician");
+        const visit = await visitFamily(gedcom(...lines), { name: "ada.ged" });
+        const reasonOf = async (text) => {
+            await visit.page.fill("#search", text);
+            return visit.page.$$eval("#search-list .why", (found) => found.map((line) => line.textContent));
+        };
+        assert.deepEqual(await reasonOf("london marylebone"), ["Birth: Marylebone, London"]);
+        assert.deepEqual(await reasonOf("lovelace"), ["Title: Lady Lovelace"]);
+        assert.deepEqual(await reasonOf("matematician"), ["Occupation: Mathematician"]);
+        assert.deepEqual(await reasonOf("countess"), ["Nickname: Countess"]);
+        assert.deepEqual(await reasonOf("@I1@"), ["Record: I1"]);
+        await photograph(visit, "search-reasons");
         await visit.end();
     });
 

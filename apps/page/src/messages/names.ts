@@ -52,6 +52,12 @@ function textOf(date: GedcomDate, month: number, day: number, mark: DateMark, me
     return dates.marked(mark, dates.day(date.year, 0, 0), dates.day(date.lastYear, 0, 0));
 }
 
+/** "Kew,,,England" is "Kew, England". */
+export function placeText(place: string): string {
+    const parts = place.split(",").map((part) => part.trim());
+    return parts.filter((part) => part !== "").join(", ");
+}
+
 // Hebrew, Arabic, Syriac, Thaana, N'Ko and their neighbours, the forms for printing, the old scripts of the east,
 // and the two marks of direction themselves.
 const kRightToLeft = /[\u0590-\u08ff\u200f\ufb1d-\ufdff\ufe70-\ufeff\u{10800}-\u{10fff}\u{1e800}-\u{1efff}]/u;

@@ -25,6 +25,14 @@ export const uiGerman: UiMessages = {
         none: "Niemand gefunden",
         count: (n) => (n === 1 ? "1 Person gefunden" : `${n} Personen gefunden`),
         first: (n) => `die ersten ${n}; weitertippen führt zu anderen`,
+        similar: "Ähnlicher Name",
+        foundIn: {
+            identifier: "Datensatz",
+            name: "Auch genannt",
+            nickname: "Rufname",
+            marriedName: "Ehename",
+            title: "Titel",
+        },
     },
     views: {
         label: "Ansichten",

@@ -23,6 +23,14 @@ export const uiEnglish: UiMessages = {
         none: "Nobody found",
         count: (n) => (n === 1 ? "1 person found" : `${n} persons found`),
         first: (n) => `the first ${n}; type on to find others`,
+        similar: "Similar name",
+        foundIn: {
+            identifier: "Record",
+            name: "Also called",
+            nickname: "Nickname",
+            marriedName: "Married name",
+            title: "Title",
+        },
     },
     views: {
         label: "Views",

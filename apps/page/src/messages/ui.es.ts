@@ -23,6 +23,14 @@ export const uiSpanish: UiMessages = {
         none: "No se encontró a nadie",
         count: (n) => (n === 1 ? "1 persona encontrada" : `${n} personas encontradas`),
         first: (n) => `las primeras ${n}; siga escribiendo para encontrar otras`,
+        similar: "Nombre parecido",
+        foundIn: {
+            identifier: "Registro",
+            name: "También llamado",
+            nickname: "Apodo",
+            marriedName: "Apellido de casada",
+            title: "Título",
+        },
     },
     views: {
         label: "Vistas",

@@ -26,6 +26,10 @@ export interface UiMessages {
         readonly none: string;
         readonly count: (n: number) => string;
         readonly first: (n: number) => string;
+        /** Before a name that is written in another way. */
+        readonly similar: string;
+        /** What a word was found in, where no fact names it. */
+        readonly foundIn: Readonly<Record<"identifier" | "name" | "nickname" | "marriedName" | "title", string>>;
     };
     readonly views: { readonly label: string } & Readonly<Record<ViewName, string>>;
     readonly depth: { readonly up: string; readonly down: string; readonly all: string };

@@ -29,6 +29,7 @@ import { Chrome, type ChromeActions } from "./Chrome";
 import { fileInput, takeDrops } from "./dropping";
 import { FileOpening, type OpenedFile } from "./FileOpening";
 import { Journey } from "./Journey";
+import type { Found } from "./searchReasons";
 import { Theme, type ThemeChoice } from "./theme";
 import { Welcome } from "./Welcome";
 
@@ -305,8 +306,10 @@ export class App implements ChromeActions {
 
     // --- the search's questions ---
 
-    find(text: string, limit: number): readonly Person[] {
-        return this.tree.family?.index.find(text, limit) ?? [];
+    find(text: string, limit: number): readonly Found[] {
+        const { family } = this.tree;
+        if (!family) return [];
+        return family.file.search(text, limit).map((hit) => ({ person: family.person(hit.person)!, hit }));
     }
 
     nameOf(person: Person): string {

@@ -1,18 +1,20 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Finds persons by name and year while one types. The keys stay in the field; the list below is walked with
+// Finds persons while one types, by all that is in their records, and says what was found where. The keys stay in the field; the list below is walked with
 // arrows.
 
 import type { Person } from "olvane";
 import type { UiMessages } from "../messages/ui";
-import { html, isolated, onClick } from "../base/dom";
+import { html, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
+import { messagesFor } from "../messages";
+import { type Found, marked, reasonLines, wordsInName } from "./searchReasons";
 
 const kMostFound = 30;
 
 export interface SearchSource {
-    find(text: string, limit: number): readonly Person[];
+    find(text: string, limit: number): readonly Found[];
     nameOf(person: Person): string;
     yearsOf(person: Person): string;
     kinshipOf(person: Person): string;
@@ -24,7 +26,7 @@ export class SearchBox {
     readonly input: HTMLInputElement;
     private readonly list: HTMLUListElement;
     private readonly status: HTMLElement;
-    private found: readonly Person[] = [];
+    private found: readonly Found[] = [];
     private current = -1;
 
     constructor(
@@ -86,7 +88,7 @@ export class SearchBox {
         if (name === "ArrowUp") return this.move(-1);
         if (name === "Enter") {
             if (this.list.hidden) this.look();
-            return this.choose(this.found[Math.max(0, this.current)]);
+            return this.choose(this.found[Math.max(0, this.current)]?.person);
         }
         if (name !== "Escape") return false;
         if (this.list.hidden) this.input.value = "";
@@ -120,7 +122,7 @@ export class SearchBox {
         this.found = found.slice(0, kMostFound);
         const areMore = found.length > kMostFound;
         const { search } = this.messages;
-        this.list.replaceChildren(...this.found.map((person, i) => this.option(person, i)));
+        this.list.replaceChildren(...this.found.map((found, i) => this.option(found, i)));
         if (this.found.length === 0) this.list.append(this.remark(search.none));
         if (areMore) this.list.append(this.remark(search.first(kMostFound)));
         this.list.hidden = false;
@@ -139,8 +141,9 @@ export class SearchBox {
         return html("li", { class: "none", role: "option", "aria-disabled": "true" }, text);
     }
 
-    private option(person: Person, index: number): HTMLLIElement {
-        const { source } = this;
+    private option(found: Found, index: number): HTMLLIElement {
+        const { source, messages } = this;
+        const { person } = found;
         const option = html(
             "li",
             { id: "found-" + index, role: "option", "data-person-id": person.id },
@@ -148,8 +151,9 @@ export class SearchBox {
             html(
                 "span",
                 { class: "who" },
-                isolated(source.nameOf(person)),
+                html("bdi", { class: "name" }, ...marked(source.nameOf(person), wordsInName(found))),
                 html("span", { class: "kin" }, source.kinshipOf(person)),
+                ...reasonLines(found, messages, messagesFor(messages.language)),
             ),
             html("span", { class: "years" }, source.yearsOf(person)),
         );

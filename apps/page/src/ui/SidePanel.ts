@@ -8,7 +8,7 @@
 import type { Fact, GedcomFamily as Family, Person } from "olvane";
 import { factLabel, type Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { dateText, nameOf, yearsOf } from "../messages/names";
+import { dateText, nameOf, placeText, yearsOf } from "../messages/names";
 import type { OpenFamily } from "../view/OpenFamily";
 import { html, isolated, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
@@ -278,10 +278,4 @@ export class SidePanel {
         });
         return link;
     }
-}
-
-// "Kew,,,England" is "Kew, England".
-function placeText(place: string): string {
-    const parts = place.split(",").map((part) => part.trim());
-    return parts.filter((part) => part !== "").join(", ");
 }

@@ -5,14 +5,12 @@
 
 import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
 import { allKinships, type Kinship } from "../kinship";
-import { PersonIndex } from "../search";
 import { Picture } from "./Picture";
 import { optionsOf, type ViewState } from "./ViewState";
 
 export class OpenFamily {
     readonly persons: readonly Person[];
     readonly families: readonly Family[];
-    readonly index: PersonIndex;
     private kinships: ReadonlyMap<number, Kinship> | null = null;
     private kinshipFocus = 0;
 
@@ -23,7 +21,6 @@ export class OpenFamily {
     ) {
         this.persons = file.persons;
         this.families = file.families;
-        this.index = new PersonIndex(this.persons);
     }
 
     person(id: number): Person | undefined {

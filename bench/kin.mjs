@@ -1,0 +1,66 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// node kin.mjs OLVANE.WASM FILE...: how long searches take in the module, as bench_search prints it for the library. A
+// search's time is the least of five.
+
+import { readFile } from "node:fs/promises";
+
+import { loadOlvane } from "../bindings/javascript/olvane.mjs";
+
+const kRounds = 5;
+const kShown = 30;
+const kSearches = [
+    "a",
+    "surname1",
+    "victoria",
+    "albert of",
+    "surname1 given2",
+    "urnam",
+    "victorai",
+    "given20x",
+    "1819",
+    "1819-1825",
+    "I17",
+    "17",
+    "nobodyatall",
+    "of saxe co",
+    "elisabeth 18",
+];
+
+const [module, ...paths] = process.argv.slice(2);
+if (paths.length === 0) throw new Error("usage: node kin.mjs OLVANE.WASM FILE...");
+const olvane = await loadOlvane(await readFile(module));
+
+function milliseconds(work) {
+    const start = performance.now();
+    const answer = work();
+    return [performance.now() - start, answer];
+}
+
+function row(...cells) {
+    console.log(cells.map((cell) => (typeof cell === "number" && !Number.isInteger(cell) ? cell.toFixed(3) : cell)).join("\t"));
+}
+
+function measureSearch(path, file) {
+    const [made] = milliseconds(() => file.search("a", kShown));
+    row(path, `${file.persons.length} persons`, "first search, with the index", made, "ms");
+    let worst = 0;
+    for (const text of kSearches) {
+        let least = Infinity;
+        let found = [];
+        for (let round = 0; round < kRounds; ++round) {
+            const [took, hits] = milliseconds(() => file.search(text, kShown));
+            [least, found] = [Math.min(least, took), hits];
+        }
+        worst = Math.max(worst, least);
+        row("", text, `${found.length} found`, least, "ms");
+    }
+    row("", "worst", "", worst, "ms");
+}
+
+for (const path of paths) {
+    const file = olvane.readGedcom(await readFile(path), path);
+    measureSearch(path, file);
+    file.close();
+}
