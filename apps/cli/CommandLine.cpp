@@ -330,6 +330,10 @@ private:
                     "or words of the name; the page's own choice when not given")
                 ->type_name("WHO");
         addPageViewOptions(*page_, pageOptions_.request);
+        page_->add_flag(
+            "--map", pageOptions_.map,
+            "Open the page with everybody as one map, which is laid out here and may have up to two "
+            "million persons");
         page_
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
@@ -338,6 +342,7 @@ private:
         needsFile(focus);
         needsFile(page_->get_option("--encoding"));
         needsFile(page_->get_option("--hide-living"));
+        needsFile(page_->get_option("--map"));
         needsFile(page_->get_option("--title"));
         for (const std::string& name : pageViewOptionNames()) needsFile(page_->get_option(name));
     }

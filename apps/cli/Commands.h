@@ -87,6 +87,7 @@ struct PageOptions {
     std::string title;      // empty for one made of the focus's name
     LayoutRequest request;  // what the page opens with
     std::string address;    // the same, as pageAddressOf has it
+    bool map = false;       // everybody as a map, laid out here
     HidingOptions hiding;
 };
 

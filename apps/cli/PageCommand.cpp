@@ -8,7 +8,11 @@
 
 #include <cstddef>
 
+#include <olvane/charts/MapIndex.h>
+#include <olvane/gedcom/GedcomReader.h>
 #include <olvane/gedcom/GedcomWriter.h>
+#include <olvane/source/GedcomCaptions.h>
+#include <olvane/source/GedcomKin.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
@@ -26,13 +30,36 @@ constexpr std::size_t kMostBytes = std::size_t{64} << 20;
 // People do not open a page with more than this in it; a program reads the file itself.
 constexpr std::size_t kMostPersons = 200000;
 
+// A map is opened with as many, whose records a page need not hold.
+constexpr std::size_t kMostPersonsOfMap = 2000000;
+
+bool fitsAsText(const gedcom::GedcomData& data, std::size_t bytes) {
+    return data.personCount() <= kMostPersons && bytes <= kMostBytes;
+}
+
 void refuseTooLarge(const gedcom::GedcomData& data, std::size_t bytes) {
-    if (data.personCount() <= kMostPersons && bytes <= kMostBytes) return;
+    if (fitsAsText(data, bytes)) return;
     throw UsageError(
         data.file() + ": " + std::to_string(data.personCount()) + " persons and " +
         std::to_string(bytes >> 20) +
         " MiB are more than a page can hold, which is 200,000 persons and 64 MiB; take a part of the "
-        "family, or draw pictures");
+        "family, draw pictures, or write a map with --map");
+}
+
+void refuseTooManyForMap(const gedcom::GedcomData& data) {
+    if (data.personCount() <= kMostPersonsOfMap) return;
+    throw UsageError(data.file() + ": " + std::to_string(data.personCount()) +
+                     " persons are more than a map can hold, which is 2,000,000");
+}
+
+std::string mapOf(const gedcom::GedcomData& data) {
+    return charts::writeMapIndex(charts::mapIndexOf(gedcom::kinGraphOf(data), gedcom::captionsOf(data)));
+}
+
+// The map of what the text says. Where somebody is hidden it is made of that text itself, so that it cannot know more.
+std::string mapOf(const gedcom::GedcomData& data, const PageFamily& family) {
+    refuseTooManyForMap(data);
+    return family.livingHidden ? mapOf(gedcom::readGedcomBytes(family.gedcom, family.name, {})) : mapOf(data);
 }
 
 // The name that the page knows the file by. A file is often named after somebody, so with anybody hidden, as without
@@ -68,7 +95,7 @@ PageFamily familyOf(const PageOptions& options) {
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
     PageFamily family;
     family.gedcom = gedcom::writeGedcom(data, hiding);
-    refuseTooLarge(data, family.gedcom.size());
+    if (!options.map) refuseTooLarge(data, family.gedcom.size());
     family.name = fileNameOf(options);
     family.title = options.title.empty() ? titleOf(data, focus, family, hiding.hidden) : options.title;
     family.focus = focusOf(focus);
@@ -78,6 +105,10 @@ PageFamily familyOf(const PageOptions& options) {
         family.address += "&to=" + std::to_string(chooseFocus(data, options.request.to));
     }
     family.livingHidden = options.hiding.hideLiving;
+    if (options.map) {
+        family.map = mapOf(data, family);
+        if (!fitsAsText(data, family.gedcom.size())) family.gedcom.clear();
+    }
     // They quote the file, and so may name whom the page does not.
     if (!options.hiding.hideLiving) family.remarks = data.diagnostics();
     return family;

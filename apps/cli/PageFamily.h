@@ -17,7 +17,8 @@ struct PageFamily {
     std::string title;    // above the picture and in the window's title
     std::string focus;    // the number of a person in the text, from 1; empty for the page's own choice
     std::string address;  // what the page opens with, in the form of its own addresses, without the #
-    std::string gedcom;   // UTF-8
+    std::string gedcom;   // UTF-8; empty where the page has the map alone
+    std::string map;      // as charts::writeMapIndex writes it; empty for a page that opens without one
     bool livingHidden = false;
     // On the file that the text was made of, with its line numbers.
     std::vector<gedcom::Diagnostic> remarks;

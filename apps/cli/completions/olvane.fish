@@ -59,5 +59,6 @@ complete -c olvane -n '__fish_seen_subcommand_from kin' -l language -x -a 'en de
 complete -c olvane -n '__fish_seen_subcommand_from judge' -l family -r -d 'GEDCOM file of the family'
 complete -c olvane -n '__fish_seen_subcommand_from batch' -l unbuffered -d 'Answer each line at once'
 complete -c olvane -n '__fish_seen_subcommand_from people check judge' -l format -x -a 'text tsv json' -d 'Form of the output'
+complete -c olvane -n '__fish_seen_subcommand_from page' -l map -d 'Open with everybody as one map'
 complete -c olvane -n '__fish_seen_subcommand_from page' -l view -x -a 'family pedigree' -d 'Which relatives'
 complete -c olvane -n '__fish_seen_subcommand_from check' -l all -d 'Look at every layout'
