@@ -133,6 +133,18 @@ export class GedcomFile {
         }
     }
 
+    mapIndex() {
+        const { exports } = this.#instance;
+        const map = exports.gedcom_map(this.#opened());
+        if (map === 0) this.#refuse();
+        try {
+            const start = exports.map_bytes(map) >>> 0;
+            return new Uint8Array(exports.memory.buffer, start, exports.map_size(map) >>> 0).slice();
+        } finally {
+            exports.map_free(map);
+        }
+    }
+
     #refuse() {
         const message = this.#instance.text(this.#instance.exports.last_text());
         const status = message === "too large" ? "tooLarge" : "layoutFailed";

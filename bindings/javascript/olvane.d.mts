@@ -424,6 +424,8 @@ export class GedcomFile {
     layoutText(focus: number, options?: Options): string;
     /** The picture of a view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
     picture(focus: number, options?: PictureOptions): Picture;
+    /** Everybody as a map, as bytes; olvane/charts/MapIndex.h of the C++ sources describes their form. */
+    mapIndex(): Uint8Array<ArrayBuffer>;
     /**
      * Releases the memory; nothing can be asked afterwards but what was read out before. A file that nobody holds any more
      * is closed in time.

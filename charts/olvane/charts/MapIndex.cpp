@@ -97,8 +97,12 @@ private:
             map_.numbers.push_back(static_cast<std::uint32_t>(place) + 1);
             map_.births.push_back(person.birth);
             map_.deaths.push_back(person.death);
-            map_.flags.push_back(static_cast<std::uint8_t>(graph_.sex(place)));
-            map_.names.push_back(stringPlace(person.name));
+            const bool endsSo = endsWithSurname(person);
+            const std::string_view name = person.name;
+            map_.flags.push_back(static_cast<std::uint8_t>(static_cast<std::uint8_t>(graph_.sex(place)) |
+                                                           (endsSo ? MapIndex::kSurnameLast : 0)));
+            map_.names.push_back(
+                stringPlace(endsSo ? name.substr(0, name.size() - person.surname.size() - 1) : name));
             map_.surnames.push_back(stringPlace(person.surname));
         }
         for (std::size_t row = 0; row < map_.rows.size(); ++row) {
@@ -109,6 +113,13 @@ private:
     std::uint32_t endOfRow(std::size_t row) const {
         return row + 1 < map_.rows.size() ? map_.rows[row + 1].firstPerson
                                           : static_cast<std::uint32_t>(map_.x.size());
+    }
+
+    // Given names are shared by many more persons than whole names.
+    static bool endsWithSurname(const kin::PersonCaption& person) {
+        const std::size_t rest = person.surname.size() + 1;
+        return rest > 1 && person.name.size() > rest && person.name.ends_with(person.surname) &&
+               person.name[person.name.size() - rest] == ' ';
     }
 
     std::uint32_t stringPlace(std::string_view text) {

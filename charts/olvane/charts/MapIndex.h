@@ -28,12 +28,13 @@ namespace olvane::charts {
 // Holds: rows are sorted by y, the persons of a row by x, the bars of a band by x1, its uprights by x, marks by person.
 // Memory: about 55 bytes a person and the names.
 struct OLVANE_API MapIndex {
-    static constexpr std::int32_t kUnit = 4;        // in a point
-    static constexpr std::int32_t kNobody = -1;     // a partner who is not known
-    static constexpr std::uint8_t kSexMask = 3;     // of Flags: kin::Sex
-    static constexpr std::uint8_t kJoined = 4;      // a line of marriage leads to the next person of the row
-    static constexpr std::uint8_t kDivorced = 8;    // of that marriage
-    static constexpr std::int32_t kChildBits = 28;  // of children; a kin::ChildKind lies above them
+    static constexpr std::int32_t kUnit = 4;      // in a point
+    static constexpr std::int32_t kNobody = -1;   // a partner who is not known
+    static constexpr std::uint8_t kSexMask = 3;   // of Flags: kin::Sex
+    static constexpr std::uint8_t kJoined = 4;    // a line of marriage leads to the next person of the row
+    static constexpr std::uint8_t kDivorced = 8;  // of that marriage
+    static constexpr std::uint8_t kSurnameLast = 16;  // the whole name is names, a space and surnames
+    static constexpr std::int32_t kChildBits = 28;    // of children; a kin::ChildKind lies above them
     static constexpr std::uint32_t kPersonLabel = 0x80000000U;
 
     // Lines join the members of a union; an adopted line leads to a child that is none by birth.

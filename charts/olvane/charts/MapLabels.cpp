@@ -14,7 +14,7 @@ namespace olvane::charts {
 
 namespace {
 
-constexpr std::uint32_t kFinestLevel = 2;  // names are read in the boxes beyond it
+constexpr std::uint32_t kFinestLevel = 3;  // names are read in the boxes beyond it
 constexpr std::int64_t kCellWidth = 200;   // pixels
 constexpr std::int64_t kCellHeight = 60;
 constexpr std::int64_t kWindow =

@@ -151,6 +151,24 @@ TEST(MapIndex, comesBackFromItsBytes) {
     }
 }
 
+TEST(MapIndex, hasTheNamesOfTheCaptions) {
+    kin::KinGraphBuilder builder;
+    const std::vector<kin::PersonCaption> captions = {
+        {"Ann Ash", "Ash", 0, 0}, {"Ash", "Ash", 0, 0}, {"Ash Ann", "Ash", 0, 0},     {"Annash", "ash", 0, 0},
+        {"", "", 0, 0},           {"Ann", "", 0, 0},    {"Ann Ash Jr.", "Ash", 0, 0}, {" Ash", "Ash", 0, 0}};
+    for (std::size_t i = 0; i < captions.size(); ++i)
+        builder.addPerson(static_cast<int>(i) + 1, kin::Sex::unknown);
+    const MapIndex map = mapIndexOf(builder.build(), captions);
+    for (std::size_t p = 0; p < captions.size(); ++p) {
+        const bool isSplit = (map.flags[p] & MapIndex::kSurnameLast) != 0;
+        const std::string& surname = map.strings[map.surnames[p]];
+        const std::string name = map.strings[map.names[p]] + (isSplit ? " " + surname : "");
+        EXPECT_EQ(name, captions[map.numbers[p] - 1].name);
+        EXPECT_EQ(surname, captions[map.numbers[p] - 1].surname);
+        EXPECT_EQ(isSplit, map.numbers[p] == 1) << captions[map.numbers[p] - 1].name;
+    }
+}
+
 TEST(MapIndex, ofNobodyIsEmpty) {
     const MapIndex map = mapIndexOf(kin::KinGraphBuilder().build(), {});
     EXPECT_TRUE(map.x.empty());
