@@ -101,7 +101,7 @@ export class GedcomFile {
     }
 
     search(text, limit = Infinity) {
-        return searchWith(this.#instance, text, limit, (pointer, most) => this.#told("gedcom_search", pointer, most));
+        return searchWith(this.#instance, text, limit, (pointer, most) => this.#answer("gedcom_search", pointer, most));
     }
 
     layout(focus, options = undefined) {
