@@ -36,7 +36,7 @@ olvane_component(engine TARGETS olvane_engine)
 olvane_component(family TARGETS olvane_family REQUIRES olvane-engine)
 olvane_component(picture TARGETS olvane_picture REQUIRES olvane-family)
 olvane_component(charts TARGETS olvane_charts REQUIRES olvane-picture)
-olvane_component(draw TARGETS olvane_draw REQUIRES olvane-picture libutf8proc)
+olvane_component(draw TARGETS olvane_draw REQUIRES olvane-picture)
 olvane_component(gedcom TARGETS olvane_gedcom_source olvane_gedcom REQUIRES olvane-family ${reader_modules})
 # The two that are shared libraries with a C interface install themselves; these are their targets. Where all libraries are
 # shared, each finds the others beside it.

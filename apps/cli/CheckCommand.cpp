@@ -61,7 +61,7 @@ std::size_t printAllLayouts(const gedcom::GedcomData& data, const LayoutRequest&
 // Returns whether the layout has trouble.
 bool printOneLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
     const LayoutFindings findings = findingsOf(PictureRun(data, request, {}).pictureOf(focus));
-    const TreeSize size = sizeOf(request.boxes);
+    const TreeSize size = charts::treeSizeOf(request.boxes);
     writeReport(
         findingsText(findings, static_cast<double>(size.nodeWidth), static_cast<double>(size.nodeHeight)));
     return findings.hasTrouble();

@@ -409,10 +409,8 @@ private:
 
     // Pictures that lie sideways have wide boxes, and what is checked is the picture.
     static void widenSideways(const CLI::App& command, LayoutRequest& request) {
-        const charts::Direction direction = request.chart.direction;
-        const bool liesSideways = request.view() == View::pedigree || direction == charts::Direction::left ||
-                                  direction == charts::Direction::right;
-        if (liesSideways && command.count("--boxes") == 0) request.boxes = BoxForm::wide;
+        if (command.count("--boxes") > 0) return;
+        request.boxes = charts::usualBoxForm(request.view(), request.chart.direction);
     }
 
     CLI::App app_{"Family trees from GEDCOM files: lists persons, lays out families and draws them.",

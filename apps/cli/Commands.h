@@ -8,10 +8,11 @@
 #include <string>
 #include <vector>
 
+#include <olvane/source/GedcomLabels.h>
+
 #include <cli/FileReading.h>
 #include <cli/HiddenPersons.h>
 #include <cli/LayoutRun.h>
-#include <cli/PictureLabels.h>
 
 namespace olvane::cli {
 
@@ -46,7 +47,7 @@ struct DrawOptions {
     std::string theme = "light";
     std::string title;  // empty for one made of the focus's name
     std::string page;   // name of a paper; empty for a picture of its own size
-    ShownFacts shown{};
+    gedcom::ShownFacts shown{};
     HidingOptions hiding;
 };
 

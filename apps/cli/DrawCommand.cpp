@@ -12,13 +12,14 @@
 #include <sstream>
 
 #include <olvane/draw/PageSplit.h>
+#include <olvane/gedcom/HiddenNames.h>
+#include <olvane/source/GedcomLabels.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PictureConversion.h>
-#include <cli/PictureLabels.h>
 #include <cli/PictureRun.h>
 #include <cli/SourceDate.h>
 #include <cli/UsageError.h>
@@ -61,21 +62,12 @@ const char* endingOf(Form form) {
     return ".svg";
 }
 
-// "Family of Ada Berg", "Ancestors of Ada Berg".
-std::string titleOf(const DrawOptions& options, const draw::DrawingContent& content) {
-    std::string view = charts::nameOf(options.request.view());
-    if (view[0] >= 'a' && view[0] <= 'z') view[0] = static_cast<char>(view[0] - 'a' + 'A');
-    const picture::Index focus = content.picture.focus;
-    if (focus == picture::kNone) return view;
-    return view + " of " +
-           draw::fullName(content.labelOf(content.picture.boxes[static_cast<std::size_t>(focus)].id));
-}
-
 draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::DrawingContent& content) {
     draw::DrawingOptions drawing;
     drawing.theme = draw::themeOfName(options.theme);
     drawing.headline = !options.title.empty();
-    drawing.title = drawing.headline ? options.title : titleOf(options, content);
+    drawing.title =
+        drawing.headline ? options.title : draw::titleOf(charts::nameOf(options.request.view()), content);
     return drawing;
 }
 
@@ -83,7 +75,19 @@ draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
     const std::vector<bool> hidden = hiddenPersons(data, options.hiding);
     picture::Picture picture = PictureRun(data, options.request, hidden).pictureOf(focus);
-    return pictureContent(data, std::move(picture), options.shown, hidden);
+    gedcom::HiddenTexts texts;
+    if (!hidden.empty()) {
+        const gedcom::HiddenNames names(data, hidden);
+        texts = {hidden, [names](std::string_view text) { return names.shownPlace(text); },
+                 [names](std::string_view text) { return names.shownText(text); }};
+    }
+    const gedcom::GedcomLabels labels(data, options.shown, std::move(texts));
+    draw::DrawingContent content;
+    content.picture = std::move(picture);
+    content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };
+    content.familyLabelOf = [labels](std::uint32_t number) { return labels.ofFamily(number); };
+    content.countsHidden = true;
+    return content;
 }
 
 // "tree.svg" and sheet 3 of 12 give "tree-03.svg".

@@ -45,7 +45,7 @@ Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const s
 
 std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
                        const std::vector<LayoutRecord>& records, const std::vector<bool>& living) {
-    const TreeSize size = sizeOf(request.boxes);
+    const TreeSize size = charts::treeSizeOf(request.boxes);
     const gedcom::HiddenNames hiddenNames(data, living);
     Json json;
     json["format"] = kFormatVersion;

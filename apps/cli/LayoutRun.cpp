@@ -19,35 +19,7 @@ namespace {
 // quarter of a minute where one person has a hundred thousand children, which are looked up in a set that large.
 constexpr std::size_t kMostRelatives = 5000000;
 
-constexpr float kGapOfWideRows = 45;  // room for names of children over one another
-
 }  // namespace
-
-TreeSize sizeOf(BoxForm boxes) {
-    TreeSize size = familyTreeSize();
-    if (boxes == BoxForm::wide) {
-        size.nodeWidth = 105.0f;
-        size.nodeHeight = 40.0f;
-        size.horzPadding = 30.0f;
-        size.vertPadding = 14.0f;
-        size.lineInset = 15.0f;
-    }
-    return size;
-}
-
-charts::ChartSizes chartSizesOf(const LayoutRequest& request) {
-    const TreeSize size = sizeOf(request.boxes);
-    charts::ChartSizes sizes;
-    sizes.boxWidth = size.nodeWidth;
-    sizes.boxHeight = size.nodeHeight;
-    if (isEngineView(request.view())) {
-        sizes.gapX = size.horzPadding;
-        sizes.gapY = size.vertPadding;
-    } else if (request.boxes == BoxForm::wide) {
-        sizes.gapY = kGapOfWideRows;
-    }
-    return sizes;
-}
 
 std::shared_ptr<OlvaneViewerManagerWrapProtocol> limitedSource(OlvaneViewerManagerWrapProtocol& people) {
     return std::make_shared<gedcom::LimitedDataSource>(people, kMostRelatives);
@@ -56,7 +28,7 @@ std::shared_ptr<OlvaneViewerManagerWrapProtocol> limitedSource(OlvaneViewerManag
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
     gedcom::GedcomDataSource people(data);
     olvane::LayoutOptions options = request.chart.layout;
-    options.sizes = sizeOf(request.boxes);
+    options.sizes = charts::treeSizeOf(request.boxes);
     const auto source = limitedSource(people);
     return request.view() == View::pedigree ? pedigreeLayout(focus, source, options).text
                                             : familyLayout(focus, source, options).text;

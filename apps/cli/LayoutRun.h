@@ -8,17 +8,16 @@
 #include <string>
 
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomData.h>
-#include <olvane/layouter/TreeSize.h>
 
 namespace olvane::cli {
 
 // Family and pedigree are the engine's own; the others are charts.
 using charts::View;
 
-// The form of the boxes: tall ones as hosts draw them, or wide ones, which keep a sideways chart low.
-enum class BoxForm : std::uint8_t { tall, wide };
+using charts::BoxForm;
 
 // What to lay out. chart says which view and what it shows; focus and sizes are filled in by PictureRun.
 struct LayoutRequest {
@@ -35,12 +34,6 @@ struct LayoutRequest {
 inline bool isEngineView(View view) {
     return view == View::family || view == View::pedigree;
 }
-
-// The sizes of a layout of the engine.
-TreeSize sizeOf(BoxForm boxes);
-
-// The sizes of a picture, whose engine views keep the gaps of sizeOf.
-charts::ChartSizes chartSizesOf(const LayoutRequest& request);
 
 // The same answers, up to 5 million relatives.
 // Holds: refers to people, which must outlive it; one for each layout.

@@ -29,8 +29,7 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& requ
       hidden_(std::move(hidden)),
       hiddenNames_(data, hidden_),
       graph_(gedcom::kinGraphOf(data)) {
-    view_.chart.sizes = chartSizesOf(request);
-    view_.chart.layout.sizes = sizeOf(request.boxes);
+    charts::setBoxForm(view_.chart, request.boxes);
     if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
 

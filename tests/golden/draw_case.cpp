@@ -25,12 +25,12 @@ using olvane::draw::DrawingContent;
 using olvane::draw::DrawingOptions;
 using support::CaseFile;
 
-olvane::draw::PersonLabel labelOf(const CaseFile& source, std::int64_t id) {
-    olvane::draw::PersonLabel label;
+olvane::kin::PersonLabel labelOf(const CaseFile& source, std::int64_t id) {
+    olvane::kin::PersonLabel label;
     label.given = std::to_string(id);
     const auto sex = source.sexes.find(id);
     const bool male = sex == source.sexes.end() || sex->second == 0;
-    label.sex = male ? olvane::draw::LabelSex::male : olvane::draw::LabelSex::female;
+    label.sex = male ? olvane::kin::Sex::male : olvane::kin::Sex::female;
     const auto birth = source.births.find(id);
     if (birth != source.births.end()) label.birth = birth->second;
     return label;

@@ -60,12 +60,12 @@ TextRoom textRoomOf(const BoxFrame& box) {
     return {box.width / 2, box.width - 2 * kInset, 55, box.height - 6, true};
 }
 
-picture::FittedName nameOf(const PersonLabel& label, const TextRoom& room, double height) {
+picture::FittedName nameOf(const kin::PersonLabel& label, const TextRoom& room, double height) {
     return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst,
                             {room.width, std::max(height, kLeastNameHeight), kNameGap, kMostNameLines});
 }
 
-std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& room) {
+std::vector<std::string> yearLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
     const Font font{kYearsSize, false};
     std::vector<std::string> parts;
     if (!label.birth.empty()) parts.push_back("* " + cleanText(label.birth));
@@ -79,7 +79,7 @@ std::vector<std::string> yearLinesOf(const PersonLabel& label, const TextRoom& r
 }
 
 // Years, then as many details as leave room for two lines of a name.
-std::vector<std::string> factLinesOf(const PersonLabel& label, const TextRoom& room) {
+std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
     const Font font{kYearsSize, false};
     std::vector<std::string> lines = yearLinesOf(label, room);
     const double spare = room.bottom - room.top - kLeastNameHeight;
@@ -127,7 +127,8 @@ void appendYears(std::string& svg, const std::vector<std::string>& lines, const 
 }
 
 // Names in the middle of what the years leave.
-void appendTexts(std::string& svg, const BoxFrame& box, const PersonLabel& label, const DrawingTheme& theme) {
+void appendTexts(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
+                 const DrawingTheme& theme) {
     const TextRoom room = textRoomOf(box);
     const std::vector<std::string> years = factLinesOf(label, room);
     const double namesBottom =
@@ -140,31 +141,31 @@ void appendTexts(std::string& svg, const BoxFrame& box, const PersonLabel& label
 }
 
 // Square corners for men, round ones for women, in between for everybody else.
-double cornerOf(LabelSex sex) {
+double cornerOf(kin::Sex sex) {
     switch (sex) {
-        case LabelSex::male:
+        case kin::Sex::male:
             return 3;
-        case LabelSex::female:
+        case kin::Sex::female:
             return 18;
-        case LabelSex::other:
+        case kin::Sex::unknown:
             break;
     }
     return 9;
 }
 
-std::string_view silhouetteOf(LabelSex sex) {
+std::string_view silhouetteOf(kin::Sex sex) {
     switch (sex) {
-        case LabelSex::male:
+        case kin::Sex::male:
             return "olvane-man";
-        case LabelSex::female:
+        case kin::Sex::female:
             return "olvane-woman";
-        case LabelSex::other:
+        case kin::Sex::unknown:
             break;
     }
     return "olvane-person";
 }
 
-void appendFrame(std::string& svg, const BoxFrame& box, LabelSex sex, const DrawingTheme& theme) {
+void appendFrame(std::string& svg, const BoxFrame& box, kin::Sex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double corner = cornerOf(sex);
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" + px(corner) +
@@ -178,7 +179,7 @@ void appendFrame(std::string& svg, const BoxFrame& box, LabelSex sex, const Draw
            "\" stroke-width=\"1.4\"/>\n";
 }
 
-void appendSilhouette(std::string& svg, const BoxFrame& box, LabelSex sex, const DrawingTheme& theme) {
+void appendSilhouette(std::string& svg, const BoxFrame& box, kin::Sex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double x = isWide(box) ? kInset : (box.width - kSilhouetteWidth) / 2;
     const double y = isWide(box) ? (box.height - kSilhouetteHeight) / 2 : 11;
@@ -243,7 +244,7 @@ void appendBadge(std::string& svg, const BoxFrame& box, const Badge& badge, cons
 
 // The count of hidden relatives in the right corner; the repeat mark in the left one, or before it in a wide
 // box.
-void appendBadges(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+void appendBadges(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
                   const DrawingTheme& theme) {
     double right = box.width - kBadgeInset;
     if (box.hasHidden()) {
@@ -281,8 +282,8 @@ void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& them
     appendMarks(svg, box, MarkPlace::bottom, theme);
 }
 
-std::string titleOf(const BoxFrame& box, const PersonLabel& label) {
-    std::string title = fullName(label);
+std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
+    std::string title = kin::fullName(label);
     if (!label.living && !label.birth.empty()) title += ", * " + label.birth;
     if (!label.living && !label.death.empty()) title += ", \xE2\x80\xA0 " + label.death;
     if (!label.living) {
@@ -301,13 +302,13 @@ void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
 }
 
 // What is left of a label when it must not be shown.
-PersonLabel shownLabel(const PersonLabel& label) {
+kin::PersonLabel shownLabel(const kin::PersonLabel& label) {
     if (!label.living) {
-        PersonLabel shown = label;
+        kin::PersonLabel shown = label;
         if (shown.given.empty() && shown.surname.empty()) shown.given = "?";
         return shown;
     }
-    PersonLabel shown;
+    kin::PersonLabel shown;
     shown.given = "Living";
     shown.living = true;
     return shown;
@@ -315,16 +316,8 @@ PersonLabel shownLabel(const PersonLabel& label) {
 
 }  // namespace
 
-std::string fullName(const PersonLabel& label) {
-    if (label.living) return "Living";
-    const std::string& first = label.surnameFirst ? label.surname : label.given;
-    const std::string& second = label.surnameFirst ? label.given : label.surname;
-    if (first.empty() && second.empty()) return "Name not known";
-    return first.empty() || second.empty() ? first + second : first + " " + second;
-}
-
-PersonLabel readableLabel(const DrawingContent& content, std::int64_t id) {
-    PersonLabel label = content.labelOf(id);
+kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id) {
+    kin::PersonLabel label = content.labelOf(id);
     for (std::string* text : {&label.given, &label.surname, &label.birth, &label.death})
         *text = cutText(*text);
     for (std::string& detail : label.details) detail = cutText(detail);
@@ -345,9 +338,9 @@ void appendBoxDefinitions(std::string& svg) {
         "</defs>\n";
 }
 
-void appendPersonBox(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
                      const DrawingTheme& theme) {
-    const PersonLabel shown = shownLabel(label);
+    const kin::PersonLabel shown = shownLabel(label);
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
     appendSilhouette(svg, box, shown.sex, theme);
@@ -361,7 +354,7 @@ void appendPlaceholderBox(std::string& svg, const BoxFrame& box, const std::stri
                           const DrawingTheme& theme) {
     const bool isFather = box.box->sex == kin::Sex::male;
     const char* invitation = isFather ? "add father" : "add mother";
-    const LabelSex sex = isFather ? LabelSex::male : LabelSex::female;
+    const kin::Sex sex = isFather ? kin::Sex::male : kin::Sex::female;
     openBox(svg, box, std::string(invitation) + " of " + childName);
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" +
            px(cornerOf(sex)) + "\" fill=\"" + std::string(theme.page) + "\" stroke=\"" +

@@ -32,13 +32,13 @@ struct BoxFrame {
 };
 
 // What is said of a person, each text cut to what can be read.
-PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);
+kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);
 
 // The definitions that boxes refer to. Once, ahead of all boxes.
 void appendBoxDefinitions(std::string& svg);
 
 // A person's box: silhouette, name, years, marks, and a title that says it all in words.
-void appendPersonBox(std::string& svg, const BoxFrame& box, const PersonLabel& label,
+void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
                      const DrawingTheme& theme);
 
 // The dashed box of an unknown parent; childName says whose parent.

@@ -7,13 +7,13 @@
 
 namespace olvane::draw {
 
-const BoxColours& DrawingTheme::coloursOf(LabelSex sex) const {
+const BoxColours& DrawingTheme::coloursOf(kin::Sex sex) const {
     switch (sex) {
-        case LabelSex::male:
+        case kin::Sex::male:
             return male;
-        case LabelSex::female:
+        case kin::Sex::female:
             return female;
-        case LabelSex::other:
+        case kin::Sex::unknown:
             break;
     }
     return other;

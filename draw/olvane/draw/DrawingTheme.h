@@ -5,7 +5,7 @@
 
 #include <string_view>
 
-#include <olvane/draw/PersonLabel.h>
+#include <olvane/kin/PersonLabel.h>
 
 namespace olvane::draw {
 
@@ -34,7 +34,7 @@ struct DrawingTheme {
     BoxColours female;
     BoxColours other;
 
-    const BoxColours& coloursOf(LabelSex sex) const;
+    const BoxColours& coloursOf(kin::Sex sex) const;
 };
 
 const DrawingTheme& lightTheme();

@@ -119,13 +119,13 @@ private:
     const BoxColours& coloursOf(std::size_t i) const {
         switch (fan_.boxes[i].sex) {
             case kin::Sex::male:
-                return theme().coloursOf(LabelSex::male);
+                return theme().coloursOf(kin::Sex::male);
             case kin::Sex::female:
-                return theme().coloursOf(LabelSex::female);
+                return theme().coloursOf(kin::Sex::female);
             case kin::Sex::unknown:
                 break;
         }
-        return theme().coloursOf(LabelSex::other);
+        return theme().coloursOf(kin::Sex::unknown);
     }
 
     double innerOf(std::size_t i) const { return radius(fan_.arcs[i].ring); }
@@ -169,8 +169,8 @@ private:
     void appendCell(std::size_t i, const std::vector<BoxMark>& marks) {
         const picture::Box& box = fan_.boxes[i];
         const bool isFocus = fan_.focus == static_cast<Index>(i);
-        const PersonLabel label =
-            box.kind == picture::BoxKind::person ? readableLabel(content_, box.id) : PersonLabel();
+        const kin::PersonLabel label =
+            box.kind == picture::BoxKind::person ? readableLabel(content_, box.id) : kin::PersonLabel();
         const std::size_t start = svg_.svg.size();
         svg_.svg += "<g role=\"img\"><title>" + escaped(titleOf(label, isFocus, marks)) +
                     "</title>\n<path d=\"" + shapeOf(i) + "\" fill=\"" + std::string(fillOf(i)) +
@@ -184,7 +184,7 @@ private:
         svg_.boxes.push_back({area, start, svg_.svg.size() - start});
     }
 
-    static std::string yearsOf(const PersonLabel& label) {
+    static std::string yearsOf(const kin::PersonLabel& label) {
         std::string years;
         if (label.living) return years;
         if (!label.birth.empty()) years = "* " + cleanText(label.birth);
@@ -193,8 +193,9 @@ private:
         return years;
     }
 
-    static std::string titleOf(const PersonLabel& label, bool isFocus, const std::vector<BoxMark>& marks) {
-        std::string title = fullName(label);
+    static std::string titleOf(const kin::PersonLabel& label, bool isFocus,
+                               const std::vector<BoxMark>& marks) {
+        std::string title = kin::fullName(label);
         const std::string years = yearsOf(label);
         if (!years.empty()) title += ", " + years;
         if (isFocus) title += " (focus of this picture)";
@@ -203,7 +204,7 @@ private:
     }
 
     // Names as two lines, years with the signs of marks as the third.
-    static std::vector<TextLine> textOf(const PersonLabel& label, const std::vector<BoxMark>& marks) {
+    static std::vector<TextLine> textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) {
         std::vector<TextLine> lines;
         if (label.living) {
             lines.push_back({"Living", true});
@@ -334,7 +335,7 @@ private:
         double widest = 0;
         for (std::size_t i = 0; i < lines_.size(); ++i) {
             const auto box = static_cast<std::size_t>(lines_[i]);
-            const std::string name = cleanText(fullName(readableLabel(content_, fan_.boxes[box].id)));
+            const std::string name = cleanText(kin::fullName(readableLabel(content_, fan_.boxes[box].id)));
             const std::string text = fitLine(name, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
             const int y = top + kLegendPitch * static_cast<int>(i);

@@ -165,10 +165,10 @@ private:
     }
 
     std::string nameOfChild(const picture::Box& unknown) const {
-        if (unknown.childOf == picture::kNone) return fullName(PersonLabel());
+        if (unknown.childOf == picture::kNone) return kin::fullName(kin::PersonLabel());
         const picture::Box& child = content_.picture.boxes[static_cast<std::size_t>(unknown.childOf)];
-        return fullName(child.kind == picture::BoxKind::person ? readableLabel(content_, child.id)
-                                                               : PersonLabel());
+        return kin::fullName(child.kind == picture::BoxKind::person ? readableLabel(content_, child.id)
+                                                                    : kin::PersonLabel());
     }
 
     // Below the picture, as wide as it needs; lists only what is there.
@@ -233,6 +233,16 @@ void openPage(SvgPicture& picture, const DrawingOptions& options) {
 
 void closePage(SvgPicture& picture) {
     picture.svg += "</g>\n</svg>\n";
+}
+
+std::string titleOf(std::string_view view, const DrawingContent& content) {
+    std::string title(view);
+    if (!title.empty() && title[0] >= 'a' && title[0] <= 'z')
+        title[0] = static_cast<char>(title[0] - 'a' + 'A');
+    const picture::Index focus = content.picture.focus;
+    if (focus == picture::kNone) return title;
+    const std::int64_t id = content.picture.boxes[static_cast<std::size_t>(focus)].id;
+    return title + " of " + kin::fullName(content.labelOf(id));
 }
 
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options) {

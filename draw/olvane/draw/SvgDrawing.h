@@ -7,10 +7,11 @@
 #include <cstdint>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include <olvane/draw/DrawingTheme.h>
-#include <olvane/draw/PersonLabel.h>
+#include <olvane/kin/PersonLabel.h>
 #include <olvane/picture/Picture.h>
 
 namespace olvane::draw {
@@ -22,7 +23,7 @@ namespace olvane::draw {
 // Fails: whatever a question throws passes on.
 struct DrawingContent {
     picture::Picture picture;
-    std::function<PersonLabel(std::int64_t id)> labelOf;
+    std::function<kin::PersonLabel(std::int64_t id)> labelOf;
     // What stands at the marriage line of a family that has a number, such as a year; nothing where not set.
     std::function<std::string(std::uint32_t family)> familyLabelOf;
     // Whether the picture's numbers of hidden relatives are known; else the boxes' flags are all there is.
@@ -67,8 +68,8 @@ struct SvgPicture {
     PictureArea legend;              // of no size where there is none
 };
 
-// A person's name for a sentence; "Living" or "Name not known" where there is none to show.
-std::string fullName(const PersonLabel& label);
+// What a picture is called that nobody gave a title: "Family of Ada Berg" for the view "family".
+std::string titleOf(std::string_view view, const DrawingContent& content);
 
 // Draws a picture as SVG: lines below, boxes with names above, marks at their edges, a legend where lines of a
 // special kind are used. A round chart is drawn as rings of cells.

@@ -48,7 +48,7 @@ TEST(DrawingTheme, unknownNameGivesNone) {
 }
 
 TEST_P(DrawingThemes, textsCanBeReadOnEveryBox) {
-    for (const LabelSex sex : {LabelSex::male, LabelSex::female, LabelSex::other}) {
+    for (const kin::Sex sex : {kin::Sex::male, kin::Sex::female, kin::Sex::unknown}) {
         EXPECT_GE(contrast(theme().text, theme().coloursOf(sex).fill), kText);
         EXPECT_GE(contrast(theme().quietText, theme().coloursOf(sex).fill), kText);
     }

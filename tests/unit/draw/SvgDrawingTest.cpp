@@ -22,8 +22,8 @@ namespace {
 using testing::HasSubstr;
 using testing::Not;
 
-PersonLabel label(const std::string& given, const std::string& surname, LabelSex sex = LabelSex::male) {
-    PersonLabel result;
+kin::PersonLabel label(const std::string& given, const std::string& surname, kin::Sex sex = kin::Sex::male) {
+    kin::PersonLabel result;
     result.given = given;
     result.surname = surname;
     result.sex = sex;
@@ -37,9 +37,9 @@ protected:
         labels_[1] = label("Karl", "Berg");
         labels_[1].birth = "1801";
         labels_[1].death = "~1870";
-        labels_[2] = label("Ada", "Lund", LabelSex::female);
-        labels_[3] = label("Olga", "Berg", LabelSex::female);
-        labels_[4] = label("Nils", "Berg", LabelSex::other);
+        labels_[2] = label("Ada", "Lund", kin::Sex::female);
+        labels_[3] = label("Olga", "Berg", kin::Sex::female);
+        labels_[4] = label("Nils", "Berg", kin::Sex::unknown);
         addBox(1, 0, 0);
         addBox(0, 0, -110);
         addBox(2, 80, 0);
@@ -103,7 +103,7 @@ protected:
 
     std::string draw() const { return drawSvg(content_, options_).svg; }
 
-    std::map<std::int64_t, PersonLabel> labels_;
+    std::map<std::int64_t, kin::PersonLabel> labels_;
     DrawingContent content_;
     DrawingOptions options_;
 };
@@ -311,7 +311,7 @@ TEST_F(Picture, manyMarksOfOneBoxAreCounted) {
 }
 
 TEST_F(Picture, nameNotKnownIsAQuestionMark) {
-    labels_[2] = PersonLabel();
+    labels_[2] = kin::PersonLabel();
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr(">?</text>"));
     EXPECT_THAT(svg, HasSubstr("<title>Name not known</title>"));

@@ -3,13 +3,12 @@
 
 #pragma once
 
-#include <cstdint>
 #include <string>
 #include <vector>
 
-namespace olvane::draw {
+#include <olvane/kin/KinGraph.h>
 
-enum class LabelSex : std::uint8_t { male, female, other };
+namespace olvane::kin {
 
 // What a box says about its person. UTF-8; any text is allowed, it is data and never markup.
 struct PersonLabel {
@@ -19,11 +18,14 @@ struct PersonLabel {
     bool surnameFirst = false;
     std::string birth;  // a year as it is to be read: "1819", "~1819"; empty if not known
     std::string death;
-    LabelSex sex = LabelSex::other;
+    Sex sex = Sex::unknown;
     // Drawn as "Living", with nothing else of this label in the picture.
     bool living = false;
     // Further lines below the years, each shortened to its box: places, an occupation.
     std::vector<std::string> details;
 };
 
-}  // namespace olvane::draw
+// A person's name for a sentence; "Living" or "Name not known" where there is none to state.
+std::string fullName(const PersonLabel& label);
+
+}  // namespace olvane::kin

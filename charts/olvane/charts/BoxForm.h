@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+
+#include <olvane/Export.h>
+#include <olvane/charts/ViewRequest.h>
+#include <olvane/layouter/TreeSize.h>
+
+namespace olvane::charts {
+
+// The form of the boxes on paper: tall ones as hosts draw them, or wide ones, which keep a sideways chart low.
+enum class BoxForm : std::uint8_t { tall, wide };
+
+// What suits a view: wide boxes where generations stand side by side.
+OLVANE_API BoxForm usualBoxForm(View view, Direction direction);
+
+// The sizes of the engine's views, in points.
+OLVANE_API TreeSize treeSizeOf(BoxForm form);
+
+// Sets all sizes of a request for boxes of a form; its view is set before.
+OLVANE_API void setBoxForm(ChartRequest& request, BoxForm form);
+
+}  // namespace olvane::charts

@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#include <olvane/source/GedcomLabels.h>
+
+#include <utility>
+
+namespace olvane::gedcom {
+
+namespace {
+
+kin::Sex sexOf(Sex sex) {
+    switch (sex) {
+        case Sex::male:
+            return kin::Sex::male;
+        case Sex::female:
+            return kin::Sex::female;
+        case Sex::other:
+            break;
+    }
+    return kin::Sex::unknown;
+}
+
+std::string beginningOf(std::string_view text) {
+    if (text.size() <= GedcomLabels::kMostLabelBytes) return std::string(text);
+    std::size_t end = GedcomLabels::kMostLabelBytes;
+    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0u) == 0x80u) --end;
+    return std::string(text.substr(0, end));
+}
+
+void setName(const PersonName& name, kin::PersonLabel& label) {
+    label.given = beginningOf(name.given);
+    label.surname = beginningOf(name.surname);
+    if (label.given.empty() && label.surname.empty())
+        label.given = displayName(name, GedcomLabels::kMostLabelBytes);
+    label.surnameFirst = name.written.starts_with('/') && !name.written.ends_with('/');
+}
+
+}  // namespace
+
+GedcomLabels::GedcomLabels(const GedcomData& data, ShownFacts shown, HiddenTexts hidden)
+    : data_(&data), shown_(shown), hidden_(std::move(hidden)) {}
+
+kin::PersonLabel GedcomLabels::ofPerson(std::int64_t id) const {
+    const auto person = static_cast<PersonId>(id);
+    if (hidden_.persons.empty() || !hidden_.persons.at(person - 1)) return known(person);
+    // Holds nothing of the person, so that nothing can get out.
+    kin::PersonLabel living;
+    living.living = true;
+    return living;
+}
+
+std::string GedcomLabels::ofFamily(FamilyId number) const {
+    if (!shown_.marriage) return {};
+    const GedcomDate& marriage = data_->family(number).marriage;
+    if (place(marriage.written).empty()) return {};
+    return marriage.isRead() ? displayYear(marriage) : beginningOf(marriage.written);
+}
+
+kin::PersonLabel GedcomLabels::known(PersonId id) const {
+    const Person& person = data_->person(id);
+    kin::PersonLabel label;
+    setName(data_->firstName(id), label);
+    label.birth = dateText(person.birth);
+    label.death = dateText(person.death);
+    label.sex = sexOf(person.sex);
+    if (shown_.needFacts()) addDetails(id, label);
+    return label;
+}
+
+std::string GedcomLabels::dateText(const GedcomDate& date) const {
+    if (place(date.written).empty()) return {};
+    return shown_.dates || !date.isRead() ? beginningOf(date.written) : displayYear(date);
+}
+
+// Birth and death with their places, in the order of life, then the occupation.
+void GedcomLabels::addDetails(PersonId id, kin::PersonLabel& label) const {
+    std::string_view birthPlace;
+    std::string_view deathPlace;
+    std::string_view occupation;
+    for (const Fact& fact : data_->factsOfPerson(id)) {
+        if (fact.tag == "BIRT" && birthPlace.empty()) birthPlace = place(fact.place);
+        if (fact.tag == "DEAT" && deathPlace.empty()) deathPlace = place(fact.place);
+        if (fact.tag == "OCCU" && occupation.empty()) occupation = anyText(fact.value);
+    }
+    if (shown_.places && !birthPlace.empty()) label.details.push_back("* " + beginningOf(birthPlace));
+    if (shown_.places && !deathPlace.empty())
+        label.details.push_back("\xE2\x80\xA0 " + beginningOf(deathPlace));
+    if (shown_.occupation && !occupation.empty()) label.details.push_back(beginningOf(occupation));
+}
+
+std::string_view GedcomLabels::place(std::string_view text) const {
+    return hidden_.shownPlace ? hidden_.shownPlace(text) : text;
+}
+
+std::string_view GedcomLabels::anyText(std::string_view text) const {
+    return hidden_.shownText ? hidden_.shownText(text) : text;
+}
+
+}  // namespace olvane::gedcom
