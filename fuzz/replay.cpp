@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Runs one fuzzer's function over every file of the folders named, without libFuzzer, so that what was once
-// found stays mended with every compiler. A file that breaks a promise ends the program; its name is the last
+// found stays fixed with every compiler. A file that breaks a promise ends the program; its name is the last
 // one printed.
 
 #include <algorithm>

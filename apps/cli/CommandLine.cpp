@@ -126,9 +126,10 @@ public:
 private:
     // The library would only ask for a command where the first word is none.
     std::string complaintOf(const CLI::ParseError& error) const {
-        const std::vector<std::string> strangers = app_.remaining();
-        if (app_.get_subcommands().empty() && !strangers.empty() && !strangers.front().starts_with('-')) {
-            return "there is no command '" + strangers.front() +
+        const std::vector<std::string> unknownWords = app_.remaining();
+        if (app_.get_subcommands().empty() && !unknownWords.empty() &&
+            !unknownWords.front().starts_with('-')) {
+            return "there is no command '" + unknownWords.front() +
                    "', but people, layout, draw, batch, check, kin, judge and page; 'olvane --help' lists "
                    "more";
         }

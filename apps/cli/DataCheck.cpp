@@ -94,7 +94,7 @@ private:
         std::size_t births = 0;
         for (const gedcom::FamilyLink& link : data_.parentLinks(id)) {
             if (link.family == 0) continue;
-            if (link.isFamilysAlone) reportLink(Kind::parentsNotNamed, id, link.family, link.line);
+            if (link.isNamedByFamilyOnly) reportLink(Kind::parentsNotNamed, id, link.family, link.line);
             const bool byBirth =
                 link.pedigree == gedcom::Pedigree::birth || link.pedigree == gedcom::Pedigree::notGiven;
             if (byBirth && ++births == 2) reportLink(Kind::severalBirthFamilies, id, link.family, link.line);
@@ -104,7 +104,7 @@ private:
     void checkCoupleLinks(PersonId id) {
         for (const gedcom::FamilyLink& link : data_.coupleLinks(id)) {
             if (link.family == 0) continue;
-            if (link.isFamilysAlone) {
+            if (link.isNamedByFamilyOnly) {
                 reportLink(Kind::marriageNotNamed, id, link.family, link.line);
             } else if (!namesPartner(data_.family(link.family), id, link.line)) {
                 reportLink(Kind::partnerNotNamed, id, link.family, link.line);
@@ -119,7 +119,7 @@ private:
     }
 
     void checkChild(FamilyId id, const gedcom::ChildLink& link) {
-        if (link.child != 0 && link.isChildsAlone)
+        if (link.child != 0 && link.isNamedByChildOnly)
             reportLink(Kind::childNotListed, link.child, id, link.line);
     }
 

@@ -9,7 +9,7 @@
 
 namespace olvane::cli {
 
-// Who is to be taken for alive: everybody with no sign of death who was born less than 110 years before
+// Who may be living: everybody with no sign of death who was born less than 110 years before
 // thisYear, and everybody without a sign of death whose dates do not decide it and who is within two steps (to a
 // parent, a child or a spouse) of such a person.
 //

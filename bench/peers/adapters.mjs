@@ -163,7 +163,7 @@ async function entitreeFlex() {
 }
 
 // The same with those lists emptied by a line of ours instead: not what is published, but what it could be.
-async function entitreeFlexMended() {
+async function entitreeFlexRepaired() {
   const forgetters = [];
   for (const [file, list] of [['drillChildren', 'descendantsContour'], ['drillParents', 'parentsContour']]) {
     const path = pathOf(`entitree-flex/dist/${file}.js`);
@@ -315,7 +315,7 @@ export const adapters = {
   topola,
   'family-chart': familyChart,
   'entitree-flex': entitreeFlex,
-  'entitree-flex, mended': entitreeFlexMended,
+  'entitree-flex, repaired': entitreeFlexRepaired,
   elkjs: elk,
   dagre,
   dot,

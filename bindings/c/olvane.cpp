@@ -163,7 +163,7 @@ private:
     const olvane_host& host_;
 };
 
-// Counts this thread's layouts: the engine numbers its add-nodes by thread, and a second layout inside the
+// Counts this thread's layouts: the engine numbers its unknown parents by thread, and a second layout inside the
 // first would start the numbers of both anew.
 class RunningLayout {
 public:

@@ -187,7 +187,7 @@ typedef struct olvane_segment {
 /* Whether a record is of a person whom the host knows. */
 typedef enum olvane_record_kind {
     OLVANE_PERSON = 0,
-    OLVANE_MISSING_FATHER = 1, /* an add-node: an empty box where the host knows no father */
+    OLVANE_MISSING_FATHER = 1, /* an unknown parent: an empty box where the host knows no father */
     OLVANE_MISSING_MOTHER = 2
 } olvane_record_kind;
 
@@ -196,7 +196,7 @@ typedef enum olvane_record_kind {
  *
  * Units: points, whole; x grows right, y grows down. (x, y) is the upper-left corner; the size is that of the
  *     options.
- * Holds: the id of an add-node is negative, and child is then the person whose parent is missing, else 0. One
+ * Holds: the id of an unknown parent is negative, and child is then the person whose parent is unknown, else 0. One
  *     person may stand in several boxes. Segments may repeat; segments is null where there are none.
  */
 typedef struct olvane_record {

@@ -53,7 +53,7 @@ std::vector<std::int64_t> idsOf(NSArray* list) {
 // far. A first character whose low byte is zero, such as U+4E00, makes an empty date.
 //
 // The engine cuts these bytes again, to what it takes for their first character in UTF-8. That changes no
-// layout: dates are compared only where one of the two records is of an add-node's child, and its date is empty.
+// layout: dates are compared only where one of the two records is of an unknown parent's child, and its date is empty.
 // So all that counts is whether there are any bytes.
 std::string narrowDate(NSString* date) {
     const char* bytes = [date cStringUsingEncoding:NSUnicodeStringEncoding];

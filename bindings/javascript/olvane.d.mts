@@ -113,10 +113,10 @@ export interface PersonRecord extends BoxOfALayout {
     readonly child: null;
 }
 
-/** An add-node: an empty box, of a negative id, where no parent is known. */
+/** An unknown parent: an empty box, of a negative id, where no parent is known. */
 export interface MissingParentRecord extends BoxOfALayout {
     readonly kind: "missingFather" | "missingMother";
-    /** The person whose parent is missing. */
+    /** The person whose parent is unknown. */
     readonly child: number;
 }
 

@@ -41,7 +41,7 @@ std::vector<std::string> recordsOf(const std::string& text) {
     return records;
 }
 
-bool isSynthetic(const std::string& record) {
+bool isUnknownParent(const std::string& record) {
     return !record.empty() && record.front() == '-';
 }
 
@@ -130,7 +130,7 @@ RC_GTEST_PROP(LayoutProperties, everyAddNodeNamesItsSexAndAChildOnThePicture, ()
     std::set<std::string> shown;
     for (const std::string& record : records) shown.insert(idOf(record));
     for (const std::string& record : records) {
-        if (!isSynthetic(record)) continue;
+        if (!isUnknownParent(record)) continue;
         const std::size_t lastColon = record.rfind(':');
         const std::string sex = record.substr(lastColon - 1, 1);
         RC_ASSERT(sex == "M" || sex == "F");
@@ -143,7 +143,7 @@ RC_GTEST_PROP(LayoutProperties, theFocusStandsInTheFirstRecord, ()) {
     RC_ASSERT(idOf(recordsOf(support::layoutText(request)).front()) == std::to_string(request.focus));
 }
 
-RC_GTEST_PROP(LayoutProperties, theHostIsNeverAskedForRelativesOrSexOfASyntheticPerson, ()) {
+RC_GTEST_PROP(LayoutProperties, theHostIsNeverAskedForRelativesOrSexOfAnUnknownParent, ()) {
     const CaseFile request = drawCase(property::anyRequest(kMostPersons));
     for (const std::string& line : support::runCase(request, false, true)) {
         std::istringstream words(line);
@@ -221,7 +221,7 @@ RC_GTEST_PROP(LayoutProperties, idsRenamedInTheSameOrderGiveTheSamePicture, ()) 
         std::string places;
         for (const std::string& record : recordsOf(text)) {
             const std::size_t first = record.find(':');
-            const std::size_t end = isSynthetic(record) ? record.rfind(':') : record.size();
+            const std::size_t end = isUnknownParent(record) ? record.rfind(':') : record.size();
             places += record.substr(first, end - first) + ";";
         }
         return places;

@@ -38,7 +38,7 @@ std::string_view operationName(HostOperation operation);
 
 enum class CaseView { family, pedigree };
 
-// host: a missing parent is filled by a synthetic person. bare: a missing parent stays unset.
+// host: an unknown parent gets a negative id. bare: an unknown parent stays unset.
 enum class CaseAdapter { host, bare };
 
 // The six sizes of a drawing, in its points.

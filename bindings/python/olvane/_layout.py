@@ -65,7 +65,7 @@ def version() -> str:
 class _Answers:
     """What a host answers to C, and the first that it raised, or that a signal raised meanwhile.
 
-    It holds none of its own callbacks, so that the host is let go when the call ends, without a collector's help.
+    It holds none of its own callbacks, so that the host is released when the call ends, without a collector's help.
     """
 
     def __init__(self, host: Host) -> None:

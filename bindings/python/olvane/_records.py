@@ -15,7 +15,7 @@ class RecordKind(IntEnum):
     """Whether a record is of a person whom the host knows."""
 
     PERSON = 0
-    MISSING_FATHER = 1  # an add-node: an empty box where the host knows no father
+    MISSING_FATHER = 1  # an unknown parent: an empty box where the host knows no father
     MISSING_MOTHER = 2
 
 
@@ -31,7 +31,7 @@ class Segment(NamedTuple):
 class Record(NamedTuple):
     """One box. (x, y) is its upper-left corner, in points.
 
-    An add-node has a negative id, and child is the person whose parent is missing; elsewhere it is None. One person may
+    An unknown parent has a negative id, and child is the person whose parent is unknown; elsewhere it is None. One person may
     stand in several boxes, and segments may repeat.
     """
 

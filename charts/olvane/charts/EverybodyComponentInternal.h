@@ -12,7 +12,7 @@
 
 namespace olvane::charts {
 
-// Lists of numbers by place, in one piece of memory.
+// Lists of numbers by place, in one block of memory.
 class NumberLists {
 public:
     // Lists 0 to count - 1 from (list, value) pairs, each in the order in which forEachPair hands its pairs

@@ -35,7 +35,7 @@ GapTracks::GapTracks(Plan& plan) : plan_(plan) {
     bars_.assign(at(last - firstRow_) + 1, 0);
     overLines_ = bars_;
     for (const PlannedFamily& family : plan.families) {
-        if (family.joint != Joint::over) continue;
+        if (family.coupleLine != CoupleLine::over) continue;
         std::int32_t& lines = overLines_[rowOf(family)];
         lines = std::max<std::int32_t>(lines, family.overHeight);
     }
@@ -85,7 +85,7 @@ void GapTracks::addShortLinks(double reach) {
         if (link.drawn) topUsed_[at(plan_.boxOf[at(link.child)])] |= placeOnTop(link.shift);
     }
     for (const PlannedFamily& family : plan_.families) {
-        if (family.joint != Joint::over) continue;
+        if (family.coupleLine != CoupleLine::over) continue;
         for (const Index box : family.parents) topUsed_[at(box)] |= kOverLine;
     }
     std::sort(candidates.begin(), candidates.end(), [](const Candidate& a, const Candidate& b) {

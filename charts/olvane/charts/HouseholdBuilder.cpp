@@ -147,7 +147,7 @@ void HouseholdBuilder::joinCouples(const std::vector<Joined>& side) {
         family.parents[1] = plan_.boxOf[at(two[1])];
         family.holder = plan_.boxOf[at(one.person)];
         const Index between = std::abs(family.parents[0] - family.parents[1]) - 1;
-        family.joint = between == 0 ? Joint::direct : Joint::over;
+        family.coupleLine = between == 0 ? CoupleLine::direct : CoupleLine::over;
         families_.push_back(family);
     }
     chooseOverLines(side);
@@ -161,19 +161,19 @@ void HouseholdBuilder::chooseOverLines(const std::vector<Joined>& side) {
     const auto fromOf = [this, &side](std::size_t i) { return plan_.boxOf[at(side[i].from)]; };
     counts_.assign(plan_.persons.size() - at(firstBox_), 0);
     for (std::size_t i = 0; i < side.size(); ++i) {
-        if (own[i].joint != Joint::over) continue;
+        if (own[i].coupleLine != CoupleLine::over) continue;
         int& lines = counts_[at(fromOf(i) - firstBox_)];
         if (lines < linesThatFit(widthOf(fromOf(i)) / 2 - kLeastLineGap)) {
             own[i].overHeight = static_cast<std::uint16_t>(++lines);
         } else {
-            own[i].joint = Joint::alone;
+            own[i].coupleLine = CoupleLine::alone;
             own[i].partnersMarked = true;
         }
     }
     covered_.clear();
     for (std::size_t i = 0; i < side.size(); ++i) {
         PlannedFamily& family = own[i];
-        if (family.joint != Joint::over) continue;
+        if (family.coupleLine != CoupleLine::over) continue;
         const Index from = fromOf(i);
         const bool leftwards = family.holder < from;
         const float room = widthOf(from) / 2 - kLeastLineGap;
@@ -188,7 +188,7 @@ void HouseholdBuilder::chooseOverLines(const std::vector<Joined>& side) {
             covered_.pop_back();
         }
         if (below == kMostOverHeight) {
-            family.joint = Joint::alone;
+            family.coupleLine = CoupleLine::alone;
             family.partnersMarked = true;
             covered_.emplace_back(from, below);
             continue;
@@ -237,11 +237,11 @@ void HouseholdBuilder::addFamiliesAlone(Index box) {
 void HouseholdBuilder::placeDrops() {
     counts_.assign(plan_.persons.size() - at(firstBox_), 0);
     for (const PlannedFamily& family : families_) {
-        if (family.joint == Joint::alone) ++counts_[at(family.holder - firstBox_)];
+        if (family.coupleLine == CoupleLine::alone) ++counts_[at(family.holder - firstBox_)];
     }
     dropped_.assign(counts_.size(), 0);
     for (PlannedFamily& family : families_) {
-        if (family.joint == Joint::alone) {
+        if (family.coupleLine == CoupleLine::alone) {
             placeDropAlone(family, counts_[at(family.holder - firstBox_)],
                            dropped_[at(family.holder - firstBox_)]++);
             continue;

@@ -110,7 +110,8 @@ bool PlanBuilder::hasOverLine(Index box) const {
     for (Index family = plan_.households[at(household)].firstFamily; family < plan_.familyEnd(household);
          ++family) {
         const PlannedFamily& one = plan_.families[at(family)];
-        if (one.joint == Joint::over && (one.parents[0] == box || one.parents[1] == box)) return true;
+        if (one.coupleLine == CoupleLine::over && (one.parents[0] == box || one.parents[1] == box))
+            return true;
     }
     return false;
 }

@@ -37,12 +37,12 @@ constexpr float kLeastWidthForTwoStems = 20;
 //   direct   [A]-+-[B]        over   +-----------+       alone   [A]
 //                |                  [A]--[B]    +-[C]             |
 //                                        |      |
-enum class Joint : std::uint8_t { alone, direct, over };
+enum class CoupleLine : std::uint8_t { alone, direct, over };
 
 // A family as it shall be drawn.
 //
 // Units: points. dropX is where its line to the children leaves, from the left edge of the household.
-// Holds: parents[0] is a box; parents[1] is kNone for one shown parent. joint is alone for two parents whose
+// Holds: parents[0] is a box; parents[1] is kNone for one shown parent. coupleLine is alone for two parents whose
 //        line cannot be drawn: they get a mark, and the children hang from `holder`. Without hasDrop nothing can
 //        hang from it. Its links are Plan::links from firstLink to the next family's, children in the order of
 //        the data.
@@ -53,10 +53,10 @@ struct PlannedFamily {
     Index household = kNone;
     std::uint32_t firstLink = 0;
     float dropX = 0;
-    float departX = 0;  // joint over: where the line leaves the top of its first box, from its centre
-    std::uint16_t overHeight = 0;  // joint over: 1 for the line next to the boxes
+    float departX = 0;  // coupleLine over: where the line leaves the top of its first box, from its centre
+    std::uint16_t overHeight = 0;  // coupleLine over: 1 for the line next to the boxes
     std::uint16_t track = 0;       // of the bar, 0 for the one next to the parents
-    Joint joint = Joint::alone;
+    CoupleLine coupleLine = CoupleLine::alone;
     bool partnersMarked = false;
     bool hasDrop = true;
 };

@@ -71,7 +71,7 @@ void PlanPicture::reserve() {
     std::size_t lines = 0;
     for (Index f = 0; f < static_cast<Index>(plan_.families.size()); ++f) {
         const PlannedFamily& family = plan_.families[at(f)];
-        lines += family.joint == Joint::over ? 4 : family.joint == Joint::direct ? 1 : 0;
+        lines += family.coupleLine == CoupleLine::over ? 4 : family.coupleLine == CoupleLine::direct ? 1 : 0;
         std::size_t drawn = 0;
         for (std::uint32_t link = family.firstLink; link < plan_.linkEnd(f); ++link) {
             drawn += plan_.links[link].drawn ? 1 : 0;
@@ -168,12 +168,12 @@ void PlanPicture::addFamily(Index f) {
 
 // Returns where the line to the children starts.
 double PlanPicture::addPartnersLine(const PlannedFamily& family, std::size_t row) {
-    if (family.joint == Joint::alone) {
+    if (family.coupleLine == CoupleLine::alone) {
         return top_[row] + sizes_.height(plan_.persons[at(family.holder)]);
     }
     const Index left = std::min(family.parents[0], family.parents[1]);
     const Index right = std::max(family.parents[0], family.parents[1]);
-    if (family.joint == Joint::over) {
+    if (family.coupleLine == CoupleLine::over) {
         return addOverLine(family, row, top_[row] + sizes_.height(plan_.persons[at(family.holder)]) / 2);
     }
     const double middle =

@@ -33,7 +33,7 @@ void TidyTree::place(std::span<const Index> nodes, bool above) {
 }
 
 // How many rows each subtree has, and where its contour lies: in that of its parent's, if it is the first of its
-// deepest children, else in a new piece.
+// deepest children, else in a new block.
 void TidyTree::measure(std::span<const Index> nodes) {
     for (const Index node : nodes) rows_[at(node)] = 1;
     for (std::size_t i = nodes.size() - 1; i > 0; --i) {

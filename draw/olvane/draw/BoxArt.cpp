@@ -350,19 +350,19 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     svg += "</g>\n";
 }
 
-void appendPlaceholderBox(std::string& svg, const BoxFrame& box, const std::string& childName,
-                          const DrawingTheme& theme) {
+void appendUnknownParentBox(std::string& svg, const BoxFrame& box, const std::string& childName,
+                            const DrawingTheme& theme) {
     const bool isFather = box.box->sex == kin::Sex::male;
     const char* invitation = isFather ? "add father" : "add mother";
     const kin::Sex sex = isFather ? kin::Sex::male : kin::Sex::female;
     openBox(svg, box, std::string(invitation) + " of " + childName);
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" +
            px(cornerOf(sex)) + "\" fill=\"" + std::string(theme.page) + "\" stroke=\"" +
-           std::string(theme.placeholder) + "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n";
+           std::string(theme.unknownParent) + "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n";
     const double middleX = isWide(box) ? kInset + kSilhouetteWidth / 2 : box.width / 2;
     const double middleY = isWide(box) ? box.height / 2 : box.height / 2 - 18;
     svg += "<path d=\"M" + px(middleX - 11) + " " + px(middleY) + "h22m-11 -11v22\" stroke=\"" +
-           std::string(theme.placeholder) +
+           std::string(theme.unknownParent) +
            "\" stroke-width=\"3\" stroke-linecap=\"round\" fill=\"none\"/>\n";
     const TextRoom room = textRoomOf(box);
     const double baseline = isWide(box) ? box.height / 2 + 4 : box.height / 2 + 22;

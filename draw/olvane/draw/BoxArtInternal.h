@@ -42,7 +42,7 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
                      const DrawingTheme& theme);
 
 // The dashed box of an unknown parent; childName says whose parent.
-void appendPlaceholderBox(std::string& svg, const BoxFrame& box, const std::string& childName,
-                          const DrawingTheme& theme);
+void appendUnknownParentBox(std::string& svg, const BoxFrame& box, const std::string& childName,
+                            const DrawingTheme& theme);
 
 }  // namespace olvane::draw

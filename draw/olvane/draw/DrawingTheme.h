@@ -24,12 +24,12 @@ struct BoxColours {
 struct DrawingTheme {
     std::string_view page;
     std::string_view text;
-    std::string_view quietText;  // years, placeholders, legend
+    std::string_view quietText;  // years, words of unknown parents, legend
     std::string_view line;
     std::string_view focus;  // the border of the focus's box
     std::string_view badge;  // the marks in a box's corners
     std::string_view badgeText;
-    std::string_view placeholder;  // the dashed border of an add-node
+    std::string_view unknownParent;  // the dashed border of an unknown parent
     BoxColours male;
     BoxColours female;
     BoxColours other;

@@ -156,7 +156,7 @@ private:
     void appendBox(const BoxFrame& frame) {
         const std::size_t start = picture_.svg.size();
         if (frame.box->kind == picture::BoxKind::unknownParent) {
-            appendPlaceholderBox(picture_.svg, frame, nameOfChild(*frame.box), theme());
+            appendUnknownParentBox(picture_.svg, frame, nameOfChild(*frame.box), theme());
         } else {
             appendPersonBox(picture_.svg, frame, readableLabel(content_, frame.box->id), theme());
         }

@@ -13,10 +13,10 @@
 // order in which children are drawn.
 struct OLVANE_API ChildrenAdapter {
     int key;               // the child's person key
-    std::string date;      // the birth date, compared as bytes; empty for the child of an add-node
+    std::string date;      // the birth date, compared as bytes; empty for the child of an unknown parent
     std::string idText;    // the host's id as text
     std::string sortText;  // nothing fills it; always empty in the sets that the engine makes
-    int hostOrder;         // place in the host's list, counted from 1; 0 for the child of an add-node
+    int hostOrder;         // place in the host's list, counted from 1; 0 for the child of an unknown parent
 
     ChildrenAdapter(int childKey, std::string_view dateText, std::string_view hostId, int placeInList)
         : key(childKey), date(dateText), idText(hostId), hostOrder(placeInList) {}
@@ -28,7 +28,7 @@ struct OLVANE_API ChildrenAdapter {
     // ahead of its siblings, and the focus, whose key is 0, ahead of all of them. Otherwise the earlier date
     // first, then the lesser id text, then the lesser key.
     //
-    // The same child has unlike records in a real parent's set and in an add-node's set, and the two are
+    // The same child has unlike records in a real parent's set and in an unknown parent's set, and the two are
     // equivalent only when the real parent's record has no date either. Whether such a child counts as shared
     // by both parents hangs on that, so comparing by key alone would move half siblings in every chart with
     // an unknown parent.

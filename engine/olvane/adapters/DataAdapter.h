@@ -26,7 +26,7 @@ struct DataAdapter {
     ParentsCallback getParents;    // (key, father, mother): writes the keys of the parents that there are
     ChildrenCallback getChildren;  // (key, set): adds the person's children
     KeyTest isMale;                // true for male
-    KeyTest isAddNode;             // a synthetic person, or a key below 0
+    KeyTest isAddNode;             // an unknown parent, or a key below 0
     KeyTouch touchPerson;          // fails on a key never handed out, does nothing else
 
     DataAdapter(SpousesCallback spouses, ParentsCallback parents, ChildrenCallback children, KeyTest male,

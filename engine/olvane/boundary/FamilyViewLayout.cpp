@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // One request, from a person's id to the text of its picture. Every object of it lives in this frame and is
-// destroyed in the reverse order; nothing survives but the count of synthetic ids, which the next request
+// destroyed in the reverse order; nothing survives but the count of negative ids, which the next request
 // resets.
 
 #include <olvane/boundary/FamilyViewLayout.h>

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The road from the layouters to the data source: keys to ids and back, records from lists, and add-nodes
+// The road from the layouters to the data source: keys to ids and back, records from lists, and unknown parents
 // where a parent is not known.
 //
-// Nothing is remembered from one call to the next. A person with an unknown parent gets a new add-node at
+// Nothing is remembered from one call to the next. A person without a known parent gets a new unknown parent at
 // every look, also where only hasParents wanted to know; the ids of those that were only looked at are never
 // drawn. Keeping the first answer would hand out fewer keys, and children who are met later would change
 // their order.
@@ -24,7 +24,7 @@ namespace {
 
 typedef std::shared_ptr<OlvaneViewerManagerWrapProtocol> ManagerReference;
 
-// The next synthetic id. It only falls, one at a time; each thread counts its own, so that hosts may lay out
+// The next negative id. It only falls, one at a time; each thread counts its own, so that hosts may lay out
 // on several threads at once.
 thread_local int ADD_PARENT_ID = -1;
 
@@ -52,7 +52,7 @@ Parent parentOf(ViewerGlue& glue, std::int64_t answer) {
     return Parent{false, key};
 }
 
-// Ids below 1 mark synthetic persons, of whom the host is never asked.
+// Ids below 1 mark unknown parents, of whom the host is never asked.
 void getParents(ViewerGlue& glue, const ManagerReference& manager, int key, int& father, int& mother) {
     const int id = glue.numberOfKey(key);
     if (id < 1) return;
@@ -92,7 +92,7 @@ void getSpouses(ViewerGlue& glue, const ManagerReference& manager, int key, Spou
     source.visitSpousesOfPerson(id, PersonIdVisitor(addEntry));
 }
 
-// An add-node has one child: the person for whom it stands.
+// An unknown parent has one child: the person for whom it stands.
 void getChildOfAddNode(ViewerGlue& glue, int key, ChildrenSet& children) {
     const std::string childText = glue.childTextOfAddNode(key);
     if (childText.empty()) return;
@@ -131,7 +131,7 @@ bool isMale(const ViewerGlue& glue, const ManagerReference& manager, int key) {
 }
 
 // The writer of the result tests for an id below 0 instead. The two differ for the id 0 alone, which is
-// synthetic here and has no suffix there; hosts' parsers count on the suffix standing with negative ids only.
+// an unknown parent here and has no suffix there; hosts' parsers count on the suffix standing with negative ids only.
 bool isAddNode(const ViewerGlue& glue, int key) {
     return key < 0 || glue.numberOfKey(key) < 1;
 }
@@ -158,11 +158,11 @@ void resetAddParentId() {
     ADD_PARENT_ID = -1;
 }
 
-SyntheticIds::SyntheticIds() : before_(ADD_PARENT_ID) {
+NegativeIds::NegativeIds() : before_(ADD_PARENT_ID) {
     resetAddParentId();
 }
 
-SyntheticIds::~SyntheticIds() {
+NegativeIds::~NegativeIds() {
     ADD_PARENT_ID = before_;
 }
 

@@ -45,8 +45,8 @@ class OLVANE_API HostCallbacks {
 public:
     HostCallbacks(ViewerGlue& glue, const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& manager);
 
-    // Each person's slots are always filled: a parent whom the host does not know becomes an add-node with a
-    // new synthetic id, at every single call.
+    // Each person's slots are always filled: a parent whom the host does not know is an unknown parent with a
+    // new negative id, at every single call.
     DataAdapter::ParentsCallback getParents;
     DataAdapter::SpousesCallback getSpouses;
     DataAdapter::ChildrenCallback getChildren;
@@ -57,18 +57,18 @@ public:
     DataAdapter dataAdapter() const;
 };
 
-// Starts the synthetic ids of this thread at -1 again. First thing in every request: the ids that add-nodes
+// Starts the negative ids of this thread at -1 again. First thing in every request: the ids that unknown parents
 // get would otherwise go on from the request before. There is one count for each thread.
 OLVANE_API void resetAddParentId();
 
 // Starts them at -1 for as long as it lives, and then goes on where they were: for a layout that may run within
 // an operation of another one.
-class OLVANE_API SyntheticIds {
+class OLVANE_API NegativeIds {
 public:
-    SyntheticIds();
-    ~SyntheticIds();
-    SyntheticIds(const SyntheticIds&) = delete;
-    SyntheticIds& operator=(const SyntheticIds&) = delete;
+    NegativeIds();
+    ~NegativeIds();
+    NegativeIds(const NegativeIds&) = delete;
+    NegativeIds& operator=(const NegativeIds&) = delete;
 
 private:
     int before_;
@@ -85,7 +85,7 @@ struct ResultBounds {
 
 // A visitor for graphIterator that appends one record for each person to the text. It refers to all three.
 // Fails: std::out_of_range for a person of an unknown key, before anything is written, and for a person of
-//        negative id without an add-node record, behind its segments.
+//        negative id without a record of an unknown parent, behind its segments.
 OLVANE_API TreeViewPerson::Visitor resultWriter(ViewerGlue& glue, ResultBounds& bounds, std::string& text);
 
 // Fills the typed layout, and its text too if asked to, from a layouter that has run with this record.

@@ -27,8 +27,8 @@ private:
 // The host's data source: eight questions about persons. All that the engine knows of a family comes through
 // these.
 //
-// Units: person ids are the host's own. Real persons have ids of 1 and more; ids below 1 mark synthetic
-//        persons inside the engine. Only the low 32 bits of an id count.
+// Units: person ids are the host's own. Real persons have ids of 1 and more; ids below 1 mark unknown
+//        parents inside the engine. Only the low 32 bits of an id count.
 // Holds: asked on the caller's thread, within a layout, and many times for the same person, since no answer
 //        is kept. Answers must agree with each other within one layout. They may contradict each other
 //        otherwise (a child that does not name its parent, a person who is their own ancestor): the layout

@@ -4,7 +4,7 @@
 // The result text: one record for each person, in the order of the walk.
 //
 //     PERSON:X:Y:FLAG:SEGMENTS;                 a real person
-//     PERSON:X:Y:FLAG:SEGMENTS:SEX:CHILD;       an add-node; SEX is M or F, CHILD the person that it stands
+//     PERSON:X:Y:FLAG:SEGMENTS:SEX:CHILD;       an unknown parent; SEX is M or F, CHILD the person that it stands
 //     above
 //
 // SEGMENTS is X1,Y1,X2,Y2| for each segment, with nothing between them. All numbers are whole, cut toward

@@ -199,7 +199,7 @@ void layOut(TypedLayout::View view, std::int64_t focusId,
     result = TypedLayout();
     result.view = view;
     result.sizes = options.sizes;
-    const SyntheticIds ids;
+    const NegativeIds ids;
     ViewerGlue glue;
     const HostCallbacks callbacks(glue, manager);
     DataAdapter adapter = callbacks.dataAdapter();

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Keys by first sight, and the records of add-nodes.
+// Keys by first sight, and the records of unknown parents.
 //
 // A layout asks about eleven questions for each record that it writes, each begins with a key or a number,
-// and most of the add-nodes that it makes are never drawn. So all is kept as numbers: an array by key, and a
+// and most of the unknown parents that it makes are never drawn. So all is kept as numbers: an array by key, and a
 // hash from numbers to keys. Texts are made when somebody looks. A number stands for its plain decimal text
 // alone; "017" and "17" are two persons with one number, and such odd texts are kept apart.
 
@@ -117,7 +117,7 @@ int ViewerGlue::childNumberOfAddNode(int key) const {
     return record != nullptr ? numberOfKey(record->childKey) : stringToInt(childTextOfAddNode(key));
 }
 
-// Null where the add-node came as text, or where there is none.
+// Null where the unknown parent came as text, or where there is none.
 const ViewerGlue::AddNodeRecord* ViewerGlue::recordOfKey(int key) const {
     const int place = entryOfKey(key).addNode;
     return place != kNone ? &records_[static_cast<std::size_t>(place)] : nullptr;
@@ -146,7 +146,7 @@ void ViewerGlue::fillPersonToKey(boost::unordered_map<std::string, int>& map) co
     }
 }
 
-// An add-node is in one of the two collections, so as many entries as both have together is all of them.
+// An unknown parent is in one of the two collections, so as many entries as both have together is all of them.
 void ViewerGlue::fillAddNodes(boost::unordered_map<std::string, AddNodeValues>& map) const {
     if (map.size() == records_.size() + textAddNodes_.size()) return;
     for (const AddNodeRecord& record : records_) map.emplace(personOfKey(record.key), valuesOf(record));

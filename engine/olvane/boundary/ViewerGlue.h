@@ -14,20 +14,20 @@
 
 #include <olvane/Export.h>
 
-// A synthetic person that stands where the host knows no father or no mother.
+// An unknown parent, who stands where the host knows no father or no mother.
 struct AddNodeValues {
-    bool male = false;            // a missing father
+    bool male = false;            // an unknown father
     std::string addNodeText;      // its own id as text: "-1", "-2", ...
-    std::string childText;        // the person whose parent is missing
+    std::string childText;        // the person whose parent is unknown
     std::string otherParentText;  // that person's other parent, real or made at the same moment
 };
 
 // Between the host's ids and the keys of the graph, for the length of one request. Every person that the
-// request meets gets a key, real and synthetic ones in one sequence: 0, 1, 2, ... in order of first sight.
+// request meets gets a key, those of real persons and of unknown parents in one sequence: 0, 1, 2, ... in order of first sight.
 //
 // Holds: keyToPerson and personToKey mirror each other. Entries are never changed or removed, and only the
 //        operations here add any.
-// Fails: a look-up of an unknown key or add-node throws std::out_of_range ("Unable to find key in
+// Fails: a look-up of an unknown key or unknown parent throws std::out_of_range ("Unable to find key in
 //        unordered_map."). No text is refused a key.
 class OLVANE_API ViewerGlue {
 public:
@@ -100,7 +100,7 @@ public:
     std::string_view textOfKey(int key, DecimalBuffer& buffer) const;
     int numberOfKey(int key) const { return entryOfKey(key).number; }
 
-    // The first record of an add-node stands; a later one for the same text is dropped.
+    // The first record of an unknown parent stands; a later one for the same text is dropped.
     void addAddNodeValue(const std::string& addNodeText, bool male, const std::string& childText,
                          const std::string& otherParentText);
     AddNodeValues getAddNodeValue(std::string personText) const;

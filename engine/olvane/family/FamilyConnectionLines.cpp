@@ -6,12 +6,12 @@
 //
 //        [F]---+---[M]      marriage line at mid-height, the drop in the gap between the two
 //              |
-//        +-----+-----+      the bus, at half the gap between generations
+//        +-----+-----+      the bar, at half the gap between generations
 //        |           |
 //       [P]         [B]     a stem for each child
 //
-// A child of one parent hangs from the bottom centre of that parent, and its bus runs at a quarter of the
-// gap, which keeps it apart from the buses of the couples. The shapes seen from below (a person's own
+// A child of one parent hangs from the bottom centre of that parent, and its bar runs at a quarter of the
+// gap, which keeps it apart from the bars of the couples. The shapes seen from below (a person's own
 // parents, its siblings) cut more of their numbers to whole points than those seen from above; hosts know the
 // lines by these numbers.
 //
@@ -100,7 +100,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfLoneParent(Tre
     drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = at.y + treeSize.nodeHeight;
-    drop.busY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
+    drop.barY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
     return drop;
 }
 
@@ -113,11 +113,11 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfCouple(TreeVie
     drop.x = person.gender ? at.x + treeSize.horzPadding * -0.5f
                            : treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = person.getSpouseLine(spouse.personId).y1;
-    drop.busY = at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f;
+    drop.barY = at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f;
     return drop;
 }
 
-// Drop, bus and stem in this order: each joins the course at its end. A stem right below the drop gives a bus
+// Drop, bar and stem in this order: each joins the course at its end. A stem right below the drop gives a bar
 // of no length, which is drawn like any other.
 TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder,
                                                     TreeViewPerson& child) const {
@@ -125,14 +125,14 @@ TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPe
     const float stemX = cutToWholePoint(at.x + treeSize.nodeWidth * 0.5f);
     TreeLine line;
     LineCourse course(line);
-    course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
-    course.draw(child, stemX, drop.busY, drop.x, drop.busY);
-    course.draw(child, stemX, at.y, stemX, drop.busY);
+    course.draw(holder, drop.x, drop.startY, drop.x, drop.barY);
+    course.draw(child, stemX, drop.barY, drop.x, drop.barY);
+    course.draw(child, stemX, at.y, stemX, drop.barY);
     if (lineRecord != nullptr) lineRecord->addChildLines(holder, child, *drop.parent, drop.other);
     return line;
 }
 
-// From a father's mid-height, in the gap at his right, down to the bus of a couple's children.
+// From a father's mid-height, in the gap at his right, down to the bar of a couple's children.
 TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(TreeViewPerson& father,
                                                                     TreeViewPerson* mother) const {
     const TreePoint at = father.getNodeCenter();
@@ -141,7 +141,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(TreeViewPers
     drop.other = mother;
     drop.x = treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight * 0.5f);
-    drop.busY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
+    drop.barY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
     return drop;
 }
 
@@ -152,7 +152,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromSingleParent(TreeVi
     drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight);
-    drop.busY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
+    drop.barY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
     return drop;
 }
 
@@ -252,7 +252,7 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
 }
 
 // The one marriage line of a couple that stands on the chart as somebody's parents and not as each other's
-// spouses. Its ends keep their fractions in x. Whether the father is an add-node is asked and changes
+// spouses. Its ends keep their fractions in x. Whether the father is an unknown parent is asked and changes
 // nothing: the look-up that it makes fails on a key that was never handed out.
 void TreeViewFamilyLayouter::drawParentsMarriageLine(TreeViewPerson& father, TreeViewPerson& mother,
                                                      const Drop& drop) {

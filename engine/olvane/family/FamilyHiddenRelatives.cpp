@@ -6,7 +6,7 @@
 // compares every real person with the whole display and has the last word.
 //
 // All of them stay although the final pass replaces most answers: they fill what the nodes keep of the data
-// source's answers, they use up synthetic ids in a fixed order, and they alone decide about add-nodes.
+// source's answers, they use up negative ids in a fixed order, and they alone decide about unknown parents.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/graph/PersonWalksInternal.h>

@@ -116,7 +116,7 @@ void TreeViewFamilyLayouter::layoutChildrenAndPersonWithNonCombinedSpouse(TreeVi
 }
 
 // The children start at the left edge of the span. They come out under the middle of the pair all the same:
-// the span is as wide as their block wherever that is wider than the couple, and a lone child was widened for
+// the span is as wide as their block wherever that is wider than the couple, and an only child was widened for
 // this.
 float TreeViewFamilyLayouter::layoutTraditionalHusbandAndWife(TreeViewPerson& husband, TreeViewPerson& wife,
                                                               const Iterator& children, float x, float y) {

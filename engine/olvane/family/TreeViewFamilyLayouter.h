@@ -86,11 +86,11 @@ public:
     std::vector<TreeViewPerson*> stackedPersons;  // not owned; filled and emptied while flags are set
 
 private:
-    // The vertical piece from which a child's bus and stem hang, and the parents whose it is.
+    // The vertical piece from which a child's bar and stem hang, and the parents whose it is.
     struct Drop {
         float x;
         float startY;
-        float busY;
+        float barY;
         TreeViewPerson* parent;
         TreeViewPerson* other = nullptr;  // null for a lone parent
     };

@@ -76,42 +76,42 @@ float TreeLine::length() {
 
 namespace {
 
-enum class Joint { none, front, back };
+enum class JoinedEnd { none, front, back };
 
 // Where the candidate may join the line. The first end that meets settles it, even when the directions then
 // refuse the join: no later end of the same candidate is tried.
-Joint jointFor(const TreeLine& line, const TreeLineSegment& candidate) {
-    const auto unlessSame = [](int lineCode, int candidateCode, Joint joint) {
-        return lineCode != candidateCode ? joint : Joint::none;
+JoinedEnd joinedEndFor(const TreeLine& line, const TreeLineSegment& candidate) {
+    const auto unlessSame = [](int lineCode, int candidateCode, JoinedEnd end) {
+        return lineCode != candidateCode ? end : JoinedEnd::none;
     };
     const TreePoint front = line.first();
     const TreePoint back = line.last();
     if (candidate.firstEnd() == front) {
         return unlessSame(line.frontLineSegment().directionFromX1Y1(), candidate.directionFromX1Y1(),
-                          Joint::front);
+                          JoinedEnd::front);
     }
     if (candidate.secondEnd() == front) {
         return unlessSame(line.frontLineSegment().directionFromX1Y1(), candidate.directionFromX2Y2(),
-                          Joint::front);
+                          JoinedEnd::front);
     }
     if (candidate.firstEnd() == back) {
         return unlessSame(line.backLineSegment().directionFromX2Y2(), candidate.directionFromX1Y1(),
-                          Joint::back);
+                          JoinedEnd::back);
     }
     if (candidate.secondEnd() == back) {
         return unlessSame(line.backLineSegment().directionFromX2Y2(), candidate.directionFromX2Y2(),
-                          Joint::back);
+                          JoinedEnd::back);
     }
-    return Joint::none;
+    return JoinedEnd::none;
 }
 
 // Joins the first segment that may join, takes it out of the list, and says whether there was one.
 bool growByOneSegment(TreeLine& line, std::vector<TreeLineSegment>& segments) {
     for (auto candidate = segments.begin(); candidate != segments.end(); ++candidate) {
-        const Joint joint = jointFor(line, *candidate);
-        if (joint == Joint::none) continue;
-        const bool joined = joint == Joint::front ? line.addLineSegmentFront(*candidate)
-                                                  : line.addLineSegmentBack(*candidate);
+        const JoinedEnd end = joinedEndFor(line, *candidate);
+        if (end == JoinedEnd::none) continue;
+        const bool joined = end == JoinedEnd::front ? line.addLineSegmentFront(*candidate)
+                                                    : line.addLineSegmentBack(*candidate);
         if (!joined) {
             throw std::logic_error(
                 "logic error: The position returned by find_if should agree with addLine()");

@@ -92,7 +92,7 @@ private:
     void pushFarPointBack(TreePoint point);
     [[noreturn]] static void failAsTooShort();
 
-    static constexpr std::uint8_t kUsualPoints = 4;  // of a drop, a bus and a stem
+    static constexpr std::uint8_t kUsualPoints = 4;  // of a drop, a bar and a stem
 
     // A line that is moved away keeps the points in near_, so it stays whole whatever it had.
     TreePoint near_[kUsualPoints];

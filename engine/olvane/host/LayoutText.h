@@ -25,10 +25,10 @@ struct LayoutSegment {
     bool operator==(const LayoutSegment&) const = default;
 };
 
-// What only the record of an add-node states: whom it stands for.
+// What only the record of an unknown parent states: whom it stands for.
 struct AddNodeSuffix {
-    bool male = false;         // a missing father; else a missing mother
-    std::int64_t childId = 0;  // the person whose parent is missing
+    bool male = false;         // an unknown father; else an unknown mother
+    std::int64_t childId = 0;  // the person whose parent is unknown
 
     bool operator==(const AddNodeSuffix&) const = default;
 };

@@ -6,9 +6,9 @@
 // who a half sibling.
 //
 // Two things here look wasteful and are not. Parents are asked for again at every look: each answer for a
-// person with an unknown parent makes new synthetic keys, and the keys of everybody met later, and with them
+// person with an unknown parent makes new keys, and the keys of everybody met later, and with them
 // the order of children, depend on how many were made. And a child is looked up by the order of its records,
-// not by its key: the record from a real parent and the one from an add-node differ where there is a birth
+// not by its key: the record from a real parent and the one from an unknown parent differ where there is a birth
 // date, so such a child counts as a child of the real parent alone.
 
 #include <olvane/layouter/TreeViewLayouter.h>

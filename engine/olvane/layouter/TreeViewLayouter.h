@@ -85,7 +85,7 @@ public:
     // Siblings and half siblings through the person's preferred parents, with an entry for the person itself.
     void addSiblingsToPerson(TreeViewPerson& person);
     void addParentsToPerson(TreeViewPerson& person);
-    // A real parent is known. Uses up a synthetic id for each parent that is not.
+    // A real parent is known. Uses up a negative id for each parent that is not.
     bool hasParents(TreeViewPerson& person);
     // The child belongs under the couple of person and other: its parents are the two, or none of its keys
     // has been admitted yet.

@@ -70,27 +70,28 @@ void TreeViewPedigreeLayouter::addPedigreeChildLine(TreeViewPerson& focus, TreeV
     TreeLine line;
     LineCourse course(line);
     if (spouse.personId == focus.personId) {
-        const TreePoint joint{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
-        course.draw(spouse, at.x, joint.y, joint.x, joint.y);
-        joinChild(course, child, joint);
+        const TreePoint junction{at.x + treeSize.horzPadding * -0.25f, at.y + treeSize.nodeHeight * 0.5f};
+        course.draw(spouse, at.x, junction.y, junction.x, junction.y);
+        joinChild(course, child, junction);
         if (lineRecord != nullptr) lineRecord->addChildLines(spouse, child, spouse, nullptr);
         focus.addGenerationEdge(makeGenerationEdge(std::move(line), child, &focus));
     } else {
-        const TreePoint joint{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
+        const TreePoint junction{at.x + treeSize.horzPadding * -0.5f, at.y + treeSize.vertPadding * -0.5f};
         const float lineX = focus.getSpouseLine(spouse.personId).x1;
-        course.draw(spouse, lineX, joint.y, joint.x, joint.y);
-        joinChild(course, child, joint);
+        course.draw(spouse, lineX, junction.y, junction.x, junction.y);
+        joinChild(course, child, junction);
         if (lineRecord != nullptr) lineRecord->addChildLines(spouse, child, focus, &spouse);
         TreeViewSpouseEdge* const couple = spouse.spouseEdge(&focus, TreeLine());
         couple->addChildEdge(makeGenerationEdge(std::move(line), child, couple));
     }
 }
 
-void TreeViewPedigreeLayouter::joinChild(LineCourse& course, TreeViewPerson& child, TreePoint joint) const {
+void TreeViewPedigreeLayouter::joinChild(LineCourse& course, TreeViewPerson& child,
+                                         TreePoint junction) const {
     const TreePoint at = child.getNodeCenter();
     const float middleY = cutToWholePoint(at.y + treeSize.nodeHeight * 0.5f);
-    course.draw(child, joint.x, middleY, joint.x, joint.y);
-    course.draw(child, at.x + treeSize.nodeWidth, middleY, joint.x, middleY);
+    course.draw(child, junction.x, middleY, junction.x, junction.y);
+    course.draw(child, at.x + treeSize.nodeWidth, middleY, junction.x, middleY);
 }
 
 void TreeViewPedigreeLayouter::addParentLinesForPerson(TreeViewPerson& person) {

@@ -83,7 +83,7 @@ private:
     void addPedigreeSpouseLine(TreeViewPerson& focus, TreeViewPerson& spouse, int& spouseBaseX,
                                int spouseStep);
     void addPedigreeChildLine(TreeViewPerson& focus, TreeViewPerson& child, TreeViewPerson& spouse);
-    void joinChild(LineCourse& course, TreeViewPerson& child, TreePoint joint) const;
+    void joinChild(LineCourse& course, TreeViewPerson& child, TreePoint junction) const;
     void addCoupleLines(TreeViewPerson& person, TreeViewPerson& father, TreeViewPerson& mother);
     void addSingleParentLines(TreeViewPerson& person, TreeViewPerson& parent);
 

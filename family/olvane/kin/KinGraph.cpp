@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Builds the arrays by counting: first how long each list is, then where it starts, then its entries. So each
-// list lies in one piece, and nothing is sorted but the few lists whose order was given.
+// list lies in one block, and nothing is sorted but the few lists whose order was given.
 
 #include <olvane/kin/KinGraph.h>
 

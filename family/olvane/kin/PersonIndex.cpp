@@ -227,10 +227,10 @@ std::vector<PersonIndex::Term> PersonIndex::termsOf(std::string_view text) const
             Term& before = terms.back();
             const char* const end = word.written.data();
             const std::size_t start = static_cast<std::size_t>(end - text.data());
-            const std::string_view joint = text.substr(0, start);
+            const std::string_view prefix = text.substr(0, start);
             const bool isRange = before.firstYear == before.lastYear &&
-                                 (joint.ends_with("-") || joint.ends_with("\u2013")) &&
-                                 !joint.ends_with(" -");
+                                 (prefix.ends_with("-") || prefix.ends_with("\u2013")) &&
+                                 !prefix.ends_with(" -");
             if (isRange) {
                 before.lastYear = yearOf(word.folded);
                 if (before.lastYear < before.firstYear) std::swap(before.firstYear, before.lastYear);

@@ -83,7 +83,7 @@ struct FamilyLink {
     LineNumber line = 0;
     Pedigree pedigree =
         Pedigree::notGiven;  // of a child: of the PEDI, else of an ADOP or of the family's _FREL and _MREL
-    bool isFamilysAlone = false;  // the family names the person, not the other way round
+    bool isNamedByFamilyOnly = false;  // the family names the person, not the other way round
 };
 
 // A family's child: a CHIL, or the child's FAMC where the family does not name the child. child is 0 for a void pointer
@@ -92,7 +92,7 @@ struct ChildLink {
     PersonId child = 0;
     LineNumber line = 0;
     Pedigree pedigree = Pedigree::notGiven;  // of a CHIL: what its _FREL and _MREL say
-    bool isChildsAlone = false;              // the child names the family, not the other way round
+    bool isNamedByChildOnly = false;         // the child names the family, not the other way round
 };
 
 // A family. The first two partners alone count; husband is the father, wife the mother. Two HUSB, or two WIFE, stand in

@@ -34,11 +34,11 @@ constexpr bool isWordLetter(char c) {
     return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || static_cast<unsigned char>(c) >= 0x80;
 }
 
-constexpr bool isJoint(char c) {
+constexpr bool isSeparator(char c) {
     return c == '.' || c == '-' || c == '/';
 }
 
-enum class CharacterSort : unsigned char { other, space, letter, digit, joint };
+enum class CharacterSort : unsigned char { other, space, letter, digit, separator };
 
 constexpr auto kSorts = [] {
     std::array<CharacterSort, 256> sorts{};
@@ -47,7 +47,7 @@ constexpr auto kSorts = [] {
         if (isSpace(character)) sorts[c] = CharacterSort::space;
         if (isDigit(character)) sorts[c] = CharacterSort::digit;
         if (isWordLetter(character)) sorts[c] = CharacterSort::letter;
-        if (isJoint(character)) sorts[c] = CharacterSort::joint;
+        if (isSeparator(character)) sorts[c] = CharacterSort::separator;
     }
     return sorts;
 }();
@@ -78,7 +78,7 @@ private:
     void findWord() {
         while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
         CharacterSort last = CharacterSort::space;  // of the last letter or digit
-        bool isClose = false;                       // it stands here but for one joint
+        bool isClose = false;                       // it stands here but for one separator
         for (wordLength_ = 0; wordLength_ < rest_.size(); ++wordLength_) {
             const CharacterSort sort = kSorts[static_cast<unsigned char>(rest_[wordLength_])];
             if (sort == CharacterSort::space) return;
@@ -87,7 +87,7 @@ private:
                 last = sort;
                 isClose = true;
             } else {
-                isClose = isClose && sort == CharacterSort::joint && !isJoint(rest_[wordLength_ - 1]);
+                isClose = isClose && sort == CharacterSort::separator && !isSeparator(rest_[wordLength_ - 1]);
             }
         }
     }
@@ -276,12 +276,12 @@ bool readIsoDate(std::string_view word, ReadDate& result) {
     return true;
 }
 
-// Numbers between joints of one sort: "06.05.1900", "24/01/1915", "1915/1/24", "01/1915".
+// Numbers between separators of one sort: "06.05.1900", "24/01/1915", "1915/1/24", "01/1915".
 struct NumberGroups {
     std::array<int, 3> values{};
     std::array<std::size_t, 3> digits{};
     std::size_t count = 0;
-    char joint = '\0';
+    char separator = '\0';
 };
 
 std::optional<NumberGroups> readGroups(std::string_view word) {
@@ -295,8 +295,9 @@ std::optional<NumberGroups> readGroups(std::string_view word) {
         groups.digits[groups.count++] = length;
         word.remove_prefix(length);
         if (word.empty() || (word == "." && groups.count == 3)) break;
-        if (!isJoint(word.front()) || (groups.joint != '\0' && groups.joint != word.front())) return {};
-        groups.joint = word.front();
+        if (!isSeparator(word.front()) || (groups.separator != '\0' && groups.separator != word.front()))
+            return {};
+        groups.separator = word.front();
         word.remove_prefix(1);
     }
     return word.size() <= 1 && groups.count >= 2 ? std::optional(groups) : std::nullopt;
@@ -307,7 +308,7 @@ std::optional<NumberGroups> readGroups(std::string_view word) {
 bool readDayMonthYear(const NumberGroups& groups, ReadDate& result) {
     const auto [first, second, year] = groups.values;
     const bool secondIsMonth = second >= 1 && second <= 12;
-    const bool either = groups.joint != '.' && first <= 12 && first != second;
+    const bool either = groups.separator != '.' && first <= 12 && first != second;
     if (year == 0 || first < 1 || first > 31 || second < 1 || second > 31 || (first > 12 && !secondIsMonth))
         return false;
     result.yearAlone = !secondIsMonth || either;
@@ -339,8 +340,9 @@ bool readNumericDate(std::string_view word, ReadDate& result) {
 bool takeNumericDate(Words& words, ReadDate& result) {
     constexpr std::size_t kDayDigits = 2;
     const std::string_view word = words.peek();
-    const bool mayHaveJoint = isDigit(words.front()) && (word.size() > kDayDigits || isJoint(word.back()));
-    if (!mayHaveJoint || std::none_of(word.begin(), word.end(), isJoint)) return false;
+    const bool mayHaveJoint =
+        isDigit(words.front()) && (word.size() > kDayDigits || isSeparator(word.back()));
+    if (!mayHaveJoint || std::none_of(word.begin(), word.end(), isSeparator)) return false;
     if (readNumericDate(words.peek(), result)) {
         words.skip();
         return true;
@@ -358,7 +360,7 @@ bool takeNumericDate(Words& words, ReadDate& result) {
 std::optional<int> takeDay(Words& words) {
     std::string_view word = words.peek();
     if (!isDigit(words.front())) return {};
-    while (isJoint(word.back()) || word.back() == ',') word.remove_suffix(1);
+    while (isSeparator(word.back()) || word.back() == ',') word.remove_suffix(1);
     const auto day = wholeNumber(word, 2);
     if (!day) return {};
     const bool isOrdinal = words.rest().size() > word.size() && isWordLetter(words.rest()[word.size()]);

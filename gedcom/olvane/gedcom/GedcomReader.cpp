@@ -9,14 +9,14 @@
 #include <memory>
 #include <utility>
 
-#include <olvane/gedcom/DetailKeeperInternal.h>
+#include <olvane/gedcom/DetailReaderInternal.h>
 #include <olvane/gedcom/DiagnosticListInternal.h>
 #include <olvane/gedcom/GedcomArchiveInternal.h>
 #include <olvane/gedcom/LineScannerInternal.h>
 #include <olvane/gedcom/LinkResolverInternal.h>
 #include <olvane/gedcom/RecordReaderInternal.h>
 #include <olvane/gedcom/TextEncodingInternal.h>
-#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/TextInternerInternal.h>
 #include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
@@ -31,9 +31,9 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     const auto xrefs = std::make_shared<XrefTable>();
     GedcomTables tables;
     LineScanner scanner(store->bytes, diagnostics);
-    TextKeeper keeper(*store, form, diagnostics);
-    DetailKeeper details(scanner, keeper, tables);
-    RecordReader records(scanner, keeper, tables, *xrefs, diagnostics, options.facts || options.details,
+    TextInterner interner(*store, form, diagnostics);
+    DetailReader details(scanner, interner, tables);
+    RecordReader records(scanner, interner, tables, *xrefs, diagnostics, options.facts || options.details,
                          options.details ? &details : nullptr);
     if (!records.readAll()) throw GedcomError(name, "holds nothing that looks like GEDCOM");
     resolveLinks(tables, *xrefs, diagnostics);

@@ -10,7 +10,7 @@
 
 namespace olvane::gedcom {
 
-class NameSpotter;
+class NameFinder;
 
 // The names of hidden persons, and which texts about others may be shown beside them: the rules that GedcomWriter.h
 // states, for whatever else shows texts of a file.
@@ -24,7 +24,7 @@ public:
     // hidden: an entry for each person, entry 0 for person 1; empty for nobody.
     HiddenNames(const GedcomData& data, const std::vector<bool>& hidden);
 
-    bool isAnybodyHidden() const { return spotter_ != nullptr; }
+    bool isAnybodyHidden() const { return finder_ != nullptr; }
 
     // A place or a date, which may bear a name by chance: nothing where it names somebody hidden, by a given name or
     // nickname and a surname; else the text.
@@ -34,7 +34,7 @@ public:
     std::string_view shownText(std::string_view text) const;
 
 private:
-    std::shared_ptr<const NameSpotter> spotter_;
+    std::shared_ptr<const NameFinder> finder_;
 };
 
 }  // namespace olvane::gedcom

@@ -114,7 +114,7 @@ Sex sexOf(std::string_view value) {
     return Sex::other;
 }
 
-// An older custom.
+// Before 7.0, the value N negates the event.
 bool didNotHappen(const GedcomLine& line) {
     return trimmed(line.value) == "N";
 }
@@ -149,7 +149,7 @@ Pedigree tieOf(std::string_view value) {
 // text will take if it goes on so, and at least to twice its size: a big list moves once instead of many
 // times.
 template <typename Item>
-void addForeseeing(std::vector<Item>& list, const Item& item, double share) {
+void appendWithGrowthEstimate(std::vector<Item>& list, const Item& item, double share) {
     constexpr double kEnoughToJudge = 1.0 / 64;
     constexpr double kMargin = 1.05;
     if (list.size() == list.capacity() && share > kEnoughToJudge) {
@@ -295,7 +295,7 @@ void RecordReader::endRecord() {
 // The place of the record's identifier, which is now known to have a record; null if it has none.
 XrefTable::Entry* RecordReader::claimXref(const GedcomLine& line) {
     if (line.xref.empty()) return nullptr;
-    XrefTable::Entry& entry = xrefs_.at(xrefs_.place(keeper_.keep(line.xref, line.number)));
+    XrefTable::Entry& entry = xrefs_.at(xrefs_.place(interner_.keep(line.xref, line.number)));
     if (entry.line != 0) {
         diagnostics_.add(DiagnosticKind::duplicateXref, Severity::warning, line.number,
                          "identifier already used in line " + std::to_string(entry.line),
@@ -311,11 +311,11 @@ void RecordReader::beginPerson(const GedcomLine& line) {
     sexRead_ = false;
     Person fresh;
     fresh.line = line.number;
-    fresh.xref = keeper_.keep(line.xref, line.number);
+    fresh.xref = interner_.keep(line.xref, line.number);
     fresh.nameSlice.first = static_cast<std::uint32_t>(tables_.names.size());
     fresh.parentLinkSlice.first = static_cast<std::uint32_t>(tables_.parentLinks.size());
     fresh.coupleLinkSlice.first = static_cast<std::uint32_t>(tables_.coupleLinks.size());
-    addForeseeing(tables_.persons, fresh, scanner_.share());
+    appendWithGrowthEstimate(tables_.persons, fresh, scanner_.share());
     if (keepsFacts_) tables_.factsOfPersons.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
     if (details_ != nullptr) details_->beginPerson();
     XrefTable::Entry* entry = claimXref(line);
@@ -348,9 +348,9 @@ void RecordReader::beginFamily(const GedcomLine& line) {
     wives_ = {};
     Family fresh;
     fresh.line = line.number;
-    fresh.xref = keeper_.keep(line.xref, line.number);
+    fresh.xref = interner_.keep(line.xref, line.number);
     fresh.childLinkSlice.first = static_cast<std::uint32_t>(tables_.childLinks.size());
-    addForeseeing(tables_.families, fresh, scanner_.share());
+    appendWithGrowthEstimate(tables_.families, fresh, scanner_.share());
     if (keepsFacts_) tables_.factsOfFamilies.push_back({static_cast<std::uint32_t>(tables_.facts.size()), 0});
     if (details_ != nullptr) details_->beginFamily();
     XrefTable::Entry* entry = claimXref(line);
@@ -497,7 +497,7 @@ void RecordReader::addFurtherName(const GedcomLine& line, std::string_view type)
     if (!value.empty()) furtherNames_.push_back({value, type});
 }
 
-void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint) {
+void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator) {
     const std::string_view more = keptValue(line);
     if (more.empty()) return;
     if (piece.first.empty()) {
@@ -505,12 +505,12 @@ void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::stri
         return;
     }
     if (piece.joined.empty()) piece.joined = piece.first;
-    piece.joined += joint;
+    piece.joined += separator;
     piece.joined += more;
 }
 
 std::string_view RecordReader::keptPiece(const PieceDraft& piece) {
-    return piece.joined.empty() ? piece.first : keeper_.keepMade(piece.joined);
+    return piece.joined.empty() ? piece.first : interner_.keepMade(piece.joined);
 }
 
 void RecordReader::endName() {
@@ -530,7 +530,7 @@ void RecordReader::endName() {
     name.nickname = keptPiece(name_.nickname);
     name.type = name_.type;
     fillFromSlashes(name);
-    addForeseeing(tables_.names, name, scanner_.share());
+    appendWithGrowthEstimate(tables_.names, name, scanner_.share());
     ++person().nameSlice.count;
     addFurtherNames(name.given);
 }
@@ -549,7 +549,7 @@ void RecordReader::addFurtherNames(std::string_view given) {
             name.written = further.value;
             fillFromSlashes(name);
         }
-        addForeseeing(tables_.names, name, scanner_.share());
+        appendWithGrowthEstimate(tables_.names, name, scanner_.share());
         ++person().nameSlice.count;
     }
     furtherNames_.clear();
@@ -647,7 +647,7 @@ void RecordReader::settlePartners() {
 
 XrefPlace RecordReader::readPointer(const GedcomLine& line) {
     const std::string_view xref = pointedXref(line);
-    return xref.empty() || xref == kVoid ? 0 : xrefs_.place(keeper_.keep(xref, line.number));
+    return xref.empty() || xref == kVoid ? 0 : xrefs_.place(interner_.keep(xref, line.number));
 }
 
 // Empty if there is none. A void pointer is as good as none, and needs no word.

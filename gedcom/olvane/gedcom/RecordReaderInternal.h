@@ -9,10 +9,10 @@
 #include <string_view>
 #include <vector>
 
-#include <olvane/gedcom/DetailKeeperInternal.h>
+#include <olvane/gedcom/DetailReaderInternal.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/LineScannerInternal.h>
-#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/TextInternerInternal.h>
 #include <olvane/gedcom/XrefTableInternal.h>
 
 namespace olvane::gedcom {
@@ -24,10 +24,10 @@ namespace olvane::gedcom {
 //        an XrefPlace. Spouses, children, fathers and mothers are not filled in here.
 class RecordReader {
 public:
-    RecordReader(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables, XrefTable& xrefs,
-                 DiagnosticList& diagnostics, bool keepsFacts, DetailKeeper* details)
+    RecordReader(LineScanner& scanner, TextInterner& interner, GedcomTables& tables, XrefTable& xrefs,
+                 DiagnosticList& diagnostics, bool keepsFacts, DetailReader* details)
         : scanner_(scanner),
-          keeper_(keeper),
+          interner_(interner),
           tables_(tables),
           xrefs_(xrefs),
           diagnostics_(diagnostics),
@@ -92,7 +92,7 @@ private:
 
     void beginName(const GedcomLine& line);
     void readNamePiece(const GedcomLine& line, std::uint64_t tag);
-    void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view joint);
+    void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator);
     std::string_view keptPiece(const PieceDraft& piece);
     void addFurtherName(const GedcomLine& line, std::string_view type);
     void addFurtherNames(std::string_view given);
@@ -116,18 +116,18 @@ private:
     std::string_view pointedXref(const GedcomLine& line);
 
     std::string_view keptValue(const GedcomLine& line) {
-        return keeper_.keep(scanner_.wholeValue(line), line.number);
+        return interner_.keep(scanner_.wholeValue(line), line.number);
     }
     Person& person() { return tables_.persons.back(); }
     Family& family() { return tables_.families.back(); }
 
     LineScanner& scanner_;
-    TextKeeper& keeper_;
+    TextInterner& interner_;
     GedcomTables& tables_;
     XrefTable& xrefs_;
     DiagnosticList& diagnostics_;
     bool keepsFacts_;
-    DetailKeeper* details_;  // null if no details are kept
+    DetailReader* details_;  // null if no details are kept
 
     Record record_ = Record::other;
     std::uint64_t fact_ = 0;          // tag of the line on level 1 that the one in hand lies under

@@ -181,7 +181,7 @@ describe("opening", kTwoAtOnce, () => {
         assert.equal(await visit.focus(), "2");
         assert.equal(await visit.page.title(), "Bea Second");
         assert.match(await visit.page.textContent("#diagnostics"), /line 4.*no line/);
-        assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can mend the file");
+        assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can fix the file");
         await visit.end();
         execFileSync(command, ["page", file, "-o", page], { stdio: "ignore" });
         const plain = await visitFile(page);

@@ -70,7 +70,7 @@ describe("speed", () => {
         context.diagnostic(`${boxes} boxes: a step of a drag takes ${median.toFixed(1)} ms, the worst ${worst.toFixed(0)} ms`);
         assert.ok(median < 16 * kPatience, `${median} ms`);
         await visit.click("#fit");
-        await photograph(visit, "crowd");
+        await photograph(visit, "overview");
         await visit.end();
     });
 

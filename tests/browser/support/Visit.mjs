@@ -173,7 +173,7 @@ export class Visit {
         await this.still();
     }
 
-    /** Upper left corners of all boxes, relative to the focus's, by record. Add-nodes go by their label. */
+    /** Upper left corners of all boxes, relative to the focus's, by record. Unknown parents go by their label. */
     async places() {
         return this.page.evaluate(() => {
             const placeOf = (box) => /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);

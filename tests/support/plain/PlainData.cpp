@@ -67,8 +67,8 @@ const std::string& Data::textOf(int key) const {
     return texts.at(static_cast<std::size_t>(key));
 }
 
-const Synthetic& Data::synthetic(const std::string& idText) const {
-    return synthetics.at(idText);
+const UnknownParent& Data::unknownParent(const std::string& idText) const {
+    return unknownParents.at(idText);
 }
 
 void Data::spouses(int key, std::set<SpouseRecord>& records) {
@@ -88,7 +88,7 @@ void Data::spouses(int key, std::set<SpouseRecord>& records) {
     }
 }
 
-// A missing parent's key is taken between the two questions, so that it lies before the mother's.
+// An unknown parent's key is taken between the two questions, so that it lies before the mother's.
 void Data::parents(int key, int& father, int& mother) {
     const std::string text = textOf(key);
     const int id = idOf(text);
@@ -101,29 +101,29 @@ void Data::parents(int key, int& father, int& mother) {
     const int motherKey = parentKey(host.motherForPersonWithID(id), madeMother);
     if (motherKey != kNoKey) mother = motherKey;
 
-    if (!madeFather.empty()) enterSynthetic(madeFather, true, text);
-    if (!madeMother.empty()) enterSynthetic(madeMother, false, text);
+    if (!madeFather.empty()) enterUnknownParent(madeFather, true, text);
+    if (!madeMother.empty()) enterUnknownParent(madeMother, false, text);
 }
 
-// idText is written only for a synthetic parent; the result is kNoKey where the parent stays unset.
+// idText is written only for an unknown parent; the result is kNoKey where the parent stays unset.
 int Data::parentKey(std::int64_t answer, std::string& idText) {
     if (answer != support::kNotFound) return keyOf(std::to_string(cutId(answer)));
     if (adapter == support::CaseAdapter::bare) return kNoKey;
-    idText = std::to_string(nextSyntheticId);
-    --nextSyntheticId;
+    idText = std::to_string(nextNegativeId);
+    --nextNegativeId;
     return keyOf(idText);
 }
 
 // The first record of an id stands.
-void Data::enterSynthetic(const std::string& idText, bool male, const std::string& childText) {
-    synthetics.emplace(idText, Synthetic{male, childText});
+void Data::enterUnknownParent(const std::string& idText, bool male, const std::string& childText) {
+    unknownParents.emplace(idText, UnknownParent{male, childText});
 }
 
 void Data::children(int key, std::set<ChildRecord>& records) {
     const std::string text = textOf(key);
     const int id = idOf(text);
     if (id < 1) {
-        const std::string childText = synthetic(text).childText;
+        const std::string childText = unknownParent(text).childText;
         if (!childText.empty()) records.insert(ChildRecord{keyOf(childText), "", childText, 0});
         return;
     }
@@ -142,7 +142,7 @@ void Data::children(int key, std::set<ChildRecord>& records) {
 bool Data::isMale(int key) {
     const std::string text = textOf(key);
     const int id = idOf(text);
-    return id >= 1 ? host.sexOfPersonWithID(id) == 0 : synthetic(text).male;
+    return id >= 1 ? host.sexOfPersonWithID(id) == 0 : unknownParent(text).male;
 }
 
 bool Data::isAddNode(int key) const {

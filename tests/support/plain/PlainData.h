@@ -13,16 +13,16 @@
 namespace plain {
 
 // A parent that the host does not know, standing on the chart with a negative id.
-struct Synthetic {
+struct UnknownParent {
     bool male = false;
     std::string childText;
 };
 
 // The host's answers in terms of keys: dense numbers from 0 in order of first sight.
 //
-// Holds: nothing is remembered but the keys and the synthetic persons, so each question goes to the host
-//        again, and each question for the parents of a person who lacks one makes new synthetic persons.
-// Fails: std::out_of_range for a key never handed out, or an id below 1 that is no synthetic person; what the
+// Holds: nothing is remembered but the keys and the unknown parents, so each question goes to the host
+//        again, and each question for the parents of a person who lacks one makes new unknown parents.
+// Fails: std::out_of_range for a key never handed out, or an id below 1 that is no unknown parent; what the
 //        host throws passes through.
 class Data {
 public:
@@ -30,10 +30,10 @@ public:
 
     int keyOf(const std::string& idText);
     const std::string& textOf(int key) const;
-    const Synthetic& synthetic(const std::string& idText) const;
+    const UnknownParent& unknownParent(const std::string& idText) const;
 
     void spouses(int key, std::set<SpouseRecord>& records);
-    void parents(int key, int& father, int& mother);  // writes neither for a synthetic person
+    void parents(int key, int& father, int& mother);  // writes neither for an unknown parent
     void children(int key, std::set<ChildRecord>& records);
     bool isMale(int key);
     bool isAddNode(int key) const;
@@ -41,14 +41,14 @@ public:
 
 private:
     int parentKey(std::int64_t answer, std::string& idText);
-    void enterSynthetic(const std::string& idText, bool male, const std::string& childText);
+    void enterUnknownParent(const std::string& idText, bool male, const std::string& childText);
 
     support::CaseHost& host;
     support::CaseAdapter adapter;
     std::vector<std::string> texts;  // by key
     std::unordered_map<std::string, int> keys;
-    std::unordered_map<std::string, Synthetic> synthetics;
-    int nextSyntheticId = -1;
+    std::unordered_map<std::string, UnknownParent> unknownParents;
+    int nextNegativeId = -1;
 };
 
 // The low 32 bits of the number at the head of the text, 0 where there is none.

@@ -145,14 +145,14 @@ void FamilyLayouter::measureSpouse(Person& person, Person& spouse) {
     spouse.width = (step + stepGaps) + (gaps(sharedCount) + shared);
 }
 
-// A lone child that is as narrow as its box is widened to a couple, so that it stands under the middle.
+// An only child that is as narrow as its box is widened to a couple, so that it stands under the middle.
 float FamilyLayouter::sharedChildrenWidth(Person& person, Person& spouse) {
-    const bool loneChild = childCountUnder(person, spouse.key) == 1 && childCountUnder(spouse, -1) == 0;
+    const bool onlyChild = childCountUnder(person, spouse.key) == 1 && childCountUnder(spouse, -1) == 0;
     float shared = 0.0F;
     forEachChildUnder(person, spouse.key, [&](Person& child) {
         measure(child);
         shared = shared + unitWidth(child);
-        if (loneChild && shared == size.nodeWidth) {
+        if (onlyChild && shared == size.nodeWidth) {
             shared = shared + (size.nodeWidth + size.horzPadding);
             child.width = shared;
         }

@@ -3,7 +3,7 @@
 
 // Who has relatives that the family view leaves out, found by the plain layout. The passes before the last one
 // are overwritten by it on every real person; they are kept because they ask the host, and each question can
-// use up synthetic ids.
+// use up negative ids.
 
 #include <support/plain/PlainFamily.h>
 

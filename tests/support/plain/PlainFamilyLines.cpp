@@ -3,11 +3,11 @@
 
 // The lines of the family view as the plain layout draws them: first every marriage line, then from each
 // person to its children, its siblings and its parents. A box covers its corner to corner + size; a drop
-// hangs down from a marriage line or from a lone parent, a bus runs sideways, a stem ends on the child's top.
+// hangs down from a marriage line or from a lone parent, a bar runs sideways, a stem ends on the child's top.
 //
 //      [husband]--+--[wife]        + dropX
 //                 |   drop
-//           +-----+   busY
+//           +-----+   barY
 //           |         stem
 //        [child]
 //
@@ -72,20 +72,20 @@ void FamilyLayouter::addChildLine(Person& person, Person& child, Person& spouse)
     const bool lone = spouse.key == person.key;
     float dropX = 0.0F;
     float startY = 0.0F;
-    float busY = 0.0F;
+    float barY = 0.0F;
     if (lone) {
         dropX = spouse.corner.x + size.nodeWidth * 0.5F;
         startY = spouse.corner.y + size.nodeHeight;
-        busY = static_cast<float>(quarterBelow(size.vertPadding, startY));
+        barY = static_cast<float>(quarterBelow(size.vertPadding, startY));
     } else {
         dropX = person.male ? spouse.corner.x + size.horzPadding * -0.5F
                             : size.nodeWidth + (spouse.corner.x + size.horzPadding * 0.5F);
         startY = spouseLine(person, spouse.key).y1;
-        busY = spouse.corner.y + size.nodeHeight + size.vertPadding * 0.5F;
+        barY = spouse.corner.y + size.nodeHeight + size.vertPadding * 0.5F;
     }
     Line line;
-    addSegment(spouse, line, Segment{dropX, startY, dropX, busY, false});
-    addBusAndStem(child, line, dropX, busY);
+    addSegment(spouse, line, Segment{dropX, startY, dropX, barY, false});
+    addBarAndStem(child, line, dropX, barY);
     if (lone) {
         addLoneEdge(person, person, child, line);
     } else {
@@ -98,23 +98,23 @@ void FamilyLayouter::addSiblingLine(Person& person, Person& sibling) {
     if (sibling.key == person.key) return;
     float dropX = 0.0F;
     float startY = 0.0F;
-    float busY = 0.0F;
+    float barY = 0.0F;
     Line line;
     if (data.isAddNode(sibling.parentKey)) {
         Person& father = fatherOf(person);
         dropX = size.nodeWidth + (father.corner.x + size.horzPadding * 0.5F);
         startY = cutPoint(father.corner.y + size.nodeHeight * 0.5F);
-        busY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
-        addSegment(father, line, Segment{dropX, startY, dropX, busY, false});
+        barY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
+        addSegment(father, line, Segment{dropX, startY, dropX, barY, false});
     } else {
         const bool fathers = person.fatherIndex != -1 && fatherOf(person).key == sibling.parentKey;
         Person& parent = fathers ? fatherOf(person) : motherOf(person);
         dropX = parent.corner.x + size.nodeWidth * 0.5F;
         startY = cutPoint(parent.corner.y + size.nodeHeight);
-        busY = loneParentBusY(startY);
-        addSegment(parent, line, Segment{dropX, startY, dropX, busY, false});
+        barY = loneParentBarY(startY);
+        addSegment(parent, line, Segment{dropX, startY, dropX, barY, false});
     }
-    addBusAndStem(sibling, line, dropX, busY);
+    addBarAndStem(sibling, line, dropX, barY);
     addSiblingEdge(person, sibling, line);
 }
 
@@ -159,34 +159,34 @@ void FamilyLayouter::addParentLines(Person& person) {
 void FamilyLayouter::addCoupleLines(Person& person, Person& father, Person& mother) {
     const float dropX = size.nodeWidth + (father.corner.x + size.horzPadding * 0.5F);
     const float startY = cutPoint(father.corner.y + size.nodeHeight * 0.5F);
-    const float busY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
+    const float barY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
     const float fatherRight = father.corner.x + size.nodeWidth;
     Line line;
-    addSegment(father, line, Segment{dropX, startY, dropX, busY, false});
+    addSegment(father, line, Segment{dropX, startY, dropX, barY, false});
     father.segments.push_back(Segment{fatherRight, startY, mother.corner.x, startY, true});
     spouseEdge(father, mother, Line({{fatherRight, startY}, {dropX, startY}, {mother.corner.x, startY}}));
-    addBusAndStem(person, line, dropX, busY);
+    addBarAndStem(person, line, dropX, barY);
     addCoupleEdge(spouseEdge(father, mother, Line()), person, line);
 }
 
 void FamilyLayouter::addLoneParentLines(Person& person, Person& parent) {
     const float dropX = parent.corner.x + size.nodeWidth * 0.5F;
     const float startY = cutPoint(parent.corner.y + size.nodeHeight);
-    const float busY = loneParentBusY(startY);
+    const float barY = loneParentBarY(startY);
     Line line;
-    addSegment(parent, line, Segment{dropX, startY, dropX, busY, false});
-    addBusAndStem(person, line, dropX, busY);
+    addSegment(parent, line, Segment{dropX, startY, dropX, barY, false});
+    addBarAndStem(person, line, dropX, barY);
     addLoneEdge(parent, parent, person, line);
 }
 
-void FamilyLayouter::addBusAndStem(Person& lower, Line& line, float dropX, float busY) const {
+void FamilyLayouter::addBarAndStem(Person& lower, Line& line, float dropX, float barY) const {
     const float stemX = cutPoint(lower.corner.x + size.nodeWidth * 0.5F);
-    addSegment(lower, line, Segment{stemX, busY, dropX, busY, false});
-    addSegment(lower, line, Segment{stemX, lower.corner.y, stemX, busY, false});
+    addSegment(lower, line, Segment{stemX, barY, dropX, barY, false});
+    addSegment(lower, line, Segment{stemX, lower.corner.y, stemX, barY, false});
 }
 
 // The sum is cut as a double, before it could be rounded to a float.
-float FamilyLayouter::loneParentBusY(float startY) const {
+float FamilyLayouter::loneParentBarY(float startY) const {
     return cutPoint(quarterBelow(size.vertPadding, startY));
 }
 

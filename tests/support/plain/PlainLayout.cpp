@@ -46,9 +46,9 @@ void writeRecord(Person& person, const Data& data, std::string& text) {
     }
     if (idOf(idText) < 0) {
         text += ":";
-        text += data.synthetic(idText).male ? "M" : "F";
+        text += data.unknownParent(idText).male ? "M" : "F";
         text += ":";
-        text += data.synthetic(idText).childText;
+        text += data.unknownParent(idText).childText;
     }
     text += ";";
 }

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The rules by which relatives enter a chart, for both views of the plain layout, written one question after the
-// other. Nothing is asked once where the rules ask twice, since every question can use up synthetic ids.
+// other. Nothing is asked once where the rules ask twice, since every question can use up negative ids.
 
 #include <support/plain/PlainLayouter.h>
 
@@ -162,8 +162,8 @@ void Layouter::addSiblings(Person& person) {
     }
     if (motherReal) addMothersSide(person, motherOf(person));
 
-    const bool bothSynthetic = !fatherUnset && !fatherReal && !motherUnset && !motherReal;
-    if (bothSynthetic) addTo(person.siblings, person.key, person.male);
+    const bool bothUnknown = !fatherUnset && !fatherReal && !motherUnset && !motherReal;
+    if (bothUnknown) addTo(person.siblings, person.key, person.male);
 }
 
 // The person comes after the half siblings here and before them on the mother's side.

@@ -61,21 +61,21 @@ int PedigreeLayouter::spouseLineStep() const {
 void PedigreeLayouter::addChildLine(Person& child, Person& spouse) {
     const bool lone = spouse.key == focus.key;
     Line line;
-    float jointX = 0.0F;
-    float jointY = 0.0F;
+    float junctionX = 0.0F;
+    float junctionY = 0.0F;
     if (lone) {
-        jointY = spouse.corner.y + size.nodeHeight * 0.5F;
-        jointX = spouse.corner.x + size.horzPadding * -0.25F;
-        addSegment(spouse, line, Segment{spouse.corner.x, jointY, jointX, jointY, false});
+        junctionY = spouse.corner.y + size.nodeHeight * 0.5F;
+        junctionX = spouse.corner.x + size.horzPadding * -0.25F;
+        addSegment(spouse, line, Segment{spouse.corner.x, junctionY, junctionX, junctionY, false});
     } else {
-        jointY = spouse.corner.y + size.vertPadding * -0.5F;
-        jointX = spouse.corner.x + size.horzPadding * -0.5F;
+        junctionY = spouse.corner.y + size.vertPadding * -0.5F;
+        junctionX = spouse.corner.x + size.horzPadding * -0.5F;
         const float lineX = spouseLine(focus, spouse.key).x1;
-        addSegment(spouse, line, Segment{lineX, jointY, jointX, jointY, false});
+        addSegment(spouse, line, Segment{lineX, junctionY, junctionX, junctionY, false});
     }
     const float childY = cutPoint(child.corner.y + size.nodeHeight * 0.5F);
-    addSegment(child, line, Segment{jointX, childY, jointX, jointY, false});
-    addSegment(child, line, Segment{child.corner.x + size.nodeWidth, childY, jointX, childY, false});
+    addSegment(child, line, Segment{junctionX, childY, junctionX, junctionY, false});
+    addSegment(child, line, Segment{child.corner.x + size.nodeWidth, childY, junctionX, childY, false});
     if (lone) {
         focus.generationEdges.push_back(GenerationEdge{line, &child, &focus});
     } else {

@@ -20,7 +20,7 @@ inline float cutPoint(double value) {
     return static_cast<float>(cut(value));
 }
 
-// A child as a host states it; hostOrder counts from 1, and is 0 for the child of a synthetic person.
+// A child as a host states it; hostOrder counts from 1, and is 0 for the child of an unknown parent.
 struct ChildRecord {
     int key = 0;
     std::string date;

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The order of children: by key where both have a place in the host's list, and the rules for the child of an
-// add-node, which has none.
+// unknown parent, which has none.
 
 #include <string>
 #include <vector>

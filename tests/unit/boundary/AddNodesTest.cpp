@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Parents through the callbacks: both slots of a real person are always filled, and every look at an unknown
-// parent makes a new add-node.
+// parent makes a new unknown parent.
 
 #include <stdexcept>
 #include <string>
@@ -170,8 +170,8 @@ TEST(AddNodes, parentsOfAnUnknownKeyFailByNameAndTheHostIsNotAsked) {
     EXPECT_EQ(Calls{}, request.newCalls());
 }
 
-// Five readers hold every id below 1 for synthetic, so a person of id 0 is an add-node without a record.
-TEST(SyntheticIds, personOfIdZeroIsSyntheticToEveryReaderAndHasNoRecord) {
+// Five readers hold every id below 1 for an unknown parent, so a person of id 0 is an unknown parent without a record.
+TEST(NegativeIds, personOfIdZeroIsAnUnknownParentToEveryReaderAndHasNoRecord) {
     Request request(family("17"));
     const int key = request.key(0);
     SpouseSet spouses;
@@ -186,7 +186,7 @@ TEST(SyntheticIds, personOfIdZeroIsSyntheticToEveryReaderAndHasNoRecord) {
     EXPECT_EQ(Calls{}, request.newCalls());
 }
 
-TEST(SyntheticIds, personOfIdOneIsRealToEveryReader) {
+TEST(NegativeIds, personOfIdOneIsRealToEveryReader) {
     Request request(family("1: 5"));
     const int key = request.key(1);
     SpouseSet spouses;
@@ -202,7 +202,7 @@ TEST(SyntheticIds, personOfIdOneIsRealToEveryReader) {
               request.newCalls());
 }
 
-TEST(SyntheticIds, addNodesSexIsThatOfTheMissingParent) {
+TEST(NegativeIds, unknownParentsSexIsThatOfTheSlot) {
     Request request(family("17f"));
     parentsOf(request, 17);
     request.newCalls();

@@ -32,7 +32,7 @@ static void* countedMemory(std::size_t size, std::size_t alignment) {
     return memory;
 }
 
-static void giveBack(void* memory) {
+static void release(void* memory) {
     if (memory == nullptr) return;
     --outstanding;
     std::free(memory);
@@ -67,39 +67,39 @@ void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
 }
 
 void operator delete(void* memory, const std::nothrow_t&) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete(void* memory) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete[](void* memory) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete(void* memory, std::size_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete[](void* memory, std::size_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete(void* memory, std::align_val_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete[](void* memory, std::align_val_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete(void* memory, std::size_t, std::align_val_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 void operator delete[](void* memory, std::size_t, std::align_val_t) noexcept {
-    giveBack(memory);
+    release(memory);
 }
 
 namespace unit {

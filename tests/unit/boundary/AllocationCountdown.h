@@ -10,7 +10,7 @@ namespace unit {
 // The global operator new of a test program that links AllocationCountdown.cpp: it counts, and fails on
 // demand. For one thread.
 
-// Allocations so far, failed ones included, and those of them that have not been given back.
+// Allocations so far, failed ones included, and those of them that have not been released.
 std::int64_t allocationsMade();
 std::int64_t allocationsOutstanding();
 

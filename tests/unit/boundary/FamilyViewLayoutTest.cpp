@@ -138,7 +138,7 @@ TEST(Bridge, withoutADataSourceGivesTheEmptyText) {
 TEST(Layouts, sameRequestTwiceGivesTheSameText) {
     const CaseFile input = family("17+42: 5 6f; 17: 8; 3: 17 18 19f; 5+50: 51");
     const std::string first = layOut("17", input);
-    EXPECT_NE(std::string::npos, first.find(":M:"));  // with add-nodes, whose ids could run on
+    EXPECT_NE(std::string::npos, first.find(":M:"));  // with unknown parents, whose ids could run on
     EXPECT_EQ(first, layOut("17", input));
 }
 

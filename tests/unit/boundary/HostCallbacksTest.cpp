@@ -248,12 +248,12 @@ TEST(ChildrenOfAnAddNode, isNobodyWhereTheRecordNamesNoChild) {
     EXPECT_TRUE(childrenOf(request, -7).empty());
 }
 
-TEST(ChildrenOfAnAddNode, syntheticPersonWithoutARecordFailsByName) {
+TEST(ChildrenOfAnAddNode, unknownParentWithoutARecordFailsByName) {
     Request request(family("17"));
     EXPECT_EQ(kUnknownKeyFailure, failureOf<std::out_of_range>([&] { childrenOf(request, -7); }));
 }
 
-// --- Sex, add-nodes, touch.
+// --- Sex, unknown parents, touch.
 
 TEST(SexOfAPerson, zeroIsMaleAndEveryOtherNumberFemale) {
     CaseFile input = family("17");

@@ -13,7 +13,7 @@
 
 namespace unit {
 
-// The frame of a request around a family, with the calls that reach its data source. The synthetic ids start
+// The frame of a request around a family, with the calls that reach its data source. The negative ids start
 // at -1. Persons are named by the host's ids; key and idText translate.
 class Request {
 public:

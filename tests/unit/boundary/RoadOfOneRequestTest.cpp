@@ -106,7 +106,7 @@ TEST_F(RoadOfOneRequestByPieces, everyoneHasAPlaceAndNoFlagInTheOrderOfTheWalk) 
     EXPECT_EQ(expected, placed);
 }
 
-TEST_F(RoadOfOneRequestByPieces, loneChildIsWidenedAndTheCouplesSpanIsAsWide) {
+TEST_F(RoadOfOneRequestByPieces, onlyChildIsWidenedAndTheCouplesSpanIsAsWide) {
     TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale(), options, size);
     layouter.layoutForFocusNID();
     TreeViewPerson& focus = layouter.focusPerson;

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Layouts on several threads at once: each thread counts its own synthetic ids.
+// Layouts on several threads at once: each thread counts its own negative ids.
 
 #include <atomic>
 #include <memory>
@@ -51,7 +51,7 @@ TEST(TwoThreads, giveTheSameTextsAsOne) {
     EXPECT_EQ(0, differencesWhileBothRun(input, input));
 }
 
-TEST(TwoThreads, doNotMixTheSyntheticIdsOfTheirFamilies) {
+TEST(TwoThreads, doNotMixTheNegativeIdsOfTheirFamilies) {
     EXPECT_EQ(0, differencesWhileBothRun(family("17"), family("17+42: 5 6f; 4f: 17 18; 1+2: 4; 6f: 9")));
 }
 

@@ -239,7 +239,7 @@ TEST(TypedLayout, aFailureOfTheHostReachesTheCaller) {
                  support::HostFailure);
 }
 
-// An uncle's wife -99, who is nobody's add-node: her record is cut behind its segments.
+// An uncle's wife -99, who is nobody's unknown parent: her record is cut behind its segments.
 TEST(TypedLayout, ofAFailureHoldsTheWholeBoxesAndTheCutText) {
     support::CaseFile input = family("17; 1+2: 17; 101+102: 1 11");
     input.spouses[11] = {-99};

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Keys by first sight and the records of add-nodes, without any data source.
+// Keys by first sight and the records of unknown parents, without any data source.
 
 #include <cstdint>
 #include <stdexcept>
@@ -23,7 +23,7 @@ TEST(PersonKeys, firstTextOfAnEmptyTableGetsKeyZero) {
     EXPECT_EQ(0, glue.getKeyFromPerson("4711"));
 }
 
-TEST(PersonKeys, areDenseInTheOrderOfFirstSightRealAndSyntheticInOneSequence) {
+TEST(PersonKeys, areDenseInTheOrderOfFirstSightRealAndNegativeInOneSequence) {
     ViewerGlue glue;
     EXPECT_EQ(0, glue.getKeyFromPerson("17"));
     EXPECT_EQ(1, glue.getKeyFromPerson("-1"));

@@ -64,7 +64,7 @@ TEST_P(DrawingThemes, marksCanBeRead) {
 }
 
 TEST_P(DrawingThemes, bordersAndLinesStandOffThePage) {
-    for (const std::string_view colour : {theme().line, theme().focus, theme().placeholder,
+    for (const std::string_view colour : {theme().line, theme().focus, theme().unknownParent,
                                           theme().male.border, theme().female.border, theme().other.border}) {
         EXPECT_GE(contrast(colour, theme().page), kShape) << colour;
     }

@@ -221,7 +221,7 @@ TEST_F(Picture, livingPersonLeavesNoTrace) {
         EXPECT_THAT(svg, Not(HasSubstr(trace)));
 }
 
-TEST_F(Picture, placeholderOfALivingPersonDoesNotNameThem) {
+TEST_F(Picture, unknownParentOfALivingPersonDoesNotNameThem) {
     labels_[1].living = true;
     const std::string svg = draw();
     EXPECT_THAT(svg, HasSubstr("<title>add father of Living</title>"));

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The lines down to a person's children: drop, bus and stem, each on the list of the person who holds it.
+// The lines down to a person's children: drop, bar and stem, each on the list of the person who holds it.
 // Most families here are a man at (0, 0) beside a wife at (80, 0), with the child at (40, 110).
 
 #include <gtest/gtest.h>
@@ -123,7 +123,7 @@ TEST_F(FamilyChildLines, ofThreeChildrenRepeatTheDropThreeTimes) {
     EXPECT_EQ((std::vector<int>{5, 6, 7}), order);
 }
 
-TEST_F(FamilyChildLines, busOfALoneParentRunsAboveTheBusesOfItsCouples) {
+TEST_F(FamilyChildLines, barOfALoneParentRunsAboveTheBarsOfItsCouples) {
     addWife(1, 80.0f);
     addChild(5, 1, 80.0f);
     addUnknownChild(focus, 6, 0.0f);
@@ -153,7 +153,7 @@ TEST_F(FamilyChildLines, stemRightBelowTheDropLeavesABusOfNoLength) {
 }
 
 // From above only the stem is cut to whole points: a box at y 0.75 keeps its fraction in the drop and the
-// bus.
+// bar.
 TEST_F(FamilyChildLines, cutOnlyTheStemsX) {
     place(focus, 0.0f, 0.75f);
     place(focus.addSpouse(1, kFemale), 80.25f, 0.75f);
@@ -187,7 +187,7 @@ TEST_F(FamilyChildLines, ofACoupleNeedTheMarriageLineFirst) {
     EXPECT_THROW(layouter.addLinesToPerson(focus), std::out_of_range);
 }
 
-TEST_F(FamilyChildLines, busHeightsFollowTheSizesGiven) {
+TEST_F(FamilyChildLines, barHeightsFollowTheSizesGiven) {
     layouter.treeSize.vertPadding = 31.0f;
     addWife(1, 80.0f);
     addChild(5, 1, 40.0f);

@@ -156,7 +156,7 @@ TEST(FamilyChart, rowsFollowTheSizesGiven) {
     EXPECT_EQ(-100.0f, chart.at(chart.idOf(chart.person(10).getPreferredFather())).y);
 }
 
-// The father is real and the mother an add-node: his two parents are centred above the focus, not above him.
+// The father is real and the mother unknown: his two parents are centred above the focus, not above him.
 TEST(FamilyChart, grandparentsFormOneGroupAboveTheFocus) {
     LaidOutCase chart("focus 1\nfather 1 10\nchildren 10 1\nfather 10 30\nmother 10 31\n");
     EXPECT_EQ((Point{-12.5f, -110.0f}), chart.at(10));

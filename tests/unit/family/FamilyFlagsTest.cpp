@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // The flag of each person: the data source knows a relative who is not on the chart. The final pass has the
-// last word on everybody but add-nodes, so what the passes before it decide is seen on persons whom the data
-// call add-nodes.
+// last word on everybody but unknown parents, so what the passes before it decide is seen on persons whom the data
+// call unknown parents.
 
 #include <gtest/gtest.h>
 
@@ -255,7 +255,7 @@ TEST_F(FamilyFlags, greatGrandparentsWithRealParentsAreFlagged) {
     data.addNodes = {9};
     SharedTreeViewer::flagGreatGrandparentsWithParents(layouter, focus);
     EXPECT_TRUE(flagOf(grandfather.getPreferredFather()));
-    EXPECT_FALSE(flagOf(grandfather.getPreferredMother())) << "her father is an add-node";
+    EXPECT_FALSE(flagOf(grandfather.getPreferredMother())) << "her father is unknown";
     EXPECT_FALSE(flagOf(grandfather));
 }
 
@@ -469,7 +469,7 @@ void PrintTo(const ChildRow& row, std::ostream* out) {
     *out << row.name;
 }
 
-// The focus is 0, its shown wives are 1 and the add-node 50; the host also knows a wife 7 of the focus.
+// The focus is 0, its shown wives are 1 and the unknown parent 50; the host also knows a wife 7 of the focus.
 class FamilyChildFlag : public FamilyFlags, public testing::WithParamInterface<ChildRow> {};
 
 TEST_P(FamilyChildFlag, tellsAParentOffTheChart) {

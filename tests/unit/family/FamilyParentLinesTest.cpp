@@ -101,7 +101,7 @@ TEST_F(FamilyParentLines, cutTheHeightsOfALoneParentsDrop) {
 
 TEST_F(FamilyParentLines, negativeBusIsCutTowardZero) {
     addBothParents();
-    place(father(), 0.0f, -167.5f);  // the bus at -72.5, mid-height at -127.5
+    place(father(), 0.0f, -167.5f);  // the bar at -72.5, mid-height at -127.5
     drawLines();
     EXPECT_EQ((Segments{{67.5f, -127, 67.5f, -72, false}, {55, -127, 80, -127, true}}), segmentsOf(father()));
 }
@@ -150,7 +150,7 @@ TEST_F(FamilyParentLines, ofNobodyEndAtOnce) {
 TEST_F(FamilyParentLines, areNotDrawnForAChildThatHangsUnderThePerson) {
     place(focus.addChildWithNoOtherSpouse(5, kMale), 40.0f, 220.0f);
     drawLines();
-    EXPECT_EQ(2u, unknownChild(focus).lineSegments.size()) << "bus and stem, once";
+    EXPECT_EQ(2u, unknownChild(focus).lineSegments.size()) << "bar and stem, once";
 }
 
 TEST_F(FamilyParentLines, comeBehindTheLinesToChildrenInAPersonsList) {
@@ -165,8 +165,8 @@ TEST_F(FamilyParentLines, comeBehindTheLinesToChildrenInAPersonsList) {
               segmentsOf(focus));
 }
 
-// How deep below a box's bottom edge the bus runs, in the four shapes.
-TEST_F(FamilyParentLines, busOfACoupleRunsTwiceAsDeepAsThatOfALoneParent) {
+// How deep below a box's bottom edge the bar runs, in the four shapes.
+TEST_F(FamilyParentLines, barOfACoupleRunsTwiceAsDeepAsThatOfALoneParent) {
     addBothParents();
     drawLines();
     EXPECT_EQ(80.0f + 15.0f, focus.lineSegments.front().y1);

@@ -96,7 +96,7 @@ TEST_F(FamilyPlacement, twoChildrenStandUnderTheirParents) {
     EXPECT_EQ((Point{107.5f, 110.0f}), placeOf(childUnder(focus, 1, 1)));
 }
 
-TEST_F(FamilyPlacement, loneChildStandsUnderTheMiddleOfTheCouple) {
+TEST_F(FamilyPlacement, onlyChildStandsUnderTheMiddleOfTheCouple) {
     addSpouses(1);
     focus.addChildWithSpouse(5, 1, kMale);
     placeUnit();

@@ -35,7 +35,7 @@ TEST_F(FamilyWidths, aPersonAloneIsOneBoxWide) {
     EXPECT_EQ(55.0f, unitWidth(focus));
 }
 
-TEST_F(FamilyWidths, loneChildWidensToItsParents) {
+TEST_F(FamilyWidths, onlyChildWidensToItsParents) {
     focus.addSpouse(1, kFemale);
     focus.addChildWithSpouse(2, 1, kMale);
     measure(focus);
@@ -63,7 +63,7 @@ TEST_F(FamilyWidths, threeChildrenWidenTheirParents) {
     EXPECT_EQ(215.0f, unitWidth(focus));
 }
 
-TEST_F(FamilyWidths, marriedLoneChildIsNotWidened) {
+TEST_F(FamilyWidths, marriedOnlyChildIsNotWidened) {
     focus.addSpouse(1, kFemale);
     focus.addChildWithSpouse(2, 1, kMale).addSpouse(3, kFemale);
     measure(focus);
@@ -73,7 +73,7 @@ TEST_F(FamilyWidths, marriedLoneChildIsNotWidened) {
     EXPECT_EQ(135.0f, spouse().layoutWidth);
 }
 
-TEST_F(FamilyWidths, loneChildBesideAStepChildIsNotWidened) {
+TEST_F(FamilyWidths, onlyChildBesideAStepChildIsNotWidened) {
     focus.addSpouse(1, kFemale).addChildWithNoOtherSpouse(3, kMale);
     focus.addChildWithSpouse(2, 1, kMale);
     measure(focus);
@@ -81,8 +81,8 @@ TEST_F(FamilyWidths, loneChildBesideAStepChildIsNotWidened) {
     EXPECT_EQ(135.0f, spouse().layoutWidth);
 }
 
-// Whether the lone child has a child is not asked: a unit one box wide is widened.
-TEST_F(FamilyWidths, loneChildWithALoneUnknownChildIsWidenedToo) {
+// Whether the only child has a child is not asked: a unit one box wide is widened.
+TEST_F(FamilyWidths, onlyChildWithOneUnknownChildIsWidenedToo) {
     focus.addSpouse(1, kFemale);
     focus.addChildWithSpouse(2, 1, kMale).addChildWithNoOtherSpouse(3, kMale);
     measure(focus);
@@ -90,7 +90,7 @@ TEST_F(FamilyWidths, loneChildWithALoneUnknownChildIsWidenedToo) {
     EXPECT_EQ(55.0f, unknownChild(childUnder(focus, 1)).layoutWidth);
 }
 
-TEST_F(FamilyWidths, loneChildOfALoneChildIsWidenedOnItsOwnLevel) {
+TEST_F(FamilyWidths, onlyChildOfAnOnlyChildIsWidenedOnItsOwnLevel) {
     focus.addSpouse(1, kFemale);
     TreeViewPerson& child = focus.addChildWithSpouse(2, 1, kMale);
     child.addSpouse(3, kFemale);

@@ -17,7 +17,7 @@ namespace views {
 // test builds by hand.
 //
 // Holds: a person of whom nothing is said has no relatives, is a woman and is real. A parent of -1 is left at
-//        what the caller set. The child of an add-node comes without a place in a list and without a date.
+//        what the caller set. The child of an unknown parent comes without a place in a list and without a date.
 class KeyFamily {
 public:
     typedef std::vector<int> Keys;

@@ -21,7 +21,7 @@
 namespace views {
 
 // A family in the text of a case file, laid out, with its graph still standing: tests look at its persons by
-// the host's id. Synthetic persons have the ids -1, -2, ... in the order in which they were made.
+// the host's id. Unknown parents have the ids -1, -2, ... in the order in which they were made.
 //
 // Fails: what the layout throws passes on, since a test wants to see it; person throws std::out_of_range when
 //        nobody of that id is on the chart.

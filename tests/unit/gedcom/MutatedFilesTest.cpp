@@ -137,7 +137,7 @@ TEST(MutatedFiles, areReadOrRefused) {
         if (readAndUse(bytes, mutant % 2 == 0)) ++read;
         ASSERT_FALSE(HasFailure()) << "mutant " << mutant;
     }
-    EXPECT_GT(read, wanted / 4) << "most copies are still files";
+    EXPECT_GT(read, wanted / 8) << "many copies are still files";
 }
 
 }  // namespace

@@ -147,7 +147,7 @@ TEST(Relations, aFamilyThatAloneNamesItsMembersIsFollowed) {
     EXPECT_EQ(data.person(4).mother, 2U);
     EXPECT_EQ(data.person(4).parentFamily, 1U);
     ASSERT_EQ(data.parentLinks(4).size(), 1U);
-    EXPECT_TRUE(data.parentLinks(4)[0].isFamilysAlone);
+    EXPECT_TRUE(data.parentLinks(4)[0].isNamedByFamilyOnly);
     EXPECT_EQ(data.parentLinks(4)[0].line, 14U);
     EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "12 13 14 15");
     EXPECT_EQ(data.diagnostics()[0].severity, Severity::note);
@@ -163,7 +163,7 @@ TEST(Relations, personsWhoAloneNameTheirFamilyAreFollowed) {
     EXPECT_EQ(idsOf(data.children(2)), "4 3");
     EXPECT_EQ(data.person(3).mother, 1U);
     ASSERT_EQ(data.childLinks(1).size(), 2U);
-    EXPECT_TRUE(data.childLinks(1)[1].isChildsAlone);
+    EXPECT_TRUE(data.childLinks(1)[1].isNamedByChildOnly);
     EXPECT_EQ(linesReported(data, DiagnosticKind::oneSidedLink), "8 10 12");
 }
 

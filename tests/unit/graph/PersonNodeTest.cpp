@@ -195,7 +195,7 @@ TEST(PersonsSpouses, hiddenSpouseIsAWomanEvenWhenAHusbandAndWalksAsOne) {
     husband.addSpouse(1, false);
     husband.addChildWithNoOtherSpouse(5, true);
     husband.addChildWithSpouse(6, 1, true);
-    // A man's lone children would come first.
+    // A man's only children would come first.
     EXPECT_EQ((Keys{6, 5}), keysOf(husband.getAllChildrenIterator(false)));
 }
 

@@ -57,13 +57,13 @@ Keys allChildren(TreeViewPerson& person, bool includeBastards) {
 
 // --- Children.
 
-TEST(ChildWalk, mansLoneChildrenComeFirstAndHisWifesLast) {
+TEST(ChildWalk, mansChildrenWithoutSecondParentComeFirstAndHisWifesLast) {
     TreeViewPerson man = manOfTheCouple();
     EXPECT_EQ((Keys{kA, kB, kC, kD}), allChildren(man, true));
     EXPECT_EQ((Keys{kA, kB, kC}), allChildren(man, false));
 }
 
-TEST(ChildWalk, womansLoneChildrenComeLastAndHerHusbandsFirst) {
+TEST(ChildWalk, womansChildrenWithoutSecondParentComeLastAndHerHusbandsFirst) {
     TreeViewPerson wife = wifeOfTheCouple();
     EXPECT_EQ((Keys{kA, kB, kC, kD}), allChildren(wife, true));
     EXPECT_EQ((Keys{kB, kC, kD}), allChildren(wife, false));
@@ -98,7 +98,7 @@ TEST(ChildWalk, underOneKeyGoesFromFirstToLast) {
     EXPECT_EQ(Keys{}, keysOf([&](const Visitor& v) { man.childrenIterator(77, v); }));
 }
 
-TEST(ChildWalk, withOneSpouseSetsTheMansLoneChildrenLeftAndTheWomansRight) {
+TEST(ChildWalk, withOneSpouseSetsTheMansChildrenWithoutSecondParentLeftAndTheWomansRight) {
     TreeViewPerson man = manOfTheCouple();
     TreeViewPerson wife = wifeOfTheCouple();
     EXPECT_EQ((Keys{kA, kB, kC, kD}),
@@ -107,7 +107,7 @@ TEST(ChildWalk, withOneSpouseSetsTheMansLoneChildrenLeftAndTheWomansRight) {
               keysOf([&](const Visitor& v) { wife.allChildrenWithSpouseIterator(wife.spouses[0], v); }));
 }
 
-TEST(ChildWalk, withSharedAndTheSpousesLoneChildrenLeavesOutThePersonsOwn) {
+TEST(ChildWalk, withSharedAndTheSpousesChildrenWithoutSecondParentLeavesOutThePersonsOwn) {
     TreeViewPerson man = manOfTheCouple();
     TreeViewPerson wife = wifeOfTheCouple();
     EXPECT_EQ((Keys{kB, kC, kD}), keysOf(man.getChildrenAndBastardsWithSpouseIterator(man.spouses[0])));
@@ -124,12 +124,12 @@ KeyPairs childrenWithOtherParent(TreeViewPerson& person) {
     return pairs;
 }
 
-TEST(ChildAndSpouseWalk, manStandsAsTheOtherParentOfHisLoneChildrenFirst) {
+TEST(ChildAndSpouseWalk, manStandsAsTheOtherParentOfHisChildrenWithoutSecondParentFirst) {
     TreeViewPerson man = manOfTheCouple();
     EXPECT_EQ((KeyPairs{{kA, kMan}, {kB, kWife}, {kC, kWife}}), childrenWithOtherParent(man));
 }
 
-TEST(ChildAndSpouseWalk, womanStandsAsTheOtherParentOfHerLoneChildrenLast) {
+TEST(ChildAndSpouseWalk, womanStandsAsTheOtherParentOfHerChildrenWithoutSecondParentLast) {
     TreeViewPerson wife = wifeOfTheCouple();
     EXPECT_EQ((KeyPairs{{kB, kMan}, {kC, kMan}, {kD, kWife}}), childrenWithOtherParent(wife));
 }

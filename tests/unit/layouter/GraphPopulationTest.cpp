@@ -155,7 +155,7 @@ TEST(HavingParents, isFalseForAnAddNode) {
     EXPECT_FALSE(population.layouter.hasParents(population.focus.getPreferredFather()));
 }
 
-TEST(HavingParents, questionUsesUpASyntheticIdForEachUnknownOne) {
+TEST(HavingParents, questionUsesUpANegativeIdForEachUnknownOne) {
     Population population(family("17"));
     population.layouter.hasParents(population.focus);
     population.layouter.hasParents(population.focus);
@@ -254,7 +254,7 @@ TEST(AddingChildren, withASpouseNeedsChildrenAndAsksNobodyOtherwise) {
     EXPECT_EQ(0, population.focus.getAllChildrenCount());
 }
 
-// A child whose other parent is unknown gets a new add-node as its mother at every look. While nobody of its
+// A child whose other parent is unknown gets a new unknown mother at every look. While nobody of its
 // three stands on the chart it is let through under the couple that asks; once it stands there it is not.
 TEST(AddingChildren, childOfUnknownMotherListedByAWifeIsLetThroughOnceOnly) {
     CaseFile input = family("17+42: 5");
@@ -269,7 +269,7 @@ TEST(AddingChildren, childOfUnknownMotherListedByAWifeIsLetThroughOnceOnly) {
 
 // --- Lone children, and what is common to two sets.
 
-TEST(LoneChildren, areThoseOfNobodyWhomTheWalkVisits) {
+TEST(ChildrenWithoutSecondParent, areThoseOfNobodyWhomTheWalkVisits) {
     Population population(family("17: 5 6 7; 42f: 6"));
     population.focus.addSpouse(population.request.key(42), false);
     const ChildrenSet alone = population.layouter.getBastardChildrenOfPerson(
@@ -279,13 +279,13 @@ TEST(LoneChildren, areThoseOfNobodyWhomTheWalkVisits) {
     EXPECT_EQ("7", alone.rbegin()->idText);
 }
 
-TEST(LoneChildren, ofAPersonWithoutChildrenAreNobodyAndTheWalkIsNotCalled) {
+TEST(ChildrenWithoutSecondParent, ofAPersonWithoutChildrenAreNobodyAndTheWalkIsNotCalled) {
     Population population(family("17"));
     EXPECT_TRUE(
         population.layouter.getBastardChildrenOfPerson(population.focus, TreeViewPerson::Iterator()).empty());
 }
 
-TEST(LoneChildren, emptyWalkFailsByNameWhereThereAreChildren) {
+TEST(ChildrenWithoutSecondParent, emptyWalkFailsByNameWhereThereAreChildren) {
     Population population(family("17: 5"));
     EXPECT_EQ(kEmptyFunctionFailure, failureOf<boost::bad_function_call>([&] {
                   population.layouter.getBastardChildrenOfPerson(population.focus,
@@ -293,7 +293,7 @@ TEST(LoneChildren, emptyWalkFailsByNameWhereThereAreChildren) {
               }));
 }
 
-TEST(LoneChildren, nodesOfThePersonAmongTheVisitedDoNotCount) {
+TEST(ChildrenWithoutSecondParent, nodesOfThePersonAmongTheVisitedDoNotCount) {
     Population population(family("17: 5"));
     EXPECT_EQ(1u,
               population.layouter
@@ -301,7 +301,7 @@ TEST(LoneChildren, nodesOfThePersonAmongTheVisitedDoNotCount) {
                   .size());
 }
 
-TEST(LoneChildren, ofTheRealParentIncludeADatedChildOfAnAddNode) {
+TEST(ChildrenWithoutSecondParent, ofTheRealParentIncludeADatedChildOfAnAddNode) {
     for (const bool dated : {false, true}) {
         CaseFile input = family("17; 3: 17");
         if (dated) input.births[17] = "1850";
@@ -316,7 +316,7 @@ TEST(LoneChildren, ofTheRealParentIncludeADatedChildOfAnAddNode) {
 // The three records run in a circle: child 1, without a place, stands before 3 and behind 5 by date, and 3
 // stands before 5 by key. Inserted in turn, 5 comes to lie ahead of 1. A record of 5 with another date is
 // then looked for behind 3 and not found, although key 5 is there.
-TEST(LoneChildren, othersAreGatheredInOneSetByOnePlainInsertAfterAnother) {
+TEST(ChildrenWithoutSecondParent, othersAreGatheredInOneSetByOnePlainInsertAfterAnother) {
     const auto answerChildren = [](int key, ChildrenSet& set) {
         if (key == 0) set.insert(ChildrenAdapter(5, "4", "55", 1));
         if (key == 8) set.insert(ChildrenAdapter(1, "2", "11"));

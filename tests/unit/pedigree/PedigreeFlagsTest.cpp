@@ -160,7 +160,7 @@ void PrintTo(const ChildRow& row, std::ostream* out) {
     *out << row.name;
 }
 
-// The focus is 0, its shown wives are 1 and the add-node 50.
+// The focus is 0, its shown wives are 1 and the unknown parent 50.
 class PedigreeChildFlag : public PedigreeFlags, public testing::WithParamInterface<ChildRow> {};
 
 TEST_P(PedigreeChildFlag, tellsAParentOffTheChart) {

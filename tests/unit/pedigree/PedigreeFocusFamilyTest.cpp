@@ -47,7 +47,7 @@ TEST_F(PedigreeFocusFamily, childlessSpouseStandsBelowTheFocus) {
     EXPECT_EQ((Point{27.5f, 110.0f}), placeOf(spouse()));
 }
 
-TEST_F(PedigreeFocusFamily, loneChildStandsBesideTheMiddleOfTheCouple) {
+TEST_F(PedigreeFocusFamily, onlyChildStandsBesideTheMiddleOfTheCouple) {
     addWife(1, {5});
     setOut();
     EXPECT_EQ((Point{-52.5f, 55.0f}), placeOf(childUnder(1)));

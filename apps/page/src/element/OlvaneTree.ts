@@ -14,7 +14,7 @@ import { nameOf, yearsOf } from "../messages/names";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import type { Placing } from "../scene/Camera";
 import { svgText, wholePicture } from "../output/pictureSvg";
-import { PictureDress } from "../scene/PictureDress";
+import { PictureContents } from "../scene/PictureContents";
 import { Scene } from "../scene/Scene";
 import { Corner } from "../ui/Corner";
 import { Overview } from "../ui/Overview";
@@ -36,7 +36,7 @@ const kKinshipDelay = 600; // ms after the picture of a larger family, when its 
 /** A picture and what is written on it, for whoever saves or prints it. */
 export interface Shown {
     readonly picture: Picture;
-    readonly dress: PictureDress;
+    readonly contents: PictureContents;
     readonly title: string;
     /** Where the viewer's looks hold. */
     readonly root: ShadowRoot;
@@ -77,7 +77,7 @@ export class OlvaneTree extends HTMLElement {
     private opened: OpenFamily | null = null;
     private shownState: ViewState | null = null;
     private picture: Picture | null = null;
-    private dress: PictureDress | null = null;
+    private contents: PictureContents | null = null;
     private shownPerson = 0; // in the panel
     private kinshipTimer = 0;
 
@@ -207,9 +207,9 @@ export class OlvaneTree extends HTMLElement {
         this.shownState = state;
         this.picture = picture;
         this.tooltip.hide();
-        this.dress = this.newDress(opened, picture);
-        this.dress.kinshipKnown = opened.persons.length <= kSoonSearched;
-        this.scene.show(picture, this.dress, anchor);
+        this.contents = this.newContents(opened, picture);
+        this.contents.kinshipKnown = opened.persons.length <= kSoonSearched;
+        this.scene.show(picture, this.contents, anchor);
         this.overview.show(picture);
         this.nameTree();
         this.learnKinships();
@@ -273,8 +273,8 @@ export class OlvaneTree extends HTMLElement {
 
     /** The picture and its looks; null before any. */
     get shown(): Shown | null {
-        const { picture, dress } = this;
-        return picture && dress ? { picture, dress, title: this.pictureTitle(), root: this.shadow } : null;
+        const { picture, contents } = this;
+        return picture && contents ? { picture, contents, title: this.pictureTitle(), root: this.shadow } : null;
     }
 
     // --- words ---
@@ -289,7 +289,7 @@ export class OlvaneTree extends HTMLElement {
 
     /** To the focus; empty while it is not known. */
     kinshipOf(person: Person): string {
-        return this.dress?.kinshipKnown ? this.dress.kinshipOf(person.id) : "";
+        return this.contents?.kinshipKnown ? this.contents.kinshipOf(person.id) : "";
     }
 
     private setLanguage(language: string): void {
@@ -326,10 +326,10 @@ export class OlvaneTree extends HTMLElement {
     /** Writes the boxes again, where words or marks have changed. */
     private restyle(): void {
         if (!this.opened || !this.picture || !this.shownState) return;
-        const known = this.dress?.kinshipKnown ?? false;
-        this.dress = this.newDress(this.opened, this.picture);
-        this.dress.kinshipKnown = known;
-        this.scene.restyle(this.dress);
+        const known = this.contents?.kinshipKnown ?? false;
+        this.contents = this.newContents(this.opened, this.picture);
+        this.contents.kinshipKnown = known;
+        this.scene.restyle(this.contents);
         this.nameTree();
         this.refreshPanel();
     }
@@ -367,18 +367,18 @@ export class OlvaneTree extends HTMLElement {
         const isFocus = person.id === shownState.focus;
         this.panel.show(person, opened, {
             focus: opened.person(shownState.focus)!,
-            kinship: isFocus ? "" : (this.dress?.kinshipOf(person.id) ?? ""),
+            kinship: isFocus ? "" : (this.contents?.kinshipOf(person.id) ?? ""),
             boxes: picture.boxesOf(person.id).length,
         });
     }
 
     private pointAt(box: Box | null, element: SVGGElement | null): void {
-        const { picture, dress } = this;
+        const { picture, contents } = this;
         this.scene.pointAt(box);
         const person = box ? this.opened?.person(box.person) : undefined;
         this.scene.markDuplicates(person && picture!.boxesOf(person.id).length > 1 ? person.id : 0);
-        if (!box || !person || !element || !dress || !picture) return this.tooltip.hide();
-        const hidden = dress.hiddenOf(box);
+        if (!box || !person || !element || !contents || !picture) return this.tooltip.hide();
+        const hidden = contents.hiddenOf(box);
         const boxes = picture.boxesOf(person.id).length;
         this.tooltip.show(element, {
             name: this.nameOf(person),
@@ -446,10 +446,10 @@ export class OlvaneTree extends HTMLElement {
         this.scene.activate(boxes[(at + 1) % boxes.length]!);
     }
 
-    // --- the picture's dress ---
+    // --- the picture's contents ---
 
-    private newDress(family: OpenFamily, picture: Picture): PictureDress {
-        return new PictureDress(family, picture, {
+    private newContents(family: OpenFamily, picture: Picture): PictureContents {
+        return new PictureContents(family, picture, {
             messages: this.messages,
             ui: this.ui,
             kinshipInBoxes: this.getAttribute("kinship") !== "none",
@@ -459,12 +459,12 @@ export class OlvaneTree extends HTMLElement {
     // In a large family the boxes come first; what is written into them of kinship follows when there is time.
     private learnKinships(): void {
         clearTimeout(this.kinshipTimer);
-        if (this.dress?.kinshipKnown) return;
+        if (this.contents?.kinshipKnown) return;
         this.kinshipTimer = window.setTimeout(() => {
-            if (!this.dress || !this.opened || !this.shownState) return;
+            if (!this.contents || !this.opened || !this.shownState) return;
             const start = performance.now();
             this.opened.kinshipsTo(this.shownState.focus);
-            this.dress.kinshipKnown = true;
+            this.contents.kinshipKnown = true;
             this.scene.redraw();
             performance.measure("olvane-kinship", { start });
         }, kKinshipDelay);

@@ -164,7 +164,7 @@ export const uiGerman: UiMessages = {
         notGedcom: (name) => `${name} ließ sich nicht als Familiendatei lesen.`,
         hint: "Eine GEDCOM-Datei beginnt mit der Zeile „0 HEAD“. Die meisten Ahnenprogramme schreiben eine unter Export.",
         noPersons: (name) => `${name} enthält keine Person.`,
-        stranger: (link) => `Der Link führt zu ${link}: Diese Person steht nicht in der Datei.`,
+        unknownPerson: (link) => `Der Link führt zu ${link}: Diese Person steht nicht in der Datei.`,
         pictureTooLarge:
             "Dieses Bild fragt nach mehr als einer Million Verwandten; so viel fasst eine Seite nicht. Eine andere Person oder weniger Verwandte helfen.",
         tooLarge: "Sie ist größer als 128 MiB; so viel fasst eine Seite nicht.",

@@ -162,7 +162,7 @@ export const uiEnglish: UiMessages = {
         notGedcom: (name) => `${name} could not be read as a family file.`,
         hint: "A GEDCOM file begins with the line “0 HEAD”. Most genealogy programs write one under Export.",
         noPersons: (name) => `${name} holds no person.`,
-        stranger: (link) => `The link leads to ${link}, a person who is not in this file.`,
+        unknownPerson: (link) => `The link leads to ${link}, a person who is not in this file.`,
         pictureTooLarge:
             "This picture asks for more than a million relatives, which is more than a page can hold. Try another person, or show fewer relatives.",
         tooLarge: "It is larger than 128 MiB, which is more than a page can hold.",

@@ -167,7 +167,7 @@ export const uiSpanish: UiMessages = {
         notGedcom: (name) => `${name} no se pudo leer como archivo de familia.`,
         hint: "Un archivo GEDCOM empieza por la línea «0 HEAD». La mayoría de los programas de genealogía lo crean con Exportar.",
         noPersons: (name) => `${name} no contiene ninguna persona.`,
-        stranger: (link) => `El enlace lleva a ${link}, una persona que no está en este archivo.`,
+        unknownPerson: (link) => `El enlace lleva a ${link}, una persona que no está en este archivo.`,
         pictureTooLarge:
             "Esta imagen pide más de un millón de parientes, más de lo que cabe en una página. Pruebe con otra persona o muestre menos parientes.",
         tooLarge: "Supera los 128 MiB, más de lo que cabe en una página.",

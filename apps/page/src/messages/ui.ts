@@ -129,7 +129,7 @@ export interface UiMessages {
         readonly notGedcom: (name: string) => string;
         readonly hint: string;
         readonly noPersons: (name: string) => string;
-        readonly stranger: (link: string) => string;
+        readonly unknownPerson: (link: string) => string;
         readonly tooLarge: string;
         readonly pictureTooLarge: string;
         readonly tooNew: string;

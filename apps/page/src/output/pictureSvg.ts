@@ -6,7 +6,7 @@
 
 import { drawBox, handleOf } from "../scene/boxArt";
 import { drawFamily } from "../scene/familyLines";
-import type { Dress } from "../scene/Scene";
+import type { BoxContents } from "../scene/Scene";
 import { kFontFamily } from "../scene/textFit";
 import { svg } from "../base/dom";
 import type { Picture } from "../view/Picture";
@@ -43,7 +43,7 @@ const kPageOnly = [
 
 export interface Looks {
     readonly picture: Picture;
-    readonly dress: Dress;
+    readonly contents: BoxContents;
     readonly title: string;
     readonly root: ParentNode & Node;
 }
@@ -58,7 +58,7 @@ export interface WholePicture {
 // theme is the name of a set of colours in the style sheet.
 // root is the tree of elements that the sheet holds for.
 export function wholePicture(
-    { picture, dress, title, root }: Looks,
+    { picture, contents, title, root }: Looks,
     theme: string,
 ): WholePicture {
     const { left, top, right, bottom } = picture.bounds;
@@ -80,7 +80,7 @@ export function wholePicture(
         svg("g", { "stroke-width": 1.6 }, ...picture.families.map(drawFamily)),
     );
     for (const box of picture.boxes) {
-        const look = dress.lookOf(box);
+        const look = contents.lookOf(box);
         const element = drawBox(look, box);
         element.setAttribute("transform", `translate(${box.x} ${box.y})`);
         element.setAttribute("role", "img");

@@ -33,7 +33,7 @@ export interface SceneEvents {
 }
 
 // How the boxes of a picture are to be drawn.
-export interface Dress {
+export interface BoxContents {
     lookOf(box: Box): BoxLook;
 }
 
@@ -51,7 +51,7 @@ export class Scene {
     private readonly boxLayer = svg("g", { class: "boxes" });
     private readonly elements = new Map<Box, SVGGElement>();
     private picture: Picture | null = null;
-    private dress!: Dress; // given with the picture
+    private contents!: BoxContents; // given with the picture
     private activeBox: Box | null = null;
     private pointedBox: Box | null = null;
     private drawn: Rectangle | null = null; // whose boxes and lines have elements
@@ -71,7 +71,7 @@ export class Scene {
 
     // Draws another picture. Boxes of the same persons glide from where they stood, while the anchor, a box
     // of the picture so far, hands its place on the screen to the new focus.
-    show(picture: Picture, dress: Dress, anchor: Box | null): void {
+    show(picture: Picture, contents: BoxContents, anchor: Box | null): void {
         const before = this.picture;
         const hadKeys = this.surface.contains(this.keyHolder);
         const oldElements = new Map(this.elements);
@@ -79,7 +79,7 @@ export class Scene {
 
         this.endGlide();
         this.picture = picture;
-        this.dress = dress;
+        this.contents = contents;
         this.activeBox = picture.focusBox;
         this.pointedBox = null;
         this.elements.clear();
@@ -95,11 +95,11 @@ export class Scene {
     // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
     redraw(): void {
         for (const [box, element] of this.elements)
-            repaintBox(element, this.dress.lookOf(box), box);
+            repaintBox(element, this.contents.lookOf(box), box);
     }
 
-    restyle(dress: Dress): void {
-        this.dress = dress;
+    restyle(contents: BoxContents): void {
+        this.contents = contents;
         this.redraw();
     }
 
@@ -351,7 +351,7 @@ export class Scene {
     }
 
     private newElement(box: Box): SVGGElement {
-        const element = drawBox(this.dress.lookOf(box), box);
+        const element = drawBox(this.contents.lookOf(box), box);
         element.setAttribute("data-box", String(box.index));
         if (box === this.activeBox) handleOf(element).setAttribute("tabindex", "0");
         this.elements.set(box, element);

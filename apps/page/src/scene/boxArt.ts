@@ -20,7 +20,7 @@ export interface Extent {
 
 // Everything that a box shows and says.
 export interface BoxLook {
-    readonly person: number; // 0 for a missing parent
+    readonly person: number; // 0 for an unknown parent
     readonly xref: string;
     readonly sex: Sex;
     // Given name and surname in the order of reading.

@@ -139,7 +139,7 @@ export class App implements ChromeActions {
     // A link that leads to nobody is named; one that leads somewhere takes the notice away.
     private nameUnknownPerson(address: string): void {
         const link = unknownPersonIn(address, this.tree.family!.persons);
-        if (link) this.notices.fail(this.ui.errors.stranger(quoted(link)), [], "link");
+        if (link) this.notices.fail(this.ui.errors.unknownPerson(quoted(link)), [], "link");
         else this.notices.clear("link");
     }
 

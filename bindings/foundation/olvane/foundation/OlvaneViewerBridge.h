@@ -12,7 +12,7 @@
 //          share.
 // Memory: the data source is held for the whole of a call, also where one of its operations releases the bridge. What
 //         it autoreleases goes to the pool that stands when the call is made.
-// Nested: an operation may ask for a layout of its own. Both count synthetic parents in one sequence, so those of the
+// Nested: an operation may ask for a layout of its own. Both count unknown parents in one sequence, so those of the
 //         outer layout that are made afterwards have other negative ids than without it.
 // Not to be included together with the class of the same name in C++.
 @interface OlvaneViewerBridge : NSObject {

@@ -4,7 +4,7 @@
 // Lines of detail, as they stand, in one list. A line is kept if its tag is one of those that readers of a family want,
 // and if the line above it is kept.
 
-#include <olvane/gedcom/DetailKeeperInternal.h>
+#include <olvane/gedcom/DetailReaderInternal.h>
 
 #include <algorithm>
 #include <iterator>
@@ -47,29 +47,29 @@ bool looksLikePointer(std::string_view value) {
 
 }  // namespace
 
-void DetailKeeper::beginPerson() {
+void DetailReader::beginPerson() {
     tables_.detailsOfPersons.push_back({static_cast<std::uint32_t>(tables_.details.size()), 0});
     record_ = &tables_.detailsOfPersons.back();
     owner_ = nullptr;
     leftOutLevel_ = 0;
 }
 
-void DetailKeeper::beginFamily() {
+void DetailReader::beginFamily() {
     tables_.detailsOfFamilies.push_back({static_cast<std::uint32_t>(tables_.details.size()), 0});
     record_ = &tables_.detailsOfFamilies.back();
     owner_ = nullptr;
     leftOutLevel_ = 0;
 }
 
-void DetailKeeper::beginShared(const GedcomLine& line, std::uint64_t tag) {
+void DetailReader::beginShared(const GedcomLine& line, std::uint64_t tag) {
     record_ = nullptr;
     owner_ = nullptr;
     leftOutLevel_ = 0;
     if (line.xref.empty() || !isOneOf(tag, kSharedTags)) return;
     SharedRecord shared;
-    shared.xref = keeper_.keep(line.xref, line.number);
+    shared.xref = interner_.keep(line.xref, line.number);
     shared.tag = line.tag;
-    shared.value = keeper_.keepLines(scanner_.wholeValue(line), line.number);
+    shared.value = interner_.keepLines(scanner_.wholeValue(line), line.number);
     shared.line = line.number;
     shared.detailSlice.first = static_cast<std::uint32_t>(tables_.details.size());
     tables_.sharedByXref.emplace(shared.xref, static_cast<std::uint32_t>(tables_.sharedRecords.size()));
@@ -78,41 +78,41 @@ void DetailKeeper::beginShared(const GedcomLine& line, std::uint64_t tag) {
 }
 
 // Those before that have no slice have no details.
-void DetailKeeper::beginOwner(std::vector<Slice>& slices, std::size_t place) {
+void DetailReader::beginOwner(std::vector<Slice>& slices, std::size_t place) {
     slices.resize(place + 1);
     slices[place].first = static_cast<std::uint32_t>(tables_.details.size());
     owner_ = &slices[place];
     leftOutLevel_ = 0;
 }
 
-void DetailKeeper::beginName() {
+void DetailReader::beginName() {
     beginOwner(tables_.detailsOfNames, tables_.names.size());
 }
 
-void DetailKeeper::beginFact() {
+void DetailReader::beginFact() {
     beginOwner(tables_.detailsOfFacts, tables_.facts.size() - 1);
 }
 
-void DetailKeeper::beginOwn(const GedcomLine& line, std::uint64_t tag) {
+void DetailReader::beginOwn(const GedcomLine& line, std::uint64_t tag) {
     owner_ = nullptr;
     leftOutLevel_ = 0;
     isOneOf(tag, kOwnTags) ? keep(line) : leaveOut(line);
 }
 
-void DetailKeeper::add(const GedcomLine& line, std::uint64_t tag) {
+void DetailReader::add(const GedcomLine& line, std::uint64_t tag) {
     if (record_ == nullptr || (leftOutLevel_ != 0 && line.level > leftOutLevel_)) return;
     leftOutLevel_ = 0;
     const bool fits = isOneOf(tag, kTagsBelow) && line.level < GedcomLine::kDeep;
     fits ? keep(line) : leaveOut(line);
 }
 
-void DetailKeeper::keep(const GedcomLine& line) {
+void DetailReader::keep(const GedcomLine& line) {
     DetailLine detail;
     const std::string_view value = trimmed(line.value);
     detail.isPointer = looksLikePointer(value);
     detail.tag = line.tag;
-    detail.value = detail.isPointer ? keeper_.keep(value.substr(1, value.size() - 2), line.number)
-                                    : keeper_.keepLines(scanner_.wholeValue(line), line.number);
+    detail.value = detail.isPointer ? interner_.keep(value.substr(1, value.size() - 2), line.number)
+                                    : interner_.keepLines(scanner_.wholeValue(line), line.number);
     detail.line = line.number;
     detail.level = static_cast<std::uint8_t>(line.level);
     detail.isOfPart = owner_ != nullptr;

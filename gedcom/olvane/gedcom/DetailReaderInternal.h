@@ -6,7 +6,7 @@
 
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/LineScannerInternal.h>
-#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/TextInternerInternal.h>
 
 namespace olvane::gedcom {
 
@@ -14,10 +14,10 @@ namespace olvane::gedcom {
 // links, and the records that they point to. Whatever else stands in a file is left out, with what lies below it.
 //
 // Holds: receives every line below level 0, in order.
-class DetailKeeper {
+class DetailReader {
 public:
-    DetailKeeper(LineScanner& scanner, TextKeeper& keeper, GedcomTables& tables)
-        : scanner_(scanner), keeper_(keeper), tables_(tables) {}
+    DetailReader(LineScanner& scanner, TextInterner& interner, GedcomTables& tables)
+        : scanner_(scanner), interner_(interner), tables_(tables) {}
 
     void beginPerson();
     void beginFamily();
@@ -38,7 +38,7 @@ private:
     void keep(const GedcomLine& line);
 
     LineScanner& scanner_;
-    TextKeeper& keeper_;
+    TextInterner& interner_;
     GedcomTables& tables_;
     Slice* record_ = nullptr;       // of the record in hand; null for one that is left out
     Slice* owner_ = nullptr;        // of the fact or name in hand, beside the record's

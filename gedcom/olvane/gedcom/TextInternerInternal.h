@@ -23,9 +23,9 @@ struct TextStore {
 // are so already and are kept as a view into the bytes.
 //
 // Holds: what is kept is well-formed UTF-8 on one line.
-class TextKeeper {
+class TextInterner {
 public:
-    TextKeeper(TextStore& store, const TextForm& form, DiagnosticList& diagnostics)
+    TextInterner(TextStore& store, const TextForm& form, DiagnosticList& diagnostics)
         : store_(store), form_(form), diagnostics_(diagnostics) {}
 
     std::string_view keep(std::string_view raw, std::uint32_t line);
@@ -39,7 +39,7 @@ private:
     bool isPlain(std::string_view raw) const;
     bool liesInBytes(std::string_view text) const;
     std::string decoded(std::string_view raw, std::uint32_t line);
-    void undouble(std::string& text) const;
+    void unescapeAt(std::string& text) const;
     void removeControls(std::string& text, std::uint32_t line, bool keepsLineEnds);
 
     TextStore& store_;

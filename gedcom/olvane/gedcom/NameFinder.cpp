@@ -5,7 +5,7 @@
 // that are anybody's given word or surname are picked out, and pairs of them are looked up. Words are what letters and
 // digits make between anything else; a run of a script that is written without spaces gives all its short pieces.
 
-#include <olvane/gedcom/NameSpotterInternal.h>
+#include <olvane/gedcom/NameFinderInternal.h>
 
 #include <algorithm>
 #include <array>
@@ -202,7 +202,7 @@ Hashes common(const Hashes& words, const Hashes& set) {
 
 }  // namespace
 
-void NameSpotter::add(const GedcomData& data, PersonId id) {
+void NameFinder::add(const GedcomData& data, PersonId id) {
     Hashes surnames = surnamesOf(data, id);
     Hashes given;
     for (const PersonName& name : someNames(data, id)) addGivenNames(name, given);
@@ -222,7 +222,7 @@ void NameSpotter::add(const GedcomData& data, PersonId id) {
     surnameWords_.insert(surnameWords_.end(), surnames.begin(), surnames.end());
 }
 
-void NameSpotter::addOther(const GedcomData& data, PersonId id) {
+void NameFinder::addOther(const GedcomData& data, PersonId id) {
     Hashes words;
     for (const PersonName& name : someNames(data, id)) {
         addGivenNames(name, words);
@@ -231,12 +231,12 @@ void NameSpotter::addOther(const GedcomData& data, PersonId id) {
     otherWords_.insert(otherWords_.end(), words.begin(), words.end());
 }
 
-void NameSpotter::settle() {
+void NameFinder::buildIndex() {
     for (Hashes* const set : {&givenWords_, &surnameWords_, &pairs_, &ownWords_, &otherWords_}) makeSet(*set);
     std::erase_if(ownWords_, [this](std::uint64_t word) { return contains(otherWords_, word); });
 }
 
-bool NameSpotter::isNamedIn(std::string_view text) const {
+bool NameFinder::isNamedIn(std::string_view text) const {
     const Hashes words = wordsOfText(text);
     const Hashes given = common(words, givenWords_);
     if (given.empty()) return false;
@@ -248,7 +248,7 @@ bool NameSpotter::isNamedIn(std::string_view text) const {
     });
 }
 
-bool NameSpotter::isHintedAtIn(std::string_view text) const {
+bool NameFinder::isHintedAtIn(std::string_view text) const {
     const Hashes words = wordsOfText(text);
     return std::any_of(words.begin(), words.end(),
                        [this](std::uint64_t word) { return contains(ownWords_, word); });

@@ -10,7 +10,7 @@ import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../messages/names";
 import type { BoxLook } from "./boxArt";
-import type { Dress } from "./Scene";
+import type { BoxContents } from "./Scene";
 import type { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
 
@@ -20,7 +20,7 @@ export interface Wording {
     readonly kinshipInBoxes: boolean;
 }
 
-export class PictureDress implements Dress {
+export class PictureContents implements BoxContents {
     kinshipKnown = false;
 
     constructor(

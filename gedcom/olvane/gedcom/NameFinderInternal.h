@@ -17,13 +17,13 @@ namespace olvane::gedcom {
 //
 // Holds: words are kept as 64-bit hashes, so once in a long while a text is taken to name somebody whom it does not;
 //        never the other way round. Time is linear in names and texts.
-class NameSpotter {
+class NameFinder {
 public:
     void add(const GedcomData& data, PersonId id);
     // Somebody else, whose given names and surnames are no hint.
     void addOther(const GedcomData& data, PersonId id);
     // To be called behind the last add, before the first question.
-    void settle();
+    void buildIndex();
     bool isNamedIn(std::string_view text) const;
     bool isHintedAtIn(std::string_view text) const;
 

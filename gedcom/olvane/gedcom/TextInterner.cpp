@@ -4,7 +4,7 @@
 // Values on their way from the file to the records. Nearly all are plain ASCII or sound UTF-8 and cost one
 // look.
 
-#include <olvane/gedcom/TextKeeperInternal.h>
+#include <olvane/gedcom/TextInternerInternal.h>
 
 #include <algorithm>
 #include <array>
@@ -38,36 +38,36 @@ bool isWhiteControl(char c) {
 
 }  // namespace
 
-bool TextKeeper::isPlain(std::string_view raw) const {
+bool TextInterner::isPlain(std::string_view raw) const {
     unsigned demands = 0;
     for (const char c : raw) demands |= kDemands[static_cast<unsigned char>(c)];
     return demands == kNothing || (demands == kDecoding && form_.coding == ValueCoding::utf8 && isUtf8(raw));
 }
 
-bool TextKeeper::liesInBytes(std::string_view text) const {
+bool TextInterner::liesInBytes(std::string_view text) const {
     const std::string& bytes = store_.bytes;
     const std::less<const char*> before;
     return !before(text.data(), bytes.data()) && before(text.data(), bytes.data() + bytes.size());
 }
 
-std::string_view TextKeeper::keep(std::string_view raw, std::uint32_t line) {
+std::string_view TextInterner::keep(std::string_view raw, std::uint32_t line) {
     return keepAs(raw, line, false);
 }
 
-std::string_view TextKeeper::keepLines(std::string_view raw, std::uint32_t line) {
+std::string_view TextInterner::keepLines(std::string_view raw, std::uint32_t line) {
     return keepAs(raw, line, true);
 }
 
-std::string_view TextKeeper::keepAs(std::string_view raw, std::uint32_t line, bool keepsLineEnds) {
+std::string_view TextInterner::keepAs(std::string_view raw, std::uint32_t line, bool keepsLineEnds) {
     raw = trimmed(raw);
     if (isPlain(raw)) return liesInBytes(raw) ? raw : store_.arena.keep(raw);
     std::string text = decoded(raw, line);
-    undouble(text);
+    unescapeAt(text);
     removeControls(text, line, keepsLineEnds);
     return store_.arena.keep(trimmed(text));
 }
 
-std::string TextKeeper::decoded(std::string_view raw, std::uint32_t line) {
+std::string TextInterner::decoded(std::string_view raw, std::uint32_t line) {
     std::size_t faults = 0;
     std::string text = decodeText(raw, form_, faults);
     if (faults != 0) {
@@ -79,7 +79,7 @@ std::string TextKeeper::decoded(std::string_view raw, std::uint32_t line) {
     return text;
 }
 
-void TextKeeper::undouble(std::string& text) const {
+void TextInterner::unescapeAt(std::string& text) const {
     if (!form_.doublesEveryAt) {
         if (text.starts_with("@@")) text.erase(0, 1);
         return;
@@ -92,7 +92,7 @@ void TextKeeper::undouble(std::string& text) const {
     text.resize(kept);
 }
 
-void TextKeeper::removeControls(std::string& text, std::uint32_t line, bool keepsLineEnds) {
+void TextInterner::removeControls(std::string& text, std::uint32_t line, bool keepsLineEnds) {
     const auto isKept = [keepsLineEnds](char c) { return keepsLineEnds && c == '\n'; };
     std::replace_if(
         text.begin(), text.end(), [&](char c) { return isWhiteControl(c) && !isKept(c); }, ' ');
