@@ -6,7 +6,7 @@
 
 import type { Diagnostic, GedcomFile, Person } from "olvane";
 import { html, recall, remember } from "../base/dom";
-import { type ChartDirection, kViewNames, type RelativeName, type ViewName } from "../base/views";
+import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
 import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
 import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
