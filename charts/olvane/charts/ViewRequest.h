@@ -8,6 +8,7 @@
 
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/KinGraph.h>
+#include <olvane/kin/Language.h>
 
 namespace olvane::charts {
 
@@ -73,6 +74,7 @@ struct ChartRequest {
 
     WayChoice ways = WayChoice::both;
     int mostWays = 8;  // kinship: no more ways than this are drawn, the nearest first; 0 means all
+    kin::Language language = kin::Language::english;  // kinship: of its words
 
     int marks = 0;        // everybody: how many second links become marks; -1 for all of them
     int effort = 1;       // everybody: 0 is quickest, each step more takes up to twice the time

@@ -102,12 +102,24 @@ enum class WayKind : std::uint8_t { blood, legal, marriage };
 // A way from one person to another.
 //
 // Holds: its boxes lie in Picture::wayBoxes, from the one person to the other; behind them, the common ancestors at
-//        its top, one or both of a couple. A way by marriage has none.
+//        its top, one or both of a couple. A way by marriage has none. Its lines lie in Picture::wayPieces.
 struct Way {
     std::uint32_t firstBox = 0;
     std::uint32_t boxCount = 0;
     std::uint32_t ancestorCount = 0;
+    std::uint32_t firstPiece = 0;
+    std::uint32_t pieceCount = 0;
     WayKind kind = WayKind::blood;
+    std::string words;  // what the other person is to the focus by this way alone: "first cousin"
+};
+
+// A straight piece of the line of a way, in points: horizontal or vertical. It runs along the lines of families, or
+// beside them where several ways take the same line, and reaches into the boxes at its ends.
+struct WayPiece {
+    double x1 = 0;
+    double y1 = 0;
+    double x2 = 0;
+    double y2 = 0;
 };
 
 // What is drawn, as data: boxes, families and the lines of each family. Every view ends in one.
@@ -129,8 +141,14 @@ struct Picture {
     std::vector<Line> lines;
     std::vector<double> bridges;
     std::vector<Mark> marks;
-    std::vector<Way> ways;  // of a picture of kinship, the nearest first
+    // Of a picture of kinship: the other person, the ways, those by blood first, and in words what the focus is to
+    // the other person and the other one to the focus; empty where no way is known.
+    Index other = kNone;
+    std::vector<Way> ways;
     std::vector<Index> wayBoxes;
+    std::vector<WayPiece> wayPieces;
+    std::string focusIs;
+    std::string otherIs;
 
     bool isRound() const { return !arcs.empty(); }
     std::span<const Index> parents(const Family& f) const {
@@ -148,6 +166,9 @@ struct Picture {
     }
     std::span<const Index> ancestorsOf(const Way& way) const {
         return {wayBoxes.data() + way.firstBox + way.boxCount, way.ancestorCount};
+    }
+    std::span<const WayPiece> piecesOf(const Way& way) const {
+        return {wayPieces.data() + way.firstPiece, way.pieceCount};
     }
     std::span<const double> bridgesOf(const Line& line) const {
         return {bridges.data() + line.firstBridge, line.bridgeCount};

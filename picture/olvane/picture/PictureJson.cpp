@@ -88,8 +88,11 @@ public:
         json_ += ",\n";
         addList("marks", picture_.marks.size(),
                 [this](std::size_t i) { return markJson(picture_.marks[i]); });
-        if (!picture_.ways.empty()) {
-            json_ += ",\n";
+        if (picture_.other != kNone) {
+            json_ += ",\n \"other\": " +
+                     std::to_string(picture_.boxes[static_cast<std::size_t>(picture_.other)].id) +
+                     ",\n \"focusIs\": " + quoted(picture_.focusIs) +
+                     ",\n \"otherIs\": " + quoted(picture_.otherIs) + ",\n";
             addList("ways", picture_.ways.size(),
                     [this](std::size_t i) { return wayJson(picture_.ways[i]); });
         }
@@ -168,7 +171,13 @@ private:
     std::string wayJson(const Way& way) const {
         return "{\"kind\": " + quoted(nameOf(way.kind)) +
                ", \"boxes\": " + placesJson(picture_.boxesOf(way)) +
-               ", \"ancestors\": " + placesJson(picture_.ancestorsOf(way)) + "}";
+               ", \"ancestors\": " + placesJson(picture_.ancestorsOf(way)) +
+               ", \"words\": " + quoted(way.words) + ", \"lines\": " +
+               listOf(picture_.piecesOf(way),
+                      [](const WayPiece& piece) {
+                          return listOf(std::array{piece.x1, piece.y1, piece.x2, piece.y2}, number);
+                      }) +
+               "}";
     }
 
     static std::string markJson(const Mark& mark) {

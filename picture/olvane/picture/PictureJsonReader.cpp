@@ -121,6 +121,7 @@ public:
         findFocus(integerAt<std::int64_t>(json, "focus"));
         for (const Json& family : listAt(json, "families")) readFamily(family);
         for (const Json& mark : listAt(json, "marks")) readMark(mark);
+        readOther(json);
         for (const Json& way : listAt(json, "ways")) readWay(way);
         return std::move(picture_);
     }
@@ -146,7 +147,32 @@ private:
             picture_.wayBoxes.push_back(placeOf(box, "a way"));
             ++way.ancestorCount;
         }
-        picture_.ways.push_back(way);
+        way.words = textAt(json, "words");
+        way.firstPiece = static_cast<std::uint32_t>(picture_.wayPieces.size());
+        for (const Json& piece : listAt(json, "lines")) readWayPiece(piece);
+        way.pieceCount = static_cast<std::uint32_t>(picture_.wayPieces.size()) - way.firstPiece;
+        picture_.ways.push_back(std::move(way));
+    }
+
+    void readWayPiece(const Json& json) {
+        if (!json.is_array() || json.size() != 4) fail("a line of a way has four numbers");
+        picture_.wayPieces.push_back({numberOf(json[0], "lines"), numberOf(json[1], "lines"),
+                                      numberOf(json[2], "lines"), numberOf(json[3], "lines")});
+    }
+
+    static std::string textAt(const Json& object, const char* name) {
+        const Json* text = find(object, name);
+        return text != nullptr && text->is_string() ? text->get<std::string>() : std::string();
+    }
+
+    void readOther(const Json& json) {
+        if (find(json, "other") == nullptr) return;
+        const auto id = integerAt<std::int64_t>(json, "other");
+        for (std::size_t i = 0; i < picture_.boxes.size() && picture_.other == kNone; ++i) {
+            if (picture_.boxes[i].id == id) picture_.other = static_cast<Index>(i);
+        }
+        picture_.focusIs = textAt(json, "focusIs");
+        picture_.otherIs = textAt(json, "otherIs");
     }
 
     void readRings(const Json& json) {
