@@ -63,6 +63,23 @@ void PictureRun::hideIn(picture::Picture& picture) const {
         family.number = 0;
         family.style = kin::UnionState::unknown;
     }
+    hideWaysIn(picture);
+}
+
+// Words of a way tell an adoption and whether a marriage lasts; and those at the ends tell of all ways.
+void PictureRun::hideWaysIn(picture::Picture& picture) const {
+    for (picture::Way& way : picture.ways) {
+        const auto boxes = picture.boxesOf(way);
+        if (std::none_of(boxes.begin(), boxes.end(), [&](picture::Index box) {
+                return isHidden(picture.boxes[static_cast<std::size_t>(box)].id);
+            })) {
+            continue;
+        }
+        way.words.clear();
+        if (way.kind == picture::WayKind::legal) way.kind = picture::WayKind::blood;
+        picture.focusIs.clear();
+        picture.otherIs.clear();
+    }
 }
 
 picture::PictureFacts PictureRun::facts() const {

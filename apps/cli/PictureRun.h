@@ -27,7 +27,7 @@ public:
     PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden);
 
     // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, neither number
-    // nor state of a family with a hidden partner or without a partner who is known.
+    // nor state of a family with a hidden partner or without a partner who is known, no words of a way over them.
     picture::Picture pictureOf(gedcom::PersonId focus) const;
 
     // What the file adds in JSON; of a hidden person {"living": true}. Valid as long as this lives.
@@ -39,6 +39,7 @@ public:
 private:
     bool isHidden(std::int64_t id) const;
     void hideIn(picture::Picture& picture) const;
+    void hideWaysIn(picture::Picture& picture) const;
 
     const gedcom::GedcomData& data_;
     charts::ViewRequest view_;

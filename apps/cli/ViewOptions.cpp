@@ -85,6 +85,7 @@ const std::vector<OptionUse>& optionUses() {
         {"--to", {View::kinship}},
         {"--by", {View::kinship}},
         {"--ways", {View::kinship}},
+        {"--language", {View::kinship}},
         {"--marks", {View::everybody}},
         {"--effort", {View::everybody}},
         {"--all-parts", {View::everybody}},
@@ -190,6 +191,18 @@ void addKinshipOptions(CLI::App& command, LayoutRequest& request) {
         ->group(group);
 }
 
+void addLanguage(CLI::App& command, kin::Language& language) {
+    static const std::map<std::string, kin::Language> kNames = [] {
+        std::map<std::string, kin::Language> names;
+        for (const kin::Language one : kin::kLanguages) names.emplace(kin::languageCode(one), one);
+        return names;
+    }();
+    command.add_option("--language", language, "The language of the kinship's words; English when not given")
+        ->transform(CLI::CheckedTransformer(kNames))
+        ->type_name("en|de|es")
+        ->group(kKinshipGroup);
+}
+
 void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
     const std::string group = "View of everybody";
     command
@@ -273,6 +286,7 @@ void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string
     addChartOptions(command, request.chart);
     addOtherPerson(command, request);
     addKinshipOptions(command, request);
+    addLanguage(command, request.chart.language);
     addEverybodyOptions(command, request.chart);
     addFamilySwitches(command, request);
 }

@@ -11,7 +11,7 @@ _olvane() {
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
     local commands="people layout draw batch check kin judge page"
-    local view="--view --generations --boxes --up --down --direction --compact --siblings --no-spouses --to --by --ways --marks --effort --all-parts --of --angle"
+    local view="--view --generations --boxes --up --down --direction --compact --siblings --no-spouses --to --by --ways --language --marks --effort --all-parts --of --angle"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"

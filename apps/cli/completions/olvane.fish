@@ -55,7 +55,7 @@ complete -c olvane -n '__fish_seen_subcommand_from draw' -l page -x -a 'A4 A3 le
 complete -c olvane -n '__fish_seen_subcommand_from batch' -l focus-from -r -d 'File with the focuses'
 complete -c olvane -n '__fish_seen_subcommand_from kin' -l format -x -a 'text json' -d 'Form of the output'
 complete -c olvane -n '__fish_seen_subcommand_from kin' -l ways -x -d 'The most ways listed'
-complete -c olvane -n '__fish_seen_subcommand_from kin' -l language -x -a 'en de es' -d 'Language of the words'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts kin" -l language -x -a 'en de es' -d 'Language of the words'
 complete -c olvane -n '__fish_seen_subcommand_from judge' -l family -r -d 'GEDCOM file of the family'
 complete -c olvane -n '__fish_seen_subcommand_from batch' -l unbuffered -d 'Answer each line at once'
 complete -c olvane -n '__fish_seen_subcommand_from people check judge' -l format -x -a 'text tsv json' -d 'Form of the output'

@@ -35,6 +35,10 @@ constexpr double kBadgeHeight = 15;
 constexpr double kBadgeSize = 10;
 constexpr double kBadgeInset = 6;
 constexpr double kFocusBorder = 4;
+constexpr double kCaptionSize = 10.5;
+constexpr double kCaptionPitch = 13;
+constexpr std::size_t kMostCaptionLines = 3;
+constexpr double kCaptionOver = 40;      // by which a caption may be wider than its box
 constexpr double kNameGap = 3;           // between lines of a name
 constexpr double kLeastNameHeight = 26;  // two lines of the smallest letters
 constexpr std::size_t kMostNameLines = 8;
@@ -165,14 +169,23 @@ std::string_view silhouetteOf(kin::Sex sex) {
     return "olvane-person";
 }
 
+// A thick frame outside, apart from the border.
+void appendAncestorFrame(std::string& svg, const BoxFrame& box, double corner, const DrawingTheme& theme) {
+    svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
+           "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.badge) +
+           "\" stroke-width=\"3\"/>\n";
+}
+
 void appendFrame(std::string& svg, const BoxFrame& box, kin::Sex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double corner = cornerOf(sex);
+    const bool isEnd = box.isFocus || box.isOther;
     svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" + px(corner) +
            "\" fill=\"" + std::string(colours.fill) + "\" stroke=\"" +
-           std::string(box.isFocus ? theme.focus : colours.border) + "\" stroke-width=\"" +
-           px(box.isFocus ? kFocusBorder : 1.4) + "\"/>\n";
-    if (!box.isFocus) return;
+           std::string(isEnd ? theme.focus : colours.border) + "\" stroke-width=\"" +
+           px(isEnd ? kFocusBorder : 1.4) + "\"/>\n";
+    if (box.isCommonAncestor && !isEnd) appendAncestorFrame(svg, box, corner, theme);
+    if (!isEnd) return;
     // A second, thin frame outside marks the focus where colours are lost.
     svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
            "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.focus) +
@@ -282,6 +295,29 @@ void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& them
     appendMarks(svg, box, MarkPlace::bottom, theme);
 }
 
+// What the person is to the other one of a kinship, on a plate outside the box that touches its edge.
+void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
+    if (box.caption.empty()) return;
+    const Font font{kCaptionSize, true};
+    const picture::FittedText text = picture::fitText(
+        cleanText(cutText(box.caption)), font, box.width + kCaptionOver - 2 * kInset, kMostCaptionLines);
+    double width = 0;
+    for (const std::string& line : text.lines) width = std::max(width, textWidth(line, font));
+    width += 2 * kInset;
+    const double height = static_cast<double>(text.lines.size()) * kCaptionPitch + 5;
+    const double x = (box.width - width) / 2;
+    const double y = box.captionOnTop ? kFocusBorder - height : box.height - kFocusBorder;
+    svg += "<rect x=\"" + px(x) + "\" y=\"" + px(y) + "\" width=\"" + px(width) + "\" height=\"" +
+           px(height) + "\" rx=\"6\" fill=\"" + std::string(theme.focus) + "\"/>\n";
+    double baseline = y + kCaptionPitch - 1.5;
+    for (const std::string& line : text.lines) {
+        appendTextLine(svg, box.width / 2, baseline, line,
+                       " text-anchor=\"middle\" font-weight=\"bold\" font-size=\"" + px(kCaptionSize) +
+                           "\" fill=\"" + std::string(theme.page) + "\"");
+        baseline += kCaptionPitch;
+    }
+}
+
 std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
     std::string title = kin::fullName(label);
     if (!label.living && !label.birth.empty()) title += ", * " + label.birth;
@@ -290,6 +326,8 @@ std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
         for (const std::string& detail : label.details) title += ", " + detail;
     }
     if (box.isFocus) title += " (focus of this picture)";
+    if (!box.caption.empty()) title += ". " + box.caption;
+    if (box.isCommonAncestor) title += ". Common ancestor";
     if (box.repeatNumber > 0) title += ". " + repeatSentence(box);
     if (box.hasHidden()) title += ". " + hiddenSentence(box, label.living);
     for (const BoxMark& mark : box.marks) title += ". " + mark.title;
@@ -347,6 +385,7 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     appendTexts(svg, box, shown, theme);
     appendBadges(svg, box, label, theme);
     appendMarks(svg, box, theme);
+    appendCaption(svg, box, theme);
     svg += "</g>\n";
 }
 

@@ -21,6 +21,10 @@ struct BoxFrame {
     double width = 0;
     double height = 0;
     bool isFocus = false;
+    bool isOther = false;           // whom a kinship is about beside the focus
+    bool isCommonAncestor = false;  // at the top of a way
+    std::string caption;            // what the one of a kinship is to the other; at the lower or upper edge
+    bool captionOnTop = false;
     // A person with several boxes has a number, the same in each; 0 for everybody else.
     int repeatNumber = 0;
     int repeatCount = 0;
@@ -33,6 +37,9 @@ struct BoxFrame {
 
 // What is said of a person, each text cut to what can be read.
 kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);
+
+// How far a caption reaches beyond its box, at most.
+constexpr double kCaptionReach = 40;
 
 // The definitions that boxes refer to. Once, ahead of all boxes.
 void appendBoxDefinitions(std::string& svg);

@@ -32,6 +32,7 @@ const DrawingTheme& lightTheme() {
         .male = {"#d3e3f5", "#2f6199", "#8dacd0"},
         .female = {"#fdeaf1", "#a63d6e", "#d79db8"},
         .other = {"#eeede8", "#66625a", "#aaa69c"},
+        .ways = {"#0060a8", "#b3470f", "#00724f", "#8f3f86", "#6b5600", "#00707f", "#a32a3c", "#55504a"},
     };
     return kTheme;
 }
@@ -49,6 +50,7 @@ const DrawingTheme& darkTheme() {
         .male = {"#18304d", "#7fb0e6", "#4d759f"},
         .female = {"#592740", "#ee9dbf", "#8f5170"},
         .other = {"#35373c", "#b4b4b4", "#6c6d71"},
+        .ways = {"#6cb6ff", "#ff9a5c", "#58d3a0", "#e294d8", "#e0c95a", "#5fd0e0", "#ff8f9c", "#c9c4bc"},
     };
     return kTheme;
 }
@@ -66,6 +68,7 @@ const DrawingTheme& printTheme() {
         .male = {"#e8e8e8", "#202020", "#9c9c9c"},
         .female = {"#ffffff", "#202020", "#b4b4b4"},
         .other = {"#f4f4f4", "#202020", "#a8a8a8"},
+        .ways = {"#000000", "#303030", "#000000", "#303030", "#000000", "#303030", "#000000", "#303030"},
     };
     return kTheme;
 }

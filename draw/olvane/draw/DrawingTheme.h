@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <array>
 #include <string_view>
 
 #include <olvane/kin/PersonLabel.h>
@@ -33,6 +34,7 @@ struct DrawingTheme {
     BoxColours male;
     BoxColours female;
     BoxColours other;
+    std::array<std::string_view, 8> ways;  // lines of the ways of a kinship; dashes set them apart as well
 
     const BoxColours& coloursOf(kin::Sex sex) const;
 };

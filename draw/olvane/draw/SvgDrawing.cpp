@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <set>
 #include <unordered_map>
 #include <vector>
 
@@ -14,6 +15,7 @@
 #include <olvane/draw/FanArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
+#include <olvane/draw/WayArtInternal.h>
 #include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
@@ -25,6 +27,7 @@ using picture::cutText;
 using picture::fitLine;
 using picture::Font;
 using picture::kFontFamilies;
+using picture::textWidth;
 
 // All in px.
 constexpr int kMargin = 28;
@@ -32,9 +35,10 @@ constexpr int kHeadlineHeight = 40;
 constexpr double kHeadlineSize = 20;
 constexpr int kLegendPitch = 22;
 constexpr int kLegendGap = 12;  // between the last row of boxes and the legend
-constexpr int kLegendWidth = 170;
+constexpr double kLegendWidth = 170;
 constexpr int kLegendStroke = 44;
 constexpr double kLegendSize = 11.5;
+constexpr double kLegendLine = 1.6;
 
 struct Bounds {
     double left = 0;
@@ -50,7 +54,17 @@ struct Bounds {
     }
 };
 
-// Of boxes and lines; of an empty picture, the room that its sentence needs.
+// Whether an upright line leaves the box downwards.
+bool hasLineBelow(const picture::Picture& picture, const picture::Box& box) {
+    const double lower = box.y + static_cast<double>(box.height);
+    const double right = box.x + static_cast<double>(box.width);
+    return std::any_of(picture.lines.begin(), picture.lines.end(), [&](const picture::Line& line) {
+        return line.x1 == line.x2 && line.x1 >= box.x && line.x1 <= right &&
+               std::min(line.y1, line.y2) == lower;
+    });
+}
+
+// Of boxes, lines and captions; of an empty picture, the room that its sentence needs.
 Bounds boundsOf(const picture::Picture& picture) {
     if (picture.boxes.empty()) return {0, 0, 55, 80};
     const picture::Box& first = picture.boxes.front();
@@ -62,6 +76,16 @@ Bounds boundsOf(const picture::Picture& picture) {
     for (const picture::Line& line : picture.lines) {
         bounds.include(line.x1, line.y1);
         bounds.include(line.x2, line.y2);
+    }
+    for (const picture::Index end : {picture.focus, picture.other}) {
+        if (picture.other == picture::kNone || end == picture::kNone) continue;
+        const picture::Box& box = picture.boxes[static_cast<std::size_t>(end)];
+        constexpr double kReach = kCaptionReach / Frame::kScale;
+        if (hasLineBelow(picture, box)) {
+            bounds.include(box.x, box.y - kReach);
+        } else {
+            bounds.include(box.x, box.y + static_cast<double>(box.height) + kReach);
+        }
     }
     return bounds;
 }
@@ -91,6 +115,7 @@ public:
         for (PictureBox& stroke : lines.strokes) stroke.start += picture_.svg.size();
         picture_.strokes = std::move(lines.strokes);
         picture_.svg += lines.svg;
+        appendWays(picture_.svg, content_.picture, theme(), frame_);
         appendBoxes();
         picture_.svg += legend;
         closePage(picture_);
@@ -121,13 +146,36 @@ private:
     void appendBoxes() {
         const picture::Picture& picture = content_.picture;
         numberRepeats();
+        findCommonAncestors();
         if (picture.boxes.empty()) appendNobody();
         const auto marks = boxMarksOf(picture);
         for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
             BoxFrame frame = frameOf(picture.boxes[i]);
             frame.isFocus = picture.focus == static_cast<picture::Index>(i);
+            addKinship(frame, static_cast<picture::Index>(i));
             frame.marks = marks[i];
             appendBox(frame);
+        }
+    }
+
+    // Of the ends of a kinship what they are to one another, on the edge that no line meets; and who is on top.
+    void addKinship(BoxFrame& frame, picture::Index place) const {
+        const picture::Picture& picture = content_.picture;
+        if (picture.other == picture::kNone) return;
+        frame.isOther = place == picture.other;
+        frame.isCommonAncestor = commonAncestors_.contains(place);
+        if (place == picture.other) {
+            frame.caption = picture.otherIs;
+        } else if (frame.isFocus) {
+            frame.caption = picture.focusIs;
+        }
+        frame.captionOnTop = !frame.caption.empty() && hasLineBelow(picture, *frame.box);
+    }
+
+    void findCommonAncestors() {
+        for (const picture::Way& way : content_.picture.ways) {
+            const auto ancestors = content_.picture.ancestorsOf(way);
+            commonAncestors_.insert(ancestors.begin(), ancestors.end());
         }
     }
 
@@ -171,31 +219,57 @@ private:
                                                                     : kin::PersonLabel());
     }
 
+    // What a line of a kind looks like, and what it means.
+    struct LegendRow {
+        std::string_view colour;
+        double width = kLegendLine;
+        std::string_view dashes;
+        std::string text;
+    };
+
+    std::vector<LegendRow> legendRows(const LineStylesUsed& styles) const {
+        std::vector<LegendRow> rows;
+        const std::vector<picture::Way>& ways = content_.picture.ways;
+        for (std::size_t i = 0; i < ways.size(); ++i) {
+            rows.push_back({wayColour(theme(), i), kWayWidth, wayDashes(i), ways[i].words});
+        }
+        for (std::size_t i = 1; i < kLineStyles; ++i) {
+            const auto style = static_cast<LineStyle>(i);
+            if (styles[i])
+                rows.push_back({theme().line, kLegendLine, dashesOf(style), std::string(meaningOf(style))});
+        }
+        return rows;
+    }
+
     // Below the picture, as wide as it needs; lists only what is there.
     std::string legendFor(const LineStylesUsed& styles) {
-        std::vector<LineStyle> rows;
-        for (std::size_t i = 1; i < kLineStyles; ++i) {
-            if (styles[i]) rows.push_back(static_cast<LineStyle>(i));
-        }
+        const std::vector<LegendRow> rows = legendRows(styles);
         if (rows.empty()) return std::string();
         std::string legend = "<g>\n<title>Legend</title>\n";
-        int row = 0;
-        for (const LineStyle style : rows) appendLegendLine(legend, row++, style);
-        picture_.height += row * kLegendPitch + kLegendGap;
-        picture_.width = std::max(picture_.width, kLegendWidth + 2 * kMargin);
-        const double height = row * kLegendPitch;
-        picture_.legend = {kMargin, picture_.height - kMargin - height, kLegendWidth, height};
+        double width = kLegendWidth;
+        int number = 0;
+        for (const LegendRow& row : rows) {
+            appendLegendRow(legend, number++, row);
+            width =
+                std::max(width, kLegendStroke + 10 + textWidth(cleanText(cutText(row.text)), {kLegendSize}));
+        }
+        picture_.height += number * kLegendPitch + kLegendGap;
+        picture_.width = std::max(picture_.width, wholePx(width) + 2 * kMargin);
+        const double height = number * kLegendPitch;
+        picture_.legend = {kMargin, picture_.height - kMargin - height, width, height};
         return legend + "</g>\n";
     }
 
-    void appendLegendLine(std::string& legend, int row, LineStyle style) const {
-        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * row + kLegendPitch / 2;
+    void appendLegendRow(std::string& legend, int number, const LegendRow& row) const {
+        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * number + kLegendPitch / 2;
         legend += "<path d=\"M" + std::to_string(kMargin) + " " + std::to_string(y) + "h" +
-                  std::to_string(kLegendStroke) + "\" fill=\"none\" stroke=\"" + std::string(theme().line) +
-                  "\" stroke-width=\"1.6\" stroke-dasharray=\"" + std::string(dashesOf(style)) +
-                  "\"/>\n<text x=\"" + std::to_string(kMargin + kLegendStroke + 10) + "\" y=\"" +
+                  std::to_string(kLegendStroke) + "\" fill=\"none\" stroke=\"" + std::string(row.colour) +
+                  "\" stroke-width=\"" + px(row.width) + "\"";
+        if (!row.dashes.empty()) legend += " stroke-dasharray=\"" + std::string(row.dashes) + "\"";
+        legend += "/>\n<text x=\"" + std::to_string(kMargin + kLegendStroke + 10) + "\" y=\"" +
                   std::to_string(y + 4) + "\" font-size=\"" + px(kLegendSize) + "\" fill=\"" +
-                  std::string(theme().quietText) + "\">" + std::string(meaningOf(style)) + "</text>\n";
+                  std::string(theme().quietText) + "\">" + escaped(cleanText(cutText(row.text))) +
+                  "</text>\n";
     }
 
     const DrawingContent& content_;
@@ -203,6 +277,7 @@ private:
     Frame frame_;
     SvgPicture picture_;
     std::unordered_map<std::int64_t, Repeats> repeats_;
+    std::set<picture::Index> commonAncestors_;
 };
 
 void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {

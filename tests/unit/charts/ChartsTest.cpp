@@ -339,6 +339,50 @@ TEST(KinshipChart, showsTheWaysBetweenTwoPersonsAndNobodyElse) {
     EXPECT_EQ(drawn.faults(), 0U);
 }
 
+TEST(KinshipChart, saysAtBothEndsWhatTheOneIsToTheOther) {
+    const KinFamily family{"Opa + Oma: Vater.m Onkel.m", "Vater + Mutter: Ich.m", "Onkel + Tante: Base.f",
+                           "Base + Mann: Nichte.f"};
+    ChartRequest request = requestFor(View::kinship, family["Onkel"]);
+    request.to = family["Ich"];
+    Picture picture = chartOf(family.graph(), request);
+    EXPECT_EQ(picture.focusIs, "uncle (father's brother)");
+    EXPECT_EQ(picture.otherIs, "nephew");
+    EXPECT_EQ(boxOf(picture, family.graph(), family["Ich"]).id,
+              picture.boxes[static_cast<std::size_t>(picture.other)].id);
+    request.language = Language::german;
+    EXPECT_EQ(chartOf(family.graph(), request).focusIs, "Onkel väterlicherseits");
+}
+
+// Brothers who married sisters: the children are cousins twice, by fathers and by mothers.
+TEST(KinshipChart, severalWaysRunSideBySideAndNoneOverItself) {
+    const KinFamily family{"Opa + Oma: Vater.m Onkel.m", "Opi + Omi: Mutter.f Tante.f",
+                           "Vater + Mutter: Ich.m", "Onkel + Tante: Base.f"};
+    ChartRequest request = requestFor(View::kinship, family["Ich"]);
+    request.to = family["Base"];
+    request.ways = WayChoice::blood;
+    const Picture picture = chartOf(family.graph(), request);
+    ASSERT_EQ(picture.ways.size(), 2U);
+    const auto meet = [](const auto& a, const auto& b) {
+        const bool isUpright = a.x1 == a.x2;
+        if (isUpright != (b.x1 == b.x2)) return false;
+        return isUpright ? a.x1 == b.x1 && std::min(a.y2, b.y2) > std::max(a.y1, b.y1)
+                         : a.y1 == b.y1 && std::min(a.x2, b.x2) > std::max(a.x1, b.x1);
+    };
+    for (std::size_t i = 0; i < picture.wayPieces.size(); ++i) {
+        for (std::size_t k = 0; k < i; ++k) EXPECT_FALSE(meet(picture.wayPieces[i], picture.wayPieces[k]));
+    }
+    // The stem to the child of both is on both ways, each beside the other.
+    std::vector<double> stems;
+    const Box& child = boxOf(picture, family.graph(), family["Ich"]);
+    for (const auto& piece : picture.wayPieces) {
+        if (piece.x1 == piece.x2 && piece.y1 < child.y && piece.y2 > child.y && piece.x1 > child.x &&
+            piece.x1 < child.x + 55) {
+            stems.push_back(piece.x1 - child.x - 27.5);
+        }
+    }
+    EXPECT_EQ(stems, (std::vector<double>{0, 2.5}));
+}
+
 TEST(KinshipChart, ofStrangersShowsTheTwoWithoutAWay) {
     const KinFamily family{"Adam + Eva", "Romeo + Julia"};
     ChartRequest request = requestFor(View::kinship, family["Adam"]);
@@ -346,6 +390,8 @@ TEST(KinshipChart, ofStrangersShowsTheTwoWithoutAWay) {
     const Drawn drawn(family, request);
     EXPECT_EQ(drawn.picture.boxes.size(), 2U);
     EXPECT_TRUE(drawn.picture.ways.empty());
+    EXPECT_EQ(drawn.picture.focusIs + drawn.picture.otherIs, "");
+    EXPECT_NE(drawn.picture.other, olvane::picture::kNone);
 }
 
 // --- Fans.

@@ -64,6 +64,11 @@ std::vector<Golden> goldens() {
         {"near", threeGenerations(), "Ich", viewOf(View::near)},
         {"fan", threeGenerations(), "Kind", half},
         {"kinship", threeGenerations(), "Base", viewOf(View::kinship), "Kind"},
+        {"kinship-two-ways",
+         {"Opa + Oma: A.m B.m", "Opi + Omi: C.f D.f", "A + C: a.m", "B + D: b.f"},
+         "a",
+         viewOf(View::kinship),
+         "b"},
         {"four-wives",
          {"Ein + A: a.m", "Ein + B: b.m", "Ein + C: c.m", "Ein + D: d.m"},
          "Ein",
@@ -104,6 +109,18 @@ std::string textOf(const Picture& picture, const KinFamily& family, const std::v
         text << "mark " << mark.number << ':';
         for (const Index box : mark.boxes) text << (box < 0 ? "" : " " + nameOfBox(box));
         text << '\n';
+    }
+    for (const auto& way : picture.ways) {
+        text << "way: " << way.words << ':';
+        for (const Index box : picture.boxesOf(way)) text << ' ' << nameOfBox(box);
+        text << '\n';
+        for (const auto& piece : picture.piecesOf(way)) {
+            text << "    " << piece.x1 << ' ' << piece.y1 << " - " << piece.x2 << ' ' << piece.y2 << '\n';
+        }
+    }
+    if (picture.other >= 0) {
+        text << nameOfBox(picture.focus) << " is the " << picture.focusIs << ", " << nameOfBox(picture.other)
+             << " the " << picture.otherIs << '\n';
     }
     return text.str();
 }

@@ -68,6 +68,10 @@ TEST_P(DrawingThemes, bordersAndLinesStandOffThePage) {
                                           theme().male.border, theme().female.border, theme().other.border}) {
         EXPECT_GE(contrast(colour, theme().page), kShape) << colour;
     }
+    for (const std::string_view colour : theme().ways) {
+        EXPECT_GE(contrast(colour, theme().page), kShape) << colour;
+    }
+    EXPECT_GE(contrast(theme().page, theme().focus), kText);  // of captions
 }
 
 TEST_P(DrawingThemes, menAndWomenDifferInGreyToo) {

@@ -157,6 +157,65 @@ TEST_F(Picture, markCountsWhatIsNotShown) {
     EXPECT_THAT(svg, HasSubstr("Not shown: 2 parents, 1 spouse, 3 children"));
 }
 
+// Two ways between the children: one over the father, one over both parents' line.
+class PictureOfKinship : public Picture {
+protected:
+    PictureOfKinship() {
+        picture::Picture& picture = content_.picture;
+        picture.focus = 3;
+        picture.other = 4;
+        picture.focusIs = "half sister";
+        picture.otherIs = "brother, the one and only of all of them";
+        picture.wayBoxes = {3, 0, 4, 0, 3, 2, 4};
+        picture.wayPieces = {{10, 20, 10, 60}, {10, 60, 40, 60}, {12, 22, 12, 62}};
+        picture.ways = {{0, 3, 1, 0, 2, picture::WayKind::blood, "by the father"},
+                        {4, 3, 0, 2, 1, picture::WayKind::marriage, "by <both>"}};
+    }
+};
+
+TEST_F(PictureOfKinship, hasALineOfItsOwnColourAndDashesForEachWayAndALegendOfThem) {
+    const std::string svg = draw();
+    // Boxes begin at (0, -110); two px for each point, behind a margin of 28.
+    EXPECT_THAT(svg, HasSubstr("<g><title>by the father</title><path fill=\"none\" stroke=\"#0060a8\" "
+                               "stroke-width=\"3.4\" stroke-linecap=\"square\" "
+                               "d=\"M48 288L48 368M48 368L108 368\"/>"));
+    EXPECT_THAT(svg, HasSubstr("<title>by &lt;both&gt;</title><path fill=\"none\" stroke=\"#b3470f\" "
+                               "stroke-width=\"3.4\" stroke-dasharray=\"9 4\""));
+    EXPECT_THAT(svg, HasSubstr(">by the father</text>"));
+    EXPECT_THAT(svg, HasSubstr(">by &lt;both&gt;</text>"));
+    EXPECT_EQ(countOf(svg, "stroke=\"#0060a8\""), 2u);  // in the picture and in its legend
+}
+
+TEST_F(PictureOfKinship, printsWaysApartByTheirDashes) {
+    options_.theme = &printTheme();
+    EXPECT_THAT(draw(), HasSubstr("stroke-dasharray=\"9 4\""));
+}
+
+TEST_F(PictureOfKinship, setsOffBothEndsAndTheCommonAncestor) {
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr("(focus of this picture). half sister"));
+    EXPECT_THAT(svg, HasSubstr(">half sister</text>"));
+    EXPECT_THAT(svg, HasSubstr("Nils Berg. brother, the one and only of all of them"));
+    EXPECT_THAT(svg, testing::ContainsRegex(">brother, [a-z ]+</text>"));
+    EXPECT_THAT(svg, HasSubstr(" of them</text>"));
+    EXPECT_EQ(countOf(svg, ". Common ancestor</title>"), 1u);
+    EXPECT_THAT(svg, HasSubstr("Karl Berg, * 1801, † ~1870. Common ancestor"));
+    EXPECT_EQ(countOf(svg, "stroke=\"" + std::string(lightTheme().focus) + "\" stroke-width=\"4\""), 2u);
+}
+
+// A caption would lie over a line that leaves the box downwards.
+TEST_F(PictureOfKinship, writesAboveABoxWithALineBelow) {
+    picture::Box& father = boxOf(0);
+    father.id = 5;
+    father.kind = picture::BoxKind::person;
+    labels_[5] = label("Ole", "Berg");
+    content_.picture.focus = 1;
+    const std::string svg = draw();
+    const std::size_t caption = svg.find(">half sister</text>");
+    const std::size_t y = svg.rfind(" y=\"", caption) + 4;
+    EXPECT_LT(std::stod(svg.substr(y)), 4);
+}
+
 TEST_F(Picture, sexShowsInTheSilhouetteToo) {
     const std::string svg = draw();
     EXPECT_EQ(countOf(svg, "href=\"#olvane-man\""), 1u);
