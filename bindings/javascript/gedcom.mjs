@@ -67,6 +67,41 @@ function factFrom([tag, value, date, place]) {
     return { tag, value, date: dateFrom(date), place };
 }
 
+function citationFrom([title, author, publication, page, text, quality]) {
+    return { title, author, publication, page, text, quality: quality < 0 ? null : quality };
+}
+
+function mediumFrom([title, file, format]) {
+    return { title, file, format };
+}
+
+// 0 stands for no details at all.
+function detailsFrom(row) {
+    const [type, cause, age, husbandAge, wifeAge, agency, address, notes, citations, media, links] =
+        row === 0 ? ["", "", "", "", "", "", "", [], [], [], []] : row;
+    return {
+        type,
+        cause,
+        age,
+        husbandAge,
+        wifeAge,
+        agency,
+        address,
+        notes,
+        citations: citations.map(citationFrom),
+        media: media.map(mediumFrom),
+        links,
+    };
+}
+
+function detailedFactFrom([tag, value, date, place, details]) {
+    return { tag, value, date: dateFrom(date), place, details: detailsFrom(details) };
+}
+
+function detailedNameFrom([text, type, nickname, details]) {
+    return { text, type, nickname, details: detailsFrom(details) };
+}
+
 function diagnosticFrom([line, severity, message, hint]) {
     return { line, severity, message, hint };
 }
@@ -102,6 +137,16 @@ export class GedcomFile {
 
     search(text, limit = Infinity) {
         return searchWith(this.#instance, text, limit, (pointer, most) => this.#answer("gedcom_search", pointer, most));
+    }
+
+    detailsOfPerson(id) {
+        const [details, facts, names] = this.#answer("gedcom_person_details", id);
+        return { ...detailsFrom(details), facts: facts.map(detailedFactFrom), names: names.map(detailedNameFrom) };
+    }
+
+    detailsOfFamily(id) {
+        const [details, facts] = this.#answer("gedcom_family_details", id);
+        return { ...detailsFrom(details), facts: facts.map(detailedFactFrom) };
     }
 
     layout(focus, options = undefined) {

@@ -313,6 +313,67 @@ export interface Fact {
     readonly place: string;
 }
 
+/** A source that something is known from. Texts that the file does not give are empty. */
+export interface Citation {
+    readonly title: string;
+    readonly author: string;
+    readonly publication: string;
+    /** Where in the source. */
+    readonly page: string;
+    /** What the source says. */
+    readonly text: string;
+    /** 0 unreliable to 3 primary evidence; null where the file does not say. */
+    readonly quality: number | null;
+}
+
+/** A picture, recording or document. */
+export interface MediaFile {
+    readonly title: string;
+    /** A path, a name in the archive or an address, as the file has it: nothing was opened. */
+    readonly file: string;
+    readonly format: string;
+}
+
+/** What a file knows beyond names and facts. Shared records are followed; texts that it does not give are empty. */
+export interface Details {
+    /** What sort of event, in the file's own words. */
+    readonly type: string;
+    readonly cause: string;
+    readonly age: string;
+    readonly husbandAge: string;
+    readonly wifeAge: string;
+    /** Who was responsible: a church, an office. */
+    readonly agency: string;
+    /** Its lines, joined by line ends. */
+    readonly address: string;
+    readonly notes: readonly string[];
+    readonly citations: readonly Citation[];
+    readonly media: readonly MediaFile[];
+    /** Addresses as written: check the scheme before one becomes a link. */
+    readonly links: readonly string[];
+}
+
+export interface DetailedFact extends Fact {
+    readonly details: Details;
+}
+
+export interface DetailedName {
+    readonly text: string;
+    /** "married", "aka" and so on, as the file has it; empty where not given. */
+    readonly type: string;
+    readonly nickname: string;
+    readonly details: Details;
+}
+
+export interface FamilyDetails extends Details {
+    readonly facts: readonly DetailedFact[];
+}
+
+export interface PersonDetails extends FamilyDetails {
+    /** All names in the order of the file. */
+    readonly names: readonly DetailedName[];
+}
+
 /** Persons and families count from 1 in the order of the file; 0 is nobody. */
 export interface Person {
     readonly id: number;
@@ -419,6 +480,9 @@ export class GedcomFile {
      * makes an index.
      */
     search(text: string, limit?: number): SearchHit[];
+    /** Notes, sources, media and links beside facts and names. Throws GedcomError for nobody. */
+    detailsOfPerson(id: number): PersonDetails;
+    detailsOfFamily(id: number): FamilyDetails;
     /** As Olvane.layout, with the file as the host. Asks for a million relatives at most, and else is tooLarge. */
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;

@@ -231,3 +231,70 @@ test("what finds no room in the module's memory is not taken for too large", asy
         assert.throws(() => file.layout(1), { name: "LayoutError", status: "outOfMemory" });
     }
 });
+
+const detailed = `0 HEAD
+1 GEDC
+2 VERS 5.5.1
+1 CHAR UTF-8
+0 @I1@ INDI
+1 NAME Anna /Berg/
+2 TYPE birth
+2 NICK Anni
+1 NAME Anna /Tal/
+2 TYPE married
+2 SOUR @S1@
+3 PAGE folio 3
+1 RESI
+2 DATE 1850
+2 ADDR 4 Main Street
+3 CONT Bern
+2 CAUS work
+2 AGE 20
+2 SOUR @S1@
+3 PAGE 12
+3 QUAY 2
+1 NOTE @N1@
+1 NOTE of her own
+1 OBJE
+2 FILE anna.jpg
+2 TITL Anna at home
+2 FORM jpeg
+1 WWW https://example.org/anna
+1 FAMS @F1@
+0 @F1@ FAM
+1 WIFE @I1@
+1 MARR Y
+2 WIFE
+3 AGE 22
+1 NOTE of the couple
+0 @S1@ SOUR
+1 TITL Parish book
+1 AUTH A priest
+0 @N1@ NOTE shared
+1 CONT by many
+0 TRLR
+`;
+
+test("details of a person and a family come with their facts and names", () => {
+    const file = olvane.readGedcom(bytesOf(detailed), "detailed.ged");
+    const anna = file.detailsOfPerson(1);
+    assert.deepEqual(anna.notes, ["shared\nby many", "of her own"]);
+    assert.deepEqual(anna.media, [{ title: "Anna at home", file: "anna.jpg", format: "jpeg" }]);
+    assert.deepEqual(anna.links, ["https://example.org/anna"]);
+    assert.deepEqual(
+        anna.names.map(({ text, type, nickname, details }) => [text, type, nickname, details.citations.map(({ page }) => page)]),
+        [
+            ["Anna Berg", "birth", "Anni", []],
+            ["Anna Tal", "married", "", ["folio 3"]],
+        ],
+    );
+    const { tag, date, details } = anna.facts[0];
+    assert.deepEqual([tag, date.year, details.address, details.cause, details.age], ["RESI", 1850, "4 Main Street\nBern", "work", "20"]);
+    assert.deepEqual(details.citations, [
+        { title: "Parish book", author: "A priest", publication: "", page: "12", text: "", quality: 2 },
+    ]);
+    const couple = file.detailsOfFamily(1);
+    assert.deepEqual([couple.notes, couple.facts[0].tag, couple.facts[0].details.wifeAge], [["of the couple"], "MARR", "22"]);
+    assert.throws(() => file.detailsOfPerson(2), GedcomError);
+    file.close();
+});

@@ -15,6 +15,7 @@
 #include <olvane/source/LimitedDataSource.h>
 
 #include "GedcomHost.h"
+#include "GedcomJson.h"
 #include "JsonText.h"
 #include "LayoutAnswer.h"
 #include "OpenFile.h"
@@ -27,19 +28,6 @@ namespace olvane::js {
 std::string lastText;
 
 namespace {
-
-void write(JsonText& json, const gedcom::GedcomDate& date) {
-    if (!date.isGiven()) return json.number(0);
-    json.begin();
-    json.string(date.written);
-    json.number(date.year);
-    json.number(date.month);
-    json.number(date.day);
-    json.number(static_cast<int>(date.mark));
-    json.number(date.lastYear);
-    json.string(gedcom::displayYear(date));
-    json.end();
-}
 
 template <class Ids>
 void writeIds(JsonText& json, const Ids& ids) {
@@ -81,8 +69,8 @@ void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonI
     json.string(data.firstName(id).surname);
     json.number(static_cast<int>(person.sex));
     json.number(person.dead ? 1 : 0);
-    write(json, person.birth);
-    write(json, person.death);
+    appendDate(json, person.birth);
+    appendDate(json, person.death);
     json.number(person.father);
     json.number(person.mother);
     writeIds(json, data.spouses(id));
@@ -104,7 +92,7 @@ void writeFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyI
     json.end();
     json.number(family.married ? 1 : 0);
     json.number(family.divorced ? 1 : 0);
-    write(json, family.marriage);
+    appendDate(json, family.marriage);
     json.end();
 }
 
@@ -149,24 +137,12 @@ std::string factsText(std::span<const gedcom::Fact> facts) {
         json.begin();
         json.string(fact.tag);
         json.string(fact.value);
-        write(json, fact.date);
+        appendDate(json, fact.date);
         json.string(fact.place);
         json.end();
     }
     json.end();
     return std::move(json).take();
-}
-
-// The text that make gives, or null with the reason in its place.
-template <class Make>
-const char* toldOrRefused(const Make& make) {
-    try {
-        lastText = make();
-        return lastText.c_str();
-    } catch (const std::exception& error) {
-        lastText = error.what();
-        return nullptr;
-    }
 }
 
 }  // namespace
@@ -180,7 +156,7 @@ OLVANE_EXPORT("gedcom_open")
 OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, const char* encoding) {
     try {
         gedcom::ReadOptions options;
-        options.facts = true;
+        options.details = true;
         options.encoding = encoding;
         return std::make_unique<OpenFile>(gedcom::readGedcomBytes(std::string(bytes, length), name, options))
             .release();
@@ -192,20 +168,20 @@ OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, co
 
 // Texts live until the next call that gives one; null where there is none, and last_text says why.
 OLVANE_EXPORT("gedcom_table") const char* gedcomTable(const OpenFile* file) {
-    return js::toldOrRefused([&] { return js::tableOf(file->data); });
+    return js::textOrRefusal([&] { return js::tableOf(file->data); });
 }
 
 OLVANE_EXPORT("gedcom_person_facts") const char* gedcomPersonFacts(const OpenFile* file, std::uint32_t id) {
-    return js::toldOrRefused([&] { return js::factsText(file->data.factsOfPerson(id)); });
+    return js::textOrRefusal([&] { return js::factsText(file->data.factsOfPerson(id)); });
 }
 
 OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFile* file, std::uint32_t id) {
-    return js::toldOrRefused([&] { return js::factsText(file->data.factsOfFamily(id)); });
+    return js::textOrRefusal([&] { return js::factsText(file->data.factsOfFamily(id)); });
 }
 
 // The first search makes the index.
 OLVANE_EXPORT("gedcom_search") const char* gedcomSearch(OpenFile* file, const char* text, std::size_t limit) {
-    return js::toldOrRefused([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
+    return js::textOrRefusal([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
 }
 
 OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {
