@@ -339,6 +339,7 @@ private:
             ->add_option("--title", pageOptions_.title,
                          "Title of the page; the name of --focus when not given, or that of the file")
             ->type_name("TEXT");
+        addPageContents();
         addHideLiving(*page_, pageOptions_.hiding, "; nor any free text about others that may name them");
         needsFile(focus);
         needsFile(page_->get_option("--encoding"));
@@ -346,6 +347,26 @@ private:
         needsFile(page_->get_option("--map"));
         needsFile(page_->get_option("--title"));
         for (const std::string& name : pageViewOptionNames()) needsFile(page_->get_option(name));
+    }
+
+    void addPageContents() {
+        CLI::Option* notes = page_->add_flag_callback(
+            "--no-notes", [this] { pageOptions_.notes = false; }, "Leave notes and sources out");
+        CLI::Option* media = page_->add_flag_callback(
+            "--no-media", [this] { pageOptions_.media = false; },
+            "Leave out which pictures and documents the file links to");
+        CLI::Option* photos =
+            page_
+                ->add_option(
+                    "--photos", pageOptions_.photoSize,
+                    "Put photographs into the page, scaled down to so many pixels on the longer side: those "
+                    "in the .gdz archive, or in the folder of the file and below it")
+                ->check(CLI::Range(16, 4096))
+                ->type_name("SIZE")
+                ->excludes(media);
+        needsFile(notes);
+        needsFile(media);
+        needsFile(photos);
     }
 
     // Without a family these would change nothing.

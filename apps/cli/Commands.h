@@ -90,6 +90,9 @@ struct PageOptions {
     std::string address;    // the same, as pageAddressOf has it
     bool map = false;       // everybody as a map, laid out here
     HidingOptions hiding;
+    bool notes = true;  // and sources
+    bool media = true;
+    int photoSize = 0;  // pixels of the longer side of photographs in the page; 0 for none
 };
 
 int runPeople(const PeopleOptions& options);

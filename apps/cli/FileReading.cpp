@@ -50,10 +50,8 @@ gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions
     return gedcom::readGedcomBytes(readInputBytes(path), inputName(path), options);
 }
 
-gedcom::GedcomData read(const InputOptions& input, bool facts = false) {
-    gedcom::ReadOptions options;
+gedcom::GedcomData read(const InputOptions& input, gedcom::ReadOptions options = {}) {
     options.diagnosticsPerKind = kCounted;
-    options.facts = facts;
     options.encoding = input.encoding;
     try {
         return readSource(input.file, options);
@@ -71,7 +69,17 @@ gedcom::GedcomData readFile(const InputOptions& input) {
 }
 
 gedcom::GedcomData readFileWithFacts(const InputOptions& input) {
-    gedcom::GedcomData data = read(input, true);
+    gedcom::ReadOptions options;
+    options.facts = true;
+    gedcom::GedcomData data = read(input, options);
+    report(data);
+    return data;
+}
+
+gedcom::GedcomData readFileWithDetails(const InputOptions& input) {
+    gedcom::ReadOptions options;
+    options.details = true;
+    gedcom::GedcomData data = read(input, options);
     report(data);
     return data;
 }

@@ -23,6 +23,9 @@ gedcom::GedcomData readFile(const InputOptions& input);
 // As readFile, and keeps the facts of persons and couples.
 gedcom::GedcomData readFileWithFacts(const InputOptions& input);
 
+// As readFileWithFacts, and keeps notes, sources, media and the other details too.
+gedcom::GedcomData readFileWithDetails(const InputOptions& input);
+
 // As readFile, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
 gedcom::GedcomData readFileQuietly(const InputOptions& input);
 

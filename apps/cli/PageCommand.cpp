@@ -7,6 +7,9 @@
 #include <cli/Commands.h>
 
 #include <cstddef>
+#include <string>
+#include <utility>
+#include <vector>
 
 #include <olvane/charts/MapIndex.h>
 #include <olvane/gedcom/GedcomReader.h>
@@ -16,6 +19,8 @@
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
+#include <cli/MediaFiles.h>
+#include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PageFamily.h>
 #include <cli/PageTemplate.h>
@@ -29,6 +34,9 @@ namespace {
 constexpr std::size_t kMostBytes = std::size_t{64} << 20;
 // People do not open a page with more than this in it; a program reads the file itself.
 constexpr std::size_t kMostPersons = 200000;
+// Larger pages are slow to send and to open, so whoever writes one should know.
+constexpr std::size_t kLargePage = std::size_t{20} << 20;
+constexpr std::size_t kNamedFiles = 5;
 
 // A map is opened with as many, whose records a page need not hold.
 constexpr std::size_t kMostPersonsOfMap = 2000000;
@@ -88,14 +96,42 @@ std::string focusOf(gedcom::PersonId focus) {
     return focus == 0 ? "" : std::to_string(focus);
 }
 
+void reportPhotos(const PageOptions& options, const PagePhotos& photos) {
+    const std::size_t count = photos.missing.size();
+    if (count == 0) return;
+    std::string text = options.input.file + ": " + std::to_string(photos.photos.size()) +
+                       " photographs are in the page; " + std::to_string(count) +
+                       " media files are not, since they are not beside the file, or are no photographs: ";
+    for (std::size_t i = 0; i < count && i < kNamedFiles; ++i) {
+        text += (i == 0 ? "" : ", ") + photos.missing[i];
+    }
+    printMessage(count > kNamedFiles ? text + " and others" : text);
+}
+
+// Of the text that the page gets, so that no photograph of anybody else is in it.
+std::vector<PagePhoto> photosOf(const std::string& text, const gedcom::GedcomData& whole,
+                                const std::vector<bool>& hidden, const PageOptions& options) {
+    if (options.photoSize == 0) return {};
+    gedcom::ReadOptions reading;
+    reading.details = true;
+    const gedcom::GedcomData written = gedcom::readGedcomBytes(text, options.input.file, reading);
+    PagePhotos photos =
+        photosOfPage(written, whole, hidden, MediaFiles(options.input.file), options.photoSize);
+    reportPhotos(options, photos);
+    return std::move(photos.photos);
+}
+
 PageFamily familyOf(const PageOptions& options) {
-    const gedcom::GedcomData data = readFileWithFacts(options.input);
+    const gedcom::GedcomData data = readFileWithDetails(options.input);
     gedcom::WriteOptions hiding;
     hiding.hidden = hiddenPersons(data, options.hiding);
+    hiding.notes = hiding.sources = options.notes;
+    hiding.media = options.media;
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
     PageFamily family;
     family.gedcom = gedcom::writeGedcom(data, hiding);
     if (!options.map) refuseTooLarge(data, family.gedcom.size());
+    family.photos = photosOf(family.gedcom, data, hiding.hidden, options);
     family.name = fileNameOf(options);
     family.title = options.title.empty() ? titleOf(data, focus, family, hiding.hidden) : options.title;
     family.focus = focusOf(focus);
@@ -126,7 +162,10 @@ int runPage(const PageOptions& options) {
     if (options.input.file.empty()) {
         writeOutput(options.output, pageTemplate(), rules);
     } else {
-        writeOutput(options.output, pageWith(pageTemplate(), familyOf(options)), rules);
+        const std::string page = pageWith(pageTemplate(), familyOf(options));
+        if (page.size() > kLargePage)
+            printMessage(options.output + ": the page has " + std::to_string(page.size() >> 20) + " MiB");
+        writeOutput(options.output, page, rules);
     }
     return 0;
 }

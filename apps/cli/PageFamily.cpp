@@ -70,6 +70,13 @@ nlohmann::ordered_json remarksOf(const PageFamily& family) {
     return remarks;
 }
 
+// By the name that the text has for the file.
+nlohmann::ordered_json photosOf(const PageFamily& family) {
+    nlohmann::ordered_json photos = nlohmann::ordered_json::object();
+    for (const PagePhoto& photo : family.photos) photos[photo.file] = base64(photo.jpeg);
+    return photos;
+}
+
 // Nothing in it can end the element.
 std::string familyBlock(const PageFamily& family) {
     const nlohmann::ordered_json json = {
@@ -79,6 +86,7 @@ std::string familyBlock(const PageFamily& family) {
         {"address", family.address},
         {"livingHidden", family.livingHidden},
         {"remarks", remarksOf(family)},
+        {"photos", photosOf(family)},
         {"gzip", family.gedcom.empty() ? "" : base64(gzipped(family.gedcom, Z_BEST_COMPRESSION))},
     };
     const std::string text = json.dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);

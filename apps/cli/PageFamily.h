@@ -9,6 +9,8 @@
 
 #include <olvane/gedcom/GedcomDiagnostic.h>
 
+#include <cli/PagePhotos.h>
+
 namespace olvane::cli {
 
 // What a page carries of a family, and how it opens.
@@ -22,6 +24,7 @@ struct PageFamily {
     bool livingHidden = false;
     // On the file that the text was made of, with its line numbers.
     std::vector<gedcom::Diagnostic> remarks;
+    std::vector<PagePhoto> photos;
 };
 
 // The page with the family in it.

@@ -1,49 +1,25 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Opens the rendering libraries while the command runs. Linked the usual way they would be opened at every
-// start, and a listing of persons would wait for them.
+// The rendering libraries, by name and version of their interfaces.
 
 #include <cli/RenderLibraries.h>
 
-#include <string>
-
-#include <dlfcn.h>
-
-#include <cli/UsageError.h>
+#include <cli/SharedLibrary.h>
 
 namespace olvane::cli {
 
 namespace {
 
-// Never closed: glib does not support that.
-class Library {
-public:
-    explicit Library(const char* name) : name_(name), handle_(::dlopen(name, RTLD_NOW | RTLD_LOCAL)) {
-        if (handle_ == nullptr) refuse("is not installed");
-    }
-
-    template <class Function>
-    void load(Function& function, const char* symbol) const {
-        function = reinterpret_cast<Function>(::dlsym(handle_, symbol));
-        if (function == nullptr) refuse(std::string("is too old, it has no ") + symbol);
-    }
-
-private:
-    [[noreturn]] void refuse(const std::string& reason) const {
-        throw UsageError("PNG and PDF need librsvg 2.48 and cairo, but " + name_ + " " + reason +
-                         "; an .svg can be written without them");
-    }
-
-    std::string name_;
-    void* handle_;
-};
+SharedLibrary opened(const char* name) {
+    return {name, "PNG and PDF need librsvg 2.48 and cairo", "an .svg can be written without them"};
+}
 
 RenderLibraries openLibraries() {
-    const Library rsvg("librsvg-2.so.2");
-    const Library cairo("libcairo.so.2");
-    const Library gobject("libgobject-2.0.so.0");
-    const Library glib("libglib-2.0.so.0");
+    const SharedLibrary rsvg = opened("librsvg-2.so.2");
+    const SharedLibrary cairo = opened("libcairo.so.2");
+    const SharedLibrary gobject = opened("libgobject-2.0.so.0");
+    const SharedLibrary glib = opened("libglib-2.0.so.0");
     RenderLibraries all;
 #define OLVANE_LOAD(library, symbol) (library).load(all.symbol, #symbol)
     OLVANE_LOAD(rsvg, rsvg_handle_new_from_data);

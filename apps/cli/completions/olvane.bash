@@ -53,7 +53,7 @@ _olvane() {
         check) COMPREPLY=($(compgen -W "--help --encoding --focus --all --format $view $family" -- "$cur")) ;;
         kin) COMPREPLY=($(compgen -W "--help --encoding --format --ways --language" -- "$cur")) ;;
         judge) COMPREPLY=($(compgen -W "--help --encoding --family --format" -- "$cur")) ;;
-        page) COMPREPLY=($(compgen -W "--help --encoding --focus --map --output --title --view --generations --up --down --direction --to $living $family" -- "$cur")) ;;
+        page) COMPREPLY=($(compgen -W "--help --no-notes --no-media --photos --encoding --focus --map --output --title --view --generations --up --down --direction --to $living $family" -- "$cur")) ;;
     esac
 }
 

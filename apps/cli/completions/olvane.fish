@@ -62,3 +62,6 @@ complete -c olvane -n '__fish_seen_subcommand_from people check judge' -l format
 complete -c olvane -n '__fish_seen_subcommand_from page' -l map -d 'Open with everybody as one map'
 complete -c olvane -n '__fish_seen_subcommand_from page' -l view -x -a 'family pedigree' -d 'Which relatives'
 complete -c olvane -n '__fish_seen_subcommand_from check' -l all -d 'Look at every layout'
+complete -c olvane -n '__fish_seen_subcommand_from page' -l no-notes -d 'Leave notes and sources out'
+complete -c olvane -n '__fish_seen_subcommand_from page' -l no-media -d 'Leave links to media out'
+complete -c olvane -n '__fish_seen_subcommand_from page' -l photos -x -d 'Put photographs in, of so many pixels'
