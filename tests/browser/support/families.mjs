@@ -138,3 +138,32 @@ export function hugeHousehold() {
     }
     return [...lines, "0 @LONE@ INDI", "1 NAME Lone /Stranger/", "0 TRLR"].join("\n");
 }
+
+/** Lines of notes, sources, media and the like in the file of detailedFamily(), each with a word of its own. */
+export const kDetailWords = [
+    "Rosenholz", "Zweitnotiz", "Gemeinschaftsnotiz", "Weiterzeile", "Kirchenbuch", "Pfarrer", "Druckerei", "Blatt 17",
+    "Wortlaut", "Fieber", "63y", "Standesamt", "Lindenallee", "Hinterhof", "Ehenamen", "Spitzname", "Taufzeuge", "29y",
+    "Hochzeitsnotiz", "Portraitbild", "https://example.org/berta",
+];
+
+/** A couple of whom the file knows more than dates and places, and their son. */
+export function detailedFamily() {
+    return gedcom(
+        "0 @I1@ INDI", "1 NAME Berta /Rose/", "2 NICK Spitzname", "2 SOUR @S1@", "3 PAGE Blatt 17", "3 QUAY 3", "3 DATA", "4 TEXT Wortlaut der Quelle",
+        "1 NAME Berta /Ehenamen/", "2 TYPE married", "1 SEX F",
+        "1 DEAT", "2 DATE 3 MAR 1901", "2 PLAC Bern", "2 CAUS Fieber", "2 AGE 63y", "2 AGNC Standesamt Bern",
+        "1 RESI", "2 DATE 1870", "2 ADDR Lindenallee 4", "3 CONT Hinterhof",
+        "1 BIRT", "2 DATE 1 FEB 1838", "1 OCCU Weberin",
+        "1 EVEN", "2 TYPE Taufzeuge", "2 DATE 1860",
+        "1 NOTE Rosenholz stand im Zimmer", "1 NOTE Zweitnotiz javascript:alert(1) <b>fett</b>", "1 NOTE @N1@",
+        "1 WWW https://example.org/berta", "1 WWW javascript:window.wasRun=1",
+        "1 OBJE", "2 FILE portrait.jpg", "2 TITL Portraitbild", "2 FORM jpeg",
+        "1 OBJE @M1@", "1 FAMS @F1@",
+        "0 @I2@ INDI", "1 NAME Anton /Rose/", "1 SEX M", "1 BIRT", "2 DATE 1830", "1 DEAT Y", "1 FAMS @F1@",
+        "0 @I3@ INDI", "1 NAME Carl /Rose/", "1 SEX M", "1 BIRT", "2 DATE 1865", "1 DEAT", "2 DATE 1930", "1 FAMC @F1@",
+        "0 @F1@ FAM", "1 HUSB @I2@", "1 WIFE @I1@", "1 CHIL @I3@", "1 MARR", "2 DATE 1864", "2 WIFE", "3 AGE 29y", "1 NOTE Hochzeitsnotiz",
+        "0 @S1@ SOUR", "1 TITL Kirchenbuch von Bern", "1 AUTH Pfarrer Muster", "1 PUBL Druckerei Muster",
+        "0 @N1@ NOTE Gemeinschaftsnotiz", "1 CONT Weiterzeile",
+        "0 @M1@ OBJE", "1 FILE ../outside.jpg", "2 FORM jpeg", "2 TITL Von anderswo",
+    );
+}

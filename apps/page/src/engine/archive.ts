@@ -28,23 +28,49 @@ export function isArchive(bytes: Uint8Array): boolean {
     return bytes[0] === 0x50 && bytes[1] === 0x4b && (bytes[2] === 3 || bytes[2] === 5);
 }
 
-// The GEDCOM file of a GEDZIP archive: gedcom.ged, or else the only file that ends in .ged. At most so many bytes
-// come out of it.
-export async function gedcomInArchive(
-    archive: Uint8Array<ArrayBuffer>,
-    most: number,
-): Promise<Uint8Array<ArrayBuffer>> {
-    const entries = entriesOf(archive);
-    const chosen =
-        entries.find((entry) => /(^|\/)gedcom\.ged$/i.test(entry.name)) ??
-        entries.find((entry) => /\.ged$/i.test(entry.name));
-    if (!chosen) throw new ArchiveError("no .ged");
-    try {
-        return await contentOf(archive, chosen, most);
-    } catch (error) {
-        if (error instanceof TooLargeError) throw error;
-        throw new ArchiveError("damaged", { cause: error });
+/** A GEDZIP archive: a GEDCOM file with the media that it links to. */
+export class Archive {
+    private readonly entries: ReadonlyMap<string, Entry>;
+
+    /** Throws ArchiveError for bytes that are none. */
+    constructor(private readonly bytes: Uint8Array<ArrayBuffer>) {
+        this.entries = new Map(entriesOf(bytes).map((entry) => [entry.name, entry]));
     }
+
+    /** The GEDCOM file: gedcom.ged, or else the first that ends in .ged. At most so many bytes come out of it. */
+    async gedcom(most: number): Promise<Uint8Array<ArrayBuffer>> {
+        const names = [...this.entries.keys()];
+        const name =
+            names.find((one) => /(^|\/)gedcom\.ged$/i.test(one)) ?? names.find((one) => /\.ged$/i.test(one));
+        if (name === undefined) throw new ArchiveError("no .ged");
+        return this.bytesOf(name, most);
+    }
+
+    has(name: string): boolean {
+        return this.entries.has(name);
+    }
+
+    /** Throws TooLargeError for more bytes than that, ArchiveError for a damaged member. */
+    async bytesOf(name: string, most: number): Promise<Uint8Array<ArrayBuffer>> {
+        try {
+            return await contentOf(this.bytes, this.entries.get(name)!, most);
+        } catch (error) {
+            if (error instanceof TooLargeError) throw error;
+            throw new ArchiveError("damaged", { cause: error });
+        }
+    }
+}
+
+/** The member that the FILE of a medium stands for; null for what lies outside the archive. */
+export function memberName(file: string): string | null {
+    let name = file;
+    try {
+        name = decodeURIComponent(file);
+    } catch {
+        // A path with a percent sign of its own.
+    }
+    const isOutside = /[\\:\0]/.test(name) || name.split("/").some((step) => ["", ".", ".."].includes(step));
+    return isOutside ? null : name;
 }
 
 interface Entry {
@@ -92,6 +118,7 @@ async function contentOf(
     const start =
         entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
     const packed = archive.slice(start, start + entry.packedSize);
+    if (packed.length > most) throw new TooLargeError();
     if (entry.method === 0) return packed;
     if (entry.method !== 8) throw new ArchiveError("packed in a way that is not known");
     return inflate(packed, "deflate-raw", most);

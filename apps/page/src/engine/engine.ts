@@ -5,6 +5,7 @@
 
 import { type Diagnostic, loadOlvane, type Olvane } from "olvane";
 import { bytesOfBase64, gunzip } from "./archive";
+import { Photographs } from "./photographs";
 
 // What olvane page puts in.
 export interface EmbeddedFamily {
@@ -18,6 +19,7 @@ export interface EmbeddedFamily {
     /** On the file that the family was read from; the text in the page is another. Null where nobody stored. */
     readonly remarks: readonly Diagnostic[] | null;
     readonly bytes: Uint8Array;
+    readonly photographs: Photographs;
 }
 
 export async function startEngine(): Promise<Olvane> {
@@ -29,7 +31,7 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
     const text = document.getElementById("olvane-family")?.textContent;
     if (!text) return null;
     const stored = JSON.parse(text) as Partial<
-        Record<"name" | "title" | "focus" | "address" | "livingHidden" | "remarks" | "gzip", unknown>
+        Record<"name" | "title" | "focus" | "address" | "livingHidden" | "remarks" | "gzip" | "photos", unknown>
     >;
     return {
         name: String(stored.name ?? "family.ged"),
@@ -38,6 +40,7 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
         address: String(stored.address ?? ""),
         livingHidden: stored.livingHidden === true,
         remarks: Array.isArray(stored.remarks) ? (stored.remarks as Diagnostic[]) : null,
+        photographs: Photographs.embedded((stored.photos ?? {}) as Record<string, unknown>),
         bytes: await gunzip(bytesOfBase64(String(stored.gzip ?? ""))),
     };
 }

@@ -114,6 +114,25 @@ export interface UiMessages {
         readonly unknownPartner: string;
     };
     readonly pedigrees: { readonly adopted: string; readonly foster: string; readonly sealing: string };
+    /** Of what the file knows beyond dates and places. */
+    readonly details: {
+        readonly name: string;
+        readonly nickname: string;
+        /** By the type that GEDCOM has for a name, in small letters. */
+        readonly nameTypes: Readonly<Record<string, string>>;
+        readonly notes: string;
+        readonly cause: string;
+        readonly age: string;
+        readonly husbandAge: string;
+        readonly wifeAge: string;
+        readonly agency: string;
+        readonly sources: (n: number) => string;
+        readonly untitled: string;
+        /** How sure a source is, from 0 to 3. */
+        readonly qualities: readonly string[];
+        readonly readOn: string;
+        readonly enlarge: (title: string) => string;
+    };
     readonly diagnostics: {
         readonly show: string;
         readonly title: string;

@@ -97,12 +97,12 @@ export class App implements ChromeActions {
     }
 
     // isSame: the file that is shown already, read in another way.
-    private show({ file, name, title }: OpenedFile, embedded: EmbeddedFamily | null, isSame = false): void {
+    private show({ file, name, title, photographs }: OpenedFile, embedded: EmbeddedFamily | null, isSame = false): void {
         const start = performance.now();
         // Of an empty page only a link as it was followed is meant for the first file; what we wrote named
         // persons of another.
         const isLinked = isSame || embedded !== null || (this.tree.family === null && history.state === null);
-        const family = new OpenFamily(file, title, embedded?.livingHidden ?? false);
+        const family = new OpenFamily(file, title, embedded?.livingHidden ?? false, photographs);
         this.fileName = name;
         this.remarks = embedded?.remarks ?? file.diagnostics;
         this.tree.setFamily(family);

@@ -4,8 +4,9 @@
 // How a family file becomes an open family, and what is said of one that does not.
 
 import type { GedcomFile, Olvane } from "olvane";
-import { ArchiveError, gedcomInArchive, isArchive, TooLargeError } from "../engine/archive";
+import { Archive, ArchiveError, isArchive, TooLargeError } from "../engine/archive";
 import type { EmbeddedFamily } from "../engine/engine";
+import { Photographs } from "../engine/photographs";
 import type { UiMessages } from "../messages/ui";
 
 const kMostBytes = 128 * 2 ** 20; // of a file
@@ -15,15 +16,16 @@ export interface OpenedFile {
     readonly file: GedcomFile;
     readonly name: string;
     readonly title: string;
+    readonly photographs: Photographs;
 }
 
 export class FileOpening {
     constructor(private readonly engine: Olvane) {}
 
-    private last: { readonly bytes: Uint8Array; readonly name: string } | null = null;
+    private last: { readonly bytes: Uint8Array; readonly name: string; readonly photographs: Photographs } | null = null;
 
-    openEmbedded({ bytes, name, title }: EmbeddedFamily): OpenedFile {
-        return this.read(bytes, name, title);
+    openEmbedded({ bytes, name, title, photographs }: EmbeddedFamily): OpenedFile {
+        return this.read(bytes, name, title, photographs);
     }
 
     /** Whether the file that is shown can be read in another encoding: what the page itself holds is UTF-8. */
@@ -33,17 +35,19 @@ export class FileOpening {
 
     /** The file that was opened last, in another encoding; empty for the one that the file names. */
     readAgain(encoding: string): OpenedFile {
-        const { bytes, name } = this.last!;
-        return this.read(bytes, name, "", encoding);
+        const { bytes, name, photographs } = this.last!;
+        return this.read(bytes, name, "", photographs, encoding);
     }
 
     // Throws as complaint() knows.
     async openFile(file: File): Promise<OpenedFile> {
         if (file.size > kMostBytes) throw new TooLargeError();
         const bytes = new Uint8Array(await file.arrayBuffer());
-        const gedcom = isArchive(bytes) ? await gedcomInArchive(bytes, kMostBytes) : bytes;
-        const opened = this.read(gedcom, file.name, "");
-        this.last = { bytes: gedcom, name: file.name };
+        const archive = isArchive(bytes) ? new Archive(bytes) : null;
+        const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
+        const photographs = archive ? Photographs.inArchive(archive) : Photographs.none;
+        const opened = this.read(gedcom, file.name, "", photographs);
+        this.last = { bytes: gedcom, name: file.name, photographs };
         return opened;
     }
 
@@ -58,13 +62,13 @@ export class FileOpening {
         return [errors.notGedcom(file), [ui.diagnostics.remark(detail), errors.hint]];
     }
 
-    private read(bytes: Uint8Array, name: string, title: string, encoding = ""): OpenedFile {
+    private read(bytes: Uint8Array, name: string, title: string, photographs: Photographs, encoding = ""): OpenedFile {
         const file = this.engine.readGedcom(bytes, name, { encoding });
         if (file.persons.length === 0) {
             file.close();
             throw new NoPersonsError();
         }
-        return { file, name, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
+        return { file, name, photographs, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
     }
 }
 

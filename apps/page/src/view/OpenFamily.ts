@@ -5,6 +5,7 @@
 
 import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
 import { allKinships, type Kinship } from "../kinship";
+import { Photographs } from "../engine/photographs";
 import { Picture } from "./Picture";
 import { optionsOf, type ViewState } from "./ViewState";
 
@@ -18,6 +19,7 @@ export class OpenFamily {
         readonly file: GedcomFile,
         readonly title: string,
         readonly livingHidden: boolean,
+        readonly photographs: Photographs = Photographs.none,
     ) {
         this.persons = file.persons;
         this.families = file.families;
@@ -62,6 +64,7 @@ export class OpenFamily {
     }
 
     close(): void {
+        this.photographs.close();
         this.file.close();
     }
 

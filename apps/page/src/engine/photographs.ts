@@ -1,0 +1,65 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The photographs that came with a family: inside the page, or in the archive that was dropped. What a file links to
+// elsewhere is never fetched.
+
+import { type Archive, memberName } from "./archive";
+
+const kMostBytes = 32 * 2 ** 20; // of one photograph, unpacked
+
+export class Photographs {
+    static readonly none = new Photographs(() => null);
+    private readonly found = new Map<string, Promise<string | null> | string | null>();
+    private readonly made: string[] = [];
+
+    private constructor(private readonly find: (file: string) => Promise<Uint8Array<ArrayBuffer> | null> | string | null) {}
+
+    /** JPEG in base 64, by the name that the family's text has for the file. */
+    static embedded(photos: Readonly<Record<string, unknown>>): Photographs {
+        return new Photographs((file) =>
+            Object.hasOwn(photos, file) ? `data:image/jpeg;base64,${String(photos[file])}` : null,
+        );
+    }
+
+    static inArchive(archive: Archive): Photographs {
+        return new Photographs((file) => {
+            const name = memberName(file);
+            return name === null || !archive.has(name) ? null : archive.bytesOf(name, kMostBytes).catch(() => null);
+        });
+    }
+
+    /** The address of a photograph, null where there is none, or a promise of either while it is unpacked. */
+    urlOf(file: string): Promise<string | null> | string | null {
+        const known = this.found.get(file);
+        if (known !== undefined) return known;
+        const answer = this.find(file);
+        const url = answer instanceof Promise ? answer.then((bytes) => this.keep(file, bytes)) : answer;
+        this.found.set(file, url);
+        return url;
+    }
+
+    close(): void {
+        for (const url of this.made) URL.revokeObjectURL(url);
+        this.made.length = 0;
+        this.found.clear();
+    }
+
+    private keep(file: string, bytes: Uint8Array<ArrayBuffer> | null): string | null {
+        const type = bytes && typeOf(bytes);
+        const url = type ? URL.createObjectURL(new Blob([bytes], { type })) : null;
+        if (url) this.made.push(url);
+        this.found.set(file, url);
+        return url;
+    }
+}
+
+// By the first bytes: a drawing with scripts in it, or anything else, is no photograph.
+function typeOf(bytes: Uint8Array): string | null {
+    const begins = (at: number, ...values: number[]) => values.every((value, i) => bytes[at + i] === value);
+    if (begins(0, 0xff, 0xd8, 0xff)) return "image/jpeg";
+    if (begins(0, 0x89, 0x50, 0x4e, 0x47)) return "image/png";
+    if (begins(0, 0x47, 0x49, 0x46, 0x38)) return "image/gif";
+    if (begins(0, 0x52, 0x49, 0x46, 0x46) && begins(8, 0x57, 0x45, 0x42, 0x50)) return "image/webp";
+    return null;
+}
