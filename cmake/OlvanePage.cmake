@@ -12,6 +12,11 @@ find_program(OLVANE_NPM npm)
 if(OLVANE_BUILD_PAGE STREQUAL "OFF")
   return()
 endif()
+# Where no network may be asked, the modules that npm would install lie in a folder, and the bundler is the system's.
+set(OLVANE_PAGE_MODULES "" CACHE PATH "Folder of the page's modules, in place of what npm installs")
+if(OLVANE_PAGE_MODULES)
+  set(OLVANE_NPM "${OLVANE_PAGE_MODULES}")
+endif()
 if(NOT OLVANE_EMCMAKE OR NOT OLVANE_NODE OR NOT OLVANE_NPM)
   if(OLVANE_BUILD_PAGE STREQUAL "ON")
     message(FATAL_ERROR "OLVANE_BUILD_PAGE needs emscripten, nodejs and npm; install them or switch the option off")
@@ -26,8 +31,9 @@ set(inner_targets olvane_wasm)
 if(OLVANE_DEV)
   list(APPEND inner_targets layout-case)
 endif()
-# Debian's Emscripten finds its own parser by NODE_PATH.
-set(for_emscripten ${CMAKE_COMMAND} -E env NODE_PATH=/usr/share/nodejs)
+# Debian's Emscripten finds its own parser by NODE_PATH. Flags of the environment are meant for this machine's compilers.
+set(for_emscripten ${CMAKE_COMMAND} -E env --unset=CFLAGS --unset=CXXFLAGS --unset=CPPFLAGS --unset=LDFLAGS
+    NODE_PATH=/usr/share/nodejs)
 ExternalProject_Add(olvane_wasm_module
   SOURCE_DIR ${PROJECT_SOURCE_DIR}
   BINARY_DIR ${CMAKE_BINARY_DIR}/wasm
@@ -50,6 +56,7 @@ file(GLOB_RECURSE page_sources CONFIGURE_DEPENDS
 list(FILTER page_sources EXCLUDE REGEX "/node_modules/")
 add_custom_command(OUTPUT ${OLVANE_PAGE_TEMPLATE} ${OLVANE_TREE_ELEMENT}
   COMMAND ${CMAKE_COMMAND} -E env OLVANE_JAVASCRIPT=${PROJECT_SOURCE_DIR}/bindings/javascript
+          OLVANE_PAGE_MODULES=${OLVANE_PAGE_MODULES}
           ${PROJECT_SOURCE_DIR}/apps/page/build-page ${CMAKE_BINARY_DIR}/apps/page/work ${OLVANE_WASM}
           ${OLVANE_PAGE_TEMPLATE} ${OLVANE_TREE_ELEMENT}
   DEPENDS olvane_wasm_module ${OLVANE_WASM} ${PROJECT_SOURCE_DIR}/apps/page/build-page ${page_sources}

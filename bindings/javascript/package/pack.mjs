@@ -9,6 +9,7 @@
 // the WebAssembly beside them or inside them; DIR/olvane-tree is the viewer element. esbuild must be found from DIR
 // or from where this is run.
 
+import { execFileSync } from "node:child_process";
 import { copyFile, mkdir, readFile, writeFile } from "node:fs/promises";
 import { createRequire } from "node:module";
 import { join } from "node:path";
@@ -54,42 +55,17 @@ async function writePackage(folder, content) {
     await copyFile(here("../../../LICENSE"), join(folder, "LICENSE"));
 }
 
-// The licences of what is inside, in the form of the Software Package Data Exchange.
-async function writeContents(folder, name, inside) {
-    const describe = (id, { name, version, license }) => ({
-        SPDXID: id,
+// The licences of what is inside.
+function writeContents(folder, name, parts) {
+    execFileSync(here("../../../scripts/write-contents"), [
+        join(folder, "contents.spdx.json"),
         name,
-        versionInfo: version,
-        licenseDeclared: license,
-        licenseConcluded: license,
-        downloadLocation: "NOASSERTION",
-        copyrightText: "NOASSERTION",
-        filesAnalyzed: false,
-    });
-    const parts = inside.map((part, i) => describe(`SPDXRef-Part${i + 1}`, part));
-    const own = describe("SPDXRef-Package", { name, version: values.version, license: "MIT" });
-    const contains = ({ SPDXID }) => ({
-        spdxElementId: "SPDXRef-Package",
-        relationshipType: "CONTAINS",
-        relatedSpdxElement: SPDXID,
-    });
-    const document = {
-        spdxVersion: "SPDX-2.3",
-        dataLicense: "CC0-1.0",
-        SPDXID: "SPDXRef-DOCUMENT",
-        name: `${name}-${values.version}`,
-        documentNamespace: `urn:olvane:${name}:${values.version}`,
-        // The same bytes each time; a time of its own would change them.
-        creationInfo: { created: "1970-01-01T00:00:00Z", creators: ["Organization: The Olvane developers"] },
-        documentDescribes: ["SPDXRef-Package"],
-        packages: [own, ...parts],
-        relationships: parts.map(contains),
-    };
-    await writeFile(join(folder, "contents.spdx.json"), JSON.stringify(document, null, 1) + "\n");
+        values.version,
+        ...parts,
+    ]);
 }
 
-const kBoost = { name: "boost", version: "1.74", license: "BSL-1.0" };
-const kRuntime = { name: "emscripten-runtime", version: "3.1", license: "MIT" };
+const kEngineParts = ["boost", "unicode-data", "emscripten-runtime"];
 
 function entries(name) {
     return {
@@ -127,7 +103,7 @@ async function packEngine() {
     await writeFile(join(folder, "inline/package.json"), JSON.stringify(stub) + "\n");
     await copyFile(values.wasm, join(folder, "olvane.wasm"));
     await copyFile(here("README.olvane.md"), join(folder, "README.md"));
-    await writeContents(folder, "olvane", [kBoost, kRuntime]);
+    writeContents(folder, "olvane", kEngineParts);
     await writePackage(folder, {
         name: "olvane",
         version: values.version,
@@ -161,14 +137,13 @@ async function packElement() {
     await copyFile(here("../../../apps/page/src/element/custom-elements.json"), join(folder, "custom-elements.json"));
     await copyFile(here("README.olvane-tree.md"), join(folder, "README.md"));
     await bundle(values.element, join(folder, "olvane-tree.iife.js"), { format: "iife", globalName: "olvaneTree" });
-    await writeContents(folder, "olvane-tree", [
-        { name: "olvane", version: values.version, license: "MIT" },
-        kBoost,
-        kRuntime,
-        { name: "d3-selection", version: "3.0", license: "ISC" },
-        { name: "d3-zoom", version: "3.0", license: "ISC" },
-        { name: "d3-drag", version: "3.0", license: "ISC" },
-        { name: "d3-dispatch", version: "3.0", license: "ISC" },
+    writeContents(folder, "olvane-tree", [
+        "olvane",
+        ...kEngineParts,
+        "d3-selection",
+        "d3-zoom",
+        "d3-drag",
+        "d3-dispatch",
     ]);
     await writePackage(folder, {
         name: "olvane-tree",
