@@ -2,7 +2,8 @@
 # SPDX-License-Identifier: MIT
 """The C library as ctypes sees it: where it is found, and the forms of its structs and calls.
 
-The library is the one that the environment names in OLVANE_LIBRARY, else the one that the system knows.
+The library is the one that the environment names in OLVANE_LIBRARY, else the one that lies in the package, else the one
+that the system knows.
 """
 
 from __future__ import annotations
@@ -63,8 +64,13 @@ class OptionsStruct(ctypes.Structure):
     ]
 
 
+def _library_name() -> str:
+    beside = os.path.join(os.path.dirname(__file__), _SONAME)
+    return os.environ.get("OLVANE_LIBRARY") or (beside if os.path.exists(beside) else _SONAME)
+
+
 def _load() -> ctypes.CDLL:
-    name = os.environ.get("OLVANE_LIBRARY", _SONAME)
+    name = _library_name()
     try:
         return ctypes.CDLL(name)
     except OSError as error:
