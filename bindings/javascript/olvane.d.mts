@@ -114,14 +114,14 @@ export interface PersonRecord extends BoxOfALayout {
 }
 
 /** An unknown parent: an empty box, of a negative id, where no parent is known. */
-export interface MissingParentRecord extends BoxOfALayout {
+export interface UnknownParentRecord extends BoxOfALayout {
     readonly kind: "missingFather" | "missingMother";
     /** The person whose parent is unknown. */
     readonly child: number;
 }
 
 /** One box, and the lines that hang from it; kind says which. */
-export type LayoutRecord = PersonRecord | MissingParentRecord;
+export type LayoutRecord = PersonRecord | UnknownParentRecord;
 
 /** A layout that did not come to its end. text and records are what was laid out before, often nothing. */
 export class LayoutError extends Error {

@@ -157,7 +157,7 @@ TEST(GoldenFolder, holdsAtLeastSixtyCases) {
     EXPECT_GE(allCaseFiles().size(), kFewestCases) << goldenFolder();
 }
 
-TEST(GoldenFolder, tellsOfEveryQuirkOnThePage) {
+TEST(GoldenFolder, holdsEveryQuirkOfThePage) {
     const std::string page = support::readWhole(OLVANE_QUIRKS_PAGE);
     for (const fs::path& file : allCaseFiles()) {
         const std::string name = file.stem().string();

@@ -303,7 +303,7 @@ private:
     }
 
     // Whether an entry or a mark has the child's id with the parent's id; both boxes are persons.
-    bool tellsParent(std::int64_t child, std::int64_t parent) const {
+    bool expressesParent(std::int64_t child, std::int64_t parent) const {
         const auto is = [this](Index b, std::int64_t id) {
             return b != picture::kNone && box(b).kind == picture::BoxKind::person && box(b).id == id;
         };
@@ -320,7 +320,7 @@ private:
         });
     }
 
-    bool tellsPartners(std::int64_t a, std::int64_t b) const {
+    bool expressesPartners(std::int64_t a, std::int64_t b) const {
         const auto are = [&](Index p, Index q) {
             return p != picture::kNone && q != picture::kNone && box(p).kind == picture::BoxKind::person &&
                    box(q).kind == picture::BoxKind::person &&
@@ -348,14 +348,14 @@ private:
             for (const kin::UnionPlace u : known.unionsAsChild(person)) {
                 for (const kin::Place parent : known.partners(u)) {
                     if (parent == kin::kNobody || !shown.contains(known.id(parent))) continue;
-                    if (!tellsParent(id, known.id(parent))) parents.emplace(id, known.id(parent));
+                    if (!expressesParent(id, known.id(parent))) parents.emplace(id, known.id(parent));
                 }
             }
             for (const kin::UnionPlace u : known.unionsAsPartner(person)) {
                 const kin::Place other = known.otherPartner(u, person);
                 if (other == kin::kNobody || other == person || !shown.contains(known.id(other))) continue;
                 const std::int64_t otherId = known.id(other);
-                if (!tellsPartners(id, otherId))
+                if (!expressesPartners(id, otherId))
                     partners.emplace(std::min(id, otherId), std::max(id, otherId));
             }
         }

@@ -77,7 +77,7 @@ void TreeViewFamilyLayouter::addLinesToChildrenOfLoneParent(TreeViewPerson& pers
                                                             std::span<TreeViewPerson> children) {
     const Drop drop = dropToChildOfLoneParent(holder);
     for (TreeViewPerson& child : children) {
-        TreeLine line = drawDropBusAndStem(drop, holder, child);
+        TreeLine line = drawDropBarAndStem(drop, holder, child);
         person.addGenerationEdge(makeGenerationEdge(std::move(line), child, &person));
     }
 }
@@ -89,7 +89,7 @@ void TreeViewFamilyLayouter::addLinesToChildrenOfCouple(TreeViewPerson& person, 
     TreeViewSpouseEdge* const couple = person.spouseEdge(&spouse, TreeLine());
     couple->reserveChildEdges(children.size());
     for (TreeViewPerson& child : children) {
-        TreeLine line = drawDropBusAndStem(drop, spouse, child);
+        TreeLine line = drawDropBarAndStem(drop, spouse, child);
         couple->addChildEdge(makeGenerationEdge(std::move(line), child, couple));
     }
 }
@@ -119,7 +119,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfCouple(TreeVie
 
 // Drop, bar and stem in this order: each joins the course at its end. A stem right below the drop gives a bar
 // of no length, which is drawn like any other.
-TreeLine TreeViewFamilyLayouter::drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder,
+TreeLine TreeViewFamilyLayouter::drawDropBarAndStem(const Drop& drop, TreeViewPerson& holder,
                                                     TreeViewPerson& child) const {
     const TreePoint at = child.getNodeCenter();
     const float stemX = cutToWholePoint(at.x + treeSize.nodeWidth * 0.5f);
@@ -164,12 +164,12 @@ void TreeViewFamilyLayouter::addSiblingLine(TreeViewPerson& person, TreeViewPers
         TreeViewPerson& father = person.getPreferredFather();
         TreeViewPerson* const mother =
             person.preferredMotherIndex != -1 ? &person.getPreferredMother() : nullptr;
-        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromCouple(father, mother), father, sibling));
+        addSiblingEdge(person, sibling, drawDropBarAndStem(dropFromCouple(father, mother), father, sibling));
     } else {
         const bool throughFather =
             person.preferredFatherIndex != -1 && person.getPreferredFather().personId == sharedParent;
         TreeViewPerson& parent = throughFather ? person.getPreferredFather() : person.getPreferredMother();
-        addSiblingEdge(person, sibling, drawDropBusAndStem(dropFromSingleParent(parent), parent, sibling));
+        addSiblingEdge(person, sibling, drawDropBarAndStem(dropFromSingleParent(parent), parent, sibling));
     }
 }
 
@@ -238,14 +238,14 @@ void TreeViewFamilyLayouter::addParentLines(TreeViewPerson& person) {
     if (parentCount == 1) {
         TreeViewPerson& parent =
             person.preferredFatherIndex != -1 ? person.getPreferredFather() : person.getPreferredMother();
-        TreeLine line = drawDropBusAndStem(dropFromSingleParent(parent), parent, person);
+        TreeLine line = drawDropBarAndStem(dropFromSingleParent(parent), parent, person);
         parent.addGenerationEdge(makeGenerationEdge(std::move(line), person, &parent));
         return;
     }
     TreeViewPerson& father = person.getPreferredFather();
     TreeViewPerson& mother = person.getPreferredMother();
     const Drop drop = dropFromCouple(father, &mother);
-    TreeLine line = drawDropBusAndStem(drop, father, person);
+    TreeLine line = drawDropBarAndStem(drop, father, person);
     drawParentsMarriageLine(father, mother, drop);
     TreeViewSpouseEdge* const couple = father.spouseEdge(&mother, TreeLine());
     couple->addChildEdge(makeGenerationEdge(std::move(line), person, couple));

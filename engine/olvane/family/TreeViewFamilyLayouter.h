@@ -146,7 +146,7 @@ private:
     Drop dropToChildOfLoneParent(TreeViewPerson& parent) const;
     Drop dropFromCouple(TreeViewPerson& father, TreeViewPerson* mother) const;
     Drop dropFromSingleParent(TreeViewPerson& parent) const;
-    TreeLine drawDropBusAndStem(const Drop& drop, TreeViewPerson& holder, TreeViewPerson& child) const;
+    TreeLine drawDropBarAndStem(const Drop& drop, TreeViewPerson& holder, TreeViewPerson& child) const;
     void drawParentsMarriageLine(TreeViewPerson& father, TreeViewPerson& mother, const Drop& drop);
     void addSiblingEdge(TreeViewPerson& person, TreeViewPerson& sibling, TreeLine line);
     TreeViewSpouseEdge* siblingParentsEdge(TreeViewPerson& father, TreeViewPerson& mother);

@@ -340,9 +340,9 @@ bool readNumericDate(std::string_view word, ReadDate& result) {
 bool takeNumericDate(Words& words, ReadDate& result) {
     constexpr std::size_t kDayDigits = 2;
     const std::string_view word = words.peek();
-    const bool mayHaveJoint =
+    const bool mayHaveSeparator =
         isDigit(words.front()) && (word.size() > kDayDigits || isSeparator(word.back()));
-    if (!mayHaveJoint || std::none_of(word.begin(), word.end(), isSeparator)) return false;
+    if (!mayHaveSeparator || std::none_of(word.begin(), word.end(), isSeparator)) return false;
     if (readNumericDate(words.peek(), result)) {
         words.skip();
         return true;

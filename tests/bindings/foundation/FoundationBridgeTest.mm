@@ -203,7 +203,7 @@ TEST_F(FoundationBridge, endsALayoutAtANilDate) {
     EXPECT_NE("", valuesOf(hostOf<NilDateHost>(family("17")), 17));
 }
 
-TEST_F(FoundationBridge, tellsAnEmptyDateFromAnyOther) {
+TEST_F(FoundationBridge, distinguishesAnEmptyDateFromAnyOther) {
     const std::string dated = textWithBirth("1850");
     EXPECT_NE(dated, textWithBirth(""));
     EXPECT_EQ(dated, textWithBirth("2"));

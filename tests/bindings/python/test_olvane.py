@@ -518,14 +518,14 @@ class Memory(unittest.TestCase):
         gc.disable()
         self.addCleanup(gc.enable)
 
-    def test_a_host_is_let_go_after_its_layout(self) -> None:
+    def test_a_host_is_released_after_its_layout(self) -> None:
         host = Family(THREE_GENERATIONS)
         olvane.layout(host, 17)
         alive = weakref.ref(host)
         del host
         self.assertIsNone(alive())
 
-    def test_a_host_is_let_go_after_its_failure(self) -> None:
+    def test_a_host_is_released_after_its_failure(self) -> None:
         class Failing(Family):
             reason: type[BaseException] = ValueError
 

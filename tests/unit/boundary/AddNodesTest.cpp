@@ -68,7 +68,7 @@ TEST(AddNodes, missingFatherStandsBesideTheRealMother) {
     expectRecord(request, "-1", true, "17", "4");
 }
 
-TEST(AddNodes, twoMissingParentsStandBesideEachOther) {
+TEST(AddNodes, twoUnknownParentsStandBesideEachOther) {
     Request request(family("17"));
     EXPECT_EQ((ParentTexts{"-1", "-2"}), parentsOf(request, 17));
     EXPECT_EQ(2u, request.glue.addNodes.size());

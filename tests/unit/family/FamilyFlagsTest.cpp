@@ -472,7 +472,7 @@ void PrintTo(const ChildRow& row, std::ostream* out) {
 // The focus is 0, its shown wives are 1 and the unknown parent 50; the host also knows a wife 7 of the focus.
 class FamilyChildFlag : public FamilyFlags, public testing::WithParamInterface<ChildRow> {};
 
-TEST_P(FamilyChildFlag, tellsAParentOffTheChart) {
+TEST_P(FamilyChildFlag, showsAParentOffTheChart) {
     for (const bool before : {false, true}) {
         TreeViewPerson person(0);
         person.addSpouse(1, kFemale);

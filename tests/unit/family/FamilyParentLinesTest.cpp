@@ -99,7 +99,7 @@ TEST_F(FamilyParentLines, cutTheHeightsOfALoneParentsDrop) {
     EXPECT_EQ((Segments{{27.75f, 80, 27.75f, 87, false}}), segmentsOf(father()));
 }
 
-TEST_F(FamilyParentLines, negativeBusIsCutTowardZero) {
+TEST_F(FamilyParentLines, negativeBarIsCutTowardZero) {
     addBothParents();
     place(father(), 0.0f, -167.5f);  // the bar at -72.5, mid-height at -127.5
     drawLines();

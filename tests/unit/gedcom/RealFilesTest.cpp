@@ -56,7 +56,7 @@ TEST_F(RealFiles, eachHasAsManyPersonsAsRecords) {
     EXPECT_GT(files, 60U);
 }
 
-TEST_F(RealFiles, twinsGiveEqualNames) {
+TEST_F(RealFiles, copiesInSeveralEncodingsGiveEqualNames) {
     EXPECT_EQ(namesOf(file("encoding/utf8_cr_nobom.ged")), namesOf(file("encoding/utf8_crlf_bom.ged")));
     EXPECT_EQ(
         namesOf(file("encoding/utf8_crlf_bom.ged")),

@@ -106,7 +106,7 @@ TEST(Writing, leavesTheSignsOfACalendarSingle) {
               std::string::npos);
 }
 
-TEST(Writing, tellsAValueFromAYesOrNo) {
+TEST(Writing, distinguishesAValueFromAYesOrNo) {
     const GedcomData data = readWithFacts(document("0 @I1@ INDI\n1 EVEN\n2 TYPE Y\n1 DEAT Y\n2 TYPE N\n"));
     EXPECT_TRUE(readWithFacts(writeGedcom(data)).person(1).dead);
     expectLastingly(document("0 @I1@ INDI\n1 EVEN\n2 TYPE Y\n1 DEAT Y\n2 TYPE N\n"));

@@ -45,7 +45,7 @@ struct DirectionRow {
     int backward;
 };
 
-TEST(SegmentDirection, tellsTheFourWaysTheDiagonalAndNone) {
+TEST(SegmentDirection, distinguishesTheFourWaysTheDiagonalAndNone) {
     const DirectionRow rows[] = {{segment(0, 0, 0, 5), 1, 2}, {segment(0, 5, 0, 0), 2, 1},
                                  {segment(5, 0, 0, 0), 3, 4}, {segment(0, 0, 5, 0), 4, 3},
                                  {segment(0, 0, 3, 4), 5, 5}, {segment(2, 2, 2, 2), 0, 0}};

@@ -163,7 +163,7 @@ void PrintTo(const ChildRow& row, std::ostream* out) {
 // The focus is 0, its shown wives are 1 and the unknown parent 50.
 class PedigreeChildFlag : public PedigreeFlags, public testing::WithParamInterface<ChildRow> {};
 
-TEST_P(PedigreeChildFlag, tellsAParentOffTheChart) {
+TEST_P(PedigreeChildFlag, showsAParentOffTheChart) {
     for (const bool before : {false, true}) {
         TreeViewPerson person(0);
         person.addSpouse(1, kFemale);

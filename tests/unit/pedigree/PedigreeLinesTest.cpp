@@ -154,7 +154,7 @@ TEST_F(PedigreeLines, childOfALoneParentHasItsEdgeOnThatParent) {
     EXPECT_EQ(&unknownChild(), edge.child);
 }
 
-TEST_F(PedigreeLines, childrenOfOneCoupleShareTheJointAndRepeatTheRun) {
+TEST_F(PedigreeLines, childrenOfOneCoupleShareTheJunctionAndRepeatTheRun) {
     addWife(1, 110.0f);
     for (const int key : {5, 6, 7}) addChild(key, 1, static_cast<float>(key * 110 - 605));
     drawFamilyLines();
@@ -172,7 +172,7 @@ TEST_F(PedigreeLines, childrenOfTheSecondSpouseHangFromTheSecondLine) {
     EXPECT_EQ(Segments{}, segmentsOf(spouse(0)));
 }
 
-TEST_F(PedigreeLines, childLevelWithTheJointGetsAPieceOfNoLength) {
+TEST_F(PedigreeLines, childLevelWithTheJunctionGetsALineOfNoLength) {
     addWife(1, 110.0f);
     addChild(5, 1, 55.0f);
     drawFamilyLines();
