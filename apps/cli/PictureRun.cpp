@@ -66,7 +66,7 @@ void PictureRun::hideIn(picture::Picture& picture) const {
     hideWaysIn(picture);
 }
 
-// Words of a way tell an adoption and whether a marriage lasts; and those at the ends tell of all ways.
+// The words of a way state an adoption and whether a marriage lasts, and those at its ends state all ways.
 void PictureRun::hideWaysIn(picture::Picture& picture) const {
     for (picture::Way& way : picture.ways) {
         const auto boxes = picture.boxesOf(way);
