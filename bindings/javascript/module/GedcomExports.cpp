@@ -124,7 +124,7 @@ std::string tableOf(const gedcom::GedcomData& data) {
 }
 
 // A file whose answers found no memory has not failed.
-void tellLackOfMemory(LayoutAnswer& answer) {
+void reportLackOfMemory(LayoutAnswer& answer) {
     int code = 0;
     if (answer.layout) olvane_layout_host_code(answer.layout.get(), &code);
     if (code == kLacksMemory) answer.status = OLVANE_OUT_OF_MEMORY;
@@ -188,7 +188,7 @@ OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, in
     gedcom::LimitedDataSource limited(file->source, js::kMostRelatives);
     js::LayoutAnswer* answer =
         js::layoutAnswer(js::hostOfSource(limited), static_cast<js::View>(view), focus, js::nextOptions());
-    if (answer) js::tellLackOfMemory(*answer);
+    if (answer) js::reportLackOfMemory(*answer);
     return answer;
 }
 
