@@ -30,6 +30,9 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
         isLength(sizes.boxWidth) && isLength(sizes.boxHeight) && isLength(sizes.gapX) && isLength(sizes.gapY);
     for (const BoxSize& size : request.boxSizes) good = good && isLength(size.width) && isLength(size.height);
     if (!good) throw std::invalid_argument("sizes of boxes and gaps must be finite and not negative");
+    if (!std::isfinite(request.aspect) || request.aspect < 0) {
+        throw std::invalid_argument("an aspect must be finite and not negative");
+    }
     if (!request.boxSizes.empty() &&
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("there must be one box size for each person");
@@ -42,6 +45,8 @@ EverybodyOptions everybodyOptions(const ChartRequest& request) {
     options.marks = request.marks;
     options.effort = request.effort;
     options.onePart = request.onePart;
+    options.aspect = request.aspect;
+    options.compact = request.compact;
     options.direction = request.direction;
     options.sizes = request.sizes;
     options.boxSizes = request.boxSizes;

@@ -56,10 +56,11 @@ picture::Picture everybodyChart(const kin::KinGraph& graph, const EverybodyOptio
     boxes.gapY = double{options.sizes.gapY};
     std::vector<PartLayout> parts;
     EverybodyOptions left = options;
-    for (Component& part : componentsOf(graph)) {
+    if (boxes.turned && options.aspect > 0) left.aspect = 1 / options.aspect;
+    for (const Component& part : componentsOf(graph)) {
         const bool hasFocus = std::binary_search(part.persons.begin(), part.persons.end(), options.focus);
         if (options.onePart && !hasFocus) continue;
-        parts.push_back(layOutPart(std::move(part), boxes, left));
+        parts.push_back(layOutPart(part, boxes, left));
         if (left.marks > 0) left.marks = std::max(0, left.marks - parts.back().marksMade);
     }
     picture::Picture picture = pictureOfParts(graph, parts, boxes, options.focus);

@@ -27,6 +27,11 @@ struct EverybodyOptions {
     bool onePart = true;
     // A generation wider than this share of the picture's height is folded into two or three rows; 0 for none.
     double foldAspect = 0.65;
+    // Width by height of the paper that the picture is for: several ways to fold are tried, and the one that can be
+    // printed largest is taken. 0 for a picture of no paper, which foldAspect alone decides on.
+    double aspect = 0;
+    // Lines lie closer together, and gaps between rows are no higher than their lines ask for.
+    bool compact = false;
     Direction direction = Direction::down;
     ChartSizes sizes;
     std::span<const BoxSize> boxSizes;  // as in ChartRequest

@@ -19,10 +19,15 @@ std::size_t at(std::int32_t place) {
     return static_cast<std::size_t>(place);
 }
 
-// What lies between a row and the first track under it, and between two tracks. Units: points.
-constexpr double kTrackMargin = 9;
-constexpr double kTrackGap = 4;
-constexpr double kGapStep = 24;
+// What lies between a row and the first track under it, and between two tracks; and the steps in which gaps grow,
+// so that one more bar more seldom moves all that lies below. Units: points.
+struct TrackSizes {
+    double margin = 9;
+    double gap = 4;
+    double step = 24;
+};
+constexpr TrackSizes kUsualTracks;
+constexpr TrackSizes kCompactTracks{6, 3, 1};
 // How near to the side of its box a line may end.
 constexpr double kBoxMargin = 5;
 // How far a line that runs between boxes may be moved to keep it off others.
@@ -31,7 +36,12 @@ constexpr double kMostPassMove = 20;
 class PartLayouter {
 public:
     PartLayouter(PartLayout& layout, const BoxSizes& boxes, const EverybodyOptions& options)
-        : l_(layout), boxes_(boxes), options_(options) {}
+        : l_(layout),
+          boxes_(boxes),
+          options_(options),
+          tracks_(options.compact ? kCompactTracks : kUsualTracks) {
+        l_.trackGap = tracks_.gap;
+    }
 
     // Couples first, since who stands side by side is in one row. Then rows, which need the couples; then the order
     // in the rows, which decides over crossings; then places, which keep the order; lines last.
@@ -259,10 +269,10 @@ private:
             }
             const std::int32_t tracks = l_.lines.tracks[at(gap + 1)];
             const bool outside = gap < 0 || gap + 1 == l_.rows.rowCount;
-            const double used = tracks > 0 ? (tracks - 1) * kTrackGap : 0;
+            const double used = tracks > 0 ? (tracks - 1) * tracks_.gap : 0;
             const double height =
-                outside ? (tracks > 0 ? used + kTrackMargin : 0) : gapHeight(used + 2 * kTrackMargin);
-            l_.gapTop[at(gap + 1)] = outside ? y + (gap < 0 ? 0 : kTrackMargin) : y + (height - used) / 2;
+                outside ? (tracks > 0 ? used + tracks_.margin : 0) : gapHeight(used + 2 * tracks_.margin);
+            l_.gapTop[at(gap + 1)] = outside ? y + (gap < 0 ? 0 : tracks_.margin) : y + (height - used) / 2;
             y += height;
         }
         l_.height = y;
@@ -271,24 +281,50 @@ private:
         }
     }
 
-    // In whole steps beyond the least, so that a bar more seldom moves all that lies below.
+    // In whole steps beyond the least.
     double gapHeight(double needed) const {
         const double least = boxes_.gapY;
-        return needed <= least ? least : least + std::ceil((needed - least) / kGapStep) * kGapStep;
+        return needed <= least ? least : least + std::ceil((needed - least) / tracks_.step) * tracks_.step;
     }
 
     PartLayout& l_;
     const BoxSizes& boxes_;
     const EverybodyOptions& options_;
+    const TrackSizes& tracks_;
 };
+
+PartLayout layOutOnce(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options) {
+    PartLayout layout;
+    layout.part = part;
+    PartLayouter(layout, boxes, options).layOut();
+    return layout;
+}
+
+// How high a sheet of that aspect is that the picture just fits on.
+double sheetHeight(const PartLayout& layout, double aspect) {
+    return std::max(layout.height, layout.width / aspect);
+}
+
+// Folding works with estimates of the height, so that some shares of the aspect about 1 are tried.
+PartLayout layOutForPaper(const Component& part, const BoxSizes& boxes, EverybodyOptions options) {
+    constexpr double kShares[] = {1, 0.93, 1.08, 0.86, 1.17, 0.75, 1.3, 0.6};
+    constexpr std::int32_t kManyPersons = 20'000;
+    PartLayout best;
+    for (const double share : kShares) {
+        options.foldAspect = options.aspect * share;
+        PartLayout layout = layOutOnce(part, boxes, options);
+        const bool better =
+            share == 1 || sheetHeight(layout, options.aspect) < sheetHeight(best, options.aspect);
+        if (better) best = std::move(layout);
+        if (part.personCount() > kManyPersons) break;
+    }
+    return best;
+}
 
 }  // namespace
 
-PartLayout layOutPart(Component part, const BoxSizes& boxes, const EverybodyOptions& options) {
-    PartLayout layout;
-    layout.part = std::move(part);
-    PartLayouter(layout, boxes, options).layOut();
-    return layout;
+PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options) {
+    return options.aspect > 0 ? layOutForPaper(part, boxes, options) : layOutOnce(part, boxes, options);
 }
 
 }  // namespace olvane::charts

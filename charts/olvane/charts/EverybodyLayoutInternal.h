@@ -27,6 +27,7 @@ struct PartLayout {
     std::vector<double> gapTop;     // by gap + 1: where the first track runs
     double width = 0;
     double height = 0;
+    double trackGap = 4;         // between two tracks
     std::int32_t marksMade = 0;  // because they were asked for
 };
 
@@ -57,6 +58,6 @@ private:
     }
 };
 
-PartLayout layOutPart(Component part, const BoxSizes& boxes, const EverybodyOptions& options);
+PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options);
 
 }  // namespace olvane::charts

@@ -16,7 +16,6 @@ std::size_t at(std::int32_t place) {
     return static_cast<std::size_t>(place);
 }
 
-constexpr double kTrackGap = 4;
 constexpr double kPartGap = 80;
 // Between the marriage lines of two unions of one couple.
 constexpr double kMarriageGap = 6;
@@ -153,7 +152,7 @@ private:
         const Rows& rows = l_->rows;
         const Rows::Strand& strand = rows.strands[s];
         const std::int32_t track = l_->lines.track[s];
-        const double barY = l_->gapTop[at(strand.gap + 1)] + std::max(0, track) * kTrackGap;
+        const double barY = l_->gapTop[at(strand.gap + 1)] + std::max(0, track) * l_->trackGap;
         const auto x = [&](std::uint32_t e) { return offsetX_ + l_->lines.endX[e]; };
         const bool straight = track < 0 && strand.aboveCount == 1 && strand.belowCount == 1;
         double low = x(strand.firstEnd);

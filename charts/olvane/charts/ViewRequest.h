@@ -66,7 +66,8 @@ struct ChartRequest {
     LayoutOptions layout;
     bool spouses = true;    // descendants, hourglass, relatives, fan of descendants
     bool siblings = false;  // ancestors, hourglass: the siblings of the focus and of its ancestors
-    // Trees: generations packed tighter. Parents need not stand over the middle of their children.
+    // Trees: generations packed tighter. Parents need not stand over the middle of their children. Everybody: lines
+    // lie closer together.
     bool compact = false;
 
     FanOf fanOf = FanOf::ancestors;
@@ -79,6 +80,8 @@ struct ChartRequest {
     int marks = 0;        // everybody: how many second links become marks; -1 for all of them
     int effort = 1;       // everybody: 0 is quickest, each step more takes up to twice the time
     bool onePart = true;  // everybody: only the part of the family that the focus is in
+    double aspect =
+        0;  // everybody: width by height of the paper that wide generations are folded for; 0 for none
 };
 
 }  // namespace olvane::charts
