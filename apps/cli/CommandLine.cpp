@@ -17,6 +17,7 @@
 #include <cli/Commands.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
+#include <cli/PaperOptions.h>
 #include <cli/UsageError.h>
 #include <cli/ViewOptions.h>
 
@@ -191,8 +192,9 @@ private:
                          "Picture to write: .svg, .png or .pdf; - writes SVG to the standard output")
             ->required()
             ->type_name("OUT");
-        addViewOptions(*draw_, drawOptions_.request,
-                       "default tall, and wide in a pedigree and in charts that lie sideways");
+        addViewOptions(
+            *draw_, drawOptions_.request,
+            "default tall, and wide in a pedigree, in charts that lie sideways, and in everybody with --fit");
         draw_
             ->add_option("--theme", drawOptions_.theme,
                          "Colours: light (default), dark, or print for little ink")
@@ -200,14 +202,7 @@ private:
             ->type_name("light|dark|print");
         draw_->add_option("--title", drawOptions_.title, "Title above the picture; none is drawn without it")
             ->type_name("TEXT");
-        draw_
-            ->add_option(
-                "--page", drawOptions_.page,
-                "Lay the picture out on sheets of this paper, with strips to glue them by. A .pdf holds "
-                "them all; other forms become OUT-1, OUT-2 and so on. More than about 1,000 sheets are "
-                "refused")
-            ->check(CLI::IsMember({"A4", "A3", "letter"}))
-            ->type_name("A4|A3|letter");
+        addPaperOptions(*draw_, drawOptions_.paper);
         draw_->add_flag("--unknown-parents", drawOptions_.request.unknownParents,
                         "Draw dashed boxes for parents who are not known, in family and pedigree");
         draw_
@@ -396,6 +391,9 @@ private:
         DrawOptions options = drawOptions_;
         completeViewOptions(*draw_, options.request);
         widenSideways(*draw_, options.request);
+        checkPaperOptions(options.paper, options.output);
+        const bool foldedForPaper = options.paper.onPaper() && options.request.view() == View::everybody;
+        if (foldedForPaper && !isGiven(*draw_, "--boxes")) options.request.boxes = BoxForm::wide;
         for (const std::string& what : drawShown_) {
             options.shown.dates = options.shown.dates || what == "dates";
             options.shown.places = options.shown.places || what == "places";

@@ -13,6 +13,7 @@
 #include <cli/FileReading.h>
 #include <cli/HiddenPersons.h>
 #include <cli/LayoutRun.h>
+#include <cli/PaperOptions.h>
 
 namespace olvane::cli {
 
@@ -46,7 +47,7 @@ struct DrawOptions {
     LayoutRequest request;
     std::string theme = "light";
     std::string title;  // empty for one made of the focus's name
-    std::string page;   // name of a paper; empty for a picture of its own size
+    PaperOptions paper;
     gedcom::ShownFacts shown{};
     HidingOptions hiding;
 };

@@ -6,12 +6,9 @@
 
 #include <cli/Commands.h>
 
-#include <algorithm>
-#include <cmath>
 #include <iomanip>
 #include <sstream>
 
-#include <olvane/draw/PageSplit.h>
 #include <olvane/gedcom/HiddenNames.h>
 #include <olvane/source/GedcomLabels.h>
 
@@ -19,6 +16,7 @@
 #include <cli/FocusChoice.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
+#include <cli/PaperDrawing.h>
 #include <cli/PictureConversion.h>
 #include <cli/PictureRun.h>
 #include <cli/SourceDate.h>
@@ -29,10 +27,6 @@ namespace olvane::cli {
 namespace {
 
 enum class Form { svg, png, pdf };
-
-constexpr double kSheetPngScale = 2;  // 192 pixels an inch, for paper
-// Sixty square metres of A4; beyond, time and memory are of no use to anybody.
-constexpr double kMostSheets = 1000;
 
 std::string lowerCase(std::string text) {
     for (char& c : text) {
@@ -64,6 +58,7 @@ const char* endingOf(Form form) {
 
 draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::DrawingContent& content) {
     draw::DrawingOptions drawing;
+    if (!options.paper.onPaper() && options.paper.scale > 0) drawing.scale = options.paper.scale;
     drawing.theme = draw::themeOfName(options.theme);
     drawing.headline = !options.title.empty();
     drawing.title =
@@ -71,10 +66,11 @@ draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::Draw
     return drawing;
 }
 
-draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options) {
+draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options,
+                               const LayoutRequest& request) {
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
     const std::vector<bool> hidden = hiddenPersons(data, options.hiding);
-    picture::Picture picture = PictureRun(data, options.request, hidden).pictureOf(focus);
+    picture::Picture picture = PictureRun(data, request, hidden).pictureOf(focus);
     gedcom::HiddenTexts texts;
     if (!hidden.empty()) {
         const gedcom::HiddenNames names(data, hidden);
@@ -113,7 +109,8 @@ std::string contentOfSheet(const std::string& path, Form form, const draw::SvgPi
 // All of them or none: half a wall of sheets is of no use.
 void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets,
                  const OutputRules& rules) {
-    const double scale = options.page.empty() ? 1 : kSheetPngScale;
+    const double size = options.paper.onPaper() ? 1 : options.paper.scale > 0 ? options.paper.scale : 1;
+    const double scale = size * options.paper.pixelsOfPx();
     if (sheets.size() == 1) {
         return writeOutput(options.output, contentOfSheet(options.output, form, sheets.front(), scale),
                            rules);
@@ -126,33 +123,29 @@ void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::
     set.finish();
 }
 
-// Without the strips and margins that sheets share, and with those that would be blank.
-double sheetsFor(const draw::SvgPicture& picture, double paperWidth, double paperHeight) {
-    constexpr double kPxOfMm = 96 / 25.4;
-    return std::ceil(picture.width / (paperWidth * kPxOfMm)) *
-           std::ceil(picture.height / (paperHeight * kPxOfMm));
+// What is drawn, and how a screen reader calls it.
+struct Drawn {
+    std::vector<draw::SvgPicture> sheets;
+    std::string title;
+};
+
+Drawn drawWhole(const gedcom::GedcomData& data, const DrawOptions& options) {
+    const draw::DrawingContent content = contentOf(data, options, options.request);
+    const draw::DrawingOptions drawing = drawingOptions(options, content);
+    return {{draw::drawSvg(content, drawing)}, drawing.title};
 }
 
-// Before any sheet is made: a picture may be kilometres wide.
-void refuseTooManySheets(const DrawOptions& options, const draw::SvgPicture& picture,
-                         const draw::Paper& paper) {
-    const double sheets = std::min(sheetsFor(picture, paper.width, paper.height),
-                                   sheetsFor(picture, paper.height, paper.width));
-    if (sheets <= kMostSheets) return;
-    std::ostringstream text;
-    text << std::fixed << std::setprecision(0) << "the picture would take about " << sheets << " sheets of "
-         << options.page << ", and " << kMostSheets
-         << " are the most; take larger paper, leave relatives or generations out, or draw it whole, "
-            "without --page";
-    throw UsageError(text.str());
-}
-
-std::vector<draw::SvgPicture> sheetsOf(const DrawOptions& options, const draw::SvgPicture& picture,
-                                       const std::string& title) {
-    const auto paper = draw::paperOfName(options.page);
-    if (!paper) return {picture};
-    refuseTooManySheets(options, picture, *paper);
-    return draw::splitPages(picture, *paper, title);
+Drawn drawOnSheets(const gedcom::GedcomData& data, const DrawOptions& options) {
+    PaperDrawing drawn = drawOnPaper(
+        options.paper, options.request,
+        [&](const LayoutRequest& request) { return contentOf(data, options, request); },
+        [&](const draw::DrawingContent& content) { return drawingOptions(options, content); });
+    if (options.output == "-" && drawn.drawing.sheets.size() > 1) {
+        throw UsageError("the picture takes " + std::to_string(drawn.drawing.sheets.size()) +
+                         " sheets; name a file for them");
+    }
+    printMessage(sentenceOf(drawn));
+    return {std::move(drawn.drawing.sheets), drawn.title};
 }
 
 }  // namespace
@@ -163,17 +156,12 @@ int runDraw(const DrawOptions& options) {
     checkOutput(options.output, rules);
     const gedcom::GedcomData data =
         options.shown.needFacts() ? readFileWithFacts(options.input) : readFile(options.input);
-    const draw::DrawingContent content = contentOf(data, options);
-    const draw::DrawingOptions drawing = drawingOptions(options, content);
-    const auto sheets = sheetsOf(options, draw::drawSvg(content, drawing), drawing.title);
-    if (options.output == "-" && sheets.size() > 1) {
-        throw UsageError("the picture takes " + std::to_string(sheets.size()) +
-                         " sheets; name a file for them");
-    }
+    const Drawn drawn = options.paper.onPaper() ? drawOnSheets(data, options) : drawWhole(data, options);
     if (form == Form::pdf) {
-        writeOutput(options.output, pdfOf(sheets, drawing.title, sourceDate()), rules);
+        const double scale = options.paper.onPaper() || options.paper.scale <= 0 ? 1 : options.paper.scale;
+        writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, sourceDate()), rules);
     } else {
-        writeSheets(options, form, sheets, rules);
+        writeSheets(options, form, drawn.sheets, rules);
     }
     return 0;
 }

@@ -11,7 +11,9 @@
 #include <cstdio>
 #include <memory>
 #include <stdexcept>
+#include <utility>
 
+#include <cli/PdfUserUnit.h>
 #include <cli/RenderLibraries.h>
 
 namespace olvane::cli {
@@ -19,7 +21,7 @@ namespace olvane::cli {
 namespace {
 
 constexpr double kLongestPng = 32000;      // pixels; cairo's images end at 32,767
-constexpr double kLongestPdf = 14400;      // points; what viewers of PDF take
+constexpr double kLongestPdf = 14400;      // units of a page; what viewers of PDF take
 constexpr double kPointsOfPx = 72.0 / 96;  // a px is 1/96 inch, a point 1/72
 
 // Frees what the libraries hand out.
@@ -82,6 +84,14 @@ double longestSide(const draw::SvgPicture& picture) {
     return std::max({picture.width, picture.height, 1});
 }
 
+// How many points a unit of the pages must be, so that no side has more units than the form allows.
+int userUnitFor(const std::vector<draw::SvgPicture>& pages, double scale) {
+    double longest = 0;
+    for (const draw::SvgPicture& page : pages)
+        longest = std::max(longest, longestSide(page) * kPointsOfPx * scale);
+    return std::max(1, static_cast<int>(std::ceil(longest / kLongestPdf)));
+}
+
 int pixels(double length) {
     return std::max(1, static_cast<int>(std::ceil(length)));
 }
@@ -108,9 +118,10 @@ std::string pngOf(const draw::SvgPicture& picture, double scale) {
     return bytes;
 }
 
-std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title,
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title, double scale,
                   const std::optional<std::chrono::sys_seconds>& created) {
     const RenderLibraries& lib = renderLibraries();
+    const int unit = userUnitFor(pages, scale);
     std::string bytes;
     {
         const auto surface = owned(lib.cairo_pdf_surface_create_for_stream(appendBytes, &bytes, 1, 1),
@@ -120,17 +131,17 @@ std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string&
         lib.cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_CREATE_DATE,
                                            isoDate(created).c_str());
         for (const draw::SvgPicture& page : pages) {
-            const double scale = std::min(kPointsOfPx, kLongestPdf / longestSide(page));
-            lib.cairo_pdf_surface_set_size(surface.get(), page.width * scale, page.height * scale);
+            const double size = kPointsOfPx * scale / unit;
+            lib.cairo_pdf_surface_set_size(surface.get(), page.width * size, page.height * size);
             const auto target = owned(lib.cairo_create(surface.get()), lib.cairo_destroy);
-            lib.cairo_scale(target.get(), scale, scale);
+            lib.cairo_scale(target.get(), size, size);
             renderOnto(target.get(), page);
             lib.cairo_show_page(target.get());
         }
         lib.cairo_surface_finish(surface.get());
         requireSuccess(lib.cairo_surface_status(surface.get()));
     }
-    return bytes;
+    return unit == 1 ? bytes : withUserUnit(std::move(bytes), unit);
 }
 
 }  // namespace olvane::cli

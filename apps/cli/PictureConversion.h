@@ -23,10 +23,10 @@ double pngScale(const draw::SvgPicture& picture, double wanted);
 // A PNG of so many pixels for each px; smaller where a side would be too long.
 std::string pngOf(const draw::SvgPicture& picture, double scale);
 
-// A PDF with one page for each picture, of its size at 96 px an inch, in vectors and with its text as text. A
-// page larger than the form allows (14,400 points) is scaled down. The same pages give the same bytes; created is the
+// A PDF with one page for each picture, of its size at 96 px an inch times scale, in vectors and with its text as
+// text. Where a page has more than 14,400 points, the unit of all pages is a multiple of a point. The same pages give the same bytes; created is the
 // time of creation that it states, none where empty.
-std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title,
+std::string pdfOf(const std::vector<draw::SvgPicture>& pages, const std::string& title, double scale,
                   const std::optional<std::chrono::sys_seconds>& created);
 
 }  // namespace olvane::cli

@@ -25,7 +25,7 @@ std::string pngOf(const draw::SvgPicture&, double) {
     refuse();
 }
 
-std::string pdfOf(const std::vector<draw::SvgPicture>&, const std::string&,
+std::string pdfOf(const std::vector<draw::SvgPicture>&, const std::string&, double,
                   const std::optional<std::chrono::sys_seconds>&) {
     refuse();
 }

@@ -72,8 +72,8 @@ def require_records(done, fewest):
 
 def require_few_sheets(command, text):
     done, files = run(command, text, "draw", "FILE", "--focus", "I1", "--view", "pedigree", "--generations", "12",
-                      "--boxes", "tall", "--page", "A4", "-o", "out.svg")
-    if done.returncode != 2 or "sheets of A4, and 1000 are the most" not in done.stderr or files != ["family.ged"]:
+                      "--boxes", "tall", "--fit", "A4", "--scale", "1", "-o", "out.svg")
+    if done.returncode != 2 or "the picture would take more than 1000 sheets" not in done.stderr or files != ["family.ged"]:
         raise SystemExit(f"thousands of sheets: status {done.returncode}, {len(files)} files, {done.stderr[:300]}")
 
 

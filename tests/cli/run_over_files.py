@@ -32,7 +32,7 @@ def commands_for(file, number):
         ["layout", file, "--focus", "1", "--view", "everybody"], ["layout", file, "--focus", "1", "--view", "fan"],
         ["layout", file, "--focus", "1", "--view", "kinship", "--to", "3"], ["kin", file, "1", "2", "--format", "json"],
         ["draw", file, "--focus", "1", "-o", "out.svg"], ["draw", file, "--focus", "1", "-o", file],
-        ["draw", file, "--focus", "1", "--page", "A4", "-o", "sheets.svg", "--hide-living"],
+        ["draw", file, "--focus", "1", "--fit", "A4", "--sheets", "1x3", "-o", "sheets.svg", "--hide-living"],
         ["page", file, "-o", "out.html", "--hide-living"], ["page", file, "-o", file],
         ["people", file, "--encoding", "windows-1251"],
         ["draw", "io.svg", "--focus", "1", "-o", "io.svg"], ["page", "io.html", "-o", "io.html"],

@@ -31,10 +31,12 @@ _olvane() {
         --boxes) COMPREPLY=($(compgen -W "tall wide" -- "$cur")); return ;;
         --theme) COMPREPLY=($(compgen -W "light dark print" -- "$cur")); return ;;
         --show) COMPREPLY=($(compgen -W "dates places occupation marriage" -- "$cur")); return ;;
-        --page) COMPREPLY=($(compgen -W "A4 A3 letter" -- "$cur")); return ;;
+        --fit) COMPREPLY=($(compgen -W "A4 A3 A2 A1 A0 letter" -- "$cur")); return ;;
+        --sheets) COMPREPLY=($(compgen -W "1x2 2x1 2x2 2x3" -- "$cur")); return ;;
+        --dpi) COMPREPLY=($(compgen -W "96 192 300" -- "$cur")); return ;;
         --format) COMPREPLY=($(compgen -W "text tsv json json1" -- "$cur")); return ;;
         --encoding) COMPREPLY=($(compgen -W "$encodings" -- "$cur")); return ;;
-        --focus | --title | --year) return ;;
+        --focus | --title | --year | --scale) return ;;
         -o | --output | --focus-from | --family) COMPREPLY=($(compgen -f -- "$cur")); return ;;
     esac
     if ((cword == 1)); then
@@ -48,7 +50,7 @@ _olvane() {
     case ${words[1]} in
         people) COMPREPLY=($(compgen -W "--help --encoding --format" -- "$cur")) ;;
         layout) COMPREPLY=($(compgen -W "--help --encoding --focus --format $view $living $family" -- "$cur")) ;;
-        draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --page --unknown-parents --show $view $living $family" -- "$cur")) ;;
+        draw) COMPREPLY=($(compgen -W "--help --encoding --focus --output --theme --title --fit --sheets --scale --dpi --unknown-parents --show $view $living $family" -- "$cur")) ;;
         batch) COMPREPLY=($(compgen -W "--help --encoding --focus-from --unbuffered $view $family" -- "$cur")) ;;
         check) COMPREPLY=($(compgen -W "--help --encoding --focus --all --format $view $family" -- "$cur")) ;;
         kin) COMPREPLY=($(compgen -W "--help --encoding --format --ways --language" -- "$cur")) ;;

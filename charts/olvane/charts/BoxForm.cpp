@@ -7,6 +7,9 @@ namespace olvane::charts {
 
 namespace {
 
+// As close as lines allow, where all must go on one paper.
+constexpr float kPaperGapX = 8;
+constexpr float kPaperGapY = 14;
 constexpr float kGapOfWideRows = 45;  // room for names of children over one another
 
 }  // namespace
@@ -38,6 +41,9 @@ void setBoxForm(ChartRequest& request, BoxForm form) {
     if (request.view == View::family || request.view == View::pedigree) {
         request.sizes.gapX = size.horzPadding;
         request.sizes.gapY = size.vertPadding;
+    } else if (request.view == View::everybody && request.aspect > 0) {
+        request.sizes.gapX = kPaperGapX;
+        request.sizes.gapY = kPaperGapY;
     } else if (form == BoxForm::wide) {
         request.sizes.gapY = kGapOfWideRows;
     }

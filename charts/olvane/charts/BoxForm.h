@@ -20,7 +20,7 @@ OLVANE_API BoxForm usualBoxForm(View view, Direction direction);
 // The sizes of the engine's views, in points.
 OLVANE_API TreeSize treeSizeOf(BoxForm form);
 
-// Sets all sizes of a request for boxes of a form; its view is set before.
+// Sets all sizes of a request for boxes of a form; its view and its aspect are set before.
 OLVANE_API void setBoxForm(ChartRequest& request, BoxForm form);
 
 }  // namespace olvane::charts

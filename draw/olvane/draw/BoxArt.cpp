@@ -38,9 +38,10 @@ constexpr double kFocusBorder = 4;
 constexpr double kCaptionSize = 10.5;
 constexpr double kCaptionPitch = 13;
 constexpr std::size_t kMostCaptionLines = 3;
-constexpr double kCaptionOver = 40;      // by which a caption may be wider than its box
-constexpr double kNameGap = 3;           // between lines of a name
-constexpr double kLeastNameHeight = 26;  // two lines of the smallest letters
+constexpr double kCaptionOver = 40;  // by which a caption may be wider than its box
+constexpr double kNameGap = 3;       // between lines of a name
+constexpr double kLargestName = 13;
+constexpr double kSmallestName = 10;
 constexpr std::size_t kMostNameLines = 8;
 
 bool isWide(const BoxFrame& box) {
@@ -54,9 +55,48 @@ struct TextRoom {
     double top = 0;
     double bottom = 0;
     bool centred = true;
+    double largestName = kLargestName;
+    double smallestName = kSmallestName;
+    double nameGap = kNameGap;  // between lines of a name
+    double yearsSize = kYearsSize;
+    double yearsPitch = kYearsPitch;
+
+    // Two lines of the smallest letters.
+    double leastNameHeight() const { return 2 * (smallestName + nameGap); }
 };
 
+// The size of names that was asked for, or the largest at which most names go into a box of that form: nine letters
+// in a line, and three lines with years below.
+double leastNameOf(const BoxFrame& box) {
+    return std::min({box.leastName, box.width / 9, box.height / 4});
+}
+
+// Whether names are larger than beside or below a silhouette.
+bool isForPaper(const BoxFrame& box) {
+    return leastNameOf(box) > kSmallestName;
+}
+
+TextRoom paperRoomOf(const BoxFrame& box) {
+    constexpr double kSide = 5;
+    constexpr double kEdge = 2;
+    TextRoom room{box.width / 2, box.width - 2 * kSide, kEdge, box.height - kEdge, true};
+    if (isWide(box)) {
+        room.x = kSide;
+        room.centred = false;
+    } else if (box.hasHidden() || box.repeatNumber > 0) {
+        room.top = kBadgeInset + kBadgeHeight;
+    }
+    const double least = leastNameOf(box);
+    room.largestName = 1.3 * least;
+    room.smallestName = least;
+    room.nameGap = 0.06 * least;
+    room.yearsSize = std::max(kYearsSize, 0.6 * least);
+    room.yearsPitch = room.yearsSize;
+    return room;
+}
+
 TextRoom textRoomOf(const BoxFrame& box) {
+    if (isForPaper(box)) return paperRoomOf(box);
     if (isWide(box)) {
         const double left = kInset + kSilhouetteWidth + kInset;
         return {left, box.width - left - kInset, 4, box.height - 5, false};
@@ -65,12 +105,15 @@ TextRoom textRoomOf(const BoxFrame& box) {
 }
 
 picture::FittedName nameOf(const kin::PersonLabel& label, const TextRoom& room, double height) {
-    return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst,
-                            {room.width, std::max(height, kLeastNameHeight), kNameGap, kMostNameLines});
+    picture::NameRoom names{room.width, std::max(height, room.leastNameHeight()), room.nameGap,
+                            kMostNameLines};
+    names.largest = room.largestName;
+    names.smallest = room.smallestName;
+    return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst, names);
 }
 
 std::vector<std::string> yearLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
-    const Font font{kYearsSize, false};
+    const Font font{room.yearsSize, false};
     std::vector<std::string> parts;
     if (!label.birth.empty()) parts.push_back("* " + cleanText(label.birth));
     if (!label.death.empty()) parts.push_back("\xE2\x80\xA0 " + cleanText(label.death));
@@ -84,10 +127,10 @@ std::vector<std::string> yearLinesOf(const kin::PersonLabel& label, const TextRo
 
 // Years, then as many details as leave room for two lines of a name.
 std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
-    const Font font{kYearsSize, false};
+    const Font font{room.yearsSize, false};
     std::vector<std::string> lines = yearLinesOf(label, room);
-    const double spare = room.bottom - room.top - kLeastNameHeight;
-    const auto most = static_cast<std::size_t>(std::max(0.0, spare / kYearsPitch));
+    const double spare = room.bottom - room.top - room.leastNameHeight();
+    const auto most = static_cast<std::size_t>(std::max(0.0, spare / room.yearsPitch));
     for (const std::string& detail : label.details) {
         if (lines.size() >= most) break;
         lines.push_back(fitLine(cleanText(detail), font, room.width));
@@ -115,18 +158,18 @@ void appendNames(std::string& svg, const picture::FittedName& name, const TextRo
         appendTextLine(svg, room.x, y, line,
                        anchorAttribute(room, line) + " font-weight=\"bold\" font-size=\"" + px(name.size) +
                            "\" fill=\"" + std::string(theme.text) + "\"");
-        y += name.size + kNameGap;
+        y += name.size + room.nameGap;
     }
 }
 
 void appendYears(std::string& svg, const std::vector<std::string>& lines, const TextRoom& room,
                  double lastBaseline, const DrawingTheme& theme) {
-    double y = lastBaseline - kYearsPitch * (static_cast<double>(lines.size()) - 1);
+    double y = lastBaseline - room.yearsPitch * (static_cast<double>(lines.size()) - 1);
     for (const std::string& line : lines) {
         appendTextLine(svg, room.x, y, line,
                        std::string(room.centred ? " text-anchor=\"middle\"" : "") + " font-size=\"" +
-                           px(kYearsSize) + "\" fill=\"" + std::string(theme.quietText) + "\"");
-        y += kYearsPitch;
+                           px(room.yearsSize) + "\" fill=\"" + std::string(theme.quietText) + "\"");
+        y += room.yearsPitch;
     }
 }
 
@@ -135,13 +178,17 @@ void appendTexts(std::string& svg, const BoxFrame& box, const kin::PersonLabel& 
                  const DrawingTheme& theme) {
     const TextRoom room = textRoomOf(box);
     const std::vector<std::string> years = factLinesOf(label, room);
+    const double gap = isForPaper(box) ? 0 : 2;
     const double namesBottom =
-        room.bottom - kYearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : 2);
+        room.bottom - room.yearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : gap);
     const double namesHeight = namesBottom - room.top;
     const picture::FittedName names = nameOf(label, room, namesHeight);
-    const double used = static_cast<double>(names.lines.size()) * (names.size + kNameGap);
+    const double used = static_cast<double>(names.lines.size()) * (names.size + room.nameGap);
     appendNames(svg, names, room, room.top + std::max(0.0, (namesHeight - used) / 2), theme);
-    appendYears(svg, years, room, room.bottom - 3, theme);
+    appendYears(svg, years, room, room.bottom - (isForPaper(box) ? 0.2 * room.yearsSize : 3), theme);
+    if (box.text == nullptr) return;
+    if (!names.lines.empty()) box.text->addName(names.size);
+    if (!years.empty()) box.text->add(room.yearsSize);
 }
 
 // Square corners for men, round ones for women, in between for everybody else.
@@ -264,11 +311,13 @@ void appendBadges(std::string& svg, const BoxFrame& box, const kin::PersonLabel&
         Badge badge{hiddenMark(box, label.living), hiddenSentence(box, label.living)};
         badge.x = right - badge.width();
         right = badge.x - kBadgeInset / 2;
+        if (box.text != nullptr) box.text->add(kBadgeSize);
         appendBadge(svg, box, badge, theme);
     }
     if (box.repeatNumber > 0) {
         Badge badge{"=" + std::to_string(box.repeatNumber), repeatSentence(box), true};
         badge.x = isWide(box) ? right - badge.width() : kBadgeInset;
+        if (box.text != nullptr) box.text->add(kBadgeSize);
         appendBadge(svg, box, badge, theme);
     }
 }
@@ -280,6 +329,7 @@ void appendMarks(std::string& svg, const BoxFrame& box, MarkPlace place, const D
     for (const BoxMark& mark : box.marks) {
         if (mark.place != place) continue;
         badges.push_back({mark.text, mark.title, true});
+        if (box.text != nullptr) box.text->add(kBadgeSize);
         width += badges.back().width() + (badges.size() > 1 ? kBadgeInset / 2 : 0);
     }
     double x = (box.width - width) / 2;
@@ -381,7 +431,7 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     const kin::PersonLabel shown = shownLabel(label);
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
-    appendSilhouette(svg, box, shown.sex, theme);
+    if (!isForPaper(box)) appendSilhouette(svg, box, shown.sex, theme);
     appendTexts(svg, box, shown, theme);
     appendBadges(svg, box, label, theme);
     appendMarks(svg, box, theme);

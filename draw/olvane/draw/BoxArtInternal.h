@@ -30,6 +30,8 @@ struct BoxFrame {
     int repeatCount = 0;
     bool countsHidden = false;  // the box's numbers of hidden relatives are known
     std::span<const BoxMark> marks;
+    double leastName = 0;       // DrawingOptions::leastNameSize
+    TextSizes* text = nullptr;  // takes the sizes of what is written
 
     int hiddenCount() const { return box->hiddenParents + box->hiddenPartners + box->hiddenChildren; }
     bool hasHidden() const { return box->hasFlag ? box->flag : hiddenCount() > 0; }

@@ -317,6 +317,11 @@ private:
     void appendLine(const std::string& text, bool bold, double size, double x, double y, double turn,
                     const char* anchor) {
         if (text.empty()) return;
+        if (bold) {
+            svg_.text.addName(size);
+        } else {
+            svg_.text.add(size);
+        }
         const std::string transform =
             turn == 0 ? std::string() : " transform=\"rotate(" + px(turn) + " " + px(x) + " " + px(y) + ")\"";
         svg_.svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\" dy=\"" + px(size * 0.36) +
@@ -330,6 +335,7 @@ private:
     // Whose line each colour is.
     std::string legendText() {
         if (lines_.empty()) return std::string();
+        svg_.text.add(kLegendSize);
         std::string legend = "<g>\n<title>Legend</title>\n";
         const int top = svg_.height - kMargin + 12;
         double widest = 0;

@@ -161,6 +161,7 @@ private:
         const double x = (frame_.x(line.x1) + frame_.x(line.x2)) / 2 + (isFlat ? 0 : kLabelLift);
         const double y =
             (frame_.y(line.y1) + frame_.y(line.y2)) / 2 - (isFlat ? kLabelLift : -kLabelSize / 3);
+        svg_.text.add(kLabelSize);
         svg_.svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\"" +
                     (isFlat ? " text-anchor=\"middle\"" : "") + " font-size=\"" + px(kLabelSize) +
                     "\" fill=\"" + std::string(options_.theme->quietText) + "\" stroke=\"" +

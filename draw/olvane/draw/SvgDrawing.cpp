@@ -110,6 +110,7 @@ public:
         SvgPicture lines;
         const LineStylesUsed styles = appendLines(lines, content_, options_, frame_);
         picture_.lines = std::move(lines.lines);
+        picture_.text = lines.text;
         const std::string legend = legendFor(styles);
         openPage(picture_, options_);
         for (PictureBox& stroke : lines.strokes) stroke.start += picture_.svg.size();
@@ -154,6 +155,8 @@ private:
             frame.isFocus = picture.focus == static_cast<picture::Index>(i);
             addKinship(frame, static_cast<picture::Index>(i));
             frame.marks = marks[i];
+            frame.leastName = options_.leastNameSize;
+            frame.text = &picture_.text;
             appendBox(frame);
         }
     }
@@ -245,6 +248,7 @@ private:
     std::string legendFor(const LineStylesUsed& styles) {
         const std::vector<LegendRow> rows = legendRows(styles);
         if (rows.empty()) return std::string();
+        picture_.text.add(kLegendSize);
         std::string legend = "<g>\n<title>Legend</title>\n";
         double width = kLegendWidth;
         int number = 0;
@@ -294,9 +298,11 @@ void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
 void openPage(SvgPicture& picture, const DrawingOptions& options) {
     const std::string width = std::to_string(picture.width);
     const std::string height = std::to_string(picture.height);
+    const std::string widthDrawn = options.scale == 1 ? width : px(picture.width * options.scale);
+    const std::string heightDrawn = options.scale == 1 ? height : px(picture.height * options.scale);
     picture.svg +=
         "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
-        width + "\" height=\"" + height + "\" viewBox=\"0 0 " + width + " " + height +
+        widthDrawn + "\" height=\"" + heightDrawn + "\" viewBox=\"0 0 " + width + " " + height +
         "\" role=\"group\" aria-label=\"" + escaped(cutText(options.title)) + "\">\n<title>" +
         escaped(cutText(options.title)) + "</title>\n";
     appendBoxDefinitions(picture.svg);

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include <olvane/draw/DrawingTheme.h>
+#include <olvane/draw/PictureArea.h>
 #include <olvane/kin/PersonLabel.h>
 #include <olvane/picture/Picture.h>
 
@@ -36,14 +37,11 @@ struct DrawingOptions {
     std::string title = "Family tree";
     // Sets the title above the picture as well.
     bool headline = false;
-};
-
-// A place in a picture, in px.
-struct PictureArea {
-    double x = 0;
-    double y = 0;
-    double width = 0;
-    double height = 0;
+    // Names in boxes are set no smaller than this, in px, as far as the boxes allow; then they take the whole box, and
+    // silhouettes are left out. 0 for the usual sizes. A round chart sets names as its cells allow.
+    double leastNameSize = 0;
+    // The size of the picture, by the size that it has at 96 px an inch.
+    double scale = 1;
 };
 
 // An element of a picture, a box or the lines of a family: where it is seen, and which bytes draw it.
@@ -53,9 +51,23 @@ struct PictureBox {
     std::size_t length = 0;
 };
 
+// How large the letters of a picture are, in px; 0 where there are none.
+struct TextSizes {
+    double smallestName = 0;
+    double smallest = 0;  // of names and all else
+
+    void addName(double size) {
+        if (smallestName == 0 || size < smallestName) smallestName = size;
+        add(size);
+    }
+    void add(double size) {
+        if (smallest == 0 || size < smallest) smallest = size;
+    }
+};
+
 // A finished picture.
 //
-// Units: px, two for each point of the picture.
+// Units: px, two for each point of the picture; the scale of the options is not counted in.
 // Holds: strokes, one for each family with lines, and boxes come in the order of the text, all strokes before
 //        the first box; without the bytes of some of them the rest is still a picture.
 struct SvgPicture {
@@ -66,6 +78,7 @@ struct SvgPicture {
     std::vector<PictureBox> strokes;
     std::vector<PictureArea> lines;  // every stroke of a line; those have no width or no height
     PictureArea legend;              // of no size where there is none
+    TextSizes text;
 };
 
 // What a picture is called that nobody gave a title: "Family of Ada Berg" for the view "family".

@@ -15,7 +15,15 @@ namespace olvane::picture {
 
 namespace {
 
-constexpr std::array<double, 4> kNameSizes = {13, 12, 11, 10};
+constexpr int kSizes = 4;
+
+std::array<double, kSizes> sizesOf(const NameRoom& room) {
+    std::array<double, kSizes> sizes{};
+    for (int i = 0; i < kSizes; ++i) {
+        sizes[static_cast<std::size_t>(i)] = room.largest - (room.largest - room.smallest) * i / (kSizes - 1);
+    }
+    return sizes;
+}
 
 struct CharacterRange {
     std::int32_t first;
@@ -78,7 +86,7 @@ public:
 
     // As much as goes in; the surname keeps up to half of the lines.
     FittedName cut(std::string_view given, std::string_view surname) const {
-        const double size = kNameSizes.back();
+        const double size = room_.smallest;
         const Font font{size, true};
         const std::size_t most = linesOf(size);
         if (most == 1 && !given.empty() && !surname.empty()) return cutToOneLine(given, surname, font);
@@ -120,11 +128,11 @@ private:
 FittedName fitName(std::string_view given, std::string_view surname, bool surnameFirst,
                    const NameRoom& room) {
     const NameFitter fitter(surnameFirst, room);
-    for (const double size : kNameSizes) {
+    for (const double size : sizesOf(room)) {
         if (auto name = fitter.whole(given, surname, size)) return *name;
     }
     const std::string initials = withInitials(given);
-    for (const double size : kNameSizes) {
+    for (const double size : sizesOf(room)) {
         if (auto name = fitter.whole(initials, surname, size)) return *name;
     }
     return fitter.cut(initials, surname);

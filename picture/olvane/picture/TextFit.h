@@ -35,6 +35,9 @@ struct NameRoom {
     double height = 0;
     double gap = 3;
     std::size_t mostLines = 4;
+    // Four sizes are tried, from the largest down to the smallest.
+    double largest = 13;
+    double smallest = 10;
 };
 
 struct FittedName {

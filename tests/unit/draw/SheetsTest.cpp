@@ -8,8 +8,9 @@
 
 #include <string>
 #include <utility>
+#include <vector>
 
-#include <olvane/draw/PageSplit.h>
+#include <olvane/draw/Sheets.h>
 
 namespace olvane::draw {
 namespace {
@@ -27,35 +28,36 @@ SvgPicture pictureOf(int width, int height) {
     return picture;
 }
 
-const Paper kA4 = *paperOfName("A4");
-
-TEST(PageSplit, paperIsFoundByName) {
-    EXPECT_EQ(paperOfName("A3")->width, 297);
-    EXPECT_EQ(paperOfName("letter")->height, 279.4);
-    EXPECT_FALSE(paperOfName("a4").has_value());
+std::vector<SvgPicture> sheetsAt(const SvgPicture& picture, double scale, const std::string& title = "") {
+    SheetRequest request;
+    request.paper = *paperOf("A4");
+    request.scale = scale * kMillimetresOfPx;
+    return drawSheets(picture, request, title).sheets;
 }
 
-TEST(PageSplit, smallPictureTakesOneUprightSheetWithoutMarks) {
-    const auto sheets = splitPages(pictureOf(400, 500), kA4, "Bergs");
+TEST(Sheets, onePictureOnOneSheetHasNoMarks) {
+    const auto sheets = sheetsAt(pictureOf(400, 500), 0, "Bergs");
     ASSERT_EQ(sheets.size(), 1u);
     EXPECT_THAT(sheets[0].svg, HasSubstr("width=\"210mm\" height=\"297mm\""));
     EXPECT_THAT(sheets[0].svg, Not(HasSubstr("stroke-dasharray")));
     EXPECT_THAT(sheets[0].svg, Not(HasSubstr("row 1")));
+    EXPECT_THAT(sheets[0].svg, Not(HasSubstr("Map of the sheets")));
 }
 
-TEST(PageSplit, widePictureTurnsThePaper) {
-    const auto sheets = splitPages(pictureOf(1000, 400), kA4, "Bergs");
+// 190 mm of room are 718.1 px: a picture of 400 by 400 px is 1.795 times as large, and in the middle of 277 mm.
+TEST(Sheets, onePictureStandsInTheMiddle) {
+    const auto sheets = sheetsAt(pictureOf(400, 400), 0);
+    EXPECT_THAT(sheets[0].svg, HasSubstr("viewBox=\"0 -91.6 400 583.2\""));
+}
+
+TEST(Sheets, widePictureTurnsThePaper) {
+    const auto sheets = sheetsAt(pictureOf(1000, 400), 0);
     ASSERT_EQ(sheets.size(), 1u);
     EXPECT_THAT(sheets[0].svg, HasSubstr("width=\"297mm\" height=\"210mm\""));
 }
 
-TEST(PageSplit, pictureThatNearlyFitsIsMadeSmaller) {
-    EXPECT_EQ(splitPages(pictureOf(2000, 1000), kA4, "").size(), 1u);
-    EXPECT_GT(splitPages(pictureOf(2200, 1400), kA4, "").size(), 1u);
-}
-
-TEST(PageSplit, largePictureIsSplitRowByRowWithItsPlacePrintedOnEachSheet) {
-    const auto sheets = splitPages(pictureOf(3000, 3000), kA4, "Bergs");
+TEST(Sheets, largePictureIsSplitRowByRowWithItsPlaceOnEachSheet) {
+    const auto sheets = sheetsAt(pictureOf(3000, 3000), 1, "Bergs");
     ASSERT_GT(sheets.size(), 4u);
     EXPECT_THAT(sheets[0].svg, HasSubstr("row 1 of "));
     EXPECT_THAT(sheets[0].svg, HasSubstr("column 1 of "));
@@ -63,8 +65,49 @@ TEST(PageSplit, largePictureIsSplitRowByRowWithItsPlacePrintedOnEachSheet) {
     EXPECT_THAT(sheets.back().svg, HasSubstr(">Bergs</text>"));
 }
 
-TEST(PageSplit, innerSheetHasASeamTowardsEachNeighbour) {
-    const auto sheets = splitPages(pictureOf(10000, 500), kA4, "");
+TEST(Sheets, theFirstHasAMapAndTheOthersHaveNone) {
+    SvgPicture picture = pictureOf(3000, 3000);
+    picture.lines = {{0, 1000, 3000, 0}};
+    picture.boxes = {{{10, 900, 100, 100}, 0, 0}};
+    picture.svg = "<svg></svg>";
+    const auto sheets = sheetsAt(picture, 1);
+    EXPECT_THAT(sheets[0].svg, HasSubstr("Map of the sheets"));
+    for (std::size_t i = 1; i < sheets.size(); ++i)
+        EXPECT_THAT(sheets[i].svg, Not(HasSubstr("Map of the sheets")));
+}
+
+// A picture that fills the first sheet is moved down, so that the map lies on nothing.
+TEST(Sheets, theMapStandsAboveAPictureWithoutRoom) {
+    const SvgPicture picture = pictureOf(3000, 3000);  // its one line covers everything
+    SheetRequest request;
+    request.paper = *paperOf("A4");
+    request.scale = kMillimetresOfPx;
+    const SheetDrawing drawing = drawSheets(picture, request, "");
+    EXPECT_LT(drawing.plan.sheets[0].window.y, -10);
+    EXPECT_THAT(drawing.sheets[0].svg, HasSubstr("Map of the sheets"));
+}
+
+TEST(Sheets, marginsSayWhatFollowsAndWhereALineGoesOn) {
+    SvgPicture picture = pictureOf(1300, 400);
+    picture.lines = {{0, 100, 1300, 0}};
+    SheetRequest request;
+    request.paper = {210, 297, false};
+    request.columns = 2;
+    const SheetDrawing drawing = drawSheets(picture, request, "");
+    ASSERT_EQ(drawing.sheets.size(), 2u);
+    EXPECT_THAT(drawing.sheets[0].svg, HasSubstr(">to sheet 2</text>"));
+    EXPECT_THAT(drawing.sheets[1].svg, HasSubstr(">to sheet 1</text>"));
+    const auto triangles = [](const std::string& svg) {
+        std::size_t count = 0;
+        for (auto at = svg.find("z\"/>\n"); at != std::string::npos; at = svg.find("z\"/>\n", at + 1))
+            ++count;
+        return count;
+    };
+    EXPECT_EQ(triangles(drawing.sheets[1].svg), 1u);
+}
+
+TEST(Sheets, innerSheetHasASeamTowardsEachNeighbour) {
+    const auto sheets = sheetsAt(pictureOf(10000, 500), 1);
     ASSERT_GT(sheets.size(), 2u);
     const auto seams = [](const std::string& svg) {
         std::size_t count = 0;
@@ -88,8 +131,8 @@ std::pair<double, double> windowOf(const std::string& svg) {
     return {x, std::stod(numbers.substr(width))};
 }
 
-TEST(PageSplit, neighboursShareAStripAndTheLastReachesTheEnd) {
-    const auto sheets = splitPages(pictureOf(10000, 500), kA4, "");
+TEST(Sheets, neighboursShareAStripAndTheLastReachesTheEnd) {
+    const auto sheets = sheetsAt(pictureOf(10000, 500), 1);
     for (std::size_t i = 1; i < sheets.size(); ++i) {
         const auto [before, width] = windowOf(sheets[i - 1].svg);
         const auto [start, ignored] = windowOf(sheets[i].svg);
@@ -100,38 +143,38 @@ TEST(PageSplit, neighboursShareAStripAndTheLastReachesTheEnd) {
     EXPECT_LT(start, 10000);
 }
 
-TEST(PageSplit, blankSheetsAreLeftOut) {
+TEST(Sheets, blankSheetsAreLeftOut) {
     SvgPicture picture = pictureOf(10000, 500);
     picture.lines = {{0, 100, 200, 0}, {9000, 100, 200, 0}};
-    const auto sheets = splitPages(picture, kA4, "");
+    const auto sheets = sheetsAt(picture, 1);
     ASSERT_EQ(sheets.size(), 2u);
     EXPECT_THAT(sheets[0].svg, HasSubstr("column 1 of "));
     EXPECT_THAT(sheets[1].svg, Not(HasSubstr("column 2 of ")));
 }
 
-TEST(PageSplit, sheetHoldsOnlyTheBoxesThatItShows) {
+TEST(Sheets, sheetHoldsOnlyTheBoxesThatItShows) {
     SvgPicture picture = pictureOf(10000, 500);
     picture.svg = "<svg>[left][right]</svg>";
     picture.boxes = {{{10, 10, 100, 100}, 5, 6}, {{9900, 10, 50, 100}, 11, 7}};
-    const auto sheets = splitPages(picture, kA4, "");
+    const auto sheets = sheetsAt(picture, 1);
     EXPECT_THAT(sheets.front().svg, HasSubstr("<svg>[left]</svg>"));
     EXPECT_THAT(sheets.back().svg, HasSubstr("<svg>[right]</svg>"));
 }
 
-TEST(PageSplit, sheetHoldsOnlyTheStrokesThatItShows) {
+TEST(Sheets, sheetHoldsOnlyTheStrokesThatItShows) {
     SvgPicture picture = pictureOf(10000, 500);
     picture.svg = "<svg>{M1}{M2}{M3}[right]</svg>";
     picture.strokes = {{{10, 10, 100, 0}, 5, 4}, {{0, 20, 10000, 0}, 9, 4}, {{9900, 10, 0, 50}, 13, 4}};
     picture.boxes = {{{9900, 60, 50, 100}, 17, 7}};
-    const auto sheets = splitPages(picture, kA4, "");
+    const auto sheets = sheetsAt(picture, 1);
     ASSERT_GT(sheets.size(), 2u);
     EXPECT_THAT(sheets.front().svg, HasSubstr("<svg>{M1}{M2}</svg>"));
     EXPECT_THAT(sheets[1].svg, HasSubstr("<svg>{M2}</svg>"));
     EXPECT_THAT(sheets.back().svg, HasSubstr("<svg>{M2}{M3}[right]</svg>"));
 }
 
-TEST(PageSplit, titleIsText) {
-    const auto sheets = splitPages(pictureOf(10000, 500), kA4, "<script>");
+TEST(Sheets, titleIsText) {
+    const auto sheets = sheetsAt(pictureOf(10000, 500), 1, "<script>");
     EXPECT_THAT(sheets[0].svg, Not(HasSubstr("<script")));
 }
 

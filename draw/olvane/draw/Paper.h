@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+namespace olvane::draw {
+
+// A sheet of paper, in millimetres. Paper with a name may lie upright or across; a size in numbers is used as it is.
+struct Paper {
+    double width = 210;
+    double height = 297;
+    bool mayTurn = true;
+
+    Paper turned() const { return {height, width, mayTurn}; }
+};
+
+// "A4" to "A0", "letter", or a width and a height in millimetres, such as "914x1500"; at least 50 and at most 20,000
+// each. Nothing for any other text.
+std::optional<Paper> paperOf(std::string_view text);
+
+}  // namespace olvane::draw
