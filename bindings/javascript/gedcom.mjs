@@ -149,6 +149,23 @@ export class GedcomFile {
         return { ...detailsFrom(details), facts: facts.map(detailedFactFrom) };
     }
 
+    kinship(a, b, language = "en") {
+        const [text, ways] = this.#instance.withText(String(language), (pointer) =>
+            this.#answer("gedcom_kinship", this.#person(a), this.#person(b), pointer),
+        );
+        return { text, ways: ways.map(([sort, words, persons]) => ({ sort, text: words, persons })) };
+    }
+
+    kinshipWords(focus, persons, language = "en") {
+        const ids = Uint32Array.from(persons, (person) => this.#person(person));
+        const texts = this.#instance.withText(String(language), (pointer) =>
+            this.#instance.withBytes(new Uint8Array(ids.buffer), (list) =>
+                this.#answer("gedcom_kinship_words", this.#person(focus), list, ids.length, pointer),
+            ),
+        );
+        return Array.from(ids, (_, i) => ({ text: texts[2 * i], short: texts[2 * i + 1] }));
+    }
+
     layout(focus, options = undefined) {
         return this.#run(focus, options, "records").records;
     }
@@ -188,6 +205,11 @@ export class GedcomFile {
         } finally {
             exports.map_free(map);
         }
+    }
+
+    #person(id) {
+        if (this.persons[id - 1] === undefined) throw new RangeError(`${this.name}: there is no person ${String(id)}`);
+        return id;
     }
 
     #refuse() {

@@ -450,6 +450,30 @@ export interface SearchHit {
     readonly reasons: readonly SearchReason[];
 }
 
+/** How somebody is related to somebody else, in words; both empty where they are not. */
+export interface KinshipWords {
+    /** Without how many ways there are: "uncle (mother's brother)", "wife and first cousin". */
+    readonly text: string;
+    /** The nearest way alone, without the side: "uncle", "wife". */
+    readonly short: string;
+}
+
+/** How two persons are related. */
+export interface Kinship {
+    /** What b is to a: "second cousin, in 3 ways"; empty where they are not related. */
+    readonly text: string;
+    /** Nearest first, of each sort 50 at most. Of those over marriages, the shortest alone. */
+    readonly ways: readonly KinshipWay[];
+}
+
+export interface KinshipWay {
+    /** "legal" has a link by adoption, fostering or the like. */
+    readonly sort: "blood" | "legal" | "marriage";
+    readonly text: string;
+    /** From a to b. */
+    readonly persons: readonly number[];
+}
+
 /** Something wrong or odd in a file. */
 export interface Diagnostic {
     /** From 1; 0 where no line can be named. */
@@ -483,6 +507,13 @@ export class GedcomFile {
     /** Notes, sources, media and links beside facts and names. Throws GedcomError for nobody. */
     detailsOfPerson(id: number): PersonDetails;
     detailsOfFamily(id: number): FamilyDetails;
+    /**
+     * What b is to a, and every way between them. Languages are "en", "de" and "es", with or without a region; English for
+     * others. Throws RangeError for somebody who is not in the file.
+     */
+    kinship(a: number, b: number, language?: string): Kinship;
+    /** What each of the persons is to the focus: many times as fast as kinship of each. */
+    kinshipWords(focus: number, persons: Iterable<number>, language?: string): KinshipWords[];
     /** As Olvane.layout, with the file as the host. Asks for a million relatives at most, and else is tooLarge. */
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;

@@ -3,12 +3,14 @@
 
 #pragma once
 
+#include <exception>
 #include <optional>
 #include <string>
 #include <utility>
 
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/kin/KinGraph.h>
+#include <olvane/kin/Kinship.h>
 #include <olvane/kin/PersonIndex.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
@@ -25,6 +27,11 @@ struct OpenFile {
         return *graph;
     }
 
+    kin::KinshipFinder& kinship() {
+        if (!kinshipFinder) kinshipFinder.emplace(kin());
+        return *kinshipFinder;
+    }
+
     const kin::PersonIndex& index() {
         if (!personIndex) personIndex.emplace(searchTexts);
         return *personIndex;
@@ -34,6 +41,7 @@ struct OpenFile {
     gedcom::GedcomDataSource source;
     gedcom::GedcomSearchTexts searchTexts;
     std::optional<kin::KinGraph> graph;
+    std::optional<kin::KinshipFinder> kinshipFinder;
     std::optional<kin::PersonIndex> personIndex;
 };
 
@@ -42,5 +50,17 @@ constexpr std::size_t kMostRelatives = 1000000;
 
 // What the last call had to say: a table, facts, or why something was refused.
 extern std::string lastText;
+
+// The text that make gives, which lives until the next one; or null with the reason in its place.
+template <class Make>
+const char* textOrRefusal(const Make& make) {
+    try {
+        lastText = make();
+        return lastText.c_str();
+    } catch (const std::exception& error) {
+        lastText = error.what();
+        return nullptr;
+    }
+}
 
 }  // namespace olvane::js

@@ -18,7 +18,7 @@ constexpr std::uint64_t kMostWork = 20'000'000;
 
 }  // namespace
 
-std::vector<KinWay> KinWays::list(std::size_t limit) {
+std::vector<KinWay> KinWays::list(std::size_t limit, bool nearestAlone) {
     std::vector<KinWay> ways;
     if (!ancestry_.hasCommon() || ancestry_.spotOfA() == ancestry_.spotOfB()) return ways;
     if (sort_ == WaySort::otherBonds && !ancestry_.hasOtherBonds()) return ways;
@@ -40,7 +40,7 @@ std::vector<KinWay> KinWays::list(std::size_t limit) {
         if (best.length > lastLength || ways.size() >= limit + kMostTies) break;
         if (isWay(states_[at(best.state)]) && best.length == states_[at(best.state)].climbed) {
             ways.push_back(wayOf(best.state));
-            if (ways.size() >= limit) lastLength = best.length;
+            if (nearestAlone || ways.size() >= limit) lastLength = best.length;
         }
         const std::size_t known = heap_.size();
         expand(best.state);

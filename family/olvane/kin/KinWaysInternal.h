@@ -26,7 +26,8 @@ class KinWays {
 public:
     KinWays(const Ancestry& ancestry, WaySort sort) : ancestry_(ancestry), sort_(sort) {}
 
-    std::vector<KinWay> list(std::size_t limit);
+    // The ways up to a length, at least limit of them if there are so many; or the nearest alone.
+    std::vector<KinWay> list(std::size_t limit, bool nearestAlone);
 
 private:
     static constexpr std::int32_t kNone = -1;
@@ -80,7 +81,8 @@ private:
 
 // Lists ways where somebody is their own ancestor and there is no order: partial ways, nearest first, each looked
 // at for persons that come twice. Gives up after a fixed number of partial ways, so more may exist than are listed.
-std::vector<KinWay> listWaysInLoops(const KinLinks& links, Place a, Place b, WaySort sort, std::size_t limit);
+std::vector<KinWay> listWaysInLoops(const KinLinks& links, Place a, Place b, WaySort sort, std::size_t limit,
+                                    bool nearestAlone);
 
 // Whether the way at its top is half: the two children on the way are of blood and have another known parent each.
 bool isHalfWay(const KinLinks& links, const KinWay& way);

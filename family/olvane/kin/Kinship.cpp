@@ -27,47 +27,60 @@ public:
         return KinSums(ancestry_).phi();
     }
 
-    Kinship between(Place a, Place b, std::size_t limit) {
+    Kinship between(Place a, Place b, const KinshipLimits& limits) {
         Kinship kinship;
         kinship.a = a;
         kinship.b = b;
-        findBlood(kinship, limit);
-        findOtherBonds(kinship, limit);
-        MarriageWays marriages = marriages_.find(a, b, limit);
-        kinship.marriage = std::move(marriages.ways);
-        for (MarriageWay& way : kinship.marriage) way.steps = stepsOf(links_, way.persons);
-        kinship.marriageCount = marriages.count;
+        findBlood(kinship, limits);
+        findOtherBonds(kinship, limits);
+        findMarriages(kinship, limits);
         return kinship;
     }
 
 private:
-    void findBlood(Kinship& kinship, std::size_t limit) {
+    void findBlood(Kinship& kinship, const KinshipLimits& limits) {
         ancestry_.gather(kinship.a, kinship.b, Links::blood);
         kinship.bloodLoop = ancestry_.hasLoop();
         if (kinship.bloodLoop) {
-            kinship.blood = listWaysInLoops(links_, kinship.a, kinship.b, WaySort::blood, limit);
+            kinship.blood = listWaysInLoops(links_, kinship.a, kinship.b, WaySort::blood, limits.ways,
+                                            limits.nearestAlone);
         } else {
-            const KinSums sums(ancestry_);
-            kinship.phi = sums.phi();
-            kinship.bloodCount = kinship.a == kinship.b   ? std::optional(std::uint64_t{0})
-                                 : sums.countNeedsPairs() ? countByPairs(ancestry_, false)
-                                                          : sums.count();
-            kinship.blood = KinWays(ancestry_, WaySort::blood).list(limit);
+            if (!limits.nearestAlone) addSums(kinship);
+            kinship.blood = KinWays(ancestry_, WaySort::blood).list(limits.ways, limits.nearestAlone);
         }
         if (!kinship.blood.empty()) kinship.degree = kinship.blood.front().length();
     }
 
-    void findOtherBonds(Kinship& kinship, std::size_t limit) {
+    void addSums(Kinship& kinship) const {
+        const KinSums sums(ancestry_);
+        kinship.phi = sums.phi();
+        kinship.bloodCount = kinship.a == kinship.b   ? std::optional(std::uint64_t{0})
+                             : sums.countNeedsPairs() ? countByPairs(ancestry_, false)
+                                                      : sums.count();
+    }
+
+    void findOtherBonds(Kinship& kinship, const KinshipLimits& limits) {
         ancestry_.gather(kinship.a, kinship.b, Links::all);
         kinship.legalLoop = ancestry_.hasLoop();
         if (kinship.legalLoop) {
-            kinship.legal = listWaysInLoops(links_, kinship.a, kinship.b, WaySort::otherBonds, limit);
+            kinship.legal = listWaysInLoops(links_, kinship.a, kinship.b, WaySort::otherBonds, limits.ways,
+                                            limits.nearestAlone);
             return;
         }
-        kinship.legalCount = 0;
+        if (!limits.nearestAlone) kinship.legalCount = 0;
         if (kinship.a == kinship.b || !ancestry_.hasCommon() || !ancestry_.hasOtherBonds()) return;
-        kinship.legalCount = countByPairs(ancestry_, true);
-        kinship.legal = KinWays(ancestry_, WaySort::otherBonds).list(limit);
+        if (!limits.nearestAlone) kinship.legalCount = countByPairs(ancestry_, true);
+        kinship.legal = KinWays(ancestry_, WaySort::otherBonds).list(limits.ways, limits.nearestAlone);
+    }
+
+    void findMarriages(Kinship& kinship, const KinshipLimits& limits) {
+        const bool isRelated = !kinship.blood.empty() || !kinship.legal.empty();
+        const auto reach = limits.nearestAlone && isRelated ? MarriageReach::shortestWay : MarriageReach::anyWay;
+        MarriageWays marriages =
+            marriages_.find(kinship.a, kinship.b, limits.nearestAlone ? 1 : limits.ways, reach);
+        kinship.marriage = std::move(marriages.ways);
+        for (MarriageWay& way : kinship.marriage) way.steps = stepsOf(links_, way.persons);
+        if (!limits.nearestAlone) kinship.marriageCount = marriages.count;
     }
 
     KinLinks links_;
@@ -87,7 +100,7 @@ void KinshipFinder::check(Place person) const {
 Kinship KinshipFinder::between(Place a, Place b, const KinshipLimits& limits) {
     check(a);
     check(b);
-    return search_->between(a, b, std::max<std::size_t>(limits.ways, 1));
+    return search_->between(a, b, {std::max<std::size_t>(limits.ways, 1), limits.nearestAlone});
 }
 
 std::optional<double> KinshipFinder::coefficient(Place a, Place b) {

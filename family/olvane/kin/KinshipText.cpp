@@ -89,6 +89,11 @@ std::string specialText(const KinGraph& graph, const std::vector<KinStep>& steps
     return isStepsibling ? words.inLaw(InLaw::stepsibling, sex).plain : "";
 }
 
+// Whether a way over marriages has a word of its own: that of a spouse, a relative in law or a step relative.
+bool hasOwnWord(const KinGraph& graph, const std::vector<KinStep>& steps, const KinshipWords& words) {
+    return steps.size() == 1 || !specialText(graph, steps, words).empty();
+}
+
 // All nearest ways that have the same words but for the side: two of them by different sides name neither.
 BloodWords nearestWords(const KinGraph& graph, const std::vector<KinWay>& ways) {
     BloodWords words = wordsOf(graph, ways.front());
@@ -123,6 +128,24 @@ int lengthOf(const std::vector<KinWay>& ways) {
     return ways.empty() ? std::numeric_limits<int>::max() : ways.front().length();
 }
 
+// Whether the nearest way over marriages is said: where it is all there is, or nearer than any other and has a word.
+bool namesMarriage(const KinGraph& graph, const Kinship& kinship, const KinshipWords& words) {
+    if (kinship.marriage.empty()) return false;
+    if (kinship.blood.empty() && kinship.legal.empty()) return true;
+    const MarriageWay& way = kinship.marriage.front();
+    return way.links() < std::min(lengthOf(kinship.blood), lengthOf(kinship.legal)) &&
+           hasOwnWord(graph, way.steps, words);
+}
+
+std::string shortText(const KinGraph& graph, const MarriageWay& way, Language language) {
+    const KinshipWords& words = kinshipWords(language);
+    const bool isInLaw = way.steps.size() == 2 && !specialText(graph, way.steps, words).empty();
+    const auto isSibling = [](const KinStep& step) { return !step.isCouple && step.up == 1 && step.down == 1; };
+    if (isInLaw && std::any_of(way.steps.begin(), way.steps.end(), isSibling))
+        return words.inLaw(InLaw::sibling, graph.sex(way.steps.back().to)).plain;
+    return wayText(graph, way, language);
+}
+
 }  // namespace
 
 std::string wayText(const KinGraph& graph, const KinWay& way, Language language) {
@@ -146,12 +169,19 @@ std::string kinshipText(const KinGraph& graph, const Kinship& kinship, Language 
     const auto add = [&text, &words](const std::string& more) {
         text = text.empty() ? more : words.both(text, more);
     };
-    const bool isMarriageNearest =
-        !kinship.marriage.empty() && kinship.marriage.front().links() < std::min(blood, legal);
-    if (isMarriageNearest) add(wayText(graph, kinship.marriage.front(), language));
+    if (namesMarriage(graph, kinship, words)) add(wayText(graph, kinship.marriage.front(), language));
     if (legal < blood) add(textOfWays(graph, kinship.legal, kinship.legalCount, words));
     if (!kinship.blood.empty()) add(textOfWays(graph, kinship.blood, kinship.bloodCount, words));
     return text;
+}
+
+std::string shortKinshipText(const KinGraph& graph, const Kinship& kinship, Language language) {
+    const KinshipWords& words = kinshipWords(language);
+    if (kinship.a == kinship.b) return words.self();
+    if (!kinship.isRelated()) return "";
+    if (namesMarriage(graph, kinship, words)) return shortText(graph, kinship.marriage.front(), language);
+    const bool isLegal = lengthOf(kinship.legal) < lengthOf(kinship.blood);
+    return words.relative(nearestWords(graph, isLegal ? kinship.legal : kinship.blood)).plain;
 }
 
 }  // namespace olvane::kin

@@ -12,9 +12,14 @@
 namespace olvane::kin {
 
 // What B is to A, in words: "second cousin once removed", "half sister", "wife and first cousin, in 2 ways".
-// A near relation over marriages comes before a farther one by blood; an adoptive one is named as such.
+// A spouse, a relative in law or a step relative who is a farther relative by blood, too, is named as both; other ways
+// over marriages are named where there is none by blood. An adoptive relation is named as such.
 // Empty where there is no way at all.
 OLVANE_API std::string kinshipText(const KinGraph& graph, const Kinship& kinship, Language language);
+
+// The nearest way alone, for where there is little room: without the side, the number of ways and explanations: "uncle",
+// "sister-in-law", "wife".
+OLVANE_API std::string shortKinshipText(const KinGraph& graph, const Kinship& kinship, Language language);
 
 // What B is to A by this way alone: "great-uncle (mother's side)".
 OLVANE_API std::string wayText(const KinGraph& graph, const KinWay& way, Language language);

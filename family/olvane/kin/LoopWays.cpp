@@ -28,7 +28,7 @@ public:
     LoopSearch(const KinLinks& links, Place a, Place b, WaySort sort)
         : links_(links), a_(a), b_(b), sort_(sort) {}
 
-    std::vector<KinWay> list(std::size_t limit) {
+    std::vector<KinWay> list(std::size_t limit, bool nearestAlone) {
         findDistances();
         std::vector<KinWay> ways;
         if (a_ == b_) return ways;
@@ -40,7 +40,7 @@ public:
             if ((lastLength >= 0 && length > lastLength) || ways.size() >= limit + kMostTies) break;
             if (partial_[index].person == b_) {
                 addWay(index, ways);
-                if (ways.size() >= limit) lastLength = length;
+                if (!ways.empty() && (nearestAlone || ways.size() >= limit)) lastLength = length;
             } else {
                 extend(index);
             }
@@ -206,9 +206,9 @@ private:
 
 }  // namespace
 
-std::vector<KinWay> listWaysInLoops(const KinLinks& links, Place a, Place b, WaySort sort,
-                                    std::size_t limit) {
-    return LoopSearch(links, a, b, sort).list(limit);
+std::vector<KinWay> listWaysInLoops(const KinLinks& links, Place a, Place b, WaySort sort, std::size_t limit,
+                                    bool nearestAlone) {
+    return LoopSearch(links, a, b, sort).list(limit, nearestAlone);
 }
 
 }  // namespace olvane::kin

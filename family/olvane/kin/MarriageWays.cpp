@@ -40,13 +40,14 @@ MarriageSearch::MarriageSearch(const KinLinks& links) : links_(links) {
     indexInLayer_.assign(persons, 0);
 }
 
-MarriageWays MarriageSearch::find(Place a, Place b, std::size_t limit) {
+MarriageWays MarriageSearch::find(Place a, Place b, std::size_t limit, MarriageReach reach) {
     MarriageWays result;
     if (a == b) return result;
     const std::int32_t total = meet(a, b);
     if (total < 0) return result;
     layShortest(total);
     result.count = countShortest();
+    if (result.count == std::uint64_t{0} && reach == MarriageReach::shortestWay) return result;
     if (result.count == std::uint64_t{0}) return findFartherMarriageWays(links_, a, b, limit);
     listShortest(limit, result.ways);
     return result;

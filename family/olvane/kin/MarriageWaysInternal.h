@@ -32,6 +32,10 @@ std::vector<KinStep> stepsOf(const KinLinks& links, const std::vector<Place>& pe
 // The ways from one side, as said below.
 MarriageWays findFartherMarriageWays(const KinLinks& links, Place a, Place b, std::size_t limit);
 
+// How far a search goes: to ways over marriages, or only to the shortest of all ways, where none may be
+// over a marriage.
+enum class MarriageReach : std::uint8_t { anyWay, shortestWay };
+
 // Finds the shortest ways over partners, parents and children that are more than up to an ancestor and down again.
 //
 // Mostly the two meet midway in a search from both sides (Pohl, "Bi-directional search", 1971), and every shortest
@@ -44,7 +48,7 @@ class MarriageSearch {
 public:
     explicit MarriageSearch(const KinLinks& links);
 
-    MarriageWays find(Place a, Place b, std::size_t limit);
+    MarriageWays find(Place a, Place b, std::size_t limit, MarriageReach reach = MarriageReach::anyWay);
 
 private:
     static constexpr std::size_t kReadingSets = 8;

@@ -5,6 +5,7 @@
 
 #include <olvane/kin/KinSumsInternal.h>
 #include <olvane/kin/Kinship.h>
+#include <olvane/kin/KinshipText.h>
 
 #include <gtest/gtest.h>
 
@@ -164,6 +165,32 @@ TEST(KinshipProperties, aLimitKeepsTheNearestWays) {
             if (nearest.size() > 3) nearest.resize(3);
             EXPECT_EQ(text(few.blood), text(nearest)) << text(graph);
             EXPECT_EQ(few.bloodCount, all.bloodCount);
+        }
+    }
+}
+
+// Also in loops and over other bonds; and the words are those of the whole search, without how many ways there are.
+TEST(KinshipProperties, theNearestAloneAreTheNearestOfAllAndHaveTheSameWords) {
+    const auto nearest = [](std::vector<KinWay> ways) {
+        while (!ways.empty() && ways.back().length() > ways.front().length()) ways.pop_back();
+        return ways;
+    };
+    std::mt19937 random(7);
+    for (int run = 0; run < runs(); ++run) {
+        const KinGraph graph = randomGraph(random, {10, run % 4 == 0, run % 2 == 0});
+        KinshipFinder finder(graph);
+        for (Place b = 0; b < graph.personCount(); ++b) {
+            Kinship all = finder.between(9, b, {2000});
+            const Kinship few = finder.between(9, b, {2000, true});
+            EXPECT_EQ(text(few.blood), text(nearest(all.blood))) << text(graph);
+            EXPECT_EQ(text(few.legal), text(nearest(all.legal))) << text(graph);
+            EXPECT_EQ(few.degree, all.degree);
+            EXPECT_FALSE(few.bloodCount || few.legalCount || few.marriageCount || few.phi);
+            all.bloodCount = all.legalCount = std::nullopt;
+            EXPECT_EQ(kinshipText(graph, few, Language::english), kinshipText(graph, all, Language::english))
+                << text(graph);
+            EXPECT_EQ(shortKinshipText(graph, few, Language::german),
+                      shortKinshipText(graph, all, Language::german));
         }
     }
 }

@@ -155,6 +155,48 @@ TEST(KinshipText, aWifeWhoIsACousinIsBoth) {
     expectRows(family, "George", {{"Emma", "mother, in 2 ways", "Mutter, auf 2 Wegen", "madre, por 2 vías"}});
 }
 
+// Words with and without the side; ways over several marriages are not said beside one by blood.
+TEST(KinshipText, aCousinIsNoMoreThanThatByMarriagesFarOff) {
+    const KinFamily family{"Urban + Ursula: Georg.m Gustav.m",
+                           "Georg + Gerda: Victor.m",
+                           "Gustav + Gisela: Konrad.m",
+                           "Victor + Vera: Fritz.m Franz.m",
+                           "Konrad + Karla: Lukas.m",
+                           "Ludwig + Luise: Lena.f Lotte.f",
+                           "Franz + Lena",
+                           "Lukas + Laura: Moritz.m",
+                           "Moritz + Lotte"};
+    KinshipFinder finder(family.graph());
+    const Kinship found = finder.between(family["Fritz"], family["Moritz"]);
+    ASSERT_FALSE(found.marriage.empty());
+    ASSERT_LT(found.marriage.front().links(), found.blood.front().length());
+    EXPECT_EQ(kinshipText(family.graph(), found, Language::english), "second cousin once removed");
+}
+
+TEST(KinshipText, whereThereIsLittleRoomTheNearestWayStandsAlone) {
+    const KinFamily family{"Hugo + Helga: Max.m Mona.f",  "Walter + Wanda: Eva.f Erika.f",
+                           "Max + Eva: Sven.m",           "Mona.f + Moritz.m",
+                           "Karl + Kira: Hugo.m Kurt.m",  "Kurt + Kora: Kim.x",
+                           "Josiah + Sarah: Susannah.f Jos.m", "Robert + Susannah: Charles.m",
+                           "Jos + Bessy: Emma.f",         "Charles + Emma: George.m",
+                           "Ida ~ Oskar.m"};
+    KinshipFinder finder(family.graph());
+    const auto words = [&](const char* from, const char* to, Language language) {
+        return shortKinshipText(family.graph(), finder.between(family[from], family[to]), language);
+    };
+    EXPECT_EQ(words("Max", "Erika", Language::english), "sister-in-law");
+    EXPECT_EQ(words("Max", "Erika", Language::german), "Schwägerin");
+    EXPECT_EQ(words("Max", "Erika", Language::spanish), "cuñada");
+    EXPECT_EQ(words("Max", "Walter", Language::english), "father-in-law");
+    EXPECT_EQ(words("Sven", "Mona", Language::english), "aunt");
+    EXPECT_EQ(words("Sven", "Hugo", Language::german), "Großvater");
+    EXPECT_EQ(words("Max", "Kora", Language::english), "wife of an uncle");
+    EXPECT_EQ(words("Charles", "Emma", Language::english), "wife");
+    EXPECT_EQ(words("George", "Emma", Language::english), "mother");
+    EXPECT_EQ(words("Max", "Max", Language::english), "the same person");
+    EXPECT_EQ(words("Ida", "Max", Language::english), "");
+}
+
 TEST(KinshipText, adoptionAndFosteringAreNamed) {
     const KinFamily family{"Bruno + Birte: Finn.m Fee.f", "Anselm + Agnes: Finn(adopted) Alma.f",
                            "Pelle + Petra: Finn(foster) Piet.m", "Alois + Amalie: Anselm.m Arno.m"};
