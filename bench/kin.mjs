@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// node kin.mjs OLVANE.WASM FILE...: how long searches take in the module, as bench_search prints it for the library. A
-// search's time is the least of five.
+// node kin.mjs OLVANE.WASM FILE...: how long searches take in the module, as bench_search prints it for the library, and
+// what it takes to say how everybody in the family views of 80 persons is related to the focus. A time is the least of
+// five.
 
 import { readFile } from "node:fs/promises";
 
@@ -59,8 +60,24 @@ function measureSearch(path, file) {
     row("", "worst", "", worst, "ms");
 }
 
+function measureKinship(path, file) {
+    const times = [];
+    const step = Math.max(1, Math.floor(file.persons.length / 80));
+    for (let focus = 1; focus <= file.persons.length; focus += step) {
+        const persons = [...new Set(file.picture(focus).boxes.map(({ id }) => id))].filter((id) => id > 0);
+        let least = Infinity;
+        for (let round = 0; round < kRounds; ++round)
+            least = Math.min(least, milliseconds(() => file.kinshipWords(focus, persons))[0]);
+        times.push([least, persons.length]);
+    }
+    times.sort(([one], [other]) => one - other);
+    row(path, "kinship of all boxes", "median", times[times.length >> 1][0], "ms");
+    row("", "", "worst", times.at(-1)[0], "ms", `${times.at(-1)[1]} persons`);
+}
+
 for (const path of paths) {
     const file = olvane.readGedcom(await readFile(path), path);
     measureSearch(path, file);
+    measureKinship(path, file);
     file.close();
 }

@@ -3,14 +3,16 @@
 
 import assert from "node:assert/strict";
 import { test } from "node:test";
-import { english, factLabel, german, messagesFor } from "../src/messages";
+import { english, factLabel, german, messagesFor, spanish } from "../src/messages";
 import { dateText, directionOf, nameOf, yearsOf } from "../src/messages/names";
-import { date, person } from "./families";
+import { date, person } from "./persons";
 
 test("a date is written as far as it is known", () => {
     const birth = date(1809, { month: 2, day: 12 });
     assert.equal(dateText(birth, english), "12 February 1809");
     assert.equal(dateText(birth, german), "12. Februar 1809");
+    assert.equal(dateText(birth, spanish), "12 de febrero de 1809");
+    assert.equal(dateText(date(1809, { month: 3, mark: "about" }), spanish), "hacia marzo de 1809");
     assert.equal(dateText(date(1809, { month: 3 }), english), "March 1809");
     assert.equal(dateText(date(1809, { month: 3 }), german), "März 1809");
     assert.equal(dateText(date(1809), german), "1809");

@@ -3,7 +3,6 @@
 
 #pragma once
 
-#include <exception>
 #include <span>
 
 #include <olvane/gedcom/GedcomDate.h>
@@ -19,17 +18,5 @@ void appendDate(JsonText& json, const gedcom::GedcomDate& date);
 
 // 0 where there are none; else in the order of the fields of Details. A quality that is not given is -1.
 void appendDetails(JsonText& json, const gedcom::Details& details);
-
-// What make returns, kept as the last text; or null, with the reason as the last text.
-template <class Make>
-const char* textOrRefusal(const Make& make) {
-    try {
-        lastText = make();
-        return lastText.c_str();
-    } catch (const std::exception& error) {
-        lastText = error.what();
-        return nullptr;
-    }
-}
 
 }  // namespace olvane::js

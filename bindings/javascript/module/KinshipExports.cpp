@@ -48,8 +48,8 @@ void writeWays(JsonText& json, const kin::KinGraph& graph, const std::vector<Way
 }
 
 // Two texts for each person, which say nothing of how many ways there are: the whole one and the short one.
-std::string kinshipWordsJson(OpenFile& file, std::uint32_t focus, const std::uint32_t* persons, std::size_t count,
-                             Language language) {
+std::string kinshipWordsJson(OpenFile& file, std::uint32_t focus, const std::uint32_t* persons,
+                             std::size_t count, Language language) {
     const kin::KinGraph& graph = file.kin();
     JsonText json;
     json.begin();
@@ -88,8 +88,8 @@ using js::OpenFile;
 
 // Of count persons to the focus. Null where somebody is not in the file, and last_text says why.
 OLVANE_EXPORT("gedcom_kinship_words")
-const char* gedcomKinshipWords(OpenFile* file, std::uint32_t focus, const std::uint32_t* persons, std::size_t count,
-                               const char* language) {
+const char* gedcomKinshipWords(OpenFile* file, std::uint32_t focus, const std::uint32_t* persons,
+                               std::size_t count, const char* language) {
     return js::textOrRefusal(
         [&] { return js::kinshipWordsJson(*file, focus, persons, count, js::languageOf(language)); });
 }

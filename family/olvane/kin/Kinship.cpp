@@ -75,7 +75,8 @@ private:
 
     void findMarriages(Kinship& kinship, const KinshipLimits& limits) {
         const bool isRelated = !kinship.blood.empty() || !kinship.legal.empty();
-        const auto reach = limits.nearestAlone && isRelated ? MarriageReach::shortestWay : MarriageReach::anyWay;
+        const auto reach =
+            limits.nearestAlone && isRelated ? MarriageReach::shortestWay : MarriageReach::anyWay;
         MarriageWays marriages =
             marriages_.find(kinship.a, kinship.b, limits.nearestAlone ? 1 : limits.ways, reach);
         kinship.marriage = std::move(marriages.ways);

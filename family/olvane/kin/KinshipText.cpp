@@ -140,7 +140,9 @@ bool namesMarriage(const KinGraph& graph, const Kinship& kinship, const KinshipW
 std::string shortText(const KinGraph& graph, const MarriageWay& way, Language language) {
     const KinshipWords& words = kinshipWords(language);
     const bool isInLaw = way.steps.size() == 2 && !specialText(graph, way.steps, words).empty();
-    const auto isSibling = [](const KinStep& step) { return !step.isCouple && step.up == 1 && step.down == 1; };
+    const auto isSibling = [](const KinStep& step) {
+        return !step.isCouple && step.up == 1 && step.down == 1;
+    };
     if (isInLaw && std::any_of(way.steps.begin(), way.steps.end(), isSibling))
         return words.inLaw(InLaw::sibling, graph.sex(way.steps.back().to)).plain;
     return wayText(graph, way, language);

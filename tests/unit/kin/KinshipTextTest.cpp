@@ -174,11 +174,16 @@ TEST(KinshipText, aCousinIsNoMoreThanThatByMarriagesFarOff) {
 }
 
 TEST(KinshipText, whereThereIsLittleRoomTheNearestWayStandsAlone) {
-    const KinFamily family{"Hugo + Helga: Max.m Mona.f",  "Walter + Wanda: Eva.f Erika.f",
-                           "Max + Eva: Sven.m",           "Mona.f + Moritz.m",
-                           "Karl + Kira: Hugo.m Kurt.m",  "Kurt + Kora: Kim.x",
-                           "Josiah + Sarah: Susannah.f Jos.m", "Robert + Susannah: Charles.m",
-                           "Jos + Bessy: Emma.f",         "Charles + Emma: George.m",
+    const KinFamily family{"Hugo + Helga: Max.m Mona.f",
+                           "Walter + Wanda: Eva.f Erika.f",
+                           "Max + Eva: Sven.m",
+                           "Mona.f + Moritz.m",
+                           "Karl + Kira: Hugo.m Kurt.m",
+                           "Kurt + Kora: Kim.x",
+                           "Josiah + Sarah: Susannah.f Jos.m",
+                           "Robert + Susannah: Charles.m",
+                           "Jos + Bessy: Emma.f",
+                           "Charles + Emma: George.m",
                            "Ida ~ Oskar.m"};
     KinshipFinder finder(family.graph());
     const auto words = [&](const char* from, const char* to, Language language) {

@@ -27,7 +27,8 @@ import type { Box, Picture } from "../view/Picture";
 import { addressOf, kUsualState, readAddress, sameState, type ViewState } from "../view/ViewState";
 import { viewerStyles } from "./styles";
 
-const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture is drawn
+const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture of usual size is drawn
+const kKinshipTime = 12; // ms at a time for finding it out
 const kWarmUps = 8;
 const kWarmUpPause = 120; // ms
 const kWarmEnough = 12; // ms; what takes less needs no warming
@@ -208,7 +209,7 @@ export class OlvaneTree extends HTMLElement {
         this.picture = picture;
         this.tooltip.hide();
         this.contents = this.newContents(opened, picture);
-        this.contents.kinshipKnown = opened.persons.length <= kSoonSearched;
+        if (opened.persons.length <= kSoonSearched) this.contents.learnKinships(kKinshipTime);
         this.scene.show(picture, this.contents, anchor);
         this.overview.show(picture);
         this.nameTree();
@@ -329,6 +330,7 @@ export class OlvaneTree extends HTMLElement {
         const known = this.contents?.kinshipKnown ?? false;
         this.contents = this.newContents(this.opened, this.picture);
         this.contents.kinshipKnown = known;
+        this.learnKinships();
         this.scene.restyle(this.contents);
         this.nameTree();
         this.refreshPanel();
@@ -456,18 +458,21 @@ export class OlvaneTree extends HTMLElement {
         });
     }
 
-    // In a large family the boxes come first; what is written into them of kinship follows when there is time.
+    // In a large family or picture the boxes come first; what is written into them of kinship follows, found out a little
+    // at a time.
     private learnKinships(): void {
         clearTimeout(this.kinshipTimer);
-        if (this.contents?.kinshipKnown) return;
-        this.kinshipTimer = window.setTimeout(() => {
-            if (!this.contents || !this.opened || !this.shownState) return;
+        const { contents, opened } = this;
+        if (!contents || !opened || contents.kinshipKnown) return;
+        const learn = (): void => {
+            if (this.contents !== contents) return;
             const start = performance.now();
-            this.opened.kinshipsTo(this.shownState.focus);
-            this.contents.kinshipKnown = true;
-            this.scene.redraw();
+            const done = contents.learnKinships(kKinshipTime);
             performance.measure("olvane-kinship", { start });
-        }, kKinshipDelay);
+            if (done) this.scene.redraw();
+            else this.kinshipTimer = window.setTimeout(learn);
+        };
+        this.kinshipTimer = window.setTimeout(learn, opened.persons.length <= kSoonSearched ? 0 : kKinshipDelay);
     }
 
     /**

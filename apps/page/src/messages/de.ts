@@ -4,7 +4,6 @@
 // The German table.
 
 import type { DateMark, Messages } from "../messages";
-import { germanKinship } from "./kinship.de";
 
 const kMonths = [
     "Januar",
@@ -28,7 +27,6 @@ function yearText(year: number): string {
 export const german: Messages = {
     language: "de",
     unknownName: "Name unbekannt",
-    kinship: germanKinship,
     dates: {
         day(year: number, month: number, day: number): string {
             const monthText = kMonths[month - 1];

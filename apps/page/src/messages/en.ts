@@ -4,7 +4,6 @@
 // The English table.
 
 import type { DateMark, Messages } from "../messages";
-import { englishKinship } from "./kinship.en";
 
 const kMonths = [
     "January",
@@ -28,7 +27,6 @@ function yearText(year: number): string {
 export const english: Messages = {
     language: "en",
     unknownName: "unknown name",
-    kinship: englishKinship,
     dates: {
         day(year: number, month: number, day: number): string {
             const monthText = kMonths[month - 1];

@@ -5,12 +5,12 @@
 // through a large family must not hold up the picture.
 
 import type { Person } from "olvane";
-import { kinshipText, nearKinshipText } from "../kinship";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../messages/names";
 import type { BoxLook } from "./boxArt";
 import type { BoxContents } from "./Scene";
+import type { KinshipTexts } from "../view/KinshipTexts";
 import type { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
 
@@ -31,20 +31,26 @@ export class PictureContents implements BoxContents {
 
     // Empty where none is known, and for the focus.
     kinshipOf(id: number): string {
-        if (id === this.picture.focus) return "";
-        const kinship = this.family.kinshipsTo(this.picture.focus).get(id);
-        return kinship
-            ? kinshipText(kinship, this.family.person(id)?.sex ?? "other", this.wording.messages)
-            : "";
+        return this.kinships.of(id).text;
     }
 
     // As kinshipOf, without the words that say by which side.
     shortKinshipOf(id: number): string {
-        const kinship =
-            id === this.picture.focus ? undefined : this.family.kinshipsTo(this.picture.focus).get(id);
-        if (!kinship) return "";
-        const sex = this.family.person(id)?.sex ?? "other";
-        return nearKinshipText(kinship, sex, this.wording.messages);
+        return this.kinships.of(id).short;
+    }
+
+    // Finds out what the persons of the picture are to the focus, for so many ms; true where all is known then.
+    learnKinships(time: number): boolean {
+        this.kinshipKnown ||= this.kinships.learn(this.persons(), time);
+        return this.kinshipKnown;
+    }
+
+    private get kinships(): KinshipTexts {
+        return this.family.kinshipsTo(this.picture.focus, this.wording.ui.language);
+    }
+
+    private persons(): number[] {
+        return [...new Set(this.picture.boxes.map((box) => box.person))].filter((person) => person !== 0);
     }
 
     // How many relatives of a box are off the picture: -1 for none, 0 for an unknown number. The pedigree's flags

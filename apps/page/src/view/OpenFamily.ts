@@ -4,16 +4,15 @@
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
 import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
-import { allKinships, type Kinship } from "../kinship";
 import { Photographs } from "../engine/photographs";
+import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
 import { optionsOf, type ViewState } from "./ViewState";
 
 export class OpenFamily {
     readonly persons: readonly Person[];
     readonly families: readonly Family[];
-    private kinships: ReadonlyMap<number, Kinship> | null = null;
-    private kinshipFocus = 0;
+    private kinships: KinshipTexts | null = null;
 
     constructor(
         readonly file: GedcomFile,
@@ -45,13 +44,11 @@ export class OpenFamily {
         return best;
     }
 
-    // Asked for again and again with one focus, searched once.
-    kinshipsTo(focus: number): ReadonlyMap<number, Kinship> {
-        if (this.kinshipFocus !== focus || !this.kinships) {
-            this.kinships = allKinships(this.persons, this.families, focus);
-            this.kinshipFocus = focus;
-        }
-        return this.kinships;
+    // Asked for again and again with one focus, whose answers are kept.
+    kinshipsTo(focus: number, language: string): KinshipTexts {
+        const { kinships } = this;
+        if (kinships?.focus === focus && kinships.language === language) return kinships;
+        return (this.kinships = new KinshipTexts(this.file, focus, language));
     }
 
     siblingsOf(person: Person): number[] {
