@@ -231,7 +231,8 @@ export class GedcomFile {
             throw new LayoutError("invalidPerson", `${this.name}: there is no person ${focus}`, "", []);
         }
         try {
-            const ask = (view, person) => this.#instance.exports.gedcom_layout(file, view, person);
+            const withText = wanted === "text" ? 1 : 0;
+            const ask = (view, person) => this.#instance.exports.gedcom_layout(file, view, person, withText);
             return runLayout(this.#instance, null, focus, options, ask, wanted);
         } catch (error) {
             // A file answers every question; it only ends a layout that asks for too much.

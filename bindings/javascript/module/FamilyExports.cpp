@@ -17,12 +17,9 @@
 #include <string_view>
 #include <vector>
 
-#include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/Family.h>
 #include <olvane/kin/FamilyDataSource.h>
 #include <olvane/kin/PersonIndex.h>
-
-#include <LayoutInternal.h>
 
 #include "JsonText.h"
 #include "LayoutAnswer.h"
@@ -309,40 +306,11 @@ const char* jsonOrNull(const Write& write) {
     }
 }
 
-void appendBoxes(const TypedLayout& layout, std::vector<std::int32_t>& numbers) {
-    numbers.reserve(layout.boxes.size() * 7 + layout.lines.size() * 4);
-    for (const TypedLayout::Box& box : layout.boxes) {
-        numbers.insert(numbers.end(),
-                       {static_cast<std::int32_t>(box.id), box.x, box.y, box.hasHiddenRelatives ? 1 : 0,
-                        static_cast<std::int32_t>(box.kind), static_cast<std::int32_t>(box.childId),
-                        static_cast<std::int32_t>(box.lineCount)});
-        for (const TypedLayout::Line& line : layout.linesOf(box)) {
-            numbers.insert(numbers.end(), {line.x1, line.y1, line.x2, line.y2});
-        }
-    }
-}
-
-// withText asks for the text, else for the records; a layout that fails has both.
 void layOutFamily(HeldFamily& family, View view, double focus, bool withText, LayoutAnswer& answer) {
-    if (!family.table.hasPerson(static_cast<std::int64_t>(focus))) {
+    if (family.table.hasPerson(static_cast<std::int64_t>(focus)))
+        layOutSource([&family] { return family.asSource(); }, view, focus, withText, answer);
+    else
         answer.status = OLVANE_INVALID_PERSON;
-        return;
-    }
-    LayoutOptions options = c::layoutOptionsOf(nextOptions());
-    options.withText = withText;
-    TypedLayout layout;
-    try {
-        layOut(view == View::family ? TypedLayout::View::family : TypedLayout::View::pedigree,
-               static_cast<std::int64_t>(focus), family.asSource(), options, layout);
-        answer.status = OLVANE_OK;
-    } catch (const std::bad_alloc&) {
-        throw;
-    } catch (const std::exception&) {
-        answer.status = OLVANE_LAYOUT_FAILED;
-        if (!withText) return layOutFamily(family, view, focus, true, answer);
-    }
-    if (!withText || answer.status != OLVANE_OK) appendBoxes(layout, answer.numbers);
-    answer.text = std::move(layout.text);
 }
 
 }  // namespace

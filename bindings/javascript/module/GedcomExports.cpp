@@ -7,6 +7,7 @@
 #include <cstddef>
 #include <exception>
 #include <memory>
+#include <new>
 #include <span>
 #include <string>
 #include <string_view>
@@ -14,7 +15,6 @@
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/source/LimitedDataSource.h>
 
-#include "GedcomHost.h"
 #include "GedcomJson.h"
 #include "JsonText.h"
 #include "LayoutAnswer.h"
@@ -123,13 +123,6 @@ std::string tableOf(const gedcom::GedcomData& data) {
     return std::move(json).take();
 }
 
-// A file whose answers found no memory has not failed.
-void reportLackOfMemory(LayoutAnswer& answer) {
-    int code = 0;
-    if (answer.layout) olvane_layout_host_code(answer.layout.get(), &code);
-    if (code == kLacksMemory) answer.status = OLVANE_OUT_OF_MEMORY;
-}
-
 std::string factsText(std::span<const gedcom::Fact> facts) {
     JsonText json;
     json.begin();
@@ -184,12 +177,19 @@ OLVANE_EXPORT("gedcom_search") const char* gedcomSearch(OpenFile* file, const ch
     return js::textOrRefusal([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
 }
 
-OLVANE_EXPORT("gedcom_layout") js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus) {
-    gedcom::LimitedDataSource limited(file->source, js::kMostRelatives);
-    js::LayoutAnswer* answer =
-        js::layoutAnswer(js::hostOfSource(limited), static_cast<js::View>(view), focus, js::nextOptions());
-    if (answer) js::reportLackOfMemory(*answer);
-    return answer;
+// The text of a layout, or else its records. Null for want of memory.
+OLVANE_EXPORT("gedcom_layout")
+js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus, int withText) {
+    try {
+        auto answer = std::make_unique<js::LayoutAnswer>();
+        const auto limited = [file] {
+            return std::make_shared<gedcom::LimitedDataSource>(file->source, js::kMostRelatives);
+        };
+        js::layOutSource(limited, static_cast<js::View>(view), focus, withText != 0, *answer);
+        return answer.release();
+    } catch (const std::bad_alloc&) {
+        return nullptr;
+    }
 }
 
 OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {

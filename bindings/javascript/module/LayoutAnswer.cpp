@@ -8,7 +8,14 @@
 
 #include <cmath>
 #include <cstddef>
+#include <exception>
 #include <new>
+#include <stdexcept>
+#include <utility>
+
+#include <olvane/boundary/TypedLayout.h>
+
+#include <LayoutInternal.h>
 
 #include "HostImports.h"
 
@@ -37,6 +44,19 @@ void readRecords(LayoutAnswer& answer) {
     for (std::size_t i = 0; i < count; ++i) appendRecord(answer.numbers, records[i]);
 }
 
+void appendBoxes(const TypedLayout& layout, std::vector<std::int32_t>& numbers) {
+    numbers.reserve(layout.boxes.size() * 7 + layout.lines.size() * 4);
+    for (const TypedLayout::Box& box : layout.boxes) {
+        numbers.insert(numbers.end(),
+                       {static_cast<std::int32_t>(box.id), box.x, box.y, box.hasHiddenRelatives ? 1 : 0,
+                        static_cast<std::int32_t>(box.kind), static_cast<std::int32_t>(box.childId),
+                        static_cast<std::int32_t>(box.lineCount)});
+        for (const TypedLayout::Line& line : layout.linesOf(box)) {
+            numbers.insert(numbers.end(), {line.x1, line.y1, line.x2, line.y2});
+        }
+    }
+}
+
 // JavaScript hands over whole numbers; what none of 64 bits could be is nobody.
 std::int64_t idFrom(double focus) {
     constexpr double kLimit = 9007199254740992.0;  // 2^53, up to which doubles represent every whole number
@@ -61,6 +81,26 @@ LayoutAnswer* layoutAnswer(const olvane_host& host, View view, double focus, con
     } catch (const std::bad_alloc&) {
         return nullptr;
     }
+}
+
+void layOutSource(const SourceMaker& source, View view, double focus, bool withText, LayoutAnswer& answer) {
+    LayoutOptions options = c::layoutOptionsOf(nextOptions());
+    options.withText = withText;
+    TypedLayout layout;
+    try {
+        layOut(view == View::family ? TypedLayout::View::family : TypedLayout::View::pedigree, idFrom(focus),
+               source(), options, layout);
+        answer.status = OLVANE_OK;
+    } catch (const std::bad_alloc&) {
+        throw;
+    } catch (const std::length_error&) {
+        answer.status = OLVANE_HOST_FAILED;
+    } catch (const std::exception&) {
+        answer.status = OLVANE_LAYOUT_FAILED;
+    }
+    if (answer.status != OLVANE_OK && !withText) return layOutSource(source, view, focus, true, answer);
+    if (!withText || answer.status != OLVANE_OK) appendBoxes(layout, answer.numbers);
+    answer.text = std::move(layout.text);
 }
 
 }  // namespace olvane::js

@@ -4,11 +4,13 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include <olvane.h>
+#include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 
 namespace olvane::js {
 
@@ -31,6 +33,13 @@ enum class View : int { family = 0, pedigree = 1 };
 
 // Never throws; an answer without memory for it is null.
 LayoutAnswer* layoutAnswer(const olvane_host& host, View view, double focus, const olvane_options& options);
+
+using SourceMaker = std::function<std::shared_ptr<OlvaneViewerManagerWrapProtocol>()>;
+
+// Asks a data source of ours directly: for the text of the layout, or else for its records; one that fails has both, from
+// a second run. A source that ends a layout which asks for too much has failed as a host.
+// Fails: std::bad_alloc.
+void layOutSource(const SourceMaker& source, View view, double focus, bool withText, LayoutAnswer& answer);
 
 // The options of the next layout, which JavaScript fills by set_options.
 const olvane_options& nextOptions();
