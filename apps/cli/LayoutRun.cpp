@@ -26,7 +26,7 @@ std::shared_ptr<OlvaneViewerManagerWrapProtocol> limitedSource(OlvaneViewerManag
 }
 
 std::string layoutText(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request) {
-    gedcom::GedcomDataSource people(data);
+    gedcom::GedcomDataSource people(data, request.parents);
     olvane::LayoutOptions options = request.chart.layout;
     options.sizes = charts::treeSizeOf(request.boxes);
     const auto source = limitedSource(people);

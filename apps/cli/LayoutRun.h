@@ -11,6 +11,7 @@
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Charts.h>
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/source/ParentChoice.h>
 
 namespace olvane::cli {
 
@@ -23,7 +24,8 @@ using charts::BoxForm;
 struct LayoutRequest {
     charts::ChartRequest chart{};
     BoxForm boxes = BoxForm::tall;
-    std::string to;               // of the kinship view, as the user names the person; checked by PictureRun
+    std::string to;  // of the kinship view, as the user names the person; checked by PictureRun
+    gedcom::ParentChoice parents{};
     bool unknownParents = false;  // a picture of a view of the engine has boxes for parents who are not known
 
     LayoutRequest() { chart.view = View::family; }

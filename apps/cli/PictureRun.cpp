@@ -28,7 +28,8 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& requ
       view_{request.chart, request.unknownParents},
       hidden_(std::move(hidden)),
       hiddenNames_(data, hidden_),
-      graph_(gedcom::kinGraphOf(data)) {
+      parents_(request.parents),
+      graph_(gedcom::kinGraphOf(data, request.parents)) {
     charts::setBoxForm(view_.chart, request.boxes);
     if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
@@ -39,7 +40,7 @@ bool PictureRun::isHidden(std::int64_t id) const {
 }
 
 picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
-    gedcom::GedcomDataSource people(data_);
+    gedcom::GedcomDataSource people(data_, parents_);
     charts::ViewRequest view = view_;
     view.chart.focus = graph_.placeOf(focus);
     picture::Picture picture = charts::pictureOf(limitedSource(people), graph_, view);
@@ -51,6 +52,9 @@ void PictureRun::hideIn(picture::Picture& picture) const {
     const auto isHiddenBox = [&](picture::Index box) {
         return isHidden(picture.boxes[static_cast<std::size_t>(box)].id);
     };
+    for (picture::Box& box : picture.boxes) {
+        if (isHidden(box.id)) box.furtherParents = 0;
+    }
     for (picture::Family& family : picture.families) {
         const auto parents = picture.parents(family);
         const auto children = picture.children(family);

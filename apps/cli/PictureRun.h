@@ -26,7 +26,7 @@ public:
     // hidden: of whom nothing is stated, an entry for each person; empty for nobody.
     PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden);
 
-    // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, neither number
+    // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, none of their further parents, neither number
     // nor state of a family with a hidden partner or without a partner who is known, no words of a way over them.
     picture::Picture pictureOf(gedcom::PersonId focus) const;
 
@@ -45,6 +45,7 @@ private:
     charts::ViewRequest view_;
     std::vector<bool> hidden_;
     gedcom::HiddenNames hiddenNames_;
+    gedcom::ParentChoice parents_;
     kin::KinGraph graph_;
 };
 

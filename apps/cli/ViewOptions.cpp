@@ -231,6 +231,19 @@ void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
     }
 }
 
+void addParents(CLI::App& command, LayoutRequest& request) {
+    static const std::map<std::string, gedcom::ParentOrder> kOrders = {
+        {"birth", gedcom::ParentOrder::birth},
+        {"adoptive", gedcom::ParentOrder::adoptive},
+        {"all-in-order", gedcom::ParentOrder::inOrder}};
+    command
+        .add_option("--parents", request.parents.order,
+                    "Whose parents come first where somebody is a child of several families: those by birth "
+                    "(default), who adopted, or the first in the file")
+        ->transform(CLI::CheckedTransformer(kOrders))
+        ->type_name("birth|adoptive|all-in-order");
+}
+
 void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defaults) {
     static const std::map<std::string, BoxForm> kForms = {{"tall", BoxForm::tall}, {"wide", BoxForm::wide}};
     command
@@ -281,6 +294,7 @@ void applyGenerations(const CLI::App& command, LayoutRequest& request) {
 
 void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string& boxDefaults) {
     addView(command, request);
+    addParents(command, request);
     addBoxes(command, request, boxDefaults);
     addReach(command, request.chart);
     addChartOptions(command, request.chart);

@@ -32,6 +32,7 @@ complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l effort -x -a '(s
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l all-parts -d 'Show those not connected as well'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l of -x -a 'ancestors descendants' -d 'Whom a fan shows'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l angle -x -a '90 180 270 360' -d 'How far a fan reaches'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l parents -x -a 'birth adoptive all-in-order' -d 'Whose parents come first'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l boxes -x -a 'tall wide' -d 'Form of the boxes'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l no-aunts-uncles -d 'Leave out siblings of the parents'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l no-cousins -d 'Leave out cousins'

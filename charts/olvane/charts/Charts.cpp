@@ -7,6 +7,7 @@
 #include <olvane/charts/FanInternal.h>
 #include <olvane/charts/SelectionInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
+#include <olvane/picture/FurtherParents.h>
 
 #include <cmath>
 #include <stdexcept>
@@ -53,6 +54,27 @@ EverybodyOptions everybodyOptions(const ChartRequest& request) {
     return options;
 }
 
+picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartRequest& request) {
+    switch (request.view) {
+        case View::near:
+        case View::ancestors:
+        case View::descendants:
+        case View::hourglass:
+        case View::relatives:
+            return treeChart(graph, request, selectPersons(graph, request));
+        case View::fan:
+            return fanChart(graph, request);
+        case View::everybody:
+            return everybodyChart(graph, everybodyOptions(request));
+        case View::kinship:
+            checkPerson(graph, request.to);
+            return kinshipChart(graph, request);
+        default:
+            break;
+    }
+    throw std::invalid_argument(std::string("no chart is made of the view ") + nameOf(request.view));
+}
+
 }  // namespace
 
 const char* nameOf(View view) {
@@ -84,24 +106,9 @@ const char* nameOf(View view) {
 picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request) {
     checkPerson(graph, request.focus);
     checkSizes(graph, request);
-    switch (request.view) {
-        case View::near:
-        case View::ancestors:
-        case View::descendants:
-        case View::hourglass:
-        case View::relatives:
-            return treeChart(graph, request, selectPersons(graph, request));
-        case View::fan:
-            return fanChart(graph, request);
-        case View::everybody:
-            return everybodyChart(graph, everybodyOptions(request));
-        case View::kinship:
-            checkPerson(graph, request.to);
-            return kinshipChart(graph, request);
-        default:
-            break;
-    }
-    throw std::invalid_argument(std::string("no chart is made of the view ") + nameOf(request.view));
+    picture::Picture picture = chartWithoutCounts(graph, request);
+    picture::countFurtherParents(picture, graph);
+    return picture;
 }
 
 }  // namespace olvane::charts

@@ -275,6 +275,14 @@ std::string repeatSentence(const BoxFrame& box) {
            std::to_string(box.repeatNumber);
 }
 
+constexpr std::string_view kTwoUp = "\xE2\x87\x88";
+
+std::string furtherSentence(const picture::Box& box) {
+    return box.furtherParents == 1 ? "Has further parents, who are not shown"
+                                   : "Has further parents in " + std::to_string(box.furtherParents) +
+                                         " families, who are not shown";
+}
+
 struct Badge {
     std::string text;
     std::string title;
@@ -302,8 +310,8 @@ void appendBadge(std::string& svg, const BoxFrame& box, const Badge& badge, cons
     appendBadgeAt(svg, isWide(box) ? box.height - kBadgeHeight - kBadgeInset : kBadgeInset, badge, theme);
 }
 
-// The count of hidden relatives in the right corner; the repeat mark in the left one, or before it in a wide
-// box.
+// The count of hidden relatives in the right corner; the repeat mark and that of further parents in the left one, or
+// before it in a wide box.
 void appendBadges(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
                   const DrawingTheme& theme) {
     double right = box.width - kBadgeInset;
@@ -314,9 +322,21 @@ void appendBadges(std::string& svg, const BoxFrame& box, const kin::PersonLabel&
         if (box.text != nullptr) box.text->add(kBadgeSize);
         appendBadge(svg, box, badge, theme);
     }
+    double left = kBadgeInset;
+    const auto placeHollow = [&](Badge& badge) {
+        badge.x = isWide(box) ? right - badge.width() : left;
+        right -= badge.width() + kBadgeInset / 2;
+        left += badge.width() + kBadgeInset / 2;
+    };
     if (box.repeatNumber > 0) {
         Badge badge{"=" + std::to_string(box.repeatNumber), repeatSentence(box), true};
-        badge.x = isWide(box) ? right - badge.width() : kBadgeInset;
+        placeHollow(badge);
+        if (box.text != nullptr) box.text->add(kBadgeSize);
+        appendBadge(svg, box, badge, theme);
+    }
+    if (box.box->furtherParents > 0 && !label.living) {
+        Badge badge{std::string(kTwoUp), furtherSentence(*box.box), true};
+        placeHollow(badge);
         if (box.text != nullptr) box.text->add(kBadgeSize);
         appendBadge(svg, box, badge, theme);
     }
@@ -380,6 +400,7 @@ std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
     if (box.isCommonAncestor) title += ". Common ancestor";
     if (box.repeatNumber > 0) title += ". " + repeatSentence(box);
     if (box.hasHidden()) title += ". " + hiddenSentence(box, label.living);
+    if (box.box->furtherParents > 0 && !label.living) title += ". " + furtherSentence(*box.box);
     for (const BoxMark& mark : box.marks) title += ". " + mark.title;
     return title;
 }

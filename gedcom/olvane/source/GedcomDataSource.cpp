@@ -23,12 +23,17 @@ std::vector<std::int64_t> asHostIds(std::span<const PersonId> persons) {
 
 }  // namespace
 
+PersonId GedcomDataSource::parentOf(std::int64_t personId, PersonId Family::*slot) const {
+    const FamilyId family = parentFamilyOf(data_, asPerson(personId), parents_);
+    return family == 0 ? 0 : data_.family(family).*slot;
+}
+
 std::int64_t GedcomDataSource::fatherForPersonWithID(std::int64_t personId) {
-    return knownOrNot(data_.person(asPerson(personId)).father);
+    return knownOrNot(parentOf(personId, &Family::husband));
 }
 
 std::int64_t GedcomDataSource::motherForPersonWithID(std::int64_t personId) {
-    return knownOrNot(data_.person(asPerson(personId)).mother);
+    return knownOrNot(parentOf(personId, &Family::wife));
 }
 
 std::vector<std::int64_t> GedcomDataSource::spousesForPersonWithID(std::int64_t personId) {

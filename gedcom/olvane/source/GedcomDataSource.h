@@ -5,6 +5,7 @@
 
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/source/ParentChoice.h>
 
 namespace olvane::gedcom {
 
@@ -14,7 +15,8 @@ namespace olvane::gedcom {
 //        each have one around the same data.
 class GedcomDataSource final : public OlvaneViewerManagerWrapProtocol {
 public:
-    explicit GedcomDataSource(const GedcomData& data) : data_(data) {}
+    explicit GedcomDataSource(const GedcomData& data, const ParentChoice& parents = {})
+        : data_(data), parents_(parents) {}
 
     std::int64_t fatherForPersonWithID(std::int64_t personId) override;
     std::int64_t motherForPersonWithID(std::int64_t personId) override;
@@ -28,7 +30,10 @@ public:
     std::int32_t sexOfPersonWithID(std::int64_t personId) override;
 
 private:
+    PersonId parentOf(std::int64_t personId, PersonId Family::*slot) const;
+
     const GedcomData& data_;
+    ParentChoice parents_;
 };
 
 }  // namespace olvane::gedcom

@@ -66,7 +66,7 @@ struct ChildClaim {
 
 class KinMaker {
 public:
-    explicit KinMaker(const GedcomData& data) : data_(data) {}
+    KinMaker(const GedcomData& data, const ParentChoice& parents) : data_(data), parents_(parents) {}
 
     kin::KinGraph make() {
         builder_.reserve(data_.personCount(), data_.familyCount());
@@ -141,7 +141,7 @@ private:
 
     void orderAsChild(PersonId id) {
         std::vector<UnionPlace> order;
-        addUnion(order, data_.person(id).parentFamily);
+        addUnion(order, parentFamilyOf(data_, id, parents_));
         for (const FamilyLink& link : data_.parentLinks(id)) addUnion(order, link.family);
         if (!std::is_sorted(order.begin(), order.end())) {
             builder_.orderUnionsAsChild(placeOf(id), std::move(order));
@@ -153,6 +153,7 @@ private:
     }
 
     const GedcomData& data_;
+    const ParentChoice& parents_;
     kin::KinGraphBuilder builder_;
     std::vector<UnionPlace> unionOf_;      // by family
     std::vector<std::size_t> claimStart_;  // by family
@@ -161,8 +162,8 @@ private:
 
 }  // namespace
 
-kin::KinGraph kinGraphOf(const GedcomData& data) {
-    return KinMaker(data).make();
+kin::KinGraph kinGraphOf(const GedcomData& data, const ParentChoice& parents) {
+    return KinMaker(data, parents).make();
 }
 
 }  // namespace olvane::gedcom

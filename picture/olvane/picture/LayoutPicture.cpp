@@ -13,6 +13,8 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/picture/FurtherParents.h>
+
 namespace olvane::picture {
 
 namespace {
@@ -397,7 +399,9 @@ private:
 }  // namespace
 
 Picture pictureOf(const TypedLayout& layout, const LayoutPictureOptions& options) {
-    return LayoutPainter(layout, options).paint();
+    Picture picture = LayoutPainter(layout, options).paint();
+    if (options.known != nullptr) countFurtherParents(picture, *options.known);
+    return picture;
 }
 
 Direction directionOf(TypedLayout::View view) {

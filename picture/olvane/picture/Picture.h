@@ -37,6 +37,8 @@ struct Box {
     std::int32_t hiddenParents = 0;
     std::int32_t hiddenPartners = 0;
     std::int32_t hiddenChildren = 0;
+    // Families that the person is a child of, beside the one that comes first, of whose partners none has a box.
+    std::int32_t furtherParents = 0;
     BoxKind kind = BoxKind::person;
     kin::Sex sex = kin::Sex::unknown;
     bool hasFlag = false;  // the view is one of the engine's, and flag is its own

@@ -132,6 +132,7 @@ private:
                            ", \"hidden\": {\"parents\": " + std::to_string(box.hiddenParents) +
                            ", \"partners\": " + std::to_string(box.hiddenPartners) +
                            ", \"children\": " + std::to_string(box.hiddenChildren) + "}";
+        if (box.furtherParents > 0) json += ", \"furtherParents\": " + std::to_string(box.furtherParents);
         if (box.hasFlag) json += std::string(", \"flag\": ") + (box.flag ? "true" : "false");
         const std::string person = facts_.person ? facts_.person(box.id) : std::string();
         return person.empty() ? json : json + ", \"person\": " + person;

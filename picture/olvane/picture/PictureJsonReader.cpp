@@ -212,6 +212,7 @@ private:
             box.hiddenPartners = integerAt<std::int32_t>(*hidden, "partners");
             box.hiddenChildren = integerAt<std::int32_t>(*hidden, "children");
         }
+        box.furtherParents = integerAt<std::int32_t>(json, "furtherParents");
         const Json* flag = find(json, "flag");
         box.hasFlag = flag != nullptr;
         box.flag = flag != nullptr && flag->is_boolean() && flag->get<bool>();
