@@ -78,7 +78,7 @@ const styleText = {
     },
 };
 
-const kPageStyles = ["colours", "controls", "shell"].map((name) => here(`src/styles/${name}.css`));
+const kPageStyles = ["colours", "controls", "shell", "map"].map((name) => here(`src/styles/${name}.css`));
 
 const hashOf = (text) => "'sha256-" + createHash("sha256").update(text).digest("base64") + "'";
 

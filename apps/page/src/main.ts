@@ -5,7 +5,7 @@
 
 import { html } from "./base/dom";
 import { defineOlvaneTree, OlvaneTree } from "./element/OlvaneTree";
-import { embeddedFamily, startEngine } from "./engine/engine";
+import { embeddedFamily, embeddedMap, startEngine } from "./engine/engine";
 import { uiMessagesFor } from "./messages/ui";
 import { App } from "./shell/App";
 
@@ -17,7 +17,8 @@ async function start(): Promise<void> {
         const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
         OlvaneTree.engine = () => Promise.resolve(engine);
         const app = new App(root, engine);
-        if (family) app.openEmbedded(family);
+        if (family?.hasMap) await app.openMap(family, embeddedMap());
+        else if (family) app.openEmbedded(family);
     } catch (error) {
         const reason = typeof DecompressionStream === "undefined" ? errors.tooNew : errors.engine;
         const detail = error instanceof Error ? error.message : String(error);

@@ -31,6 +31,7 @@ const kPaths = {
     fan: "M12 21L3 10a14 14 0 0 1 18 0zM7.5 15.5a7 7 0 0 1 9 0M12 21V7",
     kinship: "M4 17h5v4H4zM15 17h5v4h-5zM9.5 3h5v4h-5zM6.5 17v-5h11v5M12 7v5",
     everybody: "M3 3h3v3H3zM10.5 3h3v3h-3zM18 3h3v3h-3zM3 10.5h3v3H3zM10.5 10.5h3v3h-3zM18 10.5h3v3h-3zM3 18h3v3H3zM10.5 18h3v3h-3zM18 18h3v3h-3z",
+    map: "M3 6l6-2.5 6 2.5 6-2.5v14.5L15 20.5 9 18l-6 2.5zM9 3.5V18M15 6v14.5",
     up: "M6 15l6-6 6 6",
     duplicates: "M5 9h10v10H5zM9 9V5h10v10h-4",
     lock: "M6 11h12v9H6zM8.5 11V8a3.5 3.5 0 0 1 7 0v3",

@@ -14,6 +14,8 @@ export class ArchiveError extends Error {}
 export class TooLargeError extends Error {}
 
 export function bytesOfBase64(text: string): Uint8Array<ArrayBuffer> {
+    const { fromBase64 } = Uint8Array as unknown as { fromBase64?: (text: string) => Uint8Array<ArrayBuffer> };
+    if (fromBase64) return fromBase64.call(Uint8Array, text);
     const binary = atob(text.trim());
     const bytes = new Uint8Array(binary.length);
     for (let i = 0; i < binary.length; ++i) bytes[i] = binary.charCodeAt(i);

@@ -18,8 +18,11 @@ export interface EmbeddedFamily {
     readonly livingHidden: boolean;
     /** On the file that the family was read from; the text in the page is another. Null where nobody stored. */
     readonly remarks: readonly Diagnostic[] | null;
+    /** Of the GEDCOM text; none where the page has a map alone. */
     readonly bytes: Uint8Array;
     readonly photographs: Photographs;
+    /** Whether a map lies at the end of the page. */
+    readonly hasMap: boolean;
 }
 
 export async function startEngine(): Promise<Olvane> {
@@ -31,7 +34,7 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
     const text = document.getElementById("olvane-family")?.textContent;
     if (!text) return null;
     const stored = JSON.parse(text) as Partial<
-        Record<"name" | "title" | "focus" | "address" | "livingHidden" | "remarks" | "gzip" | "photos", unknown>
+        Record<"name" | "title" | "focus" | "address" | "livingHidden" | "remarks" | "gzip" | "photos" | "map", unknown>
     >;
     return {
         name: String(stored.name ?? "family.ged"),
@@ -43,4 +46,19 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
         photographs: Photographs.embedded((stored.photos ?? {}) as Record<string, unknown>),
         bytes: await gunzip(bytesOfBase64(String(stored.gzip ?? ""))),
     };
+}
+
+/** What is missing where a page ends before its map does. */
+export class CutShortError extends Error {}
+
+/** The bytes of the map at the page's end, which is read last. Throws CutShortError. */
+export async function embeddedMap(): Promise<Uint8Array<ArrayBuffer>> {
+    if (document.readyState === "loading")
+        await new Promise((loaded) => document.addEventListener("DOMContentLoaded", loaded, { once: true }));
+    const text = document.getElementById("olvane-map")?.textContent ?? "";
+    try {
+        return await gunzip(bytesOfBase64(text));
+    } catch (error) {
+        throw new CutShortError("map", { cause: error });
+    }
 }

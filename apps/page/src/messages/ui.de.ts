@@ -47,6 +47,18 @@ export const uiGerman: UiMessages = {
         kinship: "Verwandtschaft",
         everybody: "Alle",
     },
+    map: {
+        name: "Karte von allen",
+        label: (n) => `Karte von ${n.toLocaleString("de")} Personen`,
+        hint: "Pfeiltasten führen zu Eltern, Kindern, Partnern und Geschwistern. Die Eingabetaste zeigt die Familie einer Person. Umschalt und ein Pfeil verschieben die Karte, Plus und Minus ändern die Größe, 0 zeigt alles, Pos1 führt zur ersten Person.",
+        partners: "Partner",
+        alone: "Diese Seite enthält nur die Karte: Namen, Jahre und wer zu wem gehört. Für alles andere öffnen Sie die Datei der Familie.",
+        cut: (have, wanted) =>
+            `Die Karte in dieser Seite endet nach ${have.toLocaleString("de")} von ${wanted.toLocaleString("de")} Bytes. Besorgen Sie die Seite noch einmal.`,
+        cutShort: "Diese Seite endet mitten in ihrer Karte. Sie wurde unterwegs abgeschnitten; besorgen Sie sie noch einmal.",
+        version: "Die Karte in dieser Seite ist von neuerer Art, als die Seite lesen kann.",
+        damaged: "Die Karte in dieser Seite ist beschädigt und kann nicht gezeigt werden.",
+    },
     depth: { up: "Generationen aufwärts", down: "Generationen abwärts", all: "alle" },
     direction: "Richtung",
     directions: { down: "Abwärts", up: "Aufwärts", left: "Nach links", right: "Nach rechts" },

@@ -45,6 +45,18 @@ export const uiEnglish: UiMessages = {
         kinship: "Relationship",
         everybody: "Everybody",
     },
+    map: {
+        name: "Map of everybody",
+        label: (n) => `Map of ${n.toLocaleString("en")} persons`,
+        hint: "Arrow keys lead to parents, children, partners and siblings. Enter shows a person's family. Shift and an arrow move the map, plus and minus zoom, 0 shows everything, Home leads to the first person.",
+        partners: "Partners",
+        alone: "This page has the map alone: names, years and who belongs to whom. For all else, open the family's own file.",
+        cut: (have, wanted) =>
+            `The map in this page ends after ${have.toLocaleString("en")} of ${wanted.toLocaleString("en")} bytes. Get the page again.`,
+        cutShort: "This page ends in the middle of its map. It was cut short on its way; get it again.",
+        version: "The map in this page is of a newer kind than the page can read.",
+        damaged: "The map in this page is damaged and cannot be shown.",
+    },
     depth: { up: "Generations up", down: "Generations down", all: "all" },
     direction: "Direction",
     directions: { down: "Downward", up: "Upward", left: "To the left", right: "To the right" },

@@ -45,6 +45,18 @@ export const uiSpanish: UiMessages = {
         kinship: "Parentesco",
         everybody: "Todos",
     },
+    map: {
+        name: "Mapa de todos",
+        label: (n) => `Mapa de ${n.toLocaleString("es")} personas`,
+        hint: "Las flechas llevan a padres, hijos, parejas y hermanos. Intro muestra la familia de una persona. Mayúsculas y una flecha mueven el mapa, más y menos cambian el tamaño, 0 muestra todo, Inicio lleva a la primera persona.",
+        partners: "Parejas",
+        alone: "Esta página solo contiene el mapa: nombres, años y quién es pariente de quién. Para todo lo demás, abra el archivo de la familia.",
+        cut: (have, wanted) =>
+            `El mapa de esta página termina después de ${have.toLocaleString("es")} de ${wanted.toLocaleString("es")} bytes. Consiga la página de nuevo.`,
+        cutShort: "Esta página termina en medio de su mapa. Quedó cortada por el camino; consígala de nuevo.",
+        version: "El mapa de esta página es más nuevo de lo que la página sabe leer.",
+        damaged: "El mapa de esta página está dañado y no se puede mostrar.",
+    },
     depth: { up: "Generaciones hacia arriba", down: "Generaciones hacia abajo", all: "todas" },
     direction: "Dirección",
     directions: {

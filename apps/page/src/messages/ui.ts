@@ -32,6 +32,18 @@ export interface UiMessages {
         readonly foundIn: Readonly<Record<"identifier" | "name" | "nickname" | "marriedName" | "title", string>>;
     };
     readonly views: { readonly label: string } & Readonly<Record<ViewName, string>>;
+    readonly map: {
+        readonly name: string;
+        readonly label: (persons: number) => string;
+        readonly hint: string;
+        readonly partners: string;
+        /** The page has no records beside the map. */
+        readonly alone: string;
+        readonly cut: (have: number, wanted: number) => string;
+        readonly cutShort: string;
+        readonly version: string;
+        readonly damaged: string;
+    };
     readonly depth: { readonly up: string; readonly down: string; readonly all: string };
     readonly direction: string;
     readonly directions: Readonly<Record<ChartDirection, string>>;

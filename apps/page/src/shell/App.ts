@@ -29,6 +29,7 @@ import { Chrome, type ChromeActions } from "./Chrome";
 import { fileInput, takeDrops } from "./dropping";
 import { FileOpening, type OpenedFile } from "./FileOpening";
 import { Journey } from "./Journey";
+import { isMapAddress, mapComplaint, MapHost } from "./MapHost";
 import type { Found } from "./searchReasons";
 import { Theme, type ThemeChoice } from "./theme";
 import { Welcome } from "./Welcome";
@@ -51,6 +52,12 @@ export class App implements ChromeActions {
     private readonly cover = html("div", { class: "cover", hidden: true });
     private readonly input = fileInput((file) => void this.openDropped([file]));
     private readonly journey = new Journey((address) => this.arriveAt(address));
+    private readonly maps = new MapHost({
+        openPerson: (number) => this.leaveMap({ focus: number }),
+        mapSettled: (address) => this.journey.replace(address),
+    });
+    // The family beside an embedded map, which is read when somebody leaves the map.
+    private unread: EmbeddedFamily | null = null;
     private readonly output = new PictureOutput(() => this.subject(), this.notices);
     private readonly files: FileOpening;
 
@@ -79,6 +86,31 @@ export class App implements ChromeActions {
         }
     }
 
+    // The map that lies in the page, which stands before the family is read.
+    async openMap(embedded: EmbeddedFamily, map: Promise<Uint8Array<ArrayBuffer>>): Promise<void> {
+        const start = performance.now();
+        const hasText = embedded.bytes.length > 0;
+        try {
+            this.maps.take(await map, embedded.focus);
+        } catch (error) {
+            if (hasText) this.openEmbedded(embedded);
+            this.notices.fail(mapComplaint(error, this.ui), []);
+            return;
+        }
+        const { hash } = location;
+        // A link may lead past the map.
+        if (hash !== "" && !isMapAddress(hash) && hasText) return this.openEmbedded(embedded);
+        this.unread = embedded;
+        this.fileName = embedded.name;
+        this.remarks = embedded.remarks ?? [];
+        document.title = embedded.title;
+        this.showMap(isMapAddress(hash) ? hash : `#map=&number=${embedded.focus}`);
+        this.journey.begin(this.maps.address, true);
+        this.showState();
+        performance.measure("olvane-open", { start });
+        if (embedded.livingHidden) this.notices.show(this.ui.livingHidden);
+    }
+
     // One family at a time: of several files the first is opened, and the page says so.
     async openDropped([file, ...others]: readonly File[]): Promise<void> {
         if (!file) return;
@@ -103,6 +135,9 @@ export class App implements ChromeActions {
         // persons of another.
         const isLinked = isSame || embedded !== null || (this.tree.family === null && history.state === null);
         const family = new OpenFamily(file, title, embedded?.livingHidden ?? false, photographs);
+        if (embedded) this.maps.hide();
+        else this.maps.forget();
+        this.unread = null;
         this.fileName = name;
         this.remarks = embedded?.remarks ?? file.diagnostics;
         this.tree.setFamily(family);
@@ -120,6 +155,7 @@ export class App implements ChromeActions {
         this.greet(family);
         this.nameUnknownPerson(address);
         this.tree.warmUp();
+        if (isMapAddress(address)) this.setMap(address);
         if (!embedded) this.warnOfErrors(file);
     }
 
@@ -163,6 +199,9 @@ export class App implements ChromeActions {
     }
 
     private arriveAt(address: string): void {
+        if (isMapAddress(address) && (this.maps.isReady || this.tree.family)) return this.showMap(address);
+        if (this.unread && this.maps.isShown) return void this.readBesideMap();
+        this.hideMap();
         const { family, state } = this.tree;
         if (!family || !state) return;
         const wanted = readAddress(address, family.persons, state);
@@ -193,7 +232,61 @@ export class App implements ChromeActions {
     // --- what the bar and the keys do ---
 
     setView(view: ViewName): void {
-        this.travel({ view });
+        if (this.maps.isShown) this.leaveMap({ view });
+        else this.travel({ view });
+    }
+
+    // --- the map ---
+
+    setMap(address = ""): void {
+        const { state } = this.tree;
+        if (this.maps.isShown) return;
+        this.showMap(address || this.maps.address || `#map=&number=${state?.focus ?? 0}`);
+        if (this.maps.isShown) this.journey.add(this.maps.address);
+        this.showState();
+    }
+
+    private showMap(address: string): void {
+        try {
+            const { family, state } = this.tree;
+            if (!this.maps.isReady && family) this.maps.take(family.file.mapIndex(), state?.focus ?? 0);
+            this.maps.show(this.ui, address);
+            this.arrange();
+            this.maps.takeKeys();
+        } catch (error) {
+            this.notices.fail(mapComplaint(error, this.ui), []);
+        }
+    }
+
+    private hideMap(): void {
+        if (!this.maps.isShown) return;
+        this.maps.hide();
+        this.arrange();
+    }
+
+    // To a view of the tree, of the person who is chosen on the map where nobody else is named.
+    private leaveMap(change: Partial<ViewState>): void {
+        const focus = change.focus || this.maps.number;
+        const wanted = focus ? { ...change, focus } : change;
+        if (this.unread && !this.readBesideMap(focus)) return;
+        const { family, state } = this.tree;
+        if (!family || !state) return;
+        this.hideMap();
+        if (sameState({ ...state, ...wanted }, state)) this.journey.add(addressOf(state, family.persons));
+        else this.travel(wanted);
+        this.showState();
+    }
+
+    // A step of its own in the history, so that the way back leads to the map.
+    private readBesideMap(focus = 0): boolean {
+        const { unread } = this;
+        if (!unread || unread.bytes.length === 0) {
+            this.notices.show(this.ui.map.alone);
+            return false;
+        }
+        this.journey.add(focus ? `#number=${focus}` : "#view=family");
+        this.openEmbedded(unread);
+        return this.tree.family !== null;
     }
 
     setDepth(which: "up" | "down", generations: number): void {
@@ -297,18 +390,19 @@ export class App implements ChromeActions {
 
     // Keys pressed outside the viewer; those inside it have been acted on by the time they come here.
     private key(event: KeyboardEvent): void {
-        if (!this.tree.family || event.defaultPrevented) return;
+        if (event.defaultPrevented) return;
         if (document.querySelector("dialog[open]") || event.composedPath().includes(this.tree)) return;
         const target = event.target as Element;
         if (target.matches("input:not([type=checkbox]), select, textarea")) return;
-        if (this.tree.press(event)) event.preventDefault();
+        if (this.maps.isShown ? event.key === "/" && this.outerKey("search") : this.tree.family && this.tree.press(event))
+            event.preventDefault();
     }
 
     // --- the search's questions ---
 
     find(text: string, limit: number): readonly Found[] {
         const { family } = this.tree;
-        if (!family) return [];
+        if (!family) return this.maps.find(text, limit);
         return family.file.search(text, limit).map((hit) => ({ person: family.person(hit.person)!, hit }));
     }
 
@@ -325,6 +419,7 @@ export class App implements ChromeActions {
     }
 
     choose(person: Person): void {
+        if (this.maps.isShown) return this.maps.goTo(person.id);
         this.tree.focusOn(person.id);
         this.tree.takeKeys();
     }
@@ -339,6 +434,7 @@ export class App implements ChromeActions {
         this.welcome = new Welcome(ui, () => this.openFile(), this.languageChooser());
         this.notices.setDismissLabel(ui.errors.dismiss);
         this.cover.textContent = ui.welcome.dropNow;
+        this.maps.rebuild(ui);
         this.arrange();
     }
 
@@ -346,27 +442,32 @@ export class App implements ChromeActions {
         const { chrome, tree } = this;
         const { family } = tree;
         const always = [this.notices.element, this.cover, this.input, this.output.sheet.element];
-        this.root.classList.toggle("empty", !family);
-        if (!family) {
+        const isEmpty = !family && !this.maps.isReady;
+        this.root.classList.toggle("empty", isEmpty);
+        if (isEmpty) {
             this.root.replaceChildren(this.welcome.element, ...always);
             return;
         }
         // The viewer stays where it is: taken out and put back, it would lose the keys.
-        const main = tree.parentElement ?? html("main", { class: "viewer-place" }, tree);
+        const main = tree.parentElement ?? html("main", { class: "viewer-place" }, tree, this.maps.element);
+        tree.hidden = this.maps.isShown;
         for (const child of [...this.root.children]) if (child !== main) child.remove();
         if (!main.isConnected) this.root.append(main);
         main.before(chrome.bar);
         this.root.append(chrome.keys, chrome.diagnostics, ...always);
-        chrome.showFamily(family.title, this.ui.personCount(family.persons.length));
+        const count = family?.persons.length ?? this.maps.count;
+        chrome.showFamily(family?.title ?? document.title, this.ui.personCount(count));
         chrome.showEncoding(this.files.canReadAgain ? this.encoding : null);
-        chrome.showDiagnostics(this.remarks, family.persons.length);
+        chrome.showDiagnostics(this.remarks, count);
         this.showPanelState();
         this.showState();
     }
 
     private showState(): void {
-        const { state } = this.tree;
+        const { isShown } = this.maps;
+        const state = this.tree.state ?? (isShown ? kUsualState : null);
         if (state) this.chrome.showState(state, this.journey.canGoBack, this.journey.canGoForward);
+        this.chrome.showMap(isShown);
     }
 
     private showPanelState(): void {

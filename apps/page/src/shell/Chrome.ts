@@ -165,6 +165,12 @@ export class Chrome {
         );
     }
 
+    // While the map is shown, no view of the tree is.
+    showMap(shown: boolean): void {
+        this.views.showMap(shown);
+        if (shown) for (const view of ["family", "pedigree"] as const) this.buttons[view].setAttribute("aria-pressed", "false");
+    }
+
     showPanelState(open: boolean): void {
         this.buttons.panel.setAttribute("aria-pressed", String(open));
     }

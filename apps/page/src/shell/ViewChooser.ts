@@ -23,6 +23,8 @@ const kMostCounted = 10; // generations; one step further on the slider is all o
 
 export interface ViewActions {
     setView(view: ViewName): void;
+    /** Shows everybody as a map. */
+    setMap(): void;
     setDepth(which: "up" | "down", generations: number): void;
     setDirection(direction: ChartDirection): void;
 }
@@ -30,6 +32,7 @@ export interface ViewActions {
 export class ViewChooser {
     readonly popover: Popover;
     private readonly buttons = new Map<ViewName, HTMLButtonElement>();
+    private readonly map: HTMLButtonElement;
     private readonly depths = new Map<"up" | "down", Depth>();
     private readonly direction: HTMLSelectElement;
     private readonly directionRow: HTMLElement;
@@ -40,6 +43,14 @@ export class ViewChooser {
     ) {
         const views = html("div", { class: "views", role: "group", "aria-label": ui.views.label });
         for (const view of kViewNames) views.append(this.viewButton(view));
+        this.map = html(
+            "button",
+            { id: "choose-map", type: "button", class: "view", "aria-pressed": "false" },
+            icon("map"),
+            html("span", {}, ui.map.name),
+        );
+        onClick(this.map, () => actions.setMap());
+        views.append(this.map);
         this.direction = html("select", { id: "direction" });
         for (const name of kDirections)
             this.direction.append(html("option", { value: name }, ui.directions[name]));
@@ -71,6 +82,11 @@ export class ViewChooser {
         this.depths.get("down")!.show(hasDown(view), down);
         this.directionRow.hidden = !hasDirection(view);
         this.direction.value = direction;
+    }
+
+    showMap(shown: boolean): void {
+        this.map.setAttribute("aria-pressed", String(shown));
+        if (shown) for (const button of this.buttons.values()) button.setAttribute("aria-pressed", "false");
     }
 
     private viewButton(view: ViewName): HTMLButtonElement {
