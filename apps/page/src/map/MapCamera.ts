@@ -16,7 +16,7 @@ export interface MapPlace {
 
 const kMostZoom = 3;
 const kMargin = 24; // px around everything
-const kFlight = 80; // ms: nobody waits for the map to arrive
+const kFlight = 50; // ms: nobody waits for the map to arrive
 export const kReadable = 0.8;
 
 export class MapCamera {
@@ -41,8 +41,9 @@ export class MapCamera {
     }
 
     get least(): number {
-        const width = (this.width - 2 * kMargin) / (this.area.right - this.area.left);
-        return Math.min(0.5, Math.max(width, 1e-7));
+        const { left, top, right, bottom } = this.area;
+        const [width, height] = [(this.width - 2 * kMargin) / (right - left), (this.height - 2 * kMargin) / (bottom - top)];
+        return Math.min(0.5, Math.max(Math.min(width, height), 1e-7));
     }
 
     get whole(): MapPlace {

@@ -19,6 +19,7 @@ export interface TextColours {
 const kNamedBox = 54; // px of a box from which on names are in it
 const kMostLabels = 48;
 const kYearGap = 30; // px between the years of rows
+const kYearRoom = 50; // px at the edge that are theirs
 const kMostCached = 6000;
 
 export class MapTexts {
@@ -106,7 +107,7 @@ export class MapTexts {
             const text = this.fitting(this.labelText(labels[4 * i + 2]!), 220 * frame.dpr);
             const half = context.measureText(text).width / 2 + 6 * frame.dpr;
             const box: [number, number, number, number] = [x - half, y - size, x + half, y + size];
-            if (taken.some((other) => overlap(other, box))) continue;
+            if (box[0] < kYearRoom * frame.dpr || box[2] > frame.width || taken.some((other) => overlap(other, box))) continue;
             taken.push(box);
             this.plate(colours, text, x, y, size);
         }
