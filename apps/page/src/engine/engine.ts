@@ -44,7 +44,8 @@ export async function embeddedFamily(): Promise<EmbeddedFamily | null> {
         livingHidden: stored.livingHidden === true,
         remarks: Array.isArray(stored.remarks) ? (stored.remarks as Diagnostic[]) : null,
         photographs: Photographs.embedded((stored.photos ?? {}) as Record<string, unknown>),
-        bytes: await gunzip(bytesOfBase64(String(stored.gzip ?? ""))),
+        bytes: stored.gzip ? await gunzip(bytesOfBase64(String(stored.gzip))) : new Uint8Array(),
+        hasMap: stored.map === true,
     };
 }
 

@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // Draws boxes and lines of a map straight into pixels: all of them are level or upright, so each is a few runs of one
-// colour, and a browser that draws in software is not asked for a hundred thousand paths. What is too small to be
-// told apart is not drawn one by one: of boxes within a column of pixels the first, of many lines the longest of each
+// colour, and a browser that draws in software is not asked for a hundred thousand paths. What is too small to
+// be distinguished is not drawn one by one: of boxes within a column of pixels the first, of many lines the longest of each
 // block. So the work grows with the window, not with the family.
 
 import { type FamilyMap, lowerBound } from "./FamilyMap";
