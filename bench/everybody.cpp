@@ -7,7 +7,9 @@
 //   bench_everybody FILE.ged --graph         that family as JSON, for others to place
 //   bench_everybody FILE.ged --place NAME    judges a placement: lines "id x y" of the corners of boxes on the standard
 //                                            input, lines drawn by our router in the same style
-//   bench_everybody FILE.ged --moved N       how many boxes stay where they are when one person is added, N times
+//   bench_everybody FILE.ged --moved N       how many boxes stay where they are when one person is added, N times, and with
+//                                            the places of the picture before kept
+//   bench_everybody FILE.ged --grown N       area and crossings after N more persons, places kept each time
 //   bench_everybody --made PERSONS           time and memory for a made population
 
 #include <olvane/charts/Everybody.h>
@@ -179,10 +181,10 @@ void judgePlacement(const KinGraph& graph, const std::string& name) {
 }
 
 // One more child of a union, or a first child of somebody, or a partner, in turns; whom, is spread over the family.
-KinGraph withOneMore(const KinGraph& graph, int turn, std::uint64_t random) {
+KinGraph withOneMore(const KinGraph& graph, int turn, std::uint64_t random, std::int64_t id = 1'000'000'000) {
     olvane::kin::KinGraphBuilder builder;
     copyTo(graph, std::vector<std::uint8_t>(static_cast<std::size_t>(graph.personCount()), 1), builder);
-    const Place added = builder.addPerson(1'000'000'000, olvane::kin::Sex::female);
+    const Place added = builder.addPerson(id, olvane::kin::Sex::female);
     const auto person = static_cast<Place>(random % static_cast<std::uint64_t>(graph.personCount()));
     if (turn % 3 == 0) {
         const auto u = static_cast<UnionPlace>(random % static_cast<std::uint64_t>(graph.unionCount()));
@@ -239,28 +241,60 @@ Kept keptIn(const Picture& before, const Picture& after) {
     return kept;
 }
 
-void measureMoved(const KinGraph& graph, int times) {
+// After one more person, N times; from scratch, and with the places of the picture before.
+void measureMoved(const KinGraph& graph, int times, bool keep) {
     for (const std::int32_t marks : {0, -1}) {
         EverybodyOptions options;
         options.marks = marks;
         options.focus = graph.personCount() / 2;
         const Picture before = everybodyChart(graph, options);
+        if (keep) options.earlier = &before;
         double moved = 0;
+        double ms = 0;
+        double crossings = 0;
         Kept kept;
         std::uint64_t random = 1;
         for (int i = 0; i < times; ++i) {
             random = random * 6364136223846793005U + 1442695040888963407U;
-            const Picture after = everybodyChart(withOneMore(graph, i, random >> 33U), options);
+            const KinGraph larger = withOneMore(graph, i, random >> 33U);
+            const auto start = std::chrono::steady_clock::now();
+            const Picture after = everybodyChart(larger, options);
+            ms += msSince(start) / times;
             moved += olvane::picture::movedShare(before, after) / times;
+            crossings += static_cast<double>(olvane::picture::judge(after, &larger).crossings) / times;
             const Kept once = keptIn(before, after);
             kept.row += once.row / times;
             kept.neighbours += once.neighbours / times;
         }
-        std::printf(
-            "marks %d: after one more person, over %d tries, %.1f%% of the boxes keep their place relative "
-            "to the focus, "
-            "%.1f%% their row, %.1f%% their right neighbour\n",
-            marks, times, 100 * (1 - moved), 100 * kept.row, 100 * kept.neighbours);
+        std::printf("| %s, marks %d | %.1f%% | %.2f%% | %.2f%% | %.0f | %.0f |\n",
+                    keep ? "places kept" : "from scratch", marks, 100 * (1 - moved), 100 * kept.row,
+                    100 * kept.neighbours, crossings, ms);
+        std::fflush(stdout);
+    }
+}
+
+// Persons added one after another, each time with the places of the picture before.
+void measureGrowth(KinGraph graph, int persons) {
+    EverybodyOptions options;
+    options.focus = graph.personCount() / 2;
+    Picture picture = everybodyChart(graph, options);
+    std::printf(
+        "| persons added | areas a person, kept | crossings, kept | areas a person, from scratch | "
+        "crossings, from scratch |\n"
+        "| ---: | ---: | ---: | ---: | ---: |\n");
+    std::uint64_t random = 7;
+    for (int i = 1; i <= persons; ++i) {
+        random = random * 6364136223846793005U + 1442695040888963407U;
+        graph = withOneMore(graph, i, random >> 33U, 1'000'000'000 + i);
+        options.earlier = &picture;
+        picture = everybodyChart(graph, options);
+        if (i != 1 && i != 10 && i % 100 != 0) continue;
+        options.earlier = nullptr;
+        const auto kept = olvane::picture::judge(picture, &graph);
+        const auto anew = olvane::picture::judge(everybodyChart(graph, options), &graph);
+        std::printf("| %d | %.1f | %zu | %.1f | %zu |\n", i, kept.areaPerPerson, kept.crossings,
+                    anew.areaPerPerson, anew.crossings);
+        std::fflush(stdout);
     }
 }
 
@@ -300,7 +334,14 @@ int run(const std::vector<std::string>& arguments) {
     } else if (arguments.size() == 3 && arguments[1] == "--place") {
         judgePlacement(graph, arguments[2]);
     } else if (arguments.size() == 3 && arguments[1] == "--moved") {
-        measureMoved(graph, std::stoi(arguments[2]));
+        std::printf(
+            "| after one more person, %s times | keep their place relative to the focus | their row | their "
+            "right neighbour | crossings | ms |\n"
+            "| --- | ---: | ---: | ---: | ---: | ---: |\n",
+            arguments[2].c_str());
+        for (const bool keep : {false, true}) measureMoved(graph, std::stoi(arguments[2]), keep);
+    } else if (arguments.size() == 3 && arguments[1] == "--grown") {
+        measureGrowth(graph, std::stoi(arguments[2]));
     } else {
         throw std::runtime_error("what?");
     }

@@ -47,6 +47,7 @@ EverybodyOptions everybodyOptions(const ChartRequest& request) {
     options.effort = request.effort;
     options.onePart = request.onePart;
     options.aspect = request.aspect;
+    options.earlier = request.earlier;
     options.compact = request.compact;
     options.direction = request.direction;
     options.sizes = request.sizes;

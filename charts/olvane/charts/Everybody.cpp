@@ -4,6 +4,7 @@
 #include <olvane/charts/Everybody.h>
 
 #include <algorithm>
+#include <optional>
 #include <stdexcept>
 #include <utility>
 
@@ -18,11 +19,15 @@ bool runsSideways(Direction direction) {
     return direction == Direction::left || direction == Direction::right;
 }
 
+bool isMirrored(Direction direction) {
+    return direction == Direction::up || direction == Direction::left;
+}
+
 // From a chart that runs down to one that runs the way that was asked for.
 void turn(picture::Picture& picture, Direction direction) {
     double bottom = 0;
     for (const picture::Box& box : picture.boxes) bottom = std::max(bottom, box.y + double{box.height});
-    const bool mirror = direction == Direction::up || direction == Direction::left;
+    const bool mirror = isMirrored(direction);
     const bool sideways = runsSideways(direction);
     for (picture::Box& box : picture.boxes) {
         if (mirror) box.y = bottom - box.y - double{box.height};
@@ -56,11 +61,15 @@ picture::Picture everybodyChart(const kin::KinGraph& graph, const EverybodyOptio
     boxes.gapY = double{options.sizes.gapY};
     std::vector<PartLayout> parts;
     EverybodyOptions left = options;
+    std::optional<EarlierPicture> earlier;
+    if (options.earlier != nullptr && !options.earlier->isRound()) {
+        earlier = earlierPictureOf(graph, *options.earlier, boxes.turned, isMirrored(options.direction));
+    }
     if (boxes.turned && options.aspect > 0) left.aspect = 1 / options.aspect;
     for (const Component& part : componentsOf(graph)) {
         const bool hasFocus = std::binary_search(part.persons.begin(), part.persons.end(), options.focus);
         if (options.onePart && !hasFocus) continue;
-        parts.push_back(layOutPart(part, boxes, left));
+        parts.push_back(layOutPart(part, boxes, left, earlier ? &*earlier : nullptr));
         if (left.marks > 0) left.marks = std::max(0, left.marks - parts.back().marksMade);
     }
     picture::Picture picture = pictureOfParts(graph, parts, boxes, options.focus);

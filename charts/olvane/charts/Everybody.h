@@ -32,6 +32,10 @@ struct EverybodyOptions {
     double aspect = 0;
     // Lines lie closer together, and gaps between rows are no higher than their lines ask for.
     bool compact = false;
+    // An earlier chart of the same family, in the same direction, whose rows, order and places are kept where a change
+    // leaves them: who is new is inserted where the fewest lines cross, and what has no room is moved aside. Read
+    // during the call only; may be null. A chart that less than half of the family is in is not kept.
+    const picture::Picture* earlier = nullptr;
     Direction direction = Direction::down;
     ChartSizes sizes;
     std::span<const BoxSize> boxSizes;  // as in ChartRequest

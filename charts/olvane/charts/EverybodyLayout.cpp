@@ -26,6 +26,7 @@ struct TrackSizes {
     double gap = 4;
     double step = 24;
 };
+constexpr double kLeastMargin = 5;
 constexpr TrackSizes kUsualTracks;
 constexpr TrackSizes kCompactTracks{6, 3, 1};
 // How near to the side of its box a line may end.
@@ -35,10 +36,12 @@ constexpr double kMostPassMove = 20;
 
 class PartLayouter {
 public:
-    PartLayouter(PartLayout& layout, const BoxSizes& boxes, const EverybodyOptions& options)
+    PartLayouter(PartLayout& layout, const BoxSizes& boxes, const EverybodyOptions& options,
+                 const EarlierPicture* earlier)
         : l_(layout),
           boxes_(boxes),
           options_(options),
+          earlier_(earlier),
           tracks_(options.compact ? kCompactTracks : kUsualTracks) {
         l_.trackGap = tracks_.gap;
     }
@@ -47,18 +50,55 @@ public:
     // in the rows, which decides over crossings; then places, which keep the order; lines last.
     void layOut() {
         l_.chains = weldCouples(l_.part);
-        const std::vector<std::int32_t> rows = chooseRows(l_.part, l_.chains, levelEffort());
-        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
-        if (options_.marks < 0) markAllSecondLinks(l_.part, l_.chains, rows, l_.marked);
         measureChains();
-        orderRows(rows);
-        measureEnds();
-        l_.left = placeNodes(l_.rows, l_.order, l_.sizes, 0, kSweeps);
+        if (earlier_ == nullptr || !placeAsBefore()) place();
         l_.lines = routeGaps(l_.rows, endRanges());
         stackRows();
     }
 
 private:
+    void place() {
+        const std::vector<std::int32_t> rows = chooseRows(l_.part, l_.chains, levelEffort());
+        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
+        if (options_.marks < 0) markAllSecondLinks(l_.part, l_.chains, rows, l_.marked);
+        orderRows(rows);
+        measureEnds();
+        l_.left = placeNodes(l_.rows, l_.order, l_.sizes, 0, kSweeps);
+    }
+
+    // False where that is another family, or where lines would cross in spite of all marks.
+    bool placeAsBefore() {
+        std::vector<double> widths;
+        for (std::int32_t person = 0; person < l_.part.personCount(); ++person) {
+            widths.push_back(boxes_.width(l_.part, person));
+        }
+        const KeptRows kept = rowsAsBefore(l_.part, l_.chains, *earlier_, widths);
+        if (kept.rowOfChain.empty()) return false;
+        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
+        if (options_.marks < 0) {
+            markAllSecondLinks(l_.part, l_.chains, kept.rowOfChain, l_.marked);
+        } else if (options_.marks > 0) {
+            markAsBefore(l_.part, *earlier_, l_.marked);
+        }
+        const std::vector<double> chainWidths = l_.sizes.width;
+        l_.rows = makeRows(l_.part, l_.chains, kept.rowOfChain, l_.marked);
+        l_.sizes.width.resize(at(l_.rows.nodeCount()), 0);
+        std::vector<double> wanted =
+            placesAsBefore(l_.part, l_.chains, l_.rows, kept, *earlier_, l_.sizes, widths);
+        std::vector<std::uint8_t> isNew(wanted.size());
+        for (std::size_t node = 0; node < wanted.size(); ++node)
+            isNew[node] = std::isnan(wanted[node]) ? 1 : 0;
+        l_.order = orderAsBefore(l_.part, l_.chains, l_.rows, *earlier_, l_.sizes, wanted);
+        if (options_.marks < 0 && countCrossings(l_.rows, l_.order) > 0) {
+            l_.sizes.width = chainWidths;
+            return false;
+        }
+        measureEnds();
+        l_.left = placesNear(l_.rows, l_.order, l_.sizes, wanted, isNew);
+        middleBefore_ = kept.middle;
+        return true;
+    }
+
     static constexpr int kSweeps = 24;
 
     std::int64_t levelEffort() const { return 20'000'000 + 40 * std::int64_t{l_.part.personCount()}; }
@@ -270,8 +310,7 @@ private:
             const std::int32_t tracks = l_.lines.tracks[at(gap + 1)];
             const bool outside = gap < 0 || gap + 1 == l_.rows.rowCount;
             const double used = tracks > 0 ? (tracks - 1) * tracks_.gap : 0;
-            const double height =
-                outside ? (tracks > 0 ? used + tracks_.margin : 0) : gapHeight(used + 2 * tracks_.margin);
+            const double height = outside ? (tracks > 0 ? used + tracks_.margin : 0) : gapHeight(gap, used);
             l_.gapTop[at(gap + 1)] = outside ? y + (gap < 0 ? 0 : tracks_.margin) : y + (height - used) / 2;
             y += height;
         }
@@ -281,22 +320,36 @@ private:
         }
     }
 
-    // In whole steps beyond the least.
-    double gapHeight(double needed) const {
+    // As before where the tracks have room, if closer to the boxes; else in whole steps beyond the least.
+    double gapHeight(std::int32_t gap, double used) const {
+        const double before = heightBefore(gap);
+        if (used + 2 * std::min(tracks_.margin, kLeastMargin) <= before) return before;
         const double least = boxes_.gapY;
+        const double needed = used + 2 * tracks_.margin;
         return needed <= least ? least : least + std::ceil((needed - least) / tracks_.step) * tracks_.step;
+    }
+
+    // Of the gap below a row; less than 0 where there was none.
+    double heightBefore(std::int32_t gap) const {
+        if (at(gap) + 1 >= middleBefore_.size()) return -1;
+        const double height = middleBefore_[at(gap) + 1] - middleBefore_[at(gap)] -
+                              (l_.rowHeight[at(gap)] + l_.rowHeight[at(gap) + 1]) / 2;
+        return height >= boxes_.gapY ? height : -1;  // not a number with a new row
     }
 
     PartLayout& l_;
     const BoxSizes& boxes_;
     const EverybodyOptions& options_;
+    const EarlierPicture* earlier_;
+    std::vector<double> middleBefore_;  // by row, in an earlier picture whose places are kept
     const TrackSizes& tracks_;
 };
 
-PartLayout layOutOnce(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options) {
+PartLayout layOutOnce(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options,
+                      const EarlierPicture* earlier) {
     PartLayout layout;
     layout.part = part;
-    PartLayouter(layout, boxes, options).layOut();
+    PartLayouter(layout, boxes, options, earlier).layOut();
     return layout;
 }
 
@@ -312,7 +365,7 @@ PartLayout layOutForPaper(const Component& part, const BoxSizes& boxes, Everybod
     PartLayout best;
     for (const double share : kShares) {
         options.foldAspect = options.aspect * share;
-        PartLayout layout = layOutOnce(part, boxes, options);
+        PartLayout layout = layOutOnce(part, boxes, options, nullptr);
         const bool better =
             share == 1 || sheetHeight(layout, options.aspect) < sheetHeight(best, options.aspect);
         if (better) best = std::move(layout);
@@ -323,8 +376,10 @@ PartLayout layOutForPaper(const Component& part, const BoxSizes& boxes, Everybod
 
 }  // namespace
 
-PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options) {
-    return options.aspect > 0 ? layOutForPaper(part, boxes, options) : layOutOnce(part, boxes, options);
+PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options,
+                      const EarlierPicture* earlier) {
+    const bool forPaper = options.aspect > 0 && earlier == nullptr;
+    return forPaper ? layOutForPaper(part, boxes, options) : layOutOnce(part, boxes, options, earlier);
 }
 
 }  // namespace olvane::charts

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include <olvane/charts/Everybody.h>
+#include <olvane/charts/EverybodyKeptInternal.h>
 #include <olvane/charts/EverybodyLinesInternal.h>
 #include <olvane/charts/EverybodyPlacesInternal.h>
 
@@ -58,6 +59,8 @@ private:
     }
 };
 
-PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options);
+// earlier: whose places are kept where that is possible; may be null.
+PartLayout layOutPart(const Component& part, const BoxSizes& boxes, const EverybodyOptions& options,
+                      const EarlierPicture* earlier);
 
 }  // namespace olvane::charts

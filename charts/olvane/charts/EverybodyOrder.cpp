@@ -265,6 +265,11 @@ public:
         }
         return gain;
     }
+    void runOver(const std::vector<std::int32_t>& nodes, std::int32_t window) {
+        window_ = window;
+        drift_ = false;
+        for (const std::int32_t node : nodes) sift(node);
+    }
     std::int64_t effort() const { return effort_; }
 
     void finish() {
@@ -429,6 +434,14 @@ std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t eff
     }
     sifting.finish();
     return sifting.effort();
+}
+
+void siftNodes(const Rows& rows, RowOrder& order, const std::vector<std::int32_t>& nodes) {
+    constexpr std::int32_t kWindow = 60;
+    constexpr std::int64_t kEffort = 20'000'000;
+    Sifting sifting(rows, order, kEffort);
+    sifting.runOver(nodes, kWindow);
+    sifting.finish();
 }
 
 // Whether every chain hangs from one strand at most, and every strand from one end: a walk then crosses nothing.

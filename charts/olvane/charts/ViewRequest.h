@@ -9,6 +9,7 @@
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Language.h>
+#include <olvane/picture/Picture.h>
 
 namespace olvane::charts {
 
@@ -80,6 +81,8 @@ struct ChartRequest {
     int marks = 0;        // everybody: how many second links become marks; -1 for all of them
     int effort = 1;       // everybody: 0 is quickest, each step more takes up to twice the time
     bool onePart = true;  // everybody: only the part of the family that the focus is in
+    // Everybody: an earlier picture of it whose places are kept where a change leaves them; see EverybodyOptions.
+    const picture::Picture* earlier = nullptr;
     double aspect =
         0;  // everybody: width by height of the paper that wide generations are folded for; 0 for none
 };
