@@ -24,7 +24,7 @@ from wheel.bdist_wheel import bdist_wheel
 
 ROOT = pathlib.Path(__file__).resolve().parent
 PACKAGE = ROOT / "bindings" / "python" / "olvane"
-LIBRARY_PARTS = ["boost", "unicode-data"]
+LIBRARY_PARTS = ["boost", "unicode-data", "utf8proc"]
 os.environ.setdefault("SOURCE_DATE_EPOCH", "315532800")
 os.umask(0o022)
 
@@ -59,6 +59,8 @@ def built_library(folder: pathlib.Path) -> pathlib.Path:
         "OLVANE_BUILD_FOUNDATION": "OFF",
         "OLVANE_BUILD_C": "ON",
         "OLVANE_BUILD_PAGE": "OFF",
+        "OLVANE_STATIC_UTF8PROC": "ON",
+        "OLVANE_GEDCOM_ZIP": "OFF",  # libzip needs a dozen libraries more; the package unpacks archives itself
     }
     generator = ["-G", "Ninja"] if shutil.which("ninja") else []
     given = [f"-D{name}={value}" for name, value in options.items()]

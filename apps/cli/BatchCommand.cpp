@@ -22,10 +22,10 @@
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/ParallelWork.h>
-#include <cli/PersonFinder.h>
 #include <cli/PictureRun.h>
 #include <cli/TableCells.h>
 #include <cli/UsageError.h>
+#include <olvane/source/PersonFinder.h>
 
 namespace olvane::cli {
 
@@ -124,7 +124,7 @@ private:
     }
 
     const gedcom::GedcomData& data_;
-    PersonFinder finder_;
+    gedcom::PersonFinder finder_;
     std::string from_;
     std::size_t perBlock_;
     std::unique_ptr<std::ifstream> file_;

@@ -9,8 +9,8 @@
 #include <sstream>
 #include <vector>
 
-#include <cli/PersonFinder.h>
 #include <cli/UsageError.h>
+#include <olvane/source/PersonFinder.h>
 
 namespace olvane::cli {
 
@@ -38,7 +38,7 @@ bool isAscii(const std::string& word) {
     return std::all_of(word.begin(), word.end(), [](char c) { return static_cast<unsigned char>(c) < 0x80; });
 }
 
-void addMatches(PersonFinder& finder, const std::string& word, std::vector<gedcom::PersonId>& found) {
+void addMatches(gedcom::PersonFinder& finder, const std::string& word, std::vector<gedcom::PersonId>& found) {
     for (const gedcom::PersonId id : finder.find(word, kMostCandidates)) {
         if (std::find(found.begin(), found.end(), id) == found.end()) found.push_back(id);
     }
@@ -46,7 +46,7 @@ void addMatches(PersonFinder& finder, const std::string& word, std::vector<gedco
 
 // Persons whom a mistyped name may mean: by all of its words as they are written nearly, by one of them, or else by
 // how a word begins.
-std::vector<gedcom::PersonId> similarPersons(PersonFinder& finder, const std::string& who) {
+std::vector<gedcom::PersonId> similarPersons(gedcom::PersonFinder& finder, const std::string& who) {
     std::vector<gedcom::PersonId> found = finder.find(who, kMostCandidates);
     if (!found.empty()) return found;
     for (const std::string& word : wordsOf(who)) addMatches(finder, word, found);
@@ -57,7 +57,7 @@ std::vector<gedcom::PersonId> similarPersons(PersonFinder& finder, const std::st
     return found;
 }
 
-[[noreturn]] void refuseUnknown(const gedcom::GedcomData& data, PersonFinder& finder,
+[[noreturn]] void refuseUnknown(const gedcom::GedcomData& data, gedcom::PersonFinder& finder,
                                 const std::string& who) {
     const std::vector<gedcom::PersonId> similar = similarPersons(finder, who);
     const std::string start = data.file() + ": no person is called '" + who + "'";
@@ -76,7 +76,7 @@ std::string years(const gedcom::Person& person) {
 }  // namespace
 
 gedcom::PersonId chooseFocus(const gedcom::GedcomData& data, const std::string& who) {
-    PersonFinder finder(data);
+    gedcom::PersonFinder finder(data);
     const std::vector<gedcom::PersonId> found = finder.meant(who);
     if (found.empty()) refuseUnknown(data, finder, who);
     if (found.size() > 1) {

@@ -10,7 +10,7 @@
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PeopleList.h>
-#include <cli/PersonFinder.h>
+#include <olvane/source/PersonFinder.h>
 
 namespace olvane::cli {
 
@@ -43,7 +43,7 @@ int runPeople(const PeopleOptions& options) {
     const std::string words = joined(options.words);
     const bool needsFacts = options.format != ListFormat::text || !words.empty();
     const gedcom::GedcomData data = needsFacts ? readFileWithFacts(options.input) : readFile(options.input);
-    const auto persons = words.empty() ? everybody(data) : PersonFinder(data).find(words);
+    const auto persons = words.empty() ? everybody(data) : gedcom::PersonFinder(data).find(words);
     writeReport(textOf(data, persons, options.format));
     if (!persons.empty()) return 0;
     printMessage(

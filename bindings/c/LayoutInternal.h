@@ -5,9 +5,12 @@
 
 #include <olvane.h>
 
+#include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
+#include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/boundary/TypedLayout.h>
 
 // The opaque layout: what the engine filled, and the form in which C reads it.
@@ -25,5 +28,11 @@ namespace olvane::c {
 
 // The options of a C host as the engine takes them.
 LayoutOptions layoutOptionsOf(const olvane_options& options);
+
+typedef std::function<std::shared_ptr<OlvaneViewerManagerWrapProtocol>()> MakeSource;
+
+// A layout of a source in C++, with all checks of what C passes in; view is an olvane_view_kind.
+olvane_status layOutSource(const MakeSource& makeSource, std::int32_t view, std::int64_t focus,
+                           const olvane_options* options, olvane_layout** layout) noexcept;
 
 }  // namespace olvane::c

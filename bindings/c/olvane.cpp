@@ -241,10 +241,10 @@ olvane::LayoutOptions layoutOptionsOf(const olvane_options& options) {
     return result;
 }
 
-// What both views ask for. Exactly one of host and family is there.
+// What both views ask for. Exactly one of host and source is there.
 struct Request {
     const olvane_host* host;
-    const olvane_family* family;
+    std::shared_ptr<OlvaneViewerManagerWrapProtocol> source;
     std::int64_t focus;
     const olvane_options& options;
     TypedLayout::View view;
@@ -252,7 +252,7 @@ struct Request {
 
 std::shared_ptr<OlvaneViewerManagerWrapProtocol> managerOf(const Request& request) {
     if (request.host) return std::make_shared<CallbackManager>(*request.host);
-    return std::make_shared<olvane::FamilyDataSource>(request.family->table);
+    return request.source;
 }
 
 olvane_status statusOfRun(const Request& request, olvane_layout& layout) {
@@ -345,6 +345,22 @@ olvane::LayoutOptions olvane::c::layoutOptionsOf(const olvane_options& options) 
     return ::layoutOptionsOf(options);
 }
 
+olvane_status olvane::c::layOutSource(const MakeSource& makeSource, std::int32_t view, std::int64_t focus,
+                                      const olvane_options* options, olvane_layout** layout) noexcept {
+    if (!layout) return OLVANE_INVALID_ARGUMENT;
+    *layout = nullptr;
+    const olvane_options chosen = options ? *options : defaultOptions();
+    const bool isFamilyView = view == OLVANE_VIEW_FAMILY;
+    if (!(isFamilyView || view == OLVANE_VIEW_PEDIGREE) || !areInRange(chosen))
+        return OLVANE_INVALID_ARGUMENT;
+    const auto chosenView = isFamilyView ? TypedLayout::View::family : TypedLayout::View::pedigree;
+    try {
+        return ::layOut(Request{nullptr, makeSource(), focus, chosen, chosenView}, layout);
+    } catch (...) {
+        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
+    }
+}
+
 const char* olvane_status_text(olvane_status status) {
     switch (status) {
         case OLVANE_OK:
@@ -365,6 +381,8 @@ const char* olvane_status_text(olvane_status status) {
             return "Rows of a family are wrong; nothing has changed, and the error says where.";
         case OLVANE_INVALID_ID:
             return "A callback answered a number that is no id of a person: ids are 1 to 2147483647.";
+        case OLVANE_UNREADABLE:
+            return "There is nothing to read: the file cannot be opened, or is not GEDCOM.";
     }
     return "This number is not a status of this version.";
 }
@@ -413,15 +431,11 @@ olvane_status olvane_layout_pedigree(const olvane_host* host, int64_t focus, con
 
 olvane_status olvane_view(const olvane_family* family, int32_t view, int64_t focus,
                           const olvane_options* options, olvane_layout** layout) {
-    if (!layout) return OLVANE_INVALID_ARGUMENT;
-    *layout = nullptr;
-    const olvane_options chosen = options ? *options : defaultOptions();
-    const bool isFamilyView = view == OLVANE_VIEW_FAMILY;
-    if (!family || !(isFamilyView || view == OLVANE_VIEW_PEDIGREE) || !areInRange(chosen))
-        return OLVANE_INVALID_ARGUMENT;
+    if (layout) *layout = nullptr;
+    if (!family) return OLVANE_INVALID_ARGUMENT;
     const std::int64_t known = family->table.hasPerson(focus) ? focus : 0;
-    const auto chosenView = isFamilyView ? TypedLayout::View::family : TypedLayout::View::pedigree;
-    return layOut({nullptr, family, known, chosen, chosenView}, layout);
+    const auto source = [&] { return std::make_shared<olvane::FamilyDataSource>(family->table); };
+    return olvane::c::layOutSource(source, view, known, options, layout);
 }
 
 void olvane_layout_free(olvane_layout* layout) {

@@ -50,7 +50,8 @@ typedef enum olvane_status {
     OLVANE_NESTED_CALL = 6, /* asked for by a callback of a layout that is still running on this thread */
     OLVANE_REFUSED = 7,     /* rows of a family are wrong; nothing has changed, and the error says where */
     OLVANE_INVALID_ID =
-        8 /* a callback answered an id that is not 1 to 2147483647; the layout holds what came before */
+        8, /* a callback answered an id that is not 1 to 2147483647; the layout holds what came before */
+    OLVANE_UNREADABLE = 9 /* a file cannot be opened, or is not GEDCOM */
 } olvane_status;
 
 /* A sentence in English for every status, and for any other number one that says so. Lives for ever. */

@@ -8,6 +8,10 @@ A :class:`Family` is handed over once, as rows or columns or by two queries. One
     for record in olvane.layout(family, 17):
         draw_box(record.id, record.x, record.y)
 
+A GEDCOM file is drawn in one call, and a notebook shows the picture::
+
+    olvane.draw("family.ged", "Charles Darwin", view="hourglass")
+
 A host that keeps its data elsewhere is any object with the eight methods of :class:`Host`, in the family's place. It is
 asked many times, and so takes many times longer.
 
@@ -19,18 +23,23 @@ Layouts may run on several threads at once, if their hosts may be asked so; a ho
 
 from olvane._errors import HostError, LayoutError, Status
 from olvane._family import ChildKind, Family, FamilyError, FamilyRow, FamilyState, NameKind, Person
+from olvane._file import DrawView, File, FileError, Remark, draw
 from olvane._host import Host
 from olvane._layout import MOST_RELATIVES, family_layout, layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
 from olvane._picture import LineRole, MarkKind, Picture, PictureBox, PictureFamily, PictureLine, PictureMark, picture
 from olvane._records import Layout, Record, RecordKind, Segment
+from olvane._svg import Svg
 
 __all__ = [
     "ChildKind",
+    "DrawView",
     "Family",
     "FamilyError",
     "FamilyRow",
     "FamilyState",
+    "File",
+    "FileError",
     "Host",
     "HostError",
     "Layout",
@@ -48,11 +57,14 @@ __all__ = [
     "PictureMark",
     "Record",
     "RecordKind",
+    "Remark",
     "Segment",
     "Shown",
     "Sizes",
     "Status",
+    "Svg",
     "View",
+    "draw",
     "family_layout",
     "layout",
     "layout_text",

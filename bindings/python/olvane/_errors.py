@@ -22,6 +22,7 @@ class Status(IntEnum):
     NESTED_CALL = 6
     REFUSED = 7
     INVALID_ID = 8
+    UNREADABLE = 9
 
 
 class LayoutError(Exception):

@@ -158,11 +158,16 @@ class Family:
         """A copy for undo: made at once, whatever the size, and changed on its own."""
         made = c_void_p()
         _raise(_native.library.olvane_family_copy(self._pointer, byref(made)))
-        other = Family.__new__(Family)
-        other._pointer = made.value
-        return other
+        return Family._of(made)
 
     __copy__ = copy
+
+    @classmethod
+    def _of(cls, made: c_void_p) -> Family:
+        """Of a table that the library made, which now belongs to the Family."""
+        other = cls.__new__(cls)
+        other._pointer = made.value
+        return other
 
     def __deepcopy__(self, memo: dict[int, Any]) -> Family:
         return self.copy()

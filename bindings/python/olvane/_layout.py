@@ -47,7 +47,10 @@ def layout(host: Host | Family, focus: int, view: View = View.FAMILY, options: O
 
 def family_layout(family: Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> Layout:
     """The layout of a Family as one object, whose records are made when they are looked at."""
-    return _family_laid_out(family, focus, view, options, _records_of)
+    made = _family_laid_out(family, focus, view, options, _records_of)
+    if options is not None:
+        made._box = (options.sizes.node_width, options.sizes.node_height)
+    return made
 
 
 def layout_text(host: Host | Family, focus: int, view: View = View.FAMILY, options: Options | None = None) -> str:

@@ -5,6 +5,7 @@
 from __future__ import annotations
 
 import ctypes
+from collections.abc import Callable
 from ctypes import POINTER, byref, c_double, c_float, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
 from dataclasses import dataclass
 from enum import IntEnum
@@ -16,6 +17,7 @@ from olvane._family import ChildKind, Family, FamilyState
 from olvane._host import Host
 from olvane._layout import _laid_out, _message, _request, _Request
 from olvane._options import Options, View
+from olvane._svg import Svg, plain_drawing
 
 
 class LineRole(IntEnum):
@@ -104,6 +106,16 @@ class Picture:
     boxes: tuple[PictureBox, ...]
     families: tuple[PictureFamily, ...]
     marks: tuple[PictureMark, ...]
+
+    def svg(self, label: Callable[[int], str] = str) -> Svg:
+        """A plain drawing; label gives the text of a person's box, and is the id by default."""
+        return plain_drawing(
+            ((box.x, box.y, box.width, box.height, "" if box.id is None else label(box.id)) for box in self.boxes),
+            ((line.x1, line.y1, line.x2, line.y2) for family in self.families for line in family.lines),
+        )
+
+    def _repr_svg_(self) -> str:
+        return self.svg()
 
 
 def picture(

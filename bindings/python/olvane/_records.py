@@ -6,9 +6,11 @@ from __future__ import annotations
 
 import ctypes
 import struct
-from collections.abc import Iterable, Iterator, Sequence
+from collections.abc import Callable, Iterable, Iterator, Sequence
 from enum import IntEnum
 from typing import NamedTuple, overload
+
+from olvane._svg import Svg, plain_drawing
 
 
 class RecordKind(IntEnum):
@@ -69,12 +71,13 @@ class Layout(Sequence[Record]):
     Equal layouts compare equal. Iterating makes all records; so does list.
     """
 
-    __slots__ = ("_records", "_segments", "_first_segment")
+    __slots__ = ("_records", "_segments", "_first_segment", "_box")
 
     def __init__(self, records: bytes, segments: bytes, first_segment: int) -> None:
         self._records = records
         self._segments = segments
         self._first_segment = first_segment  # where they lay, for records say where theirs begin
+        self._box = (55.0, 80.0)  # width and height, for a drawing
 
     @classmethod
     def copied_from(cls, address: int | None, count: int) -> Layout:
@@ -119,6 +122,16 @@ class Layout(Sequence[Record]):
 
     def __hash__(self) -> int:
         return hash((len(self), self._segments))
+
+    def svg(self, label: Callable[[int], str] = str) -> Svg:
+        """A plain drawing; label gives the text of a person's box, and is the id by default."""
+        return plain_drawing(
+            ((record.x, record.y, *self._box, label(record.id) if record.id > 0 else "") for record in self),
+            (segment for record in self for segment in record.segments),
+        )
+
+    def _repr_svg_(self) -> str:
+        return self.svg()
 
     def __repr__(self) -> str:
         return f"Layout({list(self)!r})"

@@ -10,6 +10,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include <olvane/kin/RemarkJson.h>
 #include <olvane/picture/PictureNames.h>
 
 namespace olvane::picture {
@@ -32,22 +33,7 @@ std::string number(double value) {
 }
 
 std::string quoted(std::string_view text) {
-    constexpr std::string_view kHex = "0123456789abcdef";
-    std::string json = "\"";
-    for (const char c : text) {
-        const auto byte = static_cast<unsigned char>(c);
-        if (c == '"' || c == '\\') {
-            json += '\\';
-            json += c;
-        } else if (byte < 0x20) {
-            json += "\\u00";
-            json += kHex[byte >> 4];
-            json += kHex[byte & 15];
-        } else {
-            json += c;
-        }
-    }
-    return json + "\"";
+    return kin::jsonText(text);
 }
 
 template <class Values, class Text>

@@ -10,7 +10,7 @@
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/kin/PersonIndex.h>
 
-namespace olvane::cli {
+namespace olvane::gedcom {
 
 // The persons of a file by what a user types. The index is made at the first text that is no identifier.
 //
@@ -18,21 +18,21 @@ namespace olvane::cli {
 // Threads: one call at a time.
 class PersonFinder {
 public:
-    explicit PersonFinder(const gedcom::GedcomData& data) : data_(data) {}
+    explicit PersonFinder(const GedcomData& data) : data_(data) {}
 
     // Everybody who fits, the best first. Whoever has the text as xref or number is the only one.
-    std::vector<gedcom::PersonId> find(const std::string& text,
-                                       std::size_t limit = std::numeric_limits<std::size_t>::max());
+    std::vector<PersonId> find(const std::string& text,
+                               std::size_t limit = std::numeric_limits<std::size_t>::max());
     // Those whom the text can only mean: whose names have each word or a word that begins so; where there is nobody,
     // those in whose records all words stand.
-    std::vector<gedcom::PersonId> meant(const std::string& text);
+    std::vector<PersonId> meant(const std::string& text);
 
 private:
-    gedcom::PersonId byIdentifier(const std::string& text) const;
+    PersonId byIdentifier(const std::string& text) const;
     const kin::PersonIndex& index();
 
-    const gedcom::GedcomData& data_;
+    const GedcomData& data_;
     std::unique_ptr<kin::PersonIndex> index_;
 };
 
-}  // namespace olvane::cli
+}  // namespace olvane::gedcom
