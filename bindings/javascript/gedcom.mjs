@@ -189,7 +189,9 @@ export class GedcomFile {
         try {
             const count = exports.picture_count(answer) >>> 0;
             const pointer = exports.picture_numbers(answer) >>> 0;
-            return pictureFrom(options.view ?? "family", new Float64Array(exports.memory.buffer, pointer, count));
+            const values = new Float64Array(exports.memory.buffer, pointer, count);
+            const texts = () => JSON.parse(this.#instance.text(exports.last_text()));
+            return pictureFrom(options.view ?? "family", values, texts);
         } finally {
             exports.picture_free(answer);
         }

@@ -187,12 +187,21 @@ export interface PictureOptions {
     ways?: "blood" | "marriage" | "both" | undefined;
     /** Kinship: how many ways are drawn, the nearest first, and 0 for all; 8. */
     mostWays?: number | undefined;
+    /** Kinship: of its words; English. */
+    language?: "en" | "de" | "es" | undefined;
     /** Everybody: how many second parent links become marks, -1 for all of them; 0. */
     marks?: number | undefined;
     /** Everybody: steps of work, 0 to 100; 1. */
     effort?: number | undefined;
+    /** Everybody: those as well who are not connected with the focus; false. */
+    allParts?: boolean | undefined;
     /** Family and pedigree: whether unknown parents have boxes; true. */
     unknownParents?: boolean | undefined;
+    /** Whose parents come first where somebody is a child of several families: those by birth, if not given. */
+    parents?: "birth" | "adoptive" | "allInOrder" | undefined;
+    /** One person, and the family whose partners are that person's parents whatever parents says; 0 for nobody. */
+    parentsOf?: number | undefined;
+    parentFamily?: number | undefined;
     /** Of a box, in points: 55 by 80. */
     width?: number | undefined;
     height?: number | undefined;
@@ -221,6 +230,8 @@ export interface PictureBox {
     readonly repeat: number;
     /** How many relatives have no box. */
     readonly hidden: { readonly parents: number; readonly partners: number; readonly children: number };
+    /** Families that the person is a child of, beside the one that comes first, of whose partners none has a box. */
+    readonly furtherParents: number;
     /** The engine's own flag, in its two views; else null. */
     readonly flag: boolean | null;
 }
@@ -281,6 +292,30 @@ export interface Picture {
     readonly rings: PictureRings | null;
     readonly families: readonly PictureFamily[];
     readonly marks: readonly PictureMark[];
+    /** Of the view of kinship; else null. */
+    readonly kinship: PictureKinship | null;
+}
+
+/** How the focus and another person are related: by which ways, those by blood first, and in words at both ends. */
+export interface PictureKinship {
+    readonly other: PictureIndex;
+    /** What the focus is to the other person; empty where no way is known. */
+    readonly focusIs: string;
+    /** What the other person is to the focus. */
+    readonly otherIs: string;
+    readonly ways: readonly PictureWay[];
+}
+
+export interface PictureWay {
+    readonly kind: "blood" | "legal" | "marriage";
+    /** What the other person is to the focus by this way alone. */
+    readonly words: string;
+    /** From the focus to the other person. */
+    readonly boxes: readonly PictureIndex[];
+    /** The common ancestors at its top. */
+    readonly ancestors: readonly PictureIndex[];
+    /** Straight pieces along the lines of families, or beside them where several ways take one line. */
+    readonly lines: readonly { readonly x1: number; readonly y1: number; readonly x2: number; readonly y2: number }[];
 }
 
 /** A file that is no GEDCOM file. */

@@ -9,7 +9,8 @@ const ROLES = ["marriage", "drop", "bar", "stem", "link"];
 const STYLES = ["married", "divorced", "unmarried", "unknown"];
 const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
-const HEAD = 11;
+const WAY_KINDS = ["blood", "legal", "marriage"];
+const HEAD = 15;
 
 function boxAt(n, at, index) {
     return {
@@ -24,6 +25,7 @@ function boxAt(n, at, index) {
         childOf: n[at + 5] < 0 ? null : n[at + 5],
         repeat: n[at + 6],
         hidden: { parents: n[at + 7], partners: n[at + 8], children: n[at + 9] },
+        furtherParents: n[at + 13],
         flag: n[at + 12] < 0 ? null : n[at + 12] > 0,
     };
 }
@@ -60,10 +62,26 @@ function markAt(n, at) {
     return { kind: MARK_KINDS[n[at]], number: n[at + 1], boxes };
 }
 
-/** The picture of a view; numbers may be memory of the module's, which is not kept. */
-export function pictureFrom(view, numbers) {
+function wayAt(n, at, words, { wayBoxes, pieces }) {
+    const [firstBox, boxCount, ancestorCount, firstPiece, pieceCount, kind] = n.subarray(at, at + 6);
+    const boxes = wayBoxes + firstBox;
+    return {
+        kind: WAY_KINDS[kind],
+        words,
+        boxes: Array.from(n.subarray(boxes, boxes + boxCount)),
+        ancestors: Array.from(n.subarray(boxes + boxCount, boxes + boxCount + ancestorCount)),
+        lines: Array.from({ length: pieceCount }, (_, piece) => {
+            const [x1, y1, x2, y2] = n.subarray(pieces + 4 * (firstPiece + piece));
+            return { x1, y1, x2, y2 };
+        }),
+    };
+}
+
+/** The picture of a view; numbers may be memory of the module's, which is not kept. texts gives its words. */
+export function pictureFrom(view, numbers, texts) {
     const [boxCount, arcCount, familyCount, memberCount, lineCount, bridgeCount, markCount, focus, ringCount, middleX, middleY] =
         numbers;
+    const [other, wayCount, wayBoxCount, pieceCount] = numbers.subarray(11, HEAD);
     // Lists refer to those behind them, so each is read where it lies before any is put together.
     const starts = {};
     let at = HEAD;
@@ -71,7 +89,7 @@ export function pictureFrom(view, numbers) {
         starts[name] = at;
         at += count * size;
     };
-    place("boxes", boxCount, 13);
+    place("boxes", boxCount, 14);
     place("arcs", arcCount, 4);
     place("rings", ringCount, 1);
     place("families", familyCount, 7);
@@ -79,15 +97,19 @@ export function pictureFrom(view, numbers) {
     place("lines", lineCount, 8);
     place("bridges", bridgeCount, 1);
     place("marks", markCount, 5);
+    place("ways", wayCount, 6);
+    place("wayBoxes", wayBoxCount, 1);
+    place("pieces", pieceCount, 4);
     const list = (name, count, size, make) =>
         Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
     const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
     const members = list("members", memberCount, 2, (start) => ({ box: numbers[start], kind: numbers[start + 1] }));
+    const [focusIs, otherIs, ...words] = other < 0 ? [] : texts();
     const lines = list("lines", lineCount, 8, (start) => lineAt(numbers, start, bridges));
     return {
         view,
         focus,
-        boxes: list("boxes", boxCount, 13, (start, index) => boxAt(numbers, start, index)),
+        boxes: list("boxes", boxCount, 14, (start, index) => boxAt(numbers, start, index)),
         arcs: list("arcs", arcCount, 4, (start) => ({
             ring: numbers[start],
             from: numbers[start + 1],
@@ -100,5 +122,9 @@ export function pictureFrom(view, numbers) {
                 : { radii: Array.from(numbers.subarray(starts.rings, starts.rings + ringCount)), middleX, middleY },
         families: list("families", familyCount, 7, (start) => familyAt(numbers, start, members, lines)),
         marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
+        kinship:
+            other < 0
+                ? null
+                : { other, focusIs, otherIs, ways: list("ways", wayCount, 6, (start, i) => wayAt(numbers, start, words[i], starts)) },
     };
 }

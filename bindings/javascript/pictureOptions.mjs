@@ -21,6 +21,9 @@ const DIRECTIONS = ["down", "up", "left", "right"];
 const FANS = ["ancestors", "descendants"];
 const WAYS = ["blood", "marriage", "both"];
 
+const LANGUAGES = ["en", "de", "es"];
+const PARENTS = ["birth", "adoptive", "allInOrder"];
+
 const MOST = 2 ** 31 - 1;
 
 /** In the order of set_picture_options. */
@@ -39,9 +42,14 @@ const OPTIONS = {
     angle: { least: 90, most: 360, usual: 360 },
     ways: { words: WAYS, usual: "both" },
     mostWays: { least: 0, most: MOST, usual: 8 },
+    language: { words: LANGUAGES, usual: "en" },
     marks: { least: -1, most: MOST, usual: 0 },
     effort: { least: 0, most: 100, usual: 1 },
+    allParts: { flag: true, usual: false },
     unknownParents: { flag: true, usual: true },
+    parents: { words: PARENTS, usual: "birth" },
+    parentsOf: { least: 0, most: MOST, usual: 0 },
+    parentFamily: { least: 0, most: MOST, usual: 0 },
     width: { size: true, usual: 55 },
     height: { size: true, usual: 80 },
     gapX: { size: true, usual: 25 },

@@ -95,3 +95,41 @@ test("what cannot be asked for is refused by its name", () => {
     assert.throws(() => file.picture(1, { spouses: 1 }), /takes true or false/);
     assert.throws(() => file.picture(7), LayoutError);
 });
+
+test("a picture of kinship has the line of each way, and words at both ends", () => {
+    const { kinship, boxes, focus } = file.picture(3, { view: "kinship", to: 5 });
+    assert.equal(boxes[kinship.other].id, 5);
+    assert.deepEqual([kinship.focusIs, kinship.otherIs], ["grandchild", "grandfather (father's father)"]);
+    const [way] = kinship.ways;
+    assert.deepEqual([way.kind, way.words], ["blood", "grandfather (father's father)"]);
+    assert.deepEqual(way.boxes.map((box) => boxes[box].id), [3, 1, 5]);
+    assert.equal(way.boxes[0], focus);
+    assert.deepEqual(way.ancestors.map((box) => boxes[box].id), [5]);
+    assert.ok(way.lines.length > 0);
+    for (const { x1, y1, x2, y2 } of way.lines) assert.ok((x1 === x2) !== (y1 === y2));
+    const german = file.picture(3, { view: "kinship", to: 5, language: "de" }).kinship;
+    assert.equal(german.focusIs, "Enkelkind");
+    assert.equal(file.picture(3).kinship, null);
+});
+
+// Person 1 is a child of family 1 by birth, and of family 2 by adoption.
+const adopted = olvane.readGedcom(
+    new TextEncoder().encode(
+        "0 HEAD\n1 CHAR UTF-8\n0 @I1@ INDI\n1 FAMC @F1@\n1 FAMC @F2@\n2 PEDI adopted\n" +
+            "0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I3@ INDI\n1 SEX M\n1 FAMS @F2@\n" +
+            "0 @F1@ FAM\n1 HUSB @I2@\n1 CHIL @I1@\n0 @F2@ FAM\n1 HUSB @I3@\n1 CHIL @I1@\n0 TRLR",
+    ),
+    "adopted.ged",
+);
+
+test("whose parents come first is a choice, and whoever has further ones says so", () => {
+    const shown = (options) => idsShown(adopted.picture(1, options));
+    const idsShown = ({ boxes }) => boxes.filter(({ id }) => id > 0).map(({ id }) => id).sort();
+    assert.deepEqual(shown({}), [1, 2]);
+    assert.deepEqual(shown({ parents: "adoptive" }), [1, 3]);
+    assert.deepEqual(shown({ parentsOf: 1, parentFamily: 2 }), [1, 3]);
+    assert.deepEqual(shown({ parents: "adoptive", parentsOf: 1, parentFamily: 1 }), [1, 2]);
+    assert.deepEqual(shown({}), [1, 2]);
+    assert.equal(adopted.picture(1).boxes[0].furtherParents, 1);
+    assert.equal(adopted.picture(1, { view: "ancestors" }).boxes[0].furtherParents, 0);
+});

@@ -48,8 +48,15 @@ void setShown(LayoutOptions& layout, unsigned bits) {
     layout.spousesOfChildren = (bits & 0x80u) != 0;
 }
 
-charts::ViewRequest requestOf(kin::Place focus) {
-    charts::ViewRequest request;
+// A request, and whose parents come first.
+struct PictureRequest {
+    charts::ViewRequest view;
+    gedcom::ParentChoice parents;
+};
+
+PictureRequest requestOf(kin::Place focus) {
+    PictureRequest asked;
+    charts::ViewRequest& request = asked.view;
     charts::ChartRequest& chart = request.chart;
     OptionReader options;
     chart.focus = focus;
@@ -68,14 +75,26 @@ charts::ViewRequest requestOf(kin::Place focus) {
     chart.fanAngle = options.next<int>();
     chart.ways = options.next<charts::WayChoice>();
     chart.mostWays = options.next<int>();
+    chart.language = options.next<kin::Language>();
     chart.marks = options.next<int>();
     chart.effort = options.next<int>();
+    chart.onePart = !options.flag();
     request.unknownParents = options.flag();
+    asked.parents.order = options.next<gedcom::ParentOrder>();
+    asked.parents.child = options.next<gedcom::PersonId>();
+    asked.parents.family = options.next<gedcom::FamilyId>();
     chart.sizes.boxWidth = static_cast<float>(options.number());
     chart.sizes.boxHeight = static_cast<float>(options.number());
     chart.sizes.gapX = static_cast<float>(options.number());
     chart.sizes.gapY = static_cast<float>(options.number());
-    return request;
+    return asked;
+}
+
+picture::Picture pictureOf(OpenFile& file, kin::Place focus) {
+    const PictureRequest asked = requestOf(focus);
+    gedcom::GedcomDataSource source(file.data, asked.parents);
+    const auto limited = std::make_shared<gedcom::LimitedDataSource>(source, kMostRelatives);
+    return charts::pictureOf(limited, file.kin(asked.parents), asked.view);
 }
 
 }  // namespace
@@ -90,12 +109,13 @@ OLVANE_EXPORT("picture_options") double* pictureOptionsRoom(std::size_t count) {
     return js::pictureOptions.data();
 }
 
-// Null for a picture that is refused; last_text then says why.
+// With the words of a kinship in last_text. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* file, std::int32_t focus) {
     try {
-        const auto limited = std::make_shared<gedcom::LimitedDataSource>(file->source, js::kMostRelatives);
-        const picture::Picture picture = charts::pictureOf(limited, file->kin(), js::requestOf(focus - 1));
-        return std::make_unique<std::vector<double>>(js::numbersOf(picture)).release();
+        const picture::Picture picture = js::pictureOf(*file, focus - 1);
+        auto numbers = std::make_unique<std::vector<double>>(js::numbersOf(picture));
+        js::lastText = js::textsOf(picture);
+        return numbers.release();
     } catch (const std::length_error&) {
         js::lastText = "too large";
     } catch (const std::exception& error) {

@@ -27,6 +27,16 @@ struct OpenFile {
         return *graph;
     }
 
+    // With the parents first who were chosen; the last choice is kept.
+    const kin::KinGraph& kin(const gedcom::ParentChoice& parents) {
+        if (parents == gedcom::ParentChoice()) return kin();
+        if (!chosenGraph || !(parents == chosenParents)) {
+            chosenGraph = gedcom::kinGraphOf(data, parents);
+            chosenParents = parents;
+        }
+        return *chosenGraph;
+    }
+
     kin::KinshipFinder& kinship() {
         if (!kinshipFinder) kinshipFinder.emplace(kin());
         return *kinshipFinder;
@@ -41,6 +51,8 @@ struct OpenFile {
     gedcom::GedcomDataSource source;
     gedcom::GedcomSearchTexts searchTexts;
     std::optional<kin::KinGraph> graph;
+    std::optional<kin::KinGraph> chosenGraph;
+    gedcom::ParentChoice chosenParents;
     std::optional<kin::KinshipFinder> kinshipFinder;
     std::optional<kin::PersonIndex> personIndex;
 };

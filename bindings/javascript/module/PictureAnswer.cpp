@@ -6,11 +6,14 @@
 #include "PictureAnswer.h"
 
 #include <initializer_list>
+#include <utility>
+
+#include "JsonText.h"
 
 namespace olvane::js {
 namespace {
 
-constexpr std::size_t kBoxNumbers = 13;
+constexpr std::size_t kBoxNumbers = 14;
 constexpr std::size_t kLineNumbers = 8;
 
 void append(std::vector<double>& numbers, std::initializer_list<double> values) {
@@ -23,7 +26,8 @@ void appendBox(std::vector<double>& numbers, const picture::Box& box) {
                      static_cast<double>(box.childOf), static_cast<double>(box.repeat),
                      static_cast<double>(box.hiddenParents), static_cast<double>(box.hiddenPartners),
                      static_cast<double>(box.hiddenChildren), static_cast<double>(box.kind),
-                     static_cast<double>(box.sex), static_cast<double>(flag)});
+                     static_cast<double>(box.sex), static_cast<double>(flag),
+                     static_cast<double>(box.furtherParents)});
 }
 
 void appendFamily(std::vector<double>& numbers, const picture::Family& family) {
@@ -45,18 +49,36 @@ void appendMark(std::vector<double>& numbers, const picture::Mark& mark) {
                      static_cast<double>(mark.boxes[2])});
 }
 
+void appendWay(std::vector<double>& numbers, const picture::Way& way) {
+    append(numbers, {static_cast<double>(way.firstBox), static_cast<double>(way.boxCount),
+                     static_cast<double>(way.ancestorCount), static_cast<double>(way.firstPiece),
+                     static_cast<double>(way.pieceCount), static_cast<double>(way.kind)});
+}
+
 }  // namespace
+
+std::string textsOf(const picture::Picture& picture) {
+    JsonText json;
+    json.begin();
+    json.string(picture.focusIs);
+    json.string(picture.otherIs);
+    for (const picture::Way& way : picture.ways) json.string(way.words);
+    json.end();
+    return std::move(json).take();
+}
 
 std::vector<double> numbersOf(const picture::Picture& picture) {
     std::vector<double> numbers;
-    numbers.reserve(11 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
+    numbers.reserve(15 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
                     kLineNumbers * picture.lines.size());
     append(numbers,
            {static_cast<double>(picture.boxes.size()), static_cast<double>(picture.arcs.size()),
             static_cast<double>(picture.families.size()), static_cast<double>(picture.members.size()),
             static_cast<double>(picture.lines.size()), static_cast<double>(picture.bridges.size()),
             static_cast<double>(picture.marks.size()), static_cast<double>(picture.focus),
-            static_cast<double>(picture.ringRadii.size()), picture.middleX, picture.middleY});
+            static_cast<double>(picture.ringRadii.size()), picture.middleX, picture.middleY,
+            static_cast<double>(picture.other), static_cast<double>(picture.ways.size()),
+            static_cast<double>(picture.wayBoxes.size()), static_cast<double>(picture.wayPieces.size())});
     for (const picture::Box& box : picture.boxes) appendBox(numbers, box);
     for (const picture::Arc& arc : picture.arcs) {
         append(numbers, {static_cast<double>(arc.ring), arc.from, arc.to, static_cast<double>(arc.line)});
@@ -70,6 +92,11 @@ std::vector<double> numbersOf(const picture::Picture& picture) {
     for (const picture::Line& line : picture.lines) appendLine(numbers, line);
     numbers.insert(numbers.end(), picture.bridges.begin(), picture.bridges.end());
     for (const picture::Mark& mark : picture.marks) appendMark(numbers, mark);
+    for (const picture::Way& way : picture.ways) appendWay(numbers, way);
+    numbers.insert(numbers.end(), picture.wayBoxes.begin(), picture.wayBoxes.end());
+    for (const picture::WayPiece& piece : picture.wayPieces) {
+        append(numbers, {piece.x1, piece.y1, piece.x2, piece.y2});
+    }
     return numbers;
 }
 

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <string>
 #include <vector>
 
 #include <olvane/picture/Picture.h>
@@ -11,7 +12,10 @@ namespace olvane::js {
 
 // A picture as one run of numbers, which JavaScript reads faster than structs or text: first how many boxes,
 // arcs, families, members, lines, bridges and marks there are, the box of the focus, how many rings and their
-// middle; then each of them in the order that picture.mjs reads.
+// middle, the box of a kinship's other person, how many ways, boxes on them and pieces of their lines; then each of them in the order that picture.mjs reads.
 std::vector<double> numbersOf(const picture::Picture& picture);
+
+// The words of a kinship as a JSON array: those of the focus, of the other person, and of each way.
+std::string textsOf(const picture::Picture& picture);
 
 }  // namespace olvane::js

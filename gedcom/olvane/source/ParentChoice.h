@@ -21,6 +21,8 @@ struct ParentChoice {
     // For this one person another family, whatever the order says, if the person is a child of it; 0 for nobody.
     PersonId child = 0;
     FamilyId family = 0;
+
+    bool operator==(const ParentChoice&) const = default;
 };
 
 // The family whose partners are the person's father and mother by that choice; 0 for none.

@@ -24,7 +24,7 @@ import { Tooltip } from "../ui/Tooltip";
 import { boxTowards, type Direction } from "../view/kinMoves";
 import { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
-import { addressOf, kUsualState, readAddress, sameState, type ViewState } from "../view/ViewState";
+import { addressOf, kUsualState, readAddress, sameState, type ViewState, withNextParents } from "../view/ViewState";
 import { viewerStyles } from "./styles";
 
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture of usual size is drawn
@@ -92,6 +92,7 @@ export class OlvaneTree extends HTMLElement {
         this.scene = new Scene(this.surface, {
             opened: (box) => this.openBox(box),
             selected: (box) => this.selectBox(box),
+            furtherParents: (box) => this.showFurtherParents(box),
             active: (box) => this.showInPanel(box.person || box.child),
             pointed: (box, element) => this.pointAt(box, element),
             moved: (placing) => this.moved(placing),
@@ -197,7 +198,7 @@ export class OlvaneTree extends HTMLElement {
         const start = performance.now();
         let picture: Picture;
         try {
-            picture = opened.picture(state);
+            picture = opened.picture(state, this.messages.language as PictureOptions["language"]);
         } catch (error) {
             this.shownState ??= state;
             this.emit("refused", { tooLarge: error instanceof LayoutError && error.status === "tooLarge" });
@@ -212,6 +213,7 @@ export class OlvaneTree extends HTMLElement {
         if (opened.persons.length <= kSoonSearched) this.contents.learnKinships(kKinshipTime);
         this.scene.show(picture, this.contents, anchor);
         this.overview.show(picture);
+        this.corner.showWays(picture.kinship?.ways ?? []);
         this.nameTree();
         this.learnKinships();
         const person = opened.person(state.focus)!;
@@ -224,6 +226,12 @@ export class OlvaneTree extends HTMLElement {
         performance.measure("olvane-picture", { start });
         this.emit("focuschange", { state, person, boxes: picture.boxes.length, byUser });
         return true;
+    }
+
+    // The next of several families of parents, with their child in the middle.
+    private showFurtherParents(box: Box): void {
+        const person = this.opened?.person(box.person);
+        if (person && this.shownState) this.show(withNextParents(person, this.shownState), box, true);
     }
 
     /** Makes a person the focus, from the box where they stand. */
@@ -297,6 +305,7 @@ export class OlvaneTree extends HTMLElement {
         this.messages = messagesFor(language);
         this.ui = uiMessagesFor(language);
         this.rebuildUi();
+        this.corner.showWays(this.picture?.kinship?.ways ?? []);
     }
 
     // Makes everything that holds words.

@@ -48,6 +48,9 @@ export interface UiMessages {
     readonly direction: string;
     readonly directions: Readonly<Record<ChartDirection, string>>;
     /** Of a numbered mark at a box. */
+    readonly commonAncestor: string;
+    readonly furtherParents: string;
+    readonly waysBetween: string;
     readonly marked: (numbers: string) => string;
     readonly howRelated: string;
     readonly back: string;

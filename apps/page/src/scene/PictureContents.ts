@@ -79,6 +79,9 @@ export class PictureContents implements BoxContents {
             isFocus ? ui.inFocus : kinship,
             boxes > 1 && ui.severalBoxes(boxes),
             hidden >= 0 && ui.hiddenCount(hidden),
+            box.caption,
+            box.kinshipPlace === "ancestor" && ui.commonAncestor,
+            box.furtherParents > 0 && ui.furtherParents,
             box.marks.length > 0 && ui.marked(box.marks.join(", ")),
         ];
         return {
@@ -94,6 +97,9 @@ export class PictureContents implements BoxContents {
                     : ""
                 : null,
             hidden,
+            further: box.furtherParents > 0 ? ui.furtherParents : "",
+            caption: box.caption,
+            kinshipPlace: box.kinshipPlace,
             marks: box.marks,
             repeated: boxes > 1,
             isFocus,
@@ -114,6 +120,9 @@ export class PictureContents implements BoxContents {
             years: "",
             kinship: null,
             hidden: -1,
+            further: "",
+            caption: "",
+            kinshipPlace: null,
             marks: [],
             repeated: false,
             isFocus: false,

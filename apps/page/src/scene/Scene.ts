@@ -14,6 +14,7 @@ import { arcPath } from "./arcArt";
 import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 import { drawFamily } from "./familyLines";
+import { drawWays } from "./wayLines";
 
 const kMostReadable = 420; // boxes in sight
 const kGlideTime = 520; // ms
@@ -28,6 +29,8 @@ export interface SceneEvents {
     selected(box: Box): void;
     // The keys stand on another box.
     active(box: Box): void;
+    // The mark of further parents was clicked or tapped.
+    furtherParents(box: Box): void;
     pointed(box: Box | null, element: SVGGElement | null): void;
     moved(placing: Placing): void;
 }
@@ -311,6 +314,7 @@ export class Scene {
     private drawLines(picture: Picture): void {
         const families = this.isFar ? picture.families : picture.familiesWithin(this.drawn!);
         this.lines.replaceChildren(...(this.isFar ? [farLines(families)] : families.map(drawFamily)));
+        this.lines.append(...drawWays(picture.kinship?.ways ?? []));
         this.thickenLines();
         this.lightFamilies();
     }
@@ -380,6 +384,7 @@ export class Scene {
         surface.addEventListener("click", (event) => {
             const box = this.boxAt(event.target);
             if (!box) return;
+            if ((event.target as Element).closest(".further")) return events.furtherParents(box);
             // The second of two quick clicks opens what the first one selected.
             const isSecond = event.detail > 1 && box === lastClicked;
             lastClicked = box;

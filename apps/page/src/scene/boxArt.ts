@@ -31,6 +31,11 @@ export interface BoxLook {
     readonly kinship: string | null;
     // Relatives without a box: -1 for none, 0 for an unknown number.
     readonly hidden: number;
+    // What the mark of further parents says; empty without one.
+    readonly further: string;
+    // What the one of a kinship is to the other, at both ends.
+    readonly caption: string;
+    readonly kinshipPlace: Box["kinshipPlace"];
     // Numbers of the marks that lead to other boxes.
     readonly marks: readonly number[];
     readonly repeated: boolean;
@@ -54,6 +59,8 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
         "box",
         look.person ? look.sex : "missing",
         look.isFocus && "focus",
+        look.kinshipPlace === "other" && "focus",
+        look.kinshipPlace === "ancestor" && "ancestor",
         look.repeated && "repeated",
         sizes.arc && lineClass(sizes.arc),
     ];
@@ -71,6 +78,8 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     else appendTallText(box, look, sizes);
     if (look.hidden >= 0) appendBadge(box, look.hidden, sizes);
     if (look.repeated) appendDuplicateMark(box);
+    if (look.further) appendFurtherMark(box, look.further);
+    if (look.caption) appendCaption(box, look.caption, sizes);
     if (look.marks.length > 0) appendMarks(box, look.marks, sizes);
     return box;
 }
@@ -231,4 +240,28 @@ function appendDuplicateMark(box: SVGGElement): void {
             svg("path", { d }),
         ),
     );
+}
+
+// Two arrows up at the left edge; a click shows other parents of the person.
+function appendFurtherMark(box: SVGGElement, title: string): void {
+    const mark = svg("g", { class: "further", transform: "translate(-10 26)" });
+    mark.append(
+        svg("title", {}, title),
+        svg("rect", { width: 22, height: 22, rx: 11 }),
+        svg("path", { d: "M7.5 16.5v-10m-3 3 3-3 3 3M14.5 16.5v-10m-3 3 3-3 3 3" }),
+    );
+    box.append(mark);
+}
+
+// Below the box, touching it.
+function appendCaption(box: SVGGElement, caption: string, { width, height }: Extent): void {
+    const room = width + 36;
+    const { lines } = fitName([caption], room - 16, 2);
+    const wide = Math.min(room, Math.max(...lines.map((line) => textWidth(line, kKinSize, 700))) + 16);
+    const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${height - 2})` });
+    plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
+    lines.forEach((line, i) =>
+        plate.append(svg("text", { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" }, fitLine(line, kKinSize, 700, room - 12))),
+    );
+    box.append(plate);
 }

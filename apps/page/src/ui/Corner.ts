@@ -4,9 +4,10 @@
 // What floats over the lower edge of the picture: the legend, the overview, and the buttons for zooming.
 
 import { iconButton } from "../base/controls";
-import { html } from "../base/dom";
+import { html, svg } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
 import type { UiMessages } from "../messages/ui";
+import { wayClass } from "../scene/wayLines";
 
 export interface CornerActions {
     zoomIn(): void;
@@ -18,10 +19,22 @@ export interface CornerActions {
 export class Corner {
     readonly element: HTMLElement;
     private readonly legend: HTMLDetailsElement;
+    private readonly ways = html("ul", { class: "ways", hidden: true });
 
     constructor(ui: UiMessages, overview: HTMLElement, actions: CornerActions) {
         this.legend = legendOf(ui);
-        this.element = html("div", { class: "corner" }, this.legend, overview, zoomButtons(ui, actions));
+        this.ways.setAttribute("aria-label", ui.waysBetween);
+        this.element = html("div", { class: "corner" }, this.ways, this.legend, overview, zoomButtons(ui, actions));
+    }
+
+    // What the line of each way means; nothing without ways.
+    showWays(ways: readonly { readonly words: string }[]): void {
+        this.ways.hidden = ways.length === 0;
+        this.ways.replaceChildren(
+            ...ways.map(({ words }, index) =>
+                html("li", {}, waySign(index), html("span", {}, words)),
+            ),
+        );
     }
 
     // The keys move to the legend's heading when they stood inside it.
@@ -30,6 +43,14 @@ export class Corner {
             this.legend.querySelector("summary")!.focus();
         this.legend.open = false;
     }
+}
+
+function waySign(index: number): SVGElement {
+    return svg(
+        "svg",
+        { width: 44, height: 10, "aria-hidden": "true" },
+        svg("path", { class: "way " + wayClass(index), d: "M0 5H44" }),
+    );
 }
 
 function zoomButtons(ui: UiMessages, actions: CornerActions): HTMLElement {

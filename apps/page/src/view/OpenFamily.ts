@@ -3,7 +3,7 @@
 
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
-import type { GedcomFamily as Family, GedcomFile, Person } from "olvane";
+import type { GedcomFamily as Family, GedcomFile, Person, PictureOptions } from "olvane";
 import { Photographs } from "../engine/photographs";
 import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
@@ -29,8 +29,9 @@ export class OpenFamily {
     }
 
     // Throws LayoutError.
-    picture(state: ViewState): Picture {
-        return new Picture(state.view, state.direction, state.focus, this.file.picture(state.focus, optionsOf(state)));
+    picture(state: ViewState, language: PictureOptions["language"]): Picture {
+        const values = this.file.picture(state.focus, optionsOf(state, language));
+        return new Picture(state.view, state.direction, state.focus, values);
     }
 
     // The focus stands first among all who could be one: whoever has the most relatives near.

@@ -28,6 +28,12 @@ export interface Box {
     readonly hidden: PictureBox["hidden"];
     // Numbers of the marks that stand at the box.
     readonly marks: readonly number[];
+    // How many families of parents the person has beside those that are shown.
+    readonly furtherParents: number;
+    // In a picture of kinship: what the person at one end is to the one at the other; else empty.
+    readonly caption: string;
+    // In a picture of kinship: at the end beside the focus, or at the top of a way.
+    readonly kinshipPlace: "other" | "ancestor" | null;
     // Its piece of a ring, in a round chart.
     readonly arc: BoxArc | null;
 }
@@ -55,6 +61,7 @@ export class Picture {
     readonly boxes: readonly Box[];
     readonly families: readonly FamilyLines[];
     readonly marks: readonly PictureMark[];
+    readonly kinship: PictureValues["kinship"];
     readonly bounds: Rectangle;
     readonly focusBox: Box;
     private readonly boxGrid: SpatialGrid;
@@ -74,6 +81,7 @@ export class Picture {
         const lines = [...new Set(values.arcs.map((arc) => arc.line))].filter((line) => line !== null);
         this.boxes = values.boxes.map((box, i) => this.boxOf(box, values, numbers, arcOf(values, i, lines)));
         this.marks = values.marks;
+        this.kinship = values.kinship;
         this.families = values.families.map((family, index) => this.linesOf(family, index));
         const drawn = this.families.filter(({ family }) => family.lines.length > 0);
         this.boxGrid = new SpatialGrid(this.boxes.map(areaOf));
@@ -118,16 +126,21 @@ export class Picture {
 
     private boxOf(
         from: PictureBox,
-        { boxes: all }: PictureValues,
+        { boxes: all, focus, kinship }: PictureValues,
         marks: ReadonlyMap<number, number[]>,
         arc: BoxArc | null,
     ): Box {
-        const { index, id: person, sex, x, y, width, height, flag, hidden } = from;
+        const { index, id: person, sex, x, y, width, height, flag, hidden, furtherParents } = from;
         const child = from.childOf === null ? 0 : all[from.childOf]!.id;
         const base = person ? String(person) : `${sex} parent of ${child}`;
         let key = base;
         for (let copy = 1; this.byKey.has(key); ++copy) key = base + "#" + copy;
-        const box = { index, key, person, child, sex, x, y, width, height, flag, hidden, marks: marks.get(index) ?? [], arc };
+        const box: Box = {
+            ...{ index, key, person, child, sex, x, y, width, height, flag, hidden, furtherParents, arc },
+            marks: marks.get(index) ?? [],
+            caption: !kinship ? "" : index === kinship.other ? kinship.otherIs : index === focus ? kinship.focusIs : "",
+            kinshipPlace: placeInKinship(index, kinship),
+        };
         this.byKey.set(key, box);
         const copies = this.byPerson.get(person);
         if (copies) copies.push(box);
@@ -152,6 +165,12 @@ export class Picture {
         }
         return lines;
     }
+}
+
+function placeInKinship(index: number, kinship: PictureValues["kinship"]): Box["kinshipPlace"] {
+    if (!kinship) return null;
+    if (index === kinship.other) return "other";
+    return kinship.ways.some(({ ancestors }) => ancestors.includes(index)) ? "ancestor" : null;
 }
 
 function arcOf({ arcs, rings }: PictureValues, index: number, lines: readonly number[]): BoxArc | null {

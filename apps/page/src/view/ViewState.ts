@@ -30,6 +30,9 @@ export interface ViewState {
     readonly to: number;
     // Whether parents who are not known have boxes, in the engine's two views.
     readonly unknownParents: boolean;
+    // A person, and the family whose partners are shown as that person's parents; 0 for the usual ones.
+    readonly parentsOf: number;
+    readonly parentFamily: number;
     // Names of kRelatives that are switched off.
     readonly hidden: ReadonlySet<RelativeName>;
 }
@@ -51,6 +54,8 @@ export const kUsualState: ViewState = {
     direction: "down",
     to: 0,
     unknownParents: true,
+    parentsOf: 0,
+    parentFamily: 0,
     hidden: new Set(),
 };
 
@@ -61,11 +66,15 @@ const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
 /** What to ask of the module for a state. */
-export function optionsOf(state: ViewState): PictureOptions {
-    const { view, generations, direction, up, down, to, unknownParents } = state;
+export function optionsOf(state: ViewState, language: PictureOptions["language"] = "en"): PictureOptions {
+    const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily } = state;
     const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
     const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : kTall;
-    return { view, generations, direction, up, down, to, unknownParents, shown: shownBits(state), ...sizes };
+    return {
+        ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, language },
+        shown: shownBits(state),
+        ...sizes,
+    };
 }
 
 function shownBits(state: ViewState): number {
@@ -76,7 +85,7 @@ function shownBits(state: ViewState): number {
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
-    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents"] as const).every(
+    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents", "parentFamily", "parentsOf"] as const).every(
         (name) => a[name] === b[name],
     );
     return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
@@ -96,13 +105,14 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
     if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
     const hide = [...state.hidden, ...(state.unknownParents ? [] : [kUnknownParents])];
+    if (state.parentFamily) parts.set("parents", `${state.parentsOf}.${state.parentFamily}`);
     if (hide.length > 0) parts.set("hide", hide.join(","));
     return "#" + parts.toString().replaceAll("%2C", ",");
 }
 
 // What "hide" names beside the groups of relatives.
 const kUnknownParents = "unknownParents";
-const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "hide"];
+const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "hide", "parents"];
 
 // Whatever an address does not name, or names wrongly, is as in the state that it is read into.
 export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {
@@ -119,6 +129,7 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
         down: clampDepth(Number(parts.get("down") ?? kUsualDown), kUsualDown),
         direction: kDirections.find((name) => name === parts.get("direction")) ?? "down",
         to,
+        ...parentsIn(parts.get("parents") ?? "", persons),
         unknownParents: !hidden.includes(kUnknownParents),
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
     };
@@ -148,6 +159,22 @@ function focusIn(parts: URLSearchParams, persons: readonly Person[]): number {
     if (xref) return personOfXref(xref.replaceAll("@", ""), persons)?.id ?? 0;
     const id = Number(parts.get("number"));
     return Number.isInteger(id) && persons[id - 1] ? id : 0;
+}
+
+// "7.2": the parents of person 7 are the partners of family 2.
+function parentsIn(text: string, persons: readonly Person[]): Pick<ViewState, "parentsOf" | "parentFamily"> {
+    const [parentsOf = 0, parentFamily = 0] = text.split(".").map(Number);
+    const isKnown = persons[parentsOf - 1]?.parentFamilies.some(({ family }) => family === parentFamily);
+    return isKnown ? { parentsOf, parentFamily } : { parentsOf: 0, parentFamily: 0 };
+}
+
+/** The state in which the person stands in the middle with the next of several families of parents. */
+export function withNextParents(person: Person, state: ViewState): Partial<ViewState> {
+    const families = person.parentFamilies.map(({ family }) => family);
+    const byBirth = person.parentFamilies.find(({ pedigree }) => pedigree === "birth" || pedigree === "notGiven");
+    const present = state.parentsOf === person.id ? state.parentFamily : (byBirth?.family ?? families[0] ?? 0);
+    const next = families[(families.indexOf(present) + 1) % families.length] ?? 0;
+    return { focus: person.id, parentsOf: person.id, parentFamily: next };
 }
 
 // By xref or by number.
