@@ -5,7 +5,8 @@
 
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
-import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
+import { gedcom } from "../support/families.mjs";
 
 // Sister Susan; Henry Parker, husband of sister Marianne; their brother's child does not live in this file, so the
 // nieces are Caroline's daughters; uncle John; cousin Hensleigh; great-grandfather Robert; a son's wife; a grandson.
@@ -95,6 +96,45 @@ describe("options", kTwoAtOnce, () => {
         assert.equal(await visit.page.innerText("#generations"), "2");
         assert.ok(await visit.page.isDisabled("#generations-fewer"));
         assert.equal(await columns(), 2);
+        await visit.end();
+    });
+
+    test("other parents of an adopted person are shown at a click, and a link keeps them", async () => {
+        const visit = await visitFamily(
+            gedcom(
+                ...["0 @I1@ INDI", "1 NAME Kim //", "1 FAMC @F1@", "1 FAMC @F2@", "2 PEDI adopted"],
+                ...["0 @I2@ INDI", "1 NAME Jon //", "1 SEX M", "1 FAMS @F1@"],
+                ...["0 @I3@ INDI", "1 NAME Leif //", "1 SEX M", "1 FAMS @F2@"],
+                ...["0 @F1@ FAM", "1 HUSB @I2@", "1 CHIL @I1@", "0 @F2@ FAM", "1 HUSB @I3@", "1 CHIL @I1@"],
+            ),
+            { focus: 1 },
+        );
+        assert.deepEqual(await allPersons(visit), ["I1", "I2"]);
+        await visit.click("#tree .further");
+        assert.deepEqual(await allPersons(visit), ["I1", "I3"]);
+        assert.match(await visit.hash(), /parents=1\.2/);
+        await visit.page.reload();
+        await visit.untilFamily();
+        assert.deepEqual(await allPersons(visit), ["I1", "I3"]);
+        await visit.click("#tree .further");
+        assert.deepEqual(await allPersons(visit), ["I1", "I2"]);
+        await visit.end();
+    });
+
+    test("each way of a kinship has a line, a place in the legend, and words at both ends", async () => {
+        const visit = await visitDarwins("#person=I1&view=kinship&to=I2");
+        const words = await visit.page.locator(".corner .ways li").allInnerTexts();
+        assert.deepEqual(words, ["first cousin", "wife"]);
+        assert.equal(await visit.page.locator("#tree .way").count(), 2);
+        const captions = await visit.page.locator("#tree .caption").allTextContents();
+        // Broken into lines, which stand without a space between them.
+        const wordsAtEnds = captions.map((caption) => caption.replaceAll(" ", "")).sort();
+        assert.deepEqual(wordsAtEnds, ["husbandandfirstcousin", "wifeandfirstcousin"]);
+        assert.ok((await visit.page.locator("#tree .ancestor").count()) > 0);
+        await photograph(visit, "kinship");
+        await visit.page.goto((await visit.page.url()).replace(/#.*/, "#person=I1"));
+        await visit.page.waitForSelector("#tree .box");
+        assert.equal(await visit.page.locator(".corner .ways li").count(), 0);
         await visit.end();
     });
 

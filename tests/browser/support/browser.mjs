@@ -57,13 +57,12 @@ export async function visitEmpty(settings = {}, hash = "") {
     return visitFile(process.env.OLVANE_PAGE, settings, hash);
 }
 
-/** The page with a family in it, as the olvane command writes it. stated: name, title, focus, view. */
+/** The page with a family in it, as the olvane command writes it. stated: name, title, focus, address. */
 export async function visitFamily(gedcom, stated = {}, settings = {}, hash = "") {
     const block = JSON.stringify({
         name: "family.ged",
         title: "Family",
         focus: "",
-        view: "family",
         livingHidden: false,
         gzip: gzipSync(gedcom).toString("base64"),
         ...stated,

@@ -6,7 +6,7 @@
 // no dialog and stores nothing. Everything inside lies in its own shadow tree, so that any number of them stand
 // on one page.
 
-import { type GedcomFile, LayoutError, type Olvane, type Person } from "olvane";
+import { type GedcomFile, LayoutError, type Olvane, type Person, type PictureOptions } from "olvane";
 import { html, setAttributes, svg } from "../base/dom";
 import type { ViewName } from "../base/views";
 import { type Messages, messagesFor } from "../messages";
@@ -494,7 +494,7 @@ export class OlvaneTree extends HTMLElement {
             const { shownState } = this;
             if (!opened || this.opened !== opened || !this.picture || !shownState) return;
             const start = performance.now();
-            opened.picture(shownState);
+            opened.picture(shownState, this.messages.language as PictureOptions["language"]);
             if (performance.now() - start > kWarmEnough && times > 1) this.warmUp(times - 1);
         }, kWarmUpPause);
     }

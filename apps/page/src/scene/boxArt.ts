@@ -256,7 +256,7 @@ function appendFurtherMark(box: SVGGElement, title: string): void {
 // Below the box, touching it.
 function appendCaption(box: SVGGElement, caption: string, { width, height }: Extent): void {
     const room = width + 36;
-    const { lines } = fitName([caption], room - 16, 2);
+    const { lines } = fitName([caption], room - 16, 3);
     const wide = Math.min(room, Math.max(...lines.map((line) => textWidth(line, kKinSize, 700))) + 16);
     const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${height - 2})` });
     plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
