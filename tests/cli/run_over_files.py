@@ -7,7 +7,8 @@ Each command ends with status 0, 1 or 2, outputs that exist are whole, and with 
 changes, removes, repeats or swaps bytes and lines of a file, always the same ones for the same seed.
 
 Usage: run_over_files.py PATH/TO/olvane FOLDER [MUTATED [SEED]]
-FOLDER "-" is OLVANE_GEDCOM_DIR; status 77 where that is not set. MUTATED copies are made of all files together, 0 by default.
+FOLDER "-" is OLVANE_GEDCOM_DIR; status 77 where that is not set. MUTATED copies are made of all files together, 0 by default;
+a copy runs one of the commands, in turn. With a plus sign before MUTATED the files themselves are left out.
 """
 
 import concurrent.futures
@@ -17,6 +18,12 @@ import random
 import subprocess
 import sys
 import tempfile
+
+# A picture to be judged with the relations of a file.
+PICTURE = """{"format": 2, "view": "made", "focus": 1, "boxes": [{"id": 1, "width": 10, "height": 10},
+{"id": 2, "x": 50, "width": 10, "height": 10}]}"""
+
+MOST_BYTES = 200000  # of a file that is mutated
 
 TIME_LIMIT = 120  # seconds, for one command on one file
 
@@ -36,6 +43,8 @@ def commands_for(file, number):
         ["page", file, "-o", "out.html", "--hide-living"], ["page", file, "-o", file],
         ["people", file, "--encoding", "windows-1251"],
         ["draw", "io.svg", "--focus", "1", "-o", "io.svg"], ["page", "io.html", "-o", "io.html"],
+        ["draw", file, "--focus", "2", "-o", "out.png"], ["draw", file, "--focus", "3", "-o", "out.pdf"],
+        ["kin", file, "2", "3"], ["judge", file], ["judge", "picture.json", "--family", file],
     ]
     return all_commands if number is None else [all_commands[number % len(all_commands)]]
 
@@ -77,6 +86,7 @@ def faults(command, data, name, number):
         inputs = [path, pathlib.Path(folder) / "io.svg", pathlib.Path(folder) / "io.html"]
         for one in inputs:
             one.write_bytes(data)
+        (pathlib.Path(folder) / "picture.json").write_text(PICTURE, encoding="utf-8")
         for words in commands_for(name, number):
             asked = f"{name} {number}: olvane {' '.join(words)}"
             try:
@@ -103,12 +113,14 @@ def main():
         print("OLVANE_GEDCOM_DIR names no folder of GEDCOM files")
         raise SystemExit(77)
     copies = int(sys.argv[3]) if len(sys.argv) > 3 else 0
+    only_copies = len(sys.argv) > 3 and sys.argv[3].startswith("+")
     seed = int(sys.argv[4]) if len(sys.argv) > 4 else 1
     paths = sorted(p for p in pathlib.Path(folder).rglob("*") if p.suffix in (".ged", ".gdz"))
     files = [(p.name, p.read_bytes()) for p in paths]
-    work = [(name, data, None) for name, data in files]
+    # Nothing but copies where the number of copies begins with a plus sign.
+    work = [] if only_copies else [(name, data, None) for name, data in files]
     chance = random.Random(seed)
-    small = [(name, data) for name, data in files if len(data) < 200000]
+    small = [(name, data) for name, data in files if len(data) < MOST_BYTES]
     work += [(name, (data, chance.random()), i) for i in range(copies) for name, data in [chance.choice(small)]]
 
     def look(item):
