@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Bundles each test beside this file and runs them all with node's own runner: node test/run.mjs
+// OLVANE_RESULTS may name a file for the results, as the reporter "junit" has them.
 
 import { spawnSync } from "node:child_process";
 import { mkdtempSync, readdirSync, rmSync } from "node:fs";
@@ -25,7 +26,10 @@ try {
         logLevel: "warning",
     });
     const files = tests.map((name) => join(folder, name.replace(/\.ts$/, ".mjs")));
-    const run = spawnSync(process.execPath, ["--enable-source-maps", "--test", ...files], { stdio: "inherit" });
+    const reporters = ["--test-reporter=spec", "--test-reporter-destination=stdout"];
+    const results = process.env.OLVANE_RESULTS;
+    if (results) reporters.push("--test-reporter=junit", `--test-reporter-destination=${results}`);
+    const run = spawnSync(process.execPath, ["--enable-source-maps", "--test", ...reporters, ...files], { stdio: "inherit" });
     process.exitCode = run.status ?? 1;
 } finally {
     rmSync(folder, { recursive: true, force: true });
