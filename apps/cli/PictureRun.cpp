@@ -31,6 +31,7 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& requ
       parents_(request.parents),
       graph_(gedcom::kinGraphOf(data, request.parents)) {
     charts::setBoxForm(view_.chart, request.boxes);
+    charts::flagBeyondGenerations(view_.chart);
     if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
 

@@ -8,8 +8,9 @@ import { GedcomError, LayoutError } from "./errors.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { pictureFrom } from "./picture.mjs";
-import { pictureNumbers } from "./pictureOptions.mjs";
+import { drawingNumbers, pictureNumbers } from "./pictureOptions.mjs";
 import { searchWith } from "./search.mjs";
+import { Texts } from "./texts.mjs";
 
 const SEXES = ["male", "female", "other"];
 const MARKS = ["exact", "about", "before", "after", "between"];
@@ -118,6 +119,7 @@ export class GedcomFile {
         this.#instance = instance;
         this.#file = file;
         this.name = name;
+        this.texts = new Texts(instance);
         const [encoding, version, persons, families, diagnostics] = this.#answer("gedcom_table");
         this.encoding = encoding;
         this.version = version;
@@ -177,13 +179,7 @@ export class GedcomFile {
     picture(focus, options = {}) {
         const { exports } = this.#instance;
         const file = this.#opened();
-        const numbers = pictureNumbers(options);
-        for (const person of [focusNumber(focus), numbers[3] || focus]) {
-            if (this.persons[person - 1] !== undefined) continue;
-            throw new LayoutError("invalidPerson", `${this.name}: there is no person ${person}`, "", []);
-        }
-        const head = exports.picture_options(numbers.length);
-        new Float64Array(exports.memory.buffer, head >>> 0, numbers.length).set(numbers);
+        this.#setPictureOptions(focus, options);
         const answer = exports.gedcom_picture(file, focus);
         if (answer === 0) this.#refuse();
         try {
@@ -212,6 +208,29 @@ export class GedcomFile {
     #person(id) {
         if (this.persons[id - 1] === undefined) throw new RangeError(`${this.name}: there is no person ${String(id)}`);
         return id;
+    }
+
+    svg(focus, options = {}, drawing = {}) {
+        const { exports } = this.#instance;
+        const file = this.#opened();
+        const { theme, boxes, facts, title } = drawingNumbers(drawing);
+        this.#setPictureOptions(focus, options);
+        const pointer = this.#instance.withText(title, (text) =>
+            exports.gedcom_svg(file, focus, theme, boxes, facts, text),
+        );
+        if (pointer === 0) this.#refuse();
+        return this.#instance.text(pointer);
+    }
+
+    #setPictureOptions(focus, options) {
+        const { exports } = this.#instance;
+        const numbers = pictureNumbers(options);
+        for (const person of [focusNumber(focus), numbers[3] || focus]) {
+            if (this.persons[person - 1] !== undefined) continue;
+            throw new LayoutError("invalidPerson", `${this.name}: there is no person ${person}`, "", []);
+        }
+        const head = exports.picture_options(numbers.length);
+        new Float64Array(exports.memory.buffer, head >>> 0, numbers.length).set(numbers);
     }
 
     #refuse() {

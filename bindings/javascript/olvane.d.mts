@@ -210,6 +210,51 @@ export interface PictureOptions {
     gapY?: number | undefined;
 }
 
+export type DrawingTheme = "light" | "dark" | "print";
+
+/** How a picture is drawn as SVG. */
+export interface DrawingOptions {
+    /** light if not given. */
+    readonly theme?: DrawingTheme | undefined;
+    /** The form of the boxes; usual is what suits the view: wide ones where generations stand side by side. */
+    readonly boxes?: "usual" | "tall" | "wide" | undefined;
+    /** What boxes and lines say beside names and years. */
+    readonly show?: Iterable<"dates" | "places" | "occupation" | "marriage"> | undefined;
+    /** Stands above the picture. Empty for none: the picture is then called after its view and focus. */
+    readonly title?: string | undefined;
+}
+
+/** A name by its parts; either may be empty. */
+export interface NameParts {
+    readonly given: string;
+    readonly surname: string;
+    /** Whether it is read with the surname in front. */
+    readonly surnameFirst?: boolean | undefined;
+}
+
+/** The room for a name, in px: a line needs the size of its letters and the gap, 3; at most 4 lines. */
+export interface NameRoom {
+    readonly width: number;
+    readonly height: number;
+    readonly gap?: number | undefined;
+    readonly lines?: number | undefined;
+}
+
+/**
+ * Measures and fits texts as drawings do: with the advances of one font, which no other one of fontFamilies exceeds,
+ * and line breaks by UAX 14 and 29 of Unicode 15. Sizes and widths are px. Of a text of more than 1,000 bytes the
+ * beginning is used.
+ */
+export interface Texts {
+    /** What a screen that uses these widths has as its font-family. */
+    readonly fontFamilies: string;
+    width(text: string, size: number, bold?: boolean): number;
+    /** One line, with an ellipsis where it was too long. */
+    fitLine(text: string, size: number, width: number, bold?: boolean): string;
+    /** In bold letters of 10 to 13 px, as large as the room allows. */
+    fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
+}
+
 /** A place in one of the lists of a picture. */
 export type PictureIndex = number;
 
@@ -554,6 +599,13 @@ export class GedcomFile {
     layoutText(focus: number, options?: Options): string;
     /** The picture of a view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
     picture(focus: number, options?: PictureOptions): Picture;
+    /**
+     * The picture as the text of an SVG file, byte for byte as olvane draw writes it for the same options; the sizes
+     * in options are those of the boxes' form instead. Throws as picture does.
+     */
+    svg(focus: number, options?: PictureOptions, drawing?: DrawingOptions): string;
+    /** As that of Olvane. */
+    readonly texts: Texts;
     /** Everybody as a map, as bytes; olvane/charts/MapIndex.h of the C++ sources describes their form. */
     mapIndex(): Uint8Array<ArrayBuffer>;
     /**
@@ -711,6 +763,7 @@ export class Family {
 }
 
 export class Olvane {
+    readonly texts: Texts;
     /** "MAJOR.MINOR.PATCH". */
     readonly version: string;
     /** Takes over a family: none of the rows is looked at again. Throws FamilyError. */

@@ -7,6 +7,7 @@ import { Family } from "./family.mjs";
 import { readGedcom } from "./gedcom.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
+import { Texts } from "./texts.mjs";
 
 export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
 export { Family } from "./family.mjs";
@@ -18,6 +19,7 @@ export class Olvane {
 
     constructor(instance) {
         this.#instance = instance;
+        this.texts = new Texts(instance);
         this.version = instance.text(instance.exports.version());
     }
 

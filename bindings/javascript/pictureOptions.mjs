@@ -86,6 +86,22 @@ function numberOf(name, value, option) {
     return option.flag ? flagNumber(name, value) : plainNumber(name, value, option);
 }
 
+const THEMES = ["light", "dark", "print"];
+const BOXES = ["usual", "tall", "wide"];
+const FACTS = ["dates", "places", "occupation", "marriage"];
+
+/** What a caller asks of a drawing, as the module's numbers. */
+export function drawingNumbers({ theme = "light", boxes = "usual", show = [], title = "", ...rest }) {
+    const unknown = Object.keys(rest)[0];
+    if (unknown !== undefined) throw new TypeError(`there is no option ${unknown}, but theme, boxes, show, title`);
+    return {
+        theme: wordNumber("theme", theme, THEMES),
+        boxes: wordNumber("boxes", boxes, BOXES),
+        facts: [...show].reduce((bits, fact) => bits | (1 << wordNumber("show", fact, FACTS)), 0),
+        title: String(title),
+    };
+}
+
 /** All options as numbers, in the order of set_picture_options. */
 export function pictureNumbers(options) {
     if (typeof options !== "object" || options === null) {

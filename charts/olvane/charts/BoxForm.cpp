@@ -3,6 +3,8 @@
 
 #include <olvane/charts/BoxForm.h>
 
+#include <algorithm>
+
 namespace olvane::charts {
 
 namespace {
@@ -47,6 +49,10 @@ void setBoxForm(ChartRequest& request, BoxForm form) {
     } else if (form == BoxForm::wide) {
         request.sizes.gapY = kGapOfWideRows;
     }
+}
+
+void flagBeyondGenerations(ChartRequest& request) {
+    request.layout.flagDepth = std::max(1, request.layout.generations - 1);
 }
 
 }  // namespace olvane::charts

@@ -23,4 +23,7 @@ OLVANE_API TreeSize treeSizeOf(BoxForm form);
 // Sets all sizes of a request for boxes of a form; its view and its aspect are set before.
 OLVANE_API void setBoxForm(ChartRequest& request, BoxForm form);
 
+// Lets a pedigree of any number of columns flag those who have ancestors beyond the last one.
+OLVANE_API void flagBeyondGenerations(ChartRequest& request);
+
 }  // namespace olvane::charts

@@ -138,16 +138,24 @@ std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRo
     return lines;
 }
 
-void appendTextLine(std::string& svg, double x, double y, std::string_view text,
-                    std::string_view attributes) {
-    svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\"";
-    svg += attributes;
+struct TextLook {
+    std::string_view anchor;  // an attribute
+    Font font;
+    std::string_view colour;
+};
+
+void appendTextLine(std::string& svg, double x, double y, std::string_view text, const TextLook& look) {
+    put(svg, "<text x=\"", number(x), "\" y=\"", number(y), "\"", look.anchor);
+    if (look.font.bold) svg += " font-weight=\"bold\"";
+    put(svg, " font-size=\"", number(look.font.size), "\" fill=\"", look.colour, "\"");
     if (runsRightToLeft(text)) svg += " direction=\"rtl\"";
-    svg += ">" + escaped(text) + "</text>\n";
+    put(svg, ">", Escaped{text}, "</text>\n");
 }
 
-std::string anchorAttribute(const TextRoom& room, std::string_view text) {
-    if (room.centred) return " text-anchor=\"middle\"";
+constexpr std::string_view kMiddle = " text-anchor=\"middle\"";
+
+std::string_view anchorAttribute(const TextRoom& room, std::string_view text) {
+    if (room.centred) return kMiddle;
     return runsRightToLeft(text) ? " text-anchor=\"end\"" : "";
 }
 
@@ -155,9 +163,7 @@ void appendNames(std::string& svg, const picture::FittedName& name, const TextRo
                  const DrawingTheme& theme) {
     double y = top + name.size;
     for (const std::string& line : name.lines) {
-        appendTextLine(svg, room.x, y, line,
-                       anchorAttribute(room, line) + " font-weight=\"bold\" font-size=\"" + px(name.size) +
-                           "\" fill=\"" + std::string(theme.text) + "\"");
+        appendTextLine(svg, room.x, y, line, {anchorAttribute(room, line), {name.size, true}, theme.text});
         y += name.size + room.nameGap;
     }
 }
@@ -166,9 +172,9 @@ void appendYears(std::string& svg, const std::vector<std::string>& lines, const 
                  double lastBaseline, const DrawingTheme& theme) {
     double y = lastBaseline - room.yearsPitch * (static_cast<double>(lines.size()) - 1);
     for (const std::string& line : lines) {
-        appendTextLine(svg, room.x, y, line,
-                       std::string(room.centred ? " text-anchor=\"middle\"" : "") + " font-size=\"" +
-                           px(room.yearsSize) + "\" fill=\"" + std::string(theme.quietText) + "\"");
+        appendTextLine(
+            svg, room.x, y, line,
+            {room.centred ? kMiddle : std::string_view(), {room.yearsSize, false}, theme.quietText});
         y += room.yearsPitch;
     }
 }
@@ -218,42 +224,41 @@ std::string_view silhouetteOf(kin::Sex sex) {
 
 // A thick frame outside, apart from the border.
 void appendAncestorFrame(std::string& svg, const BoxFrame& box, double corner, const DrawingTheme& theme) {
-    svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
-           "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.badge) +
-           "\" stroke-width=\"3\"/>\n";
+    put(svg, "<rect x=\"-5\" y=\"-5\" width=\"", number(box.width + 10), "\" height=\"",
+        number(box.height + 10), "\" rx=\"", number(corner + 5), "\" fill=\"none\" stroke=\"", theme.badge,
+        "\" stroke-width=\"3\"/>\n");
 }
 
 void appendFrame(std::string& svg, const BoxFrame& box, kin::Sex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double corner = cornerOf(sex);
     const bool isEnd = box.isFocus || box.isOther;
-    svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" + px(corner) +
-           "\" fill=\"" + std::string(colours.fill) + "\" stroke=\"" +
-           std::string(isEnd ? theme.focus : colours.border) + "\" stroke-width=\"" +
-           px(isEnd ? kFocusBorder : 1.4) + "\"/>\n";
+    put(svg, "<rect width=\"", number(box.width), "\" height=\"", number(box.height), "\" rx=\"",
+        number(corner), "\" fill=\"", colours.fill, "\" stroke=\"", isEnd ? theme.focus : colours.border,
+        "\" stroke-width=\"", number(isEnd ? kFocusBorder : 1.4), "\"/>\n");
     if (box.isCommonAncestor && !isEnd) appendAncestorFrame(svg, box, corner, theme);
     if (!isEnd) return;
     // A second, thin frame outside marks the focus where colours are lost.
-    svg += "<rect x=\"-5\" y=\"-5\" width=\"" + px(box.width + 10) + "\" height=\"" + px(box.height + 10) +
-           "\" rx=\"" + px(corner + 5) + "\" fill=\"none\" stroke=\"" + std::string(theme.focus) +
-           "\" stroke-width=\"1.4\"/>\n";
+    put(svg, "<rect x=\"-5\" y=\"-5\" width=\"", number(box.width + 10), "\" height=\"",
+        number(box.height + 10), "\" rx=\"", number(corner + 5), "\" fill=\"none\" stroke=\"", theme.focus,
+        "\" stroke-width=\"1.4\"/>\n");
 }
 
 void appendSilhouette(std::string& svg, const BoxFrame& box, kin::Sex sex, const DrawingTheme& theme) {
     const BoxColours& colours = theme.coloursOf(sex);
     const double x = isWide(box) ? kInset : (box.width - kSilhouetteWidth) / 2;
     const double y = isWide(box) ? (box.height - kSilhouetteHeight) / 2 : 11;
-    svg += "<use href=\"#" + std::string(silhouetteOf(sex)) + "\" x=\"" + px(x) + "\" y=\"" + px(y) +
-           "\" color=\"" + std::string(colours.silhouette) + "\"/>\n";
+    put(svg, "<use href=\"#", silhouetteOf(sex), "\" x=\"", number(x), "\" y=\"", number(y), "\" color=\"",
+        colours.silhouette, "\"/>\n");
 }
 
 std::string counted(int count, const char* one, const char* many) {
-    return std::to_string(count) + " " + (count == 1 ? one : many);
+    return joined(whole(count), " ", count == 1 ? one : many);
 }
 
 std::string hiddenSentence(const BoxFrame& frame, bool isLiving) {
     std::string list;
-    const auto add = [&list](const std::string& part) { list += (list.empty() ? "" : ", ") + part; };
+    const auto add = [&list](const std::string& part) { put(list, (list.empty() ? "" : ", "), part); };
     const picture::Box& box = *frame.box;
     if (frame.countsHidden && !isLiving) {
         if (box.hiddenParents > 0) add(counted(box.hiddenParents, "parent", "parents"));
@@ -271,16 +276,14 @@ std::string hiddenMark(const BoxFrame& frame, bool isLiving) {
 }
 
 std::string repeatSentence(const BoxFrame& box) {
-    return "Stands in " + std::to_string(box.repeatCount) + " boxes, all marked " +
-           std::to_string(box.repeatNumber);
+    return joined("Stands in ", whole(box.repeatCount), " boxes, all marked ", whole(box.repeatNumber));
 }
 
 constexpr std::string_view kTwoUp = "\xE2\x87\x88";
 
 std::string furtherSentence(const picture::Box& box) {
-    return box.furtherParents == 1 ? "Has further parents, who are not shown"
-                                   : "Has further parents in " + std::to_string(box.furtherParents) +
-                                         " families, who are not shown";
+    if (box.furtherParents == 1) return "Has further parents, who are not shown";
+    return joined("Has further parents in ", whole(box.furtherParents), " families, who are not shown");
 }
 
 struct Badge {
@@ -294,14 +297,13 @@ struct Badge {
 
 // A pill with a title of its own.
 void appendBadgeAt(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
-    const std::string fill(badge.hollow ? theme.page : theme.badge);
-    const std::string ink(badge.hollow ? theme.text : theme.badgeText);
-    svg += "<g><title>" + escaped(badge.title) + "</title>\n<rect x=\"" + px(badge.x) + "\" y=\"" + px(y) +
-           "\" width=\"" + px(badge.width()) + "\" height=\"" + px(kBadgeHeight) + "\" rx=\"7.5\" fill=\"" +
-           fill + "\" stroke=\"" + std::string(theme.badge) + "\"/>\n";
+    const std::string_view fill = badge.hollow ? theme.page : theme.badge;
+    const std::string_view ink = badge.hollow ? theme.text : theme.badgeText;
+    put(svg, "<g><title>", Escaped{badge.title}, "</title>\n<rect x=\"", number(badge.x), "\" y=\"",
+        number(y), "\" width=\"", number(badge.width()), "\" height=\"", number(kBadgeHeight),
+        "\" rx=\"7.5\" fill=\"", fill, "\" stroke=\"", theme.badge, "\"/>\n");
     appendTextLine(svg, badge.x + badge.width() / 2, y + kBadgeHeight - 4, badge.text,
-                   " text-anchor=\"middle\" font-weight=\"bold\" font-size=\"" + px(kBadgeSize) +
-                       "\" fill=\"" + ink + "\"");
+                   {kMiddle, {kBadgeSize, true}, ink});
     svg += "</g>\n";
 }
 
@@ -377,37 +379,35 @@ void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& th
     const double height = static_cast<double>(text.lines.size()) * kCaptionPitch + 5;
     const double x = (box.width - width) / 2;
     const double y = box.captionOnTop ? kFocusBorder - height : box.height - kFocusBorder;
-    svg += "<rect x=\"" + px(x) + "\" y=\"" + px(y) + "\" width=\"" + px(width) + "\" height=\"" +
-           px(height) + "\" rx=\"6\" fill=\"" + std::string(theme.focus) + "\"/>\n";
+    put(svg, "<rect x=\"", number(x), "\" y=\"", number(y), "\" width=\"", number(width), "\" height=\"",
+        number(height), "\" rx=\"6\" fill=\"", theme.focus, "\"/>\n");
     double baseline = y + kCaptionPitch - 1.5;
     for (const std::string& line : text.lines) {
-        appendTextLine(svg, box.width / 2, baseline, line,
-                       " text-anchor=\"middle\" font-weight=\"bold\" font-size=\"" + px(kCaptionSize) +
-                           "\" fill=\"" + std::string(theme.page) + "\"");
+        appendTextLine(svg, box.width / 2, baseline, line, {kMiddle, {kCaptionSize, true}, theme.page});
         baseline += kCaptionPitch;
     }
 }
 
 std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
     std::string title = kin::fullName(label);
-    if (!label.living && !label.birth.empty()) title += ", * " + label.birth;
-    if (!label.living && !label.death.empty()) title += ", \xE2\x80\xA0 " + label.death;
+    if (!label.living && !label.birth.empty()) put(title, ", * ", label.birth);
+    if (!label.living && !label.death.empty()) put(title, ", \xE2\x80\xA0 ", label.death);
     if (!label.living) {
-        for (const std::string& detail : label.details) title += ", " + detail;
+        for (const std::string& detail : label.details) put(title, ", ", detail);
     }
     if (box.isFocus) title += " (focus of this picture)";
-    if (!box.caption.empty()) title += ". " + box.caption;
+    if (!box.caption.empty()) put(title, ". ", box.caption);
     if (box.isCommonAncestor) title += ". Common ancestor";
-    if (box.repeatNumber > 0) title += ". " + repeatSentence(box);
-    if (box.hasHidden()) title += ". " + hiddenSentence(box, label.living);
-    if (box.box->furtherParents > 0 && !label.living) title += ". " + furtherSentence(*box.box);
-    for (const BoxMark& mark : box.marks) title += ". " + mark.title;
+    if (box.repeatNumber > 0) put(title, ". ", repeatSentence(box));
+    if (box.hasHidden()) put(title, ". ", hiddenSentence(box, label.living));
+    if (box.box->furtherParents > 0 && !label.living) put(title, ". ", furtherSentence(*box.box));
+    for (const BoxMark& mark : box.marks) put(title, ". ", mark.title);
     return title;
 }
 
 void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
-    svg += "<g role=\"img\" transform=\"translate(" + px(box.x) + " " + px(box.y) + ")\"><title>" +
-           escaped(title) + "</title>\n";
+    put(svg, "<g role=\"img\" transform=\"translate(", number(box.x), " ", number(box.y), ")\"><title>",
+        Escaped{title}, "</title>\n");
 }
 
 // What is left of a label when it must not be shown.
@@ -466,19 +466,17 @@ void appendUnknownParentBox(std::string& svg, const BoxFrame& box, const std::st
     const char* invitation = isFather ? "add father" : "add mother";
     const kin::Sex sex = isFather ? kin::Sex::male : kin::Sex::female;
     openBox(svg, box, std::string(invitation) + " of " + childName);
-    svg += "<rect width=\"" + px(box.width) + "\" height=\"" + px(box.height) + "\" rx=\"" +
-           px(cornerOf(sex)) + "\" fill=\"" + std::string(theme.page) + "\" stroke=\"" +
-           std::string(theme.unknownParent) + "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n";
+    put(svg, "<rect width=\"", number(box.width), "\" height=\"", number(box.height), "\" rx=\"",
+        number(cornerOf(sex)), "\" fill=\"", theme.page, "\" stroke=\"", theme.unknownParent,
+        "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n");
     const double middleX = isWide(box) ? kInset + kSilhouetteWidth / 2 : box.width / 2;
     const double middleY = isWide(box) ? box.height / 2 : box.height / 2 - 18;
-    svg += "<path d=\"M" + px(middleX - 11) + " " + px(middleY) + "h22m-11 -11v22\" stroke=\"" +
-           std::string(theme.unknownParent) +
-           "\" stroke-width=\"3\" stroke-linecap=\"round\" fill=\"none\"/>\n";
+    put(svg, "<path d=\"M", number(middleX - 11), " ", number(middleY), "h22m-11 -11v22\" stroke=\"",
+        theme.unknownParent, "\" stroke-width=\"3\" stroke-linecap=\"round\" fill=\"none\"/>\n");
     const TextRoom room = textRoomOf(box);
     const double baseline = isWide(box) ? box.height / 2 + 4 : box.height / 2 + 22;
     appendTextLine(svg, room.x, baseline, invitation,
-                   anchorAttribute(room, invitation) + " font-size=\"12\" fill=\"" +
-                       std::string(theme.quietText) + "\"");
+                   {anchorAttribute(room, invitation), {12, false}, theme.quietText});
     svg += "</g>\n";
 }
 

@@ -135,14 +135,20 @@ private:
         return r < fan_.ringRadii.size() ? fan_.ringRadii[r] * Frame::kScale : 0;
     }
 
-    std::string point(double degrees, double r) const {
+    void putPoint(std::string& d, double degrees, double r) const {
         const picture::CirclePoint p = picture::onCircle(degrees, r);
-        return px(middleX_ + p.x) + " " + px(middleY_ + p.y);
+        put(d, number(middleX_ + p.x), " ", number(middleY_ + p.y));
     }
 
-    std::string arcTo(double r, double span, double end, bool clockwise) const {
-        return "A" + px(r) + " " + px(r) + " 0 " + (span > 180 ? "1 " : "0 ") + (clockwise ? "1 " : "0 ") +
-               point(end, r);
+    // begin is "M" or "L".
+    void putStart(std::string& d, const char* begin, double degrees, double r) const {
+        d += begin;
+        putPoint(d, degrees, r);
+    }
+
+    void putArc(std::string& d, double r, double span, double end, bool clockwise) const {
+        put(d, "A", number(r), " ", number(r), " 0 ", span > 180 ? "1 " : "0 ", clockwise ? "1 " : "0 ");
+        putPoint(d, end, r);
     }
 
     std::string shapeOf(std::size_t i) const {
@@ -151,19 +157,30 @@ private:
         const double r1 = outerOf(i);
         const double span = arc.to - arc.from;
         if (span >= 360) return ringShape(r0, r1);
-        std::string d = "M" + point(arc.from, r1) + arcTo(r1, span, arc.to, true);
+        std::string d;
+        putStart(d, "M", arc.from, r1);
+        putArc(d, r1, span, arc.to, true);
         if (r0 > 0) {
-            d += "L" + point(arc.to, r0) + arcTo(r0, span, arc.from, false);
+            putStart(d, "L", arc.to, r0);
+            putArc(d, r0, span, arc.from, false);
         } else {
-            d += "L" + px(middleX_) + " " + px(middleY_);
+            put(d, "L", number(middleX_), " ", number(middleY_));
         }
         return d + "Z";
     }
 
     std::string ringShape(double r0, double r1) const {
-        std::string d = "M" + point(0, r1) + arcTo(r1, 180, 180, true) + arcTo(r1, 180, 360, true) + "Z";
-        if (r0 > 0) d += "M" + point(0, r0) + arcTo(r0, 180, 180, false) + arcTo(r0, 180, 360, false) + "Z";
+        std::string d;
+        putRing(d, r1, true);
+        if (r0 > 0) putRing(d, r0, false);
         return d;
+    }
+
+    void putRing(std::string& d, double r, bool clockwise) const {
+        putStart(d, "M", 0, r);
+        putArc(d, r, 180, 180, clockwise);
+        putArc(d, r, 180, 360, clockwise);
+        d += "Z";
     }
 
     void appendCell(std::size_t i, const std::vector<BoxMark>& marks) {
@@ -172,10 +189,10 @@ private:
         const kin::PersonLabel label =
             box.kind == picture::BoxKind::person ? readableLabel(content_, box.id) : kin::PersonLabel();
         const std::size_t start = svg_.svg.size();
-        svg_.svg += "<g role=\"img\"><title>" + escaped(titleOf(label, isFocus, marks)) +
-                    "</title>\n<path d=\"" + shapeOf(i) + "\" fill=\"" + std::string(fillOf(i)) +
-                    "\" stroke=\"" + std::string(isFocus ? theme().focus : coloursOf(i).border) +
-                    "\" stroke-width=\"" + px(isFocus ? kFocusBorder : kBorder) + "\"/>\n";
+        put(svg_.svg, "<g role=\"img\"><title>", Escaped{titleOf(label, isFocus, marks)},
+            "</title>\n<path d=\"", shapeOf(i), "\" fill=\"", fillOf(i), "\" stroke=\"",
+            isFocus ? theme().focus : coloursOf(i).border, "\" stroke-width=\"",
+            number(isFocus ? kFocusBorder : kBorder), "\"/>\n");
         appendTexts(i, textOf(label, marks));
         svg_.svg += "</g>\n";
         const PictureArea area{frame_.x(box.x), frame_.y(box.y),
@@ -189,7 +206,7 @@ private:
         if (label.living) return years;
         if (!label.birth.empty()) years = "* " + cleanText(label.birth);
         if (!label.death.empty())
-            years += (years.empty() ? "" : "  ") + ("\xE2\x80\xA0 " + cleanText(label.death));
+            put(years, (years.empty() ? "" : "  "), ("\xE2\x80\xA0 " + cleanText(label.death)));
         return years;
     }
 
@@ -197,9 +214,9 @@ private:
                                const std::vector<BoxMark>& marks) {
         std::string title = kin::fullName(label);
         const std::string years = yearsOf(label);
-        if (!years.empty()) title += ", " + years;
+        if (!years.empty()) put(title, ", ", years);
         if (isFocus) title += " (focus of this picture)";
-        for (const BoxMark& mark : marks) title += ". " + mark.title;
+        for (const BoxMark& mark : marks) put(title, ". ", mark.title);
         return title;
     }
 
@@ -216,7 +233,7 @@ private:
             if (lines.empty()) lines.push_back({"?", true});
         }
         std::string facts = yearsOf(label);
-        for (const BoxMark& mark : marks) facts += (facts.empty() ? "" : " ") + mark.text;
+        for (const BoxMark& mark : marks) put(facts, (facts.empty() ? "" : " "), mark.text);
         if (!facts.empty()) lines.push_back({facts, false});
         return lines;
     }
@@ -299,7 +316,7 @@ private:
         std::string facts;
         for (const TextLine& line : lines) {
             std::string& text = line.bold ? names : facts;
-            text += (text.empty() ? "" : " ") + line.text;
+            put(text, (text.empty() ? "" : " "), line.text);
         }
         const bool twoLines = !facts.empty() && breadth >= 2 * (kLeastName + 3);
         const double size = std::min(kLargestName, (twoLines ? breadth / 2 : breadth) - 2);
@@ -322,12 +339,13 @@ private:
         } else {
             svg_.text.add(size);
         }
-        const std::string transform =
-            turn == 0 ? std::string() : " transform=\"rotate(" + px(turn) + " " + px(x) + " " + px(y) + ")\"";
-        svg_.svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\" dy=\"" + px(size * 0.36) +
-                    "\" text-anchor=\"" + anchor + "\"" + transform + (bold ? " font-weight=\"bold\"" : "") +
-                    " font-size=\"" + px(size) + "\" fill=\"" + std::string(theme().text) + "\"" +
-                    (runsRightToLeft(text) ? " direction=\"rtl\"" : "") + ">" + escaped(text) + "</text>\n";
+        put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\" dy=\"", number(size * 0.36),
+            "\" text-anchor=\"", anchor, "\"");
+        if (turn != 0)
+            put(svg_.svg, " transform=\"rotate(", number(turn), " ", number(x), " ", number(y), ")\"");
+        put(svg_.svg, (bold ? " font-weight=\"bold\"" : ""), " font-size=\"", number(size), "\" fill=\"",
+            theme().text, "\"", (runsRightToLeft(text) ? " direction=\"rtl\"" : ""), ">", Escaped{text},
+            "</text>\n");
     }
 
     void appendLinks() { appendLines(svg_, content_, options_, frame_); }
@@ -345,11 +363,10 @@ private:
             const std::string text = fitLine(name, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
             const int y = top + kLegendPitch * static_cast<int>(i);
-            legend += "<rect x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(y) +
-                      "\" width=\"28\" height=\"14\" fill=\"" + std::string(fillOf(box)) + "\" stroke=\"" +
-                      std::string(theme().line) + "\"/>\n<text x=\"" + std::to_string(kMargin + 38) +
-                      "\" y=\"" + std::to_string(y + 11) + "\" font-size=\"" + px(kLegendSize) +
-                      "\" fill=\"" + std::string(theme().quietText) + "\">" + escaped(text) + "</text>\n";
+            put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
+                "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line,
+                "\"/>\n<text x=\"", whole(kMargin + 38), "\" y=\"", whole(y + 11), "\" font-size=\"",
+                number(kLegendSize), "\" fill=\"", theme().quietText, "\">", Escaped{text}, "</text>\n");
         }
         const double height = static_cast<double>(lines_.size()) * kLegendPitch;
         svg_.height += static_cast<int>(height) + 12;

@@ -65,8 +65,8 @@ public:
         : svg_(svg), content_(content), picture_(content.picture), options_(options), frame_(frame) {}
 
     LineStylesUsed drawAll() {
-        svg_.svg += "<g fill=\"none\" stroke=\"" + std::string(options_.theme->line) + "\" stroke-width=\"" +
-                    px(kLineWidth) + "\" stroke-linejoin=\"round\" stroke-linecap=\"square\">\n";
+        put(svg_.svg, "<g fill=\"none\" stroke=\"", options_.theme->line, "\" stroke-width=\"",
+            number(kLineWidth), "\" stroke-linejoin=\"round\" stroke-linecap=\"square\">\n");
         for (const Family& family : picture_.families) {
             if (family.lineCount > 0) draw(family);
         }
@@ -107,42 +107,41 @@ private:
         used_[static_cast<std::size_t>(style)] = true;
         svg_.svg += "<path";
         if (style != LineStyle::plain) {
-            svg_.svg += " stroke-linecap=\"butt\" stroke-dasharray=\"" + std::string(dashesOf(style)) + "\"";
+            put(svg_.svg, " stroke-linecap=\"butt\" stroke-dasharray=\"", dashesOf(style), "\"");
         }
-        svg_.svg += " d=\"" + path + "\"/>";
+        put(svg_.svg, " d=\"", path, "\"/>");
     }
 
     std::string pathOf(const Line& line) const {
         const double x1 = frame_.x(std::min(line.x1, line.x2));
         const double x2 = frame_.x(std::max(line.x1, line.x2));
         if (line.x1 == line.x2) {
-            return "M" + px(x1) + " " + px(frame_.y(std::min(line.y1, line.y2))) + "V" +
-                   px(frame_.y(std::max(line.y1, line.y2)));
+            return joined("M", number(x1), " ", number(frame_.y(std::min(line.y1, line.y2))), "V",
+                          number(frame_.y(std::max(line.y1, line.y2))));
         }
         if (line.y1 != line.y2) {
-            return "M" + px(frame_.x(line.x1)) + " " + px(frame_.y(line.y1)) + "L" + px(frame_.x(line.x2)) +
-                   " " + px(frame_.y(line.y2));
+            return joined("M", number(frame_.x(line.x1)), " ", number(frame_.y(line.y1)), "L",
+                          number(frame_.x(line.x2)), " ", number(frame_.y(line.y2)));
         }
-        return "M" + px(x1) + " " + px(frame_.y(line.y1)) + jumps(line) + "H" + px(x2);
+        std::string path = joined("M", number(x1), " ", number(frame_.y(line.y1)));
+        appendJumps(path, line);
+        put(path, "H", number(x2));
+        return path;
     }
 
     // Up in a quarter of a circle, over one line or several that are close, and down again.
-    std::string jumps(const Line& line) const {
+    void appendJumps(std::string& path, const Line& line) const {
         std::vector<double> places;
         for (const double place : picture_.bridgesOf(line)) places.push_back(frame_.x(place));
         std::sort(places.begin(), places.end());
-        const std::string r = px(kBridge);
-        const std::string up = "a" + r + " " + r + " 0 0 1 " + r + " -" + r;
-        const std::string down = "a" + r + " " + r + " 0 0 1 " + r + " " + r;
-        std::string path;
+        const Number r = number(kBridge);
         for (std::size_t i = 0, next = 0; i < places.size(); i = next) {
             while (next < places.size() && places[next] - places[i == next ? i : next - 1] <= 2 * kBridge)
                 ++next;
-            path.append("H").append(px(places[i] - kBridge)).append(up);
-            if (next - i > 1) path.append("H").append(px(places[next - 1]));
-            path += down;
+            put(path, "H", number(places[i] - kBridge), "a", r, " ", r, " 0 0 1 ", r, " -", r);
+            if (next - i > 1) put(path, "H", number(places[next - 1]));
+            put(path, "a", r, " ", r, " 0 0 1 ", r, " ", r);
         }
-        return path;
     }
 
     // Over the first piece of marriage that lies flat, in page colour around, so that lines below do not show.
@@ -162,11 +161,10 @@ private:
         const double y =
             (frame_.y(line.y1) + frame_.y(line.y2)) / 2 - (isFlat ? kLabelLift : -kLabelSize / 3);
         svg_.text.add(kLabelSize);
-        svg_.svg += "<text x=\"" + px(x) + "\" y=\"" + px(y) + "\"" +
-                    (isFlat ? " text-anchor=\"middle\"" : "") + " font-size=\"" + px(kLabelSize) +
-                    "\" fill=\"" + std::string(options_.theme->quietText) + "\" stroke=\"" +
-                    std::string(options_.theme->page) + "\" stroke-width=\"3\" paint-order=\"stroke\">" +
-                    escaped(text) + "</text>";
+        put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\"",
+            (isFlat ? " text-anchor=\"middle\"" : ""), " font-size=\"", number(kLabelSize), "\" fill=\"",
+            options_.theme->quietText, "\" stroke=\"", options_.theme->page,
+            "\" stroke-width=\"3\" paint-order=\"stroke\">", Escaped{text}, "</text>");
     }
 
     PictureArea areaOf(const Line& line) const {

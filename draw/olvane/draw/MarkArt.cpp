@@ -8,6 +8,8 @@
 
 #include <cstddef>
 
+#include <olvane/draw/SvgTextInternal.h>
+
 namespace olvane::draw {
 
 namespace {
@@ -36,21 +38,22 @@ public:
 private:
     void add(Index box, const char* sign, const Mark& mark, const std::string& title, MarkPlace place) {
         if (box == picture::kNone) return;
-        marks_[static_cast<std::size_t>(box)].push_back({sign + std::to_string(mark.number), title, place});
+        marks_[static_cast<std::size_t>(box)].push_back({joined(sign, whole(mark.number)), title, place});
     }
 
     void addParents(const Mark& mark) {
-        const std::string number = std::to_string(mark.number);
-        add(mark.boxes[0], kUp, mark, "Child of whoever is marked " + (kDown + number), MarkPlace::top);
+        add(mark.boxes[0], kUp, mark, joined("Child of whoever is marked ", kDown, whole(mark.number)),
+            MarkPlace::top);
         for (const Index parent : {mark.boxes[1], mark.boxes[2]}) {
-            add(parent, kDown, mark, "Parent of who is marked " + (kUp + number), MarkPlace::bottom);
+            add(parent, kDown, mark, joined("Parent of who is marked ", kUp, whole(mark.number)),
+                MarkPlace::bottom);
         }
     }
 
     void addPartners(const Mark& mark) {
-        const std::string number = std::to_string(mark.number);
         for (const Index partner : {mark.boxes[0], mark.boxes[1]}) {
-            add(partner, kBoth, mark, "Partner of who is marked " + (kBoth + number) + " as well",
+            add(partner, kBoth, mark,
+                joined("Partner of who is marked ", kBoth, whole(mark.number), " as well"),
                 MarkPlace::bottom);
         }
     }
@@ -66,10 +69,11 @@ private:
             std::size_t kept = 0;
             std::erase_if(marks, [&](const BoxMark& mark) {
                 if (mark.place != place || ++kept < kMostMarks) return false;
-                title += (title.empty() ? "" : "; ") + mark.title;
+                put(title, (title.empty() ? "" : "; "), mark.title);
                 return true;
             });
-            marks.push_back({"+" + std::to_string(count - kMostMarks + 1), title, place});
+            marks.push_back(
+                {joined("+", whole(static_cast<long long>(count - kMostMarks + 1))), title, place});
         }
     }
 

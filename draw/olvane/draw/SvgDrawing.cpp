@@ -183,9 +183,8 @@ private:
     }
 
     void appendNobody() {
-        picture_.svg += "<text x=\"" + std::to_string(kMargin) + "\" y=\"" +
-                        std::to_string(picture_.height / 2) + "\" font-size=\"12\" fill=\"" +
-                        std::string(theme().quietText) + "\">Nobody to show</text>\n";
+        put(picture_.svg, "<text x=\"", whole(kMargin), "\" y=\"", whole(picture_.height / 2),
+            "\" font-size=\"12\" fill=\"", theme().quietText, "\">Nobody to show</text>\n");
     }
 
     BoxFrame frameOf(const picture::Box& box) const {
@@ -264,16 +263,14 @@ private:
         return legend + "</g>\n";
     }
 
-    void appendLegendRow(std::string& legend, int number, const LegendRow& row) const {
-        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * number + kLegendPitch / 2;
-        legend += "<path d=\"M" + std::to_string(kMargin) + " " + std::to_string(y) + "h" +
-                  std::to_string(kLegendStroke) + "\" fill=\"none\" stroke=\"" + std::string(row.colour) +
-                  "\" stroke-width=\"" + px(row.width) + "\"";
-        if (!row.dashes.empty()) legend += " stroke-dasharray=\"" + std::string(row.dashes) + "\"";
-        legend += "/>\n<text x=\"" + std::to_string(kMargin + kLegendStroke + 10) + "\" y=\"" +
-                  std::to_string(y + 4) + "\" font-size=\"" + px(kLegendSize) + "\" fill=\"" +
-                  std::string(theme().quietText) + "\">" + escaped(cleanText(cutText(row.text))) +
-                  "</text>\n";
+    void appendLegendRow(std::string& legend, int place, const LegendRow& row) const {
+        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * place + kLegendPitch / 2;
+        put(legend, "<path d=\"M", whole(kMargin), " ", whole(y), "h", whole(kLegendStroke),
+            "\" fill=\"none\" stroke=\"", row.colour, "\" stroke-width=\"", number(row.width), "\"");
+        if (!row.dashes.empty()) put(legend, " stroke-dasharray=\"", row.dashes, "\"");
+        put(legend, "/>\n<text x=\"", whole(kMargin + kLegendStroke + 10), "\" y=\"", whole(y + 4),
+            "\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().quietText, "\">",
+            Escaped{cleanText(cutText(row.text))}, "</text>\n");
     }
 
     const DrawingContent& content_;
@@ -288,27 +285,25 @@ void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
     if (!options.headline) return;
     const Font font{kHeadlineSize, true};
     const std::string text = fitLine(cleanText(cutText(options.title)), font, picture.width - 2 * kMargin);
-    picture.svg += "<text x=\"" + std::to_string(kMargin) + "\" y=\"" + std::to_string(kMargin + 12) +
-                   "\" font-weight=\"bold\" font-size=\"" + px(kHeadlineSize) + "\" fill=\"" +
-                   std::string(options.theme->text) + "\">" + escaped(text) + "</text>\n";
+    put(picture.svg, "<text x=\"", whole(kMargin), "\" y=\"", whole(kMargin + 12),
+        "\" font-weight=\"bold\" font-size=\"", number(kHeadlineSize), "\" fill=\"", options.theme->text,
+        "\">", Escaped{text}, "</text>\n");
 }
 
 }  // namespace
 
 void openPage(SvgPicture& picture, const DrawingOptions& options) {
-    const std::string width = std::to_string(picture.width);
-    const std::string height = std::to_string(picture.height);
-    const std::string widthDrawn = options.scale == 1 ? width : px(picture.width * options.scale);
-    const std::string heightDrawn = options.scale == 1 ? height : px(picture.height * options.scale);
-    picture.svg +=
-        "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" +
-        widthDrawn + "\" height=\"" + heightDrawn + "\" viewBox=\"0 0 " + width + " " + height +
-        "\" role=\"group\" aria-label=\"" + escaped(cutText(options.title)) + "\">\n<title>" +
-        escaped(cutText(options.title)) + "</title>\n";
+    const Whole width = whole(picture.width);
+    const Whole height = whole(picture.height);
+    const std::string title = escaped(cutText(options.title));
+    put(picture.svg,
+        "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"",
+        number(picture.width * options.scale), "\" height=\"", number(picture.height * options.scale),
+        "\" viewBox=\"0 0 ", width, " ", height, "\" role=\"group\" aria-label=\"", title, "\">\n<title>",
+        title, "</title>\n");
     appendBoxDefinitions(picture.svg);
-    picture.svg += "<rect width=\"" + width + "\" height=\"" + height + "\" fill=\"" +
-                   std::string(options.theme->page) + "\"/>\n<g font-family=\"" + std::string(kFontFamilies) +
-                   "\">\n";
+    put(picture.svg, "<rect width=\"", width, "\" height=\"", height, "\" fill=\"", options.theme->page,
+        "\"/>\n<g font-family=\"", kFontFamilies, "\">\n");
     appendHeadline(picture, options);
 }
 

@@ -11,39 +11,62 @@
 
 namespace olvane::draw {
 
-std::string escaped(std::string_view text) {
-    std::string result;
-    for (const char c : picture::cleanText(text)) {
-        switch (c) {
-            case '&':
-                result += "&amp;";
-                break;
-            case '<':
-                result += "&lt;";
-                break;
-            case '>':
-                result += "&gt;";
-                break;
-            case '"':
-                result += "&quot;";
-                break;
-            case '\'':
-                result += "&#39;";
-                break;
-            default:
-                result += c;
+namespace {
+
+std::string_view entityOf(char c) {
+    switch (c) {
+        case '&':
+            return "&amp;";
+        case '<':
+            return "&lt;";
+        case '>':
+            return "&gt;";
+        case '"':
+            return "&quot;";
+        case '\'':
+            return "&#39;";
+        default:
+            return {};
+    }
+}
+
+}  // namespace
+
+void append(std::string& svg, std::string_view text) {
+    svg += text;
+}
+
+void append(std::string& svg, Number part) {
+    const long long tenths = std::llround(part.value * 10);
+    const long long size = tenths < 0 ? -tenths : tenths;
+    if (tenths < 0) svg += '-';
+    append(svg, whole(size / 10));
+    if (size % 10 == 0) return;
+    svg += '.';
+    svg += static_cast<char>('0' + size % 10);
+}
+
+void append(std::string& svg, Whole part) {
+    svg += std::to_string(part.value);
+}
+
+void append(std::string& svg, Escaped part) {
+    for (const char c : picture::cleanText(part.text)) {
+        const std::string_view entity = entityOf(c);
+        if (entity.empty()) {
+            svg += c;
+        } else {
+            svg += entity;
         }
     }
-    return result;
+}
+
+std::string escaped(std::string_view text) {
+    return joined(Escaped{text});
 }
 
 std::string px(double value) {
-    const long long tenths = std::llround(value * 10);
-    const long long size = tenths < 0 ? -tenths : tenths;
-    std::string text = tenths < 0 ? "-" : "";
-    text += std::to_string(size / 10);
-    if (size % 10 != 0) text += "." + std::to_string(size % 10);
-    return text;
+    return joined(number(value));
 }
 
 }  // namespace olvane::draw

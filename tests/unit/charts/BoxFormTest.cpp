@@ -37,4 +37,16 @@ TEST(BoxForm, setsTheSizesOfChartsAndOfTheEngine) {
     EXPECT_EQ(chart.layout.sizes.nodeHeight, 80);
 }
 
+TEST(BoxForm, flagsStandAtTheLastColumnOfAPedigree) {
+    ChartRequest chart;
+    flagBeyondGenerations(chart);
+    EXPECT_EQ(chart.layout.flagDepth, 4);
+    chart.layout.generations = 7;
+    flagBeyondGenerations(chart);
+    EXPECT_EQ(chart.layout.flagDepth, 6);
+    chart.layout.generations = 1;
+    flagBeyondGenerations(chart);
+    EXPECT_EQ(chart.layout.flagDepth, 1);
+}
+
 }  // namespace

@@ -6,14 +6,13 @@
 // no dialog and stores nothing. Everything inside lies in its own shadow tree, so that any number of them stand
 // on one page.
 
-import { type GedcomFile, LayoutError, type Olvane, type Person, type PictureOptions } from "olvane";
+import { type DrawingTheme, type GedcomFile, LayoutError, type Olvane, type Person, type PictureOptions } from "olvane";
 import { html, setAttributes, svg } from "../base/dom";
 import type { ViewName } from "../base/views";
 import { type Messages, messagesFor } from "../messages";
 import { nameOf, yearsOf } from "../messages/names";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import type { Placing } from "../scene/Camera";
-import { svgText, wholePicture } from "../output/pictureSvg";
 import { PictureContents } from "../scene/PictureContents";
 import { Scene } from "../scene/Scene";
 import { Corner } from "../ui/Corner";
@@ -33,15 +32,6 @@ const kWarmUps = 8;
 const kWarmUpPause = 120; // ms
 const kWarmEnough = 12; // ms; what takes less needs no warming
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
-
-/** A picture and what is written on it, for whoever saves or prints it. */
-export interface Shown {
-    readonly picture: Picture;
-    readonly contents: PictureContents;
-    readonly title: string;
-    /** Where the viewer's looks hold. */
-    readonly root: ShadowRoot;
-}
 
 export interface OlvaneTreeEvents {
     /** Another person is selected: the panel is about them. */
@@ -276,14 +266,18 @@ export class OlvaneTree extends HTMLElement {
 
     /** The whole picture as the text of an SVG file, in the colours of the viewer; null before any. */
     saveSvg(): string | null {
-        const { shown } = this;
-        return shown && svgText(wholePicture(shown, this.dataset["theme"] ?? "light").svg);
+        return this.drawing(this.dataset["theme"] === "dark" ? "dark" : "light");
     }
 
-    /** The picture and its looks; null before any. */
-    get shown(): Shown | null {
-        const { picture, contents } = this;
-        return picture && contents ? { picture, contents, title: this.pictureTitle(), root: this.shadow } : null;
+    /** The whole picture as the text of an SVG file; null before any. */
+    drawing(theme: DrawingTheme): string | null {
+        const { opened, shownState } = this;
+        return opened && shownState && this.picture ? opened.svg(shownState, theme, this.messages.language as PictureOptions["language"]) : null;
+    }
+
+    /** What the picture is called; empty before any. */
+    get shownTitle(): string {
+        return this.picture ? this.pictureTitle() : "";
     }
 
     // --- words ---

@@ -3,19 +3,25 @@
 
 // The ways out of the page: the picture as SVG or PNG in the colours of the screen, and on paper in its own.
 
+import type { DrawingTheme } from "olvane";
 import type { UiMessages } from "../messages/ui";
 import type { Notices } from "../ui/Notices";
-import { type Looks, wholePicture, type WholePicture } from "./pictureSvg";
 import { PrintSheet } from "./printing";
 import { pngOf, saveFile, svgBlob } from "./saving";
 
-export interface Subject extends Looks {
+export interface Subject {
     // Of a file, without its ending.
     readonly name: string;
+    readonly title: string;
+    // The text of an SVG file.
+    drawing(theme: DrawingTheme): string;
 }
 
 export class PictureOutput {
-    readonly sheet = new PrintSheet(() => this.whole("print"));
+    readonly sheet = new PrintSheet(() => {
+        const subject = this.subject();
+        return subject && { title: subject.title, drawing: subject.drawing("print") };
+    });
 
     // subject gives what is to be seen at the time, or null before any family is open.
     constructor(
@@ -24,32 +30,27 @@ export class PictureOutput {
     ) {}
 
     saveSvg(ui: UiMessages): void {
-        const whole = this.whole(screenTheme());
-        if (!whole) return;
-        const name = this.subject()!.name + ".svg";
-        saveFile(name, svgBlob(whole));
-        this.notices.show(ui.saved(name));
+        const subject = this.subject();
+        if (!subject) return;
+        const name = subject.name + ".svg";
+        saveFile(name, svgBlob(subject.drawing(screenTheme())));
+        this.notices.tell(ui.saved(name));
     }
 
     async savePng(ui: UiMessages): Promise<void> {
-        const whole = this.whole(screenTheme());
-        if (!whole) return;
-        const name = this.subject()!.name + ".png";
+        const subject = this.subject();
+        if (!subject) return;
+        const name = subject.name + ".png";
         try {
-            const { blob, part } = await pngOf(whole);
+            const { blob, part } = await pngOf(subject.drawing(screenTheme()));
             saveFile(name, blob);
-            this.notices.show(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
+            this.notices.tell(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
         } catch {
             this.notices.fail(ui.pictureFailed, []);
         }
     }
-
-    private whole(theme: string): WholePicture | null {
-        const subject = this.subject();
-        return subject && wholePicture(subject, theme);
-    }
 }
 
-function screenTheme(): string {
-    return document.documentElement.dataset["theme"] ?? "light";
+function screenTheme(): DrawingTheme {
+    return document.documentElement.dataset["theme"] === "dark" ? "dark" : "light";
 }

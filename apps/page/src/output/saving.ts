@@ -4,9 +4,8 @@
 // Hands files to the browser's downloads, and turns a drawing into pixels.
 
 import { html } from "../base/dom";
-import { svgText, type WholePicture } from "./pictureSvg";
 
-const kSharpness = 2; // px for a point
+const kSharpness = 2; // pixels for a px of the drawing
 const kMostSide = 12000; // px; beyond it some browsers hand out an empty canvas
 const kMostPixels = 100e6;
 
@@ -19,8 +18,16 @@ export function saveFile(name: string, content: Blob): void {
     setTimeout(() => URL.revokeObjectURL(address), 60_000);
 }
 
-export function svgBlob(whole: WholePicture): Blob {
-    return new Blob([svgText(whole.svg)], { type: "image/svg+xml" });
+export function svgBlob(drawing: string): Blob {
+    return new Blob([drawing], { type: "image/svg+xml" });
+}
+
+/** A drawing as an element of this document, with its size in px. */
+export function drawingElement(drawing: string): { svg: SVGSVGElement; width: number; height: number } {
+    const root = new DOMParser().parseFromString(drawing, "image/svg+xml").documentElement;
+    const svg = document.importNode(root, true) as Element as SVGSVGElement;
+    const [width, height] = [Number(svg.getAttribute("width")), Number(svg.getAttribute("height"))];
+    return { svg, width, height };
 }
 
 export interface Pixels {
@@ -29,8 +36,8 @@ export interface Pixels {
     readonly part: number;
 }
 
-export async function pngOf(whole: WholePicture): Promise<Pixels> {
-    const { width, height } = whole;
+export async function pngOf(drawing: string): Promise<Pixels> {
+    const { width, height } = drawingElement(drawing);
     const most = Math.min(
         kSharpness,
         kMostSide / Math.max(width, height),
@@ -42,7 +49,7 @@ export async function pngOf(whole: WholePicture): Promise<Pixels> {
     });
     const pen = canvas.getContext("2d");
     if (!pen) throw new Error("no canvas");
-    pen.drawImage(await imageOf(svgBlob(whole)), 0, 0, canvas.width, canvas.height);
+    pen.drawImage(await imageOf(svgBlob(drawing)), 0, 0, canvas.width, canvas.height);
     const blob = await new Promise<Blob | null>((done) => canvas.toBlob(done, "image/png"));
     if (!blob) throw new Error("no picture");
     return { blob, part: Math.min(1, most / kSharpness) };

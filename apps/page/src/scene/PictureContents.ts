@@ -4,7 +4,7 @@
 // What stands in each box and what is read out for it. Kinship is stated only once it is known, since a search
 // through a large family must not hold up the picture.
 
-import type { Person } from "olvane";
+import type { NameParts, Person, Texts } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../messages/names";
@@ -28,6 +28,10 @@ export class PictureContents implements BoxContents {
         private readonly picture: Picture,
         private readonly wording: Wording,
     ) {}
+
+    get texts(): Texts {
+        return this.family.file.texts;
+    }
 
     // Empty where none is known, and for the focus.
     kinshipOf(id: number): string {
@@ -88,7 +92,8 @@ export class PictureContents implements BoxContents {
             person: person.id,
             xref: person.xref,
             sex: person.sex,
-            nameParts: nameParts(person, messages),
+            name: nameParts(person, messages),
+            texts: this.texts,
             rightToLeft: directionOf(person.name) === "rtl",
             years: shortYears(person),
             kinship: this.wording.kinshipInBoxes
@@ -115,7 +120,8 @@ export class PictureContents implements BoxContents {
             person: 0,
             xref: "",
             sex: box.sex,
-            nameParts: [what],
+            name: { given: what, surname: "" },
+            texts: this.texts,
             rightToLeft: false,
             years: "",
             kinship: null,
@@ -142,8 +148,8 @@ export function shortYears(person: Person): string {
 }
 
 // Surname first where the file writes it first.
-function nameParts(person: Person, messages: Messages): string[] {
+function nameParts(person: Person, messages: Messages): NameParts {
     const { given, surname, name } = person;
-    if (!given || !surname) return [nameOf(person, messages)];
-    return name.startsWith(surname) && !name.endsWith(surname) ? [surname, given] : [given, surname];
+    if (!given || !surname) return { given: nameOf(person, messages), surname: "" };
+    return { given, surname, surnameFirst: name.startsWith(surname) && !name.endsWith(surname) };
 }

@@ -7,6 +7,7 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
+import type { Texts } from "olvane";
 import { prefersStillness, svg } from "../base/dom";
 import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
@@ -37,6 +38,8 @@ export interface SceneEvents {
 
 // How the boxes of a picture are to be drawn.
 export interface BoxContents {
+    // Measures what is written; its fonts are those of the boxes.
+    readonly texts: Texts;
     lookOf(box: Box): BoxLook;
 }
 
@@ -83,6 +86,7 @@ export class Scene {
         this.endGlide();
         this.picture = picture;
         this.contents = contents;
+        this.world.setAttribute("font-family", contents.texts.fontFamilies);
         this.activeBox = picture.focusBox;
         this.pointedBox = null;
         this.elements.clear();

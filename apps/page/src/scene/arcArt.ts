@@ -7,7 +7,6 @@
 import { svg } from "../base/dom";
 import type { Box, BoxArc } from "../view/Picture";
 import type { BoxLook } from "./boxArt";
-import { fitLine, fitName } from "./textFit";
 
 const kYearsSize = 10;
 const kInset = 4; // points on each side of a text
@@ -64,16 +63,18 @@ function appendText(group: SVGGElement, look: BoxLook, { x, y }: Box, arc: BoxAr
     const width = (radius === 0 ? 1.7 * arc.outer : isAcross ? across : along) - 2 * kInset;
     const height = (radius === 0 ? arc.outer : isAcross ? along : across) - 2;
     if (width < kLeastRoom || height < 9) return;
-    const lines = Math.max(1, Math.min(3, Math.floor(height / 13) - (look.years ? 1 : 0)));
-    const name = fitName(look.nameParts, width, lines);
-    const years = look.years && height >= (name.lines.length + 1) * 13 ? fitLine(look.years, kYearsSize, 400, width) : "";
+    const { texts } = look;
+    const nameHeight = height - (look.years && height >= 26 ? 13 : 0);
+    const name = texts.fitName(look.name, { width, height: nameHeight, gap: 1, lines: 3 });
+    const hasYears = look.years !== "" && height >= (name.lines.length + 1) * 13;
+    const years = hasYears ? texts.fitLine(look.years, kYearsSize, width) : "";
     const [cx, cy] = pointAt(arc, radius, middle);
     const turn = radius === 0 ? 0 : uprightTurn(isAcross ? middle - 90 : middle);
-    const texts = [...name.lines, ...(years ? [years] : [])];
+    const shown = [...name.lines, ...(years ? [years] : [])];
     const pitch = Math.max(12, name.size + 1);
-    const top = -((texts.length - 1) * pitch) / 2 + 4;
+    const top = -((shown.length - 1) * pitch) / 2 + 4;
     const holder = svg("g", { transform: `translate(${(cx - x).toFixed(1)} ${(cy - y).toFixed(1)}) rotate(${turn.toFixed(1)})` });
-    texts.forEach((line, i) =>
+    shown.forEach((line, i) =>
         holder.append(
             svg(
                 "text",

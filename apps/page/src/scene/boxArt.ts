@@ -5,12 +5,11 @@
 // left and lines beside it. Sex is shown by corners and silhouette as well as by colour. Colours come from the
 // page's themes.
 
-import type { Sex } from "olvane";
+import type { NameParts, Sex, Texts } from "olvane";
 import { svg } from "../base/dom";
 import type { Box } from "../view/Picture";
 import { appendArc, lineClass } from "./arcArt";
 import { kSilhouettes } from "../base/silhouettes";
-import { fitLine, fitName, textWidth } from "./textFit";
 
 // Of one box, in points.
 export interface Extent {
@@ -23,8 +22,9 @@ export interface BoxLook {
     readonly person: number; // 0 for an unknown parent
     readonly xref: string;
     readonly sex: Sex;
-    // Given name and surname in the order of reading.
-    readonly nameParts: readonly string[];
+    readonly name: NameParts;
+    // Measures and fits what is written.
+    readonly texts: Texts;
     readonly rightToLeft: boolean;
     readonly years: string;
     // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
@@ -76,11 +76,11 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     appendFrame(box, look, sizes);
     if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
-    if (look.hidden >= 0) appendBadge(box, look.hidden, sizes);
+    if (look.hidden >= 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);
     if (look.further) appendFurtherMark(box, look.further);
     if (look.caption) appendCaption(box, look.caption, sizes);
-    if (look.marks.length > 0) appendMarks(box, look.marks, sizes);
+    if (look.marks.length > 0) appendMarks(box, look, sizes);
     return box;
 }
 
@@ -128,18 +128,18 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
     const yearsY = look.kinship !== null ? lastLine - 14 : lastLine;
-    const name = fitName(look.nameParts, room, 3);
-    const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const top = 31;
     const bottom = look.years || look.kinship !== null ? yearsY - kYearsSize - 1 : nodeHeight - 6;
+    const name = look.texts.fitName(look.name, { width: room, height: bottom - top, gap: 1, lines: 3 });
+    const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
 
     box.append(figure(look, middle - 12, 8));
     name.lines.forEach((line, i) =>
         box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
-    if (look.years) box.append(text("years", middle, yearsY, fitLine(look.years, kYearsSize, 400, room)));
-    if (look.kinship) box.append(kinText(middle, lastLine, look.kinship, kKinSize, room));
+    if (look.years) box.append(text("years", middle, yearsY, look.texts.fitLine(look.years, kYearsSize, room)));
+    if (look.kinship) box.append(kinText(look, middle, lastLine, look.kinship, kKinSize, room));
 }
 
 function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
@@ -147,7 +147,8 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const right = nodeWidth - kInset;
     const room = right - left;
     const lower = lowerLines(look, room);
-    const name = fitName(look.nameParts, room, lower.length > 1 ? 1 : 2);
+    const nameHeight = nodeHeight - 8 - lower.length * 14;
+    const name = look.texts.fitName(look.name, { width: room, height: nameHeight, gap: 2, lines: lower.length > 1 ? 1 : 2 });
     const pitch = name.size + 2;
     const height = name.lines.length * pitch + lower.length * 14;
     const firstY = (nodeHeight - height) / 2 + name.size - 1;
@@ -162,8 +163,8 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
         const y = firstY + name.lines.length * pitch + i * 14;
         box.append(
             line === look.kinship
-                ? kinText(left, y, line, kYearsSize, room)
-                : text("years", left, y, fitLine(line, kYearsSize, 400, room)),
+                ? kinText(look, left, y, line, kYearsSize, room)
+                : text("years", left, y, look.texts.fitLine(line, kYearsSize, room)),
         );
     });
     box.classList.add("wide");
@@ -173,7 +174,7 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
 function lowerLines(look: BoxLook, room: number): string[] {
     const lines = [look.years, look.kinship].filter((line): line is string => Boolean(line));
     const joined = lines.join(" \u00b7 ");
-    return lines.length === 2 && textWidth(joined, kYearsSize, 400) <= room ? [joined] : lines;
+    return lines.length === 2 && look.texts.width(joined, kYearsSize) <= room ? [joined] : lines;
 }
 
 function figure(look: BoxLook, x: number, y: number): SVGElement {
@@ -186,9 +187,16 @@ function figure(look: BoxLook, x: number, y: number): SVGElement {
     return text("unknown", x + 12, y + 19, "?");
 }
 
-function kinText(x: number, y: number, kinship: string, usualSize: number, room: number): SVGTextElement {
-    const size = textWidth(kinship, usualSize, 400) <= room ? usualSize : kLeastKinSize;
-    return text("kin", x, y, fitLine(kinship, size, 400, room), false, size === usualSize ? undefined : size);
+function kinText(
+    { texts }: BoxLook,
+    x: number,
+    y: number,
+    kinship: string,
+    usualSize: number,
+    room: number,
+): SVGTextElement {
+    const size = texts.width(kinship, usualSize) <= room ? usualSize : kLeastKinSize;
+    return text("kin", x, y, texts.fitLine(kinship, size, room), false, size === usualSize ? undefined : size);
 }
 
 function text(
@@ -209,9 +217,9 @@ function text(
 }
 
 // On the upper edge, where neither names nor lines go.
-function appendBadge(box: SVGGElement, hidden: number, { width: nodeWidth }: Extent): void {
+function appendBadge(box: SVGGElement, { hidden, texts }: BoxLook, { width: nodeWidth }: Extent): void {
     const label = hidden > 0 ? "+" + hidden : "+";
-    const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
+    const width = Math.max(20, texts.width(label, 10.5, true) + 10);
     const badge = svg("g", {
         class: "badge",
         "aria-hidden": "true",
@@ -222,9 +230,9 @@ function appendBadge(box: SVGGElement, hidden: number, { width: nodeWidth }: Ext
 }
 
 // On the lower edge: the same number stands at every box that belongs together.
-function appendMarks(box: SVGGElement, marks: readonly number[], { height }: Extent): void {
+function appendMarks(box: SVGGElement, { marks, texts }: BoxLook, { height }: Extent): void {
     const label = marks.slice(0, 3).join(" \u00b7 ") + (marks.length > 3 ? " \u2026" : "");
-    const width = Math.max(20, textWidth(label, 10.5, 700) + 10);
+    const width = Math.max(20, texts.width(label, 10.5, true) + 10);
     const badge = svg("g", { class: "mark", "aria-hidden": "true", transform: `translate(-8 ${height - 9})` });
     badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);

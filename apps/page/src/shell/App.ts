@@ -477,10 +477,14 @@ export class App implements ChromeActions {
     }
 
     private subject(): Subject | null {
-        const { shown, state, family } = this.tree;
+        const { state, family, shownTitle } = this.tree;
         const focus = family?.person(state?.focus ?? 0);
-        if (!shown || !focus) return null;
-        return { ...shown, name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)) };
+        if (!shownTitle || !focus) return null;
+        return {
+            title: shownTitle,
+            name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)),
+            drawing: (theme) => this.tree.drawing(theme) ?? "",
+        };
     }
 
     private languageChooser(): HTMLElement {

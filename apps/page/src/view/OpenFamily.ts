@@ -3,7 +3,7 @@
 
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
-import type { GedcomFamily as Family, GedcomFile, Person, PictureOptions } from "olvane";
+import type { DrawingTheme, GedcomFamily as Family, GedcomFile, Person, PictureOptions } from "olvane";
 import { Photographs } from "../engine/photographs";
 import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
@@ -32,6 +32,11 @@ export class OpenFamily {
     picture(state: ViewState, language: PictureOptions["language"]): Picture {
         const values = this.file.picture(state.focus, optionsOf(state, language));
         return new Picture(state.view, state.direction, state.focus, values);
+    }
+
+    // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
+    svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
+        return this.file.svg(state.focus, optionsOf(state, language), { theme });
     }
 
     // The focus stands first among all who could be one: whoever has the most relatives near.

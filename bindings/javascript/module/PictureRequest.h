@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <olvane/charts/Views.h>
+#include <olvane/source/GedcomDataSource.h>
+
+#include "OpenFile.h"
+
+namespace olvane::js {
+
+// A request, and whose parents come first.
+struct PictureRequest {
+    charts::ViewRequest view;
+    gedcom::ParentChoice parents;
+};
+
+// What JavaScript last asked of a picture, for a focus.
+PictureRequest requestOf(kin::Place focus);
+
+picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked);
+
+}  // namespace olvane::js

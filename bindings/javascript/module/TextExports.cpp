@@ -1,0 +1,64 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Measuring and fitting of texts, as pictures have it. The module's texts are cut first, as in a picture.
+
+#include <exception>
+#include <string>
+
+#include <olvane/picture/TextFit.h>
+
+#include "OpenFile.h"
+
+#define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
+
+using namespace olvane;
+
+namespace {
+
+std::string readable(const char* text) {
+    return picture::cleanText(picture::cutText(text));
+}
+
+// The text that make gives, or null where there is no memory for it.
+template <class Make>
+const char* answered(const Make& make) {
+    try {
+        js::lastText = make();
+        return js::lastText.c_str();
+    } catch (const std::exception&) {
+        return nullptr;
+    }
+}
+
+}  // namespace
+
+OLVANE_EXPORT("text_width") double textWidth(const char* text, double size, int bold) {
+    try {
+        return picture::textWidth(readable(text), {size, bold != 0});
+    } catch (const std::exception&) {
+        return 0;
+    }
+}
+
+OLVANE_EXPORT("fit_line") const char* fitLine(const char* text, double size, int bold, double width) {
+    return answered([&] { return picture::fitLine(readable(text), {size, bold != 0}, width); });
+}
+
+// The size of the letters and the lines, each on a line of its own.
+OLVANE_EXPORT("fit_name")
+const char* fitName(const char* given, const char* surname, int surnameFirst, double width, double height,
+                    double gap, int mostLines) {
+    return answered([&] {
+        const picture::NameRoom room{width, height, gap, static_cast<std::size_t>(mostLines)};
+        const picture::FittedName name =
+            picture::fitName(readable(given), readable(surname), surnameFirst != 0, room);
+        std::string answer = std::to_string(static_cast<int>(name.size));
+        for (const std::string& line : name.lines) answer += "\n" + line;
+        return answer;
+    });
+}
+
+OLVANE_EXPORT("font_families") const char* fontFamilies() {
+    return picture::kFontFamilies.data();
+}

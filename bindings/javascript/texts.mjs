@@ -1,0 +1,61 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Measures and fits texts as the module's pictures do, so that a screen breaks lines where a file does.
+
+const MOST_REMEMBERED = 20000;
+
+export class Texts {
+    #instance;
+    #known = new Map();
+
+    constructor(instance) {
+        this.#instance = instance;
+    }
+
+    get fontFamilies() {
+        return this.#instance.text(this.#instance.exports.font_families());
+    }
+
+    width(text, size, bold = false) {
+        return this.#remembered(`w/${size}/${bold}/${text}`, () =>
+            this.#instance.withText(text, (pointer) => this.#instance.exports.text_width(pointer, size, bold ? 1 : 0)),
+        );
+    }
+
+    fitLine(text, size, width, bold = false) {
+        return this.#remembered(`l/${size}/${bold}/${width}/${text}`, () =>
+            this.#instance.withText(text, (pointer) =>
+                this.#answer(this.#instance.exports.fit_line(pointer, size, bold ? 1 : 0, width)),
+            ),
+        );
+    }
+
+    fitName({ given, surname, surnameFirst = false }, { width, height, gap = 3, lines = 4 }) {
+        const room = [surnameFirst ? 1 : 0, width, height, gap, lines];
+        return this.#remembered(`n/${room.join("/")}/${given}\n${surname}`, () => {
+            const answer = this.#instance.withText(given, (first) =>
+                this.#instance.withText(surname, (second) =>
+                    this.#answer(this.#instance.exports.fit_name(first, second, ...room)),
+                ),
+            );
+            const [size, ...fitted] = answer.split("\n");
+            return { size: Number(size), lines: fitted };
+        });
+    }
+
+    #answer(pointer) {
+        if (pointer === 0) throw new Error("the module found no memory for a text");
+        return this.#instance.text(pointer);
+    }
+
+    // The same texts are asked for again and again while a picture moves.
+    #remembered(key, ask) {
+        const known = this.#known.get(key);
+        if (known !== undefined) return known;
+        if (this.#known.size >= MOST_REMEMBERED) this.#known.clear();
+        const answer = ask();
+        if (key.length < 1000) this.#known.set(key, answer);
+        return answer;
+    }
+}
