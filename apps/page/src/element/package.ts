@@ -23,4 +23,4 @@ OlvaneTree.engine = sharedEngine;
 defineOlvaneTree();
 
 export { OlvaneTree };
-export type { OlvaneTreeEvents, Shown } from "./OlvaneTree";
+export type { OlvaneTreeEvents } from "./OlvaneTree";

@@ -34,7 +34,7 @@ export class PictureOutput {
         if (!subject) return;
         const name = subject.name + ".svg";
         saveFile(name, svgBlob(subject.drawing(screenTheme())));
-        this.notices.tell(ui.saved(name));
+        this.notices.show(ui.saved(name));
     }
 
     async savePng(ui: UiMessages): Promise<void> {
@@ -44,7 +44,7 @@ export class PictureOutput {
         try {
             const { blob, part } = await pngOf(subject.drawing(screenTheme()));
             saveFile(name, blob);
-            this.notices.tell(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
+            this.notices.show(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
         } catch {
             this.notices.fail(ui.pictureFailed, []);
         }
