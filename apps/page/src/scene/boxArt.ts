@@ -79,7 +79,7 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     if (look.hidden >= 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);
     if (look.further) appendFurtherMark(box, look.further);
-    if (look.caption) appendCaption(box, look.caption, sizes);
+    if (look.caption) appendCaption(box, look.caption, look.texts, sizes);
     if (look.marks.length > 0) appendMarks(box, look, sizes);
     return box;
 }
@@ -262,14 +262,14 @@ function appendFurtherMark(box: SVGGElement, title: string): void {
 }
 
 // Below the box, touching it.
-function appendCaption(box: SVGGElement, caption: string, { width, height }: Extent): void {
+function appendCaption(box: SVGGElement, caption: string, texts: Texts, { width, height }: Extent): void {
     const room = width + 36;
-    const { lines } = fitName([caption], room - 16, 3);
-    const wide = Math.min(room, Math.max(...lines.map((line) => textWidth(line, kKinSize, 700))) + 16);
+    const { lines } = texts.fitName({ given: caption, surname: "" }, { width: room - 16, height: 48, lines: 3 });
+    const wide = Math.min(room, Math.max(...lines.map((line) => texts.width(line, kKinSize, true))) + 16);
     const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${height - 2})` });
     plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
     lines.forEach((line, i) =>
-        plate.append(svg("text", { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" }, fitLine(line, kKinSize, 700, room - 12))),
+        plate.append(svg("text", { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" }, texts.fitLine(line, kKinSize, room - 12, true))),
     );
     box.append(plate);
 }
