@@ -70,6 +70,7 @@ private:
     }
 
     void walkFrom(std::size_t at) {
+        if (reach_.everybody) return walkEverywhere(at);
         const int up = met_[at].up;
         const int down = met_[at].down;
         if (up > 0) {
@@ -82,6 +83,18 @@ private:
             askForChildren(met_[at]);
             const std::vector<FamilyId> children = met_[at].children;
             for (const FamilyId child : children) meet(child, 0, down - 1);
+        }
+    }
+
+    void walkEverywhere(std::size_t at) {
+        askForParents(met_[at]);
+        askForChildren(met_[at]);
+        askForSpousesOf(met_[at]);
+        std::vector<FamilyId> relatives{met_[at].father, met_[at].mother};
+        relatives.insert(relatives.end(), met_[at].spouses.begin(), met_[at].spouses.end());
+        relatives.insert(relatives.end(), met_[at].children.begin(), met_[at].children.end());
+        for (const FamilyId relative : relatives) {
+            if (relative != 0) meet(relative, 0, 0);
         }
     }
 
@@ -117,11 +130,16 @@ private:
         person.knowsChildren = true;
     }
 
+    void askForSpousesOf(Met& person) {
+        person.spouses = answeredList(person, "spouses", host_.spousesForPersonWithID(person.id));
+    }
+
     // Spouses come last: theirs are not asked for, whatever road led to them.
     void askForSpouses() {
+        if (reach_.everybody) return;
         const std::size_t walked = met_.size();
         for (std::size_t at = 0; reach_.spouses && at < walked; ++at) {
-            met_[at].spouses = answeredList(met_[at], "spouses", host_.spousesForPersonWithID(met_[at].id));
+            askForSpousesOf(met_[at]);
             const std::vector<FamilyId> spouses = met_[at].spouses;
             for (const FamilyId spouse : spouses) meet(spouse, 0, 0);
         }
