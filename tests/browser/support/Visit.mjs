@@ -30,7 +30,7 @@ export class Visit {
         await visit.page.addInitScript(lookInside);
         visit.watch(address);
         await visit.page.goto(address);
-        await visit.page.waitForSelector("#welcome, #tree, .fatal");
+        await visit.page.waitForSelector("#welcome, #tree:visible, #map canvas, .fatal");
         return visit;
     }
 

@@ -246,6 +246,7 @@ export class MapView {
     }
 
     private resized(): void {
+        if (this.canvas.clientWidth === 0) return; // hidden
         this.measure();
         this.camera.jump(this.camera.place);
         this.draw();

@@ -268,12 +268,13 @@ export class App implements ChromeActions {
     private leaveMap(change: Partial<ViewState>): void {
         const focus = change.focus || this.maps.number;
         const wanted = focus ? { ...change, focus } : change;
-        if (this.unread && !this.readBesideMap(focus)) return;
+        const isNew = this.unread !== null;
+        if (isNew && !this.readBesideMap(focus)) return;
         const { family, state } = this.tree;
         if (!family || !state) return;
         this.hideMap();
-        if (sameState({ ...state, ...wanted }, state)) this.journey.add(addressOf(state, family.persons));
-        else this.travel(wanted);
+        if (!sameState({ ...state, ...wanted }, state)) this.travel(wanted);
+        else if (!isNew) this.journey.add(addressOf(state, family.persons));
         this.showState();
     }
 

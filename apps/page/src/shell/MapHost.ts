@@ -124,6 +124,7 @@ export class MapHost {
 
     private moved(): void {
         clearTimeout(this.timer);
+        if (!this.isShown) return;
         this.timer = window.setTimeout(() => this.page.mapSettled(this.address), kSettled);
     }
 
