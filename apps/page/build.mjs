@@ -89,6 +89,7 @@ function policyOf(script, style) {
         `script-src ${hashOf(script)} 'wasm-unsafe-eval'`,
         `style-src ${hashOf(style)}`,
         "img-src data: blob:",
+        "worker-src blob:",
         "connect-src 'none'",
         "base-uri 'none'",
         "form-action 'none'",

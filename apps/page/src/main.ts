@@ -6,6 +6,7 @@
 import { html } from "./base/dom";
 import { defineOlvaneTree, OlvaneTree } from "./element/OlvaneTree";
 import { embeddedFamily, embeddedMap, startEngine } from "./engine/engine";
+import { isWorker, serveMap } from "./engine/mapWorker";
 import { uiMessagesFor } from "./messages/ui";
 import { App } from "./shell/App";
 
@@ -26,4 +27,5 @@ async function start(): Promise<void> {
     }
 }
 
-void start();
+if (isWorker) serveMap();
+else void start();

@@ -5,11 +5,12 @@
 //
 // Prints when the page stands after it was asked for, how long frames are while somebody flies about (each frame pans
 // or zooms, from everything to names and back, to random places), and how long searches and the flights behind them
-// take. A frame is the time from one to the next: scripts, drawing and what the browser does beside them.
+// take; and how many bytes the map has for each person. A frame is the time from one to the next: scripts, drawing and what the browser does beside them.
 
-import { mkdirSync, statSync } from "node:fs";
+import { mkdirSync, readFileSync, statSync } from "node:fs";
 import { basename, join, resolve } from "node:path";
 import { pathToFileURL } from "node:url";
+import { gunzipSync } from "node:zlib";
 import { chromium } from "playwright-core";
 
 const [file] = process.argv.slice(2);
@@ -34,6 +35,7 @@ await page.waitForFunction(() => window.openedAfter !== undefined);
 const size = (statSync(file).size / 1e6).toFixed(1);
 console.log(`${basename(file)}: ${size} MB; ${await page.innerText(".title span")}`);
 console.log(`  open: ${(await page.evaluate(() => window.openedAfter)).toFixed(0)} ms`);
+printBytes(readFileSync(file, "latin1"));
 if (folder) mkdirSync(folder, { recursive: true });
 const photograph = async (name) => folder && page.screenshot({ path: join(folder, `${basename(file, ".html")}-${name}.png`) });
 await page.waitForTimeout(1500);
@@ -56,6 +58,18 @@ for (let i = 0; i < 6; ++i) await page.click("#map-out");
 await page.waitForTimeout(400);
 await photograph("middle");
 await browser.close();
+
+// The texts and their ends are section 9, the places of each person's texts section 8; see olvane/charts/MapIndex.h.
+function printBytes(text) {
+    const packed = /id="olvane-map">([^<]*)</.exec(text)[1];
+    const map = gunzipSync(Buffer.from(packed, "base64"));
+    const persons = map.readUInt32LE(20);
+    const sizes = new Map();
+    for (let at = 28; at < map.length; at += 8 + 4 * Math.ceil(map.readUInt32LE(at + 4) / 4)) sizes.set(map.readUInt32LE(at), map.readUInt32LE(at + 4));
+    const each = (bytes) => (bytes / persons).toFixed(1);
+    const [names, texts] = [sizes.get(8), sizes.get(9)];
+    console.log(`  bytes a person: ${each(map.length - names - texts)} beside the names, ${each(names + texts)} of names; ${each(packed.length)} as they lie in the page`);
+}
 
 // In the page. Wheel and drag by events, as they come from hands; one of them a frame.
 function fly(count) {

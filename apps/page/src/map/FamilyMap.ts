@@ -116,10 +116,13 @@ export class FamilyMap {
     /** Whose box is there, in points; kNobody between the boxes. */
     personAt(px: number, py: number): number {
         const { x, rowY, rowStart, boxWidth, boxHeight } = this.arrays;
-        const row = lastNotAbove(rowY, py * 4, rowY.length);
-        if (row < 0 || py * 4 > rowY[row]! + boxHeight) return kNobody;
-        const person = lowerBound(x, px * 4 - boxWidth, rowStart[row]!, rowStart[row + 1]!);
-        return person < rowStart[row + 1]! && x[person]! <= px * 4 ? person : kNobody;
+        // Parts of a family stand beside each other, with rows of their own: several may be as high as this.
+        for (let row = lastNotAbove(rowY, py * 4, rowY.length); row >= 0 && rowY[row]! + boxHeight >= py * 4; --row) {
+            const end = rowStart[row + 1]!;
+            const person = lowerBound(x, px * 4 - boxWidth, rowStart[row]!, end);
+            if (person < end && x[person]! <= px * 4) return person;
+        }
+        return kNobody;
     }
 
     /** Each of them once, in the order of the data; somebody married to themself is not listed. */

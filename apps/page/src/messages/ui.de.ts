@@ -53,6 +53,7 @@ export const uiGerman: UiMessages = {
         hint: "Pfeiltasten führen zu Eltern, Kindern, Partnern und Geschwistern. Die Eingabetaste zeigt die Familie einer Person. Umschalt und ein Pfeil verschieben die Karte, Plus und Minus ändern die Größe, 0 zeigt alles, Pos1 führt zur ersten Person.",
         partners: "Partner",
         alone: "Diese Seite enthält nur die Karte: Namen, Jahre und wer zu wem gehört. Für alles andere öffnen Sie die Datei der Familie.",
+        drawing: "Die Karte wird gezeichnet …",
         cut: (have, wanted) =>
             `Die Karte in dieser Seite endet nach ${have.toLocaleString("de")} von ${wanted.toLocaleString("de")} Bytes. Besorgen Sie die Seite noch einmal.`,
         cutShort: "Diese Seite endet mitten in ihrer Karte. Sie wurde unterwegs abgeschnitten; besorgen Sie sie noch einmal.",

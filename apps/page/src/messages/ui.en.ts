@@ -51,6 +51,7 @@ export const uiEnglish: UiMessages = {
         hint: "Arrow keys lead to parents, children, partners and siblings. Enter shows a person's family. Shift and an arrow move the map, plus and minus zoom, 0 shows everything, Home leads to the first person.",
         partners: "Partners",
         alone: "This page has the map alone: names, years and who belongs to whom. For all else, open the family's own file.",
+        drawing: "The map is being laid out…",
         cut: (have, wanted) =>
             `The map in this page ends after ${have.toLocaleString("en")} of ${wanted.toLocaleString("en")} bytes. Get the page again.`,
         cutShort: "This page ends in the middle of its map. It was cut short on its way; get it again.",

@@ -51,6 +51,7 @@ export const uiSpanish: UiMessages = {
         hint: "Las flechas llevan a padres, hijos, parejas y hermanos. Intro muestra la familia de una persona. Mayúsculas y una flecha mueven el mapa, más y menos cambian el tamaño, 0 muestra todo, Inicio lleva a la primera persona.",
         partners: "Parejas",
         alone: "Esta página solo contiene el mapa: nombres, años y quién es pariente de quién. Para todo lo demás, abra el archivo de la familia.",
+        drawing: "Se está trazando el mapa…",
         cut: (have, wanted) =>
             `El mapa de esta página termina después de ${have.toLocaleString("es")} de ${wanted.toLocaleString("es")} bytes. Consiga la página de nuevo.`,
         cutShort: "Esta página termina en medio de su mapa. Quedó cortada por el camino; consígala de nuevo.",

@@ -39,6 +39,7 @@ export interface UiMessages {
         readonly partners: string;
         /** The page has no records beside the map. */
         readonly alone: string;
+        readonly drawing: string;
         readonly cut: (have: number, wanted: number) => string;
         readonly cutShort: string;
         readonly version: string;

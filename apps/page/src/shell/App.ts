@@ -9,6 +9,7 @@ import { html, recall, remember } from "../base/dom";
 import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
 import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
+import { mapInWorker } from "../engine/mapWorker";
 import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
 import { PictureOutput, type Subject } from "../output/PictureOutput";
 import { fileNameOf } from "../output/saving";
@@ -58,6 +59,7 @@ export class App implements ChromeActions {
     });
     // The family beside an embedded map, which is read when somebody leaves the map.
     private unread: EmbeddedFamily | null = null;
+    private isLayingOut = false; // a map
     private readonly output = new PictureOutput(() => this.subject(), this.notices);
     private readonly files: FileOpening;
 
@@ -199,7 +201,8 @@ export class App implements ChromeActions {
     }
 
     private arriveAt(address: string): void {
-        if (isMapAddress(address) && (this.maps.isReady || this.tree.family)) return this.showMap(address);
+        if (isMapAddress(address) && this.maps.isReady) return this.showMap(address);
+        if (isMapAddress(address) && this.tree.family) return this.setMap(address);
         if (this.unread && this.maps.isShown) return void this.readBesideMap();
         this.hideMap();
         const { family, state } = this.tree;
@@ -241,20 +244,35 @@ export class App implements ChromeActions {
     setMap(address = ""): void {
         const { state } = this.tree;
         if (this.maps.isShown) return;
+        if (!this.maps.isReady) return void this.layOutMap(address);
         this.showMap(address || this.maps.address || `#map=&number=${state?.focus ?? 0}`);
         if (this.maps.isShown) this.journey.add(this.maps.address);
         this.showState();
     }
 
     private showMap(address: string): void {
+        this.maps.show(this.ui, address);
+        this.arrange();
+        this.maps.takeKeys();
+    }
+
+    // In a worker, or where the browser has none for a page like this, here.
+    private async layOutMap(address: string): Promise<void> {
+        const { family } = this.tree;
+        const { source } = this.files;
+        if (!family || !source || this.isLayingOut) return;
+        this.isLayingOut = true;
+        this.notices.show(this.ui.map.drawing, "map");
         try {
-            const { family, state } = this.tree;
-            if (!this.maps.isReady && family) this.maps.take(family.file.mapIndex(), state?.focus ?? 0);
-            this.maps.show(this.ui, address);
-            this.arrange();
-            this.maps.takeKeys();
+            const bytes = await mapInWorker(source).catch(() => family.file.mapIndex());
+            if (this.tree.family !== family) return;
+            this.maps.take(bytes, this.tree.state?.focus ?? 0);
+            this.setMap(address);
         } catch (error) {
             this.notices.fail(mapComplaint(error, this.ui), []);
+        } finally {
+            this.isLayingOut = false;
+            this.notices.clear("map");
         }
     }
 

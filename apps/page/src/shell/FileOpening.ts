@@ -7,6 +7,7 @@ import type { GedcomFile, Olvane } from "olvane";
 import { Archive, ArchiveError, isArchive, TooLargeError } from "../engine/archive";
 import type { EmbeddedFamily } from "../engine/engine";
 import { Photographs } from "../engine/photographs";
+import type { MapSource } from "../engine/mapWorker";
 import type { UiMessages } from "../messages/ui";
 
 const kMostBytes = 128 * 2 ** 20; // of a file
@@ -23,6 +24,9 @@ export class FileOpening {
     constructor(private readonly engine: Olvane) {}
 
     private last: { readonly bytes: Uint8Array; readonly name: string; readonly photographs: Photographs } | null = null;
+
+    /** What was read last. */
+    source: MapSource | null = null;
 
     openEmbedded({ bytes, name, title, photographs }: EmbeddedFamily): OpenedFile {
         return this.read(bytes, name, title, photographs);
@@ -68,6 +72,7 @@ export class FileOpening {
             file.close();
             throw new NoPersonsError();
         }
+        this.source = { bytes, name, encoding };
         return { file, name, photographs, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
     }
 }

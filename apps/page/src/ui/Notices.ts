@@ -18,8 +18,9 @@ export class Notices {
         this.dismissLabel = dismissLabel;
     }
 
-    show(text: string): void {
+    show(text: string, subject = ""): void {
         const notice = this.add("message", "status", text, []);
+        notice.dataset["subject"] = subject;
         setTimeout(() => notice.remove(), kTime);
     }
 
