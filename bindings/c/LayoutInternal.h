@@ -29,6 +29,18 @@ namespace olvane::c {
 // The options of a C host as the engine takes them.
 LayoutOptions layoutOptionsOf(const olvane_options& options);
 
+bool areInRange(const olvane_options& options);
+bool isComplete(const olvane_host& host);
+
+// The callbacks as a data source; the host outlives it.
+std::shared_ptr<OlvaneViewerManagerWrapProtocol> sourceOf(const olvane_host& host);
+
+// Runs the work, and makes a status and a sentence of what it throws.
+olvane_status guarded(const std::function<void()>& work, std::string& failure);
+
+// Runs the work unless a layout of a host is running on this thread.
+void unlessNested(const std::function<void()>& work);
+
 typedef std::function<std::shared_ptr<OlvaneViewerManagerWrapProtocol>()> MakeSource;
 
 // A layout of a source in C++, with all checks of what C passes in; view is an olvane_view_kind.

@@ -13,6 +13,7 @@
 #include <limits>
 #include <memory>
 #include <new>
+#include <stdexcept>
 #include <string>
 #include <utility>
 #include <vector>
@@ -343,6 +344,44 @@ olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olva
 
 olvane::LayoutOptions olvane::c::layoutOptionsOf(const olvane_options& options) {
     return ::layoutOptionsOf(options);
+}
+
+bool olvane::c::areInRange(const olvane_options& options) {
+    return ::areInRange(options);
+}
+
+bool olvane::c::isComplete(const olvane_host& host) {
+    return ::isComplete(host);
+}
+
+std::shared_ptr<OlvaneViewerManagerWrapProtocol> olvane::c::sourceOf(const olvane_host& host) {
+    return std::make_shared<CallbackManager>(host);
+}
+
+olvane_status olvane::c::guarded(const std::function<void()>& work, std::string& failure) {
+    try {
+        work();
+    } catch (const HostFailure& hostFailure) {
+        failure = hostFailure.what;
+        return OLVANE_HOST_FAILED;
+    } catch (const WrongId& wrong) {
+        failure = wrong.what;
+        return OLVANE_INVALID_ID;
+    } catch (const std::out_of_range&) {
+        failure = "The focus, or the other person, is not there.";
+        return OLVANE_INVALID_PERSON;
+    } catch (const std::bad_alloc&) {
+        return OLVANE_OUT_OF_MEMORY;
+    } catch (const std::exception& error) {
+        failure = error.what();
+        return OLVANE_LAYOUT_FAILED;
+    }
+    return OLVANE_OK;
+}
+
+void olvane::c::unlessNested(const std::function<void()>& work) {
+    const RunningLayout running;
+    if (running.isFirst()) work();
 }
 
 olvane_status olvane::c::layOutSource(const MakeSource& makeSource, std::int32_t view, std::int64_t focus,

@@ -6,6 +6,7 @@
 #include <olvane_picture.h>
 
 #include <cstddef>
+#include <functional>
 #include <memory>
 #include <new>
 #include <string>
@@ -14,6 +15,7 @@
 #include "FamilyInternal.h"
 #include "LayoutInternal.h"
 
+#include <olvane/charts/Views.h>
 #include <olvane/picture/LayoutPicture.h>
 #include <olvane/picture/PictureJson.h>
 
@@ -27,12 +29,25 @@ struct olvane_picture {
     std::vector<double> bridges;
     std::vector<olvane_picture_mark> marks;
     std::int32_t focus = OLVANE_NO_PLACE;
+    std::int32_t other = OLVANE_NO_PLACE;
+    std::vector<olvane_picture_arc> arcs;
+    std::vector<double> ringRadii;
+    double middleX = 0;
+    double middleY = 0;
+    std::vector<std::string> words;  // of ways, which point to them
+    std::vector<olvane_picture_way> ways;
+    std::vector<std::int32_t> wayBoxes;
+    std::vector<olvane_picture_piece> wayPieces;
+    std::string focusIs;
+    std::string otherIs;
     std::string json;
+    std::string failure;
 };
 
 namespace {
 
 namespace picture = olvane::picture;
+namespace charts = olvane::charts;
 
 olvane_picture_box boxOf(const picture::Box& box) {
     return {box.id,
@@ -47,7 +62,8 @@ olvane_picture_box boxOf(const picture::Box& box) {
             box.flag ? 1 : 0,
             box.hiddenParents,
             box.hiddenPartners,
-            box.hiddenChildren};
+            box.hiddenChildren,
+            box.furtherParents};
 }
 
 olvane_picture_family familyOf(const picture::Family& family) {
@@ -75,6 +91,22 @@ void copyAll(const std::vector<Source>& from, std::vector<Target>& to, const Con
     for (const Source& entry : from) to.push_back(convert(entry));
 }
 
+void fillKinship(const picture::Picture& from, olvane_picture& to) {
+    to.other = from.other;
+    to.focusIs = from.focusIs;
+    to.otherIs = from.otherIs;
+    copyAll(from.ways, to.words, [](const picture::Way& way) { return way.words; });
+    for (std::size_t i = 0; i < from.ways.size(); ++i) {
+        const picture::Way& way = from.ways[i];
+        to.ways.push_back({way.firstBox, way.boxCount, way.ancestorCount, way.firstPiece, way.pieceCount,
+                           static_cast<std::int32_t>(way.kind), to.words[i].c_str()});
+    }
+    to.wayBoxes = from.wayBoxes;
+    copyAll(from.wayPieces, to.wayPieces, [](const picture::WayPiece& piece) {
+        return olvane_picture_piece{piece.x1, piece.y1, piece.x2, piece.y2};
+    });
+}
+
 void fill(const picture::Picture& from, olvane_picture& to) {
     copyAll(from.boxes, to.boxes, boxOf);
     copyAll(from.families, to.families, familyOf);
@@ -85,6 +117,13 @@ void fill(const picture::Picture& from, olvane_picture& to) {
             [](olvane::kin::ChildKind kind) { return static_cast<std::int32_t>(kind); });
     to.bridges = from.bridges;
     to.focus = from.focus;
+    copyAll(from.arcs, to.arcs, [](const picture::Arc& arc) {
+        return olvane_picture_arc{arc.from, arc.to, arc.ring, arc.line};
+    });
+    to.ringRadii = from.ringRadii;
+    to.middleX = from.middleX;
+    to.middleY = from.middleY;
+    fillKinship(from, to);
     to.json = picture::pictureJson(from);
 }
 
@@ -93,7 +132,112 @@ const Entry* dataOrNull(const std::vector<Entry>& entries) {
     return entries.empty() ? nullptr : entries.data();
 }
 
+// Whether a number is one of an enumeration that counts from 0.
+bool isOneOf(std::int32_t number, std::int32_t count) {
+    return number >= 0 && number < count;
+}
+
+bool areInRange(const olvane_picture_options& options) {
+    const olvane_sizes& sizes = options.layout.sizes;
+    for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding}) {
+        if (!(size >= 0)) return false;
+    }
+    return options.struct_size == sizeof(olvane_picture_options) && isOneOf(options.view, 10) &&
+           options.up >= 0 && options.down >= 0 && isOneOf(options.direction, 4) &&
+           isOneOf(options.fan_of, 2) && options.fan_angle >= 90 && options.fan_angle <= 360 &&
+           isOneOf(options.ways, 3) && options.most_ways >= 0 && isOneOf(options.language, 3) &&
+           options.marks >= -1 && isOneOf(options.effort, 101) && olvane::c::areInRange(options.layout);
+}
+
+charts::ViewRequest requestOf(const olvane_picture_options& options) {
+    charts::ViewRequest request;
+    charts::ChartRequest& chart = request.chart;
+    chart.view = static_cast<charts::View>(options.view);
+    chart.up = options.up;
+    chart.down = options.down;
+    chart.direction = static_cast<charts::Direction>(options.direction);
+    chart.spouses = options.spouses != 0;
+    chart.siblings = options.siblings != 0;
+    chart.compact = options.compact != 0;
+    chart.fanOf = static_cast<charts::FanOf>(options.fan_of);
+    chart.fanAngle = options.fan_angle;
+    chart.ways = static_cast<charts::WayChoice>(options.ways);
+    chart.mostWays = options.most_ways;
+    chart.language = static_cast<olvane::kin::Language>(options.language);
+    chart.marks = options.marks;
+    chart.effort = options.effort;
+    chart.onePart = options.all_parts == 0;
+    chart.layout = olvane::c::layoutOptionsOf(options.layout);
+    chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
+                   options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
+    request.unknownParents = options.unknown_parents != 0;
+    return request;
+}
+
+olvane_picture_options chosenOptions(const olvane_picture_options* options) {
+    olvane_picture_options chosen;
+    if (options) return *options;
+    olvane_picture_options_default(OLVANE_PICTURE_FAMILY, &chosen);
+    return chosen;
+}
+
+// Runs what makes a picture, and fills it; a failure is stated in an empty picture.
+olvane_status make(const std::function<picture::Picture()>& work, olvane_picture** picture) noexcept {
+    try {
+        auto made = std::make_unique<olvane_picture>();
+        const olvane_status status = olvane::c::guarded([&] { fill(work(), *made); }, made->failure);
+        *picture = made.release();
+        return status;
+    } catch (...) {
+        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
+    }
+}
+
 }  // namespace
+
+olvane_status olvane_picture_options_default(int32_t view, olvane_picture_options* options) {
+    if (!options || !isOneOf(view, 10)) return OLVANE_INVALID_ARGUMENT;
+    *options = {};
+    options->struct_size = sizeof(olvane_picture_options);
+    options->view = view;
+    options->spouses = 1;
+    options->fan_angle = 360;
+    options->ways = 2;
+    options->most_ways = 8;
+    options->effort = 1;
+    options->unknown_parents = 1;
+    return olvane_options_default(&options->layout);
+}
+
+olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focus,
+                                       const olvane_picture_options* options, olvane_picture** picture) {
+    if (!picture) return OLVANE_INVALID_ARGUMENT;
+    *picture = nullptr;
+    const olvane_picture_options chosen = chosenOptions(options);
+    if (!family || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    return make([&] { return charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other); },
+                picture);
+}
+
+olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
+                                     const olvane_picture_options* options, olvane_picture** picture) {
+    if (!picture) return OLVANE_INVALID_ARGUMENT;
+    *picture = nullptr;
+    const olvane_picture_options chosen = chosenOptions(options);
+    if (!host || !olvane::c::isComplete(*host) || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    const auto work = [&] {
+        return charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other);
+    };
+    olvane_status status = OLVANE_NESTED_CALL;
+    olvane::c::unlessNested([&] { status = make(work, picture); });
+    return status;
+}
+
+olvane_status olvane_picture_failure(const olvane_picture* picture, const char** text) {
+    if (!picture || !text) return OLVANE_INVALID_ARGUMENT;
+    *text = picture->failure.c_str();
+    return OLVANE_OK;
+}
 
 olvane_status olvane_picture_create(const olvane_layout* layout, const olvane_family* family,
                                     int unknown_parents, olvane_picture** picture) {
@@ -125,11 +269,36 @@ olvane_status olvane_picture_read(const olvane_picture* picture, olvane_picture_
     if (!picture || !arrays || arrays->struct_size != sizeof(olvane_picture_arrays)) {
         return OLVANE_INVALID_ARGUMENT;
     }
-    *arrays = {sizeof(olvane_picture_arrays),   dataOrNull(picture->boxes),   picture->boxes.size(),
-               dataOrNull(picture->families),   picture->families.size(),     dataOrNull(picture->members),
-               dataOrNull(picture->childKinds), picture->members.size(),      dataOrNull(picture->lines),
-               picture->lines.size(),           dataOrNull(picture->bridges), picture->bridges.size(),
-               dataOrNull(picture->marks),      picture->marks.size(),        picture->focus};
+    *arrays = {sizeof(olvane_picture_arrays),
+               dataOrNull(picture->boxes),
+               picture->boxes.size(),
+               dataOrNull(picture->families),
+               picture->families.size(),
+               dataOrNull(picture->members),
+               dataOrNull(picture->childKinds),
+               picture->members.size(),
+               dataOrNull(picture->lines),
+               picture->lines.size(),
+               dataOrNull(picture->bridges),
+               picture->bridges.size(),
+               dataOrNull(picture->marks),
+               picture->marks.size(),
+               picture->focus,
+               picture->other,
+               dataOrNull(picture->arcs),
+               picture->arcs.size(),
+               dataOrNull(picture->ringRadii),
+               picture->ringRadii.size(),
+               picture->middleX,
+               picture->middleY,
+               dataOrNull(picture->ways),
+               picture->ways.size(),
+               dataOrNull(picture->wayBoxes),
+               picture->wayBoxes.size(),
+               dataOrNull(picture->wayPieces),
+               picture->wayPieces.size(),
+               picture->focusIs.c_str(),
+               picture->otherIs.c_str()};
     return OLVANE_OK;
 }
 

@@ -62,6 +62,8 @@ typedef struct olvane_picture_box {
     int32_t hidden_parents; /* relatives without a box; 0 where no family was given */
     int32_t hidden_partners;
     int32_t hidden_children;
+    int32_t
+        further_parents; /* families that the person is a child of, beside the first, with no parent shown */
 } olvane_picture_box;
 
 /* Persons joined by lines. Its members lie side by side in members, one or two parents first, the father or the
@@ -96,6 +98,33 @@ typedef struct olvane_picture_mark {
     int32_t boxes[3]; /* OLVANE_NO_PLACE where there are fewer */
 } olvane_picture_mark;
 
+/* A box of a round chart, beside the box: a piece of a ring, in degrees clockwise from the top. Ring 0 is the middle. */
+typedef struct olvane_picture_arc {
+    double from;
+    double to;
+    int32_t ring;
+    int32_t line; /* the box at which its line of descent begins, or OLVANE_NO_PLACE */
+} olvane_picture_arc;
+
+/* A way between two persons, in a picture of kinship. Its boxes, from the focus to the other person, and behind them the
+   common ancestors at its top, lie in way_boxes; its line, in way_pieces, runs along the lines of families. */
+typedef struct olvane_picture_way {
+    uint32_t first_box;
+    uint32_t box_count;
+    uint32_t ancestor_count;
+    uint32_t first_piece;
+    uint32_t piece_count;
+    int32_t kind;      /* 0 by blood, 1 by adoption and the like, 2 by marriage */
+    const char* words; /* what the other person is to the focus by this way alone */
+} olvane_picture_way;
+
+typedef struct olvane_picture_piece {
+    double x1;
+    double y1;
+    double x2;
+    double y2;
+} olvane_picture_piece;
+
 /* All arrays of a picture; those of no entries are null. */
 typedef struct olvane_picture_arrays {
     size_t
@@ -114,7 +143,22 @@ typedef struct olvane_picture_arrays {
     size_t bridge_count;
     const olvane_picture_mark* marks;
     size_t mark_count;
-    int32_t focus; /* place of its box, or OLVANE_NO_PLACE in an empty picture */
+    int32_t focus;                  /* place of its box, or OLVANE_NO_PLACE in an empty picture */
+    int32_t other;                  /* the other person's box in a picture of kinship, or OLVANE_NO_PLACE */
+    const olvane_picture_arc* arcs; /* one for each box of a round chart */
+    size_t arc_count;
+    const double* ring_radii; /* ring i reaches from ring_radii[i] to ring_radii[i + 1] */
+    size_t ring_radius_count;
+    double middle_x;
+    double middle_y;
+    const olvane_picture_way* ways; /* those by blood first, the nearest first */
+    size_t way_count;
+    const int32_t* way_boxes;
+    size_t way_box_count;
+    const olvane_picture_piece* way_pieces;
+    size_t way_piece_count;
+    const char* focus_is; /* what the focus is to the other person, in words; empty without a way */
+    const char* other_is;
 } olvane_picture_arrays;
 
 typedef struct olvane_picture olvane_picture;
@@ -126,6 +170,63 @@ typedef struct olvane_picture olvane_picture;
  */
 OLVANE_C_API olvane_status olvane_picture_create(const olvane_layout* layout, const olvane_family* family,
                                                  int unknown_parents, olvane_picture** picture);
+/* ---- Any view in one call ------------------------------------------------------------------------------------ */
+
+typedef enum olvane_picture_view {
+    OLVANE_PICTURE_FAMILY = 0,
+    OLVANE_PICTURE_PEDIGREE = 1,
+    OLVANE_PICTURE_NEAR = 2, /* the persons of the family view, placed compactly */
+    OLVANE_PICTURE_ANCESTORS = 3,
+    OLVANE_PICTURE_DESCENDANTS = 4,
+    OLVANE_PICTURE_HOURGLASS = 5,
+    OLVANE_PICTURE_RELATIVES = 6,
+    OLVANE_PICTURE_FAN = 7,
+    OLVANE_PICTURE_KINSHIP = 8,
+    OLVANE_PICTURE_EVERYBODY = 9
+} olvane_picture_view;
+
+/* What a view has no use for is ignored. */
+typedef struct olvane_picture_options {
+    size_t struct_size;      /* sizeof(olvane_picture_options); olvane_picture_options_default sets it */
+    int32_t view;            /* olvane_picture_view */
+    int32_t up;              /* generations of ancestors; 0 for all */
+    int32_t down;            /* generations of descendants; 0 for all */
+    int32_t direction;       /* where later generations stand: 0 below, 1 above, 2 left, 3 right */
+    int32_t spouses;         /* of descendants: 1 */
+    int32_t siblings;        /* of ancestors: 0 */
+    int32_t compact;         /* 1 for trees packed tighter */
+    int32_t fan_of;          /* 0 ancestors, 1 descendants */
+    double fan_angle;        /* 90 to 360 degrees */
+    int64_t other;           /* kinship: the other person */
+    int32_t ways;            /* kinship: 0 by blood, 1 by marriage, 2 both */
+    int32_t most_ways;       /* kinship: 8; 0 for all */
+    int32_t language;        /* kinship: 0 English, 1 German, 2 Spanish */
+    int32_t marks;           /* everybody: how many second links become marks; -1 for all */
+    int32_t effort;          /* everybody: 0 to 100 */
+    int32_t all_parts;       /* everybody: 1 for those as well who are not connected with the focus */
+    int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
+    olvane_options
+        layout; /* the box and the gaps of every view; family, near: shown; pedigree: generations */
+} olvane_picture_options;
+
+/* Everything at its usual value, as said above, for the view. */
+OLVANE_C_API olvane_status olvane_picture_options_default(int32_t view, olvane_picture_options* options);
+
+/*
+ * The picture of a view, of a table or of a host that is asked as far as the view reaches. options may be null for the
+ * family view. *picture is set by every call: to null after OLVANE_INVALID_ARGUMENT and OLVANE_NESTED_CALL, and perhaps
+ * after OLVANE_OUT_OF_MEMORY; else to a picture that the caller frees, which after a failure is empty.
+ */
+OLVANE_C_API olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focus,
+                                                    const olvane_picture_options* options,
+                                                    olvane_picture** picture);
+OLVANE_C_API olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
+                                                  const olvane_picture_options* options,
+                                                  olvane_picture** picture);
+
+/* After a failure, what went wrong, in English: "spouses_of(17) returned 5". Else the empty text. */
+OLVANE_C_API olvane_status olvane_picture_failure(const olvane_picture* picture, const char** text);
+
 /* A null picture is allowed. */
 OLVANE_C_API void olvane_picture_free(olvane_picture* picture);
 

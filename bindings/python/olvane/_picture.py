@@ -161,6 +161,7 @@ class _Box(ctypes.Structure):
         ("hidden_parents", c_int32),
         ("hidden_partners", c_int32),
         ("hidden_children", c_int32),
+        ("further_parents", c_int32),
     ]
 
 
@@ -210,6 +211,21 @@ class _Arrays(ctypes.Structure):
         ("marks", POINTER(_Mark)),
         ("mark_count", c_size_t),
         ("focus", c_int32),
+        ("other", c_int32),
+        ("arcs", c_void_p),
+        ("arc_count", c_size_t),
+        ("ring_radii", POINTER(c_double)),
+        ("ring_radius_count", c_size_t),
+        ("middle_x", c_double),
+        ("middle_y", c_double),
+        ("ways", c_void_p),
+        ("way_count", c_size_t),
+        ("way_boxes", POINTER(c_int32)),
+        ("way_box_count", c_size_t),
+        ("way_pieces", c_void_p),
+        ("way_piece_count", c_size_t),
+        ("focus_is", ctypes.c_char_p),
+        ("other_is", ctypes.c_char_p),
     ]
 
 

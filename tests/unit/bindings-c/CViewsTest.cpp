@@ -1,0 +1,183 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The picture of any view in C: of a table and of callbacks it is that of the library.
+
+#include <memory>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include <FamilyInternal.h>
+#include <olvane_picture.h>
+
+#include <olvane/charts/Views.h>
+#include <olvane/picture/PictureJson.h>
+#include <support/FamilyText.h>
+#include <unit/bindings-c/CallbackHost.h>
+
+namespace {
+
+struct PictureDeleter {
+    void operator()(olvane_picture* picture) const { olvane_picture_free(picture); }
+};
+typedef std::unique_ptr<olvane_picture, PictureDeleter> PicturePointer;
+
+olvane_picture_options optionsFor(std::int32_t view) {
+    olvane_picture_options options;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_options_default(view, &options));
+    return options;
+}
+
+std::string jsonOf(const PicturePointer& picture) {
+    const char* text = nullptr;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_json(picture.get(), &text, nullptr));
+    return text;
+}
+
+// Two children of 1 and 2: 3, who has a child 7 with 4, and 5.
+std::unique_ptr<olvane_family> table() {
+    auto family = std::make_unique<olvane_family>();
+    for (const std::int64_t id : {1, 2, 3, 4, 5, 7}) {
+        olvane::PersonRow row;
+        row.id = id;
+        row.sex = id % 2 == 0 ? olvane::kin::Sex::female : olvane::kin::Sex::male;
+        row.father = id == 3 || id == 5 ? 1 : id == 7 ? 3 : 0;
+        row.mother = id == 3 || id == 5 ? 2 : id == 7 ? 4 : 0;
+        if (id == 7) row.mother = 4;
+        family->table.addPerson(row);
+    }
+    const auto join = [&](std::int64_t one, std::int64_t other, const std::vector<std::int64_t>& children) {
+        const std::int64_t spouseOfOne[] = {other};
+        const std::int64_t spouseOfOther[] = {one};
+        family->table.setSpouses(one, spouseOfOne, other);
+        family->table.setSpouses(other, spouseOfOther, one);
+        family->table.setChildren(one, children);
+        family->table.setChildren(other, children);
+    };
+    join(1, 2, {3, 5});
+    join(3, 4, {7});
+    return family;
+}
+
+TEST(CViews, ofATableAreThoseOfTheLibrary) {
+    const auto family = table();
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        olvane_picture_options options = optionsFor(view);
+        options.other = 5;
+        olvane_picture* made = nullptr;
+        ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made)) << view;
+        const PicturePointer picture(made);
+        olvane::charts::ViewRequest request;
+        request.chart.view = static_cast<olvane::charts::View>(view);
+        EXPECT_EQ(jsonOf(picture),
+                  olvane::picture::pictureJson(olvane::charts::pictureOf(family->table, 7, request, 5)))
+            << view;
+    }
+}
+
+TEST(CViews, ofKinshipHaveWaysAndWords) {
+    const auto family = table();
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_KINSHIP);
+    options.other = 5;
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer picture(made);
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    EXPECT_EQ(arrays.boxes[arrays.other].id, 5);
+    ASSERT_EQ(arrays.way_count, 1U);
+    EXPECT_STREQ(arrays.ways[0].words, "uncle (father's brother)");
+    EXPECT_STREQ(arrays.focus_is, "nephew");
+    EXPECT_EQ(arrays.ways[0].box_count, 4U);
+    EXPECT_EQ(arrays.ways[0].ancestor_count, 2U);
+    EXPECT_EQ(arrays.boxes[arrays.way_boxes[3]].id, 5);
+    EXPECT_GT(arrays.way_piece_count, 3U);
+}
+
+TEST(CViews, ofARoundChartHaveArcs) {
+    const auto family = table();
+    const olvane_picture_options options = optionsFor(OLVANE_PICTURE_FAN);
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer picture(made);
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    ASSERT_EQ(arrays.arc_count, arrays.box_count);
+    EXPECT_EQ(arrays.arcs[arrays.focus].ring, 0);
+    EXPECT_GE(arrays.ring_radius_count, 3U);
+}
+
+TEST(CViews, refuseWhatIsOutOfRangeAndWhoIsNotThere) {
+    const auto family = table();
+    olvane_picture* picture = nullptr;
+    olvane_picture_options options;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_default(10, &options));
+    options = optionsFor(OLVANE_PICTURE_FAN);
+    options.fan_angle = 89;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &picture));
+    options = optionsFor(OLVANE_PICTURE_NEAR);
+    options.struct_size = 8;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &picture));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(nullptr, 7, nullptr, &picture));
+    EXPECT_EQ(nullptr, picture);
+    options = optionsFor(OLVANE_PICTURE_KINSHIP);
+    EXPECT_EQ(OLVANE_INVALID_PERSON, olvane_picture_of_family(family.get(), 7, &options, &picture));
+    const PicturePointer empty(picture);
+    const char* why = nullptr;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_failure(empty.get(), &why));
+    EXPECT_STREQ(why, "The focus, or the other person, is not there.");
+}
+
+int refuse(void*, std::int64_t, olvane_person_list*) {
+    return 5;
+}
+int nobody(void*, std::int64_t, std::int64_t*) {
+    return 0;
+}
+int nobodies(void*, std::int64_t, olvane_person_list*) {
+    return 0;
+}
+int notPreferred(void*, std::int64_t, std::int64_t, int*) {
+    return 0;
+}
+int alive(void*, std::int64_t, int*) {
+    return 0;
+}
+int noDate(void*, std::int64_t, int, olvane_date*) {
+    return 0;
+}
+int male(void*, std::int64_t, std::int32_t*) {
+    return 0;
+}
+
+TEST(CViews, nameTheCallbackAndThePersonOfAFailure) {
+    olvane_host host = {sizeof host, nullptr,      nobody, nobody, refuse,
+                        nobodies,    notPreferred, alive,  noDate, male};
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        olvane_picture_options options = optionsFor(view);
+        options.other = 17;
+        if (view == OLVANE_PICTURE_PEDIGREE) options.layout.flag_depth = 4;
+        olvane_picture* made = nullptr;
+        const olvane_status status = olvane_picture_of_host(&host, 17, &options, &made);
+        const PicturePointer picture(made);
+        if (view == OLVANE_PICTURE_PEDIGREE && status == OLVANE_OK) continue;  // it may ask nobody's spouses
+        EXPECT_EQ(OLVANE_HOST_FAILED, status) << view;
+        const char* why = nullptr;
+        ASSERT_EQ(OLVANE_OK, olvane_picture_failure(picture.get(), &why));
+        EXPECT_STREQ(why, "spouses_of(17) returned 5") << view;
+    }
+    host.spouses_of = nobodies;
+    olvane_picture* made = nullptr;
+    const olvane_picture_options options = optionsFor(OLVANE_PICTURE_HOURGLASS);
+    EXPECT_EQ(OLVANE_OK, olvane_picture_of_host(&host, 17, &options, &made));
+    const PicturePointer picture(made);
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    EXPECT_EQ(arrays.box_count, 1U);
+}
+
+}  // namespace
