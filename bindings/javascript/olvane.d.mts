@@ -195,6 +195,13 @@ export interface PictureOptions {
     effort?: number | undefined;
     /** Everybody: those as well who are not connected with the focus; false. */
     allParts?: boolean | undefined;
+    /** Everybody: width by height of the paper that wide generations are folded for; 0 for no paper. */
+    aspect?: number | undefined;
+    /**
+     * Everybody: keep the places of the last picture of everybody that was made with this option, of this file or of
+     * an earlier version of it whose persons have the same numbers; false.
+     */
+    keepPlaces?: boolean | undefined;
     /** Family and pedigree: whether unknown parents have boxes; true. */
     unknownParents?: boolean | undefined;
     /** Whose parents come first where somebody is a child of several families: those by birth, if not given. */

@@ -54,6 +54,8 @@ const OPTIONS = {
     height: { size: true, usual: 80 },
     gapX: { size: true, usual: 25 },
     gapY: { size: true, usual: 30 },
+    aspect: { size: true, usual: 0 },
+    keepPlaces: { flag: true, usual: false },
 };
 
 function quoted(value) {

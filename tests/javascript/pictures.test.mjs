@@ -88,6 +88,28 @@ test("a chart shows everybody of its kind once, and counts who is hidden", () =>
     assert.deepEqual(focus.hidden, { parents: 0, partners: 1, children: 0 });
 });
 
+// From the box of the focus.
+function placesOf({ boxes }) {
+    const { x: left, y: top } = boxes.find(({ id }) => id === 1);
+    return new Map(boxes.map(({ id, x, y }) => [id, `${x - left} ${y - top}`]));
+}
+
+test("everybody keeps the places of the picture before, where that is asked for", () => {
+    const larger = family
+        .replace("1 CHIL @I4@\n", "1 CHIL @I7@\n1 CHIL @I4@\n")
+        .replace("0 @F1@ FAM", "0 @I7@ INDI\n1 FAMC @F1@\n0 @F1@ FAM");
+    const grown = olvane.readGedcom(new TextEncoder().encode(larger), "larger.ged");
+    const options = { view: "everybody", keepPlaces: true };
+    const before = placesOf(file.picture(1, options));
+    const after = placesOf(grown.picture(1, options));
+    assert.equal(after.size, 7);
+    const moved = (places) => [...before].filter(([id, place]) => places.get(id) !== place).length;
+    // Its siblings make room for the new child; without places kept, their grandparents move as well.
+    assert.equal(moved(after), 2);
+    assert.equal(moved(placesOf(grown.picture(1, { view: "everybody" }))), 4);
+    assert.throws(() => file.picture(1, { view: "everybody", aspect: Number.NaN }), RangeError);
+});
+
 test("what cannot be asked for is refused by its name", () => {
     assert.throws(() => file.picture(1, { view: "tree" }), /view is "tree", and takes one of family, pedigree/);
     assert.throws(() => file.picture(1, { depth: 3 }), /there is no option depth/);

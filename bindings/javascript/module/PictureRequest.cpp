@@ -80,13 +80,25 @@ PictureRequest requestOf(kin::Place focus) {
     chart.sizes.boxHeight = static_cast<float>(options.number());
     chart.sizes.gapX = static_cast<float>(options.number());
     chart.sizes.gapY = static_cast<float>(options.number());
+    chart.aspect = options.number();
+    asked.keepsPlaces = options.flag() && chart.view == charts::View::everybody;
     return asked;
 }
 
 picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked) {
+    static picture::Picture kept;
+    static charts::Direction keptDirection = charts::Direction::down;
     gedcom::GedcomDataSource source(file.data, asked.parents);
     const auto limited = std::make_shared<gedcom::LimitedDataSource>(source, kMostRelatives);
-    return charts::pictureOf(limited, file.kin(asked.parents), asked.view);
+    charts::ViewRequest view = asked.view;
+    const bool mayKeep = asked.keepsPlaces && !kept.boxes.empty() && keptDirection == view.chart.direction;
+    if (mayKeep) view.chart.earlier = &kept;
+    picture::Picture picture = charts::pictureOf(limited, file.kin(asked.parents), view);
+    if (asked.keepsPlaces) {
+        kept = picture;
+        keptDirection = view.chart.direction;
+    }
+    return picture;
 }
 
 // Room for so many numbers, which JavaScript fills before it asks for a picture.
