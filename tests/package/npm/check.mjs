@@ -51,10 +51,14 @@ const kWorker = `import { loadOlvane } from "olvane";\nonmessage = async () => {
 const kWorkerPage = `const worker = new Worker(new URL("./worker.js", import.meta.url), { type: "module" });\nworker.onmessage = ({ data }) => (document.title = String(data));\nworker.postMessage(0);\n`;
 
 const kTypes = { ".html": "text/html", ".js": "text/javascript", ".mjs": "text/javascript", ".wasm": "application/wasm", ".ged": "text/plain" };
+// What docs/guide/web-page.md says that a policy needs.
+const kStrictPolicy = "default-src 'none'; script-src 'self' 'wasm-unsafe-eval'; connect-src 'self'; img-src data: blob:";
 const server = createServer((request, response) => {
     const path = join(work, decodeURIComponent(new URL(request.url, "http://localhost").pathname));
     if (!path.startsWith(work) || !existsSync(path)) return response.writeHead(404).end();
-    response.writeHead(200, { "content-type": kTypes[extname(path)] ?? "application/octet-stream" }).end(readFileSync(path));
+    const policy = path.includes("/strict/") ? { "content-security-policy": kStrictPolicy } : {};
+    const type = { "content-type": kTypes[extname(path)] ?? "application/octet-stream" };
+    response.writeHead(200, { ...type, ...policy }).end(readFileSync(path));
 });
 await new Promise((done) => server.listen(0, "127.0.0.1", done));
 const address = `http://127.0.0.1:${server.address().port}`;
@@ -117,6 +121,28 @@ const kRoads = {
 <script type="module">import "/node_modules/olvane-tree/olvane-tree.mjs";
 document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail }) => (document.title = String(detail.boxes)));</script>`));
         return titleOf(`${address}/element/index.html`);
+    },
+    async "a page of own data, under a strict policy"() {
+        for (const name of ["own_tree.html", "own_tree.mjs"]) {
+            write(`strict/${name}`, readFileSync(new URL(`../../../examples/javascript/${name}`, import.meta.url), "utf8"));
+        }
+        write("strict/olvane-tree.mjs", readFileSync(join(work, "node_modules/olvane-tree/olvane-tree.mjs"), "utf8"));
+        const page = await browser.newPage();
+        try {
+            // The guide's own policy; the height is set without the attribute that the policy refuses.
+            await page.addInitScript(() => {
+                globalThis.refused = [];
+                addEventListener("securitypolicyviolation", (event) => globalThis.refused.push(event.violatedDirective));
+            });
+            await page.goto(`${address}/strict/own_tree.html`);
+            await page.waitForFunction(() => document.querySelector("olvane-tree").state?.focus, undefined, { timeout: 20_000 });
+            const svg = await page.evaluate(() => document.querySelector("olvane-tree").saveSvg());
+            for (const name of ["Henry", "Anne", "Elizabeth", "Edmund", "Margaret"]) assert.ok(svg.includes(name), `${name} is not drawn`);
+            assert.deepEqual(await page.evaluate(() => globalThis.refused), ["style-src-attr"]);
+        } finally {
+            await page.close();
+        }
+        return "3";
     },
     ...(values.quick ? {} : {
         async rollup() {
