@@ -7,6 +7,8 @@ import { FamilyError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { columnsOf } from "./familyColumns.mjs";
 import { chosenNumber, idNumber, refuse, storedText } from "./familyValues.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
+import { readPicture, usePictureOptions } from "./picture.mjs";
+import { pictureNumbers } from "./pictureOptions.mjs";
 import { searchWith } from "./search.mjs";
 import { CHILD_KINDS, FAMILY_STATES, NAME_KINDS, SEXES, STATUSES, recordsFrom } from "./values.mjs";
 
@@ -209,6 +211,18 @@ export class Family {
 
     layoutText(focus, options = undefined) {
         return this.#layOut(focus, options, 1).text;
+    }
+
+    picture(focus, options = {}) {
+        const { exports } = this.#instance;
+        const numbers = pictureNumbers(options);
+        usePictureOptions(this.#instance, numbers);
+        const answer = exports.family_picture(this.#opened(), focusNumber(focus));
+        const picture = readPicture(this.#instance, options, answer);
+        if (picture !== null) return picture;
+        const isKnown = this.has(focus) && (options.view !== "kinship" || this.has(options.to));
+        const why = this.#instance.text(exports.last_text());
+        throw new LayoutError(isKnown ? "layoutFailed" : "invalidPerson", `picture of person ${String(focus)}: ${why}`, "", []);
     }
 
     close() {

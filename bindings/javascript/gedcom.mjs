@@ -7,7 +7,7 @@
 import { GedcomError, LayoutError } from "./errors.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
-import { pictureFrom } from "./picture.mjs";
+import { readPicture } from "./picture.mjs";
 import { drawingNumbers, pictureNumbers } from "./pictureOptions.mjs";
 import { searchWith } from "./search.mjs";
 import { Texts } from "./texts.mjs";
@@ -180,17 +180,7 @@ export class GedcomFile {
         const { exports } = this.#instance;
         const file = this.#opened();
         this.#setPictureOptions(focus, options);
-        const answer = exports.gedcom_picture(file, focus);
-        if (answer === 0) this.#refuse();
-        try {
-            const count = exports.picture_count(answer) >>> 0;
-            const pointer = exports.picture_numbers(answer) >>> 0;
-            const values = new Float64Array(exports.memory.buffer, pointer, count);
-            const texts = () => JSON.parse(this.#instance.text(exports.last_text()));
-            return pictureFrom(options.view ?? "family", values, texts);
-        } finally {
-            exports.picture_free(answer);
-        }
+        return readPicture(this.#instance, options, exports.gedcom_picture(file, focus)) ?? this.#refuse();
     }
 
     mapIndex() {

@@ -5,6 +5,8 @@
 
 import { HostError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
+import { readPicture, usePictureOptions } from "./picture.mjs";
+import { pictureNumbers } from "./pictureOptions.mjs";
 import { STATUSES, recordsFrom } from "./values.mjs";
 
 // The answer is read before anything is thrown, since it must be freed; of one that is whole, what is wanted alone.
@@ -53,4 +55,24 @@ export function runLayout(instance, host, focus, options, ask, wanted = undefine
     if (status !== "hostFailed" || thrown === null) throw new LayoutError(status, message, text, records);
     const [cause, question] = thrown;
     throw new HostError(status, `${question}: ${reasonOf(cause)}`, text, records, { cause });
+}
+
+/** The picture of a view of a host that is asked. */
+export function runPicture(instance, host, focus, options) {
+    usePictureOptions(instance, pictureNumbers(options));
+    const person = focusNumber(focus);
+    const { exports } = instance;
+    const { result, thrown } = instance.askingHost(host, () => {
+        const picture = readPicture(instance, options, exports.host_picture(person));
+        const why = picture === null ? instance.text(exports.last_text()) : "";
+        return { picture, status: exports.picture_status(), why };
+    });
+    if (result.picture !== null) return result.picture;
+    const number = statusOf(result, thrown);
+    const status = STATUSES[number] === "ok" ? "tooLarge" : STATUSES[number];
+    if (status !== "hostFailed" || thrown === null) {
+        throw new LayoutError(status, result.why || instance.text(exports.status_text(number)), "", []);
+    }
+    const [cause, question] = thrown;
+    throw new HostError(status, `${question}: ${reasonOf(cause)}`, "", [], { cause });
 }

@@ -764,6 +764,8 @@ export class Family {
     search(text: string, limit?: number): SearchHit[];
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;
+    /** The picture of any view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
+    picture(focus: number, options?: PictureOptions): Picture;
     /** Releases the memory; nothing can be asked afterwards. */
     close(): void;
     [Symbol.dispose](): void;
@@ -779,6 +781,8 @@ export class Olvane {
     layout(host: Host | Family, focus: number, options?: Options): LayoutRecord[];
     /** The engine's own line of text. Throws as layout does. */
     layoutText(host: Host | Family, focus: number, options?: Options): string;
+    /** The picture of any view, of a host that is asked as far as the view reaches. Throws as layout does. */
+    picture(host: Host | Family, focus: number, options?: PictureOptions): Picture;
     /**
      * Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Where the file's own word on its
      * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.

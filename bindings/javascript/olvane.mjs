@@ -6,7 +6,7 @@
 import { Family } from "./family.mjs";
 import { readGedcom } from "./gedcom.mjs";
 import { Instance } from "./instance.mjs";
-import { runLayout } from "./layout.mjs";
+import { runLayout, runPicture } from "./layout.mjs";
 import { Texts } from "./texts.mjs";
 
 export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
@@ -35,6 +35,12 @@ export class Olvane {
     layoutText(host, focus, options = undefined) {
         if (host instanceof Family) return host.layoutText(focus, options);
         return this.#run(host, focus, options, "text").text;
+    }
+
+    picture(host, focus, options = {}) {
+        return host instanceof Family
+            ? host.picture(focus, options)
+            : runPicture(this.#instance, host, focus, options);
     }
 
     readGedcom(bytes, name = "family.ged", options = {}) {

@@ -128,3 +128,22 @@ export function pictureFrom(view, numbers, texts) {
                 : { other, focusIs, otherIs, ways: list("ways", wayCount, 6, (start, i) => wayAt(numbers, start, words[i], starts)) },
     };
 }
+
+/** Hands options over as numbers, for the next picture. */
+export function usePictureOptions({ exports }, numbers) {
+    const head = exports.picture_options(numbers.length);
+    new Float64Array(exports.memory.buffer, head >>> 0, numbers.length).set(numbers);
+}
+
+/** Reads what the module answered, and releases it; null for a picture that was refused. */
+export function readPicture(instance, options, answer) {
+    if (answer === 0) return null;
+    const { exports } = instance;
+    try {
+        const count = exports.picture_count(answer) >>> 0;
+        const values = new Float64Array(exports.memory.buffer, exports.picture_numbers(answer) >>> 0, count);
+        return pictureFrom(options.view ?? "family", values, () => JSON.parse(instance.text(exports.last_text())));
+    } finally {
+        exports.picture_free(answer);
+    }
+}

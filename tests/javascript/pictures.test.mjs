@@ -6,7 +6,7 @@
 import assert from "node:assert/strict";
 import test from "node:test";
 
-import { LayoutError } from "../../bindings/javascript/olvane.mjs";
+import { HostError, LayoutError, PERSON_NOT_FOUND } from "../../bindings/javascript/olvane.mjs";
 import { olvane } from "./module.mjs";
 
 // A couple with a child of their own and an adopted one; the husband's parents are divorced.
@@ -154,4 +154,49 @@ test("whose parents come first is a choice, and whoever has further ones says so
     assert.deepEqual(shown({}), [1, 2]);
     assert.equal(adopted.picture(1).boxes[0].furtherParents, 1);
     assert.equal(adopted.picture(1, { view: "ancestors" }).boxes[0].furtherParents, 0);
+});
+
+// Persons 1 and 2 have the children 3 and 5; 3 and 4 have 7.
+const parents = { 3: [1, 2], 5: [1, 2], 7: [3, 4] };
+const couples = [[1, 2, [3, 5]], [3, 4, [7]]];
+const personIds = [1, 2, 3, 4, 5, 7];
+const families = (id) => couples.filter(([one, other]) => one === id || other === id);
+const host = {
+    fatherOf: (id) => parents[id]?.[0] ?? PERSON_NOT_FOUND,
+    motherOf: (id) => parents[id]?.[1] ?? PERSON_NOT_FOUND,
+    spousesOf: (id) => families(id).map(([one, other]) => (one === id ? other : one)),
+    childrenOf: (id) => families(id).flatMap(([, , children]) => children),
+    isPreferredSpouse: () => true,
+    isDead: () => false,
+    dateOf: () => "",
+    sexOf: (id) => (id % 2 === 0 ? 1 : 0),
+};
+const table = olvane.family({
+    persons: personIds.map((id) => ({ id, father: parents[id]?.[0], mother: parents[id]?.[1], sex: id % 2 === 0 ? "female" : "male" })),
+    spouses: couples.flatMap(([one, other]) => [{ person: one, spouse: other }, { person: other, spouse: one }]),
+    children: couples.flatMap(([one, other, children]) =>
+        [one, other].flatMap((parent) => children.map((child) => ({ parent, child })))),
+});
+const shownIds = ({ boxes }) => boxes.map(({ id }) => id).filter((id) => id > 0).sort();
+
+test("every view is drawn of a family that is handed over, and of a host that is asked", () => {
+    for (const view of ["family", "pedigree", "near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship", "everybody"]) {
+        const options = { view, to: 5 };
+        const ofTable = olvane.picture(table, 7, options);
+        const ofHost = olvane.picture(host, 7, options);
+        assert.equal(ofTable.boxes[ofTable.focus].id, 7, view);
+        assert.deepEqual(shownIds(ofTable), shownIds(ofHost), view);
+        assert.ok(shownIds(ofTable).length >= (view === "descendants" ? 1 : 3), view);
+    }
+    assert.equal(table.picture(7, { view: "kinship", to: 5 }).kinship.otherIs, "uncle (father's brother)");
+    assert.throws(() => table.picture(9, { view: "fan" }), (error) => error instanceof LayoutError && error.status === "invalidPerson");
+});
+
+test("a failure of a host names the question and the person, in every view", () => {
+    const failing = { ...host, childrenOf: (id) => (id === 3 ? assert.fail("no such page") : host.childrenOf(id)) };
+    for (const view of ["family", "near", "hourglass", "relatives", "everybody"]) {
+        assert.throws(() => olvane.picture(failing, 7, { view }), (error) =>
+            error instanceof HostError && error.status === "hostFailed" && /childrenOf\(3\): .*no such page/.test(error.message), view);
+    }
+    assert.equal(olvane.picture(host, 7, { view: "near" }).boxes.length > 0, true);
 });

@@ -23,6 +23,7 @@
 
 #include "JsonText.h"
 #include "LayoutAnswer.h"
+#include "PictureRequest.h"
 #include "SearchJson.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
@@ -444,4 +445,12 @@ js::LayoutAnswer* familyLayout(HeldFamily* family, int view, double focus, int w
     } catch (const std::bad_alloc&) {
         return nullptr;
     }
+}
+
+// As gedcom_picture, of a person by id.
+OLVANE_EXPORT("family_picture") std::vector<double>* familyPicture(HeldFamily* family, std::int32_t focus) {
+    return js::pictureAnswer([&] {
+        const charts::ViewRequest view = js::requestOf(0).view;
+        return charts::pictureOf(family->table, focus, view, std::int64_t{view.chart.to} + 1);
+    });
 }

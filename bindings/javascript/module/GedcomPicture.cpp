@@ -1,39 +1,78 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Pictures of an open GEDCOM file, as runs of numbers.
+// Pictures of an open GEDCOM file, and of a host in JavaScript, as runs of numbers.
 
 #include <cstddef>
 #include <exception>
+#include <functional>
 #include <memory>
 #include <stdexcept>
+#include <string>
 #include <vector>
 
 #include <olvane/charts/Views.h>
-#include <olvane/source/LimitedDataSource.h>
 
+#include <LayoutInternal.h>
+
+#include "HostImports.h"
 #include "OpenFile.h"
 #include "PictureAnswer.h"
 #include "PictureRequest.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
+namespace olvane::js {
+
+std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make) {
+    try {
+        const picture::Picture picture = make();
+        auto numbers = std::make_unique<std::vector<double>>(numbersOf(picture));
+        lastText = textsOf(picture);
+        return numbers.release();
+    } catch (const std::length_error&) {
+        lastText = "too large";
+    } catch (const std::exception& error) {
+        lastText = error.what();
+    }
+    return nullptr;
+}
+
+namespace {
+
+olvane_status lastStatus = OLVANE_OK;
+
+}  // namespace
+}  // namespace olvane::js
+
 using namespace olvane;
 using js::OpenFile;
 
 // With the words of a kinship in last_text. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* file, std::int32_t focus) {
-    try {
-        const picture::Picture picture = js::pictureOf(*file, js::requestOf(focus - 1));
-        auto numbers = std::make_unique<std::vector<double>>(js::numbersOf(picture));
-        js::lastText = js::textsOf(picture);
-        return numbers.release();
-    } catch (const std::length_error&) {
-        js::lastText = "too large";
-    } catch (const std::exception& error) {
-        js::lastText = error.what();
-    }
-    return nullptr;
+    return js::pictureAnswer([&] { return js::pictureOf(*file, js::requestOf(focus - 1)); });
+}
+
+// The same of a host in JavaScript. Null where it failed; picture_status then says how, and last_text why.
+OLVANE_EXPORT("host_picture") std::vector<double>* hostPicture(std::int32_t focus) {
+    std::vector<double>* answer = nullptr;
+    std::string failure;
+    const auto ask = [&] {
+        const olvane_host host = js::hostOfJavaScript();
+        const charts::ViewRequest view = js::requestOf(0).view;
+        // The other person of a kinship is written down as a place, one less than the id.
+        const picture::Picture picture =
+            charts::pictureOfHost(c::sourceOf(host), focus, view, std::int64_t{view.chart.to} + 1);
+        answer = js::pictureAnswer([&] { return picture; });
+    };
+    js::lastStatus = OLVANE_NESTED_CALL;
+    c::unlessNested([&] { js::lastStatus = c::guarded(ask, failure); });
+    if (js::lastStatus != OLVANE_OK) js::lastText = failure;
+    return answer;
+}
+
+OLVANE_EXPORT("picture_status") int pictureStatus() {
+    return js::lastStatus;
 }
 
 OLVANE_EXPORT("picture_numbers") const double* pictureNumbers(const std::vector<double>* answer) {
