@@ -33,6 +33,7 @@ using charts::writeMapIndex;
 
 std::vector<kin::PersonCaption> captionsFor(const kin::KinGraph& graph) {
     std::vector<kin::PersonCaption> captions;
+    captions.reserve(static_cast<std::size_t>(graph.personCount()));
     for (int p = 0; p < graph.personCount(); ++p) {
         captions.push_back({"Given" + std::to_string(p % 7) + " Ash" + std::to_string(p % 3),
                             "Ash" + std::to_string(p % 3),
