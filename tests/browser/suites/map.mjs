@@ -7,7 +7,8 @@ import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { readFileSync } from "node:fs";
 import { describe, test } from "node:test";
-import { gunzipSync } from "node:zlib";
+import { gunzipSync, gzipSync } from "node:zlib";
+import axe from "axe-core";
 import { fileFor, kTwoAtOnce, photograph, sample, visitEmpty, visitFile } from "../support/browser.mjs";
 import { livingFamily } from "../support/families.mjs";
 
@@ -164,7 +165,6 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
 
     test("a map that was changed on its way is refused in words", async () => {
         const { text } = darwins();
-        const { gzipSync } = await import("node:zlib");
         const changed = mapBytes(text);
         changed[changed.length - 40] ^= 1;
         const block = text.replace(kMap, (whole, packed) => whole.replace(packed, gzipSync(changed).toString("base64")));
@@ -184,6 +184,45 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         assert.equal(await visit.page.isVisible("#map canvas"), true);
         await visit.end();
     });
+
+    test("two fingers apart come nearer, and what lies between them stays there", async () => {
+        const visit = await visitMap(darwins().path, { hasTouch: true }, "#map=400,300,0.5");
+        const before = await visit.hash();
+        await visit.page.evaluate(() => {
+            const canvas = document.querySelector("#map canvas");
+            const { left, top, width, height } = canvas.getBoundingClientRect();
+            const finger = (type, pointerId, dx) =>
+                canvas.dispatchEvent(new PointerEvent(type, { pointerId, button: 0, clientX: left + width / 2 + dx, clientY: top + height / 2, bubbles: true }));
+            finger("pointerdown", 1, -50);
+            finger("pointerdown", 2, 50);
+            finger("pointermove", 1, -100);
+            finger("pointermove", 2, 100);
+            finger("pointerup", 1, -100);
+            finger("pointerup", 2, 100);
+        });
+        await visit.page.waitForFunction((old) => location.hash !== old, before);
+        const [x, y, k] = /map=([^&]*)/.exec(await visit.hash())[1].split(",").map(Number);
+        assert.ok(Math.abs(x - 400) <= 2 && Math.abs(k - 1) < 0.001, `${x},${y},${k}`);
+        await visit.end();
+    });
+
+    for (const [state, settings] of [
+        ["light", {}],
+        ["dark", { colorScheme: "dark" }],
+        ["a phone", { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true }],
+    ]) {
+        test(`axe finds nothing on the map: ${state}`, async () => {
+            const visit = await visitMap(darwins().path, settings);
+            await visit.page.evaluate(axe.source);
+            const found = await visit.page.evaluate(async () => {
+                const { violations } = await window.axe.run(document, { resultTypes: ["violations"] });
+                return violations.map(({ id, nodes }) => `${id}: ${nodes.slice(0, 3).map((node) => node.html.slice(0, 160)).join(" | ")}`);
+            });
+            assert.deepEqual(found, []);
+            if (settings.isMobile) await photograph(visit, "map-phone");
+            await visit.end();
+        });
+    }
 
     test("flights over 4,000 persons at random break nothing", async () => {
         const visit = await visitMap(mapPage(madeFamily(2000)).path);
