@@ -127,6 +127,11 @@ async function topola(shape) {
       return () => data;
     },
     layout: (data) => (shape === 'ped' ? layOutAncestors : layOutRelatives)(optionsFor(data)),
+    // What draws the links of its nodes.
+    tools() {
+      const options = optionsFor(new JsonDataProvider({ indis: [{ id: `I${FOCUS}` }], fams: [] }));
+      return { util: new ChartUtil(options), renderer: options.renderer };
+    },
     shown: (nodes) => nodes.flatMap(({ data }) => [data.indi, data.spouse]).filter(Boolean).map(({ id }) => id),
   };
 }
