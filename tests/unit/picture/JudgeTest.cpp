@@ -103,7 +103,8 @@ TEST(Judge, everyCountHasAPictureThatIsWrongInIt) {
     std::map<std::string, std::size_t> sums = countsOf(Judgement());
     for (const auto& entry : std::filesystem::directory_iterator(OLVANE_PICTURES)) {
         if (entry.path().extension() != ".json") continue;
-        for (const auto& [name, count] : countsOf(judge(readPictureJson(textOf(entry.path()))))) sums[name] += count;
+        for (const auto& [name, count] : countsOf(judge(readPictureJson(textOf(entry.path())))))
+            sums[name] += count;
     }
     for (const auto& [name, sum] : sums) EXPECT_GT(sum, 0U) << name;
 }
