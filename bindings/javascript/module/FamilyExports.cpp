@@ -84,7 +84,7 @@ std::array<TextColumn*, 10> textColumns(FamilyColumns& to) {
 }
 
 // What the last call had to say: JSON that was asked for, or why something was refused.
-std::string lastText;
+std::string lastFamilyJson;
 // Ids that were asked for last.
 std::vector<FamilyId> lastIds;
 
@@ -101,7 +101,7 @@ void writeRefusal(const FamilyError& error) {
     json.number(error.id());
     json.string(error.field());
     json.end();
-    lastText = std::move(json).take();
+    lastFamilyJson = std::move(json).take();
 }
 
 template <class Work>
@@ -300,8 +300,8 @@ const char* jsonOrNull(const Write& write) {
         json.begin();
         write(json);
         json.end();
-        lastText = std::move(json).take();
-        return lastText.c_str();
+        lastFamilyJson = std::move(json).take();
+        return lastFamilyJson.c_str();
     } catch (const std::exception&) {
         return nullptr;
     }
@@ -375,7 +375,7 @@ OLVANE_EXPORT("family_free") void familyFree(HeldFamily* family) {
 }
 
 OLVANE_EXPORT("last_family_text") const char* lastFamilyText() {
-    return js::lastText.c_str();
+    return js::lastFamilyJson.c_str();
 }
 
 OLVANE_EXPORT("family_edit")
@@ -429,8 +429,8 @@ OLVANE_EXPORT("family_search")
 const char* familySearch(HeldFamily* family, const char* text, std::size_t limit) {
     try {
         const kin::FamilySearchTexts texts(family->table);
-        js::lastText = js::searchJson(family->index(), texts, text, limit);
-        return js::lastText.c_str();
+        js::lastFamilyJson = js::searchJson(family->index(), texts, text, limit);
+        return js::lastFamilyJson.c_str();
     } catch (const std::exception&) {
         return nullptr;
     }
