@@ -41,19 +41,10 @@ olvane::kin::KinGraph familyOf(Bytes& bytes) {
     return builder.build();
 }
 
-}  // namespace
-
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    Bytes bytes(data, size);
-    olvane::charts::EverybodyOptions options;
-    options.marks = bytes.below(5) - 1;
-    options.effort = bytes.below(2);
-    options.onePart = bytes.below(4) == 0;
-    options.direction = static_cast<olvane::charts::Direction>(bytes.below(4));
-    if (bytes.below(4) == 0) options.foldAspect = 0;
-    const olvane::kin::KinGraph graph = familyOf(bytes);
-    options.focus = bytes.below(graph.personCount());
-    const olvane::picture::Picture picture = olvane::charts::everybodyChart(graph, options);
+// What must hold of a chart of this family.
+olvane::picture::Picture checkedChart(const olvane::kin::KinGraph& graph,
+                                      const olvane::charts::EverybodyOptions& options) {
+    olvane::picture::Picture picture = olvane::charts::everybodyChart(graph, options);
     const olvane::picture::Judgement j = olvane::picture::judge(picture, &graph);
     HOLDS(j.persons == picture.boxes.size());
     HOLDS(options.onePart || picture.boxes.size() == static_cast<std::size_t>(graph.personCount()));
@@ -61,5 +52,32 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     HOLDS(j.tracks == 0 && j.touches == 0);
     HOLDS(j.unjoined == 0 && *j.untold == 0);
     HOLDS(options.marks >= 0 || j.crossings == 0);
+    return picture;
+}
+
+}  // namespace
+
+// The last byte asks for lines closer together, for paper, and for a chart of another family of the same ids, whose
+// bytes are those of the second half, with the places of the first kept.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    Bytes bytes(data, size);
+    const int further = size > 0 ? data[size - 1] : 0;
+    olvane::charts::EverybodyOptions options;
+    options.marks = bytes.below(5) - 1;
+    options.effort = bytes.below(2);
+    options.onePart = bytes.below(4) == 0;
+    options.direction = static_cast<olvane::charts::Direction>(bytes.below(4));
+    if (bytes.below(4) == 0) options.foldAspect = 0;
+    options.compact = (further & 1) != 0;
+    if ((further & 6) == 6) options.aspect = 0.5 + (further >> 4);
+    const olvane::kin::KinGraph graph = familyOf(bytes);
+    options.focus = bytes.below(graph.personCount());
+    const olvane::picture::Picture picture = checkedChart(graph, options);
+    if ((further & 8) == 0) return 0;
+    Bytes half(data + size / 2, size - size / 2);
+    const olvane::kin::KinGraph other = familyOf(half);
+    options.focus = 0;
+    options.earlier = &picture;
+    checkedChart(other, options);
     return 0;
 }

@@ -49,8 +49,8 @@ std::size_t tableOf(std::string_view pdf) {
 bool isPage(std::string_view object) {
     constexpr std::string_view kType = "<< /Type /Page";
     const std::size_t start = object.find(kType);
-    return start != std::string_view::npos && start < 24 && object.size() > start + kType.size() &&
-           object[start + kType.size()] != 's';
+    constexpr std::size_t kMostBefore = 24;  // "N 0 obj"
+    return start < kMostBefore && object.size() > start + kType.size() && object[start + kType.size()] != 's';
 }
 
 // By the table: "xref", "0 COUNT", then twenty bytes for each object.

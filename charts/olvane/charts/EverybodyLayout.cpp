@@ -69,6 +69,7 @@ private:
     // False where that is another family, or where lines would cross in spite of all marks.
     bool placeAsBefore() {
         std::vector<double> widths;
+        widths.reserve(l_.part.persons.size());
         for (std::int32_t person = 0; person < l_.part.personCount(); ++person) {
             widths.push_back(boxes_.width(l_.part, person));
         }

@@ -35,6 +35,7 @@ constexpr std::int64_t kAdded = 1'000'000;
 KinGraph copyOf(const KinGraph& graph, Place without, int addedAt) {
     olvane::kin::KinGraphBuilder builder;
     std::vector<Place> place;
+    place.reserve(static_cast<std::size_t>(graph.personCount()));
     for (Place p = 0; p < graph.personCount(); ++p) {
         place.push_back(p == without ? kNobody : builder.addPerson(graph.id(p), graph.sex(p)));
     }
