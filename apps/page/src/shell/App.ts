@@ -201,7 +201,10 @@ export class App implements ChromeActions {
     }
 
     private arriveAt(address: string): void {
-        if (isMapAddress(address) && this.maps.isReady) return this.showMap(address);
+        if (isMapAddress(address) && this.maps.isReady) {
+            this.showMap(address);
+            return this.maps.takeKeys();
+        }
         if (isMapAddress(address) && this.tree.family) return this.setMap(address);
         if (this.unread && this.maps.isShown) return void this.readBesideMap();
         this.hideMap();
@@ -246,14 +249,14 @@ export class App implements ChromeActions {
         if (this.maps.isShown) return;
         if (!this.maps.isReady) return void this.layOutMap(address);
         this.showMap(address || this.maps.address || `#map=&number=${state?.focus ?? 0}`);
-        if (this.maps.isShown) this.journey.add(this.maps.address);
+        this.maps.takeKeys();
+        this.journey.add(this.maps.address);
         this.showState();
     }
 
     private showMap(address: string): void {
         this.maps.show(this.ui, address);
         this.arrange();
-        this.maps.takeKeys();
     }
 
     // In a worker, or where the browser has none for a page like this, here.
