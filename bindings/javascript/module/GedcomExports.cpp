@@ -18,6 +18,7 @@
 #include "GedcomJson.h"
 #include "JsonText.h"
 #include "LayoutAnswer.h"
+#include "MemoryGrowth.h"
 #include "OpenFile.h"
 #include "SearchJson.h"
 
@@ -147,7 +148,10 @@ using js::OpenFile;
 // An empty encoding is what the file itself says. Null for a file that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_open")
 OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, const char* encoding) {
+    // What a file takes with its tables and with the text that hands them over, as measured.
+    constexpr std::size_t kMemoryOfByte = 12;
     try {
+        js::ensureMemory(length * kMemoryOfByte);
         gedcom::ReadOptions options;
         options.details = true;
         options.encoding = encoding;
