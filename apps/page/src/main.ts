@@ -20,6 +20,7 @@ async function start(): Promise<void> {
         const app = new App(root, engine);
         if (family?.hasMap) await app.openMap(family, embeddedMap());
         else if (family) app.openEmbedded(family);
+        else await app.openKept();
     } catch (error) {
         const reason = typeof DecompressionStream === "undefined" ? errors.tooNew : errors.engine;
         const detail = error instanceof Error ? error.message : String(error);

@@ -196,6 +196,14 @@ describe("details of olvane page", { skip: command ? false : "no olvane command 
         });
         assert.deepEqual(seen, [80, 120, "red", "blue"]);
         await photograph(visit, "photos");
+        await visit.page.click("#options-button");
+        await visit.page.check("#photos-in-boxes");
+        await visit.still();
+        assert.equal(await visit.box("I1").locator("image.portrait").count(), 1);
+        assert.equal(await visit.box("I2").locator("image.portrait").count(), 0);
+        assert.match(await visit.hash(), /photos=boxes/);
+        await visit.page.keyboard.press("Escape");
+        await photograph(visit, "photos-in-boxes");
         await visit.end();
     });
 

@@ -23,6 +23,7 @@ import { Tooltip } from "../ui/Tooltip";
 import { boxTowards, type Direction } from "../view/kinMoves";
 import { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
+import type { Sight } from "../view/SharedLink";
 import { addressOf, kUsualState, readAddress, sameState, type ViewState, withNextParents } from "../view/ViewState";
 import { viewerStyles } from "./styles";
 
@@ -31,6 +32,7 @@ const kKinshipTime = 12; // ms at a time for finding it out
 const kWarmUps = 8;
 const kWarmUpPause = 120; // ms
 const kWarmEnough = 12; // ms; what takes less needs no warming
+const kRedrawDelay = 60; // ms
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
 export interface OlvaneTreeEvents {
@@ -71,6 +73,8 @@ export class OlvaneTree extends HTMLElement {
     private contents: PictureContents | null = null;
     private shownPerson = 0; // in the panel
     private kinshipTimer = 0;
+    private redrawTimer = 0;
+    private isInUse = false; // by a pointer that was pressed in the picture and has not left it
 
     constructor() {
         super();
@@ -88,6 +92,9 @@ export class OlvaneTree extends HTMLElement {
             moved: (placing) => this.moved(placing),
         });
         this.overview = new Overview(this.scene.camera);
+        this.scene.camera.takesWheel = () => this.takesWheel();
+        this.surface.addEventListener("pointerdown", () => (this.isInUse = true));
+        this.surface.addEventListener("pointerleave", () => (this.isInUse = false));
         this.shadow.append(html("div", { class: "viewer" }, this.parts), this.tooltip.element, this.live);
         this.shadow.addEventListener("keydown", (event) => this.key(event as KeyboardEvent));
         this.rebuildUi();
@@ -250,6 +257,28 @@ export class OlvaneTree extends HTMLElement {
 
     zoomBy(factor: number): void {
         this.scene.camera.zoomBy(factor);
+    }
+
+    /** Which part of the picture is in sight; null before any. */
+    get sight(): Sight | null {
+        if (!this.picture) return null;
+        const { camera } = this.scene;
+        const { k, x, y } = camera.placing;
+        const { width, height } = camera.size;
+        const middle = middleOf(this.picture.focusBox);
+        return { zoom: k, x: (width / 2 - x) / k - middle.x, y: (height / 2 - y) / k - middle.y };
+    }
+
+    set sight(sight: Sight | null) {
+        if (!this.picture || !sight) return;
+        const { x, y } = middleOf(this.picture.focusBox);
+        this.scene.camera.place(this.scene.camera.centring({ x: x + sight.x, y: y + sight.y }, sight.zoom));
+    }
+
+    // In a frame the wheel scrolls the page around it until the picture is used.
+    private takesWheel(): boolean {
+        const rule = this.getAttribute("wheel") ?? (window.self === window.top ? "always" : "active");
+        return rule !== "active" || this.isInUse || (document.hasFocus() && this.matches(":focus-within"));
     }
 
     /** Puts the keys on the selected box. */
@@ -458,6 +487,7 @@ export class OlvaneTree extends HTMLElement {
             messages: this.messages,
             ui: this.ui,
             kinshipInBoxes: this.getAttribute("kinship") !== "none",
+            portraitOf: this.shownState?.photos ? (person) => family.portraitOf(person, () => this.redrawSoon()) : null,
         });
     }
 
@@ -493,6 +523,12 @@ export class OlvaneTree extends HTMLElement {
         }, kWarmUpPause);
     }
 
+    // Photographs of an archive come one by one.
+    private redrawSoon(): void {
+        clearTimeout(this.redrawTimer);
+        this.redrawTimer = window.setTimeout(() => this.scene.redraw(), kRedrawDelay);
+    }
+
     private nameTree(): void {
         setAttributes(this.surface, { "aria-label": this.pictureTitle(), "aria-describedby": "tree-hint" });
     }
@@ -519,6 +555,10 @@ export class OlvaneTree extends HTMLElement {
     ): boolean {
         return !this.dispatchEvent(new CustomEvent(name, { detail, cancelable: true }));
     }
+}
+
+function middleOf({ x, y, width, height }: Box): { x: number; y: number } {
+    return { x: x + width / 2, y: y + height / 2 };
 }
 
 /** Makes <olvane-tree> known to the browser; once is enough. */

@@ -17,6 +17,7 @@ export class Photographs {
 
     /** JPEG in base 64, by the name that the family's text has for the file. */
     static embedded(photos: Readonly<Record<string, unknown>>): Photographs {
+        if (Object.keys(photos).length === 0) return Photographs.none;
         return new Photographs((file) =>
             Object.hasOwn(photos, file) ? `data:image/jpeg;base64,${String(photos[file])}` : null,
         );

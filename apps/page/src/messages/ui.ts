@@ -82,6 +82,17 @@ export interface UiMessages {
     readonly encodingAuto: string;
     readonly file: string;
     readonly openFile: string;
+    readonly copyLink: string;
+    readonly linkCopied: string;
+    readonly linkNotCopied: string;
+    readonly photosInBoxes: string;
+    /** Of a file that stays in the browser. */
+    readonly keep: {
+        readonly label: string;
+        readonly hint: string;
+        readonly removed: string;
+        readonly failed: string;
+    };
     readonly saveSvg: string;
     readonly savePng: string;
     readonly print: string;

@@ -18,6 +18,21 @@ export function saveFile(name: string, content: Blob): void {
     setTimeout(() => URL.revokeObjectURL(address), 60_000);
 }
 
+/** False where the browser lets no page write to the clipboard. */
+export async function copyText(text: string): Promise<boolean> {
+    try {
+        await navigator.clipboard.writeText(text);
+        return true;
+    } catch {
+        const field = html("textarea", { "aria-hidden": "true" }, text);
+        document.body.append(field);
+        field.select();
+        const isCopied = document.execCommand("copy");
+        field.remove();
+        return isCopied;
+    }
+}
+
 export function svgBlob(drawing: string): Blob {
     return new Blob([drawing], { type: "image/svg+xml" });
 }

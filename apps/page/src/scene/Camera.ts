@@ -37,6 +37,8 @@ export class Camera {
     private measured: { width: number; height: number } | null = null;
     private travel = 0; // the frame that is asked for; 0 at rest
     private aim: Placing | null = null; // of the travel
+    /** Whether the wheel is for the picture now, and not for the page around it. */
+    takesWheel = () => true;
 
     constructor(
         private readonly surface: SVGSVGElement,
@@ -49,6 +51,9 @@ export class Camera {
                 [0, 0],
                 [this.size.width, this.size.height],
             ])
+            .filter((event: MouseEvent) =>
+                event.type === "wheel" ? event.ctrlKey || this.takesWheel() : !event.ctrlKey && !event.button,
+            )
             .clickDistance(6)
             .on("zoom", (event: D3ZoomEvent<SVGSVGElement, unknown>) => {
                 if (event.sourceEvent) this.stop();

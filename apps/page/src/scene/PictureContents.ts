@@ -18,6 +18,8 @@ export interface Wording {
     readonly messages: Messages;
     readonly ui: UiMessages;
     readonly kinshipInBoxes: boolean;
+    /** The address of somebody's photograph, null where there is none; null where boxes show none. */
+    readonly portraitOf: ((person: number) => string | null) | null;
 }
 
 export class PictureContents implements BoxContents {
@@ -95,6 +97,7 @@ export class PictureContents implements BoxContents {
             name: nameParts(person, messages),
             texts: this.texts,
             rightToLeft: directionOf(person.name) === "rtl",
+            photo: this.wording.portraitOf?.(person.id) ?? null,
             years: shortYears(person),
             kinship: this.wording.kinshipInBoxes
                 ? this.kinshipKnown
@@ -123,6 +126,7 @@ export class PictureContents implements BoxContents {
             name: { given: what, surname: "" },
             texts: this.texts,
             rightToLeft: false,
+            photo: null,
             years: "",
             kinship: null,
             hidden: -1,

@@ -26,6 +26,8 @@ export interface BoxLook {
     // Measures and fits what is written.
     readonly texts: Texts;
     readonly rightToLeft: boolean;
+    // The address of a photograph; null for a silhouette.
+    readonly photo: string | null;
     readonly years: string;
     // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
     readonly kinship: string | null;
@@ -43,6 +45,7 @@ export interface BoxLook {
     readonly label: string;
 }
 
+const kUsualHeight = 104; // of a tall box without room for a photograph
 const kInset = 7; // px from the border to any text
 const kYearsSize = 11;
 const kKinSize = 10.5;
@@ -128,13 +131,15 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
     const yearsY = look.kinship !== null ? lastLine - 14 : lastLine;
-    const top = 31;
+    // What a box is higher than usual is for the photograph.
+    const figureHeight = 22 + Math.max(0, nodeHeight - kUsualHeight);
+    const top = 9 + figureHeight;
     const bottom = look.years || look.kinship !== null ? yearsY - kYearsSize - 1 : nodeHeight - 6;
     const name = look.texts.fitName(look.name, { width: room, height: bottom - top, gap: 1, lines: 3 });
     const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
 
-    box.append(figure(look, middle - 12, 8));
+    box.append(figure(look, middle, 7, figureHeight));
     name.lines.forEach((line, i) =>
         box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
@@ -143,7 +148,7 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
 }
 
 function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
-    const left = 40;
+    const left = look.photo ? 54 : 40;
     const right = nodeWidth - kInset;
     const room = right - left;
     const lower = lowerLines(look, room);
@@ -155,7 +160,8 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     // In the other direction a line begins at the right edge of its room.
     const x = look.rightToLeft ? right : left;
 
-    box.append(figure(look, 9, (nodeHeight - 22) / 2));
+    const figureHeight = look.photo ? nodeHeight - 12 : 22;
+    box.append(figure(look, look.photo ? 28 : 21, (nodeHeight - figureHeight) / 2, figureHeight));
     name.lines.forEach((line, i) =>
         box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
@@ -177,14 +183,27 @@ function lowerLines(look: BoxLook, room: number): string[] {
     return lines.length === 2 && look.texts.width(joined, kYearsSize) <= room ? [joined] : lines;
 }
 
-function figure(look: BoxLook, x: number, y: number): SVGElement {
-    if (look.person)
-        return svg("path", {
-            class: "figure",
-            d: kSilhouettes[look.sex],
-            transform: `translate(${x} ${y}) scale(${kFigureScale})`,
+// x is its middle, y its upper edge.
+function figure(look: BoxLook, x: number, y: number, height: number): SVGElement {
+    if (look.photo) {
+        const width = Math.min(height, 44);
+        return svg("image", {
+            class: "portrait",
+            href: look.photo,
+            x: x - width / 2,
+            y,
+            width,
+            height,
+            preserveAspectRatio: "xMidYMid slice",
         });
-    return text("unknown", x + 12, y + 19, "?");
+    }
+    if (!look.person) return text("unknown", x, y + height / 2 + 8, "?");
+    const scale = (kFigureScale * Math.min(height, 44)) / 22;
+    return svg("path", {
+        class: "figure",
+        d: kSilhouettes[look.sex],
+        transform: `translate(${x - 22 * scale} ${y + (height - 40 * scale) / 2}) scale(${scale})`,
+    });
 }
 
 function kinText(

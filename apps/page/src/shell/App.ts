@@ -5,17 +5,20 @@
 // Files come in through FileOpening; everything about the picture is the viewer's.
 
 import type { Diagnostic, GedcomFile, Person } from "olvane";
+import { iconButton } from "../base/controls";
 import { html, recall, remember } from "../base/dom";
 import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
 import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
 import { mapInWorker } from "../engine/mapWorker";
+import { Photographs } from "../engine/photographs";
 import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
 import { PictureOutput, type Subject } from "../output/PictureOutput";
-import { fileNameOf } from "../output/saving";
+import { copyText, fileNameOf } from "../output/saving";
 import { Notices } from "../ui/Notices";
 import type { OuterKey } from "../ui/pictureKeys";
 import { OpenFamily } from "../view/OpenFamily";
+import { linkOf, looksIn } from "../view/SharedLink";
 import {
     addressOf,
     clampDepth,
@@ -30,16 +33,20 @@ import { Chrome, type ChromeActions } from "./Chrome";
 import { fileInput, takeDrops } from "./dropping";
 import { FileOpening, type OpenedFile } from "./FileOpening";
 import { Journey } from "./Journey";
+import { canKeep, keepFile, keptFile, removeKeptFile } from "./KeptFile";
 import { isMapAddress, mapComplaint, MapHost } from "./MapHost";
 import type { Found } from "./searchReasons";
-import { Theme, type ThemeChoice } from "./theme";
+import { kThemeChoices, Theme, type ThemeChoice } from "./theme";
 import { Welcome } from "./Welcome";
+
+const kNarrow = "(max-width: 720px)"; // as in styles/shell.css
 
 export class App implements ChromeActions {
     private ui: UiMessages;
     private chrome!: Chrome; // made by rebuildUi()
     private welcome!: Welcome;
     private fileName = "";
+    private isKept = false; // the open file, in the browser
     private encoding = ""; // that was chosen; empty for the file's own word
     private remarks: readonly Diagnostic[] = [];
     private panelOpen = recall("panel") !== "no";
@@ -52,7 +59,12 @@ export class App implements ChromeActions {
     private readonly notices = new Notices();
     private readonly cover = html("div", { class: "cover", hidden: true });
     private readonly input = fileInput((file) => void this.openDropped([file]));
-    private readonly journey = new Journey((address) => this.arriveAt(address));
+    // In a frame, steps do not fill the history of the page around it, unless "?history" asks for that.
+    private readonly journey = new Journey(
+        (address) => this.arriveAt(address),
+        window.self !== window.top && !new URLSearchParams(location.search).has("history"),
+    );
+    private readonly firstHint = html("div", { id: "first-hint", role: "status", hidden: true });
     private readonly maps = new MapHost({
         openPerson: (number) => this.leaveMap({ focus: number }),
         mapSettled: (address) => this.journey.replace(address),
@@ -121,6 +133,8 @@ export class App implements ChromeActions {
         await pause();
         try {
             const opened = await this.files.openFile(file);
+            // Another file than the kept one is kept only when that is asked for again.
+            if (this.tree.family) this.isKept = false;
             this.encoding = "";
             this.show(opened, null);
             if (others.length > 0) this.notices.show(this.ui.firstOfFiles(quoted(file.name)));
@@ -154,6 +168,7 @@ export class App implements ChromeActions {
         this.journey.begin(addressOf(state, family.persons), embedded !== null);
         this.arrive(state);
         performance.measure("olvane-open", { start });
+        this.wearLooks(address);
         this.greet(family);
         this.nameUnknownPerson(address);
         this.tree.warmUp();
@@ -169,9 +184,35 @@ export class App implements ChromeActions {
     }
 
     private greet(family: OpenFamily): void {
-        if (recall("greeted") !== "yes") this.notices.show(this.ui.firstHint);
+        if (recall("greeted") !== "yes") this.showFirstHint();
         remember("greeted", "yes");
         if (family.livingHidden) this.notices.show(this.ui.livingHidden);
+    }
+
+    // Where a notice would lie over the picture, the hint has a row of its own until somebody has done something.
+    private showFirstHint(): void {
+        if (!matchMedia(kNarrow).matches) return this.notices.show(this.ui.firstHint);
+        const dismiss = iconButton("hint-dismiss", "close", this.ui.errors.dismiss, () => this.hideFirstHint());
+        this.firstHint.replaceChildren(html("p", {}, this.ui.firstHint), dismiss);
+        this.firstHint.hidden = false;
+        this.arrange();
+    }
+
+    private hideFirstHint(): void {
+        this.firstHint.hidden = true;
+        this.firstHint.remove();
+    }
+
+    // What a link says of colours, language and zoom holds for this visit; what the reader chose before stays theirs.
+    private wearLooks(address: string): void {
+        const looks = looksIn(address, this.tree.family!.persons);
+        if (looks.language && looks.language !== this.ui.language) this.speak(looks.language);
+        const theme = kThemeChoices.find((choice) => choice === looks.theme);
+        if (theme) this.theme.show(theme);
+        if (looks.kinship === false) this.showKinship(false);
+        if (theme || looks.kinship === false) this.rebuildUi();
+        if (looks.selected) this.tree.select(looks.selected);
+        if (looks.sight) this.tree.sight = looks.sight;
     }
 
     // A link that leads to nobody is named; one that leads somewhere takes the notice away.
@@ -223,7 +264,9 @@ export class App implements ChromeActions {
             name: Name,
             act: (event: OlvaneTreeEvents[Name]) => void,
         ) => this.tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
+        on("select", () => this.hideFirstHint());
         on("focuschange", ({ detail }) => {
+            if (detail.byUser) this.hideFirstHint();
             if (!this.arriving) this.journey.add(addressOf(detail.state, this.tree.family!.persons));
             this.showState();
         });
@@ -331,8 +374,12 @@ export class App implements ChromeActions {
     }
 
     setKinshipInBoxes(shown: boolean): void {
-        this.kinshipInBoxes = shown;
         remember("kinship", shown ? "yes" : "no");
+        this.showKinship(shown);
+    }
+
+    private showKinship(shown: boolean): void {
+        this.kinshipInBoxes = shown;
         this.tree.setAttribute("kinship", shown ? "boxes" : "none");
     }
 
@@ -356,10 +403,18 @@ export class App implements ChromeActions {
 
     setLanguage(language: string): void {
         remember("language", language);
+        this.speak(language);
+        document.getElementById(this.tree.family ? "options-button" : "language")?.focus();
+    }
+
+    private speak(language: string): void {
         this.ui = uiMessagesFor(language);
         this.tree.setAttribute("language", language);
         this.rebuildUi();
-        document.getElementById(this.tree.family ? "options-button" : "language")?.focus();
+    }
+
+    setPhotos(photos: boolean): void {
+        this.travel({ photos });
     }
 
     back(): void {
@@ -380,6 +435,48 @@ export class App implements ChromeActions {
 
     savePng(): void {
         void this.output.savePng(this.ui);
+    }
+
+    /** With everything that is seen: another browser shows the same. */
+    async copyLink(): Promise<void> {
+        const { state, family, sight, selected } = this.tree;
+        if (!state || !family) return;
+        const looks = {
+            selected: selected?.id ?? 0,
+            sight,
+            language: this.ui.language,
+            theme: this.theme.choice,
+            kinship: this.kinshipInBoxes,
+        };
+        const link = location.href.replace(/#.*$/, "") + linkOf(state, looks, family.persons);
+        if (await copyText(link)) this.notices.show(this.ui.linkCopied);
+        else this.notices.fail(this.ui.linkNotCopied, [link]);
+    }
+
+    /** Keeps the open file in the browser for the next visit, or removes it. */
+    async setKept(isKept: boolean): Promise<void> {
+        if (!isKept) {
+            await removeKeptFile();
+            this.notices.show(this.ui.keep.removed);
+        } else if (this.files.opened && !(await keepFile(this.files.opened))) {
+            this.notices.fail(this.ui.keep.failed, []);
+            isKept = false;
+        }
+        this.isKept = isKept;
+        this.showKept();
+    }
+
+    /** Opens what was kept on an earlier visit. */
+    async openKept(): Promise<void> {
+        const kept = await keptFile();
+        if (!kept || this.tree.family) return;
+        this.isKept = true;
+        await this.openDropped([new File([kept.bytes], kept.name)]);
+    }
+
+    // null where nothing can be kept: on disk, and of a family that lies in the page.
+    private showKept(): void {
+        this.chrome.showKept(canKeep() && this.files.opened ? this.isKept : null);
     }
 
     print(): void {
@@ -476,9 +573,12 @@ export class App implements ChromeActions {
         for (const child of [...this.root.children]) if (child !== main) child.remove();
         if (!main.isConnected) this.root.append(main);
         main.before(chrome.bar);
+        if (!this.firstHint.hidden) main.before(this.firstHint);
         this.root.append(chrome.keys, chrome.diagnostics, ...always);
         const count = family?.persons.length ?? this.maps.count;
         chrome.showFamily(family?.title ?? document.title, this.ui.personCount(count));
+        this.showKept();
+        chrome.showPhotos(family !== null && family.photographs !== Photographs.none);
         chrome.showEncoding(this.files.canReadAgain ? this.encoding : null);
         chrome.showDiagnostics(this.remarks, count);
         this.showPanelState();

@@ -29,6 +29,9 @@ export interface ChromeActions extends SearchSource, ViewActions {
     forward(): void;
     openFile(): void;
     saveSvg(): void;
+    copyLink(): void;
+    setKept(isKept: boolean): void;
+    setPhotos(shown: boolean): void;
     savePng(): void;
     print(): void;
     togglePanel(): void;
@@ -80,6 +83,10 @@ export class Chrome {
     private readonly unknownParents: HTMLInputElement;
     private readonly encoding = html("select", { id: "encoding" });
     private readonly encodingRow: HTMLElement;
+    private readonly keep: HTMLInputElement;
+    private readonly keepRow: HTMLElement;
+    private readonly photos: HTMLInputElement;
+    private readonly photosRow: HTMLElement;
     private readonly generations = html("output", { id: "generations" });
     private readonly fewer: HTMLButtonElement;
     private readonly more: HTMLButtonElement;
@@ -118,6 +125,15 @@ export class Chrome {
         this.encoding.append(html("option", { value: "" }, ui.encodingAuto));
         for (const name of kEncodings) this.encoding.append(html("option", { value: name }, name));
         this.encoding.addEventListener("change", () => actions.setEncoding(this.encoding.value));
+        this.keep = this.checkbox("keep-file", (checked) => actions.setKept(checked));
+        this.keepRow = html(
+            "label",
+            { class: "switch", hidden: true },
+            this.keep,
+            html("span", {}, ui.keep.label, html("small", {}, ui.keep.hint)),
+        );
+        this.photos = this.checkbox("photos-in-boxes", (checked) => actions.setPhotos(checked));
+        this.photosRow = html("label", { class: "switch", hidden: true }, this.photos, html("span", {}, ui.photosInBoxes));
         this.encodingRow = html("label", { class: "row" }, html("span", {}, ui.encoding), this.encoding);
         this.options = new Popover(
             iconButton("options-button", "options", ui.options, () => {}),
@@ -136,6 +152,16 @@ export class Chrome {
         this.encoding.value = encoding ?? "";
     }
 
+    // null where no file can be kept.
+    showKept(isKept: boolean | null): void {
+        this.keepRow.hidden = isKept === null;
+        this.keep.checked = isKept === true;
+    }
+
+    showPhotos(areThere: boolean): void {
+        this.photosRow.hidden = !areThere;
+    }
+
     showFamily(title: string, persons: string): void {
         this.title.replaceChildren(html("h1", { dir: "auto" }, title), html("span", {}, persons));
     }
@@ -147,6 +173,7 @@ export class Chrome {
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
         this.unknownParents.checked = state.unknownParents;
+        this.photos.checked = state.photos;
         this.unknownParents.disabled = state.view !== "family" && state.view !== "pedigree";
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
         // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from. The
@@ -263,6 +290,7 @@ export class Chrome {
                 {},
                 html("legend", {}, ui.look),
                 html("label", { class: "switch" }, kinship, html("span", {}, ui.kinshipInBoxes)),
+                this.photosRow,
                 this.choice("theme", ui.theme, themes, looks.theme, (theme) =>
                     actions.setTheme(theme as ThemeChoice),
                 ),
@@ -287,11 +315,13 @@ export class Chrome {
         return html(
             "div",
             { id: "file-panel", class: "sheet", role: "region", "aria-label": ui.file },
+            item("copy-link", ui.copyLink, () => actions.copyLink()),
             item("save-svg", ui.saveSvg, () => actions.saveSvg()),
             item("save-png", ui.savePng, () => actions.savePng()),
             item("print", ui.print, () => actions.print()),
             item("open-file", ui.openFile, () => actions.openFile()),
             this.encodingRow,
+            this.keepRow,
             item("keys-button", ui.keys, () => this.keys.showModal()),
         );
     }

@@ -23,13 +23,18 @@ export interface OpenedFile {
 export class FileOpening {
     constructor(private readonly engine: Olvane) {}
 
-    private last: { readonly bytes: Uint8Array; readonly name: string; readonly photographs: Photographs } | null = null;
+    private last: { readonly bytes: Uint8Array; readonly name: string; readonly photographs: Photographs; readonly whole: Uint8Array<ArrayBuffer> } | null = null;
 
     /** What was read last. */
     source: MapSource | null = null;
 
     openEmbedded({ bytes, name, title, photographs }: EmbeddedFamily): OpenedFile {
         return this.read(bytes, name, title, photographs);
+    }
+
+    /** The file as it was opened; null for a family that lies in the page. */
+    get opened(): { readonly name: string; readonly bytes: ArrayBuffer } | null {
+        return this.last && { name: this.last.name, bytes: this.last.whole.buffer };
     }
 
     /** Whether the file that is shown can be read in another encoding: what the page itself holds is UTF-8. */
@@ -51,7 +56,7 @@ export class FileOpening {
         const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
         const photographs = archive ? Photographs.inArchive(archive) : Photographs.none;
         const opened = this.read(gedcom, file.name, "", photographs);
-        this.last = { bytes: gedcom, name: file.name, photographs };
+        this.last = { bytes: gedcom, name: file.name, photographs, whole: bytes };
         return opened;
     }
 

@@ -17,9 +17,14 @@ export class Journey {
     private first = 0;
     private family = kOwnFamily;
     private address = "";
+    private readonly steps: string[] = []; // where the browser's history is not ours to fill
 
-    // goTo receives an address that the browser went to.
-    constructor(private readonly goTo: (address: string) => void) {
+    // goTo receives an address that the browser went to. keepsSteps: they are kept here, since the browser's history
+    // belongs to the page around the frame that this one lies in.
+    constructor(
+        private readonly goTo: (address: string) => void,
+        private readonly keepsSteps: boolean,
+    ) {
         window.addEventListener("popstate", (event) => this.arrived(event.state));
     }
 
@@ -34,7 +39,7 @@ export class Journey {
     // The address that the way begins at. Before it lies at most what was there before the page, with a family
     // of its own, was loaded again: the way through another family does not lead into this one.
     begin(address: string, isOwnFamily: boolean): void {
-        const here = stepOf(history.state);
+        const here = this.keepsSteps ? null : stepOf(history.state);
         this.family = isOwnFamily ? kOwnFamily : Date.now();
         this.step = this.last = here?.olvane ?? 0;
         this.first = isOwnFamily && here?.family === kOwnFamily ? 0 : this.step;
@@ -43,7 +48,7 @@ export class Journey {
 
     add(address: string): void {
         this.last = ++this.step;
-        this.write("pushState", address);
+        this.write(this.keepsSteps ? "replaceState" : "pushState", address);
     }
 
     // Corrects the address of the place where we are.
@@ -52,15 +57,26 @@ export class Journey {
     }
 
     back(): void {
-        if (this.canGoBack) history.back();
+        if (!this.canGoBack) return;
+        if (this.keepsSteps) this.stepBy(-1);
+        else history.back();
     }
 
     forward(): void {
-        if (this.canGoForward) history.forward();
+        if (!this.canGoForward) return;
+        if (this.keepsSteps) this.stepBy(1);
+        else history.forward();
+    }
+
+    private stepBy(count: number): void {
+        this.step += count;
+        this.write("replaceState", this.steps[this.step]!);
+        this.goTo(this.address);
     }
 
     private write(how: "pushState" | "replaceState", address: string): void {
         this.address = address;
+        this.steps[this.step] = address;
         try {
             history[how]({ olvane: this.step, family: this.family } satisfies Step, "", address);
         } catch {

@@ -24,8 +24,13 @@ export class Theme {
     }
 
     choose(choice: ThemeChoice): void {
-        this.choice = choice;
         remember("theme", choice);
+        this.show(choice);
+    }
+
+    /** For this time alone, as a link wants it. */
+    show(choice: ThemeChoice): void {
+        this.choice = choice;
         this.wear();
     }
 

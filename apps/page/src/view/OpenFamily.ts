@@ -12,6 +12,7 @@ import { optionsOf, type ViewState } from "./ViewState";
 export class OpenFamily {
     readonly persons: readonly Person[];
     readonly families: readonly Family[];
+    private readonly portraits = new Map<number, string | null>();
     private kinships: KinshipTexts | null = null;
 
     constructor(
@@ -37,6 +38,26 @@ export class OpenFamily {
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
         return this.file.svg(state.focus, optionsOf(state, language), { theme });
+    }
+
+    // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.
+    portraitOf(id: number, late: () => void): string | null {
+        const known = this.portraits.get(id);
+        if (known !== undefined) return known;
+        this.portraits.set(id, null);
+        for (const { file } of this.file.detailsOfPerson(id).media) {
+            const url = this.photographs.urlOf(file);
+            if (typeof url === "string") {
+                this.portraits.set(id, url);
+                return url;
+            }
+            void url?.then((found) => {
+                if (!found || this.portraits.get(id)) return;
+                this.portraits.set(id, found);
+                late();
+            });
+        }
+        return null;
     }
 
     // The focus stands first among all who could be one: whoever has the most relatives near.

@@ -33,6 +33,8 @@ export interface ViewState {
     // A person, and the family whose partners are shown as that person's parents; 0 for the usual ones.
     readonly parentsOf: number;
     readonly parentFamily: number;
+    // Whether boxes show photographs.
+    readonly photos: boolean;
     // Names of kRelatives that are switched off.
     readonly hidden: ReadonlySet<RelativeName>;
 }
@@ -56,12 +58,14 @@ export const kUsualState: ViewState = {
     unknownParents: true,
     parentsOf: 0,
     parentFamily: 0,
+    photos: false,
     hidden: new Set(),
 };
 
 // Boxes wide enough for most names, and rows far enough apart for the lines between them to be distinguished from
 // another.
 const kTall = { width: 118, height: 104, gapX: 22, gapY: 42 };
+const kTallWithPhoto = { ...kTall, height: kTall.height + 32 };
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
@@ -69,7 +73,8 @@ const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 export function optionsOf(state: ViewState, language: PictureOptions["language"] = "en"): PictureOptions {
     const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily } = state;
     const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
-    const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : kTall;
+    const tall = state.photos ? kTallWithPhoto : kTall;
+    const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : tall;
     return {
         ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, language },
         shown: shownBits(state),
@@ -85,7 +90,7 @@ function shownBits(state: ViewState): number {
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
-    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents", "parentFamily", "parentsOf"] as const).every(
+    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents", "photos", "parentFamily", "parentsOf"] as const).every(
         (name) => a[name] === b[name],
     );
     return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
@@ -104,6 +109,7 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     if (hasDown(view) && state.down !== kUsualDown) parts.set("down", String(state.down));
     if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
     if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
+    if (state.photos) parts.set("photos", "boxes");
     const hide = [...state.hidden, ...(state.unknownParents ? [] : [kUnknownParents])];
     if (state.parentFamily) parts.set("parents", `${state.parentsOf}.${state.parentFamily}`);
     if (hide.length > 0) parts.set("hide", hide.join(","));
@@ -112,7 +118,7 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
 
 // What "hide" names beside the groups of relatives.
 const kUnknownParents = "unknownParents";
-const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "hide", "parents"];
+const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "photos", "hide", "parents"];
 
 // Whatever an address does not name, or names wrongly, is as in the state that it is read into.
 export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {
@@ -131,6 +137,7 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
         to,
         ...parentsIn(parts.get("parents") ?? "", persons),
         unknownParents: !hidden.includes(kUnknownParents),
+        photos: parts.get("photos") === "boxes",
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
     };
 }

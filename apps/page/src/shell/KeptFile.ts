@@ -1,0 +1,59 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The file that a reader asked this site to keep in the browser, so that it opens again without being dropped. Never of a
+// page that lies on disk: every other page on that disk could read it.
+
+const kDatabase = "olvane";
+const kStore = "files";
+const kKey = "kept";
+
+export interface KeptBytes {
+    readonly name: string;
+    readonly bytes: ArrayBuffer;
+}
+
+/** Whether a file may be kept at all. */
+export function canKeep(): boolean {
+    return /^https?:$/.test(location.protocol) && typeof indexedDB !== "undefined";
+}
+
+/** Null where none is kept, or the browser lets none be read. */
+export async function keptFile(): Promise<KeptBytes | null> {
+    if (!canKeep()) return null;
+    const found = await within<KeptBytes | undefined>("readonly", (store) => store.get(kKey)).catch(() => null);
+    // To look is to make an empty database, which nobody asked for.
+    if (!found) await removeKeptFile();
+    return found ?? null;
+}
+
+/** False where the browser keeps nothing, in a private window or for want of room. */
+export function keepFile(file: KeptBytes): Promise<boolean> {
+    return within("readwrite", (store) => store.put(file, kKey)).then(
+        () => true,
+        () => false,
+    );
+}
+
+/** Removes it with the database that it lies in. */
+export function removeKeptFile(): Promise<void> {
+    return new Promise((done) => {
+        const request = indexedDB.deleteDatabase(kDatabase);
+        request.onsuccess = request.onerror = request.onblocked = () => done();
+    });
+}
+
+function within<Result>(mode: IDBTransactionMode, ask: (store: IDBObjectStore) => IDBRequest): Promise<Result> {
+    return new Promise((done, failed) => {
+        const opening = indexedDB.open(kDatabase, 1);
+        opening.onupgradeneeded = () => opening.result.createObjectStore(kStore);
+        opening.onerror = () => failed(opening.error);
+        opening.onsuccess = () => {
+            const database = opening.result;
+            const transaction = database.transaction(kStore, mode);
+            const request = ask(transaction.objectStore(kStore));
+            transaction.oncomplete = () => (database.close(), done(request.result as Result));
+            transaction.onerror = transaction.onabort = () => (database.close(), failed(transaction.error));
+        };
+    });
+}
