@@ -19,6 +19,8 @@ const here = (path) => fileURLToPath(new URL(path, import.meta.url));
 const { values } = parseArgs({ options: { wasm: { type: "string" }, out: { type: "string" }, element: { type: "string" } } });
 if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
 
+const kBinding = process.env.OLVANE_JAVASCRIPT ?? here("../../bindings/javascript");
+
 // One script with all that it imports. settings are esbuild's.
 async function bundled(entry, settings) {
     const { outputFiles } = await build({
@@ -35,9 +37,7 @@ async function bundled(entry, settings) {
         // The engine lies in the script's own file, not beside it.
         define: { "import.meta.url": '"data:,"', ...settings.define },
         alias: {
-            olvane: process.env.OLVANE_JAVASCRIPT
-                ? `${process.env.OLVANE_JAVASCRIPT}/olvane.mjs`
-                : here("../../bindings/javascript/olvane.mjs"),
+            olvane: `${kBinding}/olvane.mjs`,
             // The page moves things by itself, so most of what zooming could do beside that stays out.
             "d3-transition": here("src/scene/noTransition.ts"),
             "d3-interpolate": here("src/scene/noInterpolation.ts"),
@@ -48,14 +48,14 @@ async function bundled(entry, settings) {
 
 // What would end the element early may stand in a script only as an escape.
 async function bundledScript() {
-    return (await bundled("src/main.ts", { format: "iife" })).replaceAll("</script", "<\\/script");
+    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript } })).replaceAll("</script", "<\\/script");
 }
 
 async function writeElement(path, engine) {
     const banner = "// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n";
     const script = await bundled("src/element/package.ts", {
         format: "esm",
-        define: { kPackedModule: JSON.stringify(engine) },
+        define: { kPackedModule: JSON.stringify(engine), kReadingScript },
     });
     await writeFile(path, banner + script + "\n");
     const packed = gzipSync(script, { level: 9 }).length;
@@ -91,10 +91,15 @@ function policyOf(script, style) {
         "img-src data: blob:",
         "worker-src blob:",
         "connect-src 'none'",
+        // Large files are read in one.
+        "worker-src blob:",
         "base-uri 'none'",
         "form-action 'none'",
     ].join("; ");
 }
+
+// The worker's script is a text in the page's.
+const kReadingScript = JSON.stringify(await bundled(`${kBinding}/readingWorker.mjs`, { format: "iife" }));
 
 const [script, style] = await Promise.all([bundledScript(), minifiedStyle(...kPageStyles)]);
 const engine = gzipSync(await readFile(values.wasm), { level: 9 }).toString("base64");

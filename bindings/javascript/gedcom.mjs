@@ -5,10 +5,12 @@
 // when they are asked for.
 
 import { GedcomError, LayoutError } from "./errors.mjs";
+import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { readPicture } from "./picture.mjs";
 import { drawingNumbers, pictureNumbers } from "./pictureOptions.mjs";
+import { openFile } from "./reading.mjs";
 import { searchWith } from "./search.mjs";
 import { Texts } from "./texts.mjs";
 
@@ -115,12 +117,12 @@ export class GedcomFile {
     #file;
     #token = {};
 
-    constructor(instance, file, name) {
+    constructor(instance, file, name, table = undefined) {
         this.#instance = instance;
         this.#file = file;
         this.name = name;
         this.texts = new Texts(instance);
-        const [encoding, version, persons, families, diagnostics] = this.#answer("gedcom_table");
+        const [encoding, version, persons, families, diagnostics] = table ? JSON.parse(table) : this.#answer("gedcom_table");
         this.encoding = encoding;
         this.version = version;
         this.persons = persons.map(personFrom);
@@ -269,18 +271,33 @@ if (Symbol.dispose) GedcomFile.prototype[Symbol.dispose] = GedcomFile.prototype.
 
 export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
     const { exports } = instance;
-    const file = instance.withText(name, (namePointer) =>
-        instance.withText(encoding, (encodingPointer) =>
-            instance.withBytes(bytes, (pointer, length) =>
-                exports.gedcom_open(pointer, length, namePointer, encodingPointer),
-            ),
-        ),
-    );
-    if (file === 0) throw new GedcomError(instance.text(exports.last_text()));
+    const file = openFile(instance, bytes, name, encoding);
     try {
         return new GedcomFile(instance, file, name);
     } catch (error) {
         exports.gedcom_close(file);
         throw error;
     }
+}
+
+export function readGedcomIn(worker, { module }, bytes, name, { encoding = "", onProgress, signal } = {}) {
+    return new Promise((done, failed) => {
+        const end = (settle, value) => {
+            worker.terminate();
+            settle(value);
+        };
+        signal?.addEventListener("abort", () => end(failed, signal.reason), { once: true });
+        worker.onerror = (event) => end(failed, new Error(event.message || "the worker could not be started"));
+        worker.onmessage = async ({ data: { part, file, table, memory, refused, message } }) => {
+            if (part !== undefined) return onProgress?.(part);
+            if (message !== undefined) return end(failed, refused ? new GedcomError(message) : new Error(message));
+            try {
+                end(done, new GedcomFile(await Instance.withMemory(module, memory), file, name, table));
+            } catch (error) {
+                end(failed, error);
+            }
+        };
+        if (signal?.aborted) end(failed, signal.reason);
+        else worker.postMessage({ module, bytes, name, encoding });
+    });
 }

@@ -18,6 +18,7 @@ function decoderOf(label) {
     }
 }
 
+const PAGE = 65536; // bytes
 const GREATEST_ID = 2 ** 31 - 1;
 // Persons in one list that a host answers: an endless iterator ends there.
 const MOST_RELATIVES = 1000000;
@@ -57,9 +58,31 @@ export class Instance {
         const compiled = module instanceof WebAssembly.Module ? module : await WebAssembly.compile(module);
         const { exports } = await WebAssembly.instantiate(compiled, instance.#imports(compiled));
         instance.exports = exports;
+        instance.module = compiled;
         exports._initialize();
         return instance;
     }
+
+    /** Another instance whose memory is that of one at rest, with everything that is open in it. */
+    static async withMemory(module, memory) {
+        const instance = await Instance.of(module);
+        const grown = instance.exports.memory;
+        const missing = memory.length - grown.buffer.byteLength;
+        if (missing > 0) grown.grow(Math.ceil(missing / PAGE));
+        new Uint8Array(grown.buffer).set(memory);
+        return instance;
+    }
+
+    /** A copy of the memory, without what was never used at its end. */
+    memoryCopy() {
+        const words = new Uint32Array(this.exports.memory.buffer);
+        let last = words.length - 1;
+        while (last > 0 && words[last] === 0) --last;
+        return new Uint8Array(this.exports.memory.buffer.slice(0, (last + 1) * 4));
+    }
+
+    /** Called with the part of a file that has been read, from 0 to 1. */
+    onProgress = null;
 
     /** The options that the module has, and the view that they ask for; null before the first ones. */
     #options = null;
@@ -232,6 +255,7 @@ export class Instance {
         const imports = {
             olvane: {
                 ...this.#questions(),
+                reading_progress: (done, all) => this.onProgress?.((done >>> 0) / (all >>> 0)),
                 compose: (pointer, length, result) => {
                     const bytes = new Uint8Array(this.exports.memory.buffer, pointer >>> 0, length >>> 0);
                     const text = utf8.decoder.decode(bytes).normalize("NFC");

@@ -771,6 +771,16 @@ export class Family {
     [Symbol.dispose](): void;
 }
 
+export interface WorkerReadOptions {
+    readonly encoding?: string;
+    /** Called with the part that has been read, from 0 to 1. */
+    readonly onProgress?: (part: number) => void;
+    readonly signal?: AbortSignal;
+}
+
+/** Lets a worker read files for Olvane.readGedcomIn. Called in the worker, with its global scope. */
+export function serveReading(scope: { onmessage: unknown; postMessage: unknown }): void;
+
 export class Olvane {
     readonly texts: Texts;
     /** "MAJOR.MINOR.PATCH". */
@@ -788,6 +798,12 @@ export class Olvane {
      * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.
      */
     readGedcom(bytes: Uint8Array, name?: string, options?: { readonly encoding?: string }): GedcomFile;
+    /**
+     * As readGedcom, in a worker that has called serveReading: the page stays free, is told of progress and may end the
+     * reading. The worker is ended in any case. Rejects with GedcomError for a file that is refused, with the signal's reason
+     * where it was ended, and with Error where the worker cannot run.
+     */
+    readGedcomIn(worker: Worker, bytes: Uint8Array, name?: string, options?: WorkerReadOptions): Promise<GedcomFile>;
 }
 
 /**

@@ -4,7 +4,7 @@
 // What a JavaScript host loads; olvane.d.mts says what everything means.
 
 import { Family } from "./family.mjs";
-import { readGedcom } from "./gedcom.mjs";
+import { readGedcom, readGedcomIn } from "./gedcom.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout, runPicture } from "./layout.mjs";
 import { Texts } from "./texts.mjs";
@@ -12,6 +12,7 @@ import { Texts } from "./texts.mjs";
 export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
 export { Family } from "./family.mjs";
 export { GedcomFile } from "./gedcom.mjs";
+export { serveReading } from "./reading.mjs";
 export { PERSON_NOT_FOUND, Shown } from "./values.mjs";
 
 export class Olvane {
@@ -45,6 +46,10 @@ export class Olvane {
 
     readGedcom(bytes, name = "family.ged", options = {}) {
         return readGedcom(this.#instance, bytes, name, options);
+    }
+
+    readGedcomIn(worker, bytes, name = "family.ged", options = {}) {
+        return readGedcomIn(worker, this.#instance, bytes, name, options);
     }
 
     #run(host, focus, options, wanted) {

@@ -22,6 +22,10 @@
 #include "OpenFile.h"
 #include "SearchJson.h"
 
+// Bytes that have been read, and all of them, while a file is being opened.
+extern "C" __attribute__((import_module("olvane"), import_name("reading_progress"))) void readingProgress(
+    std::size_t done, std::size_t all);
+
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
@@ -154,6 +158,7 @@ OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, co
         js::ensureMemory(length * kMemoryOfByte);
         gedcom::ReadOptions options;
         options.details = true;
+        options.progress = readingProgress;
         options.encoding = encoding;
         return std::make_unique<OpenFile>(gedcom::readGedcomBytes(std::string(bytes, length), name, options))
             .release();

@@ -35,7 +35,7 @@ GedcomData readGedcomBytes(std::string bytes, const std::string& name, const Rea
     DetailReader details(scanner, interner, tables);
     RecordReader records(scanner, interner, tables, *xrefs, diagnostics, options.facts || options.details,
                          options.details ? &details : nullptr);
-    if (!records.readAll()) throw GedcomError(name, "holds nothing that looks like GEDCOM");
+    if (!records.readAll(options.progress)) throw GedcomError(name, "holds nothing that looks like GEDCOM");
     resolveLinks(tables, *xrefs, diagnostics);
 
     tables.text = store;

@@ -21,6 +21,8 @@ struct ReadOptions {
     bool details = false;
     // The encoding of the file, by any name that GedcomEncodings.h knows. Empty: as the file says and its bytes allow.
     std::string encoding = {};
+    // Called every some thousand lines with how many bytes have been read, and of how many. May be null.
+    void (*progress)(std::size_t done, std::size_t all) = nullptr;
 };
 
 // Reads the bytes of a GEDCOM file, 5.5 to 7.0, or of a .gdz archive, in any encoding that is known.

@@ -76,6 +76,7 @@ public:
     std::string_view wholeValue(const GedcomLine& line);
 
     std::uint32_t lineNumber() const { return cutter_.number(); }
+    std::size_t bytesLeft() const { return cutter_.rest().size(); }
     // How much of the text is read, from 0 to 1.
     double share() const { return cutter_.share(); }
 

@@ -191,9 +191,14 @@ void fillFromSlashes(PersonName& name) {
 
 }  // namespace
 
-bool RecordReader::readAll() {
+bool RecordReader::readAll(void (*progress)(std::size_t done, std::size_t all)) {
+    constexpr std::uint32_t kLinesBetween = 1U << 14U;
+    const std::size_t all = scanner_.bytesLeft();
     GedcomLine line;
-    while (scanner_.next(line)) readLine(line);
+    while (scanner_.next(line)) {
+        readLine(line);
+        if (progress != nullptr && line.number % kLinesBetween == 0) progress(all - scanner_.bytesLeft(), all);
+    }
     endRecord();
     if (anyRecord_ && !trailerSeen_) {
         diagnostics_.add(DiagnosticKind::missingTrailer, Severity::warning, scanner_.lineNumber(),

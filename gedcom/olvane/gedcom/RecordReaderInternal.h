@@ -35,7 +35,7 @@ public:
           details_(details) {}
 
     // False if there was no record that GEDCOM knows.
-    bool readAll();
+    bool readAll(void (*progress)(std::size_t done, std::size_t all) = nullptr);
 
 private:
     enum class Record : std::uint8_t { other, person, family };

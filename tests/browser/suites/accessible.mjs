@@ -40,6 +40,38 @@ describe("accessible", kTwoAtOnce, () => {
         });
     }
 
+    const kViews = ["near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship&to=I12", "everybody"];
+    for (const [state, settings] of [
+        ["on a desktop", {}],
+        ["on a phone of 320 px", { viewport: { width: 320, height: 640 }, hasTouch: true, isMobile: true }],
+        ["with forced colours", { forcedColors: "active" }],
+    ]) {
+        test(`axe finds nothing in any chart, and none scrolls sideways: ${state}`, async () => {
+            for (const view of kViews) {
+                const visit = await visitDarwins(`#person=I1&view=${view}`, settings);
+                await expectNoViolation(visit, view);
+                const over = await visit.page.evaluate(() => document.documentElement.scrollWidth - innerWidth);
+                assert.ok(over <= 0, `${view}: ${over} px`);
+                await visit.end();
+            }
+        });
+    }
+
+    test("with text of twice the size nothing is cut off or lies outside the window", async () => {
+        const visit = await visitDarwins("#person=I1", { viewport: { width: 1280, height: 900 } });
+        await visit.page.evaluate(() => (document.documentElement.style.fontSize = "200%"));
+        await visit.still();
+        const outside = await visit.page.evaluate(() =>
+            [...all(".bar button, .bar input, .zoom button, #side-panel h2")]
+                .filter((part) => part.offsetParent !== null)
+                .map((part) => [part.id || part.tagName, part.getBoundingClientRect()])
+                .filter(([, area]) => area.right > innerWidth + 1 || area.left < -1)
+                .map(([name]) => name),
+        );
+        assert.deepEqual(outside, []);
+        await visit.end();
+    });
+
     test("axe finds nothing while panels, lists and dialogs are open", async () => {
         const visit = await visitDarwins();
         const { page } = visit;

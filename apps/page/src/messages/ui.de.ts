@@ -130,6 +130,7 @@ export const uiGerman: UiMessages = {
         ["Umschalt + Pfeile", "das Bild verschieben"],
         ["Escape", "schließen, was offen ist"],
     ],
+    cancel: "Abbrechen",
     close: "Schließen",
     legend: "Legende",
     legendItems: {

@@ -128,6 +128,7 @@ export const uiEnglish: UiMessages = {
         ["Shift + arrows", "move the picture"],
         ["Escape", "close what is open"],
     ],
+    cancel: "Cancel",
     close: "Close",
     legend: "Legend",
     legendItems: {

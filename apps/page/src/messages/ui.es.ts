@@ -133,6 +133,7 @@ export const uiSpanish: UiMessages = {
         ["Mayús + flechas", "mover la imagen"],
         ["Escape", "cerrar lo que esté abierto"],
     ],
+    cancel: "Cancelar",
     close: "Cerrar",
     legend: "Leyenda",
     legendItems: {

@@ -101,6 +101,7 @@ export interface UiMessages {
     readonly pictureFailed: string;
     readonly keys: string;
     readonly keyList: readonly (readonly [string, string])[];
+    readonly cancel: string;
     readonly close: string;
     readonly legend: string;
     readonly legendItems: {

@@ -37,6 +37,7 @@ import { canKeep, keepFile, keptFile, removeKeptFile } from "./KeptFile";
 import { isMapAddress, mapComplaint, MapHost } from "./MapHost";
 import type { Found } from "./searchReasons";
 import { kThemeChoices, Theme, type ThemeChoice } from "./theme";
+import { CancelledError, Reading } from "./Reading";
 import { Welcome } from "./Welcome";
 
 const kNarrow = "(max-width: 720px)"; // as in styles/shell.css
@@ -58,6 +59,7 @@ export class App implements ChromeActions {
     private readonly theme = new Theme(this.tree);
     private readonly notices = new Notices();
     private readonly cover = html("div", { class: "cover", hidden: true });
+    private readonly reading = new Reading();
     private readonly input = fileInput((file) => void this.openDropped([file]));
     // In a frame, steps do not fill the history of the page around it, unless "?history" asks for that.
     private readonly journey = new Journey(
@@ -129,10 +131,10 @@ export class App implements ChromeActions {
     async openDropped([file, ...others]: readonly File[]): Promise<void> {
         if (!file) return;
         this.notices.clear();
-        this.welcome.showReading(file.name);
+        const signal = this.reading.begin(file.name, this.ui);
         await pause();
         try {
-            const opened = await this.files.openFile(file);
+            const opened = await this.files.openFile(file, signal, (part) => this.reading.advance(part));
             // Another file than the kept one is kept only when that is asked for again.
             if (this.tree.family) this.isKept = false;
             this.encoding = "";
@@ -141,7 +143,7 @@ export class App implements ChromeActions {
         } catch (error) {
             this.refuse(file.name, error);
         }
-        this.welcome.showReading(null);
+        this.reading.end();
     }
 
     // isSame: the file that is shown already, read in another way.
@@ -223,6 +225,7 @@ export class App implements ChromeActions {
     }
 
     private refuse(name: string, error: unknown): void {
+        if (error instanceof CancelledError) return;
         const [text, details] = this.files.complaint(name, error, this.ui);
         this.notices.fail(text, details);
     }
@@ -560,7 +563,7 @@ export class App implements ChromeActions {
     private arrange(): void {
         const { chrome, tree } = this;
         const { family } = tree;
-        const always = [this.notices.element, this.cover, this.input, this.output.sheet.element];
+        const always = [this.reading.element, this.notices.element, this.cover, this.input, this.output.sheet.element];
         const isEmpty = !family && !this.maps.isReady;
         this.root.classList.toggle("empty", isEmpty);
         if (isEmpty) {

@@ -3,13 +3,15 @@
 
 // How a family file becomes an open family, and what is said of one that does not.
 
-import type { GedcomFile, Olvane } from "olvane";
+import { GedcomError, type GedcomFile, type Olvane, type WorkerReadOptions } from "olvane";
 import { Archive, ArchiveError, isArchive, TooLargeError } from "../engine/archive";
 import type { EmbeddedFamily } from "../engine/engine";
 import { Photographs } from "../engine/photographs";
 import type { MapSource } from "../engine/mapWorker";
+import { readingWorker } from "../engine/readingWorker";
 import type { UiMessages } from "../messages/ui";
 
+const kLargeFile = 2 ** 20; // bytes; a smaller one is read in less time than a worker takes to start
 const kMostBytes = 128 * 2 ** 20; // of a file
 
 /** A file that was read and has somebody in it. */
@@ -48,14 +50,17 @@ export class FileOpening {
         return this.read(bytes, name, "", photographs, encoding);
     }
 
-    // Throws as complaint() knows.
-    async openFile(file: File): Promise<OpenedFile> {
+    // Throws as complaint() knows, and the signal's reason where the reading was ended.
+    async openFile(file: File, signal: AbortSignal, onProgress: (part: number) => void): Promise<OpenedFile> {
         if (file.size > kMostBytes) throw new TooLargeError();
         const bytes = new Uint8Array(await file.arrayBuffer());
         const archive = isArchive(bytes) ? new Archive(bytes) : null;
         const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
         const photographs = archive ? Photographs.inArchive(archive) : Photographs.none;
-        const opened = this.read(gedcom, file.name, "", photographs);
+        const opened =
+            gedcom.length < kLargeFile
+                ? this.read(gedcom, file.name, "", photographs)
+                : await this.readAside(gedcom, file.name, photographs, { signal, onProgress });
         this.last = { bytes: gedcom, name: file.name, photographs, whole: bytes };
         return opened;
     }
@@ -71,8 +76,26 @@ export class FileOpening {
         return [errors.notGedcom(file), [ui.diagnostics.remark(detail), errors.hint]];
     }
 
+    // In a worker, so that the page goes on; or here, in a browser that starts none.
+    private async readAside(
+        bytes: Uint8Array,
+        name: string,
+        photographs: Photographs,
+        options: WorkerReadOptions,
+    ): Promise<OpenedFile> {
+        try {
+            return this.checked(await this.engine.readGedcomIn(readingWorker(), bytes, name, options), name, "", photographs);
+        } catch (error) {
+            if (error instanceof GedcomError || error instanceof NoPersonsError || options.signal?.aborted) throw error;
+            return this.read(bytes, name, "", photographs);
+        }
+    }
+
     private read(bytes: Uint8Array, name: string, title: string, photographs: Photographs, encoding = ""): OpenedFile {
-        const file = this.engine.readGedcom(bytes, name, { encoding });
+        return this.checked(this.engine.readGedcom(bytes, name, { encoding }), name, title, photographs);
+    }
+
+    private checked(file: GedcomFile, name: string, title: string, photographs: Photographs): OpenedFile {
         if (file.persons.length === 0) {
             file.close();
             throw new NoPersonsError();

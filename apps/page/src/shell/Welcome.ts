@@ -9,10 +9,9 @@ import { icon } from "../base/icons";
 
 export class Welcome {
     readonly element: HTMLElement;
-    private readonly status = html("p", { class: "reading", role: "status" });
 
     constructor(
-        private readonly ui: UiMessages,
+        ui: UiMessages,
         choose: () => void,
         languageChooser: HTMLElement,
     ) {
@@ -31,15 +30,10 @@ export class Welcome {
                 html("p", { class: "drop" }, welcome.drop),
                 button,
                 html("p", { class: "quiet" }, welcome.kinds),
-                this.status,
             ),
             html("p", { class: "privacy" }, icon("lock"), html("span", {}, welcome.privacy)),
             languageChooser,
         );
-    }
-
-    showReading(name: string | null): void {
-        this.status.textContent = name === null ? "" : this.ui.welcome.reading("\u2068" + name + "\u2069");
     }
 }
 

@@ -1,0 +1,39 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// Reads a file into a module's memory: here, or in a worker that hands the memory over. It is all that such a worker needs.
+
+import { GedcomError } from "./errors.mjs";
+import { Instance } from "./instance.mjs";
+
+/** The module's pointer to the open file. Throws GedcomError. */
+export function openFile(instance, bytes, name, encoding) {
+    const { exports } = instance;
+    const file = instance.withText(name, (namePointer) =>
+        instance.withText(encoding, (encodingPointer) =>
+            instance.withBytes(bytes, (pointer, length) =>
+                exports.gedcom_open(pointer, length, namePointer, encodingPointer),
+            ),
+        ),
+    );
+    if (file === 0) throw new GedcomError(instance.text(exports.last_text()));
+    return file;
+}
+
+/** What a worker does for readGedcomIn: reads one file and hands over its memory. */
+export function serveReading(scope) {
+    scope.onmessage = async ({ data: { module, bytes, name, encoding } }) => {
+        try {
+            const instance = await Instance.of(module);
+            instance.onProgress = (part) => scope.postMessage({ part });
+            const file = openFile(instance, bytes, name, encoding);
+            const pointer = instance.exports.gedcom_table(file);
+            if (pointer === 0) throw new GedcomError(instance.text(instance.exports.last_text()));
+            const table = instance.text(pointer);
+            const memory = instance.memoryCopy();
+            scope.postMessage({ file, table, memory }, [memory.buffer]);
+        } catch (error) {
+            scope.postMessage({ refused: error instanceof GedcomError, message: String(error.message) });
+        }
+    };
+}
