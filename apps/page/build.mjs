@@ -89,10 +89,9 @@ function policyOf(script, style) {
         `script-src ${hashOf(script)} 'wasm-unsafe-eval'`,
         `style-src ${hashOf(style)}`,
         "img-src data: blob:",
+        // Large files are read in a worker, and maps are laid out in one.
         "worker-src blob:",
         "connect-src 'none'",
-        // Large files are read in one.
-        "worker-src blob:",
         "base-uri 'none'",
         "form-action 'none'",
     ].join("; ");

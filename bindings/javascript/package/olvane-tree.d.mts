@@ -25,6 +25,8 @@ export interface ViewState {
     readonly to: number;
     /** Whether parents who are not known have boxes, in the family view and the pedigree. */
     readonly unknownParents: boolean;
+    /** Whether boxes show photographs. */
+    readonly photos: boolean;
     /** Groups of relatives that the family view leaves out. */
     readonly hidden: ReadonlySet<string>;
 }
@@ -65,6 +67,15 @@ export declare class OlvaneTree extends HTMLElement {
     load(address: string): Promise<void>;
     /** Shows the bytes of a GEDCOM file. Rejects where they are none. */
     open(bytes: Uint8Array, name?: string): Promise<void>;
+    /**
+     * Shows what has changed in the family that is shown: the bytes of its GEDCOM file as they are now. Focus, selection and
+     * place stay with the persons of the same xrefs. Rejects where the bytes are no GEDCOM, and then shows what it showed before.
+     */
+    update(bytes: Uint8Array): Promise<void>;
+    /** Draws the inside of boxes, from the upper left corner of each; null for the usual. */
+    renderBox: ((person: Person, box: { width: number; height: number }) => SVGElement | null) | null;
+    /** Which part of the picture is in sight: the zoom, and the middle of the window in points from that of the focus. */
+    sight: { zoom: number; x: number; y: number } | null;
     /** Shows a person, a view or options; what is left out stays as it is. False where that was not possible. */
     show(wanted: Partial<ViewState>): boolean;
     /** Selects a person without changing the picture. */

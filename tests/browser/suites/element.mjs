@@ -84,6 +84,53 @@ describe("element", () => {
         await end();
     });
 
+    test("what changes in the family is shown while focus, selection and place stay", async () => {
+        const { page, end } = await open("/one.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const seen = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            tree.show({ focus: 12 });
+            tree.select(1);
+            tree.zoomBy(0.7);
+            await new Promise((next) => setTimeout(next, 400));
+            const look = () => [tree.state.focus, tree.selected.xref, ...Object.values(tree.sight).map((value) => Math.round(value * 100))];
+            const before = look();
+            const text = await (await fetch("family.ged")).text();
+            const changed = text.replace(/1 NAME Charles Robert .Darwin./, "1 NAME Charles Renamed /Darwin/");
+            await tree.update(new TextEncoder().encode(changed));
+            const refused = await tree.update(new TextEncoder().encode("no family")).catch((error) => error.name);
+            return { before, after: look(), name: tree.selected.name, isChanged: changed !== text, refused };
+        });
+        assert.equal(seen.isChanged, true);
+        assert.deepEqual(seen.after, seen.before);
+        assert.equal(seen.name, "Charles Renamed Darwin");
+        assert.match(seen.refused, /Error/);
+        await end();
+    });
+
+    test("a program draws boxes itself, and what is read out of them stays", async () => {
+        const { page, end } = await open("/one.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const seen = await page.evaluate(() => {
+            const tree = document.querySelector("olvane-tree");
+            tree.renderBox = (person, { width, height }) => {
+                if (person.sex !== "female") return null;
+                const text = document.createElementNS("http://www.w3.org/2000/svg", "text");
+                text.textContent = `${person.xref} ${width}x${height}`;
+                return text;
+            };
+            const box = (xref) => tree.shadowRoot.querySelector(`[data-xref="${xref}"]`);
+            const [his, hers] = [box("I1"), tree.shadowRoot.querySelector(".box.female")];
+            return {
+                hers: hers.querySelector("text").textContent === `${hers.dataset.xref} 118x104`,
+                label: hers.querySelector(".frame").getAttribute("aria-label").length > 5,
+                his: his.querySelectorAll(".name").length > 0,
+            };
+        });
+        assert.deepEqual(seen, { hers: true, label: true, his: true });
+        await end();
+    });
+
     test("a file that cannot be had leaves the element empty and says why to whoever asks", async () => {
         files.set("/none.html", '<!doctype html><olvane-tree></olvane-tree><script type="module" src="olvane-tree.mjs"></script>');
         const { page, end } = await open("/none.html");

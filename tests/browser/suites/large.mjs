@@ -6,20 +6,9 @@
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
 import { fileFor, photograph, visitEmpty } from "../support/browser.mjs";
+import { lineOf } from "../support/families.mjs";
 
-/** A line of so many generations, each a man with a long note. */
-function longLine(generations) {
-    const lines = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
-    for (let i = 1; i <= generations; ++i) {
-        lines.push(`0 @I${i}@ INDI`, `1 NAME Given${i} /Line/`, "1 SEX M", "1 BIRT", `2 DATE ${1000 + (i % 900)}`, "2 PLAC Some town, Some land");
-        if (i > 1) lines.push(`1 FAMC @F${i - 1}@`);
-        lines.push(`1 FAMS @F${i}@`, `0 @F${i}@ FAM`, `1 HUSB @I${i}@`);
-        if (i < generations) lines.push(`1 CHIL @I${i + 1}@`);
-    }
-    return [...lines, "0 TRLR"].join("\n");
-}
-
-const kFile = fileFor("long.ged", longLine(60_000));
+const kFile = fileFor("long.ged", lineOf(60_000));
 
 describe("large", () => {
     test("a large file is read in a worker: progress is shown and the page goes on", async () => {

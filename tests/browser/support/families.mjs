@@ -167,3 +167,15 @@ export function detailedFamily() {
         "0 @M1@ OBJE", "1 FILE ../outside.jpg", "2 FORM jpeg", "2 TITL Von anderswo",
     );
 }
+
+/** A line of so many generations. */
+export function lineOf(generations) {
+    const lines = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
+    for (let i = 1; i <= generations; ++i) {
+        lines.push(`0 @I${i}@ INDI`, `1 NAME Given${i} /Line/`, "1 SEX M", "1 BIRT", `2 DATE ${1000 + (i % 900)}`, "2 PLAC Some town, Some land");
+        if (i > 1) lines.push(`1 FAMC @F${i - 1}@`);
+        lines.push(`1 FAMS @F${i}@`, `0 @F${i}@ FAM`, `1 HUSB @I${i}@`);
+        if (i < generations) lines.push(`1 CHIL @I${i + 1}@`);
+    }
+    return [...lines, "0 TRLR"].join("\n");
+}

@@ -35,6 +35,9 @@ const kWarmEnough = 12; // ms; what takes less needs no warming
 const kRedrawDelay = 60; // ms
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
 
+/** What stands in the box of a person, which has this width and height in points; null for the usual. */
+export type BoxRenderer = (person: Person, box: { width: number; height: number }) => SVGElement | null;
+
 export interface OlvaneTreeEvents {
     /** Another person is selected: the panel is about them. */
     select: CustomEvent<{ person: Person }>;
@@ -73,6 +76,7 @@ export class OlvaneTree extends HTMLElement {
     private contents: PictureContents | null = null;
     private shownPerson = 0; // in the panel
     private kinshipTimer = 0;
+    private boxRenderer: BoxRenderer | null = null;
     private redrawTimer = 0;
     private isInUse = false; // by a pointer that was pressed in the picture and has not left it
 
@@ -168,6 +172,41 @@ export class OlvaneTree extends HTMLElement {
         this.setFamily(new OpenFamily(file, title, livingHidden));
         this.show(this.attributeState());
         this.warmUp();
+    }
+
+    /**
+     * Shows what has changed in the family that is shown: the bytes of its GEDCOM file as they are now. Focus, selection and
+     * place stay with the persons of the same xrefs. Rejects with GedcomError, and then shows what it showed before.
+     */
+    async update(bytes: Uint8Array): Promise<void> {
+        const { opened, shownState, sight } = this;
+        if (!opened || !shownState || !OlvaneTree.engine) return this.open(bytes);
+        const engine = await OlvaneTree.engine();
+        const family = new OpenFamily(engine.readGedcom(bytes, opened.file.name), opened.title, opened.livingHidden);
+        const address = addressOf(shownState, opened.persons);
+        const selected = this.selected?.xref ?? "";
+        const state = readAddress(address, family.persons, { ...kUsualState, focus: family.bestFocus() });
+        const keys = holdsKeys(this.shadow);
+        this.setFamily(family);
+        this.show(state);
+        const again = family.persons.find(({ xref }) => xref !== "" && xref === selected)?.id ?? state.focus;
+        const box = this.picture?.boxesOf(again)[0];
+        if (box) this.scene.activate(box, keys);
+        else this.showInPanel(again);
+        this.sight = sight;
+    }
+
+    /**
+     * Draws the inside of boxes: an SVG element with its origin in the box's upper left corner, or null for the usual. What is
+     * read out of a box, its frame and its marks stay.
+     */
+    get renderBox(): BoxRenderer | null {
+        return this.boxRenderer;
+    }
+
+    set renderBox(render: BoxRenderer | null) {
+        this.boxRenderer = render;
+        this.restyle();
     }
 
     /** Takes a family without showing it yet: show() follows. */
@@ -487,6 +526,7 @@ export class OlvaneTree extends HTMLElement {
             messages: this.messages,
             ui: this.ui,
             kinshipInBoxes: this.getAttribute("kinship") !== "none",
+            render: this.boxRenderer,
             portraitOf: this.shownState?.photos ? (person) => family.portraitOf(person, () => this.redrawSoon()) : null,
         });
     }
@@ -555,6 +595,10 @@ export class OlvaneTree extends HTMLElement {
     ): boolean {
         return !this.dispatchEvent(new CustomEvent(name, { detail, cancelable: true }));
     }
+}
+
+function holdsKeys(shadow: ShadowRoot): boolean {
+    return shadow.activeElement?.closest("#tree") != null;
 }
 
 function middleOf({ x, y, width, height }: Box): { x: number; y: number } {

@@ -19,6 +19,7 @@ export interface Wording {
     readonly ui: UiMessages;
     readonly kinshipInBoxes: boolean;
     /** The address of somebody's photograph, null where there is none; null where boxes show none. */
+    readonly render: ((person: Person, box: Box) => SVGElement | null) | null;
     readonly portraitOf: ((person: number) => string | null) | null;
 }
 
@@ -97,6 +98,7 @@ export class PictureContents implements BoxContents {
             name: nameParts(person, messages),
             texts: this.texts,
             rightToLeft: directionOf(person.name) === "rtl",
+            inside: this.wording.render?.(person, box) ?? null,
             photo: this.wording.portraitOf?.(person.id) ?? null,
             years: shortYears(person),
             kinship: this.wording.kinshipInBoxes
@@ -126,6 +128,7 @@ export class PictureContents implements BoxContents {
             name: { given: what, surname: "" },
             texts: this.texts,
             rightToLeft: false,
+            inside: null,
             photo: null,
             years: "",
             kinship: null,

@@ -28,6 +28,8 @@ export interface BoxLook {
     readonly rightToLeft: boolean;
     // The address of a photograph; null for a silhouette.
     readonly photo: string | null;
+    // What a program draws in place of everything within the frame.
+    readonly inside: SVGElement | null;
     readonly years: string;
     // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
     readonly kinship: string | null;
@@ -77,7 +79,10 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
         return box;
     }
     appendFrame(box, look, sizes);
-    if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
+    if (look.inside) {
+        look.inside.setAttribute("aria-hidden", "true");
+        box.append(look.inside);
+    } else if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
     if (look.hidden >= 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);

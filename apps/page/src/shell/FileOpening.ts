@@ -25,7 +25,13 @@ export interface OpenedFile {
 export class FileOpening {
     constructor(private readonly engine: Olvane) {}
 
-    private last: { readonly bytes: Uint8Array; readonly name: string; readonly photographs: Photographs; readonly whole: Uint8Array<ArrayBuffer> } | null = null;
+    // The file as it was opened, and the GEDCOM text in it.
+    private last: {
+        readonly bytes: Uint8Array;
+        readonly name: string;
+        readonly photographs: Photographs;
+        readonly whole: Uint8Array<ArrayBuffer>;
+    } | null = null;
 
     /** What was read last. */
     source: MapSource | null = null;
@@ -84,7 +90,10 @@ export class FileOpening {
         options: WorkerReadOptions,
     ): Promise<OpenedFile> {
         try {
-            return this.checked(await this.engine.readGedcomIn(readingWorker(), bytes, name, options), name, "", photographs);
+            const file = await this.engine.readGedcomIn(readingWorker(), bytes, name, options);
+            const opened = this.checked(file, name, "", photographs);
+            this.source = { bytes, name, encoding: "" };
+            return opened;
         } catch (error) {
             if (error instanceof GedcomError || error instanceof NoPersonsError || options.signal?.aborted) throw error;
             return this.read(bytes, name, "", photographs);
@@ -92,7 +101,9 @@ export class FileOpening {
     }
 
     private read(bytes: Uint8Array, name: string, title: string, photographs: Photographs, encoding = ""): OpenedFile {
-        return this.checked(this.engine.readGedcom(bytes, name, { encoding }), name, title, photographs);
+        const opened = this.checked(this.engine.readGedcom(bytes, name, { encoding }), name, title, photographs);
+        this.source = { bytes, name, encoding };
+        return opened;
     }
 
     private checked(file: GedcomFile, name: string, title: string, photographs: Photographs): OpenedFile {
@@ -100,7 +111,6 @@ export class FileOpening {
             file.close();
             throw new NoPersonsError();
         }
-        this.source = { bytes, name, encoding };
         return { file, name, photographs, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
     }
 }
