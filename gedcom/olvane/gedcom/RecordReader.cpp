@@ -197,7 +197,8 @@ bool RecordReader::readAll(void (*progress)(std::size_t done, std::size_t all)) 
     GedcomLine line;
     while (scanner_.next(line)) {
         readLine(line);
-        if (progress != nullptr && line.number % kLinesBetween == 0) progress(all - scanner_.bytesLeft(), all);
+        if (progress != nullptr && line.number % kLinesBetween == 0)
+            progress(all - scanner_.bytesLeft(), all);
     }
     endRecord();
     if (anyRecord_ && !trailerSeen_) {

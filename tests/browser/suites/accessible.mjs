@@ -41,13 +41,13 @@ describe("accessible", kTwoAtOnce, () => {
     }
 
     const kViews = ["near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship&to=I12", "everybody"];
-    for (const [state, settings] of [
-        ["on a desktop", {}],
-        ["on a phone of 320 px", { viewport: { width: 320, height: 640 }, hasTouch: true, isMobile: true }],
-        ["with forced colours", { forcedColors: "active" }],
+    for (const [state, settings, views] of [
+        ["on a desktop", {}, kViews],
+        ["on a phone of 320 px", { viewport: { width: 320, height: 640 }, hasTouch: true, isMobile: true }, ["fan", "kinship&to=I12", "everybody"]],
+        ["with forced colours", { forcedColors: "active" }, ["descendants", "fan"]],
     ]) {
-        test(`axe finds nothing in any chart, and none scrolls sideways: ${state}`, async () => {
-            for (const view of kViews) {
+        test(`axe finds nothing in charts, and none scrolls sideways: ${state}`, async () => {
+            for (const view of views) {
                 const visit = await visitDarwins(`#person=I1&view=${view}`, settings);
                 await expectNoViolation(visit, view);
                 const over = await visit.page.evaluate(() => document.documentElement.scrollWidth - innerWidth);

@@ -19,7 +19,7 @@ export interface CornerActions {
 export class Corner {
     readonly element: HTMLElement;
     private readonly legend: HTMLDetailsElement;
-    private readonly ways = html("ul", { class: "ways", hidden: true });
+    private readonly ways = html("ul", { class: "ways", tabindex: 0, hidden: true });
 
     constructor(ui: UiMessages, overview: HTMLElement, actions: CornerActions) {
         this.legend = legendOf(ui);
