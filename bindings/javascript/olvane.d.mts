@@ -799,7 +799,7 @@ export class Olvane {
      */
     readGedcom(bytes: Uint8Array, name?: string, options?: { readonly encoding?: string }): GedcomFile;
     /**
-     * As readGedcom, in a worker that has called serveReading: the page stays free, is told of progress and may end the
+     * As readGedcom, in a worker that has called serveReading: the page stays free, hears of progress and may end the
      * reading. The worker is ended in any case. Rejects with GedcomError for a file that is refused, with the signal's reason
      * where it was ended, and with Error where the worker cannot run.
      */

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Five tasks as a screen reader tells them. The texts stand in golden/ to be read by people: each should make sense to
+// Five tasks as a screen reader speaks them. The texts stand in golden/ to be read by people: each should make sense to
 // somebody who has never seen the picture. Run with OLVANE_RECORD=1 to write them anew, read them, and commit them.
 
 import assert from "node:assert/strict";
