@@ -21,6 +21,7 @@ import make_families
 import on_dask
 
 DIFFERENT = 20
+JOBS_PER_TASK = 20
 
 
 def prepared(folder: pathlib.Path, files: int, persons: int) -> str:
@@ -42,7 +43,7 @@ def measured(client: Client, work: pathlib.Path, name: str, families: str, jobs:
     shutil.rmtree(out, ignore_errors=True)
     out.mkdir()
     start = time.perf_counter()
-    count = on_dask.run_all(client, families, jobs, str(out), False)
+    count = on_dask.run_all(client, families, jobs, str(out), False, JOBS_PER_TASK)
     seconds = time.perf_counter() - start
     written = sum(path.stat().st_size for path in out.iterdir()) / 1e6
     memory = max(client.run(peak_memory).values())
