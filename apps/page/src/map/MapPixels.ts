@@ -30,7 +30,7 @@ export interface PixelColours {
     readonly kin: number;
 }
 
-const kBlocks = [8, 64]; // lines of which the longest stands for all
+const kBlocks = [8, 64, 512]; // lines of which the longest stands for all
 const kMostLines = 12000; // drawn in a frame
 const kFar = 3; // px of a box below which colours are those of surnames
 const kEdged = 8; // px of a box from which on it has an edge
@@ -83,7 +83,8 @@ export class MapPixels {
             total += to - from + lastBar - lowerBound(arrays.bars.low, left, barStart[band]!, lastBar);
             seen.push({ band, first: from, end: to, from: barStart[band]!, to: lastBar });
         }
-        const level = total <= kMostLines ? -1 : total <= kMostLines * kBlocks[0]! ? 0 : 1;
+        const fitting = kBlocks.findIndex((size) => total <= kMostLines * size);
+        const level = total <= kMostLines ? -1 : fitting < 0 ? kBlocks.length - 1 : fitting;
         const boxPx = arrays.boxWidth * frame.sx;
         const paint = mixed(colours.page, colours.line, Math.min(1, Math.max(0.3, boxPx / (24 * frame.dpr))));
         const thick = boxPx > 60 * frame.dpr ? Math.max(1, Math.round(1.4 * frame.dpr)) : 1;
@@ -107,9 +108,8 @@ export class MapPixels {
         const size = kBlocks[level]!;
         const longest = this.longest[kind][level]!;
         for (let block = Math.ceil(begin / size); block * size < end; ++block) {
-            if (isBar && this.furthest[(block * size) >> 6]! < left) continue;
             const i = longest[block]!;
-            if (i >= begin && i < end) draw(i);
+            if (i >= begin && i < end && (!isBar || high[i]! >= left)) draw(i);
         }
     }
 
