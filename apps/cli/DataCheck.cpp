@@ -13,6 +13,8 @@
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomLives.h>
 
+#include <cli/FocusChoice.h>
+
 namespace olvane::cli {
 
 namespace {
@@ -39,8 +41,7 @@ class DataChecker {
 public:
     explicit DataChecker(const GedcomData& data) : data_(data) {
         names_.person = [&data](kin::Place place) {
-            return tagOf(data.person(idOf(place)).xref) + " " +
-                   gedcom::displayName(data.firstName(idOf(place)));
+            return tagOf(data.person(idOf(place)).xref) + " " + readableName(data, idOf(place));
         };
         names_.family = [&data](std::uint32_t family) { return tagOf(data.family(family).xref); };
     }

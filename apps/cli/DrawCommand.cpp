@@ -157,6 +157,7 @@ int runDraw(const DrawOptions& options) {
     const gedcom::GedcomData data =
         options.shown.needFacts() ? readFileWithFacts(options.input) : readFile(options.input);
     const Drawn drawn = options.paper.onPaper() ? drawOnSheets(data, options) : drawWhole(data, options);
+    if (form != Form::svg) requireFonts(drawn.sheets);
     if (form == Form::pdf) {
         const double scale = options.paper.onPaper() || options.paper.scale <= 0 ? 1 : options.paper.scale;
         writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, sourceDate()), rules);

@@ -9,6 +9,8 @@
 #include <sstream>
 #include <vector>
 
+#include <olvane/picture/TextMetrics.h>
+
 #include <cli/UsageError.h>
 #include <olvane/source/PersonFinder.h>
 
@@ -86,11 +88,15 @@ gedcom::PersonId chooseFocus(const gedcom::GedcomData& data, const std::string& 
     return found.front();
 }
 
+std::string readableName(const gedcom::GedcomData& data, gedcom::PersonId id) {
+    // A little more than is shown, so that what is cut ends in an ellipsis.
+    return picture::cutText(gedcom::displayName(data.firstName(id), 2 * picture::kMostTextBytes));
+}
+
 std::string personLine(const gedcom::GedcomData& data, gedcom::PersonId id) {
     const gedcom::Person& person = data.person(id);
     const std::string xref = person.xref.empty() ? "-" : "@" + std::string(person.xref) + "@";
-    return std::to_string(id) + "\t" + xref + "\t" + gedcom::displayName(data.firstName(id)) + "\t" +
-           years(person);
+    return std::to_string(id) + "\t" + xref + "\t" + readableName(data, id) + "\t" + years(person);
 }
 
 }  // namespace olvane::cli

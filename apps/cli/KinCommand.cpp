@@ -20,7 +20,7 @@ namespace olvane::cli {
 namespace {
 
 std::string nameOf(const gedcom::GedcomData& data, std::int64_t id) {
-    const std::string name = gedcom::displayName(data.firstName(static_cast<gedcom::PersonId>(id)));
+    const std::string name = readableName(data, static_cast<gedcom::PersonId>(id));
     return name.empty() ? "#" + std::to_string(id) : name;
 }
 

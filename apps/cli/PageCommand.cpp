@@ -87,7 +87,7 @@ std::string titleOf(const gedcom::GedcomData& data, gedcom::PersonId focus, cons
                     const std::vector<bool>& hidden) {
     std::string fileTitle = withoutEnding(family.name);
     if (focus == 0 || (!hidden.empty() && hidden[focus - 1])) return fileTitle;
-    const std::string name = gedcom::displayName(data.firstName(focus));
+    const std::string name = readableName(data, focus);
     return name.empty() ? fileTitle : name;
 }
 

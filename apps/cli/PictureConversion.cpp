@@ -13,6 +13,7 @@
 #include <stdexcept>
 #include <utility>
 
+#include <cli/FontCoverage.h>
 #include <cli/PdfUserUnit.h>
 #include <cli/RenderLibraries.h>
 
@@ -97,6 +98,28 @@ int pixels(double length) {
 }
 
 }  // namespace
+
+void requireFonts(const std::vector<draw::SvgPicture>& pictures) {
+    const RenderLibraries& lib = renderLibraries();
+    const auto pattern = owned(lib.FcPatternCreate(), lib.FcPatternDestroy);
+    lib.FcConfigSubstitute(nullptr, pattern.get(), FcMatchPattern);
+    lib.FcDefaultSubstitute(pattern.get());
+    FcCharSet* characters = nullptr;
+    FcResult result = FcResultMatch;
+    // All fonts together, since a renderer goes on to the next one for what a font lacks.
+    const auto fonts =
+        owned(lib.FcFontSort(nullptr, pattern.get(), FcTrue, &characters, &result), lib.FcFontSetDestroy);
+    const auto shown = owned(characters, lib.FcCharSetDestroy);
+    const auto hasFont = [&](std::uint32_t c) {
+        return shown != nullptr && lib.FcCharSetHasChar(shown.get(), c) != FcFalse;
+    };
+    for (const draw::SvgPicture& picture : pictures) {
+        const std::string missing = missingFontsText(missingScripts(picture.svg, hasFont));
+        if (missing.empty()) continue;
+        throw std::runtime_error(
+            missing + "; install it, or write an .svg, which is shown with the fonts of its reader");
+    }
+}
 
 double pngScale(const draw::SvgPicture& picture, double wanted) {
     return std::min(wanted, kLongestPng / longestSide(picture));

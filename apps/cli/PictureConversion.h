@@ -17,6 +17,10 @@ namespace olvane::cli {
 //
 // Fails: throws UsageError where the libraries are not installed, std::runtime_error where they fail.
 
+// Refuses pictures with letters that no font of this machine shows, which would come out as empty boxes.
+// Fails: throws std::runtime_error that names the scripts and packages of Debian that have fonts for them.
+void requireFonts(const std::vector<draw::SvgPicture>& pictures);
+
 // The pixels that a PNG has for each px: as many as wanted, or fewer where a side would be too long.
 double pngScale(const draw::SvgPicture& picture, double wanted);
 

@@ -17,6 +17,10 @@ namespace {
 
 }  // namespace
 
+void requireFonts(const std::vector<draw::SvgPicture>&) {
+    refuse();
+}
+
 double pngScale(const draw::SvgPicture&, double wanted) {
     return wanted;
 }

@@ -18,6 +18,7 @@ SharedLibrary opened(const char* name) {
 RenderLibraries openLibraries() {
     const SharedLibrary rsvg = opened("librsvg-2.so.2");
     const SharedLibrary cairo = opened("libcairo.so.2");
+    const SharedLibrary fontconfig = opened("libfontconfig.so.1");
     const SharedLibrary gobject = opened("libgobject-2.0.so.0");
     const SharedLibrary glib = opened("libglib-2.0.so.0");
     RenderLibraries all;
@@ -39,6 +40,14 @@ RenderLibraries openLibraries() {
     OLVANE_LOAD(cairo, cairo_pdf_surface_create_for_stream);
     OLVANE_LOAD(cairo, cairo_pdf_surface_set_size);
     OLVANE_LOAD(cairo, cairo_pdf_surface_set_metadata);
+    OLVANE_LOAD(fontconfig, FcPatternCreate);
+    OLVANE_LOAD(fontconfig, FcPatternDestroy);
+    OLVANE_LOAD(fontconfig, FcConfigSubstitute);
+    OLVANE_LOAD(fontconfig, FcDefaultSubstitute);
+    OLVANE_LOAD(fontconfig, FcFontSort);
+    OLVANE_LOAD(fontconfig, FcFontSetDestroy);
+    OLVANE_LOAD(fontconfig, FcCharSetHasChar);
+    OLVANE_LOAD(fontconfig, FcCharSetDestroy);
     OLVANE_LOAD(gobject, g_object_unref);
     OLVANE_LOAD(glib, g_error_free);
 #undef OLVANE_LOAD

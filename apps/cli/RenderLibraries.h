@@ -5,6 +5,7 @@
 
 #include <cairo-pdf.h>
 #include <cairo.h>
+#include <fontconfig/fontconfig.h>
 #include <librsvg/rsvg.h>
 
 namespace olvane::cli {
@@ -29,6 +30,14 @@ struct RenderLibraries {
     decltype(&::cairo_pdf_surface_create_for_stream) cairo_pdf_surface_create_for_stream;
     decltype(&::cairo_pdf_surface_set_size) cairo_pdf_surface_set_size;
     decltype(&::cairo_pdf_surface_set_metadata) cairo_pdf_surface_set_metadata;
+    decltype(&::FcPatternCreate) FcPatternCreate;
+    decltype(&::FcPatternDestroy) FcPatternDestroy;
+    decltype(&::FcConfigSubstitute) FcConfigSubstitute;
+    decltype(&::FcDefaultSubstitute) FcDefaultSubstitute;
+    decltype(&::FcFontSort) FcFontSort;
+    decltype(&::FcFontSetDestroy) FcFontSetDestroy;
+    decltype(&::FcCharSetHasChar) FcCharSetHasChar;
+    decltype(&::FcCharSetDestroy) FcCharSetDestroy;
     decltype(&::g_object_unref) g_object_unref;
     decltype(&::g_error_free) g_error_free;
 };

@@ -16,6 +16,9 @@ namespace {
 using kin::FoundIn;
 using kin::SearchTexts;
 
+// A search looks no further into a text: a name in a file may be of any length.
+constexpr std::size_t kMostSearchedBytes = 100000;
+
 void visitDate(const GedcomDate& date, FoundIn in, std::string_view label,
                const SearchTexts::Visitor& visitor) {
     if (!date.isGiven()) return;
@@ -39,8 +42,13 @@ void visitFacts(std::span<const Fact> facts, const SearchTexts::Visitor& visitor
 
 }  // namespace
 
-void GedcomSearchTexts::visit(std::size_t place, const Visitor& visitor) const {
+void GedcomSearchTexts::visit(std::size_t place, const Visitor& wholeVisitor) const {
     const auto id = static_cast<PersonId>(place + 1);
+    const Visitor visitor = [&wholeVisitor](const kin::SearchText& text) {
+        kin::SearchText beginning = text;
+        beginning.text = text.text.substr(0, kMostSearchedBytes);
+        wholeVisitor(beginning);
+    };
     const Person& person = data_.person(id);
     visitor({FoundIn::identifier, person.xref, {}, false, {}});
     visitNames(id, visitor);
@@ -60,9 +68,10 @@ void GedcomSearchTexts::visitNames(PersonId id, const Visitor& visitor) const {
         };
         if (kin::foldedForSearch(name.type) == "married") {
             visitPart(FoundIn::name, name.given);
-            visitPart(FoundIn::marriedName, name.surname.empty() ? displayName(name) : name.surname);
+            visitPart(FoundIn::marriedName,
+                      name.surname.empty() ? displayName(name, kMostSearchedBytes) : name.surname);
         } else {
-            visitor({FoundIn::name, displayName(name), {}, false, {}});
+            visitor({FoundIn::name, displayName(name, kMostSearchedBytes), {}, false, {}});
             visitPart(FoundIn::name, name.given);
             visitPart(FoundIn::name, name.surname);
         }
