@@ -17,7 +17,8 @@ int main(int argc, char** argv) {
     }
     options.view = "hourglass";
     status = olvane_draw_file(argv[1], argv[2], &options, &svg);
-    fprintf(status == OLVANE_OK ? stdout : stderr, "%s\n", olvane_result_text(svg, NULL));
+    if (status == OLVANE_OK) fputs(olvane_result_text(svg, NULL), stdout);
+    if (status != OLVANE_OK) fprintf(stderr, "%s\n", olvane_result_text(svg, NULL));
     olvane_result_free(svg);
     return status == OLVANE_OK ? 0 : 1;
 }

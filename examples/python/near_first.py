@@ -48,4 +48,4 @@ def near_first(ask: Callable[[list[int]], Iterable[Row]], focus: int, rounds: in
         rows = list(ask(sorted(ring)))
         people.update((row.id, row) for row in rows)
         yield table_of(people)
-        ring = set().union(*(row.relatives() for row in rows)) - asked
+        ring = {person for row in rows for person in row.relatives()} - asked
