@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 #include <olvane/charts/EverybodyReachInternal.h>
 
@@ -453,6 +454,21 @@ bool isForest(const Rows& rows) {
                        [](const Rows::Strand& strand) { return strand.aboveCount == 1; });
 }
 
+// Every row in any order, the same for the same number.
+void shuffle(RowOrder& order, std::uint32_t number) {
+    std::uint64_t random = number;
+    for (auto& nodes : order.nodes) {
+        for (std::size_t i = nodes.size(); i > 1; --i) {
+            random = random * 6364136223846793005U + 1442695040888963407U;
+            std::swap(nodes[i - 1], nodes[(random >> 33U) % i]);
+        }
+    }
+}
+
+// So few nodes are sifted so fast that they can also start from any order.
+constexpr std::int32_t kMostNodesToShuffle = 100;
+constexpr std::uint32_t kShuffles = 16;
+
 RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
     // After a few rounds of straightening, parts of the picture are straight; after many, all of it is.
     constexpr std::array<int, 4> kShares = {1, 0, 30, 6};
@@ -469,6 +485,16 @@ RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
         reduceCrossings(rows, order, effort / starts);
         const std::int64_t crossings = starts > 1 ? countCrossings(rows, order) : 0;
         if (fewest >= 0 && crossings >= fewest) continue;
+        fewest = crossings;
+        best = std::move(order);
+    }
+    const bool shuffles = starts > 1 && rows.nodeCount() <= kMostNodesToShuffle;
+    for (std::uint32_t number = 1; shuffles && number <= kShuffles && fewest > 0; ++number) {
+        RowOrder order = walk;
+        shuffle(order, number);
+        reduceCrossings(rows, order, effort / starts);
+        const std::int64_t crossings = countCrossings(rows, order);
+        if (crossings >= fewest) continue;
         fewest = crossings;
         best = std::move(order);
     }
