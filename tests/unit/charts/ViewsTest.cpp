@@ -103,6 +103,86 @@ private:
     int left_;
 };
 
+// Answers that contradict one another, the same each time: parents who are no parents, spouses of oneself, repeats, and
+// now and then a number that is no id.
+class HostileHost final : public OlvaneViewerManagerWrapProtocol {
+public:
+    HostileHost(std::uint32_t seed, bool withWrongIds) : seed_(seed), withWrongIds_(withWrongIds) {}
+
+    std::int64_t fatherForPersonWithID(std::int64_t id) override { return parent(id, 1); }
+    std::int64_t motherForPersonWithID(std::int64_t id) override { return parent(id, 2); }
+    std::vector<std::int64_t> spousesForPersonWithID(std::int64_t id) override { return list(id, 3, 3); }
+    std::vector<std::int64_t> childrenForPersonWithID(std::int64_t id) override { return list(id, 4, 4); }
+    bool isPreferredSpouse(std::int64_t id, std::int64_t spouse) override {
+        return number(id + spouse, 5) % 2 == 0;
+    }
+    bool isPersonDead(std::int64_t id) override { return number(id, 6) % 2 == 0; }
+    std::string dateForPersonWithID(std::int64_t id, bool) override {
+        return std::string(number(id, 7) % 3, 'x');
+    }
+    std::int32_t sexOfPersonWithID(std::int64_t id) override {
+        return static_cast<std::int32_t>(number(id, 8) % 5) - 1;
+    }
+
+private:
+    static constexpr std::uint32_t kPersons = 12;
+
+    std::uint32_t number(std::int64_t id, std::uint32_t question) const {
+        std::uint32_t value =
+            seed_ * 2654435761u + static_cast<std::uint32_t>(id) * 40503u + question * 69069u;
+        for (int turn = 0; turn < 3; ++turn) value = (value ^ (value >> 15)) * 2246822519u;
+        return value >> 8;
+    }
+    std::int64_t idOf(std::uint32_t value) const {
+        if (withWrongIds_ && value % 97 == 0) return value % 2 == 0 ? 0 : -7;
+        return 1 + value % kPersons;
+    }
+    std::int64_t parent(std::int64_t id, std::uint32_t question) const {
+        const std::uint32_t value = number(id, question);
+        return value % 3 == 0 ? kPersonNotFound : idOf(value);
+    }
+    std::vector<std::int64_t> list(std::int64_t id, std::uint32_t question, std::uint32_t most) const {
+        std::vector<std::int64_t> ids(number(id, question) % (most + 1));
+        for (std::size_t i = 0; i < ids.size(); ++i) {
+            ids[i] = idOf(number(id, question + 16 * static_cast<std::uint32_t>(i + 1)));
+        }
+        return ids;
+    }
+
+    std::uint32_t seed_;
+    bool withWrongIds_;
+};
+
+// Either a picture, the same each time, or an exception that says what is wrong.
+std::string outcomeOf(std::uint32_t seed, bool withWrongIds, View view) {
+    ViewRequest request = requestFor(view);
+    request.chart.direction = static_cast<Direction>(seed % 4);
+    request.chart.compact = seed % 3 == 0;
+    request.chart.siblings = seed % 2 == 0;
+    try {
+        const auto host = std::make_shared<HostileHost>(seed, withWrongIds);
+        return picture::pictureJson(pictureOfHost(host, 1 + seed % 12, request, 1 + (seed / 12) % 12));
+    } catch (const std::exception& error) {
+        return std::string("refused: ") + error.what();
+    }
+}
+
+TEST(Views, takeWhateverAHostAnswers) {
+    std::size_t drawn = 0;
+    for (std::uint32_t seed = 0; seed < 20; ++seed) {
+        for (const View view : kViews) {
+            for (const bool withWrongIds : {false, true}) {
+                const std::string outcome = outcomeOf(seed, withWrongIds, view);
+                EXPECT_EQ(outcome, outcomeOf(seed, withWrongIds, view)) << seed << " " << nameOf(view);
+                const bool isRefused = outcome.starts_with("refused: ");
+                EXPECT_TRUE(!isRefused || outcome.size() > std::string("refused: ").size());
+                if (!isRefused) ++drawn;
+            }
+        }
+    }
+    EXPECT_GT(drawn, 130U);
+}
+
 TEST(Views, showTheSamePersonsOfATableAndOfAHost) {
     const Family family = cousins();
     const auto host = std::make_shared<FamilyDataSource>(family);
