@@ -74,7 +74,7 @@ bool hasProblem(const std::vector<Remark>& remarks) {
 
 // For people: the data, then the layouts as they come. Returns whether there is anything to see to.
 bool printText(const gedcom::GedcomData& data, gedcom::PersonId focus, const CheckOptions& options) {
-    const std::vector<Remark> remarks = remarksOf(data);
+    const std::vector<Remark> remarks = remarksOf(data, options.request.chart.language);
     writeReport(summaryOf(data) + remarksText(data, remarks));
     bool anyTrouble = hasProblem(remarks);
     if (focus != 0) anyTrouble = printOneLayout(data, focus, options.request) || anyTrouble;
@@ -82,8 +82,8 @@ bool printText(const gedcom::GedcomData& data, gedcom::PersonId focus, const Che
     return anyTrouble;
 }
 
-bool printTable(const gedcom::GedcomData& data) {
-    const std::vector<Remark> remarks = remarksOf(data);
+bool printTable(const gedcom::GedcomData& data, const CheckOptions& options) {
+    const std::vector<Remark> remarks = remarksOf(data, options.request.chart.language);
     writeReport(remarksTable(data, remarks));
     return hasProblem(remarks);
 }
@@ -101,7 +101,7 @@ std::vector<CheckedLayout> checkedLayouts(const gedcom::GedcomData& data, gedcom
 }
 
 bool printJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const CheckOptions& options) {
-    const std::vector<Remark> remarks = remarksOf(data);
+    const std::vector<Remark> remarks = remarksOf(data, options.request.chart.language);
     const std::vector<CheckedLayout> layouts = checkedLayouts(data, focus, options);
     writeReport(checkJson(data, remarks, layouts));
     return hasProblem(remarks) ||
@@ -115,7 +115,7 @@ bool printJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const Che
 int runCheck(const CheckOptions& options) {
     const gedcom::GedcomData data = readFileQuietly(options.input);
     const gedcom::PersonId focus = options.focus.empty() ? 0 : chooseFocus(data, options.focus);
-    if (options.format == ListFormat::tsv) return printTable(data) ? 1 : 0;
+    if (options.format == ListFormat::tsv) return printTable(data, options) ? 1 : 0;
     if (options.format == ListFormat::json) return printJson(data, focus, options) ? 1 : 0;
     return printText(data, focus, options) ? 1 : 0;
 }

@@ -60,13 +60,22 @@ std::string asMarkup(std::string text) {
     return replacedAll(replacedAll(std::move(text), "&", "&amp;"), "<", "&lt;");
 }
 
+nlohmann::ordered_json phraseJson(const gedcom::DiagnosticPhrase& phrase) {
+    return {{"sentence", gedcom::sentenceName(phrase.sentence)}, {"arguments", phrase.arguments}};
+}
+
+// Without words: the page has those of its reader's language.
 nlohmann::ordered_json remarksOf(const PageFamily& family) {
     nlohmann::ordered_json remarks = nlohmann::ordered_json::array();
     for (const gedcom::Diagnostic& remark : family.remarks) {
+        nlohmann::ordered_json done = nlohmann::ordered_json::array();
+        for (const gedcom::DiagnosticPhrase& phrase : remark.done) done.push_back(phraseJson(phrase));
         remarks.push_back({{"line", remark.line},
                            {"severity", gedcom::severityName(remark.severity)},
-                           {"message", remark.what},
-                           {"hint", remark.done}});
+                           {"kind", gedcom::kindName(remark.kind)},
+                           {"what", phraseJson(remark.what)},
+                           {"done", std::move(done)},
+                           {"quoted", remark.quoted}});
     }
     return remarks;
 }

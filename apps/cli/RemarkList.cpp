@@ -5,7 +5,9 @@
 
 #include <cli/RemarkList.h>
 
-#include <cli/DataCheck.h>
+#include <olvane/source/GedcomCheck.h>
+
+#include <cli/FocusChoice.h>
 #include <cli/TableCells.h>
 
 namespace olvane::cli {
@@ -24,20 +26,11 @@ std::string lineText(const Remark& remark) {
 
 }  // namespace
 
-std::vector<Remark> remarksOf(const gedcom::GedcomData& data) {
+std::vector<Remark> remarksOf(const gedcom::GedcomData& data, kin::Language language) {
     std::vector<Remark> remarks;
-    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
-        if (isFoundInData(diagnostic.kind)) continue;
-        const std::string text =
-            diagnostic.done.empty() ? diagnostic.what : diagnostic.what + "; " + diagnostic.done;
-        remarks.push_back({gedcom::kindName(diagnostic.kind),
-                           gedcom::severityName(diagnostic.severity),
-                           diagnostic.line,
-                           {},
-                           text});
-    }
-    for (const DataFinding& finding : checkData(data)) {
-        remarks.push_back({nameOf(finding.kind), "odd", finding.line, finding.xrefs, finding.text});
+    for (const gedcom::FileRemark& remark : gedcom::remarksOf(data)) {
+        remarks.push_back({std::string(remark.kind()), std::string(remark.severity()), remark.line,
+                           remark.xrefs, gedcom::remarkText(data, remark, language, readableName)});
     }
     return remarks;
 }

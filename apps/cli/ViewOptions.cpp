@@ -197,7 +197,9 @@ void addLanguage(CLI::App& command, kin::Language& language) {
         for (const kin::Language one : kin::kLanguages) names.emplace(kin::languageCode(one), one);
         return names;
     }();
-    command.add_option("--language", language, "The language of the kinship's words; English when not given")
+    command
+        .add_option("--language", language,
+                    "The language of a kinship's words and of remarks; English when not given")
         ->transform(CLI::CheckedTransformer(kNames))
         ->type_name("en|de|es")
         ->group(kKinshipGroup);
@@ -267,7 +269,11 @@ void refuseIdle(const CLI::App& command, const char* option, std::span<const Vie
 
 void refuseIdleOptions(const CLI::App& command, View view) {
     constexpr View kOfNearRelatives[] = {View::family, View::near};
-    for (const OptionUse& use : optionUses()) refuseIdle(command, use.option, use.views, view);
+    for (const OptionUse& use : optionUses()) {
+        const bool isOfRemarks =
+            command.get_name() == "check" && std::string_view(use.option) == "--language";
+        if (!isOfRemarks) refuseIdle(command, use.option, use.views, view);
+    }
     for (const FamilySwitch& option : kFamilySwitches) {
         refuseIdle(command, option.name, kOfNearRelatives, view);
     }

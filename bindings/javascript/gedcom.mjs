@@ -11,6 +11,7 @@ import { focusNumber } from "./options.mjs";
 import { readPicture } from "./picture.mjs";
 import { drawingNumbers, pictureNumbers } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
+import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { searchWith } from "./search.mjs";
 import { Texts } from "./texts.mjs";
 
@@ -105,10 +106,6 @@ function detailedNameFrom([text, type, nickname, details]) {
     return { text, type, nickname, details: detailsFrom(details) };
 }
 
-function diagnosticFrom([line, severity, message, hint]) {
-    return { line, severity, message, hint };
-}
-
 // Closes what nobody holds any more and nobody closed.
 const unclosed = new FinalizationRegistry(({ instance, file }) => instance.exports.gedcom_close(file));
 
@@ -151,6 +148,11 @@ export class GedcomFile {
     detailsOfFamily(id) {
         const [details, facts] = this.#answer("gedcom_family_details", id);
         return { ...detailsFrom(details), facts: facts.map(detailedFactFrom) };
+    }
+
+    remarks(language = "en") {
+        const remarks = this.#instance.withText(String(language), (pointer) => this.#answer("gedcom_remarks", pointer));
+        return remarks.map(remarkFrom);
     }
 
     kinship(a, b, language = "en") {

@@ -561,12 +561,36 @@ export interface KinshipWay {
     readonly persons: readonly number[];
 }
 
-/** Something wrong or odd in a file. */
+/** A sentence of the reader and what stands in its places: numbers, names of encodings or of kinds. */
+export interface DiagnosticPhrase {
+    readonly sentence: string;
+    readonly arguments: readonly string[];
+}
+
+/** Something wrong in a file, without words: Olvane.diagnosticWords has them. */
 export interface Diagnostic {
     /** From 1; 0 where no line can be named. */
     readonly line: number;
     readonly severity: "error" | "warning" | "note";
-    readonly message: string;
+    /** "levelJump", "danglingPointer" and so on. */
+    readonly kind: string;
+    readonly what: DiagnosticPhrase;
+    readonly done: readonly DiagnosticPhrase[];
+    /** Of the file; empty where nothing is quoted. */
+    readonly quoted: string;
+}
+
+/** Something wrong in a file or odd in its data, in words. */
+export interface Remark {
+    /** "levelJump", "diedBeforeBirth" and so on. */
+    readonly kind: string;
+    /** "odd" of what the data say. */
+    readonly severity: "error" | "warning" | "note" | "odd";
+    readonly line: number;
+    /** Those concerned, as the text names them. */
+    readonly persons: readonly number[];
+    readonly text: string;
+    /** What was done about it; empty for what is odd. */
     readonly hint: string;
 }
 
@@ -594,6 +618,8 @@ export class GedcomFile {
     /** Notes, sources, media and links beside facts and names. Throws GedcomError for nobody. */
     detailsOfPerson(id: number): PersonDetails;
     detailsOfFamily(id: number): FamilyDetails;
+    /** First what was wrong in the file, then what is odd in its data: what a check of the file lists. */
+    remarks(language?: string): Remark[];
     /**
      * What b is to a, and every way between them. Languages are "en", "de" and "es", with or without a region; English for
      * others. Throws RangeError for somebody who is not in the file.
@@ -793,6 +819,11 @@ export class Olvane {
     layoutText(host: Host | Family, focus: number, options?: Options): string;
     /** The picture of any view, of a host that is asked as far as the view reaches. Throws as layout does. */
     picture(host: Host | Family, focus: number, options?: PictureOptions): Picture;
+    /** What was wrong, and what was done about it. Languages are as those of GedcomFile.kinship. */
+    diagnosticWords(
+        diagnostic: Pick<Diagnostic, "what" | "done" | "quoted">,
+        language?: string,
+    ): { readonly text: string; readonly hint: string };
     /**
      * Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Where the file's own word on its
      * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.

@@ -5,6 +5,7 @@
 
 import { Family } from "./family.mjs";
 import { readGedcom, readGedcomIn } from "./gedcom.mjs";
+import { diagnosticWords } from "./remarks.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout, runPicture } from "./layout.mjs";
 import { Texts } from "./texts.mjs";
@@ -42,6 +43,10 @@ export class Olvane {
         return host instanceof Family
             ? host.picture(focus, options)
             : runPicture(this.#instance, host, focus, options);
+    }
+
+    diagnosticWords(diagnostic, language = "en") {
+        return diagnosticWords(this.#instance, diagnostic, language);
     }
 
     readGedcom(bytes, name = "family.ged", options = {}) {

@@ -101,12 +101,23 @@ void writeFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyI
     json.end();
 }
 
+void write(JsonText& json, const gedcom::DiagnosticPhrase& phrase) {
+    json.begin();
+    json.string(gedcom::sentenceName(phrase.sentence));
+    for (const std::string& argument : phrase.arguments) json.string(argument);
+    json.end();
+}
+
 void write(JsonText& json, const gedcom::Diagnostic& diagnostic) {
     json.begin();
     json.number(diagnostic.line);
     json.string(gedcom::severityName(diagnostic.severity));
-    json.string(diagnostic.what);
-    json.string(diagnostic.done);
+    json.string(gedcom::kindName(diagnostic.kind));
+    write(json, diagnostic.what);
+    json.begin();
+    for (const gedcom::DiagnosticPhrase& phrase : diagnostic.done) write(json, phrase);
+    json.end();
+    json.string(diagnostic.quoted);
     json.end();
 }
 

@@ -20,8 +20,10 @@ public:
     DiagnosticList(std::string file, std::size_t listedPerKind);
 
     // quoted is raw text from the file, shown behind what in part and made fit to print.
-    void add(DiagnosticKind kind, Severity severity, std::uint32_t line, std::string_view what,
-             std::string_view done, std::string_view quoted = {});
+    void add(DiagnosticKind kind, Severity severity, std::uint32_t line, DiagnosticPhrase what,
+             DiagnosticPhrase done, std::string_view quoted = {});
+    void add(DiagnosticKind kind, Severity severity, std::uint32_t line, DiagnosticPhrase what,
+             std::vector<DiagnosticPhrase> done, std::string_view quoted = {});
 
     // Counts one that is listed only once for the whole file, with its number, when all is read.
     void count(DiagnosticKind kind, std::uint32_t line);
@@ -30,7 +32,7 @@ public:
     std::vector<Diagnostic> take();
 
 private:
-    static constexpr std::size_t kKinds = static_cast<std::size_t>(DiagnosticKind::ambiguousDate) + 1;
+    static constexpr std::size_t kKinds = kDiagnosticKinds;
 
     struct Tally {
         std::size_t seen = 0;

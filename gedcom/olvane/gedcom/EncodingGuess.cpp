@@ -130,16 +130,15 @@ const KnownEncoding* likelyEncoding(std::string_view bytes) {
     return central || looksCzech(census) ? findEncoding("windows-1250") : nullptr;
 }
 
-std::string encodingSuggestion(std::string_view bytes) {
+DiagnosticPhrase encodingSuggestion(std::string_view bytes) {
     if (const KnownEncoding* likely = likelyEncoding(bytes)) {
-        return "it looks like " + std::string(likely->name) + ": choose that encoding";
+        return DiagnosticPhrase{DiagnosticSentence::looksLike, {std::string(likely->name)}};
     }
     const HighByteCensus census = takeCensus(bytes);
     if (census.words >= 2 && census.inWords * 2 > census.bytes) {
-        return "choose an encoding, such as GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 or windows-1256";
+        return DiagnosticSentence::chooseFarEncoding;
     }
-    return "if letters are wrong, choose an encoding, such as windows-1250, windows-1251, IBM850 or "
-           "macintosh";
+    return DiagnosticSentence::chooseNearEncoding;
 }
 
 }  // namespace olvane::gedcom

@@ -5,6 +5,7 @@
 #include <string>
 #include <string_view>
 
+#include <olvane/gedcom/DiagnosticSentence.h>
 #include <olvane/gedcom/EncodingTableInternal.h>
 
 namespace olvane::gedcom {
@@ -17,6 +18,6 @@ namespace olvane::gedcom {
 const KnownEncoding* likelyEncoding(std::string_view bytes);
 
 // What to try for text in an encoding that is not certain: "it looks like windows-1251", or a choice.
-std::string encodingSuggestion(std::string_view bytes);
+DiagnosticPhrase encodingSuggestion(std::string_view bytes);
 
 }  // namespace olvane::gedcom

@@ -62,8 +62,9 @@ zip_uint64_t findMember(zip_t* archive, const std::string& name, DiagnosticList&
     for (zip_int64_t at = 0; at < count; ++at) {
         const char* member = zip_get_name(archive, static_cast<zip_uint64_t>(at), ZIP_FL_ENC_GUESS);
         if (member == nullptr || !endsWithGed(member)) continue;
-        diagnostics.add(DiagnosticKind::archiveMember, Severity::warning, 0, "the archive has no gedcom.ged",
-                        "another member is read", member);
+        diagnostics.add(DiagnosticKind::archiveMember, Severity::warning, 0,
+                        DiagnosticSentence::archiveWithoutGedcomFile, DiagnosticSentence::otherMemberRead,
+                        member);
         return static_cast<zip_uint64_t>(at);
     }
     throw GedcomError(name, "is an archive without a GEDCOM file in it");

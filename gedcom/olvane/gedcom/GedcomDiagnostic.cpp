@@ -18,34 +18,6 @@ namespace {
 
 constexpr std::size_t kQuotedBytes = 60;
 
-// Kinds as the counting diagnostics name them, in the order of the enumeration.
-constexpr const char* kKindNames[] = {
-    "missing header",
-    "missing trailer",
-    "record behind the trailer",
-    "line without level and tag",
-    "empty line",
-    "wrong level",
-    "level jump",
-    "broken identifier",
-    "identifier used twice",
-    "pointer to no record",
-    "wrong pointer",
-    "family with a third partner",
-    "family with one person as both partners",
-    "encoding other than declared",
-    "unknown encoding",
-    "bytes that are no character",
-    "control character",
-    "unreadable date",
-    "archive member of another name",
-    "more of a kind",
-    "link of one side alone",
-    "links that contradict each other",
-    "partner in the slot of the other sex",
-    "date with day and month in doubt",
-};
-
 std::string printable(std::string_view raw) {
     std::string shown = lossyUtf8(raw.substr(0, std::min(raw.size(), kQuotedBytes)));
     for (char& c : shown) {
@@ -123,26 +95,43 @@ const char* severityName(Severity severity) {
     return "error";
 }
 
-std::string formatDiagnostic(const Diagnostic& diagnostic) {
+std::string whatText(const Diagnostic& diagnostic, std::string_view language) {
+    std::string text = phraseText(diagnostic.what, language);
+    if (!diagnostic.quoted.empty()) text.append(" (").append(diagnostic.quoted).append(")");
+    return text;
+}
+
+std::string doneText(const Diagnostic& diagnostic, std::string_view language) {
+    std::string text;
+    for (const DiagnosticPhrase& phrase : diagnostic.done)
+        text.append(text.empty() ? "" : "; ").append(phraseText(phrase, language));
+    return text;
+}
+
+std::string formatDiagnostic(const Diagnostic& diagnostic, std::string_view language) {
     std::string text = diagnostic.file;
     if (diagnostic.line != 0) text.append(":").append(std::to_string(diagnostic.line));
     text += ": ";
     text += severityName(diagnostic.severity);
-    text.append(": ").append(diagnostic.what);
-    if (!diagnostic.done.empty()) text.append("; ").append(diagnostic.done);
+    text.append(": ").append(whatText(diagnostic, language));
+    const std::string done = doneText(diagnostic, language);
+    if (!done.empty()) text.append("; ").append(done);
     return text;
 }
 
 DiagnosticList::DiagnosticList(std::string file, std::size_t listedPerKind)
     : file_(std::move(file)), listedPerKind_(listedPerKind) {}
 
-void DiagnosticList::add(DiagnosticKind kind, Severity severity, std::uint32_t line, std::string_view what,
-                         std::string_view done, std::string_view quoted) {
+void DiagnosticList::add(DiagnosticKind kind, Severity severity, std::uint32_t line, DiagnosticPhrase what,
+                         std::vector<DiagnosticPhrase> done, std::string_view quoted) {
     Tally& tally = tallies_[static_cast<std::size_t>(kind)];
     if (++tally.seen > listedPerKind_) return;
-    std::string whole(what);
-    if (!quoted.empty()) whole.append(" (").append(printable(quoted)).append(")");
-    listed_.push_back({file_, line, severity, kind, std::move(whole), std::string(done)});
+    listed_.push_back({file_, line, severity, kind, std::move(what), std::move(done), printable(quoted)});
+}
+
+void DiagnosticList::add(DiagnosticKind kind, Severity severity, std::uint32_t line, DiagnosticPhrase what,
+                         DiagnosticPhrase done, std::string_view quoted) {
+    add(kind, severity, line, std::move(what), std::vector<DiagnosticPhrase>{std::move(done)}, quoted);
 }
 
 void DiagnosticList::count(DiagnosticKind kind, std::uint32_t line) {
@@ -162,11 +151,13 @@ void DiagnosticList::listCounted() {
     for (std::size_t kind = 0; kind < kKinds; ++kind) {
         const Tally& tally = tallies_[kind];
         if (tally.onlyCounted == 0) continue;
-        const std::string what = tally.onlyCounted == 1 ? std::string(kKindNames[kind])
-                                                        : std::string(kKindNames[kind]) + ", the first of " +
-                                                              std::to_string(tally.onlyCounted);
-        listed_.push_back({file_, tally.firstCountedLine, Severity::note, static_cast<DiagnosticKind>(kind),
-                           what, "skipped"});
+        const auto of = static_cast<DiagnosticKind>(kind);
+        const DiagnosticPhrase what =
+            tally.onlyCounted == 1 ? DiagnosticPhrase{DiagnosticSentence::oneOfKind, {kindName(of)}}
+                                   : DiagnosticPhrase{DiagnosticSentence::firstOfKind,
+                                                      {kindName(of), std::to_string(tally.onlyCounted)}};
+        listed_.push_back(
+            {file_, tally.firstCountedLine, Severity::note, of, what, {DiagnosticSentence::skipped}, ""});
     }
 }
 
@@ -174,8 +165,15 @@ void DiagnosticList::listUnlisted() {
     for (std::size_t kind = 0; kind < kKinds; ++kind) {
         if (tallies_[kind].seen <= listedPerKind_) continue;
         const std::size_t unlisted = tallies_[kind].seen - listedPerKind_;
-        listed_.push_back({file_, 0, Severity::note, DiagnosticKind::moreOfAKind,
-                           std::to_string(unlisted) + " more of: " + kKindNames[kind], "not listed singly"});
+        const DiagnosticPhrase what{DiagnosticSentence::moreOfKind,
+                                    {std::to_string(unlisted), kindName(static_cast<DiagnosticKind>(kind))}};
+        listed_.push_back({file_,
+                           0,
+                           Severity::note,
+                           DiagnosticKind::moreOfAKind,
+                           what,
+                           {DiagnosticSentence::notListed},
+                           ""});
     }
 }
 

@@ -5,6 +5,10 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
+#include <string_view>
+#include <vector>
+
+#include <olvane/gedcom/DiagnosticSentence.h>
 
 namespace olvane::gedcom {
 
@@ -42,7 +46,9 @@ enum class DiagnosticKind : std::uint8_t {
     ambiguousDate,      // a date whose day and month may be either way round
 };
 
-// One thing that was wrong with a file, and what was done about it.
+constexpr std::size_t kDiagnosticKinds = static_cast<std::size_t>(DiagnosticKind::ambiguousDate) + 1;
+
+// One thing that was wrong with a file, and what was done about it. Words are made last, for a reader.
 //
 // Holds: line counts from 1; 0 means the file as a whole. Texts are valid UTF-8 without line ends.
 struct Diagnostic {
@@ -50,12 +56,19 @@ struct Diagnostic {
     std::uint32_t line = 0;
     Severity severity = Severity::note;
     DiagnosticKind kind = DiagnosticKind::notALine;
-    std::string what;
-    std::string done;
+    DiagnosticPhrase what;
+    std::vector<DiagnosticPhrase> done;
+    std::string quoted;  // of the file, short and fit to print; empty where nothing is quoted
 };
 
+// "level jumps from 1 to 4 (NAME)", in the language of a code such as "de"; English for others.
+std::string whatText(const Diagnostic& diagnostic, std::string_view language = "en");
+
+// "read as level 2"
+std::string doneText(const Diagnostic& diagnostic, std::string_view language = "en");
+
 // "royal.ged:12: warning: level jumps from 1 to 4; read as level 2"
-std::string formatDiagnostic(const Diagnostic& diagnostic);
+std::string formatDiagnostic(const Diagnostic& diagnostic, std::string_view language = "en");
 
 // "missingHeader" and so on: the name of the kind, for other programs.
 const char* kindName(DiagnosticKind kind);

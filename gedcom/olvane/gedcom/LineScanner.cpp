@@ -165,8 +165,8 @@ bool LineScanner::parse(std::string_view text, GedcomLine& line) {
 }
 
 bool LineScanner::refuse(std::string_view text, const GedcomLine& line) {
-    diagnostics_.add(DiagnosticKind::notALine, Severity::error, line.number, "not a line with level and tag",
-                     "skipped", text);
+    diagnostics_.add(DiagnosticKind::notALine, Severity::error, line.number,
+                     DiagnosticSentence::noLevelAndTag, DiagnosticSentence::skipped, text);
     return false;
 }
 
@@ -192,9 +192,11 @@ bool LineScanner::takeUnusualLevel(std::string_view& rest, GedcomLine& line) {
     const bool parted = !digits.empty() && isBlank(digits.front());
     if (!parted && (digits.empty() || (digits.front() != '@' && !isTagLetter(digits.front())))) return false;
     if (negative || padded || !parted) {
-        diagnostics_.add(DiagnosticKind::wrongLevel, Severity::warning, line.number, "level badly written",
-                         writtenLevel_ < kHighestLevel ? "read as level " + std::to_string(writtenLevel_)
-                                                       : std::string("read as one below the line before"),
+        diagnostics_.add(DiagnosticKind::wrongLevel, Severity::warning, line.number,
+                         DiagnosticSentence::badlyWrittenLevel,
+                         writtenLevel_ < kHighestLevel
+                             ? DiagnosticPhrase{DiagnosticSentence::asLevel, {std::to_string(writtenLevel_)}}
+                             : DiagnosticPhrase{DiagnosticSentence::asOneBelow},
                          written);
     }
     rest = withoutLeadingBlanks(digits);
@@ -209,7 +211,8 @@ bool LineScanner::takeXref(std::string_view& rest, GedcomLine& line) {
     if (!closed) {
         end = std::min(rest.find(' '), rest.size());
         diagnostics_.add(DiagnosticKind::brokenXref, Severity::warning, line.number,
-                         "identifier without its second @", "read up to the space", rest.substr(0, end));
+                         DiagnosticSentence::identifierWithoutEnd, DiagnosticSentence::upToSpace,
+                         rest.substr(0, end));
     }
     line.xref = trimmed(rest.substr(1, end - 1));
     rest = withoutLeadingBlanks(rest.substr(closed ? end + 1 : end));
@@ -232,10 +235,10 @@ void LineScanner::settleDepth(GedcomLine& line) {
     if (writtenLevel_ != 0 && ancestorCount_ < ancestors_.size())
         ancestors_[ancestorCount_++] = writtenLevel_;
     if (writtenLevel_ > previousLevel_ + 1) {
-        diagnostics_.add(
-            DiagnosticKind::levelJump, Severity::warning, line.number,
-            "level jumps from " + std::to_string(previousLevel_) + " to " + shownLevel(levelDigits_),
-            "read as one below the line before", line.tag);
+        diagnostics_.add(DiagnosticKind::levelJump, Severity::warning, line.number,
+                         DiagnosticPhrase{DiagnosticSentence::jumpingLevel,
+                                          {std::to_string(previousLevel_), shownLevel(levelDigits_)}},
+                         DiagnosticSentence::asOneBelow, line.tag);
     }
     previousLevel_ = writtenLevel_;
 }

@@ -127,16 +127,16 @@ private:
             if (family.husband == id || family.wife == id) continue;
             if (family.husband != 0 && family.wife != 0) {
                 diagnostics_.add(DiagnosticKind::contradictingLink, Severity::warning, link.line,
-                                 "a FAMS of a family that names two others as its partners",
-                                 "the children are kept for all of them", family.xref);
+                                 DiagnosticSentence::marriageOfOthers, DiagnosticSentence::childrenOfAll,
+                                 family.xref);
                 continue;
             }
             const bool isWoman = tables_.persons[id - 1].sex == Sex::female;
             const bool asHusband = family.husband == 0 && (family.wife != 0 || !isWoman);
             (asHusband ? family.husband : family.wife) = id;
             (asHusband ? family.husbandLine : family.wifeLine) = link.line;
-            report(link.line, "a FAMS of a family that does not name the person",
-                   asHusband ? "read as its husband" : "read as its wife", family.xref);
+            report(link.line, DiagnosticSentence::marriageNotReturned,
+                   asHusband ? DiagnosticSentence::asHusband : DiagnosticSentence::asWife, family.xref);
         }
     }
 
@@ -152,11 +152,11 @@ private:
         if (!manAsWife && !womanAsHusband) return;
         if (manAsWife) {
             diagnostics_.add(DiagnosticKind::wrongSlot, Severity::warning, family.wifeLine,
-                             "a man as the WIFE of a family", "read as its husband", family.xref);
+                             DiagnosticSentence::manAsWife, DiagnosticSentence::asHusband, family.xref);
         }
         if (womanAsHusband) {
             diagnostics_.add(DiagnosticKind::wrongSlot, Severity::warning, family.husbandLine,
-                             "a woman as the HUSB of a family", "read as its wife", family.xref);
+                             DiagnosticSentence::womanAsHusband, DiagnosticSentence::asWife, family.xref);
         }
         std::swap(family.husband, family.wife);
         std::swap(family.husbandLine, family.wifeLine);
@@ -165,7 +165,7 @@ private:
     void followPartner(FamilyId id, PersonId partner, LineNumber line) {
         if (partner == 0 || couplesOf_.holds(partner, coupleLinks(partner), id, familyOf)) return;
         newCoupleLinks_.push_back({partner, {id, line, Pedigree::notGiven, true}});
-        report(line, "a partner whose own record has no FAMS for the family", "read as if it had",
+        report(line, DiagnosticSentence::partnerNotReturned, DiagnosticSentence::asIfItHad,
                tables_.families[id - 1].xref);
     }
 
@@ -197,12 +197,11 @@ private:
             return other.family != 0 && mayBeBirth(other.pedigree);
         });
         if (!namesOthers || !mayBeBirth(link.pedigree)) {
-            return report(link.line, "a child whose own record has no FAMC for the family",
-                          "read as if it had", xref);
+            return report(link.line, DiagnosticSentence::childNotReturned, DiagnosticSentence::asIfItHad,
+                          xref);
         }
         diagnostics_.add(DiagnosticKind::contradictingLink, Severity::warning, link.line,
-                         "a child whose own record names another family as that of the parents",
-                         "both are kept, the child's own first", xref);
+                         DiagnosticSentence::childOfOthers, DiagnosticSentence::bothKept, xref);
     }
 
     void followParents(PersonId id) {
@@ -211,12 +210,12 @@ private:
                 continue;
             if (std::exchange(lastParents_[id], link.family) == link.family) continue;
             newChildLinks_.push_back({link.family, {id, link.line, Pedigree::notGiven, true}});
-            report(link.line, "a FAMC of a family that does not name the child", "read as its last child",
+            report(link.line, DiagnosticSentence::parentsNotReturned, DiagnosticSentence::asLastChild,
                    tables_.families[link.family - 1].xref);
         }
     }
 
-    void report(LineNumber line, const char* what, const char* done, std::string_view xref) {
+    void report(LineNumber line, DiagnosticSentence what, DiagnosticSentence done, std::string_view xref) {
         diagnostics_.add(DiagnosticKind::oneSidedLink, Severity::note, line, what, done, xref);
     }
 

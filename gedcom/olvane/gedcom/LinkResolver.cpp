@@ -52,7 +52,7 @@ private:
         family.wife = personAt(family.wife, family.wifeLine);
         if (family.husband == 0 || family.husband != family.wife) return;
         diagnostics_.add(DiagnosticKind::samePartners, Severity::warning, family.wifeLine,
-                         "one person as both partners of a family", "not their own spouse", family.xref);
+                         DiagnosticSentence::onePersonTwice, DiagnosticSentence::noOwnSpouse, family.xref);
     }
 
     // Links that lead nowhere are no children, and are not to be walked over again and again.
@@ -71,24 +71,24 @@ private:
 
     PersonId personAt(XrefPlace place, LineNumber line) {
         const PersonId person = xrefs_.at(place).person;
-        if (place != 0 && person == 0) reportLoose(place, line, "a pointer that leads to no person");
+        if (place != 0 && person == 0) reportLoose(place, line, DiagnosticSentence::noPerson);
         return person;
     }
 
     FamilyId familyAt(XrefPlace place, LineNumber line) {
         const FamilyId family = xrefs_.at(place).family;
-        if (place != 0 && family == 0) reportLoose(place, line, "a pointer that leads to no family");
+        if (place != 0 && family == 0) reportLoose(place, line, DiagnosticSentence::noFamily);
         return family;
     }
 
-    void reportLoose(XrefPlace place, LineNumber line, const char* what) {
+    void reportLoose(XrefPlace place, LineNumber line, DiagnosticSentence what) {
         const XrefTable::Entry& entry = xrefs_.at(place);
         if (entry.line == 0) {
-            diagnostics_.add(DiagnosticKind::danglingPointer, Severity::error, line, "a pointer to no record",
-                             "left out", entry.xref);
+            diagnostics_.add(DiagnosticKind::danglingPointer, Severity::error, line,
+                             DiagnosticSentence::noSuchRecord, DiagnosticSentence::leftOut, entry.xref);
         } else {
-            diagnostics_.add(DiagnosticKind::wrongPointer, Severity::error, line, what, "left out",
-                             entry.xref);
+            diagnostics_.add(DiagnosticKind::wrongPointer, Severity::error, line, what,
+                             DiagnosticSentence::leftOut, entry.xref);
         }
     }
 
@@ -160,8 +160,7 @@ private:
             return true;
         }
         diagnostics_.add(DiagnosticKind::wrongPointer, Severity::error, link.line,
-                         "one more person in a family that names others as its partners",
-                         "its children are left out for this person", family.xref);
+                         DiagnosticSentence::onePersonMore, DiagnosticSentence::withoutChildren, family.xref);
         return false;
     }
 

@@ -69,10 +69,10 @@ bool turnMultiByte(std::string& bytes, const KnownEncoding& encoding, Diagnostic
     if (!text) return false;
     bytes = std::move(*text);
     if (const std::size_t faults = countReplacements(bytes); faults != 0) {
-        diagnostics.add(
-            DiagnosticKind::badCharacter, Severity::error, 0,
-            "the text is not " + std::string(encoding.name) + " in " + std::to_string(faults) + " places",
-            "read as well as can be; if letters are wrong, choose another encoding");
+        diagnostics.add(DiagnosticKind::badCharacter, Severity::error, 0,
+                        DiagnosticPhrase{DiagnosticSentence::faultsInText,
+                                         {std::string(encoding.name), std::to_string(faults)}},
+                        DiagnosticSentence::maybeOtherEncoding);
     }
     return true;
 }

@@ -203,7 +203,7 @@ bool RecordReader::readAll(void (*progress)(std::size_t done, std::size_t all)) 
     endRecord();
     if (anyRecord_ && !trailerSeen_) {
         diagnostics_.add(DiagnosticKind::missingTrailer, Severity::warning, scanner_.lineNumber(),
-                         "the file ends without TRLR and may have been cut off", "read as far as it goes");
+                         DiagnosticSentence::noTrailer, DiagnosticSentence::asFarAsItGoes);
     }
     return anyRecord_;
 }
@@ -278,13 +278,13 @@ void RecordReader::beginRecord(const GedcomLine& line) {
 void RecordReader::checkBeginning(const GedcomLine& line) {
     if (line.level == 0 && tagCode(line.tag) == kHeader) return;
     diagnostics_.add(DiagnosticKind::missingHeader, Severity::warning, line.number,
-                     "the file does not begin with HEAD", "read without it", line.tag);
+                     DiagnosticSentence::noHeader, DiagnosticSentence::withoutIt, line.tag);
 }
 
 void RecordReader::checkEnd(const GedcomLine& line, std::uint64_t tag) {
     if (trailerSeen_) {
-        diagnostics_.add(DiagnosticKind::afterTrailer, Severity::warning, line.number, "a record behind TRLR",
-                         "read like the others", line.tag);
+        diagnostics_.add(DiagnosticKind::afterTrailer, Severity::warning, line.number,
+                         DiagnosticSentence::recordBehindTrailer, DiagnosticSentence::likeOthers, line.tag);
     }
     trailerSeen_ = trailerSeen_ || tag == kTrailer;
 }
@@ -304,8 +304,8 @@ XrefTable::Entry* RecordReader::claimXref(const GedcomLine& line) {
     XrefTable::Entry& entry = xrefs_.at(xrefs_.place(interner_.keep(line.xref, line.number)));
     if (entry.line != 0) {
         diagnostics_.add(DiagnosticKind::duplicateXref, Severity::warning, line.number,
-                         "identifier already used in line " + std::to_string(entry.line),
-                         "read as a record of its own; pointers lead to the first", line.xref);
+                         DiagnosticPhrase{DiagnosticSentence::identifierInUse, {std::to_string(entry.line)}},
+                         DiagnosticSentence::asOwnRecord, line.xref);
     } else {
         entry.line = line.number;
     }
@@ -602,12 +602,11 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
     lastDate_ = date;
     if (date.isYearAlone) {
         diagnostics_.add(DiagnosticKind::ambiguousDate, Severity::note, line.number,
-                         "a date whose day and month may be either way round", "its year alone is read",
-                         value);
+                         DiagnosticSentence::dayOrMonth, DiagnosticSentence::yearAlone, value);
     }
     if (date.isRead() || value.front() == '(') return;
     diagnostics_.add(DiagnosticKind::unreadableDate, Severity::note, line.number,
-                     "a date that cannot be read", "shown as written", value);
+                     DiagnosticSentence::dateNotRead, DiagnosticSentence::asWritten, value);
 }
 
 // A phrase that is a date is as good as one.
@@ -626,8 +625,8 @@ void RecordReader::addPartner(const GedcomLine& line, PartnerDraft& draft) {
 }
 
 void RecordReader::refusePartner(LineNumber line) {
-    diagnostics_.add(DiagnosticKind::tooManyPartners, Severity::error, line,
-                     "a family with more than two partners", "left out", family().xref);
+    diagnostics_.add(DiagnosticKind::tooManyPartners, Severity::error, line, DiagnosticSentence::thirdPartner,
+                     DiagnosticSentence::leftOut, family().xref);
 }
 
 void RecordReader::endFamily() {
@@ -661,13 +660,14 @@ std::string_view RecordReader::pointedXref(const GedcomLine& line) {
     const std::string_view value = trimmed(line.value);
     if (value.empty() || value.front() != '@') {
         diagnostics_.add(DiagnosticKind::wrongPointer, Severity::error, line.number,
-                         "a link without a pointer", "left out", value.empty() ? line.tag : value);
+                         DiagnosticSentence::linkWithoutPointer, DiagnosticSentence::leftOut,
+                         value.empty() ? line.tag : value);
         return {};
     }
     const std::size_t end = std::min(value.find('@', 1), value.size());
     if (end + 1 != value.size()) {
         diagnostics_.add(DiagnosticKind::brokenXref, Severity::warning, line.number,
-                         "a pointer that does not end with @", "read as if it did", value);
+                         DiagnosticSentence::pointerWithoutEnd, DiagnosticSentence::asIfItDid, value);
     }
     return trimmed(value.substr(1, end - 1));
 }

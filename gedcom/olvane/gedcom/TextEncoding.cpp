@@ -38,8 +38,8 @@ bool hasPage(const KnownEncoding* encoding) {
 // Takes the bytes for UTF-16 of that order, and makes them UTF-8.
 const KnownEncoding* turnUtf16(std::string& bytes, Utf16Order order, DiagnosticList& diagnostics) {
     if (bytes.size() % 2 != 0) {
-        diagnostics.add(DiagnosticKind::badCharacter, Severity::error, 0,
-                        "half a character at the end of the file", "left out");
+        diagnostics.add(DiagnosticKind::badCharacter, Severity::error, 0, DiagnosticSentence::halfCharacter,
+                        DiagnosticSentence::leftOut);
     }
     bytes = utf8FromUtf16(bytes, order);
     return order == Utf16Order::bigEndian ? &kUtf16Big : &kUtf16Little;
@@ -131,25 +131,24 @@ private:
     // Certain is what cannot be met by chance: UTF-8, UTF-16, and text of ASCII alone.
     void reportClaims(const KnownEncoding* used, bool ascii) {
         const bool certain = ascii || used == &kUtf8 || isUtf16(used);
-        const std::string done = std::string("read as ").append(used->name);
+        const DiagnosticPhrase done{DiagnosticSentence::asEncoding, {std::string(used->name)}};
         if (claims_.characters.empty()) {
             if (!certain)
-                addGuess(DiagnosticKind::encodingUnknown, Severity::warning, "the file names no encoding",
+                addGuess(DiagnosticKind::encodingUnknown, Severity::warning, DiagnosticSentence::noneNamed,
                          done);
         } else if (claimed_ == nullptr) {
-            const char* const what = "the header names an encoding that is not known";
+            constexpr DiagnosticSentence what = DiagnosticSentence::encodingNotKnown;
             if (certain) return add(DiagnosticKind::encodingUnknown, Severity::warning, what, done);
             addGuess(DiagnosticKind::encodingUnknown, Severity::error, what, done);
         } else if (claimed_ != used && !(isUtf16(claimed_) && isUtf16(used))) {
-            const char* const what = "the text is not in the encoding that the header names";
+            constexpr DiagnosticSentence what = DiagnosticSentence::otherThanNamed;
             if (certain) return add(DiagnosticKind::encodingMismatch, Severity::warning, what, done);
             addGuess(DiagnosticKind::encodingMismatch, Severity::error, what, done);
         } else if (!certain && hasPage(used) && !explains(*used)) {
-            addGuess(DiagnosticKind::encodingMismatch, Severity::error,
-                     "the text does not look like the encoding that the header names", done);
+            addGuess(DiagnosticKind::encodingMismatch, Severity::error, DiagnosticSentence::unlikeNamed,
+                     done);
         } else if (namesASystem(claims_.characters)) {
-            add(DiagnosticKind::encodingUnknown, Severity::note, "the header names a system, not an encoding",
-                done);
+            add(DiagnosticKind::encodingUnknown, Severity::note, DiagnosticSentence::systemNamed, done);
         }
     }
 
@@ -158,18 +157,20 @@ private:
         return &used != &kWindowsLatin || likelyEncoding(bytes_) == nullptr;
     }
 
-    void add(DiagnosticKind kind, Severity severity, const char* what, const std::string& done) {
+    void add(DiagnosticKind kind, Severity severity, DiagnosticSentence what, const DiagnosticPhrase& done) {
         diagnostics_.add(kind, severity, claims_.charactersLine, what, done, claims_.characters);
     }
-    void addGuess(DiagnosticKind kind, Severity severity, const char* what, const std::string& done) {
-        add(kind, severity, what, done + "; " + encodingSuggestion(bytes_));
+    void addGuess(DiagnosticKind kind, Severity severity, DiagnosticSentence what,
+                  const DiagnosticPhrase& done) {
+        diagnostics_.add(kind, severity, claims_.charactersLine, what, {done, encodingSuggestion(bytes_)},
+                         claims_.characters);
     }
 
     void reportFaults(const KnownEncoding* used) {
         if (used != &kUtf8 || census_.faults == 0) return;
         diagnostics_.add(DiagnosticKind::badCharacter, Severity::warning, 0,
-                         "the text is UTF-8 but for " + std::to_string(census_.faults) + " places",
-                         "those in names and dates are listed below");
+                         DiagnosticPhrase{DiagnosticSentence::faultsInUtf8, {std::to_string(census_.faults)}},
+                         DiagnosticSentence::listedBelow);
     }
 
     std::string_view bytes_;
@@ -238,9 +239,9 @@ const KnownEncoding* chosenEncoding(std::string_view chosen, const std::string& 
 
 void reportChosen(const KnownEncoding* chosen, const KnownEncoding* found, DiagnosticList& diagnostics) {
     if (found == nullptr || found == chosen || (isUtf16(chosen) && isUtf16(found))) return;
-    diagnostics.add(DiagnosticKind::encodingMismatch, Severity::warning, 0,
-                    "the text is not in the encoding that was chosen",
-                    std::string("read as ").append(found->name), chosen->name);
+    diagnostics.add(
+        DiagnosticKind::encodingMismatch, Severity::warning, 0, DiagnosticSentence::otherThanChosen,
+        DiagnosticPhrase{DiagnosticSentence::asEncoding, {std::string(found->name)}}, chosen->name);
 }
 
 }  // namespace

@@ -71,10 +71,10 @@ std::string TextInterner::decoded(std::string_view raw, std::uint32_t line) {
     std::size_t faults = 0;
     std::string text = decodeText(raw, form_, faults);
     if (faults != 0) {
-        diagnostics_.add(
-            DiagnosticKind::badCharacter, Severity::warning, line,
-            std::to_string(faults) + " bytes that are no character in " + std::string(form_.encoding->name),
-            "read as well as can be", text);
+        diagnostics_.add(DiagnosticKind::badCharacter, Severity::warning, line,
+                         DiagnosticPhrase{DiagnosticSentence::faultsInValue,
+                                          {std::to_string(faults), std::string(form_.encoding->name)}},
+                         DiagnosticSentence::asWellAsCanBe, text);
     }
     return text;
 }
@@ -99,7 +99,8 @@ void TextInterner::removeControls(std::string& text, std::uint32_t line, bool ke
     const std::size_t removed = std::erase_if(text, [&](char c) { return isControl(c) && !isKept(c); });
     if (removed == 0) return;
     diagnostics_.add(DiagnosticKind::controlCharacter, Severity::warning, line,
-                     std::to_string(removed) + " control characters", "left out", text);
+                     DiagnosticPhrase{DiagnosticSentence::controlCharacters, {std::to_string(removed)}},
+                     DiagnosticSentence::leftOut, text);
 }
 
 }  // namespace olvane::gedcom

@@ -5,8 +5,8 @@ import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { deflateRawSync } from "node:zlib";
 import { describe, test } from "node:test";
-import { fileFor, kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty, visitFile } from "../support/browser.mjs";
-import { brokenFamily, hugeHousehold } from "../support/families.mjs";
+import { fileFor, kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty, visitFamily, visitFile } from "../support/browser.mjs";
+import { brokenFamily, gedcom, hugeHousehold } from "../support/families.mjs";
 
 const kDarwins = sample("darwin-wedgwood.ged");
 const command = process.env.OLVANE_COMMAND;
@@ -172,6 +172,29 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("what is odd in the data leads to its persons, by a click and by a key", async () => {
+        const lines = ["0 @I1@ INDI", "1 NAME Early /Grave/", "1 BIRT", "2 DATE 1850", "1 DEAT", "2 DATE 1840", "1 FAMS @F1@"];
+        lines.push("0 @I2@ INDI", "1 NAME Old /Child/", "1 BIRT", "2 DATE 1800", "1 FAMC @F1@", "0 @F1@ FAM", "1 HUSB @I1@", "1 CHIL @I2@");
+        const phrase = (sentence, ...parts) => ({ sentence, arguments: parts });
+        const kept = { line: 4, severity: "error", kind: "levelJump", what: phrase("jumpingLevel", "1", "4"), done: [phrase("asOneBelow")], quoted: "NAME" };
+        const visit = await visitFamily(gedcom(...lines), { remarks: [kept] }, { locale: "de" }, "#person=I1");
+        await visit.page.click("#diagnostics-button");
+        const texts = await visit.page.locator("#diagnostics .message").allTextContents();
+        assert.deepEqual(texts, ["die Ebene springt von 1 auf 4 (NAME)", "Early Grave starb vor der Geburt", "Old Child wurde vor dem Elternteil Early Grave geboren"]);
+        assert.deepEqual(await visit.page.locator("#diagnostics .severity").allTextContents(), ["Fehler", "Auffällig", "Auffällig"]);
+        await photograph(visit, "remarks");
+        await visit.page.click("#diagnostics li:last-child .to-person >> nth=0");
+        await visit.still();
+        assert.ok(!(await visit.page.isVisible("#diagnostics")));
+        assert.equal(await visit.focus(), "I2");
+        await visit.page.click("#diagnostics-button");
+        await visit.page.focus("#diagnostics li:nth-child(2) .to-person");
+        await visit.page.keyboard.press("Enter");
+        await visit.still();
+        assert.equal(await visit.focus(), "I1");
+        await visit.end();
+    });
+
     test("a page opens at the person that the command was given, and speaks of the file that it was given", { skip: command ? false : "no olvane command was given" }, async () => {
         const file = fileFor("some.family.ged", "0 HEAD\n0 @3@ INDI\n1 NAME Abe /First/\nno line\n0 @2@ INDI\n1 NAME Bea /Second/\n0 @1@ INDI\n1 NAME Cid /Third/\n0 TRLR\n");
         const page = fileFor("named.html", "");
@@ -238,7 +261,7 @@ describe("opening", kTwoAtOnce, () => {
         const visit = await visitEmpty({ locale: "de" });
         await visit.drop("leer.ged", "");
         await visit.page.waitForSelector('#notices [role="alert"]');
-        assert.match(await visit.page.innerText("#notices"), /leer\.ged: ist leer/);
+        assert.match(await visit.page.innerText("#notices"), /leer\.ged\u2069 ist leer/);
         await visit.end();
     });
 

@@ -3,7 +3,7 @@
 
 // Every rule of the data check, with a family in which it has something to say, and the nearest one in which it has not.
 
-#include <cli/DataCheck.h>
+#include <olvane/source/GedcomCheck.h>
 
 #include <algorithm>
 #include <ostream>
@@ -20,17 +20,17 @@
 namespace olvane::cli {
 namespace {
 
-using Kind = DataFindingKind;
+using Kind = kin::RemarkKind;
 
-std::vector<DataFinding> findingsIn(const std::string& records) {
-    return checkData(gedcom::readGedcomBytes(
-        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n" + records + "0 TRLR\n", "a.ged"));
+gedcom::GedcomData fileOf(const std::string& records) {
+    return gedcom::readGedcomBytes("0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n" + records + "0 TRLR\n",
+                                   "a.ged");
 }
 
 std::string kindsIn(const std::string& records) {
     std::string kinds;
-    for (const DataFinding& finding : findingsIn(records)) {
-        kinds += (kinds.empty() ? "" : " ") + std::string(nameOf(finding.kind));
+    for (const gedcom::FileRemark& finding : gedcom::checkData(fileOf(records))) {
+        kinds += (kinds.empty() ? "" : " ") + std::string(finding.kind());
     }
     return kinds;
 }
@@ -142,17 +142,24 @@ TEST(DataCheckRules, areAllTested) {
 }
 
 TEST(DataCheckRules, nameTheRecordsConcernedAndTheLine) {
-    const auto findings = findingsIn(parentAndChild("HUSB", "1800", "", "1799"));
+    const gedcom::GedcomData data = fileOf(parentAndChild("HUSB", "1800", "", "1799"));
+    const auto findings = gedcom::checkData(data);
     ASSERT_EQ(findings.size(), 1U);
     EXPECT_THAT(findings[0].xrefs, ::testing::ElementsAre("C", "P"));
     EXPECT_EQ(findings[0].line, 10U);
-    EXPECT_EQ(findings[0].text, "@C@ C Test was born before the parent @P@ P Test");
+    EXPECT_THAT(findings[0].persons, ::testing::ElementsAre(2, 1));
+    EXPECT_EQ(gedcom::remarkText(data, findings[0], kin::Language::english),
+              "@C@ C Test was born before the parent @P@ P Test");
+    EXPECT_EQ(gedcom::remarkText(data, findings[0], kin::Language::german),
+              "@C@ C Test wurde vor dem Elternteil @P@ P Test geboren");
 }
 
 TEST(DataCheckRules, stateTheLongestLifeThatTheLivingAreJudgedBy) {
-    const auto findings = findingsIn(life("1700", "1900"));
+    const gedcom::GedcomData data = fileOf(life("1700", "1900"));
+    const auto findings = gedcom::checkData(data);
     ASSERT_EQ(findings.size(), 1U);
-    EXPECT_EQ(findings[0].text, "@P@ P Test lived for more than " + std::to_string(kLongestLife) + " years");
+    EXPECT_EQ(gedcom::remarkText(data, findings[0], kin::Language::english),
+              "@P@ P Test lived for more than " + std::to_string(kLongestLife) + " years");
 }
 
 }  // namespace

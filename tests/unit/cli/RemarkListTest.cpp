@@ -24,7 +24,7 @@ gedcom::GedcomData oddFile() {
 
 TEST(RemarkList, hasTheFileFirstThenTheData) {
     const auto data = oddFile();
-    const auto remarks = remarksOf(data);
+    const auto remarks = remarksOf(data, kin::Language::english);
     ASSERT_EQ(remarks.size(), 2U);
     EXPECT_EQ(remarks[0].kind, "danglingPointer");
     EXPECT_EQ(remarks[0].severity, "error");
@@ -39,14 +39,14 @@ TEST(RemarkList, hasTheFileFirstThenTheData) {
 // The text begins with an @ and the file's name with a sign of a formula.
 TEST(RemarkList, isATableForSpreadsheets) {
     const auto data = oddFile();
-    EXPECT_EQ(remarksTable(data, {remarksOf(data)[1]}),
+    EXPECT_EQ(remarksTable(data, {remarksOf(data, kin::Language::english)[1]}),
               "kind\tseverity\tfile\tline\txrefs\ttext\n"
               "diedBeforeBirth\todd\t'=odd.ged\t3\tI1\t'@I1@ Ada Lund died before being born\n");
 }
 
 TEST(RemarkList, isJson) {
     const auto data = oddFile();
-    const auto json = nlohmann::json::parse(checkJson(data, remarksOf(data), {}));
+    const auto json = nlohmann::json::parse(checkJson(data, remarksOf(data, kin::Language::english), {}));
     EXPECT_EQ(json["remarks"][1]["xrefs"], nlohmann::json::array({"I1"}));
     EXPECT_EQ(json["remarks"][1]["line"], 3);
     EXPECT_FALSE(json.contains("layouts"));

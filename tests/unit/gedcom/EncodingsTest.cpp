@@ -336,7 +336,7 @@ std::string mismatchOf(std::string_view names, std::string_view encoding) {
     for (int i = 0; i < 3; ++i) records.append("0 INDI\n1 NAME ").append(names).append("\n");
     const GedcomData data = read(document(records, encoding));
     for (const Diagnostic& diagnostic : data.diagnostics()) {
-        if (diagnostic.severity == Severity::error) return diagnostic.done;
+        if (diagnostic.severity == Severity::error) return doneText(diagnostic);
     }
     return {};
 }

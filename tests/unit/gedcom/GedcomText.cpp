@@ -41,7 +41,8 @@ std::vector<std::string> reported(const GedcomData& data, DiagnosticKind kind) {
     for (const Diagnostic& diagnostic : data.diagnostics()) {
         if (diagnostic.kind != kind) continue;
         std::string text = std::to_string(diagnostic.line);
-        texts.push_back(text.append(": ").append(diagnostic.what).append("; ").append(diagnostic.done));
+        texts.push_back(
+            text.append(": ").append(whatText(diagnostic)).append("; ").append(doneText(diagnostic)));
     }
     return texts;
 }

@@ -3,8 +3,6 @@
 
 // German.
 
-import { translatorOf } from "./remarks";
-import { germanRemarks } from "./remarks.de";
 import type { UiMessages } from "./ui";
 
 export const uiGerman: UiMessages = {
@@ -199,11 +197,12 @@ export const uiGerman: UiMessages = {
         summary: (persons, problems) =>
             `${persons.toLocaleString("de")} ${persons === 1 ? "Person" : "Personen"} gelesen, mit ${problems} ${problems === 1 ? "Anmerkung" : "Anmerkungen"}.`,
         line: (n) => `Zeile ${n}`,
-        severities: { error: "Fehler", warning: "Warnung", note: "Hinweis" },
+        severities: { error: "Fehler", warning: "Warnung", note: "Hinweis", odd: "Auffällig" },
         furtherOnes: (n) => `und ${n} weitere`,
-        remark: translatorOf(germanRemarks),
+        showAll: (n) => `Alle ${n} zeigen`,
     },
     errors: {
+        empty: (name) => `${name} ist leer.`,
         notGedcom: (name) => `${name} ließ sich nicht als Familiendatei lesen.`,
         hint: "Eine GEDCOM-Datei beginnt mit der Zeile „0 HEAD“. Die meisten Ahnenprogramme schreiben eine unter Export.",
         noPersons: (name) => `${name} enthält keine Person.`,

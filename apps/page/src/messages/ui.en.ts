@@ -197,11 +197,12 @@ export const uiEnglish: UiMessages = {
         summary: (persons, problems) =>
             `${persons.toLocaleString("en")} ${persons === 1 ? "person was" : "persons were"} read, with ${problems} ${problems === 1 ? "remark" : "remarks"}.`,
         line: (n) => `line ${n}`,
-        severities: { error: "Error", warning: "Warning", note: "Note" },
+        severities: { error: "Error", warning: "Warning", note: "Note", odd: "Odd" },
         furtherOnes: (n) => `and ${n} more`,
-        remark: (english) => english,
+        showAll: (n) => `Show all ${n}`,
     },
     errors: {
+        empty: (name) => `${name} is empty.`,
         notGedcom: (name) => `${name} could not be read as a family file.`,
         hint: "A GEDCOM file begins with the line “0 HEAD”. Most genealogy programs write one under Export.",
         noPersons: (name) => `${name} holds no person.`,

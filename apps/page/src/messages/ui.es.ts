@@ -202,11 +202,12 @@ export const uiSpanish: UiMessages = {
         summary: (persons, problems) =>
             `Se ${persons === 1 ? "leyó" : "leyeron"} ${persons.toLocaleString("es")} ${persons === 1 ? "persona" : "personas"}, con ${problems} ${problems === 1 ? "observación" : "observaciones"}.`,
         line: (n) => `línea ${n}`,
-        severities: { error: "Error", warning: "Advertencia", note: "Nota" },
+        severities: { error: "Error", warning: "Advertencia", note: "Nota", odd: "Extraño" },
         furtherOnes: (n) => `y ${n} más`,
-        remark: (english) => english,
+        showAll: (n) => `Mostrar los ${n}`,
     },
     errors: {
+        empty: (name) => `${name} está vacío.`,
         notGedcom: (name) => `${name} no se pudo leer como archivo de familia.`,
         hint: "Un archivo GEDCOM empieza por la línea «0 HEAD». La mayoría de los programas de genealogía lo crean con Exportar.",
         noPersons: (name) => `${name} no contiene ninguna persona.`,

@@ -167,12 +167,12 @@ export interface UiMessages {
         readonly button: (n: number) => string;
         readonly summary: (persons: number, problems: number) => string;
         readonly line: (n: number) => string;
-        readonly severities: { readonly error: string; readonly warning: string; readonly note: string };
+        readonly severities: Readonly<Record<"error" | "warning" | "note" | "odd", string>>;
         readonly furtherOnes: (n: number) => string;
-        /** A remark of the reader, which speaks English. */
-        readonly remark: (english: string) => string;
+        readonly showAll: (n: number) => string;
     };
     readonly errors: {
+        readonly empty: (name: string) => string;
         readonly notGedcom: (name: string) => string;
         readonly hint: string;
         readonly noPersons: (name: string) => string;

@@ -4,7 +4,7 @@
 // The page around the viewer: the bar, the dialogs, the address and what the browser's own history keeps of it.
 // Files come in through FileOpening; everything about the picture is the viewer's.
 
-import type { Diagnostic, GedcomFile, Person } from "olvane";
+import type { GedcomFile, Person } from "olvane";
 import { iconButton } from "../base/controls";
 import { html, recall, remember } from "../base/dom";
 import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
@@ -32,6 +32,7 @@ import {
 import { Chrome, type ChromeActions } from "./Chrome";
 import { fileInput, takeDrops } from "./dropping";
 import { FileOpening, type OpenedFile } from "./FileOpening";
+import { FileRemarks } from "./FileRemarks";
 import { Journey } from "./Journey";
 import { canKeep, keepFile, keptFile, removeKeptFile } from "./KeptFile";
 import { isMapAddress, mapComplaint, MapHost } from "./MapHost";
@@ -41,6 +42,8 @@ import { CancelledError, Reading } from "./Reading";
 import { Welcome } from "./Welcome";
 
 const kNarrow = "(max-width: 720px)"; // as in styles/shell.css
+const kSoonChecked = 6000; // persons
+const kCheckDelay = 1500; // ms
 
 export class App implements ChromeActions {
     private ui: UiMessages;
@@ -49,9 +52,10 @@ export class App implements ChromeActions {
     private fileName = "";
     private isKept = false; // the open file, in the browser
     private encoding = ""; // that was chosen; empty for the file's own word
-    private remarks: readonly Diagnostic[] = [];
+    private remarks: FileRemarks | null = null;
     private panelOpen = recall("panel") !== "no";
     private kinshipInBoxes = recall("kinship") !== "no";
+    private remarkTimer = 0;
     // Whether the next picture is one that the history leads to.
     private arriving = false;
 
@@ -118,7 +122,7 @@ export class App implements ChromeActions {
         if (hash !== "" && !isMapAddress(hash) && hasText) return this.openEmbedded(embedded);
         this.unread = embedded;
         this.fileName = embedded.name;
-        this.remarks = embedded.remarks ?? [];
+        this.remarks = new FileRemarks(this.files.engine, null, embedded.remarks ?? []);
         document.title = embedded.title;
         this.showMap(isMapAddress(hash) ? hash : `#map=&number=${embedded.focus}`);
         this.journey.begin(this.maps.address, true);
@@ -157,7 +161,7 @@ export class App implements ChromeActions {
         else this.maps.forget();
         this.unread = null;
         this.fileName = name;
-        this.remarks = embedded?.remarks ?? file.diagnostics;
+        this.remarks = new FileRemarks(this.files.engine, file, embedded?.remarks ?? null);
         this.tree.setFamily(family);
         document.title = title;
         this.arrange();
@@ -528,6 +532,10 @@ export class App implements ChromeActions {
         return family.file.search(text, limit).map((hit) => ({ person: family.person(hit.person)!, hit }));
     }
 
+    person(id: number): Person | undefined {
+        return this.tree.family?.person(id);
+    }
+
     nameOf(person: Person): string {
         return this.tree.nameOf(person);
     }
@@ -583,9 +591,19 @@ export class App implements ChromeActions {
         this.showKept();
         chrome.showPhotos(family !== null && family.photographs !== Photographs.none);
         chrome.showEncoding(this.files.canReadAgain ? this.encoding : null);
-        chrome.showDiagnostics(this.remarks, count);
+        this.showRemarks();
         this.showPanelState();
         this.showState();
+    }
+
+    // The data of a large family are looked at when its picture is shown.
+    private showRemarks(): void {
+        const { chrome, remarks, ui } = this;
+        const count = this.tree.family?.persons.length ?? this.maps.count;
+        clearTimeout(this.remarkTimer);
+        const list = (): void => chrome.showDiagnostics(remarks?.in(ui.language) ?? [], count);
+        if (count <= kSoonChecked) list();
+        else this.remarkTimer = window.setTimeout(list, kCheckDelay);
     }
 
     private showState(): void {

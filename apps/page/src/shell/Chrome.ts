@@ -4,19 +4,21 @@
 // The bar at the top with its two panels, the buttons that float over the picture, the legend, and the
 // dialogs. All of it is made anew when the language changes.
 
-import type { Diagnostic } from "olvane";
+import type { Person } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
 import { hasGroups, kRelativeNames, type RelativeName } from "../base/views";
 import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
 import { iconButton } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import { icon } from "../base/icons";
+import type { ListedRemark } from "./FileRemarks";
 import { Popover } from "./Popover";
 import { SearchBox, type SearchSource } from "./SearchBox";
 import { type ViewActions, ViewChooser } from "./ViewChooser";
 import { kThemeChoices, type ThemeChoice } from "./theme";
 
 export interface ChromeActions extends SearchSource, ViewActions {
+    person(id: number): Person | undefined;
     setRelative(name: RelativeName, shown: boolean): void;
     setGenerations(generations: number): void;
     setKinshipInBoxes(shown: boolean): void;
@@ -69,7 +71,7 @@ const kEncodings = [
     "IBM850",
     "macintosh",
 ] as const;
-const kMostDiagnostics = 500; // listed; the rest is counted
+const kMostDiagnostics = 500; // listed until all are asked for
 
 export class Chrome {
     readonly bar: HTMLElement;
@@ -202,20 +204,33 @@ export class Chrome {
         this.buttons.panel.setAttribute("aria-pressed", String(open));
     }
 
-    showDiagnostics(found: readonly Diagnostic[], persons: number): void {
+    showDiagnostics(found: readonly ListedRemark[], persons: number): void {
         const { ui } = this;
         const label = ui.diagnostics.button(found.length);
         this.diagnosticsButton.hidden = found.length === 0;
         this.diagnosticsButton.setAttribute("aria-label", label);
         this.diagnosticsButton.title = label;
-        const items = found.slice(0, kMostDiagnostics).map((one) => this.diagnosticItem(one));
-        if (found.length > kMostDiagnostics)
-            items.push(html("li", {}, ui.diagnostics.furtherOnes(found.length - kMostDiagnostics)));
         this.diagnostics.replaceChildren(
             this.dialogHead("diagnostics-title", ui.diagnostics.title, this.diagnostics),
             html("p", { class: "quiet" }, ui.diagnostics.summary(persons, found.length)),
-            html("ul", { class: "diagnostics", tabindex: 0, "aria-label": label }, ...items),
+            this.remarkList(found, label),
         );
+    }
+
+    private remarkList(found: readonly ListedRemark[], label: string): HTMLElement {
+        const list = html("ul", { class: "diagnostics", tabindex: 0, "aria-label": label });
+        const append = (some: readonly ListedRemark[]) => list.append(...some.map((one) => this.remarkItem(one)));
+        append(found.slice(0, kMostDiagnostics));
+        if (found.length <= kMostDiagnostics) return list;
+        const all = html("button", { type: "button", class: "plain" }, this.ui.diagnostics.showAll(found.length));
+        const last = html("li", {}, all);
+        onClick(all, () => {
+            last.remove();
+            append(found.slice(kMostDiagnostics));
+            (list.children[kMostDiagnostics] as HTMLElement).querySelector("button")?.focus();
+        });
+        list.append(last);
+        return list;
     }
 
     // When the dialog is closed, the keys are on the button that opens it again.
@@ -224,16 +239,29 @@ export class Chrome {
         this.diagnostics.showModal();
     }
 
-    private diagnosticItem({ line, severity, message, hint }: Diagnostic): HTMLLIElement {
+    private remarkItem({ line, severity, persons, text, hint }: ListedRemark): HTMLLIElement {
         const { diagnostics } = this.ui;
         return html(
             "li",
             { class: severity },
             html("span", { class: "severity" }, diagnostics.severities[severity]),
             line > 0 && html("span", { class: "line" }, diagnostics.line(line)),
-            html("span", { class: "message", dir: "auto" }, diagnostics.remark(message)),
-            Boolean(hint) && html("span", { class: "hint", dir: "auto" }, diagnostics.remark(hint)),
+            html("span", { class: "message", dir: "auto" }, text),
+            Boolean(hint) && html("span", { class: "hint", dir: "auto" }, hint),
+            ...persons.map((person) => this.personButton(person)),
         );
+    }
+
+    // Leads to a person whom a remark is about.
+    private personButton(id: number): HTMLElement | null {
+        const person = this.actions.person(id);
+        if (!person) return null;
+        const button = html("button", { type: "button", class: "plain to-person", "data-person-id": id, dir: "auto" }, this.actions.nameOf(person));
+        onClick(button, () => {
+            this.diagnostics.close();
+            this.actions.choose(person);
+        });
+        return button;
     }
 
     private barElement(): HTMLElement {

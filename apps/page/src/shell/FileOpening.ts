@@ -23,7 +23,7 @@ export interface OpenedFile {
 }
 
 export class FileOpening {
-    constructor(private readonly engine: Olvane) {}
+    constructor(readonly engine: Olvane) {}
 
     // The file as it was opened, and the GEDCOM text in it.
     private last: {
@@ -62,6 +62,7 @@ export class FileOpening {
         const bytes = new Uint8Array(await file.arrayBuffer());
         const archive = isArchive(bytes) ? new Archive(bytes) : null;
         const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
+        if (gedcom.length === 0) throw new EmptyFileError();
         const photographs = archive ? Photographs.inArchive(archive) : Photographs.none;
         const opened =
             gedcom.length < kLargeFile
@@ -77,9 +78,9 @@ export class FileOpening {
         const file = "\u2068" + name + "\u2069";
         if (error instanceof TooLargeError) return [errors.notGedcom(file), [errors.tooLarge]];
         if (error instanceof ArchiveError) return [errors.archive, []];
+        if (error instanceof EmptyFileError) return [errors.empty(file), [errors.hint]];
         if (error instanceof NoPersonsError) return [errors.noPersons(file), []];
-        const detail = error instanceof Error ? error.message : "";
-        return [errors.notGedcom(file), [ui.diagnostics.remark(detail), errors.hint]];
+        return [errors.notGedcom(file), [errors.hint]];
     }
 
     // In a worker, so that the page goes on; or here, in a browser that starts none.
@@ -114,6 +115,8 @@ export class FileOpening {
         return { file, name, photographs, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
     }
 }
+
+class EmptyFileError extends Error {}
 
 // What was read is GEDCOM, with nobody in it.
 class NoPersonsError extends Error {}
