@@ -32,6 +32,8 @@ const chosen = (visit) => visit.page.textContent("#map-card h2");
 async function visitMap(path, settings = {}, hash = "") {
     const visit = await visitFile(path, settings, hash);
     await visit.page.waitForSelector("#map canvas");
+    await visit.page.waitForFunction(() => location.hash.startsWith("#map="));
+    await visit.page.evaluate(() => new Promise((drawn) => requestAnimationFrame(() => requestAnimationFrame(drawn))));
     return visit;
 }
 
@@ -223,6 +225,59 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
             await visit.end();
         });
     }
+
+    test("lines to adopted children are dashed, and where lines cross one has a gap", async () => {
+        const adopted = (pedigree) =>
+            ["0 HEAD", "0 @A@ INDI", "1 SEX M", "1 FAMS @F@", "0 @B@ INDI", "1 SEX F", "1 FAMS @F@", "0 @C@ INDI", "1 FAMC @F@",
+                `2 PEDI ${pedigree}`, "0 @D@ INDI", "1 FAMC @F@", "0 @F@ FAM", "1 HUSB @A@", "1 WIFE @B@", "1 CHIL @C@", "1 CHIL @D@", "0 TRLR"].join("\n");
+        const pieces = [];
+        for (const pedigree of ["birth", "adopted"]) {
+            const visit = await visitMap(mapPage(adopted(pedigree)).path, {}, "#map=128,76,2");
+            pieces.push(await visit.page.evaluate(() => {
+                const canvas = document.querySelector("#map canvas");
+                const { width, height } = canvas;
+                const { data } = canvas.getContext("2d").getImageData(0, 0, width, height);
+                // The most pieces of one colour, but that of the page, that any column between parents and child has.
+                let most = 0;
+                for (let x = width / 2 - 300; x < width / 2 + 300; ++x) {
+                    let count = 0;
+                    for (let y = Math.floor(height / 2) - 38; y < height / 2 + 38; ++y) {
+                        const at = (y * width + x) * 4;
+                        if (data[at] < 200 && data[at - 4 * width] > 200) ++count;
+                    }
+                    most = Math.max(most, count);
+                }
+                return most;
+            }));
+            await visit.end();
+        }
+        assert.ok(pieces[0] <= 1 && pieces[1] >= 3, pieces.join());
+
+        // Of four couples, somebody of each marries somebody of every other: that cannot be drawn without a crossing.
+        const lines = ["0 HEAD"];
+        for (let f = 0; f < 4; ++f) {
+            lines.push(`0 @H${f}@ INDI`, "1 SEX M", `0 @W${f}@ INDI`, "1 SEX F", `0 @F${f}@ FAM`, `1 HUSB @H${f}@`, `1 WIFE @W${f}@`);
+            for (let g = 0; g < 4; ++g) if (g !== f) lines.push(`1 CHIL @C${f}${g}@`);
+        }
+        for (let f = 0; f < 4; ++f) for (let g = 0; g < 4; ++g) if (f !== g) lines.push(`0 @C${f}${g}@ INDI`, `1 SEX ${f < g ? "M" : "F"}`);
+        for (let f = 0; f < 4; ++f) for (let g = f + 1; g < 4; ++g) lines.push(`0 @P${f}${g}@ FAM`, `1 HUSB @C${f}${g}@`, `1 WIFE @C${g}${f}@`);
+        const visit = await visitMap(mapPage([...lines, "0 TRLR"].join("\n")).path, { viewport: { width: 1900, height: 700 } }, "#map=800,100,0.8");
+        const gaps = await visit.page.evaluate(() => {
+            const canvas = document.querySelector("#map canvas");
+            const { width, height } = canvas;
+            const { data } = canvas.getContext("2d").getImageData(0, 0, width, height);
+            const isLine = (x, y) => data[(y * width + x) * 4] < 200;
+            const areLine = (from, to, y) => Array.from({ length: to - from }, (_, i) => isLine(from + i, y)).every(Boolean);
+            let gaps = 0;
+            for (let y = 1; y < height; ++y)
+                for (let x = 8; x + 8 < width; ++x)
+                    if (isLine(x, y) && !isLine(x - 1, y) && !isLine(x + 1, y) && areLine(x - 7, x - 1, y) && areLine(x + 2, x + 8, y)) ++gaps;
+            return gaps;
+        });
+        assert.ok(gaps > 0, String(gaps));
+        await photograph(visit, "map-crossings");
+        await visit.end();
+    });
 
     test("flights over 4,000 persons at random break nothing", async () => {
         const visit = await visitMap(mapPage(madeFamily(2000)).path);

@@ -33,6 +33,8 @@ export interface PixelColours {
 const kBlocks = [8, 64, 512]; // lines of which the longest stands for all
 const kMostLines = 12000; // drawn in a frame
 const kFar = 3; // px of a box below which colours are those of surnames
+const kNear = 60; // px of a box from which on lines have dashes and gaps
+const kGap = 4; // quarters of a point beside an upright, less than to its neighbour
 const kEdged = 8; // px of a box from which on it has an edge
 const kDashed = 3; // the role of lines to children that are none by birth
 const kDivorcedLine = 1;
@@ -43,6 +45,7 @@ export class MapPixels {
     private image = new ImageData(1, 1);
     private pixels = new Uint32Array(1);
     private readonly longest: { bars: Uint32Array[]; uprights: Uint32Array[] };
+    private isNear = false;
     private readonly furthest: Int32Array; // of each block of 64 bars, the greatest x2
 
     constructor(private readonly map: FamilyMap) {
@@ -87,11 +90,17 @@ export class MapPixels {
         const level = total <= kMostLines ? -1 : fitting < 0 ? kBlocks.length - 1 : fitting;
         const boxPx = arrays.boxWidth * frame.sx;
         const paint = mixed(colours.page, colours.line, Math.min(1, Math.max(0.3, boxPx / (24 * frame.dpr))));
-        const thick = boxPx > 60 * frame.dpr ? Math.max(1, Math.round(1.4 * frame.dpr)) : 1;
-        for (const { first, end, from, to } of seen) {
+        this.isNear = boxPx > kNear * frame.dpr;
+        const thick = this.thickness(frame);
+        for (const { from, to } of seen)
             this.each("bars", level, from, to, left, (i) => this.bar(frame, i, paint, thick));
-            this.each("uprights", level, first, end, -Infinity, (i) => this.upright(frame, i, paint, thick));
-        }
+        // Bars pass below uprights, with a gap, so that no crossing looks like a corner.
+        for (const { first, end } of seen)
+            this.each("uprights", level, first, end, -Infinity, (i) => this.upright(frame, i, paint, thick, colours.page));
+    }
+
+    private thickness({ dpr }: Frame): number {
+        return this.isNear ? Math.max(1, Math.round(1.4 * dpr)) : 1;
     }
 
     // Those from begin to end that reach beyond left, or the longest of each block of them.
@@ -119,16 +128,20 @@ export class MapPixels {
         const x1 = Math.round(low[i]! * frame.sx) + frame.ox;
         const x2 = Math.round(high[i]! * frame.sx) + frame.ox + thick;
         const role = roles[i]!;
-        if (thick > 1 && (role === kDashed || role === kDivorcedLine)) this.dashes(frame, x1, x2, y, thick, paint, true);
+        if (this.isNear && (role === kDashed || role === kDivorcedLine)) this.dashes(frame, x1, x2, y, thick, paint, true);
         else this.rect(frame, x1, y, x2, y + thick, paint);
     }
 
-    private upright(frame: Frame, i: number, paint: number, thick: number): void {
+    private upright(frame: Frame, i: number, paint: number, thick: number, page: number): void {
         const { low, high, at, roles } = this.map.arrays.uprights;
         const x = Math.round(at[i]! * frame.sx) + frame.ox;
         const y1 = Math.round(low[i]! * frame.sy) + frame.oy;
         const y2 = Math.round(high[i]! * frame.sy) + frame.oy + thick;
-        if (thick > 1 && roles[i] === kDashed) this.dashes(frame, y1, y2, x, thick, paint, false);
+        if (this.isNear) {
+            const gap = Math.max(1, Math.round(frame.sx * kGap));
+            this.rect(frame, x - gap, y1 + gap + thick, x + thick + gap, y2 - gap - thick, page);
+        }
+        if (this.isNear && roles[i] === kDashed) this.dashes(frame, y1, y2, x, thick, paint, false);
         else this.rect(frame, x, y1, x + thick, y2, paint);
     }
 
@@ -184,8 +197,8 @@ export class MapPixels {
         if ((flag & kJoined) !== 0) {
             const y = top + (height >> 1);
             const to = Math.round(x[p + 1]! * frame.sx) + frame.ox;
-            const thick = width > 60 * frame.dpr ? Math.max(1, Math.round(1.4 * frame.dpr)) : 1;
-            if ((flag & kDivorced) !== 0 && thick > 1) this.dashes(frame, px + width, to, y, thick, colours.line, true);
+            const thick = this.thickness(frame);
+            if ((flag & kDivorced) !== 0 && this.isNear) this.dashes(frame, px + width, to, y, thick, colours.line, true);
             else this.rect(frame, px + width, y, to, y + thick, colours.line);
         }
         if (width < kEdged * frame.dpr) return this.rect(frame, px, top, px + width, top + height, isKin ? colours.kin : edge);
