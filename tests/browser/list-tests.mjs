@@ -14,14 +14,16 @@ const kBeginning = /^( *)(describe|test)\((["`])(.*?)(?<!\\)\3,/;
 
 for (const file of process.argv.slice(2)) {
     let suite = basename(file).replace(/\.(test\.ts|mjs)$/, "");
-    for (const line of readFileSync(file, "utf8").split("\n")) {
+    const text = readFileSync(file, "utf8").replace(/\b(describe|test)\(\s+/g, "$1(");
+    for (const line of text.split("\n")) {
         const found = kBeginning.exec(line);
         if (!found) continue;
-        const [, indent, kind, quote, text] = found;
-        const title = text.replaceAll(`\\${quote}`, quote);
+        const [, indent, kind, quote, written] = found;
+        const title = written.replaceAll(`\\${quote}`, quote);
         if (kind === "describe") suite = title;
         const at = quote === "`" ? title.indexOf("${") : -1;
         const name = kind === "test" && indent === "" ? basename(file).replace(/\.(test\.ts|mjs)$/, "") : suite;
-        if (kind === "test") console.log(`${name}\t${at < 0 ? title : title.slice(0, at)}\t${at < 0 ? "whole" : "prefix"}`);
+        if (kind === "test")
+            console.log(`${name}\t${at < 0 ? title : title.slice(0, at)}\t${at < 0 ? "whole" : "prefix"}`);
     }
 }
