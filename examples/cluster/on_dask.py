@@ -98,9 +98,9 @@ def main() -> None:
             client.upload_file(family_jobs.__file__)
             count = run_all(client, chosen.families, jobs, chosen.out, chosen.kill_one, chosen.jobs_per_task)
     else:
-        with LocalCluster(
-            n_workers=chosen.workers, threads_per_worker=1, dashboard_address=None
-        ) as cluster, Client(cluster) as client:
+        with LocalCluster(n_workers=chosen.workers, threads_per_worker=1, dashboard_address=None) as cluster, Client(
+            cluster
+        ) as client:
             count = run_all(client, chosen.families, jobs, chosen.out, chosen.kill_one, chosen.jobs_per_task)
     seconds = time.perf_counter() - start
     lines, digest = digest_of(chosen.out)

@@ -12,7 +12,9 @@ import time
 import olvane
 
 PERSONS = "SELECT id, father, mother, sex, dead, birth, death, name FROM person ORDER BY {birth}, id"
-COUPLES = "SELECT id AS number, husband AS partner0, wife AS partner1, state, day AS marriage FROM couple ORDER BY {day}, id"
+COUPLES = (
+    "SELECT id AS number, husband AS partner0, wife AS partner1, state, day AS marriage FROM couple ORDER BY {day}, id"
+)
 
 
 def connect(name: str) -> tuple[object, str]:

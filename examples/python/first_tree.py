@@ -63,9 +63,7 @@ def draw(boxes: list[olvane.Record]) -> str:
         svg += [f'<path d="M{line.x1} {line.y1}L{line.x2} {line.y2}" stroke="black"/>' for line in box.segments]
     for box in boxes:
         name = PERSONS[box.id].name if box.kind is olvane.RecordKind.PERSON else "?"
-        svg.append(
-            f'<rect x="{box.x}" y="{box.y}" width="{width}" height="{height}" fill="white" stroke="black"/>'
-        )
+        svg.append(f'<rect x="{box.x}" y="{box.y}" width="{width}" height="{height}" fill="white" stroke="black"/>')
         svg.append(f'<text x="{box.x + 4}" y="{box.y + 44}" font-size="10">{name}</text>')
     return "\n".join([*svg, "</svg>", ""])
 

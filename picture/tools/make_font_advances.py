@@ -89,7 +89,9 @@ def write_array(name, advances, first, last):
 def main():
     regular, bold = advances_of(sys.argv[1]), advances_of(sys.argv[2])
     print("// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n")
-    print("// Written by picture/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and")
+    print(
+        "// Written by picture/tools/make_font_advances.py; not edited by hand. Pen advances of DejaVu Sans, regular and"
+    )
     print("// bold, in hundredths of an em, rounded up. A character of a block with 0 is not in the font.\n")
     print("// clang-format off\n")
     print("#include <olvane/picture/FontAdvancesInternal.h>\n")

@@ -16,11 +16,66 @@ import sys
 LAST = 0x10FFFF
 HANGUL = range(0xAC00, 0xD7A4)
 
-GRAPHEME = ["Other", "CR", "LF", "Control", "Extend", "ZWJ", "Regional_Indicator", "Prepend", "SpacingMark", "L", "V",
-            "T", "LV", "LVT", "ExtPict"]
-LINE = ["AL", "B2", "BA", "BB", "BK", "CB", "CL", "CM", "CP", "CPwide", "CR", "EB", "EM", "EX", "GL", "H2", "H3", "HL",
-        "HY", "ID", "IDpict", "IN", "IS", "JL", "JT", "JV", "LF", "NL", "NS", "NU", "OP", "OPwide", "PO", "PR", "QU",
-        "RI", "SP", "SY", "WJ", "ZW", "ZWJ"]
+GRAPHEME = [
+    "Other",
+    "CR",
+    "LF",
+    "Control",
+    "Extend",
+    "ZWJ",
+    "Regional_Indicator",
+    "Prepend",
+    "SpacingMark",
+    "L",
+    "V",
+    "T",
+    "LV",
+    "LVT",
+    "ExtPict",
+]
+LINE = [
+    "AL",
+    "B2",
+    "BA",
+    "BB",
+    "BK",
+    "CB",
+    "CL",
+    "CM",
+    "CP",
+    "CPwide",
+    "CR",
+    "EB",
+    "EM",
+    "EX",
+    "GL",
+    "H2",
+    "H3",
+    "HL",
+    "HY",
+    "ID",
+    "IDpict",
+    "IN",
+    "IS",
+    "JL",
+    "JT",
+    "JV",
+    "LF",
+    "NL",
+    "NS",
+    "NU",
+    "OP",
+    "OPwide",
+    "PO",
+    "PR",
+    "QU",
+    "RI",
+    "SP",
+    "SY",
+    "WJ",
+    "ZW",
+    "ZWJ",
+]
 WIDTH = ["usual", "none", "wide", "emoji"]
 DIRECTION = ["neutral", "leftToRight", "rightToLeft"]
 
@@ -99,8 +154,12 @@ class Database:
     def record(self, code):
         # Syllables differ in a regular way, which the reader of the table computes.
         code = HANGUL.start if code in HANGUL else code
-        return (GRAPHEME.index(self.grapheme_class(code)), LINE.index(self.line_class(code)),
-                WIDTH.index(self.width_class(code)), DIRECTION.index(self.direction_class(code)))
+        return (
+            GRAPHEME.index(self.grapheme_class(code)),
+            LINE.index(self.line_class(code)),
+            WIDTH.index(self.width_class(code)),
+            DIRECTION.index(self.direction_class(code)),
+        )
 
 
 def runs_of(database):
@@ -125,7 +184,7 @@ def packed_length(count):
 
 def printed(values, width):
     values = [str(value) for value in values]
-    return "\n".join("    " + ", ".join(values[i:i + width]) + "," for i in range(0, len(values), width))
+    return "\n".join("    " + ", ".join(values[i : i + width]) + "," for i in range(0, len(values), width))
 
 
 def version_of(folder):
@@ -142,7 +201,8 @@ def main():
     records = sorted({record for _, record in runs})
     numbers = {record: i for i, record in enumerate(records)}
     lengths = [byte for count, _ in runs for byte in packed_length(count)]
-    print(f"""// SPDX-FileCopyrightText: The Olvane developers
+    print(
+        f"""// SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
 // Made by picture/tools/make_text_table.py from Unicode {version_of(folder)}; not edited by hand.
@@ -152,7 +212,8 @@ def main():
 // clang-format off
 namespace olvane::picture {{
 
-const TextRecord kTextRecords[] = {{""")
+const TextRecord kTextRecords[] = {{"""
+    )
     print("\n".join(f"    {{{g}, {l}, {w}, {d}}}," for g, l, w, d in records))
     print(f"}};\n\nconst std::uint8_t kTextRunLengths[] = {{\n{printed(lengths, 28)}\n}};")
     print(f"\nconst std::uint8_t kTextRunRecords[] = {{\n{printed([numbers[r] for _, r in runs], 28)}\n}};")

@@ -40,8 +40,11 @@ def status_of(path: str, title: str, prefix: bool) -> int:
 def unlisted(path: str, listing: str) -> int:
     with open(listing, encoding="utf-8") as file:
         known = [line.rstrip("\n").split("\t") for line in file]
-    lost = [case.get("name") for case in results(path)
-            if case.find("skipped") is None and not any(is_of(case, title, kind == "prefix") for _, title, kind in known)]
+    lost = [
+        case.get("name")
+        for case in results(path)
+        if case.find("skipped") is None and not any(is_of(case, title, kind == "prefix") for _, title, kind in known)
+    ]
     print(f"not listed: {lost}" if lost else f"{len(results(path))} tests ran, all listed")
     return 1 if lost or not results(path) else 0
 

@@ -111,7 +111,9 @@ class Outputs:
         for person in self.people:
             if person[0] in seen:
                 continue
-            layout = json.loads(run(self.command, "layout", self.path, "--focus", person[0], "--format", "json1", *self.hiding))
+            layout = json.loads(
+                run(self.command, "layout", self.path, "--focus", person[0], "--format", "json1", *self.hiding)
+            )
             for box in layout["boxes"]:
                 seen.add(str(box["id"]))
                 if box.get("living"):
@@ -128,15 +130,29 @@ class Outputs:
         layout = run(self.command, "layout", self.path, "--focus", focus, "--format", "json1", *self.hiding)
         self.texts["json " + name] = layout.decode()
         for view in ("family", "hourglass", "relatives"):
-            chart = run(self.command, "layout", self.path, "--focus", focus, "--view", view, "--format", "json", *self.hiding)
+            chart = run(
+                self.command, "layout", self.path, "--focus", focus, "--view", view, "--format", "json", *self.hiding
+            )
             self.texts[view + " " + name] = chart.decode()
         for ending in (".svg", ".pdf", ".png"):
             picture = self.folder / ("out" + ending)
-            words = [self.command, "draw", self.path, "--focus", focus, "-o", str(picture),
-                     "--show", "dates,places,occupation,marriage", *self.hiding]
+            words = [
+                self.command,
+                "draw",
+                self.path,
+                "--focus",
+                focus,
+                "-o",
+                str(picture),
+                "--show",
+                "dates,places,occupation,marriage",
+                *self.hiding,
+            ]
             if subprocess.run(words, capture_output=True, timeout=120).returncode == 0:
                 data = picture.read_bytes()
-                self.texts[ending + " " + name] = unpacked_pdf(data) if ending == ".pdf" else data.decode("utf-8", "replace")
+                self.texts[ending + " " + name] = (
+                    unpacked_pdf(data) if ending == ".pdf" else data.decode("utf-8", "replace")
+                )
 
 
 def strings_of(record):
@@ -172,7 +188,7 @@ def found_in(string, text):
     """As it stands, and, a word, not as a part of a longer one."""
     at = text.find(string)
     while at >= 0:
-        before, behind = text[at - 1:at], text[at + len(string):at + len(string) + 1]
+        before, behind = text[at - 1 : at], text[at + len(string) : at + len(string) + 1]
         if not (before.isalnum() and string[0].isalnum()) and not (behind.isalnum() and string[-1].isalnum()):
             return True
         at = text.find(string, at + 1)
@@ -225,8 +241,10 @@ def main():
                 continue
             files, persons, strings, shown = files + 1, persons + result[1], strings + result[2], shown + result[3]
             found += result[0]
-    print(f"{files} of {len(paths)} files, {persons} hidden persons, {strings} private strings, {shown} of them in "
-          f"pictures without the option; {'with' if has_page else 'without'} the page")
+    print(
+        f"{files} of {len(paths)} files, {persons} hidden persons, {strings} private strings, {shown} of them in "
+        f"pictures without the option; {'with' if has_page else 'without'} the page"
+    )
     if found:
         raise SystemExit("\n".join(found))
     if shown == 0:

@@ -30,8 +30,12 @@ def main():
         texts[name] = (folder / "completions" / name).read_text(encoding="utf-8")
     fish = (folder / "completions" / "olvane.fish").read_text(encoding="utf-8")
     texts["olvane.fish"] = " ".join("--" + name for name in re.findall(r"-l ([a-z-]+)", fish))
-    missing = [f"{name} lacks {option}" for name, text in texts.items() for option in sorted(options)
-               if not re.search(re.escape(option) + r"(?![\w-])", text)]
+    missing = [
+        f"{name} lacks {option}"
+        for name, text in texts.items()
+        for option in sorted(options)
+        if not re.search(re.escape(option) + r"(?![\w-])", text)
+    ]
     if missing:
         raise SystemExit("\n".join(missing))
 

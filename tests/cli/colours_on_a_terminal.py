@@ -48,8 +48,9 @@ def main():
     piped = subprocess.run(wrong, capture_output=True, check=False).stderr
     expect(piped.startswith(b"olvane: "), f"not plain in a pipe: {piped!r}")
     expect(b" of 6 [" in on_terminal([command, "batch", file]), "no progress bar on a terminal")
-    expect(not subprocess.run([command, "batch", file], capture_output=True, check=True).stderr,
-           "a progress bar in a pipe")
+    expect(
+        not subprocess.run([command, "batch", file], capture_output=True, check=True).stderr, "a progress bar in a pipe"
+    )
 
 
 if __name__ == "__main__":

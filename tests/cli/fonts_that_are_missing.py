@@ -44,8 +44,13 @@ def main():
             for form in ("png", "pdf", "svg"):
                 out = work / f"out.{form}"
                 out.unlink(missing_ok=True)
-                done = subprocess.run([olvane, "draw", str(family), "--focus", "1", "-o", str(out)], env=environment,
-                                      capture_output=True, text=True, check=False)
+                done = subprocess.run(
+                    [olvane, "draw", str(family), "--focus", "1", "-o", str(out)],
+                    env=environment,
+                    capture_output=True,
+                    text=True,
+                    check=False,
+                )
                 refused = bool(stated) and form != "svg"
                 assert done.returncode == (2 if refused else 0), (name, form, done.returncode, done.stderr)
                 assert out.exists() != refused, (name, form)
@@ -53,8 +58,14 @@ def main():
                     assert part in done.stderr, (name, form, part, done.stderr)
                 assert refused or "no font" not in done.stderr, (name, form, done.stderr)
         svg = (work / "out.svg").read_text(encoding="utf-8")
-        for fallback in ("Noto Sans CJK SC", "Noto Sans Arabic", "Noto Sans Hebrew", "Noto Sans Thai",
-                         "Noto Sans Devanagari", "Noto Color Emoji"):
+        for fallback in (
+            "Noto Sans CJK SC",
+            "Noto Sans Arabic",
+            "Noto Sans Hebrew",
+            "Noto Sans Thai",
+            "Noto Sans Devanagari",
+            "Noto Color Emoji",
+        ):
             assert fallback in svg, fallback
     return 0
 

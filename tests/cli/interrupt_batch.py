@@ -17,8 +17,9 @@ F_SETPIPE_SZ = 1031  # Linux; Python 3.10 has it in fcntl
 
 
 def start(command, file):
-    return subprocess.Popen([command, "batch", file, "--focus-from", "-"], stdin=subprocess.PIPE,
-                            stdout=subprocess.PIPE)
+    return subprocess.Popen(
+        [command, "batch", file, "--focus-from", "-"], stdin=subprocess.PIPE, stdout=subprocess.PIPE
+    )
 
 
 def require_whole_lines(batch, first, text):

@@ -40,7 +40,9 @@ def everybody_with_everybody(count):
 def man_with_wives(count, children_of_each=0):
     wives = range(2, 2 * count + 1, 2)
     first = 2 * count + 1
-    children = [range(first + number * children_of_each, first + (number + 1) * children_of_each) for number in range(count)]
+    children = [
+        range(first + number * children_of_each, first + (number + 1) * children_of_each) for number in range(count)
+    ]
     everybody = [1, *wives, *(child for family in children for child in family)]
     return gedcom(everybody, [(1, wife, children[number]) for number, wife in enumerate(wives)])
 
@@ -50,8 +52,14 @@ def run(command, text, *words):
     with tempfile.TemporaryDirectory() as folder:
         file = pathlib.Path(folder) / "family.ged"
         file.write_text(text, encoding="utf-8")
-        done = subprocess.run([command, *(str(file) if word == "FILE" else word for word in words)], capture_output=True,
-                              text=True, cwd=folder, timeout=100, check=False)
+        done = subprocess.run(
+            [command, *(str(file) if word == "FILE" else word for word in words)],
+            capture_output=True,
+            text=True,
+            cwd=folder,
+            timeout=100,
+            check=False,
+        )
         return done, sorted(path.name for path in pathlib.Path(folder).iterdir())
 
 
@@ -61,7 +69,9 @@ def lay_out(command, text, *options):
 
 def require_refusal(done):
     if done.returncode != 2 or done.stdout or "more than 5 million relatives are asked for" not in done.stderr:
-        raise SystemExit(f"not refused in words: status {done.returncode}, {len(done.stdout)} bytes, {done.stderr[:300]}")
+        raise SystemExit(
+            f"not refused in words: status {done.returncode}, {len(done.stdout)} bytes, {done.stderr[:300]}"
+        )
 
 
 def require_records(done, fewest):
@@ -71,9 +81,31 @@ def require_records(done, fewest):
 
 
 def require_few_sheets(command, text):
-    done, files = run(command, text, "draw", "FILE", "--focus", "I1", "--view", "pedigree", "--generations", "12",
-                      "--boxes", "tall", "--fit", "A4", "--scale", "1", "-o", "out.svg")
-    if done.returncode != 2 or "the picture would take more than 1000 sheets" not in done.stderr or files != ["family.ged"]:
+    done, files = run(
+        command,
+        text,
+        "draw",
+        "FILE",
+        "--focus",
+        "I1",
+        "--view",
+        "pedigree",
+        "--generations",
+        "12",
+        "--boxes",
+        "tall",
+        "--fit",
+        "A4",
+        "--scale",
+        "1",
+        "-o",
+        "out.svg",
+    )
+    if (
+        done.returncode != 2
+        or "the picture would take more than 1000 sheets" not in done.stderr
+        or files != ["family.ged"]
+    ):
         raise SystemExit(f"thousands of sheets: status {done.returncode}, {len(files)} files, {done.stderr[:300]}")
 
 

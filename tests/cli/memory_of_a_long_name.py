@@ -43,8 +43,10 @@ def write_family(path, letter, in_pieces):
             for _ in range(letters // 1000):
                 file.write(letter * 1000)
             file.write(" /Berg/\n")
-        file.write("1 FAMS @F1@\n0 @I2@ INDI\n1 NAME Ada /Lund/\n1 FAMS @F1@\n"
-                   "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n0 TRLR\n")
+        file.write(
+            "1 FAMS @F1@\n0 @I2@ INDI\n1 NAME Ada /Lund/\n1 FAMS @F1@\n"
+            "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n0 TRLR\n"
+        )
 
 
 def most_memory(command):
@@ -68,8 +70,10 @@ def main():
             for in_pieces in (False, True):
                 write_family(work / "family.ged", letter, in_pieces)
                 for command in COMMANDS:
-                    words = [word.replace("FILE", str(work / "family.ged")).replace("OUT", str(work / "out"))
-                             for word in command]
+                    words = [
+                        word.replace("FILE", str(work / "family.ged")).replace("OUT", str(work / "out"))
+                        for word in command
+                    ]
                     status, messages, memory = most_memory([olvane, *words])
                     if status == 2 and "built without" in messages:
                         continue

@@ -82,8 +82,12 @@ def run_step(step, folder, environment):
 def main():
     command, case = os.path.abspath(sys.argv[1]), sys.argv[2]
     here = os.path.dirname(os.path.abspath(__file__))
-    environment = dict(os.environ, PATH=os.path.dirname(command) + os.pathsep + os.environ["PATH"], CASE_FOLDER=here,
-                       CLI_FOLDER=os.path.join(here, "../../apps/cli"))
+    environment = dict(
+        os.environ,
+        PATH=os.path.dirname(command) + os.pathsep + os.environ["PATH"],
+        CASE_FOLDER=here,
+        CLI_FOLDER=os.path.join(here, "../../apps/cli"),
+    )
     with tempfile.TemporaryDirectory() as parent:
         folder = os.path.join(parent, "run")
         shutil.copytree(os.path.join(here, "data"), folder)
@@ -91,8 +95,10 @@ def main():
             result = run_step(step, folder, environment)
             complaints = complaints_about(step, result, folder)
             if complaints:
-                print(f"$ {step.command}\n{result.stdout.decode('utf-8', 'replace')}"
-                      f"{result.stderr.decode('utf-8', 'replace')}")
+                print(
+                    f"$ {step.command}\n{result.stdout.decode('utf-8', 'replace')}"
+                    f"{result.stderr.decode('utf-8', 'replace')}"
+                )
                 raise SystemExit("\n".join(complaints))
 
 

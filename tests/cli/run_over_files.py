@@ -31,20 +31,34 @@ TIME_LIMIT = 120  # seconds, for one command on one file
 def commands_for(file, number):
     """Some of them in turn for a mutated copy, all of them for number None."""
     all_commands = [
-        ["people", file, "--format", "json"], ["people", file, "--format", "tsv"], ["people", file, "a"],
-        ["check", file], ["check", file, "--focus", "1"], ["batch", file],
+        ["people", file, "--format", "json"],
+        ["people", file, "--format", "tsv"],
+        ["people", file, "a"],
+        ["check", file],
+        ["check", file, "--focus", "1"],
+        ["batch", file],
         ["layout", file, "--focus", "1", "--format", "json", "--hide-living"],
-        ["layout", file, "--focus", "2", "--view", "pedigree"], ["layout", file, "--focus", "1", "--view", "relatives"],
-        ["batch", file, "--view", "hourglass"], ["check", file, "--all", "--view", "near"],
-        ["layout", file, "--focus", "1", "--view", "everybody"], ["layout", file, "--focus", "1", "--view", "fan"],
-        ["layout", file, "--focus", "1", "--view", "kinship", "--to", "3"], ["kin", file, "1", "2", "--format", "json"],
-        ["draw", file, "--focus", "1", "-o", "out.svg"], ["draw", file, "--focus", "1", "-o", file],
+        ["layout", file, "--focus", "2", "--view", "pedigree"],
+        ["layout", file, "--focus", "1", "--view", "relatives"],
+        ["batch", file, "--view", "hourglass"],
+        ["check", file, "--all", "--view", "near"],
+        ["layout", file, "--focus", "1", "--view", "everybody"],
+        ["layout", file, "--focus", "1", "--view", "fan"],
+        ["layout", file, "--focus", "1", "--view", "kinship", "--to", "3"],
+        ["kin", file, "1", "2", "--format", "json"],
+        ["draw", file, "--focus", "1", "-o", "out.svg"],
+        ["draw", file, "--focus", "1", "-o", file],
         ["draw", file, "--focus", "1", "--fit", "A4", "--sheets", "1x3", "-o", "sheets.svg", "--hide-living"],
-        ["page", file, "-o", "out.html", "--hide-living"], ["page", file, "-o", file],
+        ["page", file, "-o", "out.html", "--hide-living"],
+        ["page", file, "-o", file],
         ["people", file, "--encoding", "windows-1251"],
-        ["draw", "io.svg", "--focus", "1", "-o", "io.svg"], ["page", "io.html", "-o", "io.html"],
-        ["draw", file, "--focus", "2", "-o", "out.png"], ["draw", file, "--focus", "3", "-o", "out.pdf"],
-        ["kin", file, "2", "3"], ["judge", file], ["judge", "picture.json", "--family", file],
+        ["draw", "io.svg", "--focus", "1", "-o", "io.svg"],
+        ["page", "io.html", "-o", "io.html"],
+        ["draw", file, "--focus", "2", "-o", "out.png"],
+        ["draw", file, "--focus", "3", "-o", "out.pdf"],
+        ["kin", file, "2", "3"],
+        ["judge", file],
+        ["judge", "picture.json", "--family", file],
     ]
     return all_commands if number is None else [all_commands[number % len(all_commands)]]
 
@@ -56,9 +70,9 @@ def mutated(data, chance):
         other = chance.randrange(len(lines))
         kind = chance.randrange(8)
         if kind == 0:
-            del lines[at:at + chance.randint(1, 20)]
+            del lines[at : at + chance.randint(1, 20)]
         elif kind == 1:
-            lines[at:at] = lines[other:other + chance.randint(1, 20)]
+            lines[at:at] = lines[other : other + chance.randint(1, 20)]
         elif kind == 2:
             lines[at], lines[other] = lines[other], lines[at]
         elif kind == 3:
@@ -71,7 +85,7 @@ def mutated(data, chance):
         elif kind == 5:
             lines[at] = lines[at] * chance.choice((2, 3, 100))
         elif kind == 6:
-            lines[at] = lines[at][:chance.randint(0, len(lines[at]))]
+            lines[at] = lines[at][: chance.randint(0, len(lines[at]))]
         else:
             lines[at] = bytes([chance.choice(b"0123456789")]) + lines[at][1:]
         if not lines:
@@ -96,7 +110,11 @@ def faults(command, data, name, number):
                 continue
             if result.returncode not in (0, 1, 2):
                 found.append(f"{asked}: status {result.returncode}: {result.stderr[-500:]!r}")
-            if result.returncode == 2 and not result.stderr.startswith(b"olvane: ") and b"\nolvane: " not in result.stderr:
+            if (
+                result.returncode == 2
+                and not result.stderr.startswith(b"olvane: ")
+                and b"\nolvane: " not in result.stderr
+            ):
                 found.append(f"{asked}: no message: {result.stderr!r}")
             for one in inputs:
                 if one.read_bytes() != data:

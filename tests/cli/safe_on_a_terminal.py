@@ -40,9 +40,16 @@ def expect(condition, what):
 
 def main():
     command, file = sys.argv[1:3]
-    asked = (["people", file], ["people", file, "--format", "tsv"], ["people", file, "--format", "json"], ["check", file],
-             ["layout", file, "--focus", "3", "--format", "json"], ["layout", file, "--focus", "Leftt"],
-             ["layout", file, "--focus", "e"], ["people", file, "\x1b]0;title\x07"])
+    asked = (
+        ["people", file],
+        ["people", file, "--format", "tsv"],
+        ["people", file, "--format", "json"],
+        ["check", file],
+        ["layout", file, "--focus", "3", "--format", "json"],
+        ["layout", file, "--focus", "Leftt"],
+        ["layout", file, "--focus", "e"],
+        ["people", file, "\x1b]0;title\x07"],
+    )
     written_out = 0
     for words in asked:
         text = on_terminal([command, *words])

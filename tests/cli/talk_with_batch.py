@@ -13,10 +13,20 @@ import sys
 
 def main():
     command, file = sys.argv[1:3]
-    process = subprocess.Popen([command, "batch", file, "--focus-from", "-", "--unbuffered"], stdin=subprocess.PIPE,
-                               stdout=subprocess.PIPE, stderr=subprocess.DEVNULL, bufsize=0)
-    for question, start in ((b"3\n", b"3\t3:"), (b"\n", b"\t\n"), (b"@I1@\n", b"1\t1:"), (b"Nobody\tHere\n", b"Nobody\\tHere\t\n"),
-                            (b"2\n", b"2\t2:")):
+    process = subprocess.Popen(
+        [command, "batch", file, "--focus-from", "-", "--unbuffered"],
+        stdin=subprocess.PIPE,
+        stdout=subprocess.PIPE,
+        stderr=subprocess.DEVNULL,
+        bufsize=0,
+    )
+    for question, start in (
+        (b"3\n", b"3\t3:"),
+        (b"\n", b"\t\n"),
+        (b"@I1@\n", b"1\t1:"),
+        (b"Nobody\tHere\n", b"Nobody\\tHere\t\n"),
+        (b"2\n", b"2\t2:"),
+    ):
         process.stdin.write(question)
         ready, _, _ = select.select([process.stdout], [], [], 30)
         if not ready:

@@ -40,7 +40,9 @@ def families_of(path):
                 continue
             if parts[0] == "0":
                 isFamily = len(parts) > 2 and parts[2] == "FAM"
-                current = families.setdefault(parts[1].strip("@"), {"parents": [], "children": []}) if isFamily else None
+                current = (
+                    families.setdefault(parts[1].strip("@"), {"parents": [], "children": []}) if isFamily else None
+                )
             elif parts[0] == "1" and current is not None and len(parts) > 2:
                 if parts[1] in ("HUSB", "WIFE"):
                     current["parents"].append(parts[2].strip("@"))
@@ -50,8 +52,9 @@ def families_of(path):
 
 
 def picture_of(command, path):
-    done = subprocess.run([command, "layout", path, "--focus", "1", "--view", "everybody"], capture_output=True, text=True,
-                          check=True)
+    done = subprocess.run(
+        [command, "layout", path, "--focus", "1", "--view", "everybody"], capture_output=True, text=True, check=True
+    )
     return json.loads(done.stdout)
 
 
@@ -78,8 +81,14 @@ def pieces_of(picture):
     pieces = []
     for family in picture["families"]:
         for line in family["lines"]:
-            pieces.append((min(line["x1"], line["x2"]), min(line["y1"], line["y2"]), max(line["x1"], line["x2"]),
-                           max(line["y1"], line["y2"])))
+            pieces.append(
+                (
+                    min(line["x1"], line["x2"]),
+                    min(line["y1"], line["y2"]),
+                    max(line["x1"], line["x2"]),
+                    max(line["y1"], line["y2"]),
+                )
+            )
     return pieces
 
 

@@ -9,8 +9,15 @@ Usage: validate_json.py SCHEMA DOCUMENT
 import json
 import sys
 
-TYPES = {"object": dict, "array": list, "string": str, "integer": int, "boolean": bool,
-         "number": (int, float), "null": type(None)}
+TYPES = {
+    "object": dict,
+    "array": list,
+    "string": str,
+    "integer": int,
+    "boolean": bool,
+    "number": (int, float),
+    "null": type(None),
+}
 
 
 def complaints(value, schema, root, place):

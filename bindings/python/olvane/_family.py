@@ -278,9 +278,7 @@ class Family:
         """The list of spouses and nothing else; preferred is one of them."""
         ids = [number("spouses", spouse, "spouse", id=person) for spouse in spouses]
         chosen = number("spouses", preferred, "preferred", id=person)
-        self._change(
-            "set_spouses", number("spouses", person, "id"), (c_int64 * len(ids))(*ids), len(ids), chosen
-        )
+        self._change("set_spouses", number("spouses", person, "id"), (c_int64 * len(ids))(*ids), len(ids), chosen)
 
     def set_children(self, person: int, children: Sequence[int]) -> None:
         """The list of children and nothing else."""
@@ -307,12 +305,16 @@ class Family:
             encoded("fields", text, "text", id=person),
         )
 
-    def add_family(self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any) -> None:
+    def add_family(
+        self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any
+    ) -> None:
         """A new family, with the fields of a row of families. Partners and children enter each other's lists."""
         struct, kept = _family_row(number, row), _family_children(number, children)
         self._change("add_family", byref(struct), kept, len(kept))
 
-    def set_family(self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any) -> None:
+    def set_family(
+        self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any
+    ) -> None:
         """In place of the family of that number. Partners whom no family joins any longer are separated."""
         struct, kept = _family_row(number, row), _family_children(number, children)
         self._change("set_family", byref(struct), kept, len(kept))
@@ -397,7 +399,9 @@ def _family_children(family: int, children: Iterable[int | tuple[int, ChildKind 
 def _refuse_unknown(table: str, id: int, row: Mapping[str, Any], known: tuple[str, ...]) -> None:
     for name in row:
         if name not in known:
-            raise FamilyError(f"{table}, field {name}: there is no such field", table=table, row=None, id=id, field=name)
+            raise FamilyError(
+                f"{table}, field {name}: there is no such field", table=table, row=None, id=id, field=name
+            )
 
 
 class _Columns:

@@ -28,7 +28,17 @@ PERSON_FIELDS = (
 )
 FAMILY_FIELDS = ("number", "partner0", "partner1", "state", "marriage", "marriage_written", "marriage_place")
 TEXT_FIELDS = frozenset(
-    ("birth", "death", "birth_written", "death_written", "marriage", "marriage_written", "marriage_place", "key", "text")
+    (
+        "birth",
+        "death",
+        "birth_written",
+        "death_written",
+        "marriage",
+        "marriage_written",
+        "marriage_place",
+        "key",
+        "text",
+    )
 )
 
 
@@ -195,7 +205,8 @@ def _whole_numbers(
         except (TypeError, OverflowError):
             return [number(table, value, field, row=row) for row, value in enumerate(column)]
     return [
-        value if type(value) is int else choice(table, value, field, choices, row=row) for row, value in enumerate(column)
+        value if type(value) is int else choice(table, value, field, choices, row=row)
+        for row, value in enumerate(column)
     ]
 
 

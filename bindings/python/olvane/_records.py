@@ -101,10 +101,12 @@ class Layout(Sequence[Record]):
             yield Record(id, x, y, flag != 0, _KINDS[kind], child if kind else None, own)
 
     @overload
-    def __getitem__(self, place: int) -> Record: ...
+    def __getitem__(self, place: int) -> Record:
+        ...
 
     @overload
-    def __getitem__(self, place: slice) -> list[Record]: ...
+    def __getitem__(self, place: slice) -> list[Record]:
+        ...
 
     def __getitem__(self, place: int | slice) -> Record | list[Record]:
         if isinstance(place, slice):

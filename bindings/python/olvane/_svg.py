@@ -48,7 +48,7 @@ def plain_drawing(
         parts.append(f'<rect {at} rx="4" fill="#fff" stroke="#333"{dashes}/>')
         if label:
             middle = f'x="{_number(x + width / 2)}" y="{_number(y + height / 2 + 4)}"'
-            parts.append(f'<text {middle}>{escape(label)}</text>')
+            parts.append(f"<text {middle}>{escape(label)}</text>")
     return Svg("\n".join([*parts, "</svg>", ""]))
 
 

@@ -97,7 +97,9 @@ class Files(unittest.TestCase):
     def test_aFamilyIsDrawnByItsNames(self) -> None:
         family = olvane.Family([{"id": 1, "birth": "1830-05-01"}, {"id": 2, "father": 1}])
         family.set_names(1, [(olvane.NameKind.FULL, "Ada Berg")])
-        self.assertTrue({"Ada Berg"} <= texts(olvane.draw(family, 2)) or {"Ada", "Berg"} <= texts(olvane.draw(family, 2)))
+        self.assertTrue(
+            {"Ada Berg"} <= texts(olvane.draw(family, 2)) or {"Ada", "Berg"} <= texts(olvane.draw(family, 2))
+        )
         with self.assertRaisesRegex(olvane.FileError, "there is no person 3"):
             olvane.draw(family, 3)
         with self.assertRaisesRegex(TypeError, "named by an id"):

@@ -73,7 +73,9 @@ class Layouts(unittest.TestCase):
 
     def test_lone_person_has_two_unknown_parents(self) -> None:
         focus, father, mother = olvane.layout(Family({}), 17)
-        self.assertEqual((17, 27, 0, False, None), (focus.id, focus.x, focus.y, focus.has_hidden_relatives, focus.child))
+        self.assertEqual(
+            (17, 27, 0, False, None), (focus.id, focus.x, focus.y, focus.has_hidden_relatives, focus.child)
+        )
         self.assertEqual((-1, olvane.RecordKind.MISSING_FATHER, 17), (father.id, father.kind, father.child))
         self.assertEqual((-2, olvane.RecordKind.MISSING_MOTHER, 17), (mother.id, mother.kind, mother.child))
 
@@ -288,7 +290,6 @@ class Failures(unittest.TestCase):
         run = subprocess.run([sys.executable, "-c", command], capture_output=True, text=True, check=False)
         self.assertIn("ImportError: the layout library can't be loaded", run.stderr)
 
-
     def test_an_error_can_be_copied_and_sent(self) -> None:
         with self.assertRaises(olvane.LayoutError) as caught:
             olvane.layout(Family({}), 0)
@@ -483,7 +484,6 @@ class Signals(unittest.TestCase):
         self.assertNotEqual([], self.printed)
         self.assertEqual({ValueError}, {getattr(unraisable, "exc_type") for unraisable in self.printed})
 
-
     def test_the_hook_is_put_back_after_the_last_layout(self) -> None:
         before = sys.unraisablehook
         during: list[object] = []
@@ -506,7 +506,8 @@ class Signals(unittest.TestCase):
                 sys.unraisablehook = other
                 return super().sex_of(person)
 
-        def other(_unraisable: object) -> None: ...
+        def other(_unraisable: object) -> None:
+            ...
 
         olvane.layout(Replacing(THREE_GENERATIONS), 17)
         self.assertIs(other, sys.unraisablehook)
