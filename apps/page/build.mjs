@@ -16,7 +16,9 @@ import { build, transform } from "esbuild";
 
 const here = (path) => fileURLToPath(new URL(path, import.meta.url));
 
-const { values } = parseArgs({ options: { wasm: { type: "string" }, out: { type: "string" }, element: { type: "string" } } });
+const { values } = parseArgs({
+    options: { wasm: { type: "string" }, out: { type: "string" }, element: { type: "string" } },
+});
 if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
 
 const kBinding = process.env.OLVANE_JAVASCRIPT ?? here("../../bindings/javascript");
@@ -48,7 +50,10 @@ async function bundled(entry, settings) {
 
 // What would end the element early may stand in a script only as an escape.
 async function bundledScript() {
-    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript } })).replaceAll("</script", "<\\/script");
+    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript } })).replaceAll(
+        "</script",
+        "<\\/script",
+    );
 }
 
 async function writeElement(path, engine) {

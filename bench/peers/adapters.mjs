@@ -79,11 +79,15 @@ async function topola(shape) {
   const { getAncestorsTree } = require('topola/dist/ancestor-chart.js');
   const { ChartUtil, getChartInfo } = require('topola/dist/chart-util.js');
   class FixedBoxes extends CompositeRenderer {
-    getPreferredIndiSize() { return [WIDTH, HEIGHT]; }
-    getCss() { return ''; }
+    getPreferredIndiSize() {
+      return [WIDTH, HEIGHT];
+    }
+    getCss() {
+      return '';
+    }
     render() {}
   }
-  const page = { querySelector: () => ({ __data__: 0 }) };  // asked for its style element alone
+  const page = { querySelector: () => ({ __data__: 0 }) }; // asked for its style element alone
   const optionsFor = (data) => {
     const options = { data, startIndi: `I${FOCUS}`, svgSelector: page };
     return Object.assign(options, { renderer: new FixedBoxes(options) });
@@ -132,7 +136,11 @@ async function topola(shape) {
       const options = optionsFor(new JsonDataProvider({ indis: [{ id: `I${FOCUS}` }], fams: [] }));
       return { util: new ChartUtil(options), renderer: options.renderer };
     },
-    shown: (nodes) => nodes.flatMap(({ data }) => [data.indi, data.spouse]).filter(Boolean).map(({ id }) => id),
+    shown: (nodes) =>
+      nodes
+        .flatMap(({ data }) => [data.indi, data.spouse])
+        .filter(Boolean)
+        .map(({ id }) => id),
   };
 }
 
@@ -170,7 +178,10 @@ async function entitreeFlex() {
 // The same with those lists emptied by a line of ours instead: not what is published, but what it could be.
 async function entitreeFlexRepaired() {
   const forgetters = [];
-  for (const [file, list] of [['drillChildren', 'descendantsContour'], ['drillParents', 'parentsContour']]) {
+  for (const [file, list] of [
+    ['drillChildren', 'descendantsContour'],
+    ['drillParents', 'parentsContour'],
+  ]) {
     const path = pathOf(`entitree-flex/dist/${file}.js`);
     const module = new Module(path);
     module.filename = path;

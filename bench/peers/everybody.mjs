@@ -32,13 +32,18 @@ function dot() {
     '}',
   ].join('\n');
   const { stdout, stderr } = spawnSync('bash', ['-c', 'TIMEFORMAT=%U; time dot -Tplain'], {
-    input: text, maxBuffer: 2 ** 30, encoding: 'utf8',
+    input: text,
+    maxBuffer: 2 ** 30,
+    encoding: 'utf8',
   });
   const ms = 1000 * Number(stderr.trim().split('\n').at(-1).replace(',', '.'));
-  const boxes = stdout.split('\n').filter((line) => line.startsWith('node p')).map((line) => {
-    const [, name, x, y] = line.split(' ');
-    return [name.slice(1), Number(x) * 72, -Number(y) * 72];
-  });
+  const boxes = stdout
+    .split('\n')
+    .filter((line) => line.startsWith('node p'))
+    .map((line) => {
+      const [, name, x, y] = line.split(' ');
+      return [name.slice(1), Number(x) * 72, -Number(y) * 72];
+    });
   return { ms, boxes };
 }
 
@@ -47,8 +52,11 @@ async function elkjs() {
   const graph = {
     id: 'root',
     layoutOptions: {
-      'elk.algorithm': 'layered', 'elk.direction': 'DOWN', 'elk.edgeRouting': 'ORTHOGONAL',
-      'elk.spacing.nodeNode': '25', 'elk.layered.spacing.nodeNodeBetweenLayers': '15',
+      'elk.algorithm': 'layered',
+      'elk.direction': 'DOWN',
+      'elk.edgeRouting': 'ORTHOGONAL',
+      'elk.spacing.nodeNode': '25',
+      'elk.layered.spacing.nodeNodeBetweenLayers': '15',
     },
     children: [
       ...persons.map((p) => ({ id: `p${p}`, width: 55, height: 80 })),
@@ -59,7 +67,9 @@ async function elkjs() {
   const start = process.cpuUsage();
   const result = await new ELK().layout(graph);
   const ms = msSince(start);
-  const boxes = result.children.filter(({ id }) => id[0] === 'p').map(({ id, x, y }) => [id.slice(1), x + 27.5, y + 40]);
+  const boxes = result.children
+    .filter(({ id }) => id[0] === 'p')
+    .map(({ id, x, y }) => [id.slice(1), x + 27.5, y + 40]);
   return { ms, boxes };
 }
 

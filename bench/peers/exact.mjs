@@ -33,7 +33,10 @@ function programOf({ nodes, strands }) {
       for (const b of members.filter((n) => n > a)) {
         binaries.add(`o_${a}_${b}`);
         for (const c of members.filter((n) => n > b)) {
-          constraints.push(`o_${a}_${b} + o_${b}_${c} - o_${a}_${c} >= 0`, `o_${a}_${b} + o_${b}_${c} - o_${a}_${c} <= 1`);
+          constraints.push(
+            `o_${a}_${b} + o_${b}_${c} - o_${a}_${c} >= 0`,
+            `o_${a}_${b} + o_${b}_${c} - o_${a}_${c} <= 1`,
+          );
         }
       }
     }
@@ -42,7 +45,10 @@ function programOf({ nodes, strands }) {
   strands.forEach((s, i) => {
     strands.forEach((t, k) => {
       if (k <= i || s.gap !== t.gap) return;
-      for (const [one, other, name] of [[s, t, `l_${i}_${k}`], [t, s, `l_${k}_${i}`]]) {
+      for (const [one, other, name] of [
+        [s, t, `l_${i}_${k}`],
+        [t, s, `l_${k}_${i}`],
+      ]) {
         binaries.add(name);
         for (const side of ['above', 'below']) {
           for (const e of one[side]) {
@@ -59,12 +65,21 @@ function programOf({ nodes, strands }) {
   });
   if (objective.length === 0) return null;
   return [
-    'Minimize', ` obj: ${objective.join(' + ')}`, 'Subject To', ...constraints.map((c, i) => ` r${i}: ${c}`),
-    'Binary', ` ${[...binaries].join(' ')}`, 'End',
+    'Minimize',
+    ` obj: ${objective.join(' + ')}`,
+    'Subject To',
+    ...constraints.map((c, i) => ` r${i}: ${c}`),
+    'Binary',
+    ` ${[...binaries].join(' ')}`,
+    'End',
   ].join('\n');
 }
 
-let families = 0, ours = 0, best = 0, atBest = 0, unsolved = 0;
+let families = 0,
+  ours = 0,
+  best = 0,
+  atBest = 0,
+  unsolved = 0;
 for await (const line of createInterface({ input: process.stdin })) {
   const problem = JSON.parse(line);
   ++families;
@@ -82,5 +97,7 @@ for await (const line of createInterface({ input: process.stdin })) {
   best += fewest;
   if (problem.crossings === fewest) ++atBest;
 }
-console.log(`${families} families, ${unsolved} of them not solved in 30 s: ${ours} crossings, ${best} the fewest, ratio ` +
-  `${(ours / best).toFixed(3)}; ${atBest} families have the fewest`);
+console.log(
+  `${families} families, ${unsolved} of them not solved in 30 s: ${ours} crossings, ${best} the fewest, ratio ` +
+    `${(ours / best).toFixed(3)}; ${atBest} families have the fewest`,
+);

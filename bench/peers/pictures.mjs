@@ -28,15 +28,26 @@ function familyFrom(picture) {
   const focus = shown.find(({ id }) => id === picture.focus);
   const boxes = [focus, ...shown.filter((box) => box !== focus)];
   const numbers = new Map(boxes.map(({ id }, i) => [id, i + 1]));
-  const persons = boxes.map(({ person }, i) => ({ id: i + 1, sex: person?.sex === 'female' ? 'F' : 'M', father: 0, mother: 0, spouses: [], children: [] }));
+  const persons = boxes.map(({ person }, i) => ({
+    id: i + 1,
+    sex: person?.sex === 'female' ? 'F' : 'M',
+    father: 0,
+    mother: 0,
+    spouses: [],
+    children: [],
+  }));
   const personAt = (place) => persons[numbers.get(picture.boxes[place].id) - 1];
-  const elsewhere = picture.marks.filter(({ kind }) => kind !== 'samePerson').map(({ kind, boxes: [first, ...rest] }) =>
-    (kind === 'parentsElsewhere' ? { parents: rest, children: [first] } : { parents: [first, ...rest], children: [] }));
+  const elsewhere = picture.marks
+    .filter(({ kind }) => kind !== 'samePerson')
+    .map(({ kind, boxes: [first, ...rest] }) =>
+      kind === 'parentsElsewhere' ? { parents: rest, children: [first] } : { parents: [first, ...rest], children: [] },
+    );
   for (const family of [...picture.families, ...elsewhere]) {
     const parents = family.parents.map(personAt).filter(Boolean);
     const children = family.children.map(personAt).filter(Boolean);
     if (parents.length === 2) {
-      for (const [one, other] of [parents, [...parents].reverse()]) if (!one.spouses.includes(other.id)) one.spouses.push(other.id);
+      for (const [one, other] of [parents, [...parents].reverse()])
+        if (!one.spouses.includes(other.id)) one.spouses.push(other.id);
     }
     for (const child of children) {
       for (const parent of parents) {
@@ -81,7 +92,14 @@ class Drawing {
     return this.boxes.findIndex((box) => box.number === Number(number));
   }
   json(view, idOf) {
-    const boxes = this.boxes.map(({ number, x, y }) => ({ id: idOf(number), kind: 'person', x, y, width: WIDTH, height: HEIGHT }));
+    const boxes = this.boxes.map(({ number, x, y }) => ({
+      id: idOf(number),
+      kind: 'person',
+      x,
+      y,
+      width: WIDTH,
+      height: HEIGHT,
+    }));
     const families = [...this.families.values()].map((family) => ({
       ...family,
       childKinds: family.children.map(() => 'birth'),
@@ -105,14 +123,20 @@ function fromTopola(nodes, { util, renderer }) {
       const [dx, dy] = anchor.call(renderer, node.data);
       return [drawing.addBox(numberOf(person.id), node.x + dx, node.y + dy)];
     };
-    places.set(node, { indi: of(node.data.indi, renderer.getIndiAnchor), spouse: of(node.data.spouse, renderer.getSpouseAnchor) });
+    places.set(node, {
+      indi: of(node.data.indi, renderer.getIndiAnchor),
+      spouse: of(node.data.spouse, renderer.getSpouseAnchor),
+    });
   }
   const parentsAt = (node) => Object.values(places.get(node)).flat();
   for (const node of nodes) {
     const parents = parentsAt(node);
     if (parents.length === 2) {
       const [one, other] = parents.map((place) => drawing.boxes[place]);
-      drawing.addRun(parents, [[one.x + WIDTH / 2, one.y + HEIGHT / 2], [other.x + WIDTH / 2, other.y + HEIGHT / 2]]);
+      drawing.addRun(parents, [
+        [one.x + WIDTH / 2, one.y + HEIGHT / 2],
+        [other.x + WIDTH / 2, other.y + HEIGHT / 2],
+      ]);
     }
   }
   for (const node of nodes.filter(({ parent, data }) => parent && !data.additionalMarriage)) {
@@ -120,7 +144,10 @@ function fromTopola(nodes, { util, renderer }) {
     const [above, below] = flipped ? [node, node.parent] : [node.parent, node];
     const { indi, spouse } = places.get(below);
     const child = (above.id === below.data.spouseParentNodeId ? spouse : indi)[0];
-    const numbers = util.linkVertical(above, below).match(/-?[\d.]+(e-?\d+)?/g).map(Number);
+    const numbers = util
+      .linkVertical(above, below)
+      .match(/-?[\d.]+(e-?\d+)?/g)
+      .map(Number);
     const points = numbers.flatMap((x, i) => (i % 2 === 0 ? [[x, numbers[i + 1]]] : []));
     drawing.addChild(parentsAt(above), child);
     drawing.addRun(parentsAt(above), points);
@@ -136,11 +163,22 @@ function fromFamilyChart({ data }) {
     const half = child.y + (from.y - child.y) / 2;
     const at = parents.map((parent) => places.get(parent));
     drawing.addChild(at, places.get(child));
-    drawing.addRun(at, [[child.x, child.y], [child.x, half], [from.x, half], [from.x, from.y]]);
+    drawing.addRun(at, [
+      [child.x, child.y],
+      [child.x, half],
+      [from.x, half],
+      [from.x, from.y],
+    ]);
   };
   for (const node of data) {
     for (const spouse of node.spouses ?? (node.coparent ? [node.coparent] : [])) {
-      drawing.addRun([places.get(node), places.get(spouse)], [[node.x, node.y], [spouse.x, spouse.y]]);
+      drawing.addRun(
+        [places.get(node), places.get(spouse)],
+        [
+          [node.x, node.y],
+          [spouse.x, spouse.y],
+        ],
+      );
     }
     if (node.parents) {
       const [one, other = one] = node.parents;
@@ -161,12 +199,19 @@ function fromRelativesTree({ nodes, connectors }, persons) {
   const drawing = new Drawing();
   const placeAt = new Map();
   for (const { id, left, top } of nodes) {
-    placeAt.set(`${left + 1},${top + 1}`, drawing.addBox(Number(id), (left + 1) * CELL_X / 2, (top + 1) * CELL_Y / 2));
+    placeAt.set(
+      `${left + 1},${top + 1}`,
+      drawing.addBox(Number(id), ((left + 1) * CELL_X) / 2, ((top + 1) * CELL_Y) / 2),
+    );
   }
   const at = (x, y) => placeAt.get(`${x},${y}`);
   const isRow = (y) => nodes.some(({ top }) => top + 1 === y);
   const unions = unionsOf(persons);
-  const placesOf = (ids) => ids.filter((id) => id !== 0).map((id) => drawing.boxOf(id)).filter((place) => place >= 0);
+  const placesOf = (ids) =>
+    ids
+      .filter((id) => id !== 0)
+      .map((id) => drawing.boxOf(id))
+      .filter((place) => place >= 0);
   const parentsOf = (place) => {
     const union = unions.find(({ children }) => children.includes(drawing.boxes[place].number));
     return union ? placesOf([union.father, union.mother]) : [];
@@ -176,7 +221,9 @@ function fromRelativesTree({ nodes, connectors }, persons) {
     if (y1 === y2 && isRow(y1)) return [at(x1, y1), at(x2, y2)].filter((place) => place !== undefined);
     if (x1 === x2 && at(x2, y2) !== undefined && !isRow(y1)) return parentsOf(at(x2, y2));
     if (x1 === x2 && isRow(y1)) return couple(x1, y1);
-    const hanging = connectors.find((run) => run[0] === run[2] && run[1] === y1 && run[0] >= x1 && run[0] <= x2 && at(run[2], run[3]) !== undefined);
+    const hanging = connectors.find(
+      (run) => run[0] === run[2] && run[1] === y1 && run[0] >= x1 && run[0] <= x2 && at(run[2], run[3]) !== undefined,
+    );
     return hanging ? parentsOf(at(hanging[2], hanging[3])) : [];
   });
   for (const { father, mother, children } of unions) {
@@ -184,7 +231,10 @@ function fromRelativesTree({ nodes, connectors }, persons) {
     for (const child of placesOf(children)) if (parents.length > 0) drawing.addChild(parents, child);
   }
   connectors.forEach(([x1, y1, x2, y2], i) => {
-    const points = [[x1 * CELL_X / 2, y1 * CELL_Y / 2], [x2 * CELL_X / 2, y2 * CELL_Y / 2]];
+    const points = [
+      [(x1 * CELL_X) / 2, (y1 * CELL_Y) / 2],
+      [(x2 * CELL_X) / 2, (y2 * CELL_Y) / 2],
+    ];
     if (owners[i].length > 0) drawing.addRun(owners[i], points);
   });
   return drawing;
@@ -209,8 +259,13 @@ function fromGraph(positions, edges, persons) {
 
 function fromElk({ children, edges }, persons) {
   const positions = new Map(children.map(({ id, x, y, width, height }) => [id, [x + width / 2, y + height / 2]]));
-  const runs = edges.flatMap(({ sources, targets, sections }) => sections.map(({ startPoint, bendPoints = [], endPoint }) =>
-    ({ from: sources[0], to: targets[0], points: [startPoint, ...bendPoints, endPoint].map(({ x, y }) => [x, y]) })));
+  const runs = edges.flatMap(({ sources, targets, sections }) =>
+    sections.map(({ startPoint, bendPoints = [], endPoint }) => ({
+      from: sources[0],
+      to: targets[0],
+      points: [startPoint, ...bendPoints, endPoint].map(({ x, y }) => [x, y]),
+    })),
+  );
   return fromGraph(positions, runs, persons);
 }
 
@@ -219,10 +274,12 @@ function fromDot(text, persons) {
   const words = text.split('\n').map((line) => line.split(' '));
   const point = (x, y) => [Number(x) * 72, -Number(y) * 72];
   const positions = new Map(words.filter(([kind]) => kind === 'node').map(([, name, x, y]) => [name, point(x, y)]));
-  const runs = words.filter(([kind]) => kind === 'edge').map(([, from, to, count, ...rest]) => {
-    const points = Array.from({ length: Number(count) }, (_, i) => point(rest[2 * i], rest[2 * i + 1]));
-    return { from, to, points: points.filter((_, i) => i % 3 === 0) };
-  });
+  const runs = words
+    .filter(([kind]) => kind === 'edge')
+    .map(([, from, to, count, ...rest]) => {
+      const points = Array.from({ length: Number(count) }, (_, i) => point(rest[2 * i], rest[2 * i + 1]));
+      return { from, to, points: points.filter((_, i) => i % 3 === 0) };
+    });
   return fromGraph(positions, runs, persons);
 }
 

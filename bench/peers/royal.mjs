@@ -15,7 +15,9 @@ const require = createRequire(join(folder, 'package.json'));
 const { CompositeRenderer, JsonDataProvider, AncestorChart, DescendantChart } = require('topola');
 const { layOutDescendants } = require('topola/dist/descendant-chart.js');
 const { ChartUtil } = require('topola/dist/chart-util.js');
-const { calculateTree } = await import(pathToFileURL(join(folder, 'node_modules/family-chart/dist/family-chart.esm.js')));
+const { calculateTree } = await import(
+  pathToFileURL(join(folder, 'node_modules/family-chart/dist/family-chart.esm.js'))
+);
 
 const WIDTH = 55;
 const HEIGHT = 80;
@@ -43,8 +45,12 @@ function readGedcom(text) {
 }
 
 class FixedBoxes extends CompositeRenderer {
-  getPreferredIndiSize() { return [WIDTH, HEIGHT]; }
-  getCss() { return ''; }
+  getPreferredIndiSize() {
+    return [WIDTH, HEIGHT];
+  }
+  getCss() {
+    return '';
+  }
   render() {}
 }
 
@@ -81,8 +87,13 @@ const entries = indis.map(({ id, sex, famc, fams: own }) => {
 
 const familyChart = (person, input) =>
   calculateTree(input, {
-    main_id: person, node_separation: WIDTH + 25, level_separation: HEIGHT + 30, single_parent_empty_card: false,
-    show_siblings_of_main: true, ancestry_depth: 3, progeny_depth: 3,
+    main_id: person,
+    node_separation: WIDTH + 25,
+    level_separation: HEIGHT + 30,
+    single_parent_empty_card: false,
+    show_siblings_of_main: true,
+    ancestry_depth: 3,
+    progeny_depth: 3,
   }).data;
 
 function measure(name, layOut, input = () => undefined) {
@@ -102,7 +113,9 @@ function measure(name, layOut, input = () => undefined) {
     times.push(least);
   }
   times.sort((a, b) => a - b);
-  console.log(`| ${name} | ${times.length} | ${times[times.length >> 1].toFixed(2)} | ${times.at(-1).toFixed(1)} | ${most} |`);
+  console.log(
+    `| ${name} | ${times.length} | ${times[times.length >> 1].toFixed(2)} | ${times.at(-1).toFixed(1)} | ${most} |`,
+  );
 }
 
 console.log('| chart | persons | median ms | slowest ms | most boxes |\n| --- | ---: | ---: | ---: | ---: |');

@@ -108,7 +108,8 @@ export class Family {
 
     person(person) {
         const read = this.#read("family_person", person, "person");
-        const [father, mother, sex, dead, birth, death, birthWritten, deathWritten, spouses, preferred, children] = read;
+        const [father, mother, sex, dead, birth, death, birthWritten, deathWritten, spouses, preferred, children] =
+            read;
         return {
             id: person,
             father,
@@ -222,7 +223,12 @@ export class Family {
         if (picture !== null) return picture;
         const isKnown = this.has(focus) && (options.view !== "kinship" || this.has(options.to));
         const why = this.#instance.text(exports.last_text());
-        throw new LayoutError(isKnown ? "layoutFailed" : "invalidPerson", `picture of person ${String(focus)}: ${why}`, "", []);
+        throw new LayoutError(
+            isKnown ? "layoutFailed" : "invalidPerson",
+            `picture of person ${String(focus)}: ${why}`,
+            "",
+            [],
+        );
     }
 
     close() {
@@ -303,7 +309,10 @@ export class Family {
         try {
             const status = STATUSES[exports.answer_status(answer)];
             const isDone = status === "ok";
-            const text = withText || !isDone ? instance.text(exports.answer_text(answer), exports.answer_text_length(answer)) : "";
+            const text =
+                withText || !isDone
+                    ? instance.text(exports.answer_text(answer), exports.answer_text_length(answer))
+                    : "";
             const records =
                 withText && isDone
                     ? []

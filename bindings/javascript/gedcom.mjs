@@ -119,7 +119,9 @@ export class GedcomFile {
         this.#file = file;
         this.name = name;
         this.texts = new Texts(instance);
-        const [encoding, version, persons, families, diagnostics] = table ? JSON.parse(table) : this.#answer("gedcom_table");
+        const [encoding, version, persons, families, diagnostics] = table
+            ? JSON.parse(table)
+            : this.#answer("gedcom_table");
         this.encoding = encoding;
         this.version = version;
         this.persons = persons.map(personFrom);

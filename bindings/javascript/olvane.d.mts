@@ -126,13 +126,7 @@ export type LayoutRecord = PersonRecord | UnknownParentRecord;
 /** A layout that did not come to its end. text and records are what was laid out before, often nothing. */
 export class LayoutError extends Error {
     readonly status:
-        | "invalidPerson"
-        | "hostFailed"
-        | "layoutFailed"
-        | "outOfMemory"
-        | "nestedCall"
-        | "invalidId"
-        | "tooLarge";
+        "invalidPerson" | "hostFailed" | "layoutFailed" | "outOfMemory" | "nestedCall" | "invalidId" | "tooLarge";
     readonly text: string;
     readonly records: readonly LayoutRecord[];
 }
@@ -508,15 +502,7 @@ export type SearchFit = "whole" | "begins" | "within" | "similar";
 /** Why a word of a search has found a person. */
 export interface SearchReason {
     readonly foundIn:
-        | "identifier"
-        | "name"
-        | "nickname"
-        | "marriedName"
-        | "title"
-        | "birth"
-        | "death"
-        | "place"
-        | "other";
+        "identifier" | "name" | "nickname" | "marriedName" | "title" | "birth" | "death" | "place" | "other";
     readonly fit: SearchFit;
     /** Of the record, in small letters without accents; of an identifier as it was typed. */
     readonly word: string;
@@ -658,9 +644,7 @@ export type ChildKind = "birth" | "adopted" | "foster" | "step" | "sealing" | "u
 type NumbersOf = Int8Array | Uint8Array | Int32Array | Uint32Array | BigInt64Array | Float64Array;
 
 /** Rows as objects; or columns: for each field an array of its values, or a typed array where they are numbers. */
-export type FamilyTable<Row> =
-    | Iterable<Row>
-    | { readonly [Field in keyof Row]?: readonly Row[Field][] | NumbersOf };
+export type FamilyTable<Row> = Iterable<Row> | { readonly [Field in keyof Row]?: readonly Row[Field][] | NumbersOf };
 
 /** Columns beside these become names, by their kind, or fields for labels. */
 export interface PersonRow {

@@ -40,9 +40,7 @@ export class Olvane {
     }
 
     picture(host, focus, options = {}) {
-        return host instanceof Family
-            ? host.picture(focus, options)
-            : runPicture(this.#instance, host, focus, options);
+        return host instanceof Family ? host.picture(focus, options) : runPicture(this.#instance, host, focus, options);
     }
 
     diagnosticWords(diagnostic, language = "en") {

@@ -79,8 +79,19 @@ function wayAt(n, at, words, { wayBoxes, pieces }) {
 
 /** The picture of a view; numbers may be memory of the module's, which is not kept. texts gives its words. */
 export function pictureFrom(view, numbers, texts) {
-    const [boxCount, arcCount, familyCount, memberCount, lineCount, bridgeCount, markCount, focus, ringCount, middleX, middleY] =
-        numbers;
+    const [
+        boxCount,
+        arcCount,
+        familyCount,
+        memberCount,
+        lineCount,
+        bridgeCount,
+        markCount,
+        focus,
+        ringCount,
+        middleX,
+        middleY,
+    ] = numbers;
     const [other, wayCount, wayBoxCount, pieceCount] = numbers.subarray(11, HEAD);
     // Lists refer to those behind them, so each is read where it lies before any is put together.
     const starts = {};
@@ -125,7 +136,12 @@ export function pictureFrom(view, numbers, texts) {
         kinship:
             other < 0
                 ? null
-                : { other, focusIs, otherIs, ways: list("ways", wayCount, 6, (start, i) => wayAt(numbers, start, words[i], starts)) },
+                : {
+                      other,
+                      focusIs,
+                      otherIs,
+                      ways: list("ways", wayCount, 6, (start, i) => wayAt(numbers, start, words[i], starts)),
+                  },
     };
 }
 

@@ -114,7 +114,5 @@ export function pictureNumbers(options) {
             throw new TypeError(`there is no option ${name}, but ${Object.keys(OPTIONS).join(", ")}`);
         }
     }
-    return Object.entries(OPTIONS).map(([name, option]) =>
-        numberOf(name, options[name] ?? option.usual, option),
-    );
+    return Object.entries(OPTIONS).map(([name, option]) => numberOf(name, options[name] ?? option.usual, option));
 }

@@ -3,7 +3,6 @@
 
 // Whom a search has found, and why, from the module's JSON.
 
-
 function reasonFrom([foundIn, fit, word, text, written, label]) {
     return { foundIn, fit, word, text, written, label };
 }

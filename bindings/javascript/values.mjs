@@ -42,7 +42,7 @@ const NUMBERS_OF_A_SEGMENT = 4;
 /** The records that a run of numbers holds, in its order. */
 export function recordsFrom(numbers) {
     const records = [];
-    for (let at = 0; at < numbers.length; ) {
+    for (let at = 0; at < numbers.length;) {
         const kind = numbers[at + 4];
         const count = numbers[at + 6];
         const segments = new Array(count);

@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 import "./olvane-tree.mjs";
 
-const persons = [  // yours: await (await fetch("/persons.json")).json()
+const persons = [
+    // yours: await (await fetch("/persons.json")).json()
     { id: 1, name: "Henry /Berg/", sex: "M", born: "1850", died: "1911", father: 4, mother: 5 },
     { id: 2, name: "Anne /Carl/", sex: "F", born: "1855", died: "1930" },
     { id: 3, name: "Elizabeth /Berg/", sex: "F", born: "1880", father: 1, mother: 2 },
@@ -14,7 +15,13 @@ const date = (tag, value) => (value ? [`1 ${tag}`, `2 DATE ${value}`] : []);
 const person = (tag, id) => (id ? [`1 ${tag} @I${id}@`] : []);
 const file = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
 for (const { id, name, sex, born, died, father, mother } of persons) {
-    file.push(`0 @I${id}@ INDI`, ...line("NAME", name), ...line("SEX", sex), ...date("BIRT", born), ...date("DEAT", died));
+    file.push(
+        `0 @I${id}@ INDI`,
+        ...line("NAME", name),
+        ...line("SEX", sex),
+        ...date("BIRT", born),
+        ...date("DEAT", died),
+    );
     if (father || mother) file.push(`1 FAMC @F${father}-${mother}@`);
 }
 for (const couple of new Set(persons.filter((p) => p.father || p.mother).map((p) => `${p.father}-${p.mother}`))) {

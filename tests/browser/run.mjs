@@ -6,7 +6,24 @@
 import { after } from "node:test";
 import { closeBrowser } from "./support/browser.mjs";
 
-const kSuites = ["opening", "walking", "searching", "options", "saving", "hostile", "looks", "accessible", "living", "details", "sharing", "large", "spoken", "map", "element", "speed"];
+const kSuites = [
+    "opening",
+    "walking",
+    "searching",
+    "options",
+    "saving",
+    "hostile",
+    "looks",
+    "accessible",
+    "living",
+    "details",
+    "sharing",
+    "large",
+    "spoken",
+    "map",
+    "element",
+    "speed",
+];
 
 const only = optionOf("--only");
 for (const suite of kSuites) {

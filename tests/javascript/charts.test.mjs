@@ -11,7 +11,18 @@ import test from "node:test";
 
 import { olvane } from "./module.mjs";
 
-const VIEWS = ["family", "pedigree", "near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship", "everybody"];
+const VIEWS = [
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+];
 const command = process.env.OLVANE_COMMAND;
 
 // As the command writes them: to thousandths, halves away from zero, without a negative zero.
@@ -62,7 +73,18 @@ function compare(path, focuses, other, views) {
     const file = olvane.readGedcom(readFileSync(path), "family.ged");
     for (const view of views) {
         for (const focus of focuses) {
-            const words = ["layout", path, "--focus", String(focus), "--view", view, "--format", "json", "--boxes", "tall"];
+            const words = [
+                "layout",
+                path,
+                "--focus",
+                String(focus),
+                "--view",
+                view,
+                "--format",
+                "json",
+                "--boxes",
+                "tall",
+            ];
             if (view === "kinship") words.push("--to", String(other));
             const text = execFileSync(command, words, { encoding: "utf8", maxBuffer: 2 ** 28 });
             const picture = file.picture(focus, { view, to: view === "kinship" ? other : undefined });
@@ -71,12 +93,18 @@ function compare(path, focuses, other, views) {
     }
 }
 
-test("every view of the bundled family is the same in WebAssembly and natively", { skip: !command && "no command" }, () => {
-    compare(new URL("../../samples/darwin-wedgwood.ged", import.meta.url).pathname, [1, 2, 17, 60], 30, VIEWS);
-});
+test(
+    "every view of the bundled family is the same in WebAssembly and natively",
+    { skip: !command && "no command" },
+    () => {
+        compare(new URL("../../samples/darwin-wedgwood.ged", import.meta.url).pathname, [1, 2, 17, 60], 30, VIEWS);
+    },
+);
 
 const royals = `${process.env.OLVANE_GEDCOM_DIR}/history/royal92.ged`;
-const reason = !command ? "no command" : !existsSync(royals) && "OLVANE_GEDCOM_DIR is not set, or has no history/royal92.ged";
+const reason = !command
+    ? "no command"
+    : !existsSync(royals) && "OLVANE_GEDCOM_DIR is not set, or has no history/royal92.ged";
 test("every view of a large family is the same in WebAssembly and natively", { skip: reason }, () => {
     const inTime = VIEWS.filter((view) => view !== "everybody");
     compare(royals, [1, 52, 700], 57, inTime);

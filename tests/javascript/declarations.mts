@@ -4,7 +4,15 @@
 // Never runs: a program in TypeScript must be able to say all this, and must not be able to say what is expected to
 // be an error.
 
-import { FamilyError, GedcomError, HostError, LayoutError, loadOlvane, PERSON_NOT_FOUND, Shown } from "../../bindings/javascript/olvane.mjs";
+import {
+    FamilyError,
+    GedcomError,
+    HostError,
+    LayoutError,
+    loadOlvane,
+    PERSON_NOT_FOUND,
+    Shown,
+} from "../../bindings/javascript/olvane.mjs";
 import type { Host, LayoutRecord, Options } from "../../bindings/javascript/olvane.mjs";
 
 class Family implements Host {
@@ -51,7 +59,11 @@ try {
 }
 
 const table = olvane.family({
-    persons: [{ id: 1, sex: "m", occupation: "smith" }, { id: 2n, birth: 1880 }, { id: 3, father: 1, mother: null }],
+    persons: [
+        { id: 1, sex: "m", occupation: "smith" },
+        { id: 2n, birth: 1880 },
+        { id: 3, father: 1, mother: null },
+    ],
     families: { number: [1], partner0: new Int32Array([1]), state: ["married"] },
     spouses: [{ person: 1, spouse: 2, preferred: true }],
 });

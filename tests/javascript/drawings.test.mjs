@@ -45,10 +45,7 @@ const kPictures = {
 const kDrawings = {
     dark: [{ theme: "dark" }, ["--theme", "dark"]],
     paper: [{ theme: "print", title: "Für <alle> & jeden" }, ["--theme", "print", "--title", "Für <alle> & jeden"]],
-    facts: [
-        { show: ["dates", "places", "occupation", "marriage"] },
-        ["--show", "dates,places,occupation,marriage"],
-    ],
+    facts: [{ show: ["dates", "places", "occupation", "marriage"] }, ["--show", "dates,places,occupation,marriage"]],
     wide: [{ boxes: "wide" }, ["--boxes", "wide"]],
 };
 
@@ -70,7 +67,9 @@ async function compare(path, file, person, [options, drawing], extra) {
     const expected = await drawnByCommand(path, person, extra);
     if (drawn === expected) return;
     const at = [...drawn].findIndex((letter, i) => letter !== expected[i]);
-    assert.fail(`person ${person}, ${extra.join(" ")}: at ${at}\n${drawn.slice(at - 80, at + 80)}\n${expected.slice(at - 80, at + 80)}`);
+    assert.fail(
+        `person ${person}, ${extra.join(" ")}: at ${at}\n${drawn.slice(at - 80, at + 80)}\n${expected.slice(at - 80, at + 80)}`,
+    );
 }
 
 // Calls work for each of the items, as many at a time as there are processors.

@@ -104,7 +104,10 @@ test("ids that would be another person are refused with their row and field", ()
 test("what is refused says where it stands", () => {
     const message = (given) => refusal(given).message;
     assert.equal(message({ persons: [{ id: "4" }] }), 'persons row 0, field id: "4" is not a whole number');
-    assert.equal(message({ persons: [{ id: 1, father: 9 }] }), "persons row 0, field father: 9 is not the id of a person");
+    assert.equal(
+        message({ persons: [{ id: 1, father: 9 }] }),
+        "persons row 0, field father: 9 is not the id of a person",
+    );
     assert.match(message({ persons: [{ id: 1, sex: "q" }] }), /^persons row 0, field sex: "q" is none of male, /);
     assert.match(message({ persons: [{ id: 1 }, { id: 2, birth: "a\0b" }] }), /^persons row 1, field birth: /);
     assert.match(message({ persons: [{ id: 1, birth: {} }] }), /^persons row 0, field birth: .* is not a text$/);

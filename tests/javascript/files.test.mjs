@@ -155,11 +155,14 @@ test("trouble in a file is reported by its line, and the rest is read", () => {
 });
 
 test("what is no GEDCOM file is refused with a reason", () => {
-    assert.throws(() => olvane.readGedcom(bytesOf("hello"), "letter.txt"), (error) => {
-        assert.ok(error instanceof GedcomError);
-        assert.match(error.message, /^letter\.txt: /);
-        return true;
-    });
+    assert.throws(
+        () => olvane.readGedcom(bytesOf("hello"), "letter.txt"),
+        (error) => {
+            assert.ok(error instanceof GedcomError);
+            assert.match(error.message, /^letter\.txt: /);
+            return true;
+        },
+    );
     assert.throws(() => olvane.readGedcom(new Uint8Array(), "empty.ged"), { message: "empty.ged: is empty" });
     assert.throws(() => olvane.readGedcom(bytesOf("PK\u0003\u0004"), "a.gdz"), GedcomError);
 });
@@ -188,12 +191,14 @@ test("a person outside the file is refused", () => {
 test("a layout that grows without measure is ended in words", () => {
     const count = 60;
     const persons = Array.from({ length: count }, (_, i) => i + 1);
-    const couples = persons.filter((id) => id % 2 === 1).flatMap((man) =>
-        persons.filter((id) => id % 2 === 0).map((wife) => [man, wife]),
-    );
+    const couples = persons
+        .filter((id) => id % 2 === 1)
+        .flatMap((man) => persons.filter((id) => id % 2 === 0).map((wife) => [man, wife]));
     const links = (id) =>
         couples
-            .map(([man, wife], i) => (man === id || wife === id ? `1 FAMS @F${i}@\n1 FAMC @F${i}@\n` : `1 FAMC @F${i}@\n`))
+            .map(([man, wife], i) =>
+                man === id || wife === id ? `1 FAMS @F${i}@\n1 FAMC @F${i}@\n` : `1 FAMC @F${i}@\n`,
+            )
             .join("");
     const text =
         "0 HEAD\n1 CHAR UTF-8\n" +
@@ -282,19 +287,30 @@ test("details of a person and a family come with their facts and names", () => {
     assert.deepEqual(anna.media, [{ title: "Anna at home", file: "anna.jpg", format: "jpeg" }]);
     assert.deepEqual(anna.links, ["https://example.org/anna"]);
     assert.deepEqual(
-        anna.names.map(({ text, type, nickname, details }) => [text, type, nickname, details.citations.map(({ page }) => page)]),
+        anna.names.map(({ text, type, nickname, details }) => [
+            text,
+            type,
+            nickname,
+            details.citations.map(({ page }) => page),
+        ]),
         [
             ["Anna Berg", "birth", "Anni", []],
             ["Anna Tal", "married", "", ["folio 3"]],
         ],
     );
     const { tag, date, details } = anna.facts[0];
-    assert.deepEqual([tag, date.year, details.address, details.cause, details.age], ["RESI", 1850, "4 Main Street\nBern", "work", "20"]);
+    assert.deepEqual(
+        [tag, date.year, details.address, details.cause, details.age],
+        ["RESI", 1850, "4 Main Street\nBern", "work", "20"],
+    );
     assert.deepEqual(details.citations, [
         { title: "Parish book", author: "A priest", publication: "", page: "12", text: "", quality: 2 },
     ]);
     const couple = file.detailsOfFamily(1);
-    assert.deepEqual([couple.notes, couple.facts[0].tag, couple.facts[0].details.wifeAge], [["of the couple"], "MARR", "22"]);
+    assert.deepEqual(
+        [couple.notes, couple.facts[0].tag, couple.facts[0].details.wifeAge],
+        [["of the couple"], "MARR", "22"],
+    );
     assert.throws(() => file.detailsOfPerson(2), GedcomError);
     file.close();
 });

@@ -154,8 +154,7 @@ test("an answered id that is not 1 to 2147483647 is refused by its value", () =>
                 (error) =>
                     error instanceof HostError &&
                     error.cause.name === name &&
-                    error.cause.message ===
-                        `a host answered ${shown} where an id is a whole number of 1 to 2147483647`,
+                    error.cause.message === `a host answered ${shown} where an id is a whole number of 1 to 2147483647`,
             );
         }
     }
@@ -299,10 +298,7 @@ test("what finds no room in the module's memory is no failure of the host", asyn
             for (;;) yield 5;
         },
     };
-    for (const changes of [
-        { spousesOf: () => endless },
-        { childrenOf: () => endless },
-    ]) {
+    for (const changes of [{ spousesOf: () => endless }, { childrenOf: () => endless }]) {
         assert.throws(() => full.layout(hostOf(changes), 1), {
             name: "LayoutError",
             status: "outOfMemory",
@@ -343,7 +339,10 @@ test("a failure names the question, the person and the cause", () => {
     assert.equal(failing({ isPreferredSpouse: raise }), "isPreferredSpouse(1, 2): Error: no row");
     assert.match(failing({ dateOf: raise }), /^dateOf\(\d, (true|false)\): Error: no row$/);
     assert.match(failing({ fatherOf: () => "4" }), /^fatherOf\(\d\): TypeError: .* answered "4" where /);
-    assert.match(failing({ fatherOf: () => 2 ** 32 + 4 }), /^fatherOf\(\d\): RangeError: .* answered 4294967300 where /);
+    assert.match(
+        failing({ fatherOf: () => 2 ** 32 + 4 }),
+        /^fatherOf\(\d\): RangeError: .* answered 4294967300 where /,
+    );
     assert.match(failing({ spousesOf: async () => [] }), /^spousesOf\(\d\): TypeError: .*promise/);
     assert.match(failing({ spousesOf: () => null }), /^spousesOf\(\d\): TypeError: .* answered null where a list/);
 });

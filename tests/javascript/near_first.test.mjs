@@ -56,6 +56,11 @@ test("aFamilyBehindANetworkComesInRings", async () => {
 test("whoEndsTheRingsEarlyAsksNoMore", async () => {
     const rows = new Map([[1, { id: 1, father: 2, mother: null, spouses: [], children: [] }]]);
     let rounds = 0;
-    await nearFirst(olvane, async (ids) => ids.filter((id) => rows.has(id)).map((id) => rows.get(id)), 1, () => ++rounds);
+    await nearFirst(
+        olvane,
+        async (ids) => ids.filter((id) => rows.has(id)).map((id) => rows.get(id)),
+        1,
+        () => ++rounds,
+    );
     assert.equal(rounds, 2, "the father is asked for once, and does not come");
 });

@@ -60,16 +60,28 @@ test("a picture says who belongs to which family, and how", () => {
     const parents = picture.families.find(({ number }) => number === 2);
     assert.equal(parents.style, "divorced");
     assert.deepEqual(new Set(own.lines.map(({ role }) => role)), new Set(["marriage", "drop", "bar", "stem"]));
-    assert.deepEqual(own.lines.filter(({ role }) => role === "stem").map(({ child }) => picture.boxes[child].id).sort(), [3, 4]);
+    assert.deepEqual(
+        own.lines
+            .filter(({ role }) => role === "stem")
+            .map(({ child }) => picture.boxes[child].id)
+            .sort(),
+        [3, 4],
+    );
 });
 
 test("the boxes of the engine's views stand where its layout has them", () => {
     for (const view of ["family", "pedigree"]) {
         const records = file.layout(1, { view });
         const boxes = file.picture(1, { view, width: 55, height: 80, gapX: 25, gapY: 30 }).boxes;
-        assert.deepEqual(boxes.map(({ x, y }) => [x, y]), records.map(({ x, y }) => [x, y]));
+        assert.deepEqual(
+            boxes.map(({ x, y }) => [x, y]),
+            records.map(({ x, y }) => [x, y]),
+        );
         const flags = records.map(({ id, hasHiddenRelatives }) => (id > 0 ? hasHiddenRelatives : null));
-        assert.deepEqual(boxes.map(({ flag }) => flag), flags);
+        assert.deepEqual(
+            boxes.map(({ flag }) => flag),
+            flags,
+        );
     }
 });
 
@@ -124,9 +136,15 @@ test("a picture of kinship has the line of each way, and words at both ends", ()
     assert.deepEqual([kinship.focusIs, kinship.otherIs], ["grandchild", "grandfather (father's father)"]);
     const [way] = kinship.ways;
     assert.deepEqual([way.kind, way.words], ["blood", "grandfather (father's father)"]);
-    assert.deepEqual(way.boxes.map((box) => boxes[box].id), [3, 1, 5]);
+    assert.deepEqual(
+        way.boxes.map((box) => boxes[box].id),
+        [3, 1, 5],
+    );
     assert.equal(way.boxes[0], focus);
-    assert.deepEqual(way.ancestors.map((box) => boxes[box].id), [5]);
+    assert.deepEqual(
+        way.ancestors.map((box) => boxes[box].id),
+        [5],
+    );
     assert.ok(way.lines.length > 0);
     for (const { x1, y1, x2, y2 } of way.lines) assert.ok((x1 === x2) !== (y1 === y2));
     const german = file.picture(3, { view: "kinship", to: 5, language: "de" }).kinship;
@@ -146,7 +164,11 @@ const adopted = olvane.readGedcom(
 
 test("whose parents come first is a choice, and whoever has further ones says so", () => {
     const shown = (options) => idsShown(adopted.picture(1, options));
-    const idsShown = ({ boxes }) => boxes.filter(({ id }) => id > 0).map(({ id }) => id).sort();
+    const idsShown = ({ boxes }) =>
+        boxes
+            .filter(({ id }) => id > 0)
+            .map(({ id }) => id)
+            .sort();
     assert.deepEqual(shown({}), [1, 2]);
     assert.deepEqual(shown({ parents: "adoptive" }), [1, 3]);
     assert.deepEqual(shown({ parentsOf: 1, parentFamily: 2 }), [1, 3]);
@@ -158,7 +180,10 @@ test("whose parents come first is a choice, and whoever has further ones says so
 
 // Persons 1 and 2 have the children 3 and 5; 3 and 4 have 7.
 const parents = { 3: [1, 2], 5: [1, 2], 7: [3, 4] };
-const couples = [[1, 2, [3, 5]], [3, 4, [7]]];
+const couples = [
+    [1, 2, [3, 5]],
+    [3, 4, [7]],
+];
 const personIds = [1, 2, 3, 4, 5, 7];
 const families = (id) => couples.filter(([one, other]) => one === id || other === id);
 const host = {
@@ -172,15 +197,39 @@ const host = {
     sexOf: (id) => (id % 2 === 0 ? 1 : 0),
 };
 const table = olvane.family({
-    persons: personIds.map((id) => ({ id, father: parents[id]?.[0], mother: parents[id]?.[1], sex: id % 2 === 0 ? "female" : "male" })),
-    spouses: couples.flatMap(([one, other]) => [{ person: one, spouse: other }, { person: other, spouse: one }]),
+    persons: personIds.map((id) => ({
+        id,
+        father: parents[id]?.[0],
+        mother: parents[id]?.[1],
+        sex: id % 2 === 0 ? "female" : "male",
+    })),
+    spouses: couples.flatMap(([one, other]) => [
+        { person: one, spouse: other },
+        { person: other, spouse: one },
+    ]),
     children: couples.flatMap(([one, other, children]) =>
-        [one, other].flatMap((parent) => children.map((child) => ({ parent, child })))),
+        [one, other].flatMap((parent) => children.map((child) => ({ parent, child }))),
+    ),
 });
-const shownIds = ({ boxes }) => boxes.map(({ id }) => id).filter((id) => id > 0).sort();
+const shownIds = ({ boxes }) =>
+    boxes
+        .map(({ id }) => id)
+        .filter((id) => id > 0)
+        .sort();
 
 test("every view is drawn of a family that is handed over, and of a host that is asked", () => {
-    for (const view of ["family", "pedigree", "near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship", "everybody"]) {
+    for (const view of [
+        "family",
+        "pedigree",
+        "near",
+        "ancestors",
+        "descendants",
+        "hourglass",
+        "relatives",
+        "fan",
+        "kinship",
+        "everybody",
+    ]) {
         const options = { view, to: 5 };
         const ofTable = olvane.picture(table, 7, options);
         const ofHost = olvane.picture(host, 7, options);
@@ -189,14 +238,23 @@ test("every view is drawn of a family that is handed over, and of a host that is
         assert.ok(shownIds(ofTable).length >= (view === "descendants" ? 1 : 3), view);
     }
     assert.equal(table.picture(7, { view: "kinship", to: 5 }).kinship.otherIs, "uncle (father's brother)");
-    assert.throws(() => table.picture(9, { view: "fan" }), (error) => error instanceof LayoutError && error.status === "invalidPerson");
+    assert.throws(
+        () => table.picture(9, { view: "fan" }),
+        (error) => error instanceof LayoutError && error.status === "invalidPerson",
+    );
 });
 
 test("a failure of a host names the question and the person, in every view", () => {
     const failing = { ...host, childrenOf: (id) => (id === 3 ? assert.fail("no such page") : host.childrenOf(id)) };
     for (const view of ["family", "near", "hourglass", "relatives", "everybody"]) {
-        assert.throws(() => olvane.picture(failing, 7, { view }), (error) =>
-            error instanceof HostError && error.status === "hostFailed" && /childrenOf\(3\): .*no such page/.test(error.message), view);
+        assert.throws(
+            () => olvane.picture(failing, 7, { view }),
+            (error) =>
+                error instanceof HostError &&
+                error.status === "hostFailed" &&
+                /childrenOf\(3\): .*no such page/.test(error.message),
+            view,
+        );
     }
     assert.equal(olvane.picture(host, 7, { view: "near" }).boxes.length > 0, true);
 });

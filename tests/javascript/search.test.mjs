@@ -87,7 +87,8 @@ const kFile = `0 HEAD
 
 test("a hit says what stands in the record where each word was found", () => {
     const file = olvane.readGedcom(new TextEncoder().encode(kFile));
-    const why = (text) => file.search(text).map(({ person, reasons }) => [person, ...reasons.map((r) => [r.foundIn, r.text, r.label])]);
+    const why = (text) =>
+        file.search(text).map(({ person, reasons }) => [person, ...reasons.map((r) => [r.foundIn, r.text, r.label])]);
     assert.deepEqual(why("charles"), [[1, ["name", "Charles Robert Darwin", ""]]]);
     assert.deepEqual(why("emma darwin"), [[2, ["name", "Emma Wedgwood", ""], ["marriedName", "Darwin", ""]]]);
     assert.deepEqual(why("emmy"), [[2, ["nickname", "Emmy", ""]]]);
@@ -95,7 +96,10 @@ test("a hit says what stands in the record where each word was found", () => {
     assert.deepEqual(why("hara"), [[3, ["marriedName", "O'Hara", ""]]]);
     assert.deepEqual(why("1800-1810"), [[1, ["birth", "12 FEB 1809", "BIRT"]]]);
     assert.deepEqual(why("downe"), [[1, ["place", "Downe, Kent, England", "RESI"]]]);
-    assert.deepEqual(why("maer"), [[1, ["place", "Maer, Staffordshire", "MARR"]], [2, ["place", "Maer, Staffordshire", "MARR"]]]);
+    assert.deepEqual(why("maer"), [
+        [1, ["place", "Maer, Staffordshire", "MARR"]],
+        [2, ["place", "Maer, Staffordshire", "MARR"]],
+    ]);
     assert.deepEqual(why("1842"), [[1, ["other", "1842", "RESI"]]]);
     assert.deepEqual(why("naturalist"), [[1, ["other", "Naturalist", "OCCU"]]]);
     assert.deepEqual(why("naturlist"), [[1, ["other", "Naturalist", "OCCU"]]]);

@@ -113,7 +113,11 @@ test("wrong numbers behind a right checksum are refused, or harm nobody", { skip
 test("persons are found by beginnings of words and by years, whole words first", { skip }, () => {
     const map = new FamilyMap(bytesOf("family"));
     const search = new MapSearch(map);
-    const names = (text: string) => search.find(text, 9).map((person) => `${map.name(person)} ${map.birth(person)}`).sort();
+    const names = (text: string) =>
+        search
+            .find(text, 9)
+            .map((person) => `${map.name(person)} ${map.birth(person)}`)
+            .sort();
     assert.deepEqual(names("ash0 1803"), ["Ann Ash0 1803"]);
     assert.deepEqual(names("1803 AN"), ["Ann Ash0 1803"]);
     assert.deepEqual(names("ash2"), ["Ann Ash2 1802", "Ann Ash2 1805"]);

@@ -36,10 +36,18 @@ test("a mark stands before its date", () => {
 
 test("what lasted has a beginning and an end, and nothing between them", () => {
     const rows = [
-        [date(1819, { mark: "between", lastYear: 1825, written: "FROM 1819 TO 1825" }), "from 1819 to 1825", "von 1819 bis 1825"],
+        [
+            date(1819, { mark: "between", lastYear: 1825, written: "FROM 1819 TO 1825" }),
+            "from 1819 to 1825",
+            "von 1819 bis 1825",
+        ],
         [date(1819, { mark: "after", written: "FROM 1819" }), "from 1819", "ab 1819"],
         [date(1825, { mark: "before", written: "to JUN 1825", month: 6 }), "until June 1825", "bis Juni 1825"],
-        [date(1819, { mark: "between", lastYear: 1825, written: "BET 1819 AND 1825" }), "between 1819 and 1825", "zwischen 1819 und 1825"],
+        [
+            date(1819, { mark: "between", lastYear: 1825, written: "BET 1819 AND 1825" }),
+            "between 1819 and 1825",
+            "zwischen 1819 und 1825",
+        ],
     ] as const;
     for (const [given, inEnglish, inGerman] of rows) {
         assert.equal(dateText(given, english), inEnglish);

@@ -29,7 +29,9 @@ try {
     const reporters = ["--test-reporter=spec", "--test-reporter-destination=stdout"];
     const results = process.env.OLVANE_RESULTS;
     if (results) reporters.push("--test-reporter=junit", `--test-reporter-destination=${results}`);
-    const run = spawnSync(process.execPath, ["--enable-source-maps", "--test", ...reporters, ...files], { stdio: "inherit" });
+    const run = spawnSync(process.execPath, ["--enable-source-maps", "--test", ...reporters, ...files], {
+        stdio: "inherit",
+    });
     process.exitCode = run.status ?? 1;
 } finally {
     rmSync(folder, { recursive: true, force: true });

@@ -17,7 +17,8 @@ export class Walk {
         await this.window.evaluate(() => {
             const viewer = () => document.querySelector("olvane-tree")?.shadowRoot;
             window.one = (selector) => document.querySelector(selector) ?? viewer()?.querySelector(selector) ?? null;
-            window.all = (selector) => [document, viewer()].flatMap((tree) => [...(tree?.querySelectorAll(selector) ?? [])]);
+            window.all = (selector) =>
+                [document, viewer()].flatMap((tree) => [...(tree?.querySelectorAll(selector) ?? [])]);
         });
         await this.until(() => one("#tree .box.focus") !== null);
         await this.still();
@@ -34,9 +35,13 @@ export class Walk {
     /** Until nothing in the picture moves. */
     async still() {
         await this.window.evaluate(async () => {
-            const look = () => [one("#tree .world")?.getAttribute("transform"), ...all("#tree .boxes > g").map((box) => box.getAttribute("transform"))].join();
+            const look = () =>
+                [
+                    one("#tree .world")?.getAttribute("transform"),
+                    ...all("#tree .boxes > g").map((box) => box.getAttribute("transform")),
+                ].join();
             let last = look();
-            for (let calm = 0; calm < 4; ) {
+            for (let calm = 0; calm < 4;) {
                 await new Promise((next) => setTimeout(next, 40));
                 const now = look();
                 calm = now === last ? calm + 1 : 0;
@@ -82,7 +87,9 @@ export class Walk {
         return this.window.evaluate(() => {
             const { picture } = document.querySelector("olvane-tree");
             const boxes = picture.boxes.map(({ key, x, y, width, height }) => [key, x, y, width, height].join(" "));
-            const lines = picture.families.flatMap(({ family }) => family.lines.map(({ x1, y1, x2, y2 }) => [x1, y1, x2, y2].join(" ")));
+            const lines = picture.families.flatMap(({ family }) =>
+                family.lines.map(({ x1, y1, x2, y2 }) => [x1, y1, x2, y2].join(" ")),
+            );
             return [...boxes, ...lines].join("\n");
         });
     }

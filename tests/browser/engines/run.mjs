@@ -25,7 +25,14 @@ function optionOf(name) {
 }
 
 function pageWith(gedcom, title) {
-    const block = JSON.stringify({ name: "family.ged", title, focus: 1, view: "family", livingHidden: false, gzip: gzipSync(gedcom).toString("base64") });
+    const block = JSON.stringify({
+        name: "family.ged",
+        title,
+        focus: 1,
+        view: "family",
+        livingHidden: false,
+        gzip: gzipSync(gedcom).toString("base64"),
+    });
     const page = readFileSync(process.env.OLVANE_PAGE, "utf8").replace(
         "<!-- olvane:family -->",
         () => `<script type="application/json" id="olvane-family">${block.replaceAll("<", "\\u003c")}</script>`,
@@ -127,7 +134,7 @@ const kTasks = {
         await walk.until(() => !location.hash.includes("view=pedigree"));
         return walk.picture();
     },
-    "print": async (walk) => {
+    print: async (walk) => {
         const sheets = await walk.window.sheets();
         assert.ok(sheets === null || sheets === 1, `${sheets} sheets`);
         return "";
@@ -146,7 +153,9 @@ const kDetailTasks = {
         await walk.window.evaluate((text) => {
             const transfer = new DataTransfer();
             transfer.items.add(new File([text], "long.ged"));
-            document.body.dispatchEvent(new DragEvent("drop", { dataTransfer: transfer, bubbles: true, cancelable: true }));
+            document.body.dispatchEvent(
+                new DragEvent("drop", { dataTransfer: transfer, bubbles: true, cancelable: true }),
+            );
         }, kLarge);
         await walk.until(() => document.title === "long");
         return walk.text(".bar .title");

@@ -16,14 +16,24 @@ const kFirefox = "/usr/bin/firefox-esr";
 const kWebKitDriver = "/usr/bin/WebKitWebDriver";
 const kMiniBrowsers = ["4.1", "4.0"].map((version) => `/usr/lib/x86_64-linux-gnu/webkit2gtk-${version}/MiniBrowser`);
 
-const kKeys = { Enter: "\uE007", Escape: "\uE00C", ArrowUp: "\uE013", ArrowDown: "\uE015", ArrowLeft: "\uE012", ArrowRight: "\uE014", Tab: "\uE004" };
+const kKeys = {
+    Enter: "\uE007",
+    Escape: "\uE00C",
+    ArrowUp: "\uE013",
+    ArrowDown: "\uE015",
+    ArrowLeft: "\uE012",
+    ArrowRight: "\uE014",
+    Tab: "\uE004",
+};
 
 // Pages are objects of their own, which may lie in packed streams.
 function sheetsOf(pdf) {
     const text = pdf.toString("latin1");
     const packed = [...text.matchAll(/stream\r?\n([\s\S]*?)endstream/g)].map(([, bytes]) => {
         try {
-            return inflateSync(Buffer.from(bytes, "latin1"), { finishFlush: constants.Z_SYNC_FLUSH }).toString("latin1");
+            return inflateSync(Buffer.from(bytes, "latin1"), { finishFlush: constants.Z_SYNC_FLUSH }).toString(
+                "latin1",
+            );
         } catch {
             return "";
         }
@@ -131,7 +141,9 @@ class WebDriverWindow {
         ]).flat();
         const move = { type: "pointerMove", x: Math.round(x), y: Math.round(y), duration: 0 };
         await this.send("POST", "/actions", {
-            actions: [{ type: "pointer", id: "mouse", parameters: { pointerType: "mouse" }, actions: [move, ...clicks] }],
+            actions: [
+                { type: "pointer", id: "mouse", parameters: { pointerType: "mouse" }, actions: [move, ...clicks] },
+            ],
         });
     }
 
@@ -141,7 +153,10 @@ class WebDriverWindow {
 
     async press(key) {
         const value = kKeys[key] ?? key;
-        const actions = [{ type: "keyDown", value }, { type: "keyUp", value }];
+        const actions = [
+            { type: "keyDown", value },
+            { type: "keyUp", value },
+        ];
         await this.send("POST", "/actions", { actions: [{ type: "key", id: "keyboard", actions }] });
     }
 
@@ -161,7 +176,15 @@ class WebDriverWindow {
     }
 }
 
-const kFlags = ["--no-sandbox", "--disable-gpu", "--disable-quic", "--no-first-run", "--disable-background-networking", "--disable-component-update", "--disable-sync"];
+const kFlags = [
+    "--no-sandbox",
+    "--disable-gpu",
+    "--disable-quic",
+    "--no-first-run",
+    "--disable-background-networking",
+    "--disable-component-update",
+    "--disable-sync",
+];
 
 /** What can be had on this machine: a name, and how a window of it is opened. */
 export const kEngines = [
@@ -173,7 +196,12 @@ export const kEngines = [
     {
         name: "firefox",
         isHere: existsSync(kFirefox),
-        open: () => PuppeteerWindow.open("firefox", { browser: "firefox", executablePath: kFirefox, protocol: "webDriverBiDi" }),
+        open: () =>
+            PuppeteerWindow.open("firefox", {
+                browser: "firefox",
+                executablePath: kFirefox,
+                protocol: "webDriverBiDi",
+            }),
     },
     {
         name: "webkit",

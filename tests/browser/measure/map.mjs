@@ -37,12 +37,15 @@ console.log(`${basename(file)}: ${size} MB; ${await page.innerText(".title span"
 console.log(`  open: ${(await page.evaluate(() => window.openedAfter)).toFixed(0)} ms`);
 printBytes(readFileSync(file, "latin1"));
 if (folder) mkdirSync(folder, { recursive: true });
-const photograph = async (name) => folder && page.screenshot({ path: join(folder, `${basename(file, ".html")}-${name}.png`) });
+const photograph = async (name) =>
+    folder && page.screenshot({ path: join(folder, `${basename(file, ".html")}-${name}.png`) });
 await page.waitForTimeout(1500);
 await photograph("far");
 
 const frames = await page.evaluate(fly, 600);
-console.log(`  frames: median ${at(frames, 0.5)} ms, 99th percentile ${at(frames, 0.99)} ms, longest ${at(frames, 1)} ms`);
+console.log(
+    `  frames: median ${at(frames, 0.5)} ms, 99th percentile ${at(frames, 0.99)} ms, longest ${at(frames, 1)} ms`,
+);
 
 const finds = [];
 const flights = [];
@@ -65,10 +68,13 @@ function printBytes(text) {
     const map = gunzipSync(Buffer.from(packed, "base64"));
     const persons = map.readUInt32LE(20);
     const sizes = new Map();
-    for (let at = 28; at < map.length; at += 8 + 4 * Math.ceil(map.readUInt32LE(at + 4) / 4)) sizes.set(map.readUInt32LE(at), map.readUInt32LE(at + 4));
+    for (let at = 28; at < map.length; at += 8 + 4 * Math.ceil(map.readUInt32LE(at + 4) / 4))
+        sizes.set(map.readUInt32LE(at), map.readUInt32LE(at + 4));
     const each = (bytes) => (bytes / persons).toFixed(1);
     const [names, texts] = [sizes.get(8), sizes.get(9)];
-    console.log(`  bytes a person: ${each(map.length - names - texts)} beside the names, ${each(names + texts)} of names; ${each(packed.length)} as they lie in the page`);
+    console.log(
+        `  bytes a person: ${each(map.length - names - texts)} beside the names, ${each(names + texts)} of names; ${each(packed.length)} as they lie in the page`,
+    );
 }
 
 // In the page. Wheel and drag by events, as they come from hands; one of them a frame.
@@ -77,8 +83,14 @@ function fly(count) {
     let seed = 7;
     const random = () => (seed = (seed * 48271) % 2147483647) / 2147483647;
     const gaps = [];
-    const wheel = (x, y, deltaY) => canvas.dispatchEvent(new WheelEvent("wheel", { clientX: x, clientY: y, deltaY, bubbles: true, cancelable: true }));
-    const pointer = (type, x, y) => canvas.dispatchEvent(new PointerEvent(type, { pointerId: 1, button: 0, clientX: x, clientY: y, bubbles: true }));
+    const wheel = (x, y, deltaY) =>
+        canvas.dispatchEvent(
+            new WheelEvent("wheel", { clientX: x, clientY: y, deltaY, bubbles: true, cancelable: true }),
+        );
+    const pointer = (type, x, y) =>
+        canvas.dispatchEvent(
+            new PointerEvent(type, { pointerId: 1, button: 0, clientX: x, clientY: y, bubbles: true }),
+        );
     return new Promise((done) => {
         let last = 0;
         let i = 0;
@@ -104,7 +116,15 @@ function fly(count) {
 
 async function findAndGo(i) {
     const input = document.querySelector("#search");
-    const words = ["mary", "john 18", "given" + i * 97, "surname" + ((i * 31) % 997), "will", "given" + i * 41 + " surname" + i, "elizabeth"];
+    const words = [
+        "mary",
+        "john 18",
+        "given" + i * 97,
+        "surname" + ((i * 31) % 997),
+        "will",
+        "given" + i * 41 + " surname" + i,
+        "elizabeth",
+    ];
     input.focus();
     input.value = words[i % words.length];
     const start = performance.now();
@@ -114,7 +134,8 @@ async function findAndGo(i) {
     performance.clearMeasures("olvane-map-flight");
     const chosen = performance.now();
     input.dispatchEvent(new KeyboardEvent("keydown", { key: "Enter", bubbles: true }));
-    while (performance.getEntriesByName("olvane-map-flight").length === 0) await new Promise((next) => setTimeout(next, 1));
+    while (performance.getEntriesByName("olvane-map-flight").length === 0)
+        await new Promise((next) => setTimeout(next, 1));
     return { find, flight: performance.now() - chosen };
 }
 

@@ -11,7 +11,13 @@ async function expectNoViolation(visit, state) {
     await visit.page.evaluate(axe.source);
     const found = await visit.page.evaluate(async () => {
         const { violations } = await window.axe.run(document, { resultTypes: ["violations"] });
-        return violations.map(({ id, help, nodes }) => `${id}: ${help}: ${nodes.slice(0, 3).map((node) => node.html.slice(0, 160)).join(" | ")}`);
+        return violations.map(
+            ({ id, help, nodes }) =>
+                `${id}: ${help}: ${nodes
+                    .slice(0, 3)
+                    .map((node) => node.html.slice(0, 160))
+                    .join(" | ")}`,
+        );
     });
     assert.deepEqual(found, [], state);
 }
@@ -43,7 +49,11 @@ describe("accessible", kTwoAtOnce, () => {
     const kViews = ["near", "ancestors", "descendants", "hourglass", "relatives", "fan", "kinship&to=I12", "everybody"];
     for (const [state, settings, views] of [
         ["on a desktop", {}, kViews],
-        ["on a phone of 320 px", { viewport: { width: 320, height: 640 }, hasTouch: true, isMobile: true }, ["fan", "kinship&to=I12", "everybody"]],
+        [
+            "on a phone of 320 px",
+            { viewport: { width: 320, height: 640 }, hasTouch: true, isMobile: true },
+            ["fan", "kinship&to=I12", "everybody"],
+        ],
         ["with forced colours", { forcedColors: "active" }, ["descendants", "fan"]],
     ]) {
         test(`axe finds nothing in charts, and none scrolls sideways: ${state}`, async () => {
@@ -105,7 +115,17 @@ describe("accessible", kTwoAtOnce, () => {
             });
             reached.add(at);
         }
-        for (const id of ["search", "view-family", "view-pedigree", "options-button", "file-button", "panel-button", "zoom-in", "fit", "I1"]) {
+        for (const id of [
+            "search",
+            "view-family",
+            "view-pedigree",
+            "options-button",
+            "file-button",
+            "panel-button",
+            "zoom-in",
+            "fit",
+            "I1",
+        ]) {
             assert.ok(reached.has(id), `${id} among ${[...reached].join(" ")}`);
         }
         await visit.end();
@@ -121,10 +141,13 @@ describe("accessible", kTwoAtOnce, () => {
             return { outline: outlineStyle !== "none" && parseFloat(outlineWidth) > 0, shadow: boxShadow !== "none" };
         });
         assert.ok(outline.outline || outline.shadow);
-        const ring = (xref) => page.evaluate((xref) => {
-            const { stroke, opacity, display, visibility } = getComputedStyle(one(`#tree [data-xref="${xref}"] .ring`));
-            return [stroke, opacity, display, visibility].join();
-        }, xref);
+        const ring = (xref) =>
+            page.evaluate((xref) => {
+                const { stroke, opacity, display, visibility } = getComputedStyle(
+                    one(`#tree [data-xref="${xref}"] .ring`),
+                );
+                return [stroke, opacity, display, visibility].join();
+            }, xref);
         await visit.stand("I1");
         const before = await ring("I12");
         await visit.press("ArrowUp");

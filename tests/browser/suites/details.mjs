@@ -9,7 +9,15 @@ import { mkdirSync, readFileSync, symlinkSync, writeFileSync } from "node:fs";
 import { join } from "node:path";
 import { describe, test } from "node:test";
 import { gunzipSync } from "node:zlib";
-import { fileFor, kTwoAtOnce, newContext, photograph, visitEmpty, visitFamily, visitFile } from "../support/browser.mjs";
+import {
+    fileFor,
+    kTwoAtOnce,
+    newContext,
+    photograph,
+    visitEmpty,
+    visitFamily,
+    visitFile,
+} from "../support/browser.mjs";
 import { detailedFamily, kDetailWords, livingFamily } from "../support/families.mjs";
 import { archiveOf } from "../support/archive.mjs";
 
@@ -24,7 +32,10 @@ async function jpeg(width, height) {
         ([width, height]) => {
             const canvas = Object.assign(document.createElement("canvas"), { width, height });
             const paint = canvas.getContext("2d");
-            for (const [colour, x] of [["red", 0], ["blue", width / 2]]) {
+            for (const [colour, x] of [
+                ["red", 0],
+                ["blue", width / 2],
+            ]) {
                 paint.fillStyle = colour;
                 paint.fillRect(x, 0, width / 2, height);
             }
@@ -45,7 +56,9 @@ function heldSideways(bytes) {
 }
 
 function blockOf(page) {
-    return JSON.parse(/<script type="application\/json" id="olvane-family">([^]*?)<\/script>/.exec(readFileSync(page, "utf8"))[1]);
+    return JSON.parse(
+        /<script type="application\/json" id="olvane-family">([^]*?)<\/script>/.exec(readFileSync(page, "utf8"))[1],
+    );
 }
 
 function folderFor(name) {
@@ -67,7 +80,9 @@ describe("details", kTwoAtOnce, () => {
         await unfold(visit);
         const text = await visit.page.innerText("#side-panel");
         for (const word of kDetailWords) assert.ok(text.includes(word), word);
-        const order = await visit.page.$$eval("#side-panel section.facts dt", (all) => all.map((one) => one.textContent));
+        const order = await visit.page.$$eval("#side-panel section.facts dt", (all) =>
+            all.map((one) => one.textContent),
+        );
         assert.deepEqual(order, ["Name", "Married name", "Birth", "Taufzeuge", "Residence", "Occupation", "Death"]);
         assert.match(text, /Primary evidence/);
         assert.equal(await visit.page.locator("#side-panel .sources").first().getAttribute("open"), "");
@@ -99,14 +114,19 @@ describe("details", kTwoAtOnce, () => {
 
     test("photographs of an archive are shown from it; what lies outside, is none or is endless is not", async () => {
         const photo = await jpeg(60, 40);
-        const text = detailedFamily()
-            .replace("1 OBJE @M1@", "1 OBJE @M1@\n1 OBJE\n2 FILE drawing.svg\n2 TITL Zeichnung\n1 OBJE\n2 FILE bomb.png\n2 TITL Bombe");
+        const text = detailedFamily().replace(
+            "1 OBJE @M1@",
+            "1 OBJE @M1@\n1 OBJE\n2 FILE drawing.svg\n2 TITL Zeichnung\n1 OBJE\n2 FILE bomb.png\n2 TITL Bombe",
+        );
         const bomb = Buffer.concat([Buffer.from([0x89, 0x50, 0x4e, 0x47]), Buffer.alloc(40 << 20)]);
         const archive = archiveOf([
             ["gedcom.ged", Buffer.from(text)],
             ["portrait.jpg", photo],
             ["outside.jpg", photo],
-            ["drawing.svg", Buffer.from('<svg xmlns="http://www.w3.org/2000/svg"><script>window.wasRun=1</script></svg>')],
+            [
+                "drawing.svg",
+                Buffer.from('<svg xmlns="http://www.w3.org/2000/svg"><script>window.wasRun=1</script></svg>'),
+            ],
             ["bomb.png", bomb],
         ]);
         const visit = await visitEmpty();
@@ -115,7 +135,9 @@ describe("details", kTwoAtOnce, () => {
         await visit.goTo("Berta");
         await visit.page.waitForSelector("#side-panel .photograph img");
         await visit.page.waitForTimeout(300);
-        const shown = await visit.page.$$eval("#side-panel .photograph img", (all) => all.map((one) => [one.alt, one.naturalWidth, one.src.slice(0, 5)]));
+        const shown = await visit.page.$$eval("#side-panel .photograph img", (all) =>
+            all.map((one) => [one.alt, one.naturalWidth, one.src.slice(0, 5)]),
+        );
         assert.deepEqual(shown, [["Portraitbild", 60, "blob:"]]);
         const documents = await visit.page.$$eval("#side-panel .document", (all) => all.map((one) => one.textContent));
         assert.deepEqual(documents, ["Von anderswo (jpeg)", "Zeichnung", "Bombe"]);
@@ -134,7 +156,9 @@ describe("details", kTwoAtOnce, () => {
         assert.ok(await visit.page.evaluate(() => document.documentElement.scrollWidth <= innerWidth));
         const wide = await visit.page.evaluate(() => {
             const edge = one(".panel-body").getBoundingClientRect().right;
-            return [...all(".panel-body *")].filter((part) => part.getBoundingClientRect().right > edge).map((part) => part.outerHTML.slice(0, 80));
+            return [...all(".panel-body *")]
+                .filter((part) => part.getBoundingClientRect().right > edge)
+                .map((part) => part.outerHTML.slice(0, 80));
         });
         assert.deepEqual(wide, []);
         await photograph(visit, "details-phone");
@@ -177,7 +201,9 @@ describe("details of olvane page", { skip: command ? false : "no olvane command 
     test("photographs are scaled down, turned as they were taken, and bring nothing of their file along", async () => {
         const { folder, file, page } = await family("photos");
         symlinkSync("/etc/passwd", join(folder, "linked.jpg"));
-        const { stderr, status } = spawnSync(command, ["page", file, "-o", page, "--photos", "120"], { encoding: "utf8" });
+        const { stderr, status } = spawnSync(command, ["page", file, "-o", page, "--photos", "120"], {
+            encoding: "utf8",
+        });
         assert.equal(status, 0, stderr);
         assert.match(stderr, /1 photographs are in the page; 1 media files are not.*outside\.jpg/);
         const { photos } = blockOf(page);
@@ -210,14 +236,36 @@ describe("details of olvane page", { skip: command ? false : "no olvane command 
     test("with the living hidden, no note, source, title or photograph of theirs is in the page", async () => {
         const folder = folderFor("living-details");
         const [file, page] = [join(folder, "living.ged"), join(folder, "page.html")];
-        const secret = ["1 NOTE Verraeter", "1 SOUR @S9@", "1 OBJE @M9@", "1 WWW https://verraeter.example", "1 ADDR Verraetergasse"];
+        const secret = [
+            "1 NOTE Verraeter",
+            "1 SOUR @S9@",
+            "1 OBJE @M9@",
+            "1 WWW https://verraeter.example",
+            "1 ADDR Verraetergasse",
+        ];
         const more = [
-            "0 @S9@ SOUR", "1 TITL Verraeterbuch", "0 @M9@ OBJE", "1 FILE both.jpg", "1 TITL Gruppenbild",
-            "0 @M8@ OBJE", "1 FILE dead.jpg", "1 TITL Grabstein", "0 TRLR",
+            "0 @S9@ SOUR",
+            "1 TITL Verraeterbuch",
+            "0 @M9@ OBJE",
+            "1 FILE both.jpg",
+            "1 TITL Gruppenbild",
+            "0 @M8@ OBJE",
+            "1 FILE dead.jpg",
+            "1 TITL Grabstein",
+            "0 TRLR",
         ];
         const text = livingFamily()
             .replace("1 NAME Zacharias /Geheimrat/", ["1 NAME Zacharias /Geheimrat/", ...secret].join("\n"))
-            .replace("1 RESI", ["1 OBJE @M9@", "1 OBJE @M8@", "1 NOTE Besucht von Yolanda Versteckt", "1 NOTE Ein alter Mann", "1 RESI"].join("\n"))
+            .replace(
+                "1 RESI",
+                [
+                    "1 OBJE @M9@",
+                    "1 OBJE @M8@",
+                    "1 NOTE Besucht von Yolanda Versteckt",
+                    "1 NOTE Ein alter Mann",
+                    "1 RESI",
+                ].join("\n"),
+            )
             .replace("1 HUSB @I3@", ["1 HUSB @I3@", "1 NOTE Verraeterfest"].join("\n"))
             .replace("0 TRLR", more.join("\n"));
         writeFileSync(file, text);
@@ -229,6 +277,10 @@ describe("details of olvane page", { skip: command ? false : "no olvane command 
         assert.match(carried, /Ein alter Mann/);
         assert.match(carried, /Grabstein/);
         assert.doesNotMatch(readFileSync(page, "utf8") + carried, /verraeter|versteckt|yolanda|zacharias/i);
-        assert.deepEqual(Object.keys(block.photos), ["dead.jpg"], "a photograph that a living person has too may show them");
+        assert.deepEqual(
+            Object.keys(block.photos),
+            ["dead.jpg"],
+            "a photograph that a living person has too may show them",
+        );
     });
 });

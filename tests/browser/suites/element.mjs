@@ -51,20 +51,35 @@ describe("element", () => {
     });
 
     test("attributes, methods and events speak of one state", async () => {
-        files.set("/one.html", '<!doctype html><olvane-tree src="family.ged" focus="I1" style="height: 500px"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>');
+        files.set(
+            "/one.html",
+            '<!doctype html><olvane-tree src="family.ged" focus="I1" style="height: 500px"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',
+        );
         const { page, end } = await open("/one.html");
         await page.waitForSelector("olvane-tree .box.focus");
         const seen = await page.evaluate(async () => {
             const tree = document.querySelector("olvane-tree");
             const events = [];
-            tree.addEventListener("focuschange", ({ detail }) => events.push([detail.person.xref, detail.state.view, detail.byUser]));
+            tree.addEventListener("focuschange", ({ detail }) =>
+                events.push([detail.person.xref, detail.state.view, detail.byUser]),
+            );
             tree.setAttribute("focus", "I5");
             tree.setAttribute("view", "pedigree");
             const isShown = tree.show({ focus: 1 });
             tree.select(12);
-            return { events, isShown, selected: tree.selected.id, view: tree.state.view, svg: tree.saveSvg().slice(0, 60) };
+            return {
+                events,
+                isShown,
+                selected: tree.selected.id,
+                view: tree.state.view,
+                svg: tree.saveSvg().slice(0, 60),
+            };
         });
-        assert.deepEqual(seen.events, [["I5", "family", false], ["I5", "pedigree", false], ["I1", "pedigree", false]]);
+        assert.deepEqual(seen.events, [
+            ["I5", "family", false],
+            ["I5", "pedigree", false],
+            ["I1", "pedigree", false],
+        ]);
         assert.equal(seen.isShown, true);
         assert.equal(seen.selected, 12);
         assert.equal(seen.view, "pedigree");
@@ -73,7 +88,10 @@ describe("element", () => {
     });
 
     test("ten of them on one page know nothing of each other", async () => {
-        const trees = Array.from({ length: 10 }, (_, i) => `<olvane-tree src="family.ged" focus="I${i + 1}" style="height: 300px"></olvane-tree>`);
+        const trees = Array.from(
+            { length: 10 },
+            (_, i) => `<olvane-tree src="family.ged" focus="I${i + 1}" style="height: 300px"></olvane-tree>`,
+        );
         files.set("/ten.html", `<!doctype html>${trees.join("")}<script type="module" src="olvane-tree.mjs"></script>`);
         const { page, end } = await open("/ten.html");
         await page.waitForFunction(() => [...document.querySelectorAll("olvane-tree")].every((tree) => tree.state));
@@ -93,7 +111,11 @@ describe("element", () => {
             tree.select(1);
             tree.zoomBy(0.7);
             await new Promise((next) => setTimeout(next, 400));
-            const look = () => [tree.state.focus, tree.selected.xref, ...Object.values(tree.sight).map((value) => Math.round(value * 100))];
+            const look = () => [
+                tree.state.focus,
+                tree.selected.xref,
+                ...Object.values(tree.sight).map((value) => Math.round(value * 100)),
+            ];
             const before = look();
             const text = await (await fetch("family.ged")).text();
             const changed = text.replace(/1 NAME Charles Robert .Darwin./, "1 NAME Charles Renamed /Darwin/");
@@ -132,11 +154,17 @@ describe("element", () => {
     });
 
     test("a file that cannot be had leaves the element empty and says why to whoever asks", async () => {
-        files.set("/none.html", '<!doctype html><olvane-tree></olvane-tree><script type="module" src="olvane-tree.mjs"></script>');
+        files.set(
+            "/none.html",
+            '<!doctype html><olvane-tree></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',
+        );
         const { page, end } = await open("/none.html");
         const reason = await page.evaluate(async () => {
             await customElements.whenDefined("olvane-tree");
-            return document.querySelector("olvane-tree").load("nowhere.ged").catch((error) => error.message);
+            return document
+                .querySelector("olvane-tree")
+                .load("nowhere.ged")
+                .catch((error) => error.message);
         });
         assert.match(reason, /nowhere\.ged: 404/);
         const event = await page.evaluate(async () => {

@@ -15,7 +15,10 @@ describe("hostile", kTwoAtOnce, () => {
     test("markup, scripts and styles in a file are shown as text and do nothing", async () => {
         const visit = await visitEmpty();
         const { page } = visit;
-        const elementsBefore = await page.$$eval("script, style, link, iframe, object, img, base, form", (all) => all.length);
+        const elementsBefore = await page.$$eval(
+            "script, style, link, iframe, object, img, base, form",
+            (all) => all.length,
+        );
         await visit.drop("<img src=x onerror=window.wasRun=9>.ged", kHostile.text);
         await visit.untilFamily();
         await visit.click("#fit");
@@ -29,7 +32,8 @@ describe("hostile", kTwoAtOnce, () => {
         await page.waitForTimeout(400);
         const after = await page.evaluate(() => ({
             elements: all("script, style, link, iframe, object, img, base, form").length,
-            handlers: [...all("*")].filter((one) => one.getAttributeNames().some((name) => name.startsWith("on"))).length,
+            handlers: [...all("*")].filter((one) => one.getAttributeNames().some((name) => name.startsWith("on")))
+                .length,
             links: [...all("[href]")].filter((link) => !/^(#|blob:|data:,$)/.test(link.getAttribute("href"))).length,
             wasRun: window.wasRun ?? null,
             title: document.title,
@@ -51,7 +55,10 @@ describe("hostile", kTwoAtOnce, () => {
         assert.equal(await visit.page.innerText("#side-panel h2"), "<img src=x onerror=window.wasRun=3>");
         assert.match(await visit.label("R8"), /^&lt;b&gt; &amp; &#x3c;i&#x3e; <b>bold/);
         await visit.stand("R8");
-        assert.match(await visit.page.innerText("#side-panel .facts"), /Occupation\s+&lt;b&gt; &amp; &#x3c;i&#x3e; <b>bold<\/b>/);
+        assert.match(
+            await visit.page.innerText("#side-panel .facts"),
+            /Occupation\s+&lt;b&gt; &amp; &#x3c;i&#x3e; <b>bold<\/b>/,
+        );
         assert.equal(await visit.page.evaluate(() => window.wasRun ?? null), null);
         await visit.end();
     });
@@ -84,7 +91,10 @@ describe("hostile", kTwoAtOnce, () => {
             const kinds = new Set([...file.querySelectorAll("*")].map((element) => element.tagName));
             return { error: file.querySelector("parsererror") !== null, kinds: [...kinds].sort() };
         }, text);
-        assert.deepEqual(judged, { error: false, kinds: ["circle", "defs", "g", "path", "rect", "svg", "text", "title", "use"] });
+        assert.deepEqual(judged, {
+            error: false,
+            kinds: ["circle", "defs", "g", "path", "rect", "svg", "text", "title", "use"],
+        });
         await visit.end();
     });
 
@@ -124,8 +134,14 @@ describe("hostile", kTwoAtOnce, () => {
             };
         });
         assert.deepEqual(outcome, { fetch: true, image: true, eval: true, wasRun: null });
-        assert.ok(visit.troubles.every((trouble) => /Content Security Policy/.test(trouble)), visit.troubles.join("\n"));
-        assert.deepEqual(visit.requests.filter((url) => !url.startsWith("http://127.0.0.1:9/")), []);
+        assert.ok(
+            visit.troubles.every((trouble) => /Content Security Policy/.test(trouble)),
+            visit.troubles.join("\n"),
+        );
+        assert.deepEqual(
+            visit.requests.filter((url) => !url.startsWith("http://127.0.0.1:9/")),
+            [],
+        );
         await visit.context.close();
     });
 });

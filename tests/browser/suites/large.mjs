@@ -27,7 +27,10 @@ describe("large", () => {
         await visit.page.waitForSelector("#reading", { state: "hidden" });
         const seen = await visit.page.evaluate(() => window.seen);
         // A page that is held up looks at nothing meanwhile.
-        assert.ok(seen.length > 0 && seen.every((part, i) => part > 0 && part <= 1 && (i === 0 || part >= seen[i - 1])), seen.join());
+        assert.ok(
+            seen.length > 0 && seen.every((part, i) => part > 0 && part <= 1 && (i === 0 || part >= seen[i - 1])),
+            seen.join(),
+        );
         assert.equal(await visit.page.locator(".bar .title span").innerText(), "60,000 persons");
         await visit.goTo("Given500 Line");
         assert.equal(await visit.focus(), "I500");

@@ -23,9 +23,13 @@ describe("living", { skip: command ? false : "no olvane command was given" }, ()
         return page;
     };
     const unpacked = (text) =>
-        (text.match(/H4sI[A-Za-z0-9+/=]+/g) ?? []).map((base64) => gunzipSync(Buffer.from(base64, "base64")).toString("latin1"));
+        (text.match(/H4sI[A-Za-z0-9+/=]+/g) ?? []).map((base64) =>
+            gunzipSync(Buffer.from(base64, "base64")).toString("latin1"),
+        );
     const familyIn = (page) => {
-        const block = /<script type="application\/json" id="olvane-family">([^]*?)<\/script>/.exec(readFileSync(page, "utf8"))[1];
+        const block = /<script type="application\/json" id="olvane-family">([^]*?)<\/script>/.exec(
+            readFileSync(page, "utf8"),
+        )[1];
         const { gzip, ...stated } = JSON.parse(block);
         return JSON.stringify(stated) + unpacked(gzip)[0];
     };

@@ -49,7 +49,10 @@ describe("looks", kTwoAtOnce, () => {
     });
 
     test("a file to be dropped is asked for only where one can be dropped", async () => {
-        for (const [settings, asked] of [[{}, true], [kPhone, false]]) {
+        for (const [settings, asked] of [
+            [{}, true],
+            [kPhone, false],
+        ]) {
             const visit = await visitEmpty(settings);
             assert.equal(await visit.page.isVisible("#drop-zone .drop"), asked);
             assert.ok(await visit.page.isVisible("#choose-file"));
@@ -61,7 +64,8 @@ describe("looks", kTwoAtOnce, () => {
         for (const colorScheme of ["light", "dark"]) {
             const visit = await visitDarwins("#person=I1&hide=cousins", { forcedColors: "active", colorScheme });
             const { page } = visit;
-            const fill = (selector) => page.evaluate((wanted) => getComputedStyle(one(wanted)).backgroundColor, selector);
+            const fill = (selector) =>
+                page.evaluate((wanted) => getComputedStyle(one(wanted)).backgroundColor, selector);
             assert.notEqual(await fill("#view-family"), await fill("#view-pedigree"));
             await page.click("#options-button");
             assert.notEqual(await fill("#show-siblings"), await fill("#show-cousins"));
@@ -81,7 +85,9 @@ describe("looks", kTwoAtOnce, () => {
     });
 
     test("on the narrowest phone the bar has two rows, and a long name leaves room for the years", async () => {
-        const long = brokenFamily().replace("Ada", "Ada Augusta Wilhelmina Theodora Philippa").replace("7 DATE far too deep", "1 BIRT\n2 DATE 1815");
+        const long = brokenFamily()
+            .replace("Ada", "Ada Augusta Wilhelmina Theodora Philippa")
+            .replace("7 DATE far too deep", "1 BIRT\n2 DATE 1815");
         const settings = { ...kPhone, viewport: { width: 320, height: 568 } };
         const visit = await visitFamily(long, { name: "long.ged", focus: "1" }, settings);
         await visit.page.waitForSelector("#diagnostics-button", { state: "visible" });
@@ -133,8 +139,12 @@ describe("looks", kTwoAtOnce, () => {
     test("themes follow the system or the choice, which is remembered", async () => {
         const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
         const { page } = visit;
-        const wears = (theme) => page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
-        const paper = () => page.evaluate(() => getComputedStyle(one("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor);
+        const wears = (theme) =>
+            page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
+        const paper = () =>
+            page.evaluate(
+                () => getComputedStyle(one("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor,
+            );
         await wears("dark");
         await visit.stand("I2");
         await photograph(visit, "dark");
@@ -174,7 +184,9 @@ describe("looks", kTwoAtOnce, () => {
     test("names from right to left are laid out so", async () => {
         const visit = await visitFamily(rightToLeftFamily(), {}, {}, "#person=I2");
         const { page } = visit;
-        const directions = await page.$$eval('#tree [data-xref="I2"] .name', (lines) => lines.map((line) => line.getAttribute("direction")));
+        const directions = await page.$$eval('#tree [data-xref="I2"] .name', (lines) =>
+            lines.map((line) => line.getAttribute("direction")),
+        );
         assert.ok(directions.length > 0 && directions.every((direction) => direction === "rtl"));
         assert.ok((await page.locator('#tree [data-xref="I4"] .name[direction=rtl]').count()) === 0);
         const panel = await page.evaluate(() => getComputedStyle(one("#side-panel h2")).direction);
@@ -204,7 +216,9 @@ describe("looks", kTwoAtOnce, () => {
         await visit.page.waitForTimeout(200);
         assert.deepEqual(await visit.placing(), at);
         assert.deepEqual(await visit.places(), places);
-        const running = await visit.page.evaluate(() => document.getAnimations().filter((one) => one.playState === "running").length);
+        const running = await visit.page.evaluate(
+            () => document.getAnimations().filter((one) => one.playState === "running").length,
+        );
         assert.equal(running, 0);
         await visit.end();
     });

@@ -42,13 +42,22 @@ function madeFamily(couples) {
     const lines = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
     for (let f = 1; f <= couples; ++f) {
         const child = (husband) => f > 1 && husband === (f % 2 === 0);
-        for (const [id, sex] of [[2 * f - 1, "M"], [2 * f, "F"]]) {
-            lines.push(`0 @I${id}@ INDI`, `1 NAME Given${id % 61} /Surname${f % 17}/`, `1 SEX ${sex}`, `1 FAMS @F${f}@`);
+        for (const [id, sex] of [
+            [2 * f - 1, "M"],
+            [2 * f, "F"],
+        ]) {
+            lines.push(
+                `0 @I${id}@ INDI`,
+                `1 NAME Given${id % 61} /Surname${f % 17}/`,
+                `1 SEX ${sex}`,
+                `1 FAMS @F${f}@`,
+            );
             lines.push("1 BIRT", `2 DATE ${1500 + 25 * Math.floor(Math.log2(f))}`);
             if (child(sex === "M")) lines.push(`1 FAMC @F${f >> 1}@`);
         }
         lines.push(`0 @F${f}@ FAM`, `1 HUSB @I${2 * f - 1}@`, `1 WIFE @I${2 * f}@`);
-        for (const g of [2 * f, 2 * f + 1]) if (g <= couples) lines.push(`1 CHIL @I${g % 2 === 0 ? 2 * g - 1 : 2 * g}@`);
+        for (const g of [2 * f, 2 * f + 1])
+            if (g <= couples) lines.push(`1 CHIL @I${g % 2 === 0 ? 2 * g - 1 : 2 * g}@`);
     }
     return [...lines, "0 TRLR"].join("\n");
 }
@@ -70,7 +79,10 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         assert.match(await chosen(visit), /Robert Waring Darwin/);
         await visit.page.keyboard.press("ArrowDown");
         assert.match(await chosen(visit), /Charles Robert Darwin/, "down again to the child one came from");
-        assert.match(await visit.page.textContent("#map [role=status]"), /Charles Robert Darwin\. 1809–1882\. Parents: .*Robert Waring/);
+        assert.match(
+            await visit.page.textContent("#map [role=status]"),
+            /Charles Robert Darwin\. 1809–1882\. Parents: .*Robert Waring/,
+        );
         const before = await chosen(visit);
         await visit.page.keyboard.press("ArrowRight");
         await visit.page.keyboard.press("ArrowLeft");
@@ -169,7 +181,9 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         const { text } = darwins();
         const changed = mapBytes(text);
         changed[changed.length - 40] ^= 1;
-        const block = text.replace(kMap, (whole, packed) => whole.replace(packed, gzipSync(changed).toString("base64")));
+        const block = text.replace(kMap, (whole, packed) =>
+            whole.replace(packed, gzipSync(changed).toString("base64")),
+        );
         const visit = await visitFile(fileFor(`changed-${++pages}.html`, block));
         await visit.untilFamily();
         assert.match(await visit.page.innerText("#notices"), /damaged/);
@@ -194,7 +208,15 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
             const canvas = document.querySelector("#map canvas");
             const { left, top, width, height } = canvas.getBoundingClientRect();
             const finger = (type, pointerId, dx) =>
-                canvas.dispatchEvent(new PointerEvent(type, { pointerId, button: 0, clientX: left + width / 2 + dx, clientY: top + height / 2, bubbles: true }));
+                canvas.dispatchEvent(
+                    new PointerEvent(type, {
+                        pointerId,
+                        button: 0,
+                        clientX: left + width / 2 + dx,
+                        clientY: top + height / 2,
+                        bubbles: true,
+                    }),
+                );
             finger("pointerdown", 1, -50);
             finger("pointerdown", 2, 50);
             finger("pointermove", 1, -100);
@@ -203,7 +225,10 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
             finger("pointerup", 2, 100);
         });
         await visit.page.waitForFunction((old) => location.hash !== old, before);
-        const [x, y, k] = /map=([^&]*)/.exec(await visit.hash())[1].split(",").map(Number);
+        const [x, y, k] = /map=([^&]*)/
+            .exec(await visit.hash())[1]
+            .split(",")
+            .map(Number);
         assert.ok(Math.abs(x - 400) <= 2 && Math.abs(k - 1) < 0.001, `${x},${y},${k}`);
         await visit.end();
     });
@@ -218,7 +243,13 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
             await visit.page.evaluate(axe.source);
             const found = await visit.page.evaluate(async () => {
                 const { violations } = await window.axe.run(document, { resultTypes: ["violations"] });
-                return violations.map(({ id, nodes }) => `${id}: ${nodes.slice(0, 3).map((node) => node.html.slice(0, 160)).join(" | ")}`);
+                return violations.map(
+                    ({ id, nodes }) =>
+                        `${id}: ${nodes
+                            .slice(0, 3)
+                            .map((node) => node.html.slice(0, 160))
+                            .join(" | ")}`,
+                );
             });
             assert.deepEqual(found, []);
             if (settings.isMobile) await photograph(visit, "map-phone");
@@ -228,27 +259,47 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
 
     test("lines to adopted children are dashed, and where lines cross one has a gap", async () => {
         const adopted = (pedigree) =>
-            ["0 HEAD", "0 @A@ INDI", "1 SEX M", "1 FAMS @F@", "0 @B@ INDI", "1 SEX F", "1 FAMS @F@", "0 @C@ INDI", "1 FAMC @F@",
-                `2 PEDI ${pedigree}`, "0 @D@ INDI", "1 FAMC @F@", "0 @F@ FAM", "1 HUSB @A@", "1 WIFE @B@", "1 CHIL @C@", "1 CHIL @D@", "0 TRLR"].join("\n");
+            [
+                "0 HEAD",
+                "0 @A@ INDI",
+                "1 SEX M",
+                "1 FAMS @F@",
+                "0 @B@ INDI",
+                "1 SEX F",
+                "1 FAMS @F@",
+                "0 @C@ INDI",
+                "1 FAMC @F@",
+                `2 PEDI ${pedigree}`,
+                "0 @D@ INDI",
+                "1 FAMC @F@",
+                "0 @F@ FAM",
+                "1 HUSB @A@",
+                "1 WIFE @B@",
+                "1 CHIL @C@",
+                "1 CHIL @D@",
+                "0 TRLR",
+            ].join("\n");
         const pieces = [];
         for (const pedigree of ["birth", "adopted"]) {
             const visit = await visitMap(mapPage(adopted(pedigree)).path, {}, "#map=128,76,2");
-            pieces.push(await visit.page.evaluate(() => {
-                const canvas = document.querySelector("#map canvas");
-                const { width, height } = canvas;
-                const { data } = canvas.getContext("2d").getImageData(0, 0, width, height);
-                // The most pieces of one colour, but that of the page, that any column between parents and child has.
-                let most = 0;
-                for (let x = width / 2 - 300; x < width / 2 + 300; ++x) {
-                    let count = 0;
-                    for (let y = Math.floor(height / 2) - 38; y < height / 2 + 38; ++y) {
-                        const at = (y * width + x) * 4;
-                        if (data[at] < 200 && data[at - 4 * width] > 200) ++count;
+            pieces.push(
+                await visit.page.evaluate(() => {
+                    const canvas = document.querySelector("#map canvas");
+                    const { width, height } = canvas;
+                    const { data } = canvas.getContext("2d").getImageData(0, 0, width, height);
+                    // The most pieces of one colour, but that of the page, that any column between parents and child has.
+                    let most = 0;
+                    for (let x = width / 2 - 300; x < width / 2 + 300; ++x) {
+                        let count = 0;
+                        for (let y = Math.floor(height / 2) - 38; y < height / 2 + 38; ++y) {
+                            const at = (y * width + x) * 4;
+                            if (data[at] < 200 && data[at - 4 * width] > 200) ++count;
+                        }
+                        most = Math.max(most, count);
                     }
-                    most = Math.max(most, count);
-                }
-                return most;
-            }));
+                    return most;
+                }),
+            );
             await visit.end();
         }
         assert.ok(pieces[0] <= 1 && pieces[1] >= 3, pieces.join());
@@ -256,22 +307,44 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         // Of four couples, somebody of each marries somebody of every other: that cannot be drawn without a crossing.
         const lines = ["0 HEAD"];
         for (let f = 0; f < 4; ++f) {
-            lines.push(`0 @H${f}@ INDI`, "1 SEX M", `0 @W${f}@ INDI`, "1 SEX F", `0 @F${f}@ FAM`, `1 HUSB @H${f}@`, `1 WIFE @W${f}@`);
+            lines.push(
+                `0 @H${f}@ INDI`,
+                "1 SEX M",
+                `0 @W${f}@ INDI`,
+                "1 SEX F",
+                `0 @F${f}@ FAM`,
+                `1 HUSB @H${f}@`,
+                `1 WIFE @W${f}@`,
+            );
             for (let g = 0; g < 4; ++g) if (g !== f) lines.push(`1 CHIL @C${f}${g}@`);
         }
-        for (let f = 0; f < 4; ++f) for (let g = 0; g < 4; ++g) if (f !== g) lines.push(`0 @C${f}${g}@ INDI`, `1 SEX ${f < g ? "M" : "F"}`);
-        for (let f = 0; f < 4; ++f) for (let g = f + 1; g < 4; ++g) lines.push(`0 @P${f}${g}@ FAM`, `1 HUSB @C${f}${g}@`, `1 WIFE @C${g}${f}@`);
-        const visit = await visitMap(mapPage([...lines, "0 TRLR"].join("\n")).path, { viewport: { width: 1900, height: 700 } }, "#map=800,100,0.8");
+        for (let f = 0; f < 4; ++f)
+            for (let g = 0; g < 4; ++g) if (f !== g) lines.push(`0 @C${f}${g}@ INDI`, `1 SEX ${f < g ? "M" : "F"}`);
+        for (let f = 0; f < 4; ++f)
+            for (let g = f + 1; g < 4; ++g) lines.push(`0 @P${f}${g}@ FAM`, `1 HUSB @C${f}${g}@`, `1 WIFE @C${g}${f}@`);
+        const visit = await visitMap(
+            mapPage([...lines, "0 TRLR"].join("\n")).path,
+            { viewport: { width: 1900, height: 700 } },
+            "#map=800,100,0.8",
+        );
         const gaps = await visit.page.evaluate(() => {
             const canvas = document.querySelector("#map canvas");
             const { width, height } = canvas;
             const { data } = canvas.getContext("2d").getImageData(0, 0, width, height);
             const isLine = (x, y) => data[(y * width + x) * 4] < 200;
-            const areLine = (from, to, y) => Array.from({ length: to - from }, (_, i) => isLine(from + i, y)).every(Boolean);
+            const areLine = (from, to, y) =>
+                Array.from({ length: to - from }, (_, i) => isLine(from + i, y)).every(Boolean);
             let gaps = 0;
             for (let y = 1; y < height; ++y)
                 for (let x = 8; x + 8 < width; ++x)
-                    if (isLine(x, y) && !isLine(x - 1, y) && !isLine(x + 1, y) && areLine(x - 7, x - 1, y) && areLine(x + 2, x + 8, y)) ++gaps;
+                    if (
+                        isLine(x, y) &&
+                        !isLine(x - 1, y) &&
+                        !isLine(x + 1, y) &&
+                        areLine(x - 7, x - 1, y) &&
+                        areLine(x + 2, x + 8, y)
+                    )
+                        ++gaps;
             return gaps;
         });
         assert.ok(gaps > 0, String(gaps));
@@ -303,7 +376,9 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
 
     test("the map wears the dark colours, and keeps still where movement is unwelcome", async () => {
         const visit = await visitMap(darwins().path, { colorScheme: "dark", reducedMotion: "reduce" });
-        const corner = await visit.page.evaluate(() => [...document.querySelector("#map canvas").getContext("2d").getImageData(2, 2, 1, 1).data]);
+        const corner = await visit.page.evaluate(() => [
+            ...document.querySelector("#map canvas").getContext("2d").getImageData(2, 2, 1, 1).data,
+        ]);
         assert.deepEqual(corner, [0x15, 0x18, 0x1d, 255]);
         await visit.page.focus("#map canvas");
         const places = await visit.page.evaluate(async () => {
@@ -318,7 +393,7 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
 });
 
 function sectionOf(bytes, kind) {
-    for (let at = 28; at < bytes.length; ) {
+    for (let at = 28; at < bytes.length;) {
         const size = bytes.readUInt32LE(at + 4);
         if (bytes.readUInt32LE(at) === kind) return new Uint8Array(bytes.subarray(at + 8, at + 8 + size));
         at += 8 + 4 * Math.ceil(size / 4);

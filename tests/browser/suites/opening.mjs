@@ -5,7 +5,16 @@ import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { deflateRawSync } from "node:zlib";
 import { describe, test } from "node:test";
-import { fileFor, kTwoAtOnce, photograph, sample, visitDarwins, visitEmpty, visitFamily, visitFile } from "../support/browser.mjs";
+import {
+    fileFor,
+    kTwoAtOnce,
+    photograph,
+    sample,
+    visitDarwins,
+    visitEmpty,
+    visitFamily,
+    visitFile,
+} from "../support/browser.mjs";
 import { brokenFamily, gedcom, hugeHousehold } from "../support/families.mjs";
 
 const kDarwins = sample("darwin-wedgwood.ged");
@@ -40,7 +49,10 @@ describe("opening", kTwoAtOnce, () => {
     test("of several files that are dropped the first opens, and the page says which", async () => {
         const visit = await visitEmpty();
         const other = "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 TRLR\n";
-        await visit.dropAll([["darwin-wedgwood.ged", kDarwins], ["small.ged", other]]);
+        await visit.dropAll([
+            ["darwin-wedgwood.ged", kDarwins],
+            ["small.ged", other],
+        ]);
         await visit.untilFamily();
         assert.equal(await visit.page.title(), "darwin-wedgwood");
         assert.match(await visit.page.innerText("#notices"), /Of the files .*darwin-wedgwood\.ged.* was opened/);
@@ -53,7 +65,10 @@ describe("opening", kTwoAtOnce, () => {
         await visit.untilFamily();
         assert.equal(await visit.focus(), "I5");
         assert.equal(await visit.hash(), "#person=I5&view=pedigree");
-        await visit.drop("small.ged", "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 @I5@ INDI\n1 NAME Ben /Five/\n0 TRLR\n");
+        await visit.drop(
+            "small.ged",
+            "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 @I5@ INDI\n1 NAME Ben /Five/\n0 TRLR\n",
+        );
         await visit.page.waitForFunction(() => document.title === "small");
         await visit.still();
         assert.equal(await visit.focus(), "A", "the link named a person of the first file");
@@ -71,7 +86,8 @@ describe("opening", kTwoAtOnce, () => {
         await visit.untilFamily();
         await visit.goTo("Emma Wedgwood 1808");
         await visit.goTo("Ralph Vaughan Williams");
-        const small = "0 HEAD\n0 @I2@ INDI\n1 NAME Ada /Two/\n0 @I90@ INDI\n1 NAME Ben /Ninety/\n0 @I1@ INDI\n1 NAME Cid /One/\n0 TRLR\n";
+        const small =
+            "0 HEAD\n0 @I2@ INDI\n1 NAME Ada /Two/\n0 @I90@ INDI\n1 NAME Ben /Ninety/\n0 @I1@ INDI\n1 NAME Cid /One/\n0 TRLR\n";
         await visit.drop("small.ged", small);
         await visit.page.waitForFunction(() => document.title === "small");
         await visit.still();
@@ -95,7 +111,12 @@ describe("opening", kTwoAtOnce, () => {
             visit.page.evaluate((type) => {
                 const dataTransfer = new DataTransfer();
                 dataTransfer.items.add(new File(["0 HEAD"], "a.ged"));
-                const event = new DragEvent(type, { bubbles: true, cancelable: true, dataTransfer, relatedTarget: null });
+                const event = new DragEvent(type, {
+                    bubbles: true,
+                    cancelable: true,
+                    dataTransfer,
+                    relatedTarget: null,
+                });
                 document.body.dispatchEvent(event);
                 return event.defaultPrevented;
             }, type);
@@ -173,15 +194,47 @@ describe("opening", kTwoAtOnce, () => {
     });
 
     test("what is odd in the data leads to its persons, by a click and by a key", async () => {
-        const lines = ["0 @I1@ INDI", "1 NAME Early /Grave/", "1 BIRT", "2 DATE 1850", "1 DEAT", "2 DATE 1840", "1 FAMS @F1@"];
-        lines.push("0 @I2@ INDI", "1 NAME Old /Child/", "1 BIRT", "2 DATE 1800", "1 FAMC @F1@", "0 @F1@ FAM", "1 HUSB @I1@", "1 CHIL @I2@");
+        const lines = [
+            "0 @I1@ INDI",
+            "1 NAME Early /Grave/",
+            "1 BIRT",
+            "2 DATE 1850",
+            "1 DEAT",
+            "2 DATE 1840",
+            "1 FAMS @F1@",
+        ];
+        lines.push(
+            "0 @I2@ INDI",
+            "1 NAME Old /Child/",
+            "1 BIRT",
+            "2 DATE 1800",
+            "1 FAMC @F1@",
+            "0 @F1@ FAM",
+            "1 HUSB @I1@",
+            "1 CHIL @I2@",
+        );
         const phrase = (sentence, ...parts) => ({ sentence, arguments: parts });
-        const kept = { line: 4, severity: "error", kind: "levelJump", what: phrase("jumpingLevel", "1", "4"), done: [phrase("asOneBelow")], quoted: "NAME" };
+        const kept = {
+            line: 4,
+            severity: "error",
+            kind: "levelJump",
+            what: phrase("jumpingLevel", "1", "4"),
+            done: [phrase("asOneBelow")],
+            quoted: "NAME",
+        };
         const visit = await visitFamily(gedcom(...lines), { remarks: [kept] }, { locale: "de" }, "#person=I1");
         await visit.page.click("#diagnostics-button");
         const texts = await visit.page.locator("#diagnostics .message").allTextContents();
-        assert.deepEqual(texts, ["die Ebene springt von 1 auf 4 (NAME)", "Early Grave starb vor der Geburt", "Old Child wurde vor dem Elternteil Early Grave geboren"]);
-        assert.deepEqual(await visit.page.locator("#diagnostics .severity").allTextContents(), ["Fehler", "Auffällig", "Auffällig"]);
+        assert.deepEqual(texts, [
+            "die Ebene springt von 1 auf 4 (NAME)",
+            "Early Grave starb vor der Geburt",
+            "Old Child wurde vor dem Elternteil Early Grave geboren",
+        ]);
+        assert.deepEqual(await visit.page.locator("#diagnostics .severity").allTextContents(), [
+            "Fehler",
+            "Auffällig",
+            "Auffällig",
+        ]);
         await photograph(visit, "remarks");
         await visit.page.click("#diagnostics li:last-child .to-person >> nth=0");
         await visit.still();
@@ -195,23 +248,30 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("a page opens at the person that the command was given, and speaks of the file that it was given", { skip: command ? false : "no olvane command was given" }, async () => {
-        const file = fileFor("some.family.ged", "0 HEAD\n0 @3@ INDI\n1 NAME Abe /First/\nno line\n0 @2@ INDI\n1 NAME Bea /Second/\n0 @1@ INDI\n1 NAME Cid /Third/\n0 TRLR\n");
-        const page = fileFor("named.html", "");
-        execFileSync(command, ["page", file, "--focus", "Second", "-o", page], { stdio: "ignore" });
-        const visit = await visitFile(page);
-        await visit.untilFamily();
-        assert.equal(await visit.focus(), "2");
-        assert.equal(await visit.page.title(), "Bea Second");
-        assert.match(await visit.page.textContent("#diagnostics"), /line 4.*no line/);
-        assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can fix the file");
-        await visit.end();
-        execFileSync(command, ["page", file, "-o", page], { stdio: "ignore" });
-        const plain = await visitFile(page);
-        await plain.untilFamily();
-        assert.equal(await plain.page.title(), "some.family");
-        await plain.end();
-    });
+    test(
+        "a page opens at the person that the command was given, and speaks of the file that it was given",
+        { skip: command ? false : "no olvane command was given" },
+        async () => {
+            const file = fileFor(
+                "some.family.ged",
+                "0 HEAD\n0 @3@ INDI\n1 NAME Abe /First/\nno line\n0 @2@ INDI\n1 NAME Bea /Second/\n0 @1@ INDI\n1 NAME Cid /Third/\n0 TRLR\n",
+            );
+            const page = fileFor("named.html", "");
+            execFileSync(command, ["page", file, "--focus", "Second", "-o", page], { stdio: "ignore" });
+            const visit = await visitFile(page);
+            await visit.untilFamily();
+            assert.equal(await visit.focus(), "2");
+            assert.equal(await visit.page.title(), "Bea Second");
+            assert.match(await visit.page.textContent("#diagnostics"), /line 4.*no line/);
+            assert.equal(await visit.page.locator("#notices .warned").count(), 0, "nobody here can fix the file");
+            await visit.end();
+            execFileSync(command, ["page", file, "-o", page], { stdio: "ignore" });
+            const plain = await visitFile(page);
+            await plain.untilFamily();
+            assert.equal(await plain.page.title(), "some.family");
+            await plain.end();
+        },
+    );
 
     test("a picture that asks for too much is refused in words, and others can be had", async () => {
         const visit = await visitEmpty({}, "#person=MAN");
@@ -253,8 +313,15 @@ describe("opening", kTwoAtOnce, () => {
         const english = await remarksIn("en");
         const german = await remarksIn("de");
         assert.equal(german.length, english.length);
-        assert.ok(german.includes("keine Zeile mit Ebene und Schlüsselwort (this is no line at all)"), german.join("; "));
-        assert.deepEqual(german.filter((remark) => english.includes(remark)), [], "still in English");
+        assert.ok(
+            german.includes("keine Zeile mit Ebene und Schlüsselwort (this is no line at all)"),
+            german.join("; "),
+        );
+        assert.deepEqual(
+            german.filter((remark) => english.includes(remark)),
+            [],
+            "still in English",
+        );
     });
 
     test("why a file is refused is said in the reader's own language", async () => {
@@ -273,7 +340,12 @@ describe("opening", kTwoAtOnce, () => {
     });
 
     test("an address that leads to nobody leads to somebody all the same", async () => {
-        for (const hash of ["#person=I9999", "#nonsense", "#person=%E0%A4%A&view=9", "#generations=1e9&view=pedigree"]) {
+        for (const hash of [
+            "#person=I9999",
+            "#nonsense",
+            "#person=%E0%A4%A&view=9",
+            "#generations=1e9&view=pedigree",
+        ]) {
             const visit = await visitDarwins(hash);
             assert.ok(await visit.focus());
             await visit.end();

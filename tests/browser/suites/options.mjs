@@ -33,7 +33,10 @@ describe("options", kTwoAtOnce, () => {
             await visit.click(`#show-${name}`);
             const without = await allPersons(visit);
             assert.ok(!without.includes(person), `${person} without ${name}`);
-            assert.ok(without.every((one) => all.includes(one)), name);
+            assert.ok(
+                without.every((one) => all.includes(one)),
+                name,
+            );
             assert.match(await visit.hash(), new RegExp(`hide=${name}`));
             await visit.click(`#show-${name}`);
             assert.deepEqual(await allPersons(visit), all, name);

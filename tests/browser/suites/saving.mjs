@@ -19,7 +19,9 @@ async function parsed(visit, text) {
     return visit.page.evaluate((text) => {
         const document = new DOMParser().parseFromString(text, "image/svg+xml");
         const error = document.querySelector("parsererror")?.textContent ?? null;
-        const boxes = [...document.querySelectorAll("g[role=img]")].map((box) => box.querySelector("title").textContent);
+        const boxes = [...document.querySelectorAll("g[role=img]")].map(
+            (box) => box.querySelector("title").textContent,
+        );
         const texts = [...document.querySelectorAll("text")].map((line) => line.textContent);
         const attributes = [...document.querySelectorAll("*")].flatMap((element) => element.getAttributeNames());
         const size = ["width", "height"].map((name) => Number(document.documentElement.getAttribute(name)));
@@ -38,9 +40,15 @@ describe("saving", kTwoAtOnce, () => {
         const file = await parsed(visit, bytes.toString("utf8"));
         assert.equal(file.error, null);
         assert.equal(file.boxes.length, labels.length);
-        assert.ok(file.boxes.some((title) => /^Charles Robert Darwin, \* 1809, † 1882/.test(title)), file.boxes.join());
+        assert.ok(
+            file.boxes.some((title) => /^Charles Robert Darwin, \* 1809, † 1882/.test(title)),
+            file.boxes.join(),
+        );
         assert.ok(file.texts.some((text) => /Darwin/.test(text)));
-        assert.ok(!file.attributes.some((attribute) => /^(on|class|style|tabindex|data-)/.test(attribute)), file.attributes.join());
+        assert.ok(
+            !file.attributes.some((attribute) => /^(on|class|style|tabindex|data-)/.test(attribute)),
+            file.attributes.join(),
+        );
         await visit.end();
     });
 
@@ -52,7 +60,11 @@ describe("saving", kTwoAtOnce, () => {
             ["", {}, []],
             ["&view=pedigree&generations=4", {}, ["--view", "pedigree", "--generations", "4"]],
             ["&view=ancestors&up=3&direction=left", {}, ["--view", "ancestors", "--up", "3", "--direction", "left"]],
-            ["&view=descendants&down=2", { colorScheme: "dark" }, ["--view", "descendants", "--down", "2", "--theme", "dark"]],
+            [
+                "&view=descendants&down=2",
+                { colorScheme: "dark" },
+                ["--view", "descendants", "--down", "2", "--theme", "dark"],
+            ],
         ];
         for (const [address, settings, extra] of pictures) {
             const visit = await visitDarwins("#person=I1" + address, settings);
@@ -70,7 +82,10 @@ describe("saving", kTwoAtOnce, () => {
         const { name, bytes } = await save(visit, "#save-png");
         assert.match(name, /\.png$/);
         assert.equal(bytes.subarray(1, 4).toString("latin1"), "PNG");
-        assert.deepEqual([bytes.readUInt32BE(16), bytes.readUInt32BE(20)], size.map((side) => Math.floor(2 * side)));
+        assert.deepEqual(
+            [bytes.readUInt32BE(16), bytes.readUInt32BE(20)],
+            size.map((side) => Math.floor(2 * side)),
+        );
         assert.ok(bytes.length > 10_000, "there is something in it");
         await visit.end();
     });

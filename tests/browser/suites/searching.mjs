@@ -26,8 +26,12 @@ describe("searching", kTwoAtOnce, () => {
 
     test("the list says what was found where, and marks it in the name", async () => {
         const visit = await visitDarwins();
-        const reasons = () => visit.page.$$eval("#search-list .why", (lines) => [...new Set(lines.map((line) => line.textContent))]);
-        const marks = () => visit.page.$$eval("#search-list bdi.name mark", (parts) => [...new Set(parts.map((part) => part.textContent))]);
+        const reasons = () =>
+            visit.page.$$eval("#search-list .why", (lines) => [...new Set(lines.map((line) => line.textContent))]);
+        const marks = () =>
+            visit.page.$$eval("#search-list bdi.name mark", (parts) => [
+                ...new Set(parts.map((part) => part.textContent)),
+            ]);
         await visit.page.fill("#search", "emma darwin 1808");
         assert.deepEqual(await found(visit), ["Emma Wedgwood"], "a wife is found by her husband's surname");
         assert.deepEqual(await reasons(), ["Married name: Darwin"]);

@@ -7,11 +7,20 @@ import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
 import { createServer } from "node:http";
 import { after, before, describe, test } from "node:test";
-import { kTwoAtOnce, newContext, photograph, sample, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
+import {
+    kTwoAtOnce,
+    newContext,
+    photograph,
+    sample,
+    visitDarwins,
+    visitEmpty,
+    visitFamily,
+} from "../support/browser.mjs";
 import { Visit } from "../support/Visit.mjs";
 
 const kPhone = { viewport: { width: 390, height: 844 }, hasTouch: true, isMobile: true };
-const kFrame = '<!doctype html><body style="height: 4000px; margin: 0"><iframe src="page.html" style="width: 900px; height: 600px"></iframe>';
+const kFrame =
+    '<!doctype html><body style="height: 4000px; margin: 0"><iframe src="page.html" style="width: 900px; height: 600px"></iframe>';
 
 let server = null;
 let address = "";
@@ -73,7 +82,11 @@ describe("sharing", kTwoAtOnce, () => {
         assert.equal(wanted.theme, "dark");
         assert.equal(wanted.state.view, "hourglass");
         assert.notEqual(wanted.state.to, 0);
-        assert.doesNotMatch(await other.hash(), /sight|theme|language/, "a step back changes neither language nor zoom");
+        assert.doesNotMatch(
+            await other.hash(),
+            /sight|theme|language/,
+            "a step back changes neither language nor zoom",
+        );
         await other.page.reload();
         await other.untilFamily();
         assert.equal((await seen(other)).language, "en", "a link is no setting of the reader's own");
@@ -86,7 +99,11 @@ describe("sharing", kTwoAtOnce, () => {
         await visit.untilFamily();
         await visit.page.click("#file-button");
         assert.ok(!(await visit.page.isVisible("#keep-file")));
-        const stored = await visit.page.evaluate(async () => [JSON.stringify(localStorage), JSON.stringify(sessionStorage), (await indexedDB.databases()).length]);
+        const stored = await visit.page.evaluate(async () => [
+            JSON.stringify(localStorage),
+            JSON.stringify(sessionStorage),
+            (await indexedDB.databases()).length,
+        ]);
         assert.doesNotMatch(stored.join(), /darwin|wedgwood|I1\b/i);
         assert.equal(stored[2], 0);
         await visit.end();
@@ -122,7 +139,11 @@ describe("sharing", kTwoAtOnce, () => {
         await page.goto(address + "/frame.html");
         const frame = page.frames()[1];
         await frame.waitForSelector("#file-input", { state: "attached" });
-        await frame.setInputFiles("#file-input", { name: "d.ged", mimeType: "", buffer: sample("darwin-wedgwood.ged") });
+        await frame.setInputFiles("#file-input", {
+            name: "d.ged",
+            mimeType: "",
+            buffer: sample("darwin-wedgwood.ged"),
+        });
         await frame.waitForSelector("#tree .box.focus");
         await page.waitForTimeout(500);
         const zoom = () => frame.evaluate(() => document.querySelector("olvane-tree").sight.zoom.toFixed(3));

@@ -36,7 +36,9 @@ describe("spoken", kTwoAtOnce, () => {
         const visit = await visitDarwins();
         const lines = [];
         await visit.stand("I1");
-        lines.push(`The picture: ${await visit.page.evaluate(() => `${one("#tree").getAttribute("aria-label")}. ${one("#tree-hint").textContent}`)}`);
+        lines.push(
+            `The picture: ${await visit.page.evaluate(() => `${one("#tree").getAttribute("aria-label")}. ${one("#tree-hint").textContent}`)}`,
+        );
         lines.push(`At first: ${await announced(visit)}`);
         for (const key of ["ArrowUp", "ArrowLeft", "ArrowDown", "ArrowRight"]) {
             await visit.press(key);

@@ -49,7 +49,10 @@ describe("walking", kTwoAtOnce, () => {
         await visit.stand("I1");
         await visit.press("ArrowDown");
         const child = await visit.keysOn();
-        assert.ok(["I107", "I109", "I110", "I111", "I113", "I115", "I116", "I120", "I123", "I125"].includes(child), child);
+        assert.ok(
+            ["I107", "I109", "I110", "I111", "I113", "I115", "I116", "I120", "I123", "I125"].includes(child),
+            child,
+        );
         await visit.press("ArrowRight");
         const neighbour = await visit.keysOn();
         assert.notEqual(neighbour, child);
@@ -99,14 +102,19 @@ describe("walking", kTwoAtOnce, () => {
             const farApart = (one, other) => Math.hypot(one[0] - other[0], one[1] - other[1]);
             const before = placeOf("I12");
             for (const detail of [1, 2])
-                one('#tree [data-xref="I12"] .frame').dispatchEvent(new MouseEvent("click", { bubbles: true, composed: true, detail }));
+                one('#tree [data-xref="I12"] .frame').dispatchEvent(
+                    new MouseEvent("click", { bubbles: true, composed: true, detail }),
+                );
             const start = placeOf("I12");
             const mother = [placeOf("I55")];
-            for (const began = performance.now(); performance.now() - began < 900; ) {
+            for (const began = performance.now(); performance.now() - began < 900;) {
                 await new Promise((next) => requestAnimationFrame(next));
                 mother.push(placeOf("I55"));
             }
-            const steps = mother.slice(1).map((place, i) => farApart(place, mother[i])).filter((step) => step > 0.5);
+            const steps = mother
+                .slice(1)
+                .map((place, i) => farApart(place, mother[i]))
+                .filter((step) => step > 0.5);
             return { jump: farApart(before, start), steps: steps.length, way: farApart(mother[0], mother.at(-1)) };
         });
         assert.ok(glide.jump < 5, "the clicked box begins where it stood");
@@ -234,7 +242,9 @@ describe("walking", kTwoAtOnce, () => {
     test("in the pedigree exactly those who have relatives out of the picture have a mark", async () => {
         const visit = await visitDarwins("#person=I1&view=pedigree&generations=3");
         await visit.fit();
-        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) => boxes.map((box) => [box.dataset.xref, box.querySelector(".badge text").textContent]));
+        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) =>
+            boxes.map((box) => [box.dataset.xref, box.querySelector(".badge text").textContent]),
+        );
         const counts = Object.fromEntries(marked);
         assert.deepEqual(counts, {
             // Children and their spouses' children; Emma's parents are not Charles's.
@@ -259,7 +269,9 @@ describe("walking", kTwoAtOnce, () => {
 
     test("who has relatives out of the picture has a mark, and a double click leads to them", async () => {
         const visit = await visitDarwins("#person=I1&hide=cousins,greatGrandparents");
-        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
+        const marked = await visit.page.$$eval("#tree .box:has(.badge)", (boxes) =>
+            boxes.map((box) => box.getAttribute("data-xref")),
+        );
         assert.ok(marked.includes("I5"), "Erasmus has parents who are not shown");
         assert.match(await visit.label("I5"), /more relatives? not shown/);
         assert.ok(!(await visit.shows("I3")));
@@ -290,7 +302,10 @@ describe("walking", kTwoAtOnce, () => {
         await page.mouse.move(500, 600, { steps: 4 });
         await page.mouse.up();
         const moved = await visit.placing();
-        assert.ok(Math.abs(moved.x - near.x - 80) < 2 && Math.abs(moved.y - near.y + 40) < 2, JSON.stringify([near, moved]));
+        assert.ok(
+            Math.abs(moved.x - near.x - 80) < 2 && Math.abs(moved.y - near.y + 40) < 2,
+            JSON.stringify([near, moved]),
+        );
         assert.equal(await visit.focus(), "I1", "a drag is no click");
         await visit.click("#zoom-out");
         assert.ok((await visit.placing()).k < moved.k);
@@ -298,7 +313,13 @@ describe("walking", kTwoAtOnce, () => {
         const sizes = await page.evaluate(() => {
             const tree = one("#tree").getBoundingClientRect();
             const boxes = [...all("#tree .frame")].map((box) => box.getBoundingClientRect());
-            return boxes.every((box) => box.left >= tree.left && box.right <= tree.right && box.top >= tree.top && box.bottom <= tree.bottom);
+            return boxes.every(
+                (box) =>
+                    box.left >= tree.left &&
+                    box.right <= tree.right &&
+                    box.top >= tree.top &&
+                    box.bottom <= tree.bottom,
+            );
         });
         assert.ok(sizes, "everything is in sight");
         await visit.stand("I1");
@@ -331,7 +352,11 @@ describe("walking", kTwoAtOnce, () => {
             return [focus.x - stage.x - stage.width / 2, focus.y - stage.y - stage.height / 2];
         };
         const [x, y] = await middle();
-        for (const size of [{ width: 1100, height: 500 }, { width: 500, height: 900 }, { width: 1280, height: 800 }]) {
+        for (const size of [
+            { width: 1100, height: 500 },
+            { width: 500, height: 900 },
+            { width: 1280, height: 800 },
+        ]) {
             await visit.page.setViewportSize(size);
             await visit.still();
             const [newX, newY] = await middle();

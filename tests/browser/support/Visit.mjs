@@ -70,7 +70,10 @@ export class Visit {
             const look = () => {
                 const boxes = [...all("#tree .boxes > g")];
                 const ghosts = one("#tree .ghosts")?.childElementCount ?? 0;
-                const words = boxes.reduce((n, box) => n + box.querySelector(".frame").getAttribute("aria-label").length, 0);
+                const words = boxes.reduce(
+                    (n, box) => n + box.querySelector(".frame").getAttribute("aria-label").length,
+                    0,
+                );
                 const places = boxes.map((box) => box.getAttribute("transform")).join();
                 return [one("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
             };
@@ -93,7 +96,11 @@ export class Visit {
 
     /** Hands a file over as the browser's own dialog does. */
     async choose(name, bytes) {
-        await this.page.setInputFiles("#file-input", { name, mimeType: "application/octet-stream", buffer: Buffer.from(bytes) });
+        await this.page.setInputFiles("#file-input", {
+            name,
+            mimeType: "application/octet-stream",
+            buffer: Buffer.from(bytes),
+        });
     }
 
     /** Drags a file over the page and lets it fall. */
@@ -140,12 +147,16 @@ export class Visit {
 
     /** Labels of all boxes that have elements. */
     async labels() {
-        return this.page.$$eval("#tree .boxes .frame", (boxes) => boxes.map((box) => box.getAttribute("aria-label")).sort());
+        return this.page.$$eval("#tree .boxes .frame", (boxes) =>
+            boxes.map((box) => box.getAttribute("aria-label")).sort(),
+        );
     }
 
     /** Records of the persons whose boxes have elements, sorted, each once. */
     async shown() {
-        const xrefs = await this.page.$$eval("#tree .boxes > [data-xref]", (boxes) => boxes.map((box) => box.getAttribute("data-xref")));
+        const xrefs = await this.page.$$eval("#tree .boxes > [data-xref]", (boxes) =>
+            boxes.map((box) => box.getAttribute("data-xref")),
+        );
         return [...new Set(xrefs)].sort();
     }
 
@@ -176,7 +187,8 @@ export class Visit {
     /** Upper left corners of all boxes, relative to the focus's, by record. Unknown parents go by their label. */
     async places() {
         return this.page.evaluate(() => {
-            const placeOf = (box) => /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);
+            const placeOf = (box) =>
+                /translate\(([-\d.]+) ([-\d.]+)\)/.exec(box.getAttribute("transform")).slice(1).map(Number);
             const boxes = [...all("#tree .boxes > g")];
             const [x0, y0] = placeOf(one("#tree .box.focus"));
             const named = boxes.map((box) => {

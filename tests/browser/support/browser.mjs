@@ -77,7 +77,12 @@ export async function visitFamily(gedcom, stated = {}, settings = {}, hash = "")
 }
 
 export async function visitDarwins(hash = "#person=I1", settings = {}) {
-    return visitFamily(sample("darwin-wedgwood.ged"), { name: "darwin-wedgwood.ged", title: "Darwin and Wedgwood" }, settings, hash);
+    return visitFamily(
+        sample("darwin-wedgwood.ged"),
+        { name: "darwin-wedgwood.ged", title: "Darwin and Wedgwood" },
+        settings,
+        hash,
+    );
 }
 
 export async function visitFile(path, settings = {}, hash = "") {

@@ -3,10 +3,44 @@
 
 // What a screen reader gets, as a text to read: the accessibility tree of Chromium, line by line.
 
-const kWholeNames = new Set(["button", "link", "heading", "option", "switch", "checkbox", "combobox", "textbox", "searchbox", "slider", "image", "img", "DisclosureTriangle", "ListBoxOption"]);
-const kAreas = new Set(["region", "complementary", "main", "banner", "dialog", "group", "application", "navigation", "search", "listbox", "list", "ListBox", "status", "alert"]);
+const kWholeNames = new Set([
+    "button",
+    "link",
+    "heading",
+    "option",
+    "switch",
+    "checkbox",
+    "combobox",
+    "textbox",
+    "searchbox",
+    "slider",
+    "image",
+    "img",
+    "DisclosureTriangle",
+    "ListBoxOption",
+]);
+const kAreas = new Set([
+    "region",
+    "complementary",
+    "main",
+    "banner",
+    "dialog",
+    "group",
+    "application",
+    "navigation",
+    "search",
+    "listbox",
+    "list",
+    "ListBox",
+    "status",
+    "alert",
+]);
 
-const nameOf = (node) => (node.name?.value ?? "").replace(/[\u2066-\u2069]/g, "").replace(/\s+/g, " ").trim();
+const nameOf = (node) =>
+    (node.name?.value ?? "")
+        .replace(/[\u2066-\u2069]/g, "")
+        .replace(/\s+/g, " ")
+        .trim();
 
 function statesOf(node) {
     const states = Object.fromEntries((node.properties ?? []).map(({ name, value }) => [name, value.value]));
@@ -39,12 +73,17 @@ export async function spoken(visit, selector) {
     const read = (node, depth) => {
         const role = node.role?.value ?? "";
         const add = (text) => lines.push("  ".repeat(depth) + text);
-        if (node.ignored || role === "generic" || role === "none") return children(node).forEach((child) => read(child, depth));
+        if (node.ignored || role === "generic" || role === "none")
+            return children(node).forEach((child) => read(child, depth));
         if (role === "StaticText" || role === "paragraph") return textOf(node) && add(textOf(node));
         if (role === "heading") return add(`== ${nameOf(node)} ==`);
         if (role === "term") return add(textOf(node) + ":");
         if (role === "definition") return children(node).forEach((child) => read(child, depth + 1));
-        if (kWholeNames.has(role)) return nameOf(node) && add(`${role === "DisclosureTriangle" ? "button" : role}: ${nameOf(node)}${statesOf(node)}`);
+        if (kWholeNames.has(role))
+            return (
+                nameOf(node) &&
+                add(`${role === "DisclosureTriangle" ? "button" : role}: ${nameOf(node)}${statesOf(node)}`)
+            );
         const isArea = kAreas.has(role) && nameOf(node) !== "";
         if (isArea) add(`[${role}: ${nameOf(node)}]${statesOf(node)}`);
         children(node).forEach((child) => read(child, isArea ? depth + 1 : depth));

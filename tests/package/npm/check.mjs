@@ -17,16 +17,31 @@ import { tmpdir } from "node:os";
 import { extname, join, resolve } from "node:path";
 import { parseArgs } from "node:util";
 
-const { values } = parseArgs({ options: { packages: { type: "string" }, quick: { type: "boolean" }, work: { type: "string" } } });
+const { values } = parseArgs({
+    options: { packages: { type: "string" }, quick: { type: "boolean" }, work: { type: "string" } },
+});
 const work = values.work ? resolve(values.work) : mkdtempSync(join(tmpdir(), "olvane-npm-"));
 mkdirSync(work, { recursive: true });
-const archives = readdirSync(values.packages).filter((name) => name.endsWith(".tgz")).map((name) => resolve(values.packages, name));
+const archives = readdirSync(values.packages)
+    .filter((name) => name.endsWith(".tgz"))
+    .map((name) => resolve(values.packages, name));
 
 const kTools = values.quick
     ? ["esbuild@0.28", "playwright-core@1.58"]
-    : ["esbuild@0.28", "playwright-core@1.58", "vite@7", "webpack@5", "webpack-cli@6", "rollup@4", "@rollup/plugin-node-resolve@16", "publint@0.3", "@arethetypeswrong/cli@0.18"];
+    : [
+          "esbuild@0.28",
+          "playwright-core@1.58",
+          "vite@7",
+          "webpack@5",
+          "webpack-cli@6",
+          "rollup@4",
+          "@rollup/plugin-node-resolve@16",
+          "publint@0.3",
+          "@arethetypeswrong/cli@0.18",
+      ];
 
-const kFamily = "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n0 @I1@ INDI\n1 NAME Ada /Berg/\n1 FAMC @F1@\n0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I3@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I2@\n1 WIFE @I3@\n1 CHIL @I1@\n0 TRLR\n";
+const kFamily =
+    "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n0 @I1@ INDI\n1 NAME Ada /Berg/\n1 FAMC @F1@\n0 @I2@ INDI\n1 SEX M\n1 FAMS @F1@\n0 @I3@ INDI\n1 SEX F\n1 FAMS @F1@\n0 @F1@ FAM\n1 HUSB @I2@\n1 WIFE @I3@\n1 CHIL @I1@\n0 TRLR\n";
 const kUse = `const olvane = await loadOlvane();
 const file = olvane.readGedcom(new TextEncoder().encode(${JSON.stringify(kFamily)}), "family.ged");
 const boxes = file.picture(1, { view: "ancestors" }).boxes.length;`;
@@ -46,13 +61,21 @@ run("npm", ["install", "--no-audit", "--no-fund", "--loglevel=error", ...archive
 // A page that says in its title what it found: 3, the boxes of a child and its parents.
 const kPage = (script) => `<!doctype html><meta charset="utf-8"><title>waiting</title>${script}`;
 const kReport = `${kUse}\ndocument.title = String(boxes);`;
-const kMain = (from) => `import { loadOlvane } from "${from}";\n(async () => { ${kReport} })().catch((error) => (document.title = String(error)));\n`;
+const kMain = (from) =>
+    `import { loadOlvane } from "${from}";\n(async () => { ${kReport} })().catch((error) => (document.title = String(error)));\n`;
 const kWorker = `import { loadOlvane } from "olvane";\nonmessage = async () => { try { ${kUse} postMessage(boxes); } catch (error) { postMessage(String(error)); } };\n`;
 const kWorkerPage = `const worker = new Worker(new URL("./worker.js", import.meta.url), { type: "module" });\nworker.onmessage = ({ data }) => (document.title = String(data));\nworker.postMessage(0);\n`;
 
-const kTypes = { ".html": "text/html", ".js": "text/javascript", ".mjs": "text/javascript", ".wasm": "application/wasm", ".ged": "text/plain" };
+const kTypes = {
+    ".html": "text/html",
+    ".js": "text/javascript",
+    ".mjs": "text/javascript",
+    ".wasm": "application/wasm",
+    ".ged": "text/plain",
+};
 // What docs/guide/web-page.md says that a policy needs.
-const kStrictPolicy = "default-src 'none'; script-src 'self' 'wasm-unsafe-eval'; connect-src 'self'; img-src data: blob:";
+const kStrictPolicy =
+    "default-src 'none'; script-src 'self' 'wasm-unsafe-eval'; connect-src 'self'; img-src data: blob:";
 const server = createServer((request, response) => {
     const path = join(work, decodeURIComponent(new URL(request.url, "http://localhost").pathname));
     if (!path.startsWith(work) || !existsSync(path)) return response.writeHead(404).end();
@@ -63,7 +86,10 @@ const server = createServer((request, response) => {
 await new Promise((done) => server.listen(0, "127.0.0.1", done));
 const address = `http://127.0.0.1:${server.address().port}`;
 const { chromium } = createRequire(join(work, "package.json"))("playwright-core");
-const browser = await chromium.launch({ executablePath: process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium", args: ["--no-sandbox", "--disable-gpu"] });
+const browser = await chromium.launch({
+    executablePath: process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium",
+    args: ["--no-sandbox", "--disable-gpu"],
+});
 
 async function titleOf(url) {
     const page = await browser.newPage();
@@ -82,16 +108,28 @@ const kRoads = {
         return run("node", ["node.mjs"]).trim();
     },
     "node, require"() {
-        write("node.cjs", `const { loadOlvane } = require("olvane");\n(async () => { ${kUse} console.log(boxes); })();`);
+        write(
+            "node.cjs",
+            `const { loadOlvane } = require("olvane");\n(async () => { ${kUse} console.log(boxes); })();`,
+        );
         return run("node", ["node.cjs"]).trim();
     },
     "node, require of the inline one"() {
-        write("inline.cjs", `const { loadOlvane } = require("olvane/inline");\n(async () => { ${kUse} console.log(boxes); })();`);
+        write(
+            "inline.cjs",
+            `const { loadOlvane } = require("olvane/inline");\n(async () => { ${kUse} console.log(boxes); })();`,
+        );
         return run("node", ["inline.cjs"]).trim();
     },
     async esbuild() {
         write("esbuild/main.js", kMain("olvane/inline"));
-        run(bin("esbuild"), ["esbuild/main.js", "--bundle", "--format=esm", "--outfile=esbuild/out.js", "--log-level=error"]);
+        run(bin("esbuild"), [
+            "esbuild/main.js",
+            "--bundle",
+            "--format=esm",
+            "--outfile=esbuild/out.js",
+            "--log-level=error",
+        ]);
         write("esbuild/index.html", kPage('<script type="module" src="out.js"></script>'));
         return titleOf(`${address}/esbuild/index.html`);
     },
@@ -102,7 +140,10 @@ const kRoads = {
     },
     async "plain script (IIFE)"() {
         const use = `(async () => { const { loadOlvane } = olvane; { ${kUse.replace("const olvane =", "const engine =").replaceAll("olvane.readGedcom", "engine.readGedcom")} document.title = String(boxes); } })()`;
-        write("iife/index.html", kPage(`<script src="/node_modules/olvane/olvane.iife.js"></script><script>${use}</script>`));
+        write(
+            "iife/index.html",
+            kPage(`<script src="/node_modules/olvane/olvane.iife.js"></script><script>${use}</script>`),
+        );
         return titleOf(`${address}/iife/index.html`);
     },
     async "a wrong response for the module is named"() {
@@ -117,14 +158,20 @@ const kRoads = {
     },
     async "the element, plain"() {
         write("element/family.ged", kFamily);
-        write("element/index.html", kPage(`<olvane-tree src="family.ged" view="ancestors" style="height: 400px"></olvane-tree>
+        write(
+            "element/index.html",
+            kPage(`<olvane-tree src="family.ged" view="ancestors" style="height: 400px"></olvane-tree>
 <script type="module">import "/node_modules/olvane-tree/olvane-tree.mjs";
-document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail }) => (document.title = String(detail.boxes)));</script>`));
+document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail }) => (document.title = String(detail.boxes)));</script>`),
+        );
         return titleOf(`${address}/element/index.html`);
     },
     async "a page of own data, under a strict policy"() {
         for (const name of ["own_tree.html", "own_tree.mjs"]) {
-            write(`strict/${name}`, readFileSync(new URL(`../../../examples/javascript/${name}`, import.meta.url), "utf8"));
+            write(
+                `strict/${name}`,
+                readFileSync(new URL(`../../../examples/javascript/${name}`, import.meta.url), "utf8"),
+            );
         }
         write("strict/olvane-tree.mjs", readFileSync(join(work, "node_modules/olvane-tree/olvane-tree.mjs"), "utf8"));
         const page = await browser.newPage();
@@ -132,62 +179,104 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
             // The guide's own policy; the height is set without the attribute that the policy refuses.
             await page.addInitScript(() => {
                 globalThis.refused = [];
-                addEventListener("securitypolicyviolation", (event) => globalThis.refused.push(event.violatedDirective));
+                addEventListener("securitypolicyviolation", (event) =>
+                    globalThis.refused.push(event.violatedDirective),
+                );
             });
             await page.goto(`${address}/strict/own_tree.html`);
-            await page.waitForFunction(() => document.querySelector("olvane-tree").state?.focus, undefined, { timeout: 20_000 });
+            await page.waitForFunction(() => document.querySelector("olvane-tree").state?.focus, undefined, {
+                timeout: 20_000,
+            });
             const svg = await page.evaluate(() => document.querySelector("olvane-tree").saveSvg());
-            for (const name of ["Henry", "Anne", "Elizabeth", "Edmund", "Margaret"]) assert.ok(svg.includes(name), `${name} is not drawn`);
+            for (const name of ["Henry", "Anne", "Elizabeth", "Edmund", "Margaret"])
+                assert.ok(svg.includes(name), `${name} is not drawn`);
             assert.deepEqual(await page.evaluate(() => globalThis.refused), ["style-src-attr"]);
         } finally {
             await page.close();
         }
         return "3";
     },
-    ...(values.quick ? {} : {
-        async rollup() {
-            write("rollup/main.js", kMain("olvane/inline"));
-            run(bin("rollup"), ["rollup/main.js", "-p", "@rollup/plugin-node-resolve", "-f", "es", "-o", "rollup/out.js", "--silent"]);
-            write("rollup/index.html", kPage('<script type="module" src="out.js"></script>'));
-            return titleOf(`${address}/rollup/index.html`);
-        },
-        async "webpack, without warnings"() {
-            write("webpack/main.js", kMain("olvane"));
-            write("webpack/webpack.config.cjs", `module.exports = { mode: "production", entry: ${JSON.stringify(join(work, "webpack/main.js"))}, output: { path: ${JSON.stringify(join(work, "webpack/out"))}, filename: "main.js", publicPath: "auto" } };`);
-            const said = run(bin("webpack"), ["--config", "webpack/webpack.config.cjs", "--no-color", "--stats", "errors-warnings"]);
-            assert.doesNotMatch(said.replace(/WARNING in (asset|entrypoint) size limit[\s\S]*/g, "").replace(/WARNING in webpack performance[\s\S]*/g, ""), /WARNING/);
-            write("webpack/index.html", kPage('<script src="out/main.js"></script>'));
-            return titleOf(`${address}/webpack/index.html`);
-        },
-        async "vite build, with a worker"() {
-            write("vite/worker.js", kWorker);
-            write("vite/main.js", kWorkerPage);
-            write("vite/index.html", kPage('<script type="module" src="./main.js"></script>'));
-            write("vite/vite.config.js", 'export default { base: "./", worker: { format: "es" }, build: { outDir: "out" }, optimizeDeps: { exclude: ["olvane"] } };');
-            run(bin("vite"), ["build", "--logLevel", "error"], join(work, "vite"));
-            return titleOf(`${address}/vite/out/index.html`);
-        },
-        async "vite dev, with a worker"() {
-            const port = 5300 + Math.floor(Math.random() * 500);
-            const dev = spawn(bin("vite"), ["--port", String(port), "--strictPort", "--logLevel", "error"], { cwd: join(work, "vite"), stdio: "ignore" });
-            try {
-                for (let tries = 0; tries < 100; ++tries) {
-                    if (await fetch(`http://localhost:${port}/`).then(() => true, () => false)) break;
-                    await new Promise((next) => setTimeout(next, 100));
-                }
-                return await titleOf(`http://localhost:${port}/`);
-            } finally {
-                dev.kill();
-            }
-        },
-        "publint and the types"() {
-            for (const archive of archives) {
-                run(bin("publint"), [archive, "--strict"]);
-                run(bin("attw"), [archive, "--exclude-entrypoints", "olvane.wasm", "custom-elements.json"]);
-            }
-            return "3";
-        },
-    }),
+    ...(values.quick
+        ? {}
+        : {
+              async rollup() {
+                  write("rollup/main.js", kMain("olvane/inline"));
+                  run(bin("rollup"), [
+                      "rollup/main.js",
+                      "-p",
+                      "@rollup/plugin-node-resolve",
+                      "-f",
+                      "es",
+                      "-o",
+                      "rollup/out.js",
+                      "--silent",
+                  ]);
+                  write("rollup/index.html", kPage('<script type="module" src="out.js"></script>'));
+                  return titleOf(`${address}/rollup/index.html`);
+              },
+              async "webpack, without warnings"() {
+                  write("webpack/main.js", kMain("olvane"));
+                  write(
+                      "webpack/webpack.config.cjs",
+                      `module.exports = { mode: "production", entry: ${JSON.stringify(join(work, "webpack/main.js"))}, output: { path: ${JSON.stringify(join(work, "webpack/out"))}, filename: "main.js", publicPath: "auto" } };`,
+                  );
+                  const said = run(bin("webpack"), [
+                      "--config",
+                      "webpack/webpack.config.cjs",
+                      "--no-color",
+                      "--stats",
+                      "errors-warnings",
+                  ]);
+                  assert.doesNotMatch(
+                      said
+                          .replace(/WARNING in (asset|entrypoint) size limit[\s\S]*/g, "")
+                          .replace(/WARNING in webpack performance[\s\S]*/g, ""),
+                      /WARNING/,
+                  );
+                  write("webpack/index.html", kPage('<script src="out/main.js"></script>'));
+                  return titleOf(`${address}/webpack/index.html`);
+              },
+              async "vite build, with a worker"() {
+                  write("vite/worker.js", kWorker);
+                  write("vite/main.js", kWorkerPage);
+                  write("vite/index.html", kPage('<script type="module" src="./main.js"></script>'));
+                  write(
+                      "vite/vite.config.js",
+                      'export default { base: "./", worker: { format: "es" }, build: { outDir: "out" }, optimizeDeps: { exclude: ["olvane"] } };',
+                  );
+                  run(bin("vite"), ["build", "--logLevel", "error"], join(work, "vite"));
+                  return titleOf(`${address}/vite/out/index.html`);
+              },
+              async "vite dev, with a worker"() {
+                  const port = 5300 + Math.floor(Math.random() * 500);
+                  const dev = spawn(bin("vite"), ["--port", String(port), "--strictPort", "--logLevel", "error"], {
+                      cwd: join(work, "vite"),
+                      stdio: "ignore",
+                  });
+                  try {
+                      for (let tries = 0; tries < 100; ++tries) {
+                          if (
+                              await fetch(`http://localhost:${port}/`).then(
+                                  () => true,
+                                  () => false,
+                              )
+                          )
+                              break;
+                          await new Promise((next) => setTimeout(next, 100));
+                      }
+                      return await titleOf(`http://localhost:${port}/`);
+                  } finally {
+                      dev.kill();
+                  }
+              },
+              "publint and the types"() {
+                  for (const archive of archives) {
+                      run(bin("publint"), [archive, "--strict"]);
+                      run(bin("attw"), [archive, "--exclude-entrypoints", "olvane.wasm", "custom-elements.json"]);
+                  }
+                  return "3";
+              },
+          }),
 };
 
 let passed = 0;

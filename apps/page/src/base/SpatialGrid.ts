@@ -53,10 +53,7 @@ export function touches(a: Rectangle, b: Rectangle): boolean {
 
 export function encloses(outer: Rectangle, inner: Rectangle): boolean {
     return (
-        outer.left <= inner.left &&
-        outer.top <= inner.top &&
-        outer.right >= inner.right &&
-        outer.bottom >= inner.bottom
+        outer.left <= inner.left && outer.top <= inner.top && outer.right >= inner.right && outer.bottom >= inner.bottom
     );
 }
 

@@ -6,12 +6,7 @@
 import { html, onClick } from "./dom";
 import { icon, type IconName } from "./icons";
 
-export function iconButton(
-    id: string,
-    name: IconName,
-    label: string,
-    action: () => void,
-): HTMLButtonElement {
+export function iconButton(id: string, name: IconName, label: string, action: () => void): HTMLButtonElement {
     const button = html(
         "button",
         { id, type: "button", class: "icon-button", "aria-label": label, title: label },

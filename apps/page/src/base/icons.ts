@@ -26,11 +26,13 @@ const kPaths = {
     near: "M9 9h6v6H9zM3 3h4v4H3zM17 3h4v4h-4zM3 17h4v4H3zM17 17h4v4h-4zM7 5h10M12 5v4M12 15v4M7 19h10",
     ancestors: "M9.5 16h5v5h-5zM3 3h5v5H3zM16 3h5v5h-5zM5.5 8v4h13V8M12 12v4",
     descendants: "M9.5 3h5v5h-5zM3 16h5v5H3zM16 16h5v5h-5zM5.5 16v-4h13v4M12 12V8",
-    hourglass: "M10 10h4v4h-4zM4 3h4v4H4zM16 3h4v4h-4zM4 17h4v4H4zM16 17h4v4h-4zM8 7l2.5 3M16 7l-2.5 3M8 17l2.5-3M16 17l-2.5-3",
+    hourglass:
+        "M10 10h4v4h-4zM4 3h4v4H4zM16 3h4v4h-4zM4 17h4v4H4zM16 17h4v4h-4zM8 7l2.5 3M16 7l-2.5 3M8 17l2.5-3M16 17l-2.5-3",
     relatives: "M10 3h4v4h-4zM3 11h4v4H3zM10 11h4v4h-4zM17 11h4v4h-4zM5 11V9h14v2M12 7v4M12 15v6M8 21h8",
     fan: "M12 21L3 10a14 14 0 0 1 18 0zM7.5 15.5a7 7 0 0 1 9 0M12 21V7",
     kinship: "M4 17h5v4H4zM15 17h5v4h-5zM9.5 3h5v4h-5zM6.5 17v-5h11v5M12 7v5",
-    everybody: "M3 3h3v3H3zM10.5 3h3v3h-3zM18 3h3v3h-3zM3 10.5h3v3H3zM10.5 10.5h3v3h-3zM18 10.5h3v3h-3zM3 18h3v3H3zM10.5 18h3v3h-3zM18 18h3v3h-3z",
+    everybody:
+        "M3 3h3v3H3zM10.5 3h3v3h-3zM18 3h3v3h-3zM3 10.5h3v3H3zM10.5 10.5h3v3h-3zM18 10.5h3v3h-3zM3 18h3v3H3zM10.5 18h3v3h-3zM18 18h3v3h-3z",
     map: "M3 6l6-2.5 6 2.5 6-2.5v14.5L15 20.5 9 18l-6 2.5zM9 3.5V18M15 6v14.5",
     up: "M6 15l6-6 6 6",
     duplicates: "M5 9h10v10H5zM9 9V5h10v10h-4",

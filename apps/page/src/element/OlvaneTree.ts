@@ -340,7 +340,9 @@ export class OlvaneTree extends HTMLElement {
     /** The whole picture as the text of an SVG file; null before any. */
     drawing(theme: DrawingTheme): string | null {
         const { opened, shownState } = this;
-        return opened && shownState && this.picture ? opened.svg(shownState, theme, this.messages.language as PictureOptions["language"]) : null;
+        return opened && shownState && this.picture
+            ? opened.svg(shownState, theme, this.messages.language as PictureOptions["language"])
+            : null;
     }
 
     /** What the picture is called; empty before any. */

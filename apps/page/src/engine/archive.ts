@@ -42,8 +42,7 @@ export class Archive {
     /** The GEDCOM file: gedcom.ged, or else the first that ends in .ged. At most so many bytes come out of it. */
     async gedcom(most: number): Promise<Uint8Array<ArrayBuffer>> {
         const names = [...this.entries.keys()];
-        const name =
-            names.find((one) => /(^|\/)gedcom\.ged$/i.test(one)) ?? names.find((one) => /\.ged$/i.test(one));
+        const name = names.find((one) => /(^|\/)gedcom\.ged$/i.test(one)) ?? names.find((one) => /\.ged$/i.test(one));
         if (name === undefined) throw new ArchiveError("no .ged");
         return this.bytesOf(name, most);
     }
@@ -89,8 +88,7 @@ function entriesOf(archive: Uint8Array): Entry[] {
     const entries: Entry[] = [];
     let at = view.getUint32(end + 16, true);
     for (let left = view.getUint16(end + 10, true); left > 0; --left) {
-        if (at + 46 > view.byteLength || view.getUint32(at, true) !== kEntry)
-            throw new ArchiveError("damaged");
+        if (at + 46 > view.byteLength || view.getUint32(at, true) !== kEntry) throw new ArchiveError("damaged");
         const nameSize = view.getUint16(at + 28, true);
         entries.push({
             name: new TextDecoder().decode(archive.subarray(at + 46, at + 46 + nameSize)),
@@ -106,8 +104,7 @@ function entriesOf(archive: Uint8Array): Entry[] {
 
 function endOf(view: DataView): number {
     const lowest = Math.max(0, view.byteLength - kEndSize - kMostComment);
-    for (let at = view.byteLength - kEndSize; at >= lowest; --at)
-        if (view.getUint32(at, true) === kEnd) return at;
+    for (let at = view.byteLength - kEndSize; at >= lowest; --at) if (view.getUint32(at, true) === kEnd) return at;
     throw new ArchiveError("no archive");
 }
 
@@ -117,8 +114,7 @@ async function contentOf(
     most: number,
 ): Promise<Uint8Array<ArrayBuffer>> {
     const view = new DataView(archive.buffer, archive.byteOffset, archive.byteLength);
-    const start =
-        entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
+    const start = entry.start + 30 + view.getUint16(entry.start + 26, true) + view.getUint16(entry.start + 28, true);
     const packed = archive.slice(start, start + entry.packedSize);
     if (packed.length > most) throw new TooLargeError();
     if (entry.method === 0) return packed;

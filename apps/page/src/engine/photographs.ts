@@ -13,7 +13,9 @@ export class Photographs {
     private readonly found = new Map<string, Promise<string | null> | string | null>();
     private readonly made: string[] = [];
 
-    private constructor(private readonly find: (file: string) => Promise<Uint8Array<ArrayBuffer> | null> | string | null) {}
+    private constructor(
+        private readonly find: (file: string) => Promise<Uint8Array<ArrayBuffer> | null> | string | null,
+    ) {}
 
     /** JPEG in base 64, by the name that the family's text has for the file. */
     static embedded(photos: Readonly<Record<string, unknown>>): Photographs {

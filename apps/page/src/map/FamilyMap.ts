@@ -128,7 +128,12 @@ export class FamilyMap {
     /** Each of them once, in the order of the data; somebody married to themself is not listed. */
     kin(person: number): Kin {
         const { partners, childStarts, children } = this.arrays;
-        const found = { parents: new Set<number>(), partners: new Set<number>(), children: new Set<number>(), siblings: new Set<number>() };
+        const found = {
+            parents: new Set<number>(),
+            partners: new Set<number>(),
+            children: new Set<number>(),
+            siblings: new Set<number>(),
+        };
         const addPartners = (u: number, to: Set<number>) => {
             for (const one of [partners[2 * u]!, partners[2 * u + 1]!]) if (one >= 0 && one !== person) to.add(one);
         };
@@ -159,7 +164,7 @@ export class FamilyMap {
         const { marks } = this.arrays;
         const numbers: number[] = [];
         let low = 0;
-        for (let high = marks.length / 2; low < high; ) {
+        for (let high = marks.length / 2; low < high;) {
             const middle = (low + high) >> 1;
             if (marks[2 * middle]! < person) low = middle + 1;
             else high = middle;
@@ -177,7 +182,12 @@ export class FamilyMap {
             left = Math.min(left, x[rowStart[row]!]!);
             right = Math.max(right, x[rowStart[row + 1]! - 1]!);
         }
-        return { left: left / 4, top: rowY[0]! / 4, right: (right + boxWidth) / 4, bottom: (rowY[rows - 1]! + boxHeight) / 4 };
+        return {
+            left: left / 4,
+            top: rowY[0]! / 4,
+            right: (right + boxWidth) / 4,
+            bottom: (rowY[rows - 1]! + boxHeight) / 4,
+        };
     }
 }
 

@@ -42,7 +42,10 @@ export class MapCamera {
 
     get least(): number {
         const { left, top, right, bottom } = this.area;
-        const [width, height] = [(this.width - 2 * kMargin) / (right - left), (this.height - 2 * kMargin) / (bottom - top)];
+        const [width, height] = [
+            (this.width - 2 * kMargin) / (right - left),
+            (this.height - 2 * kMargin) / (bottom - top),
+        ];
         return Math.min(0.5, Math.max(Math.min(width, height), 1e-7));
     }
 
@@ -81,7 +84,11 @@ export class MapCamera {
             const share = place.k === from.k ? part : (1 / from.k - 1 / k) / (1 / from.k - 1 / place.k);
             this.flight = part < 1 ? requestAnimationFrame(step) : 0;
             this.aim = part < 1 ? place : null;
-            this.set(part < 1 ? { x: from.x + (place.x - from.x) * share, y: from.y + (place.y - from.y) * share, k } : place);
+            this.set(
+                part < 1
+                    ? { x: from.x + (place.x - from.x) * share, y: from.y + (place.y - from.y) * share, k }
+                    : place,
+            );
             if (part === 1) arrived();
         };
         step();

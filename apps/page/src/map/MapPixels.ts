@@ -96,7 +96,9 @@ export class MapPixels {
             this.each("bars", level, from, to, left, (i) => this.bar(frame, i, paint, thick));
         // Bars pass below uprights, with a gap, so that no crossing looks like a corner.
         for (const { first, end } of seen)
-            this.each("uprights", level, first, end, -Infinity, (i) => this.upright(frame, i, paint, thick, colours.page));
+            this.each("uprights", level, first, end, -Infinity, (i) =>
+                this.upright(frame, i, paint, thick, colours.page),
+            );
     }
 
     private thickness({ dpr }: Frame): number {
@@ -104,7 +106,14 @@ export class MapPixels {
     }
 
     // Those from begin to end that reach beyond left, or the longest of each block of them.
-    private each(kind: "bars" | "uprights", level: number, begin: number, end: number, left: number, draw: (i: number) => void): void {
+    private each(
+        kind: "bars" | "uprights",
+        level: number,
+        begin: number,
+        end: number,
+        left: number,
+        draw: (i: number) => void,
+    ): void {
         const high = this.map.arrays.bars.high;
         const isBar = kind === "bars";
         if (level < 0) {
@@ -128,7 +137,8 @@ export class MapPixels {
         const x1 = Math.round(low[i]! * frame.sx) + frame.ox;
         const x2 = Math.round(high[i]! * frame.sx) + frame.ox + thick;
         const role = roles[i]!;
-        if (this.isNear && (role === kDashed || role === kDivorcedLine)) this.dashes(frame, x1, x2, y, thick, paint, true);
+        if (this.isNear && (role === kDashed || role === kDivorcedLine))
+            this.dashes(frame, x1, x2, y, thick, paint, true);
         else this.rect(frame, x1, y, x2, y + thick, paint);
     }
 
@@ -145,10 +155,22 @@ export class MapPixels {
         else this.rect(frame, x, y1, x + thick, y2, paint);
     }
 
-    private dashes(frame: Frame, from: number, to: number, at: number, thick: number, paint: number, isLevel: boolean): void {
+    private dashes(
+        frame: Frame,
+        from: number,
+        to: number,
+        at: number,
+        thick: number,
+        paint: number,
+        isLevel: boolean,
+    ): void {
         const step = 3 * thick;
         const limit = isLevel ? frame.width : frame.height;
-        for (let one = from < 0 ? from + Math.floor(-from / (2 * step)) * 2 * step : from; one < Math.min(to, limit); one += 2 * step) {
+        for (
+            let one = from < 0 ? from + Math.floor(-from / (2 * step)) * 2 * step : from;
+            one < Math.min(to, limit);
+            one += 2 * step
+        ) {
             const end = Math.min(to, one + step);
             if (isLevel) this.rect(frame, one, at, end, at + thick, paint);
             else this.rect(frame, at, one, at + thick, end, paint);
@@ -174,10 +196,18 @@ export class MapPixels {
         }
     }
 
-    private columns(frame: Frame, colours: PixelColours, kin: ReadonlySet<number>, top: number, height: number, first: number, end: number): void {
+    private columns(
+        frame: Frame,
+        colours: PixelColours,
+        kin: ReadonlySet<number>,
+        top: number,
+        height: number,
+        first: number,
+        end: number,
+    ): void {
         const { x, surnames, boxWidth } = this.map.arrays;
         const width = Math.max(1, Math.round(boxWidth * frame.sx));
-        for (let p = first; p < end; ) {
+        for (let p = first; p < end;) {
             const px = Math.floor(x[p]! * frame.sx) + frame.ox;
             const surname = surnames[p]!;
             const hue = surname === 0 ? colours.line : colours.surnames[surname % colours.surnames.length]!;
@@ -198,10 +228,12 @@ export class MapPixels {
             const y = top + (height >> 1);
             const to = Math.round(x[p + 1]! * frame.sx) + frame.ox;
             const thick = this.thickness(frame);
-            if ((flag & kDivorced) !== 0 && this.isNear) this.dashes(frame, px + width, to, y, thick, colours.line, true);
+            if ((flag & kDivorced) !== 0 && this.isNear)
+                this.dashes(frame, px + width, to, y, thick, colours.line, true);
             else this.rect(frame, px + width, y, to, y + thick, colours.line);
         }
-        if (width < kEdged * frame.dpr) return this.rect(frame, px, top, px + width, top + height, isKin ? colours.kin : edge);
+        if (width < kEdged * frame.dpr)
+            return this.rect(frame, px, top, px + width, top + height, isKin ? colours.kin : edge);
         const border = Math.round((isKin ? 2.5 : 1.2) * frame.dpr);
         this.rect(frame, px, top, px + width, top + height, edge);
         this.rect(frame, px + border, top + border, px + width - border, top + height - border, fill);

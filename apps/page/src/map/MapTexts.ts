@@ -59,7 +59,15 @@ export class MapTexts {
         }
     }
 
-    private box(frame: Frame, colours: TextColours, p: number, left: number, top: number, width: number, height: number): void {
+    private box(
+        frame: Frame,
+        colours: TextColours,
+        p: number,
+        left: number,
+        top: number,
+        width: number,
+        height: number,
+    ): void {
         const { context } = this;
         const [first, second] = this.map.nameLines(p);
         const lines = [first || this.unknownName, second, this.yearsOf(p)].filter((line) => line !== "");
@@ -71,7 +79,9 @@ export class MapTexts {
         context.textAlign = "center";
         lines.slice(0, count).forEach((line, i) => {
             const isYears = i > 0 && i === lines.length - 1;
-            this.setFont(`${isYears ? 400 : 600} ${Math.round((isYears ? size - 1 : size) * frame.dpr)}px ${colours.font}`);
+            this.setFont(
+                `${isYears ? 400 : 600} ${Math.round((isYears ? size - 1 : size) * frame.dpr)}px ${colours.font}`,
+            );
             context.fillStyle = isYears ? colours.quiet : colours.text;
             context.fillText(this.fitting(line, room), left + width / 2, y);
             y += lineHeight;
@@ -107,7 +117,8 @@ export class MapTexts {
             const text = this.fitting(this.labelText(labels[4 * i + 2]!), 220 * frame.dpr);
             const half = context.measureText(text).width / 2 + 6 * frame.dpr;
             const box: [number, number, number, number] = [x - half, y - size, x + half, y + size];
-            if (box[0] < kYearRoom * frame.dpr || box[2] > frame.width || taken.some((other) => overlap(other, box))) continue;
+            if (box[0] < kYearRoom * frame.dpr || box[2] > frame.width || taken.some((other) => overlap(other, box)))
+                continue;
             taken.push(box);
             this.plate(colours, text, x, y, size);
         }

@@ -129,7 +129,11 @@ export class MapView {
         this.choose(person);
         this.takeKeys();
         const { left, top, right, bottom } = this.map.box(person);
-        const target: MapPlace = { x: (left + right) / 2, y: (top + bottom) / 2, k: Math.max(kReadable, this.camera.place.k) };
+        const target: MapPlace = {
+            x: (left + right) / 2,
+            y: (top + bottom) / 2,
+            k: Math.max(kReadable, this.camera.place.k),
+        };
         const start = performance.now();
         this.camera.fly(target, () => {
             this.draw();

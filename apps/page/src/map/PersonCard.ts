@@ -62,7 +62,9 @@ export class PersonCard {
                 ? `${label}: ${members.map((one) => this.actions.nameOf(one)).join(", ")}`
                 : `${label}: ${members.length}`,
         );
-        return [this.actions.nameOf(person), this.actions.yearsOf(person), ...named].filter((text) => text !== "").join(". ");
+        return [this.actions.nameOf(person), this.actions.yearsOf(person), ...named]
+            .filter((text) => text !== "")
+            .join(". ");
     }
 
     private groups({ parents, partners, children, siblings }: Kin): [string, readonly number[]][] {

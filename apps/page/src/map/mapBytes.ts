@@ -114,7 +114,7 @@ class Reader {
     }
 
     private find(): void {
-        for (let at = kHeader; at < this.bytes.length; ) {
+        for (let at = kHeader; at < this.bytes.length;) {
             require(at + 8 <= this.bytes.length, "section");
             const kind = kSections[this.words[at / 4]! - 1];
             const size = this.words[at / 4 + 1]!;

@@ -55,7 +55,8 @@ export function takeGestures(surface: HTMLElement, camera: MapCamera, actions: G
         (event) => {
             event.preventDefault();
             const { x, y } = placeOf(event);
-            const px = event.deltaMode === 1 ? event.deltaY * 16 : event.deltaMode === 2 ? event.deltaY * 400 : event.deltaY;
+            const px =
+                event.deltaMode === 1 ? event.deltaY * 16 : event.deltaMode === 2 ? event.deltaY * 400 : event.deltaY;
             camera.zoomAt(x, y, 2 ** (-px * (event.ctrlKey ? 0.02 : 0.002)));
         },
         { passive: false },

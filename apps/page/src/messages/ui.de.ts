@@ -54,7 +54,8 @@ export const uiGerman: UiMessages = {
         drawing: "Die Karte wird gezeichnet …",
         cut: (have, wanted) =>
             `Die Karte in dieser Seite endet nach ${have.toLocaleString("de")} von ${wanted.toLocaleString("de")} Bytes. Besorgen Sie die Seite noch einmal.`,
-        cutShort: "Diese Seite endet mitten in ihrer Karte. Sie wurde unterwegs abgeschnitten; besorgen Sie sie noch einmal.",
+        cutShort:
+            "Diese Seite endet mitten in ihrer Karte. Sie wurde unterwegs abgeschnitten; besorgen Sie sie noch einmal.",
         version: "Die Karte in dieser Seite ist von neuerer Art, als die Seite lesen kann.",
         damaged: "Die Karte in dieser Seite ist beschädigt und kann nicht gezeigt werden.",
     },
@@ -177,7 +178,15 @@ export const uiGerman: UiMessages = {
     details: {
         name: "Name",
         nickname: "genannt",
-        nameTypes: { birth: "Geburtsname", maiden: "Geburtsname", married: "Ehename", aka: "Auch genannt", immigrant: "Name nach Einwanderung", religious: "Ordensname", professional: "Künstlername" },
+        nameTypes: {
+            birth: "Geburtsname",
+            maiden: "Geburtsname",
+            married: "Ehename",
+            aka: "Auch genannt",
+            immigrant: "Name nach Einwanderung",
+            religious: "Ordensname",
+            professional: "Künstlername",
+        },
         notes: "Notizen",
         cause: "Ursache",
         age: "Alter",

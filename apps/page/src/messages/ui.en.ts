@@ -148,11 +148,7 @@ export const uiEnglish: UiMessages = {
     missingMother: "Unknown mother",
     missingOf: (what, child) => `${what} of ${child}`,
     hiddenCount: (n) =>
-        n === 0
-            ? "more relatives not shown"
-            : n === 1
-              ? "1 more relative not shown"
-              : `${n} more relatives not shown`,
+        n === 0 ? "more relatives not shown" : n === 1 ? "1 more relative not shown" : `${n} more relatives not shown`,
     severalBoxes: (n) => `stands in ${n} places of this picture`,
     nextBox: "Next place",
     focusNow: (name, boxes) => `${name} is now the focus. ${boxes} boxes are shown.`,
@@ -177,7 +173,15 @@ export const uiEnglish: UiMessages = {
     details: {
         name: "Name",
         nickname: "called",
-        nameTypes: { birth: "Birth name", maiden: "Birth name", married: "Married name", aka: "Also called", immigrant: "Name as immigrant", religious: "Religious name", professional: "Professional name" },
+        nameTypes: {
+            birth: "Birth name",
+            maiden: "Birth name",
+            married: "Married name",
+            aka: "Also called",
+            immigrant: "Name as immigrant",
+            religious: "Religious name",
+            professional: "Professional name",
+        },
         notes: "Notes",
         cause: "Cause",
         age: "Age",
@@ -216,7 +220,8 @@ export const uiEnglish: UiMessages = {
         layout: "This picture could not be laid out. Try fewer generations or relatives.",
         dismiss: "Dismiss",
     },
-    firstHint: "Click or tap a person to read about them, twice to show their family. Drag to move; turn the wheel or pinch to zoom.",
+    firstHint:
+        "Click or tap a person to read about them, twice to show their family. Drag to move; turn the wheel or pinch to zoom.",
     livingHidden: "The names and dates of living persons are left out.",
     firstOfFiles: (name) => `Of the files that were dropped, ${name} was opened.`,
     personCount: (n) => (n === 1 ? "1 person" : `${n.toLocaleString("en")} persons`),

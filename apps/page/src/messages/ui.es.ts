@@ -182,7 +182,15 @@ export const uiSpanish: UiMessages = {
     details: {
         name: "Nombre",
         nickname: "llamado",
-        nameTypes: { birth: "Nombre de nacimiento", maiden: "Nombre de nacimiento", married: "Nombre de casada", aka: "También", immigrant: "Nombre de inmigrante", religious: "Nombre religioso", professional: "Nombre profesional" },
+        nameTypes: {
+            birth: "Nombre de nacimiento",
+            maiden: "Nombre de nacimiento",
+            married: "Nombre de casada",
+            aka: "También",
+            immigrant: "Nombre de inmigrante",
+            religious: "Nombre religioso",
+            professional: "Nombre profesional",
+        },
         notes: "Notas",
         cause: "Causa",
         age: "Edad",

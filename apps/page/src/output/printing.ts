@@ -31,16 +31,12 @@ export class PrintSheet {
         svg.setAttribute("height", "100%");
         this.element.append(html("p", { dir: "auto" }, printed.title), svg);
         this.orientation = new CSSStyleSheet();
-        this.orientation.insertRule(
-            `@page { size: ${width > height ? "landscape" : "portrait"}; margin: 10mm; }`,
-        );
+        this.orientation.insertRule(`@page { size: ${width > height ? "landscape" : "portrait"}; margin: 10mm; }`);
         document.adoptedStyleSheets = [...document.adoptedStyleSheets, this.orientation];
     }
 
     private empty(): void {
         this.element.replaceChildren();
-        document.adoptedStyleSheets = document.adoptedStyleSheets.filter(
-            (sheet) => sheet !== this.orientation,
-        );
+        document.adoptedStyleSheets = document.adoptedStyleSheets.filter((sheet) => sheet !== this.orientation);
     }
 }

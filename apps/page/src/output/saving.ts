@@ -53,11 +53,7 @@ export interface Pixels {
 
 export async function pngOf(drawing: string): Promise<Pixels> {
     const { width, height } = drawingElement(drawing);
-    const most = Math.min(
-        kSharpness,
-        kMostSide / Math.max(width, height),
-        Math.sqrt(kMostPixels / (width * height)),
-    );
+    const most = Math.min(kSharpness, kMostSide / Math.max(width, height), Math.sqrt(kMostPixels / (width * height)));
     const canvas = html("canvas", {
         width: Math.max(1, Math.floor(width * most)),
         height: Math.max(1, Math.floor(height * most)),

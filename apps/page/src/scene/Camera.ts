@@ -147,10 +147,7 @@ export class Camera {
                 room(height - kCornerHeight) / (area.bottom - area.top),
             ),
         );
-        const { x, y } = this.centring(
-            { x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 },
-            k,
-        );
+        const { x, y } = this.centring({ x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 }, k);
         return { k, x: x - aside / 2, y: y - kCornerHeight / 2 };
     }
 
@@ -162,10 +159,7 @@ export class Camera {
         const { height } = this.size;
         const tall = (height - 2 * kFitMargin - kCornerHeight) / (area.bottom - area.top);
         if (tall < kReadable) return this.usingRoom(area, this.centring(middle, kUsualZoom));
-        const { k, x, y } = this.centring(
-            { x: middle.x, y: (area.top + area.bottom) / 2 },
-            Math.min(1, tall),
-        );
+        const { k, x, y } = this.centring({ x: middle.x, y: (area.top + area.bottom) / 2 }, Math.min(1, tall));
         return this.usingRoom(area, { k, x, y: y - kCornerHeight / 2 });
     }
 

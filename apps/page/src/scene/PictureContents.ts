@@ -101,11 +101,7 @@ export class PictureContents implements BoxContents {
             inside: this.wording.render?.(person, box) ?? null,
             photo: this.wording.portraitOf?.(person.id) ?? null,
             years: shortYears(person),
-            kinship: this.wording.kinshipInBoxes
-                ? this.kinshipKnown
-                    ? this.shortKinshipOf(person.id)
-                    : ""
-                : null,
+            kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
             hidden,
             further: box.furtherParents > 0 ? ui.furtherParents : "",
             caption: box.caption,
@@ -148,8 +144,7 @@ export class PictureContents implements BoxContents {
 export function shortYears(person: Person): string {
     const birth = person.birth?.year ? person.birth.shown : "";
     const death = person.death?.year ? person.death.shown : "";
-    if (birth && death)
-        return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
+    if (birth && death) return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
     if (death) return "\u2020 " + death;
     return [birth && "* " + birth, person.dead && "\u2020"].filter(Boolean).join("  ");
 }

@@ -101,8 +101,7 @@ export class Scene {
 
     // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
     redraw(): void {
-        for (const [box, element] of this.elements)
-            repaintBox(element, this.contents.lookOf(box), box);
+        for (const [box, element] of this.elements) repaintBox(element, this.contents.lookOf(box), box);
     }
 
     restyle(contents: BoxContents): void {
@@ -240,8 +239,7 @@ export class Scene {
     }
 
     private fadeNewcomers(before: Picture): void {
-        for (const [box, element] of this.elements)
-            if (!before.boxOfKey(box.key)) element.classList.add("late");
+        for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) element.classList.add("late");
         const lines = svg("g", {
             class: "lines later",
             "aria-hidden": "true",
@@ -280,10 +278,7 @@ export class Scene {
 
     private cameraMoved(placing: Placing): void {
         const { k, x, y } = placing;
-        this.world.setAttribute(
-            "transform",
-            `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`,
-        );
+        this.world.setAttribute("transform", `translate(${x.toFixed(2)} ${y.toFixed(2)}) scale(${k.toFixed(5)})`);
         if (this.picture) this.update();
         this.thickenLines();
         this.events.moved(placing);
@@ -295,8 +290,7 @@ export class Scene {
         if (!picture) return;
         const sight = this.camera.window();
         const needed = alsoWindow ? unionOf(sight, alsoWindow) : sight;
-        const isFar =
-            picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
+        const isFar = picture.boxes.length > kMostReadable && picture.boxesWithin(sight).length > kMostReadable;
         const far = this.drawn && this.drawn.right - this.drawn.left > 6 * (sight.right - sight.left);
         if (
             this.drawn &&
@@ -348,8 +342,7 @@ export class Scene {
         for (const box of wanted) if (!this.elements.has(box)) added.append(this.newElement(box));
         this.boxLayer.append(added);
         const focus = this.elements.get(picture.focusBox);
-        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(this.keyHolder))
-            this.boxLayer.append(focus);
+        if (focus && this.boxLayer.lastChild !== focus && !focus.contains(this.keyHolder)) this.boxLayer.append(focus);
     }
 
     private keepAlways(picture: Picture): void {
@@ -400,8 +393,7 @@ export class Scene {
         // click or the beginning of a drag.
         let pressed = false;
         surface.addEventListener("pointerdown", () => (pressed = true), { capture: true });
-        for (const end of ["pointerup", "pointercancel"])
-            addEventListener(end, () => (pressed = false), true);
+        for (const end of ["pointerup", "pointercancel"]) addEventListener(end, () => (pressed = false), true);
         surface.addEventListener("focusin", (event) => {
             const box = this.boxAt(event.target);
             if (box && box !== this.activeBox && !pressed) this.activate(box);

@@ -73,7 +73,9 @@ function appendText(group: SVGGElement, look: BoxLook, { x, y }: Box, arc: BoxAr
     const shown = [...name.lines, ...(years ? [years] : [])];
     const pitch = Math.max(12, name.size + 1);
     const top = -((shown.length - 1) * pitch) / 2 + 4;
-    const holder = svg("g", { transform: `translate(${(cx - x).toFixed(1)} ${(cy - y).toFixed(1)}) rotate(${turn.toFixed(1)})` });
+    const holder = svg("g", {
+        transform: `translate(${(cx - x).toFixed(1)} ${(cy - y).toFixed(1)}) rotate(${turn.toFixed(1)})`,
+    });
     shown.forEach((line, i) =>
         holder.append(
             svg(

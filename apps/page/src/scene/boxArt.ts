@@ -158,7 +158,12 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = right - left;
     const lower = lowerLines(look, room);
     const nameHeight = nodeHeight - 8 - lower.length * 14;
-    const name = look.texts.fitName(look.name, { width: room, height: nameHeight, gap: 2, lines: lower.length > 1 ? 1 : 2 });
+    const name = look.texts.fitName(look.name, {
+        width: room,
+        height: nameHeight,
+        gap: 2,
+        lines: lower.length > 1 ? 1 : 2,
+    });
     const pitch = name.size + 2;
     const height = name.lines.length * pitch + lower.length * 14;
     const firstY = (nodeHeight - height) / 2 + name.size - 1;
@@ -167,9 +172,7 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
 
     const figureHeight = look.photo ? nodeHeight - 12 : 22;
     box.append(figure(look, look.photo ? 28 : 21, (nodeHeight - figureHeight) / 2, figureHeight));
-    name.lines.forEach((line, i) =>
-        box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)),
-    );
+    name.lines.forEach((line, i) => box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)));
     lower.forEach((line, i) => {
         const y = firstY + name.lines.length * pitch + i * 14;
         box.append(
@@ -293,7 +296,13 @@ function appendCaption(box: SVGGElement, caption: string, texts: Texts, { width,
     const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${height - 2})` });
     plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
     lines.forEach((line, i) =>
-        plate.append(svg("text", { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" }, texts.fitLine(line, kKinSize, room - 12, true))),
+        plate.append(
+            svg(
+                "text",
+                { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" },
+                texts.fitLine(line, kKinSize, room - 12, true),
+            ),
+        ),
     );
     box.append(plate);
 }

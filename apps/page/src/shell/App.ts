@@ -151,7 +151,11 @@ export class App implements ChromeActions {
     }
 
     // isSame: the file that is shown already, read in another way.
-    private show({ file, name, title, photographs }: OpenedFile, embedded: EmbeddedFamily | null, isSame = false): void {
+    private show(
+        { file, name, title, photographs }: OpenedFile,
+        embedded: EmbeddedFamily | null,
+        isSame = false,
+    ): void {
         const start = performance.now();
         // Of an empty page only a link as it was followed is meant for the first file; what we wrote named
         // persons of another.
@@ -267,10 +271,8 @@ export class App implements ChromeActions {
     }
 
     private listen(): void {
-        const on = <Name extends keyof OlvaneTreeEvents>(
-            name: Name,
-            act: (event: OlvaneTreeEvents[Name]) => void,
-        ) => this.tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
+        const on = <Name extends keyof OlvaneTreeEvents>(name: Name, act: (event: OlvaneTreeEvents[Name]) => void) =>
+            this.tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
         on("select", () => this.hideFirstHint());
         on("focuschange", ({ detail }) => {
             if (detail.byUser) this.hideFirstHint();
@@ -520,7 +522,11 @@ export class App implements ChromeActions {
         if (document.querySelector("dialog[open]") || event.composedPath().includes(this.tree)) return;
         const target = event.target as Element;
         if (target.matches("input:not([type=checkbox]), select, textarea")) return;
-        if (this.maps.isShown ? event.key === "/" && this.outerKey("search") : this.tree.family && this.tree.press(event))
+        if (
+            this.maps.isShown
+                ? event.key === "/" && this.outerKey("search")
+                : this.tree.family && this.tree.press(event)
+        )
             event.preventDefault();
     }
 
@@ -633,9 +639,7 @@ export class App implements ChromeActions {
     private languageChooser(): HTMLElement {
         const select = html("select", { id: "language", "aria-label": this.ui.languageLabel });
         for (const { language, languageName } of uiLanguages) {
-            select.append(
-                html("option", { value: language, selected: language === this.ui.language }, languageName),
-            );
+            select.append(html("option", { value: language, selected: language === this.ui.language }, languageName));
         }
         select.addEventListener("change", () => this.setLanguage(select.value));
         return select;

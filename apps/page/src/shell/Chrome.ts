@@ -118,9 +118,7 @@ export class Chrome {
         );
         this.keys = this.keyDialog();
         this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
-        this.diagnosticsButton = iconButton("diagnostics-button", "warning", "", () =>
-            this.openDiagnostics(),
-        );
+        this.diagnosticsButton = iconButton("diagnostics-button", "warning", "", () => this.openDiagnostics());
         this.diagnosticsButton.hidden = true;
         this.views = new ViewChooser(ui, actions);
         this.unknownParents = this.checkbox("unknown-parents", (checked) => actions.setUnknownParents(checked));
@@ -135,7 +133,12 @@ export class Chrome {
             html("span", {}, ui.keep.label, html("small", {}, ui.keep.hint)),
         );
         this.photos = this.checkbox("photos-in-boxes", (checked) => actions.setPhotos(checked));
-        this.photosRow = html("label", { class: "switch", hidden: true }, this.photos, html("span", {}, ui.photosInBoxes));
+        this.photosRow = html(
+            "label",
+            { class: "switch", hidden: true },
+            this.photos,
+            html("span", {}, ui.photosInBoxes),
+        );
         this.encodingRow = html("label", { class: "row" }, html("span", {}, ui.encoding), this.encoding);
         this.options = new Popover(
             iconButton("options-button", "options", ui.options, () => {}),
@@ -197,7 +200,9 @@ export class Chrome {
     // While the map is shown, no view of the tree is.
     showMap(shown: boolean): void {
         this.views.showMap(shown);
-        if (shown) for (const view of ["family", "pedigree"] as const) this.buttons[view].setAttribute("aria-pressed", "false");
+        if (shown)
+            for (const view of ["family", "pedigree"] as const)
+                this.buttons[view].setAttribute("aria-pressed", "false");
     }
 
     showPanelState(open: boolean): void {
@@ -256,7 +261,11 @@ export class Chrome {
     private personButton(id: number): HTMLElement | null {
         const person = this.actions.person(id);
         if (!person) return null;
-        const button = html("button", { type: "button", class: "plain to-person", "data-person-id": id, dir: "auto" }, this.actions.nameOf(person));
+        const button = html(
+            "button",
+            { type: "button", class: "plain to-person", "data-person-id": id, dir: "auto" },
+            this.actions.nameOf(person),
+        );
         onClick(button, () => {
             this.diagnostics.close();
             this.actions.choose(person);
@@ -293,9 +302,7 @@ export class Chrome {
         for (const name of kRelativeNames) {
             const input = this.checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
             this.switches.set(name, input);
-            relatives.append(
-                html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])),
-            );
+            relatives.append(html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])));
         }
         const kinship = this.checkbox("kinship-in-boxes", (checked) => actions.setKinshipInBoxes(checked));
         kinship.checked = looks.kinshipInBoxes;
@@ -319,9 +326,7 @@ export class Chrome {
                 html("legend", {}, ui.look),
                 html("label", { class: "switch" }, kinship, html("span", {}, ui.kinshipInBoxes)),
                 this.photosRow,
-                this.choice("theme", ui.theme, themes, looks.theme, (theme) =>
-                    actions.setTheme(theme as ThemeChoice),
-                ),
+                this.choice("theme", ui.theme, themes, looks.theme, (theme) => actions.setTheme(theme as ThemeChoice)),
                 this.choice("language", ui.languageLabel, languages, ui.language, (language) =>
                     actions.setLanguage(language),
                 ),
@@ -394,8 +399,7 @@ export class Chrome {
         action: (value: string) => void,
     ): HTMLElement {
         const select = html("select", { id });
-        for (const [value, text] of choices)
-            select.append(html("option", { value, selected: value === chosen }, text));
+        for (const [value, text] of choices) select.append(html("option", { value, selected: value === chosen }, text));
         select.addEventListener("change", () => action(select.value));
         return html("label", { class: "row" }, html("span", {}, label), select);
     }

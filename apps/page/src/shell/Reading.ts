@@ -14,7 +14,11 @@ export class Reading {
     /** Shows the progress of another file; the signal is set off when the reader of the page ends it. */
     begin(name: string, ui: UiMessages): AbortSignal {
         this.controller = new AbortController();
-        const text = html("span", { id: "reading-name", role: "status" }, ui.welcome.reading("\u2068" + name + "\u2069"));
+        const text = html(
+            "span",
+            { id: "reading-name", role: "status" },
+            ui.welcome.reading("\u2068" + name + "\u2069"),
+        );
         const cancel = html("button", { id: "reading-cancel", type: "button", class: "plain" }, ui.cancel);
         onClick(cancel, () => this.controller.abort(new CancelledError()));
         this.bar.removeAttribute("value");

@@ -110,8 +110,7 @@ export class SearchBox {
             option.setAttribute("aria-selected", String(isCurrent));
             if (isCurrent) option.scrollIntoView({ block: "nearest" });
         });
-        if (index >= 0 && this.found.length > 0)
-            this.input.setAttribute("aria-activedescendant", "found-" + index);
+        if (index >= 0 && this.found.length > 0) this.input.setAttribute("aria-activedescendant", "found-" + index);
         else this.input.removeAttribute("aria-activedescendant");
     }
 

@@ -52,11 +52,8 @@ export class ViewChooser {
         onClick(this.map, () => actions.setMap());
         views.append(this.map);
         this.direction = html("select", { id: "direction" });
-        for (const name of kDirections)
-            this.direction.append(html("option", { value: name }, ui.directions[name]));
-        this.direction.addEventListener("change", () =>
-            actions.setDirection(this.direction.value as ChartDirection),
-        );
+        for (const name of kDirections) this.direction.append(html("option", { value: name }, ui.directions[name]));
+        this.direction.addEventListener("change", () => actions.setDirection(this.direction.value as ChartDirection));
         this.directionRow = html("label", { class: "row" }, html("span", {}, ui.direction), this.direction);
         for (const which of ["up", "down"] as const)
             this.depths.set(which, new Depth(which, ui, (n) => actions.setDepth(which, n)));
@@ -116,13 +113,7 @@ class Depth {
         this.slider = html("input", { id: "depth-" + which, type: "range", min: 1, max: kMostCounted + 1, step: 1 });
         this.slider.addEventListener("change", () => change(this.generations));
         this.slider.addEventListener("input", () => this.name(this.generations));
-        this.row = html(
-            "label",
-            { class: "row depth" },
-            html("span", {}, ui.depth[which]),
-            this.slider,
-            this.value,
-        );
+        this.row = html("label", { class: "row depth" }, html("span", {}, ui.depth[which]), this.slider, this.value);
     }
 
     show(isUsed: boolean, generations: number): void {

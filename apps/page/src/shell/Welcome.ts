@@ -10,11 +10,7 @@ import { icon } from "../base/icons";
 export class Welcome {
     readonly element: HTMLElement;
 
-    constructor(
-        ui: UiMessages,
-        choose: () => void,
-        languageChooser: HTMLElement,
-    ) {
+    constructor(ui: UiMessages, choose: () => void, languageChooser: HTMLElement) {
         const { welcome } = ui;
         const button = html("button", { id: "choose-file", type: "button", class: "main" }, welcome.choose);
         onClick(button, choose);

@@ -18,8 +18,7 @@ export class Theme {
     constructor(private readonly viewer: HTMLElement) {
         const known = recall("theme");
         this.choice = kThemeChoices.find((choice) => choice === known) ?? "auto";
-        for (const query of [kDark, kContrast])
-            matchMedia(query).addEventListener("change", () => this.wear());
+        for (const query of [kDark, kContrast]) matchMedia(query).addEventListener("change", () => this.wear());
         this.wear();
     }
 

@@ -31,9 +31,7 @@ export class Corner {
     showWays(ways: readonly { readonly words: string }[]): void {
         this.ways.hidden = ways.length === 0;
         this.ways.replaceChildren(
-            ...ways.map(({ words }, index) =>
-                html("li", {}, waySign(index), html("span", {}, words)),
-            ),
+            ...ways.map(({ words }, index) => html("li", {}, waySign(index), html("span", {}, words))),
         );
     }
 

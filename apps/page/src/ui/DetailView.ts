@@ -112,7 +112,11 @@ export class DetailView {
     private photograph(url: string, medium: MediaFile): HTMLElement {
         const title = titleOf(medium);
         const picture = html("img", { src: url, alt: title, loading: "lazy", decoding: "async" });
-        const button = html("button", { type: "button", class: "photograph", "aria-label": this.words.enlarge(title) }, picture);
+        const button = html(
+            "button",
+            { type: "button", class: "photograph", "aria-label": this.words.enlarge(title) },
+            picture,
+        );
         onClick(button, () => this.enlarge(button, url, title));
         return html("figure", {}, button, html("figcaption", { dir: "auto" }, title));
     }

@@ -48,9 +48,7 @@ export class Notices {
     }
 
     private add(className: string, role: string, text: string, details: readonly string[]): HTMLElement {
-        const lines = details
-            .filter((detail) => detail !== "")
-            .map((detail) => html("span", { dir: "auto" }, detail));
+        const lines = details.filter((detail) => detail !== "").map((detail) => html("span", { dir: "auto" }, detail));
         const dismiss = html(
             "button",
             { type: "button", class: "icon-button", "aria-label": this.dismissLabel },

@@ -34,8 +34,7 @@ export class Overview {
             this.go(event, 260);
         });
         this.drawing.addEventListener("pointermove", (event) => held && this.go(event, 0));
-        for (const end of ["pointerup", "pointercancel"])
-            this.drawing.addEventListener(end, () => (held = false));
+        for (const end of ["pointerup", "pointercancel"]) this.drawing.addEventListener(end, () => (held = false));
     }
 
     show(picture: Picture): void {

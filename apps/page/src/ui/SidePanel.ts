@@ -76,8 +76,7 @@ export class SidePanel {
             this.handle,
             this.body,
         );
-        for (const part of [this.element, this.body])
-            part.addEventListener("scroll", () => (this.isScrolled = true));
+        for (const part of [this.element, this.body]) part.addEventListener("scroll", () => (this.isScrolled = true));
         onClick(this.handle, () => this.draw(!this.element.classList.contains("drawn")));
     }
 
@@ -96,9 +95,7 @@ export class SidePanel {
             this.facts(known),
             this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
             this.couples(person, family),
-            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) =>
-                this.link(family.person(id)),
-            ),
+            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) => this.link(family.person(id))),
             this.further(known),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));
@@ -202,14 +199,7 @@ export class SidePanel {
     }
 
     private appendFact(list: HTMLElement, label: string, parts: readonly HTMLElement[]): void {
-        list.append(
-            html(
-                "div",
-                {},
-                html("dt", {}, label),
-                html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"])),
-            ),
-        );
+        list.append(html("div", {}, html("dt", {}, label), html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"]))));
     }
 
     private parents(person: Person, family: OpenFamily): HTMLElement[] {
@@ -261,9 +251,7 @@ export class SidePanel {
         return html(
             "div",
             { class: "couple" },
-            partner
-                ? this.link(family.person(partner))
-                : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
+            partner ? this.link(family.person(partner)) : html("p", { class: "quiet" }, this.ui.panel.unknownPartner),
             facts.childElementCount > 0 && facts,
             further.length > 0 && html("div", { class: "further" }, ...further),
             couple.children.length > 0 && children,
@@ -275,15 +263,12 @@ export class SidePanel {
         things: readonly Thing[],
         linkOf: (thing: Thing) => HTMLElement,
     ): HTMLElement | null {
-        return things.length > 0
-            ? html("section", {}, html("h3", {}, title), this.list(things, linkOf))
-            : null;
+        return things.length > 0 ? html("section", {}, html("h3", {}, title), this.list(things, linkOf)) : null;
     }
 
     private list<Thing>(things: readonly Thing[], linkOf: (thing: Thing) => HTMLElement): HTMLElement {
         const list = html("ul", {});
-        const add = (some: readonly Thing[]) =>
-            list.append(...some.map((thing) => html("li", {}, linkOf(thing))));
+        const add = (some: readonly Thing[]) => list.append(...some.map((thing) => html("li", {}, linkOf(thing))));
         const isLong = things.length > kMostListed + 1;
         add(isLong ? things.slice(0, kMostListed) : things);
         if (!isLong) return list;
@@ -305,11 +290,7 @@ export class SidePanel {
             { class: "relative", href: this.events.addressOf(person.id), "data-person-id": person.id },
             silhouette(person.sex),
             html("bdi", { class: "name" }, nameOf(person, this.messages)),
-            html(
-                "span",
-                { class: "years" },
-                [yearsOf(person, this.messages), note].filter(Boolean).join(", "),
-            ),
+            html("span", { class: "years" }, [yearsOf(person, this.messages), note].filter(Boolean).join(", ")),
         );
         onClick(link, (event) => {
             if (event.ctrlKey || event.metaKey || event.shiftKey) return;

@@ -53,8 +53,7 @@ const kWithAlt: Readonly<Record<string, (actions: KeyActions) => unknown>> = {
 
 // Whether the key meant something. Other keys with Ctrl, Alt or the like are the browser's.
 export function pictureKey(event: KeyboardEvent, inPicture: boolean, actions: KeyActions): boolean {
-    if (event.altKey && !event.ctrlKey && !event.metaKey && !event.shiftKey)
-        return run(kWithAlt[event.key], actions);
+    if (event.altKey && !event.ctrlKey && !event.metaKey && !event.shiftKey) return run(kWithAlt[event.key], actions);
     if (event.ctrlKey || event.altKey || event.metaKey) return false;
     const arrow = kArrows[event.key];
     if (arrow && inPicture) {

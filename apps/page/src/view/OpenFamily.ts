@@ -81,8 +81,7 @@ export class OpenFamily {
     siblingsOf(person: Person): number[] {
         const siblings = new Set<number>();
         for (const parent of [person.father, person.mother]) {
-            for (const child of this.person(parent)?.children ?? [])
-                if (child !== person.id) siblings.add(child);
+            for (const child of this.person(parent)?.children ?? []) if (child !== person.id) siblings.add(child);
         }
         return [...siblings];
     }
@@ -97,15 +96,10 @@ export class OpenFamily {
         const parents = [person.father, person.mother]
             .map((id) => this.person(id))
             .filter((parent) => parent !== undefined);
-        const grandparents = parents.reduce(
-            (n, parent) => n + (parent.father ? 1 : 0) + (parent.mother ? 1 : 0),
-            0,
-        );
+        const grandparents = parents.reduce((n, parent) => n + (parent.father ? 1 : 0) + (parent.mother ? 1 : 0), 0);
         const siblings = Math.min(6, parents[0]?.children.length ?? 0);
         const children = Math.min(6, person.children.length);
-        const grandchildren = person.children.some((child) => (this.person(child)?.children.length ?? 0) > 0)
-            ? 2
-            : 0;
+        const grandchildren = person.children.some((child) => (this.person(child)?.children.length ?? 0) > 0) ? 2 : 0;
         const named = person.name === "" ? -10 : 0;
         return (
             named +

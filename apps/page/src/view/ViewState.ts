@@ -83,16 +83,25 @@ export function optionsOf(state: ViewState, language: PictureOptions["language"]
 }
 
 function shownBits(state: ViewState): number {
-    return kRelativeNames.reduce(
-        (bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]),
-        0,
-    );
+    return kRelativeNames.reduce((bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]), 0);
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {
-    const same = (["focus", "view", "generations", "up", "down", "direction", "to", "unknownParents", "photos", "parentFamily", "parentsOf"] as const).every(
-        (name) => a[name] === b[name],
-    );
+    const same = (
+        [
+            "focus",
+            "view",
+            "generations",
+            "up",
+            "down",
+            "direction",
+            "to",
+            "unknownParents",
+            "photos",
+            "parentFamily",
+            "parentsOf",
+        ] as const
+    ).every((name) => a[name] === b[name]);
     return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
 }
 
@@ -118,7 +127,19 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
 
 // What "hide" names beside the groups of relatives.
 const kUnknownParents = "unknownParents";
-const kParts = ["person", "number", "view", "generations", "up", "down", "direction", "to", "photos", "hide", "parents"];
+const kParts = [
+    "person",
+    "number",
+    "view",
+    "generations",
+    "up",
+    "down",
+    "direction",
+    "to",
+    "photos",
+    "hide",
+    "parents",
+];
 
 // Whatever an address does not name, or names wrongly, is as in the state that it is read into.
 export function readAddress(address: string, persons: readonly Person[], usual: ViewState): ViewState {

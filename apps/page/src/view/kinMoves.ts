@@ -11,18 +11,11 @@ export type Direction = "up" | "down" | "left" | "right";
 
 const kStraying = 2.2; // how much worse a step aside is than one ahead
 
-export function boxTowards(
-    from: Box,
-    direction: Direction,
-    picture: Picture,
-    family: OpenFamily,
-): Box | null {
+export function boxTowards(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box | null {
     const ahead = (box: Box) => box !== from && distanceAhead(from, box, direction) > 0;
     const kin = kinBoxes(from, direction, picture, family).filter(ahead);
     const others = picture.boxes.filter(ahead);
-    return (
-        nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture))
-    );
+    return nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture));
 }
 
 // Where parents lie, seen from their children: above in most charts, at the right in a pedigree.
@@ -46,15 +39,9 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
     const person = family.person(from.person);
     if (!person) return [];
     const kin =
-        direction === toParents
-            ? [person.father, person.mother]
-            : direction === toChildren
-              ? person.children
-              : [];
+        direction === toParents ? [person.father, person.mother] : direction === toChildren ? person.children : [];
     const missing =
-        direction === toParents
-            ? picture.boxes.filter((box) => box.child === person.id && person.id > 0)
-            : [];
+        direction === toParents ? picture.boxes.filter((box) => box.child === person.id && person.id > 0) : [];
     return [...kin.flatMap((id) => picture.boxesOf(id)), ...missing];
 }
 
@@ -63,9 +50,7 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
 function inLine(from: Box, direction: Direction, boxes: readonly Box[], picture: Picture): Box[] {
     const alongGeneration = !waysOf(picture).includes(direction);
     const slope = alongGeneration ? 0.2 : 1.8;
-    return boxes.filter(
-        (box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope,
-    );
+    return boxes.filter((box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope);
 }
 
 function nearest(from: Box, direction: Direction, boxes: readonly Box[]): Box | null {
