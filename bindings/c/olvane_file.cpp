@@ -275,7 +275,7 @@ olvane_status opened(olvane_file** file, olvane_result** failure, std::uint32_t 
     return answered(failure, [&] {
         if ((flags & ~OLVANE_READ_FACTS) != 0)
             refuseOption("flags", std::to_string(flags), "OLVANE_READ_FACTS");
-        *file = new olvane_file(read(readOptions(flags)));
+        *file = std::make_unique<olvane_file>(read(readOptions(flags))).release();
     });
 }
 
