@@ -10,7 +10,7 @@
 
 namespace olvane::kin {
 
-// Languages that words come in. docs of the library say how to add one.
+// Languages that words come in. docs/guide/languages.md says how to add one.
 enum class Language : std::uint8_t { english, german, spanish };
 
 constexpr std::array<Language, 3> kLanguages{Language::english, Language::german, Language::spanish};
