@@ -9,7 +9,7 @@ import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { readPicture } from "./picture.mjs";
-import { drawingNumbers, pictureNumbers } from "./pictureOptions.mjs";
+import { drawingNumbers, factBits, pictureNumbers } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { searchWith } from "./search.mjs";
@@ -136,6 +136,15 @@ export class GedcomFile {
 
     factsOfFamily(id) {
         return this.#answer("gedcom_family_facts", id).map(factFrom);
+    }
+
+    labelOfPerson(id, show = []) {
+        const [birth, death, details] = this.#answer("gedcom_person_label", id, factBits(show));
+        return { birth, death, details };
+    }
+
+    labelOfFamily(id, show = []) {
+        return this.#answer("gedcom_family_label", id, factBits(show));
     }
 
     search(text, limit = Infinity) {

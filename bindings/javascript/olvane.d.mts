@@ -213,6 +213,18 @@ export interface PictureOptions {
 
 export type DrawingTheme = "light" | "dark" | "print";
 
+/** What boxes and lines say beside names and years: dates as written, places, the first occupation, the year of a marriage. */
+export type ShownFact = "dates" | "places" | "occupation" | "marriage";
+
+/** What the box of a person says beside the name. A text is empty where nothing is known. */
+export interface PersonLabel {
+    /** A year, or the date as the file writes it. */
+    readonly birth: string;
+    readonly death: string;
+    /** Further lines: the places of birth and death, an occupation. */
+    readonly details: readonly string[];
+}
+
 /** How a picture is drawn as SVG. */
 export interface DrawingOptions {
     /** light if not given. */
@@ -220,7 +232,7 @@ export interface DrawingOptions {
     /** The form of the boxes; usual is what suits the view: wide ones where generations stand side by side. */
     readonly boxes?: "usual" | "tall" | "wide" | undefined;
     /** What boxes and lines say beside names and years. */
-    readonly show?: Iterable<"dates" | "places" | "occupation" | "marriage"> | undefined;
+    readonly show?: Iterable<ShownFact> | undefined;
     /** Stands above the picture. Empty for none: the picture is then called after its view and focus. */
     readonly title?: string | undefined;
 }
@@ -594,6 +606,10 @@ export class GedcomFile {
     /** Everything that the file states of a person, in its order. */
     factsOfPerson(id: number): readonly Fact[];
     factsOfFamily(id: number): readonly Fact[];
+    /** What drawings with these facts say in the box of a person; GedcomError for nobody. */
+    labelOfPerson(id: number, show?: Iterable<ShownFact>): PersonLabel;
+    /** What they say at the marriage line of a family; empty for nothing. */
+    labelOfFamily(id: number, show?: Iterable<ShownFact>): string;
     /**
      * Whom a text may mean, the best first. The words of the text stand in the record in any order: whole, as a beginning or,
      * from three letters on, from the middle; where nobody is found so, with one letter wrong, missing, too many or

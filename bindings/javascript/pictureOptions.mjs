@@ -92,6 +92,11 @@ const THEMES = ["light", "dark", "print"];
 const BOXES = ["usual", "tall", "wide"];
 const FACTS = ["dates", "places", "occupation", "marriage"];
 
+/** Facts beside names and years, as bits. */
+export function factBits(show) {
+    return [...show].reduce((bits, fact) => bits | (1 << wordNumber("show", fact, FACTS)), 0);
+}
+
 /** What a caller asks of a drawing, as the module's numbers. */
 export function drawingNumbers({ theme = "light", boxes = "usual", show = [], title = "", ...rest }) {
     const unknown = Object.keys(rest)[0];
@@ -99,7 +104,7 @@ export function drawingNumbers({ theme = "light", boxes = "usual", show = [], ti
     return {
         theme: wordNumber("theme", theme, THEMES),
         boxes: wordNumber("boxes", boxes, BOXES),
-        facts: [...show].reduce((bits, fact) => bits | (1 << wordNumber("show", fact, FACTS)), 0),
+        facts: factBits(show),
         title: String(title),
     };
 }

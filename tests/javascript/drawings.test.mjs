@@ -116,6 +116,18 @@ describe("what the module draws", () => {
         file.close();
     });
 
+    test("is what labels state beside the names", async () => {
+        const file = await fileOf(kSample);
+        assert.deepEqual(file.labelOfPerson(1), { birth: "1809", death: "1882", details: [] });
+        assert.equal(file.labelOfPerson(1, ["dates"]).birth, "12 FEB 1809");
+        const family = file.persons[0].coupleFamilies[0];
+        assert.equal(file.labelOfFamily(family), "");
+        assert.equal(file.labelOfFamily(family, ["marriage"]), file.families[family - 1].marriage.shown);
+        assert.throws(() => file.labelOfPerson(99999));
+        assert.throws(() => file.labelOfPerson(1, ["hats"]), /show is "hats"/);
+        file.close();
+    });
+
     test("is refused by the name of a wrong option, and for nobody", async () => {
         const file = await fileOf(kSample);
         assert.throws(() => file.svg(1, {}, { theme: "blue" }), /theme is "blue", and takes one of light, dark, print/);

@@ -1,19 +1,21 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A picture of an open GEDCOM file as SVG, the same bytes that the command draws.
+// A picture of an open GEDCOM file as SVG, the same bytes that the command draws, and what its boxes and lines say.
 
 #include <array>
 #include <cstddef>
 #include <exception>
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Views.h>
 #include <olvane/draw/SvgDrawing.h>
 #include <olvane/source/GedcomLabels.h>
 
+#include "JsonText.h"
 #include "OpenFile.h"
 #include "PictureRequest.h"
 
@@ -45,6 +47,18 @@ draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, un
     content.familyLabelOf = [labels](std::uint32_t number) { return labels.ofFamily(number); };
     content.countsHidden = true;
     return content;
+}
+
+std::string labelText(const kin::PersonLabel& label) {
+    JsonText json;
+    json.begin();
+    json.string(label.birth);
+    json.string(label.death);
+    json.begin();
+    for (const std::string& detail : label.details) json.string(detail);
+    json.end();
+    json.end();
+    return std::move(json).take();
 }
 
 // boxes: 0 for what suits the view, 1 for tall ones, 2 for wide ones.
@@ -84,4 +98,21 @@ const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int box
         js::lastText = error.what();
     }
     return nullptr;
+}
+
+// Birth, death and further lines of a person's box; facts as for gedcom_svg.
+OLVANE_EXPORT("gedcom_person_label")
+const char* gedcomPersonLabel(const js::OpenFile* file, std::uint32_t id, unsigned facts) {
+    return js::textOrRefusal(
+        [&] { return js::labelText(gedcom::GedcomLabels(file->data, js::factsOf(facts)).ofPerson(id)); });
+}
+
+// What stands at a marriage line, as a JSON text.
+OLVANE_EXPORT("gedcom_family_label")
+const char* gedcomFamilyLabel(const js::OpenFile* file, std::uint32_t number, unsigned facts) {
+    return js::textOrRefusal([&] {
+        js::JsonText json;
+        json.string(gedcom::GedcomLabels(file->data, js::factsOf(facts)).ofFamily(number));
+        return std::move(json).take();
+    });
 }

@@ -87,6 +87,28 @@ describe("element", () => {
         await end();
     });
 
+    test("an attribute has boxes and lines say more, and no more without it", async () => {
+        files.set(
+            "/facts.html",
+            '<!doctype html><olvane-tree src="family.ged" focus="I1" show="dates,marriage" style="height: 500px"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',
+        );
+        const { page, end } = await open("/facts.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const years = () => page.locator("olvane-tree .box.focus .years").allTextContents();
+        assert.deepEqual(await years(), ["* 12 FEB 1809", "\u2020 19 APR 1882"]);
+        const shown = (change) =>
+            page.evaluate((change) => {
+                const tree = document.querySelector("olvane-tree");
+                if (change === null) tree.removeAttribute("show");
+                else tree.setAttribute("show", change);
+                return [...tree.state.show];
+            }, change);
+        assert.deepEqual(await shown("occupation, hats"), ["occupation"]);
+        assert.deepEqual(await shown(null), []);
+        assert.deepEqual(await years(), ["1809\u20131882"]);
+        await end();
+    });
+
     test("ten of them on one page know nothing of each other", async () => {
         const trees = Array.from(
             { length: 10 },

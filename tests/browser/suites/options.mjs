@@ -6,7 +6,7 @@
 import assert from "node:assert/strict";
 import { describe, test } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
-import { gedcom } from "../support/families.mjs";
+import { gedcom, kFactFamily } from "../support/families.mjs";
 
 // Sister Susan; Henry Parker, husband of sister Marianne; their brother's child does not live in this file, so the
 // nieces are Caroline's daughters; uncle John; cousin Hensleigh; great-grandfather Robert; a son's wife; a grandson.
@@ -57,6 +57,64 @@ describe("options", kTwoAtOnce, () => {
         await visit.page.reload();
         await visit.untilFamily();
         assert.equal(await unknown(), 0);
+        await visit.end();
+    });
+
+    test("boxes and lines say more where it is asked for, and a link keeps that", async () => {
+        const visit = await visitFamily(kFactFamily, { focus: 1 });
+        const linesOf = (person) =>
+            visit.page
+                .locator(`#tree [data-xref="${person}"] .years`)
+                .evaluateAll((all) => all.map((line) => line.textContent));
+        const marriages = () => visit.page.locator("#tree .marriage-label").allTextContents();
+        const heightOf = (person) =>
+            visit.page
+                .locator(`#tree [data-xref="${person}"] .frame`)
+                .evaluate((frame) => Number(frame.getAttribute("height")));
+        assert.deepEqual(await linesOf("I1"), ["1809\u20131882"]);
+        assert.deepEqual(await marriages(), []);
+        const usual = await heightOf("I1");
+        await visit.click("#options-button");
+        await visit.click("#fact-dates");
+        assert.deepEqual(await linesOf("I1"), ["* 12 FEB 1809", "\u2020 19 APR 1882"]);
+        await visit.click("#fact-places");
+        assert.deepEqual((await linesOf("I1")).slice(2), ["* Bath", "\u2020 Hove"]);
+        await visit.click("#fact-occupation");
+        assert.deepEqual((await linesOf("I1")).slice(4), ["Baker"]);
+        assert.deepEqual(await linesOf("I2"), [], "of whom nothing is known");
+        assert.equal((await heightOf("I1")) - usual, 4 * 14);
+        await visit.click("#fact-marriage");
+        assert.deepEqual(await marriages(), ["1839"]);
+        assert.match(await visit.label("I1"), /\* 12 FEB 1809, \u2020 19 APR 1882, \* Bath, \u2020 Hove, Baker/);
+        assert.match(await visit.hash(), /show=dates,places,occupation,marriage/);
+        await photograph(visit, "facts");
+        await visit.page.reload();
+        await visit.untilFamily();
+        assert.equal((await linesOf("I1")).length, 5);
+        assert.deepEqual(await marriages(), ["1839"]);
+        await visit.click("#options-button");
+        assert.ok(await visit.page.isChecked("#fact-dates"));
+        for (const fact of ["dates", "places", "occupation", "marriage"]) await visit.click(`#fact-${fact}`);
+        assert.deepEqual(await linesOf("I1"), ["1809\u20131882"]);
+        assert.equal(await heightOf("I1"), usual);
+        assert.ok(!(await visit.hash()).includes("show="));
+        await visit.end();
+    });
+
+    test("generations are packed tighter where a chart can be, and a link keeps that", async () => {
+        const visit = await visitDarwins("#person=I5&view=descendants&down=3");
+        await visit.fit();
+        const loose = await visit.places();
+        await visit.click("#views-button");
+        await visit.click("#compact");
+        assert.match(await visit.hash(), /compact=yes/);
+        await visit.page.keyboard.press("Escape");
+        await visit.fit();
+        assert.notDeepEqual(await visit.places(), loose);
+        await visit.page.goto((await visit.page.url()).replace(/#.*/, "#person=I5&view=fan&compact=yes"));
+        await visit.untilFamily();
+        await visit.click("#views-button");
+        assert.ok(!(await visit.page.isVisible("#compact")), "a fan cannot be");
         await visit.end();
     });
 

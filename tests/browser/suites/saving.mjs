@@ -3,10 +3,12 @@
 
 import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
-import { readFileSync } from "node:fs";
+import { mkdtempSync, readFileSync, rmSync, writeFileSync } from "node:fs";
+import { tmpdir } from "node:os";
 import { join } from "node:path";
 import { describe, test } from "node:test";
-import { kTwoAtOnce, visitDarwins } from "../support/browser.mjs";
+import { kTwoAtOnce, visitDarwins, visitFamily } from "../support/browser.mjs";
+import { kFactFamily } from "../support/families.mjs";
 
 async function save(visit, button) {
     await visit.click("#file-button");
@@ -60,6 +62,9 @@ describe("saving", kTwoAtOnce, () => {
             ["", {}, []],
             ["&view=pedigree&generations=4", {}, ["--view", "pedigree", "--generations", "4"]],
             ["&view=ancestors&up=3&direction=left", {}, ["--view", "ancestors", "--up", "3", "--direction", "left"]],
+            ["&show=dates,places,occupation,marriage", {}, ["--show", "dates,places,occupation,marriage"]],
+            ["&view=pedigree&show=dates,marriage", {}, ["--view", "pedigree", "--show", "dates,marriage"]],
+            ["&view=descendants&compact=yes&down=2", {}, ["--view", "descendants", "--compact", "--down", "2"]],
             [
                 "&view=descendants&down=2",
                 { colorScheme: "dark" },
@@ -74,6 +79,23 @@ describe("saving", kTwoAtOnce, () => {
             assert.equal(bytes.toString("utf8"), drawn.toString("utf8"), address);
             await visit.end();
         }
+    });
+
+    test("an SVG says what boxes and lines say, in the bytes that the command draws", { skip: reason }, async () => {
+        const folder = mkdtempSync(join(tmpdir(), "facts-"));
+        const path = join(folder, "family.ged");
+        writeFileSync(path, kFactFamily);
+        const visit = await visitFamily(kFactFamily, { focus: 1 });
+        await visit.click("#options-button");
+        for (const fact of ["marriage", "places", "occupation", "dates"]) await visit.click(`#fact-${fact}`);
+        await visit.page.keyboard.press("Escape");
+        const { bytes } = await save(visit, "#save-svg");
+        const show = ["--show", "dates,places,occupation,marriage", "--unknown-parents"];
+        const drawn = execFileSync(command, ["draw", path, "--focus", "I1", "-o", "-", ...show]);
+        assert.equal(bytes.toString("utf8"), drawn.toString("utf8"));
+        for (const said of ["12 FEB 1809", "Bath", "Baker", "1839"]) assert.ok(bytes.includes(said), said);
+        rmSync(folder, { recursive: true });
+        await visit.end();
     });
 
     test("a PNG has twice the size of the drawing", async () => {

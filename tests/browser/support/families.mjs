@@ -365,3 +365,11 @@ export function lineOf(generations) {
     }
     return [...lines, "0 TRLR"].join("\n");
 }
+
+/** A couple with everything that boxes and lines can say beside names and years. */
+export const kFactFamily = gedcom(
+    ...["0 @I1@ INDI", "1 NAME Ada /Lee/", "1 SEX F", "1 OCCU Baker", "1 FAMS @F1@"],
+    ...["1 BIRT", "2 DATE 12 FEB 1809", "2 PLAC Bath", "1 DEAT", "2 DATE 19 APR 1882", "2 PLAC Hove"],
+    ...["0 @I2@ INDI", "1 NAME Jon /Lee/", "1 SEX M", "1 FAMS @F1@"],
+    ...["0 @F1@ FAM", "1 HUSB @I2@", "1 WIFE @I1@", "1 MARR", "2 DATE 29 JAN 1839"],
+);

@@ -1,9 +1,10 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The names of views and directions, and of the groups of relatives that can be switched off.
+// The names of views and directions, of the groups of relatives that can be switched off, and of the facts that can be
+// switched on.
 
-import type { PictureView } from "olvane";
+import type { PictureView, ShownFact } from "olvane";
 
 export type ViewName = PictureView;
 
@@ -38,6 +39,14 @@ export function hasDown(view: ViewName): boolean {
 export function hasDirection(view: ViewName): boolean {
     return !["family", "pedigree", "fan"].includes(view);
 }
+
+// Views whose generations can be packed tighter.
+export function hasCompact(view: ViewName): boolean {
+    return hasDirection(view) && view !== "everybody";
+}
+
+/** What boxes and lines can say beside names and years, in the order of the switches. */
+export const kShownFacts = ["dates", "places", "occupation", "marriage"] as const satisfies readonly ShownFact[];
 
 // In the order of the switches. A bit is the engine's own.
 export const kRelatives = {

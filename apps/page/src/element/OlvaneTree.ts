@@ -24,7 +24,15 @@ import { boxTowards, type Direction } from "../view/kinMoves";
 import { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
 import type { Sight } from "../view/SharedLink";
-import { addressOf, kUsualState, readAddress, sameState, type ViewState, withNextParents } from "../view/ViewState";
+import {
+    addressOf,
+    factsIn,
+    kUsualState,
+    readAddress,
+    sameState,
+    type ViewState,
+    withNextParents,
+} from "../view/ViewState";
 import { viewerStyles } from "./styles";
 
 const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture of usual size is drawn
@@ -54,7 +62,7 @@ export interface OlvaneTreeEvents {
 export class OlvaneTree extends HTMLElement {
     /** Where viewers get the engine that they share; set before any of them gets a file. */
     static engine: (() => Promise<Olvane>) | null = null;
-    static readonly observedAttributes = ["src", "focus", "view", "language", "panel", "kinship", "theme"];
+    static readonly observedAttributes = ["src", "focus", "view", "language", "panel", "kinship", "theme", "show"];
 
     private readonly shadow: ShadowRoot;
     private readonly surface = svg("svg", { id: "tree", role: "application", part: "tree" });
@@ -124,6 +132,7 @@ export class OlvaneTree extends HTMLElement {
         if (name === "panel") this.parts.classList.toggle("panel-closed", now === "closed");
         if (name === "kinship") this.restyle();
         if (name === "theme") this.applyTheme();
+        if (name === "show") this.show({ show: factsIn(now ?? "") });
         if ((name === "focus" || name === "view") && this.opened) this.show(this.attributeState());
     }
 
@@ -528,6 +537,7 @@ export class OlvaneTree extends HTMLElement {
             messages: this.messages,
             ui: this.ui,
             kinshipInBoxes: this.getAttribute("kinship") !== "none",
+            show: this.shownState?.show ?? kUsualState.show,
             render: this.boxRenderer,
             portraitOf: this.shownState?.photos ? (person) => family.portraitOf(person, () => this.redrawSoon()) : null,
         });
@@ -588,6 +598,7 @@ export class OlvaneTree extends HTMLElement {
         const view = (this.getAttribute("view") ?? this.shownState?.view ?? usual.view) as ViewName;
         const parts = new URLSearchParams({ view });
         if (focus) parts.set("person", focus);
+        parts.set("show", this.getAttribute("show") ?? [...(this.shownState?.show ?? [])].join(","));
         return readAddress("#" + parts.toString(), family.persons, usual);
     }
 

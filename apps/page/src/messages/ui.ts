@@ -3,6 +3,7 @@
 
 // The texts of the page's own parts, in each language that it speaks.
 
+import type { ShownFact } from "olvane";
 import type { ChartDirection, RelativeName, ViewName } from "../base/views";
 import { uiGerman } from "./ui.de";
 import { uiEnglish } from "./ui.en";
@@ -78,6 +79,10 @@ export interface UiMessages {
     readonly languageLabel: string;
     readonly kinshipInBoxes: string;
     readonly unknownParents: string;
+    /** What boxes and lines say beside names and years. */
+    readonly shownFacts: Readonly<Record<"label" | ShownFact, string>>;
+    /** Generations packed tighter. */
+    readonly compact: string;
     readonly encoding: string;
     readonly encodingAuto: string;
     readonly file: string;

@@ -4,7 +4,7 @@
 // What stands in each box and what is read out for it. Kinship is stated only once it is known, since a search
 // through a large family must not hold up the picture.
 
-import type { NameParts, Person, Texts } from "olvane";
+import type { NameParts, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { directionOf, nameOf, yearsOf } from "../messages/names";
@@ -13,11 +13,14 @@ import type { BoxContents } from "./Scene";
 import type { KinshipTexts } from "../view/KinshipTexts";
 import type { OpenFamily } from "../view/OpenFamily";
 import type { Box, Picture } from "../view/Picture";
+import { factHeight } from "../view/ViewState";
 
 export interface Wording {
     readonly messages: Messages;
     readonly ui: UiMessages;
     readonly kinshipInBoxes: boolean;
+    /** What boxes and lines say beside names and years. */
+    readonly show: ReadonlySet<ShownFact>;
     /** The address of somebody's photograph, null where there is none; null where boxes show none. */
     readonly render: ((person: Person, box: Box) => SVGElement | null) | null;
     readonly portraitOf: ((person: number) => string | null) | null;
@@ -74,15 +77,23 @@ export class PictureContents implements BoxContents {
         return person ? this.personLook(person, box) : this.missingLook(box);
     }
 
+    labelOf(family: PictureFamily): string {
+        const { show } = this.wording;
+        return show.has("marriage") && family.number > 0 ? this.family.file.labelOfFamily(family.number, show) : "";
+    }
+
     private personLook(person: Person, box: Box): BoxLook {
         const isFocus = box === this.picture.focusBox;
         const boxes = this.picture.boxesOf(person.id).length;
         const kinship = this.kinshipKnown ? this.kinshipOf(person.id) : "";
         const hidden = this.hiddenOf(box);
-        const { ui, messages } = this.wording;
+        const { ui, messages, show } = this.wording;
+        const says: PersonLabel | null = show.size > 0 ? this.family.file.labelOfPerson(person.id, show) : null;
+        const dates = says && show.has("dates") ? datesOf(says) : [];
         const label = [
             nameOf(person, messages),
-            yearsOf(person, messages),
+            dates.join(", ") || yearsOf(person, messages),
+            ...(says?.details ?? []),
             isFocus ? ui.inFocus : kinship,
             boxes > 1 && ui.severalBoxes(boxes),
             hidden >= 0 && ui.hiddenCount(hidden),
@@ -100,7 +111,10 @@ export class PictureContents implements BoxContents {
             rightToLeft: directionOf(person.name) === "rtl",
             inside: this.wording.render?.(person, box) ?? null,
             photo: this.wording.portraitOf?.(person.id) ?? null,
-            years: shortYears(person),
+            years: dates.join("  ") || shortYears(person),
+            dates,
+            details: says?.details ?? [],
+            factHeight: factHeight(show),
             kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
             hidden,
             further: box.furtherParents > 0 ? ui.furtherParents : "",
@@ -127,6 +141,9 @@ export class PictureContents implements BoxContents {
             inside: null,
             photo: null,
             years: "",
+            dates: [],
+            details: [],
+            factHeight: factHeight(this.wording.show),
             kinship: null,
             hidden: -1,
             further: "",
@@ -147,6 +164,10 @@ export function shortYears(person: Person): string {
     if (birth && death) return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
     if (death) return "\u2020 " + death;
     return [birth && "* " + birth, person.dead && "\u2020"].filter(Boolean).join("  ");
+}
+
+function datesOf({ birth, death }: PersonLabel): string[] {
+    return [birth && "* " + birth, death && "\u2020 " + death].filter(Boolean);
 }
 
 // Surname first where the file writes it first.

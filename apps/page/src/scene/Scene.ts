@@ -7,7 +7,7 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
-import type { Texts } from "olvane";
+import type { PictureFamily, Texts } from "olvane";
 import { prefersStillness, svg } from "../base/dom";
 import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
@@ -41,6 +41,8 @@ export interface BoxContents {
     // Measures what is written; its fonts are those of the boxes.
     readonly texts: Texts;
     lookOf(box: Box): BoxLook;
+    // What stands at the marriage line of a family; empty for nothing.
+    labelOf(family: PictureFamily): string;
 }
 
 interface Glide {
@@ -311,7 +313,8 @@ export class Scene {
 
     private drawLines(picture: Picture): void {
         const families = this.isFar ? picture.families : picture.familiesWithin(this.drawn!);
-        this.lines.replaceChildren(...(this.isFar ? [farLines(families)] : families.map(drawFamily)));
+        const near = (lines: FamilyLines) => drawFamily(lines, this.contents.labelOf(lines.family));
+        this.lines.replaceChildren(...(this.isFar ? [farLines(families)] : families.map(near)));
         this.lines.append(...drawWays(picture.kinship?.ways ?? []));
         this.thickenLines();
         this.lightFamilies();

@@ -31,6 +31,12 @@ export interface BoxLook {
     // What a program draws in place of everything within the frame.
     readonly inside: SVGElement | null;
     readonly years: string;
+    // Birth and death each, where dates are shown, for a room that is too narrow for years.
+    readonly dates: readonly string[];
+    // Further lines below the years.
+    readonly details: readonly string[];
+    // Of the box, for what is shown beside names and years.
+    readonly factHeight: number;
     // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
     readonly kinship: string | null;
     // Relatives without a box: -1 for none, 0 for an unknown number.
@@ -49,7 +55,9 @@ export interface BoxLook {
 
 const kUsualHeight = 104; // of a tall box without room for a photograph
 const kInset = 7; // px from the border to any text
+const kTwoNameLines = 36; // px that a wide box has for them at least
 const kYearsSize = 11;
+const kLinePitch = 14;
 const kKinSize = 10.5;
 const kLeastKinSize = 9.5; // before a word is cut
 
@@ -135,11 +143,13 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const middle = nodeWidth / 2;
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
-    const yearsY = look.kinship !== null ? lastLine - 14 : lastLine;
-    // What a box is higher than usual is for the photograph.
-    const figureHeight = 22 + Math.max(0, nodeHeight - kUsualHeight);
+    const facts = factLines(look, room);
+    const lastFact = look.kinship !== null ? lastLine - kLinePitch : lastLine;
+    const firstFact = lastFact - kLinePitch * Math.max(0, facts.length - 1);
+    // What a box is higher than usual, but for facts, is for the photograph.
+    const figureHeight = 22 + Math.max(0, nodeHeight - kUsualHeight - look.factHeight);
     const top = 9 + figureHeight;
-    const bottom = look.years || look.kinship !== null ? yearsY - kYearsSize - 1 : nodeHeight - 6;
+    const bottom = facts.length > 0 || look.kinship !== null ? firstFact - kYearsSize - 1 : nodeHeight - 6;
     const name = look.texts.fitName(look.name, { width: room, height: bottom - top, gap: 1, lines: 3 });
     const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
@@ -148,7 +158,7 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     name.lines.forEach((line, i) =>
         box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
-    if (look.years) box.append(text("years", middle, yearsY, look.texts.fitLine(look.years, kYearsSize, room)));
+    facts.forEach((line, i) => box.append(text("years", middle, firstFact + i * kLinePitch, line)));
     if (look.kinship) box.append(kinText(look, middle, lastLine, look.kinship, kKinSize, room));
 }
 
@@ -157,15 +167,15 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const right = nodeWidth - kInset;
     const room = right - left;
     const lower = lowerLines(look, room);
-    const nameHeight = nodeHeight - 8 - lower.length * 14;
+    const nameHeight = nodeHeight - 8 - lower.length * kLinePitch;
     const name = look.texts.fitName(look.name, {
         width: room,
         height: nameHeight,
         gap: 2,
-        lines: lower.length > 1 ? 1 : 2,
+        lines: nameHeight < kTwoNameLines ? 1 : 2,
     });
     const pitch = name.size + 2;
-    const height = name.lines.length * pitch + lower.length * 14;
+    const height = name.lines.length * pitch + lower.length * kLinePitch;
     const firstY = (nodeHeight - height) / 2 + name.size - 1;
     // In the other direction a line begins at the right edge of its room.
     const x = look.rightToLeft ? right : left;
@@ -174,7 +184,7 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     box.append(figure(look, look.photo ? 28 : 21, (nodeHeight - figureHeight) / 2, figureHeight));
     name.lines.forEach((line, i) => box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)));
     lower.forEach((line, i) => {
-        const y = firstY + name.lines.length * pitch + i * 14;
+        const y = firstY + name.lines.length * pitch + i * kLinePitch;
         box.append(
             line === look.kinship
                 ? kinText(look, left, y, line, kYearsSize, room)
@@ -184,11 +194,19 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     box.classList.add("wide");
 }
 
-// Years and kinship in one line if they fit.
+// Years and kinship in one line if they fit and nothing else is shown.
 function lowerLines(look: BoxLook, room: number): string[] {
-    const lines = [look.years, look.kinship].filter((line): line is string => Boolean(line));
+    const lines = [...factLines(look, room), look.kinship].filter((line): line is string => Boolean(line));
     const joined = lines.join(" \u00b7 ");
-    return lines.length === 2 && look.texts.width(joined, kYearsSize) <= room ? [joined] : lines;
+    const areTwo = look.factHeight === 0 && lines.length === 2;
+    return areTwo && look.texts.width(joined, kYearsSize) <= room ? [joined] : lines;
+}
+
+// Years or dates, then the details.
+function factLines({ years, dates, details, texts }: BoxLook, room: number): string[] {
+    const isTooWide = dates.length > 1 && texts.width(years, kYearsSize) > room;
+    const lines = [...(isTooWide ? dates : [years]), ...details].filter(Boolean);
+    return lines.map((line) => texts.fitLine(line, kYearsSize, room));
 }
 
 // x is its middle, y its upper edge.

@@ -9,8 +9,10 @@ import { svg } from "../base/dom";
 import type { FamilyLines } from "../view/Picture";
 
 const kBridge = 4; // points, half of what an arc spans
+const kLabelLift = 4; // points, from a marriage line to its label
 
-export function drawFamily({ index, family }: FamilyLines): SVGGElement {
+/** label stands at the marriage line; empty for none. */
+export function drawFamily({ index, family }: FamilyLines, label: string): SVGGElement {
     const shared: string[] = [];
     const own = new Map<string, string[]>(); // by kind of child
     for (const line of family.lines) {
@@ -24,7 +26,19 @@ export function drawFamily({ index, family }: FamilyLines): SVGGElement {
     if (marriages.length > 0) group.append(svg("path", { class: "line marriage", d: marriages.join("") }));
     if (rest.length > 0) group.append(svg("path", { class: "line", d: rest.join("") }));
     for (const [kind, paths] of own) group.append(svg("path", { class: "line " + kind, d: paths.join("") }));
+    if (label) appendLabel(group, family.lines, label);
     return group;
+}
+
+// Above the first level marriage line, else beside an upright one.
+function appendLabel(group: SVGGElement, lines: readonly PictureLine[], label: string): void {
+    const marriages = lines.filter(({ role }) => role === "marriage");
+    const level = marriages.find(({ x1, y1, x2, y2 }) => y1 === y2 && x1 !== x2);
+    const line = level ?? marriages[0];
+    if (!line) return;
+    const x = (line.x1 + line.x2) / 2 + (level ? 0 : kLabelLift);
+    const y = (line.y1 + line.y2) / 2 + (level ? -kLabelLift : kLabelLift);
+    group.append(svg("text", { class: level ? "marriage-label" : "marriage-label upright", x, y }, label));
 }
 
 function pathOf({ x1, y1, x2, y2, bridges }: PictureLine): string {

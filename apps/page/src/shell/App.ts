@@ -4,7 +4,7 @@
 // The page around the viewer: the bar, the dialogs, the address and what the browser's own history keeps of it.
 // Files come in through FileOpening; everything about the picture is the viewer's.
 
-import type { GedcomFile, Person } from "olvane";
+import type { GedcomFile, Person, ShownFact } from "olvane";
 import { iconButton } from "../base/controls";
 import { html, recall, remember } from "../base/dom";
 import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
@@ -390,6 +390,17 @@ export class App implements ChromeActions {
     private showKinship(shown: boolean): void {
         this.kinshipInBoxes = shown;
         this.tree.setAttribute("kinship", shown ? "boxes" : "none");
+    }
+
+    setFact(fact: ShownFact, shown: boolean): void {
+        const show = new Set(this.tree.state?.show);
+        if (shown) show.add(fact);
+        else show.delete(fact);
+        this.travel({ show });
+    }
+
+    setCompact(compact: boolean): void {
+        this.travel({ compact });
     }
 
     setUnknownParents(shown: boolean): void {

@@ -4,11 +4,11 @@
 // The bar at the top with its two panels, the buttons that float over the picture, the legend, and the
 // dialogs. All of it is made anew when the language changes.
 
-import type { Person } from "olvane";
+import type { Person, ShownFact } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
-import { hasGroups, kRelativeNames, type RelativeName } from "../base/views";
+import { hasGroups, kRelativeNames, kShownFacts, type RelativeName } from "../base/views";
 import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
-import { iconButton } from "../base/controls";
+import { checkbox, iconButton, switchRow } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import { icon } from "../base/icons";
 import type { ListedRemark } from "./FileRemarks";
@@ -23,6 +23,7 @@ export interface ChromeActions extends SearchSource, ViewActions {
     setGenerations(generations: number): void;
     setKinshipInBoxes(shown: boolean): void;
     setUnknownParents(shown: boolean): void;
+    setFact(fact: ShownFact, shown: boolean): void;
     // Reads the file again; empty for the file's own word.
     setEncoding(encoding: string): void;
     setTheme(theme: ThemeChoice): void;
@@ -82,6 +83,7 @@ export class Chrome {
     private readonly diagnosticsButton: HTMLButtonElement;
     private readonly buttons: Record<"back" | "forward" | "family" | "pedigree" | "panel", HTMLButtonElement>;
     private readonly switches = new Map<RelativeName, HTMLInputElement>();
+    private readonly facts = new Map<ShownFact, HTMLInputElement>();
     private readonly unknownParents: HTMLInputElement;
     private readonly encoding = html("select", { id: "encoding" });
     private readonly encodingRow: HTMLElement;
@@ -121,18 +123,18 @@ export class Chrome {
         this.diagnosticsButton = iconButton("diagnostics-button", "warning", "", () => this.openDiagnostics());
         this.diagnosticsButton.hidden = true;
         this.views = new ViewChooser(ui, actions);
-        this.unknownParents = this.checkbox("unknown-parents", (checked) => actions.setUnknownParents(checked));
+        this.unknownParents = checkbox("unknown-parents", (checked) => actions.setUnknownParents(checked));
         this.encoding.append(html("option", { value: "" }, ui.encodingAuto));
         for (const name of kEncodings) this.encoding.append(html("option", { value: name }, name));
         this.encoding.addEventListener("change", () => actions.setEncoding(this.encoding.value));
-        this.keep = this.checkbox("keep-file", (checked) => actions.setKept(checked));
+        this.keep = checkbox("keep-file", (checked) => actions.setKept(checked));
         this.keepRow = html(
             "label",
             { class: "switch", hidden: true },
             this.keep,
             html("span", {}, ui.keep.label, html("small", {}, ui.keep.hint)),
         );
-        this.photos = this.checkbox("photos-in-boxes", (checked) => actions.setPhotos(checked));
+        this.photos = checkbox("photos-in-boxes", (checked) => actions.setPhotos(checked));
         this.photosRow = html(
             "label",
             { class: "switch", hidden: true },
@@ -178,6 +180,7 @@ export class Chrome {
         family.setAttribute("aria-pressed", String(state.view === "family"));
         pedigree.setAttribute("aria-pressed", String(state.view === "pedigree"));
         this.unknownParents.checked = state.unknownParents;
+        for (const [fact, input] of this.facts) input.checked = state.show.has(fact);
         this.photos.checked = state.photos;
         this.unknownParents.disabled = state.view !== "family" && state.view !== "pedigree";
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
@@ -300,11 +303,17 @@ export class Chrome {
         const { ui, actions } = this;
         const relatives = html("fieldset", {}, html("legend", {}, ui.relatives));
         for (const name of kRelativeNames) {
-            const input = this.checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
+            const input = checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
             this.switches.set(name, input);
             relatives.append(html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])));
         }
-        const kinship = this.checkbox("kinship-in-boxes", (checked) => actions.setKinshipInBoxes(checked));
+        const facts = html("fieldset", {}, html("legend", {}, ui.shownFacts.label));
+        for (const fact of kShownFacts) {
+            const input = checkbox("fact-" + fact, (checked) => actions.setFact(fact, checked));
+            this.facts.set(fact, input);
+            facts.append(switchRow(input, ui.shownFacts[fact]));
+        }
+        const kinship = checkbox("kinship-in-boxes", (checked) => actions.setKinshipInBoxes(checked));
         kinship.checked = looks.kinshipInBoxes;
         const themes = kThemeChoices.map((theme) => [theme, ui.themes[theme]] as const);
         const languages = uiLanguages.map(({ language, languageName }) => [language, languageName] as const);
@@ -320,6 +329,7 @@ export class Chrome {
             relatives,
             html("label", { class: "switch" }, this.unknownParents, html("span", {}, ui.unknownParents)),
             generations,
+            facts,
             html(
                 "fieldset",
                 {},
@@ -383,12 +393,6 @@ export class Chrome {
         );
         onClick(button, () => this.actions.setView(view));
         return button;
-    }
-
-    private checkbox(id: string, action: (checked: boolean) => void): HTMLInputElement {
-        const input = html("input", { id, type: "checkbox", role: "switch" });
-        input.addEventListener("change", () => action(input.checked));
-        return input;
     }
 
     private choice(

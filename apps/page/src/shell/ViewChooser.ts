@@ -3,11 +3,12 @@
 
 // All views to choose from, each with a small picture of it, and how far the chosen one reaches.
 
-import { iconButton } from "../base/controls";
+import { checkbox, iconButton, switchRow } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import { icon } from "../base/icons";
 import {
     type ChartDirection,
+    hasCompact,
     hasDirection,
     hasDown,
     hasUp,
@@ -27,6 +28,7 @@ export interface ViewActions {
     setMap(): void;
     setDepth(which: "up" | "down", generations: number): void;
     setDirection(direction: ChartDirection): void;
+    setCompact(compact: boolean): void;
 }
 
 export class ViewChooser {
@@ -36,6 +38,8 @@ export class ViewChooser {
     private readonly depths = new Map<"up" | "down", Depth>();
     private readonly direction: HTMLSelectElement;
     private readonly directionRow: HTMLElement;
+    private readonly compact: HTMLInputElement;
+    private readonly compactRow: HTMLElement;
 
     constructor(
         private readonly ui: UiMessages,
@@ -55,6 +59,8 @@ export class ViewChooser {
         for (const name of kDirections) this.direction.append(html("option", { value: name }, ui.directions[name]));
         this.direction.addEventListener("change", () => actions.setDirection(this.direction.value as ChartDirection));
         this.directionRow = html("label", { class: "row" }, html("span", {}, ui.direction), this.direction);
+        this.compact = checkbox("compact", (checked) => actions.setCompact(checked));
+        this.compactRow = switchRow(this.compact, ui.compact);
         for (const which of ["up", "down"] as const)
             this.depths.set(which, new Depth(which, ui, (n) => actions.setDepth(which, n)));
         this.popover = new Popover(
@@ -65,11 +71,12 @@ export class ViewChooser {
                 views,
                 ...[...this.depths.values()].map((depth) => depth.row),
                 this.directionRow,
+                this.compactRow,
             ),
         );
     }
 
-    show({ view, up, down, direction, to }: ViewState): void {
+    show({ view, up, down, direction, to, compact }: ViewState): void {
         for (const [name, button] of this.buttons) {
             button.setAttribute("aria-pressed", String(name === view));
             // Ways lead to a second person, who is chosen in the panel about them.
@@ -79,6 +86,8 @@ export class ViewChooser {
         this.depths.get("down")!.show(hasDown(view), down);
         this.directionRow.hidden = !hasDirection(view);
         this.direction.value = direction;
+        this.compactRow.hidden = !hasCompact(view);
+        this.compact.checked = compact;
     }
 
     showMap(shown: boolean): void {

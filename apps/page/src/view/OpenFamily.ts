@@ -37,7 +37,7 @@ export class OpenFamily {
 
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
-        return this.file.svg(state.focus, optionsOf(state, language), { theme });
+        return this.file.svg(state.focus, optionsOf(state, language), { theme, show: state.show });
     }
 
     // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.

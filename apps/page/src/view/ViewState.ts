@@ -3,15 +3,17 @@
 
 // What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
 
-import type { Person, PictureOptions } from "olvane";
+import type { Person, PictureOptions, ShownFact } from "olvane";
 import {
     type ChartDirection,
+    hasCompact,
     hasDirection,
     hasDown,
     hasUp,
     kDirections,
     kRelativeNames,
     kRelatives,
+    kShownFacts,
     kViewNames,
     type RelativeName,
     type ViewName,
@@ -33,6 +35,10 @@ export interface ViewState {
     // A person, and the family whose partners are shown as that person's parents; 0 for the usual ones.
     readonly parentsOf: number;
     readonly parentFamily: number;
+    // Whether generations are packed tighter, in the charts.
+    readonly compact: boolean;
+    // What boxes and lines say beside names and years.
+    readonly show: ReadonlySet<ShownFact>;
     // Whether boxes show photographs.
     readonly photos: boolean;
     // Names of kRelatives that are switched off.
@@ -58,6 +64,8 @@ export const kUsualState: ViewState = {
     unknownParents: true,
     parentsOf: 0,
     parentFamily: 0,
+    compact: false,
+    show: new Set(),
     photos: false,
     hidden: new Set(),
 };
@@ -69,16 +77,28 @@ const kTallWithPhoto = { ...kTall, height: kTall.height + 32 };
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
+const kFactPitch = 14;
+const kLabelRoom = 12; // between boxes side by side, for the year at their marriage line
+// Lines that a fact adds to a box; both places have one, and so have both dates where one line has no room for them.
+const kFactLines: Readonly<Record<ShownFact, number>> = { dates: 1, places: 2, occupation: 1, marriage: 0 };
+
+/** By how much boxes are higher for the facts in them, in points. */
+export function factHeight(show: ReadonlySet<ShownFact>): number {
+    return [...show].reduce((height, fact) => height + kFactPitch * kFactLines[fact], 0);
+}
+
 /** What to ask of the module for a state. */
 export function optionsOf(state: ViewState, language: PictureOptions["language"] = "en"): PictureOptions {
-    const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily } = state;
+    const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact } = state;
     const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
     const tall = state.photos ? kTallWithPhoto : kTall;
     const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : tall;
     return {
-        ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, language },
+        ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact, language },
         shown: shownBits(state),
         ...sizes,
+        height: sizes.height + factHeight(state.show),
+        gapX: sizes.gapX + (sizes === tall && state.show.has("marriage") ? kLabelRoom : 0),
     };
 }
 
@@ -97,12 +117,17 @@ export function sameState(a: ViewState, b: ViewState): boolean {
             "direction",
             "to",
             "unknownParents",
+            "compact",
             "photos",
             "parentFamily",
             "parentsOf",
         ] as const
     ).every((name) => a[name] === b[name]);
-    return same && a.hidden.size === b.hidden.size && [...a.hidden].every((name) => b.hidden.has(name));
+    return same && sameSet(a.hidden, b.hidden) && sameSet(a.show, b.show);
+}
+
+function sameSet<Name>(a: ReadonlySet<Name>, b: ReadonlySet<Name>): boolean {
+    return a.size === b.size && [...a].every((name) => b.has(name));
 }
 
 // "#person=I17&view=pedigree&generations=6&hide=cousins,siblings"; what has its usual value is left out.
@@ -118,6 +143,8 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     if (hasDown(view) && state.down !== kUsualDown) parts.set("down", String(state.down));
     if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
     if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
+    if (hasCompact(view) && state.compact) parts.set("compact", "yes");
+    if (state.show.size > 0) parts.set("show", kShownFacts.filter((fact) => state.show.has(fact)).join(","));
     if (state.photos) parts.set("photos", "boxes");
     const hide = [...state.hidden, ...(state.unknownParents ? [] : [kUnknownParents])];
     if (state.parentFamily) parts.set("parents", `${state.parentsOf}.${state.parentFamily}`);
@@ -136,6 +163,8 @@ const kParts = [
     "down",
     "direction",
     "to",
+    "compact",
+    "show",
     "photos",
     "hide",
     "parents",
@@ -158,9 +187,17 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
         to,
         ...parentsIn(parts.get("parents") ?? "", persons),
         unknownParents: !hidden.includes(kUnknownParents),
+        compact: parts.get("compact") === "yes",
+        show: factsIn(parts.get("show") ?? ""),
         photos: parts.get("photos") === "boxes",
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
     };
+}
+
+/** "dates,places"; what is no fact is left out. */
+export function factsIn(text: string): ReadonlySet<ShownFact> {
+    const names = text.split(",").map((name) => name.trim());
+    return new Set(kShownFacts.filter((fact) => names.includes(fact)));
 }
 
 // The person whom an address names and the file does not hold; empty where there is none.
