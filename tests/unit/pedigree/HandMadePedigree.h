@@ -31,7 +31,7 @@ protected:
         layouter.layoutForFocusNID();
     }
     // Sets the data of the focus's spouses and of their shared children, of 0 and of the wife.
-    void addWife(int wife, const std::vector<int>& childrenWithHer) {
+    void addWifeWithChildren(int wife, const std::vector<int>& childrenWithHer) {
         data.spouses[0].push_back(wife);
         data.spouses[wife] = {0};
         for (const int child : childrenWithHer) {

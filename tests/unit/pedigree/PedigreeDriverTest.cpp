@@ -99,7 +99,7 @@ TEST_F(PedigreeDriver, theFathersWholeLineIsAskedForBeforeTheMothers) {
 
 TEST_F(PedigreeDriver, recordOfWhoIsShownStartsAnew) {
     layouter.shownPersons[99] = true;
-    addWife(7, {8});
+    addWifeWithChildren(7, {8});
     data.parents[0] = {1, 2};
     layOut(2);
     Keys shown;
@@ -111,7 +111,7 @@ TEST_F(PedigreeDriver, recordOfWhoIsShownStartsAnew) {
 }
 
 TEST_F(PedigreeDriver, dataAreAskedInAFixedOrder) {
-    addWife(1, {2});
+    addWifeWithChildren(1, {2});
     layOut(1);
     EXPECT_EQ((Questions{"getSpouses 0", "getChildren 0", "getChildren 1", "getParents 2",  // growing
                          "getSpouses 2", "getChildren 2", "getParents 2",  // the child's flag

@@ -42,31 +42,31 @@ TEST_F(PedigreeFocusFamily, ofALoneFocusIsEmpty) {
 }
 
 TEST_F(PedigreeFocusFamily, childlessSpouseStandsBelowTheFocus) {
-    addWife(1, {});
+    addWifeWithChildren(1, {});
     setOut();
     EXPECT_EQ((Point{27.5f, 110.0f}), placeOf(spouse()));
 }
 
 TEST_F(PedigreeFocusFamily, onlyChildStandsBesideTheMiddleOfTheCouple) {
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     setOut();
     EXPECT_EQ((Point{-52.5f, 55.0f}), placeOf(childUnder(1)));
 }
 
 TEST_F(PedigreeFocusFamily, twoChildrenStandLevelWithTheCouple) {
-    addWife(1, {5, 6});
+    addWifeWithChildren(1, {5, 6});
     setOut();
     EXPECT_EQ((Heights{0, 110}), childHeights(1));
 }
 
 TEST_F(PedigreeFocusFamily, threeChildrenStandAroundTheMiddleOfTheCouple) {
-    addWife(1, {5, 6, 7});
+    addWifeWithChildren(1, {5, 6, 7});
     setOut();
     EXPECT_EQ((Heights{-55, 55, 165}), childHeights(1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildStandsOnePitchAboveTheSharedOnes) {
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Heights{55}), childHeights(1));
@@ -74,7 +74,7 @@ TEST_F(PedigreeFocusFamily, unknownChildStandsOnePitchAboveTheSharedOnes) {
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildrenContinueTheStackUpward) {
-    addWife(1, {5, 6});
+    addWifeWithChildren(1, {5, 6});
     setChildrenWithoutSecondParent({7, 8});
     setOut();
     EXPECT_EQ((Heights{0, 110}), childHeights(1));
@@ -82,7 +82,7 @@ TEST_F(PedigreeFocusFamily, unknownChildrenContinueTheStackUpward) {
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildOfAFocusWithAChildlessSpouseStandsAboveTheFocus) {
-    addWife(1, {});
+    addWifeWithChildren(1, {});
     setChildrenWithoutSecondParent({5});
     setOut();
     EXPECT_EQ((Heights{-80}), childHeights(-1));
@@ -95,8 +95,8 @@ TEST_F(PedigreeFocusFamily, unknownChildrenOfAnUnmarriedFocusEndAtItsTop) {
 }
 
 TEST_F(PedigreeFocusFamily, secondSpouseStandsLevelWithHerOwnChildrenOrBelowTheFirst) {
-    addWife(1, {5});
-    addWife(2, {6});
+    addWifeWithChildren(1, {5});
+    addWifeWithChildren(2, {6});
     setOut();
     EXPECT_EQ((Heights{55}), childHeights(1));
     EXPECT_EQ((Heights{165}), childHeights(2));
@@ -105,17 +105,17 @@ TEST_F(PedigreeFocusFamily, secondSpouseStandsLevelWithHerOwnChildrenOrBelowTheF
 }
 
 TEST_F(PedigreeFocusFamily, childrenOfTheSecondSpouseStartWhereTheFirstLeftOff) {
-    addWife(1, {});
-    addWife(2, {5, 6, 7});
+    addWifeWithChildren(1, {});
+    addWifeWithChildren(2, {5, 6, 7});
     setOut();
     EXPECT_EQ((Heights{95, 205, 315}), childHeights(2));
     EXPECT_EQ((Point{27.5f, 220.0f}), placeOf(spouse(1)));
 }
 
 TEST_F(PedigreeFocusFamily, furtherSpousesSinkToTheMiddleOfTheirChildren) {
-    addWife(1, {5});
-    addWife(2, {6, 7, 8, 9, 10});
-    addWife(3, {});
+    addWifeWithChildren(1, {5});
+    addWifeWithChildren(2, {6, 7, 8, 9, 10});
+    addWifeWithChildren(3, {});
     setOut();
     EXPECT_EQ((Heights{165, 275, 385, 495, 605}), childHeights(2));
     EXPECT_EQ((Point{27.5f, 385.0f}), placeOf(spouse(1)));
@@ -123,23 +123,23 @@ TEST_F(PedigreeFocusFamily, furtherSpousesSinkToTheMiddleOfTheirChildren) {
 }
 
 TEST_F(PedigreeFocusFamily, childlessFurtherSpousesStandOnePitchApart) {
-    for (const int wife : {1, 2, 3}) addWife(wife, {});
+    for (const int wife : {1, 2, 3}) addWifeWithChildren(wife, {});
     setOut();
     EXPECT_EQ((Point{27.5f, 220.0f}), placeOf(spouse(1)));
     EXPECT_EQ((Point{27.5f, 330.0f}), placeOf(spouse(2)));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildFallsBackToTheFocusWhenNoSpouseHasAChild) {
-    addWife(1, {});
-    addWife(2, {});
+    addWifeWithChildren(1, {});
+    addWifeWithChildren(2, {});
     setChildrenWithoutSecondParent({5});
     setOut();
     EXPECT_EQ((Heights{-80}), childHeights(-1));
 }
 
 TEST_F(PedigreeFocusFamily, unknownChildStandsAboveTheSecondSpousesChildrenToo) {
-    addWife(1, {});
-    addWife(2, {5});
+    addWifeWithChildren(1, {});
+    addWifeWithChildren(2, {5});
     setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Heights{95}), childHeights(2));
@@ -155,7 +155,7 @@ TEST_F(PedigreeFocusFamily, firstSpouseOfTheListStandsDirectlyBelow) {
 
 // The second node of the first spouse shares its key, so no step places it; the child counts twice.
 TEST_F(PedigreeFocusFamily, firstSpouseListedTwiceStandsOnceAndItsSecondNodeStaysUnplaced) {
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     data.spouses[0] = {1, 1};
     setOut();
     ASSERT_EQ(2u, focus.spouses.size());
@@ -167,8 +167,8 @@ TEST_F(PedigreeFocusFamily, firstSpouseListedTwiceStandsOnceAndItsSecondNodeStay
 // Both entries of the spouse set out the same two nodes of the child, so the second time counts: 315 and 425,
 // with their middle at 370 for the first entry and a pitch further for the second.
 TEST_F(PedigreeFocusFamily, laterSpouseListedTwiceSetsItsChildrenOutTwice) {
-    addWife(1, {});
-    addWife(2, {5});
+    addWifeWithChildren(1, {});
+    addWifeWithChildren(2, {5});
     data.spouses[0] = {1, 2, 2};
     setOut();
     EXPECT_EQ((Heights{315, 425}), childHeights(2));
@@ -177,8 +177,8 @@ TEST_F(PedigreeFocusFamily, laterSpouseListedTwiceSetsItsChildrenOutTwice) {
 }
 
 TEST_F(PedigreeFocusFamily, everyChildIsEnteredAsShown) {
-    addWife(1, {5});
-    addWife(2, {6});
+    addWifeWithChildren(1, {5});
+    addWifeWithChildren(2, {6});
     setChildrenWithoutSecondParent({7});
     setOut();
     for (const int key : {1, 2, 5, 6, 7}) EXPECT_EQ(1u, layouter.shownPersons.count(key)) << key;
@@ -194,14 +194,14 @@ TEST_F(PedigreeFocusFamily, childThatHangsThereAlreadyIsEnteredAsShown) {
 
 // The record of who is shown goes by the nodes that hang there, not by who was given a place.
 TEST_F(PedigreeFocusFamily, childOfASpouseAloneIsEnteredWhereItHangsThere) {
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     focus.addSpouse(2, views::kFemale).addChildWithNoOtherSpouse(9, views::kMale);
     setOut();
     EXPECT_EQ(1u, layouter.shownPersons.count(9));
 }
 
 TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     data.children[1].push_back(8);
     data.parents[8] = {-1, 1};
     data.children[5] = {9};
@@ -213,7 +213,7 @@ TEST_F(PedigreeFocusFamily, bringsNoGrandchildrenAndNoStepChildren) {
 
 TEST_F(PedigreeFocusFamily, standsWhereTheFocusStands) {
     views::place(focus, 100.0f, 50.0f);
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     setChildrenWithoutSecondParent({6});
     setOut();
     EXPECT_EQ((Point{100.0f, 160.0f}), placeOf(spouse()));
@@ -224,7 +224,7 @@ TEST_F(PedigreeFocusFamily, standsWhereTheFocusStands) {
 TEST_F(PedigreeFocusFamily, followsTheSizesGiven) {
     layouter.treeSize = TreeSize{100.0f, 40.0f, 10.0f, 20.0f, 10.0f, 0.0f};
     views::place(focus, 50.0f, 0.0f);
-    addWife(1, {5});
+    addWifeWithChildren(1, {5});
     setOut();
     EXPECT_EQ((Point{50.0f, 60.0f}), placeOf(spouse()));
     EXPECT_EQ((Point{-60.0f, 30.0f}), placeOf(childUnder(1)));

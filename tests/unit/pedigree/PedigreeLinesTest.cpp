@@ -344,7 +344,7 @@ TEST_F(PedigreeLines, ofThePedigreeHaveNoSiblings) {
 }
 
 TEST_F(PedigreeLines, ofTheFocussFamilyAreDrawnBeforeThoseToItsParents) {
-    addWife(7, {8});
+    addWifeWithChildren(7, {8});
     data.parents[0] = {1, 2};
     layOut(2);
     const Segments segments = segmentsOf(focus);
