@@ -24,6 +24,7 @@
 #include <cli/ParallelWork.h>
 #include <cli/PictureRun.h>
 #include <cli/TableCells.h>
+#include <cli/TerminalProgress.h>
 #include <cli/UsageError.h>
 #include <olvane/source/PersonFinder.h>
 
@@ -132,31 +133,13 @@ private:
     gedcom::PersonId given_ = 0;
 };
 
-// On a terminal alone, and on stderr, so that results stay clean.
-class ProgressBar {
-public:
-    explicit ProgressBar(std::size_t total) : total_(total), shown_(::isatty(STDERR_FILENO) != 0) {}
-    ProgressBar(const ProgressBar&) = delete;
-    ProgressBar& operator=(const ProgressBar&) = delete;
-    ~ProgressBar() {
-        if (shown_) std::cerr << "\r\x1B[K" << std::flush;
-    }
-
-    void show(std::size_t done) const {
-        if (!shown_) return;
-        std::cerr << '\r' << done;
-        if (total_ > 0) {
-            const std::size_t width = 40 * done / total_;
-            std::cerr << " of " << total_ << " [" << std::string(width, '=') << std::string(40 - width, ' ')
-                      << ']';
-        }
-        std::cerr << std::flush;
-    }
-
-private:
-    std::size_t total_;
-    bool shown_;
-};
+// "12 of 80 [======        ]"; without a total, the number alone.
+std::string barOf(std::size_t done, std::size_t total) {
+    if (total == 0) return std::to_string(done);
+    const std::size_t width = 40 * done / total;
+    return std::to_string(done) + " of " + std::to_string(total) + " [" + std::string(width, '=') +
+           std::string(40 - width, ' ') + "]";
+}
 
 // What follows the id on a line.
 using Answer = std::function<std::string(gedcom::PersonId id)>;
@@ -203,7 +186,7 @@ int runBatch(const BatchOptions& options) {
     const gedcom::GedcomData data = readFile(options.input);
     const Answer answer = answerOf(data, options.request);
     FocusList focuses(data, options.focusFrom, options.unbuffered ? 1 : kBlock);
-    const ProgressBar progress(focuses.total());
+    TerminalProgress progress;
     const InterruptMark mark;
     std::size_t done = 0;
     std::size_t unknown = 0;
@@ -216,9 +199,10 @@ int runBatch(const BatchOptions& options) {
             writeStandardOutput(lines[i].text);
             if (lines[i].isKnown) continue;
             ++unknown;
+            progress.clear();
             printMessage(options.input.file + ": '" + block[i].written + "' is not one person");
         }
-        progress.show(done);
+        progress.show(barOf(done, focuses.total()));
     }
     if (interrupted != 0) return kInterrupted;
     return unknown == 0 ? 0 : 1;

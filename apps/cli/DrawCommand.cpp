@@ -20,6 +20,7 @@
 #include <cli/PictureConversion.h>
 #include <cli/PictureRun.h>
 #include <cli/SourceDate.h>
+#include <cli/TerminalProgress.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -67,10 +68,12 @@ draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::Draw
 }
 
 draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions& options,
-                               const LayoutRequest& request) {
+                               LayoutRequest request, TerminalProgress& progress) {
+    request.chart.progress = progress.ofChart();
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
     const std::vector<bool> hidden = hiddenPersons(data, options.hiding);
     picture::Picture picture = PictureRun(data, request, hidden).pictureOf(focus);
+    progress.show("drawing");
     gedcom::HiddenTexts texts;
     if (!hidden.empty()) {
         const gedcom::HiddenNames names(data, hidden);
@@ -130,20 +133,23 @@ struct Drawn {
 };
 
 Drawn drawWhole(const gedcom::GedcomData& data, const DrawOptions& options) {
-    const draw::DrawingContent content = contentOf(data, options, options.request);
+    TerminalProgress progress;
+    const draw::DrawingContent content = contentOf(data, options, options.request, progress);
     const draw::DrawingOptions drawing = drawingOptions(options, content);
     return {{draw::drawSvg(content, drawing)}, drawing.title};
 }
 
 Drawn drawOnSheets(const gedcom::GedcomData& data, const DrawOptions& options) {
+    TerminalProgress progress;
     PaperDrawing drawn = drawOnPaper(
         options.paper, options.request,
-        [&](const LayoutRequest& request) { return contentOf(data, options, request); },
+        [&](const LayoutRequest& request) { return contentOf(data, options, request, progress); },
         [&](const draw::DrawingContent& content) { return drawingOptions(options, content); });
     if (options.output == "-" && drawn.drawing.sheets.size() > 1) {
         throw UsageError("the picture takes " + std::to_string(drawn.drawing.sheets.size()) +
                          " sheets; name a file for them");
     }
+    progress.clear();
     printMessage(sentenceOf(drawn));
     return {std::move(drawn.drawing.sheets), drawn.title};
 }

@@ -10,6 +10,7 @@
 #include <cli/LayoutJson.h>
 #include <cli/OutputFile.h>
 #include <cli/PictureRun.h>
+#include <cli/TerminalProgress.h>
 
 namespace olvane::cli {
 
@@ -17,7 +18,10 @@ namespace {
 
 std::string outputOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options) {
     if (options.format == LayoutFormat::json) {
-        return PictureRun(data, options.request, hiddenPersons(data, options.hiding)).jsonOf(focus);
+        TerminalProgress progress;
+        LayoutRequest request = options.request;
+        request.chart.progress = progress.ofChart();
+        return PictureRun(data, request, hiddenPersons(data, options.hiding)).jsonOf(focus);
     }
     const std::string text = layoutText(data, focus, options.request);
     if (options.format == LayoutFormat::text) return text + "\n";

@@ -24,6 +24,7 @@
 #include <cli/OutputFile.h>
 #include <cli/PageFamily.h>
 #include <cli/PageTemplate.h>
+#include <cli/TerminalProgress.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -61,7 +62,9 @@ void refuseTooManyForMap(const gedcom::GedcomData& data) {
 }
 
 std::string mapOf(const gedcom::GedcomData& data) {
-    return charts::writeMapIndex(charts::mapIndexOf(gedcom::kinGraphOf(data), gedcom::captionsOf(data)));
+    TerminalProgress progress;
+    return charts::writeMapIndex(
+        charts::mapIndexOf(gedcom::kinGraphOf(data), gedcom::captionsOf(data), progress.ofChart()));
 }
 
 // The map of what the text says. Where somebody is hidden it is made of that text itself, so that it cannot know more.

@@ -52,6 +52,7 @@ EverybodyOptions everybodyOptions(const ChartRequest& request) {
     options.direction = request.direction;
     options.sizes = request.sizes;
     options.boxSizes = request.boxSizes;
+    options.progress = request.progress;
     return options;
 }
 

@@ -7,6 +7,7 @@
 #include <span>
 
 #include <olvane/Export.h>
+#include <olvane/charts/ChartProgress.h>
 #include <olvane/charts/ViewRequest.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/picture/Picture.h>
@@ -38,7 +39,8 @@ struct EverybodyOptions {
     const picture::Picture* earlier = nullptr;
     Direction direction = Direction::down;
     ChartSizes sizes;
-    std::span<const BoxSize> boxSizes;  // as in ChartRequest
+    std::span<const BoxSize> boxSizes;        // as in ChartRequest
+    const ChartProgress* progress = nullptr;  // as in ChartRequest
 };
 
 // Everybody once: each person has one box, couples stand side by side wherever nobody has three neighbours, parents

@@ -52,17 +52,27 @@ public:
         l_.chains = weldCouples(l_.part);
         measureChains();
         if (earlier_ == nullptr || !placeAsBefore()) place();
+        report(ChartStep::lines);
         l_.lines = routeGaps(l_.rows, endRanges());
         stackRows();
     }
 
 private:
+    // Of a part that is large enough to take a while.
+    void report(ChartStep step, double share = 0) const {
+        constexpr std::int32_t kFewPersons = 1000;
+        if (options_.progress == nullptr || l_.part.personCount() < kFewPersons) return;
+        (*options_.progress)(step, share);
+    }
+
     void place() {
+        report(ChartStep::rows);
         const std::vector<std::int32_t> rows = chooseRows(l_.part, l_.chains, levelEffort());
         l_.marked = marksForWantOfRoom(l_.part, l_.chains);
         if (options_.marks < 0) markAllSecondLinks(l_.part, l_.chains, rows, l_.marked);
         orderRows(rows);
         measureEnds();
+        report(ChartStep::places);
         l_.left = placeNodes(l_.rows, l_.order, l_.sizes, 0, kSweeps);
     }
 
@@ -95,6 +105,7 @@ private:
             return false;
         }
         measureEnds();
+        report(ChartStep::places);
         l_.left = placesNear(l_.rows, l_.order, l_.sizes, wanted, isNew);
         middleBefore_ = kept.middle;
         return true;
@@ -125,7 +136,9 @@ private:
         l_.order = walkOrder(l_.rows);
         fold();
         if (options_.marks < 0) return;
-        l_.order = findOrder(l_.rows, orderEffort(), starts());
+        report(ChartStep::order);
+        l_.order = findOrder(l_.rows, orderEffort(), starts(),
+                             [this](double share) { report(ChartStep::order, share); });
         for (std::int32_t left = options_.marks, batch = (left + 2) / 3; left > 0; left -= batch) {
             const std::int32_t count = std::min(left, batch);
             const std::int32_t made = markWorstLinks(l_.part, l_.chains, l_.rows, l_.order, count, l_.marked);

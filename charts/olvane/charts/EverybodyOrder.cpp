@@ -237,6 +237,7 @@ public:
         : rows_(rows),
           order_(order),
           places_(rows, order),
+          given_(effort),
           effort_(effort),
           index_(at(rows.nodeCount())),
           stamps_(rows.strands.size(), 0) {
@@ -252,12 +253,13 @@ public:
 
     // One round over all nodes. With drift, a node goes to the last of equally good places that it meets: what was
     // in its way then may not be in another's.
-    std::int64_t run(std::int32_t window, bool drift) {
+    std::int64_t run(std::int32_t window, bool drift, const ShareDone& done) {
         window_ = window;
         drift_ = drift;
         std::int64_t gain = 0;
         for (std::size_t r = 0; r < order_.nodes.size(); ++r) {
             const std::vector<std::int32_t> nodes = order_.nodes[r];
+            if (done) done(shareSpent());
             for (const std::int32_t node : nodes) {
                 if (effort_ <= 0) return gain;
                 gain += sift(node);
@@ -272,6 +274,10 @@ public:
         for (const std::int32_t node : nodes) sift(node);
     }
     std::int64_t effort() const { return effort_; }
+    double shareSpent() const {
+        if (effort_ <= 0) return 1;
+        return 1 - static_cast<double>(effort_) / static_cast<double>(given_);
+    }
 
     void finish() {
         for (std::size_t c = 0; c < order_.flipped.size(); ++c) {
@@ -397,7 +403,8 @@ private:
     const Rows& rows_;
     RowOrder& order_;
     Places places_;
-    std::int64_t effort_;
+    std::int64_t given_;
+    std::int64_t effort_;  // what is left of it
     std::int32_t window_ = 0;
     bool drift_ = false;
     std::vector<std::int32_t> index_;
@@ -425,13 +432,13 @@ void straightenOrder(const Rows& rows, RowOrder& order, int rounds) {
     }
 }
 
-std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t effort) {
+std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t effort, const ShareDone& done) {
     constexpr int kDriftsInVain = 1;
     Sifting sifting(rows, order, effort);
     const std::int32_t window = 1 << 20;
     for (int inVain = 0; inVain < kDriftsInVain && sifting.effort() > 0; ++inVain) {
-        while (sifting.effort() > 0 && sifting.run(window, false) > 0) inVain = 0;
-        if (sifting.run(window, true) > 0) inVain = 0;
+        while (sifting.effort() > 0 && sifting.run(window, false, done) > 0) inVain = 0;
+        if (sifting.run(window, true, done) > 0) inVain = 0;
     }
     sifting.finish();
     return sifting.effort();
@@ -469,7 +476,7 @@ void shuffle(RowOrder& order, std::uint32_t number) {
 constexpr std::int32_t kMostNodesToShuffle = 100;
 constexpr std::uint32_t kShuffles = 16;
 
-RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
+RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts, const ShareDone& done) {
     // After a few rounds of straightening, parts of the picture are straight; after many, all of it is.
     constexpr std::array<int, 4> kShares = {1, 0, 30, 6};
     constexpr std::int64_t kStepsOfRounds = 40'000'000;
@@ -482,7 +489,8 @@ RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts) {
         RowOrder order = walk;
         const int share = kShares[at(i)];
         if (share > 0) straightenOrder(rows, order, static_cast<int>(most / share));
-        reduceCrossings(rows, order, effort / starts);
+        const auto doneOfAll = [&](double ofStart) { done((i + ofStart) / starts); };
+        reduceCrossings(rows, order, effort / starts, done ? ShareDone(doneOfAll) : ShareDone());
         const std::int64_t crossings = starts > 1 ? countCrossings(rows, order) : 0;
         if (fewest >= 0 && crossings >= fewest) continue;
         fewest = crossings;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <vector>
 
 #include <olvane/charts/EverybodyRowsInternal.h>
@@ -27,14 +28,18 @@ RowOrder walkOrder(const Rows& rows);
 // which repeated averaging of each node with its strands approaches, from the order as it is.
 void straightenOrder(const Rows& rows, RowOrder& order, int rounds);
 
+// Is called with the share of the work that is done, from 0 to 1; may be empty.
+using ShareDone = std::function<void(double share)>;
+
 // Moves nodes along their rows, and turns chains round, for as long as that removes crossings. Returns what is
 // left of the effort.
-std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t effort);
+std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t effort,
+                             const ShareDone& done = {});
 
 // Moves these nodes alone along their rows, each to the nearest place where it crosses the fewest lines.
 void siftNodes(const Rows& rows, RowOrder& order, const std::vector<std::int32_t>& nodes);
 
 // The order with the fewest crossings that so many starts end in: a walk, straightened more or less.
-RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts);
+RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts, const ShareDone& done = {});
 
 }  // namespace olvane::charts

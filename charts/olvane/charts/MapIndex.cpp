@@ -41,11 +41,13 @@ std::int32_t quarters(double points) {
 
 class MapMaker {
 public:
-    MapMaker(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions)
+    MapMaker(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions,
+             const ChartProgress* progress)
         : graph_(graph), captions_(captions) {
         EverybodyOptions options;
         options.onePart = false;
         options.sizes = kSizes;
+        options.progress = progress;
         picture_ = everybodyChart(graph, options);
         map_.boxWidth = quarters(double{kSizes.boxWidth});
         map_.boxHeight = quarters(double{kSizes.boxHeight});
@@ -297,7 +299,8 @@ private:
 
 }  // namespace
 
-MapIndex mapIndexOf(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions) {
+MapIndex mapIndexOf(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions,
+                    const ChartProgress* progress) {
     if (captions.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("a map needs what it shows of each person");
     }
@@ -311,7 +314,7 @@ MapIndex mapIndexOf(const kin::KinGraph& graph, std::span<const kin::PersonCapti
         none.bands.assign(2, {0, 0, 0, 0});
         return none;
     }
-    return MapMaker(graph, captions).make();
+    return MapMaker(graph, captions, progress).make();
 }
 
 }  // namespace olvane::charts

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include <olvane/Export.h>
+#include <olvane/charts/ChartProgress.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/PersonCaption.h>
 
@@ -114,12 +115,14 @@ struct OLVANE_API MapIndex {
     bool operator==(const MapIndex&) const = default;
 };
 
-// The map of all parts of a family, as everybodyChart places it. captions has one entry for each person of the graph.
+// The map of all parts of a family, as everybodyChart places it. captions has one entry for each person of the graph; progress
+// is called while everybody is placed, if not null.
 //
 // Holds: the same family gives the same map on every machine.
 // Fails: std::invalid_argument where there are not as many captions as persons; std::length_error for more than
 //        2^28 persons, or a map wider or higher than 2^29 points.
-OLVANE_API MapIndex mapIndexOf(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions);
+OLVANE_API MapIndex mapIndexOf(const kin::KinGraph& graph, std::span<const kin::PersonCaption> captions,
+                               const ChartProgress* progress = nullptr);
 
 // A map as bytes, and back.
 //

@@ -7,6 +7,7 @@
 #include <span>
 
 #include <olvane/boundary/TypedLayout.h>
+#include <olvane/charts/ChartProgress.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Language.h>
 #include <olvane/picture/Picture.h>
@@ -85,6 +86,8 @@ struct ChartRequest {
     const picture::Picture* earlier = nullptr;
     double aspect =
         0;  // everybody: width by height of the paper that wide generations are folded for; 0 for none
+    const ChartProgress* progress =
+        nullptr;  // everybody: is called meanwhile, if not null; only during the call
 };
 
 }  // namespace olvane::charts

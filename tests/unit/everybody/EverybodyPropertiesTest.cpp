@@ -14,6 +14,7 @@
 #include <set>
 #include <string>
 #include <tuple>
+#include <utility>
 #include <vector>
 
 #include <PlainJudge.h>
@@ -21,6 +22,7 @@
 
 namespace {
 
+using olvane::charts::ChartStep;
 using olvane::charts::Direction;
 using olvane::charts::everybodyChart;
 using olvane::charts::EverybodyOptions;
@@ -184,6 +186,46 @@ TEST(Everybody, isTheSameForTheSameFamily) {
                       std::tie(other.lines[i].x1, other.lines[i].y1, other.lines[i].x2, other.lines[i].y2));
         }
     }
+}
+
+// The steps in their order, shares that do not shrink, and the same boxes and lines as without anybody to report to.
+TEST(Everybody, reportsItsProgressAndIsTheSameForIt) {
+    const KinGraph graph = olvane::test::hostileKin(5, 1500, 1500);
+    EverybodyOptions options;
+    options.onePart = false;
+    const Picture plain = everybodyChart(graph, options);
+    std::vector<std::pair<ChartStep, double>> reports;
+    const olvane::charts::ChartProgress progress = [&reports](ChartStep step, double share) {
+        reports.emplace_back(step, share);
+    };
+    options.progress = &progress;
+    const Picture reported = everybodyChart(graph, options);
+    EXPECT_TRUE(std::is_sorted(reports.begin(), reports.end()));
+    for (const ChartStep step : {ChartStep::rows, ChartStep::order, ChartStep::places, ChartStep::lines}) {
+        EXPECT_TRUE(
+            std::any_of(reports.begin(), reports.end(), [&](const auto& r) { return r.first == step; }));
+    }
+    ASSERT_FALSE(reports.empty());
+    EXPECT_TRUE(std::all_of(reports.begin(), reports.end(),
+                            [](const auto& r) { return r.second >= 0 && r.second <= 1; }));
+    ASSERT_EQ(reported.boxes.size(), plain.boxes.size());
+    for (std::size_t i = 0; i < plain.boxes.size(); ++i) {
+        EXPECT_EQ(std::tie(reported.boxes[i].x, reported.boxes[i].y),
+                  std::tie(plain.boxes[i].x, plain.boxes[i].y));
+    }
+    EXPECT_EQ(reported.lines.size(), plain.lines.size());
+}
+
+TEST(Everybody, endsWhereItsProgressThrows) {
+    struct GivenUp {};
+    const KinGraph graph = olvane::test::hostileKin(5, 1500, 1500);
+    EverybodyOptions options;
+    options.onePart = false;
+    const olvane::charts::ChartProgress progress = [](ChartStep step, double) {
+        if (step == ChartStep::places) throw GivenUp();
+    };
+    options.progress = &progress;
+    EXPECT_THROW(everybodyChart(graph, options), GivenUp);
 }
 
 TEST(Everybody, runsInFourDirectionsAlike) {

@@ -1,0 +1,89 @@
+#!/usr/bin/env python3
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+"""Long work shows on a terminal how far it is, in a line that is gone at the end; in a pipe, and of quick work, nothing.
+
+Usage: progress_on_a_terminal.py PATH/TO/olvane GEDCOMFILE
+"""
+
+import os
+import pty
+import subprocess
+import sys
+import tempfile
+import time
+
+from colours_on_a_terminal import expect, on_terminal
+
+CLEAR = b"\r\x1b[K"
+PERSONS = 6000
+
+
+def made_family():
+    """Couples whose children marry far away, so that lines cross and the order takes long."""
+    lines = ["0 HEAD"]
+    for person in range(PERSONS):
+        lines += [f"0 @I{person}@ INDI", f"1 NAME N{person} /S/"]
+    couples = PERSONS // 2
+    for couple in range(couples):
+        lines += [f"0 @F{couple}@ FAM", f"1 HUSB @I{2 * couple}@", f"1 WIFE @I{2 * couple + 1}@"]
+        row, place = divmod(couple, 100)
+        if row + 1 < couples // 100:
+            below = 200 * (row + 1)
+            lines += [f"1 CHIL @I{below + 2 * place}@", f"1 CHIL @I{below + 2 * ((41 * place + 13) % 100) + 1}@"]
+    return "\n".join([*lines, "0 TRLR", ""])
+
+
+def shown(text):
+    """What stood in the line, one after the other."""
+    return [part for part in text.split(CLEAR) if part]
+
+
+def check(command, words):
+    text = on_terminal(command)
+    expect(text.startswith(CLEAR) and text.endswith(CLEAR), f"not a line that is removed: {text[-200:]!r}")
+    expect(b"\n" not in text, "more than one line")
+    for word in words:
+        expect(any(word in part for part in shown(text)), f"{word!r} is not in {shown(text)}")
+    piped = subprocess.run(command, capture_output=True, check=True)
+    expect(not piped.stderr, f"progress in a pipe: {piped.stderr[:200]!r}")
+
+
+def batch_with_a_pause(olvane, file):
+    """What a batch shows whose second focus comes after the time in which nothing is shown."""
+    leader, follower = pty.openpty()
+    command = [olvane, "batch", file, "--unbuffered", "--focus-from", "-"]
+    with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.DEVNULL, stderr=follower) as process:
+        os.close(follower)
+        process.stdin.write(b"1\n")
+        process.stdin.flush()
+        time.sleep(0.8)
+        process.stdin.write(b"2\n")
+        process.stdin.close()
+        text = b""
+        try:
+            while part := os.read(leader, 4096):
+                text += part
+        except OSError:  # the other end is closed
+            pass
+    os.close(leader)
+    return text
+
+
+def main():
+    olvane, small = sys.argv[1:3]
+    with tempfile.TemporaryDirectory() as folder:
+        file = os.path.join(folder, "made.ged")
+        with open(file, "w", encoding="utf-8") as made:
+            made.write(made_family())
+        everybody = ["--view", "everybody", "--effort", "4"]
+        check([olvane, "draw", file, "--focus", "1", "-o", "-", *everybody], [b"ordering rows: ", b"drawing"])
+        check([olvane, "layout", file, "--focus", "1", "--format", "json", *everybody], [b"%", b"routing lines"])
+    slow = batch_with_a_pause(olvane, small)
+    expect(shown(slow)[-1:] == [b"2"] and slow.endswith(CLEAR), f"no count of a batch: {slow!r}")
+    quick = on_terminal([olvane, "layout", small, "--focus", "1"])
+    expect(not quick, f"progress of quick work: {quick!r}")
+
+
+if __name__ == "__main__":
+    main()
