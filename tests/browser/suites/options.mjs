@@ -101,6 +101,22 @@ describe("options", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("the years of several marriages of one person stand apart", async () => {
+        const visit = await visitDarwins("#person=I1&show=marriage");
+        await visit.fit();
+        const labels = await visit.page.locator("#tree .marriage-label").evaluateAll((all) =>
+            all.map((label) => {
+                const { left, right, top, bottom } = label.getBoundingClientRect();
+                return { year: label.textContent, left, right, top, bottom };
+            }),
+        );
+        assert.ok(labels.length > 10, String(labels.length));
+        const overlap = (a, b) => a.left < b.right && b.left < a.right && a.top < b.bottom && b.top < a.bottom;
+        const met = labels.flatMap((a, i) => labels.slice(i + 1).flatMap((b) => (overlap(a, b) ? [[a, b]] : [])));
+        assert.deepEqual(met, []);
+        await visit.end();
+    });
+
     test("generations are packed tighter where a chart can be, and a link keeps that", async () => {
         const visit = await visitDarwins("#person=I5&view=descendants&down=3");
         await visit.fit();

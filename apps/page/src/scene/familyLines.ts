@@ -30,10 +30,12 @@ export function drawFamily({ index, family }: FamilyLines, label: string): SVGGE
     return group;
 }
 
-// Above the first level marriage line, else beside an upright one.
+// Above the longest level marriage line, where lines of several marriages have parted; else beside an upright one.
 function appendLabel(group: SVGGElement, lines: readonly PictureLine[], label: string): void {
     const marriages = lines.filter(({ role }) => role === "marriage");
-    const level = marriages.find(({ x1, y1, x2, y2 }) => y1 === y2 && x1 !== x2);
+    const lengthOf = ({ x1, x2 }: PictureLine): number => Math.abs(x2 - x1);
+    const isLevel = ({ x1, y1, x2, y2 }: PictureLine): boolean => y1 === y2 && x1 !== x2;
+    const level = marriages.filter(isLevel).sort((a, b) => lengthOf(b) - lengthOf(a))[0];
     const line = level ?? marriages[0];
     if (!line) return;
     const x = (line.x1 + line.x2) / 2 + (level ? 0 : kLabelLift);
