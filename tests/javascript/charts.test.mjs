@@ -106,6 +106,8 @@ const reason = !command
     ? "no command"
     : !existsSync(royals) && "OLVANE_GEDCOM_DIR is not set, or has no history/royal92.ged";
 test("every view of a large family is the same in WebAssembly and natively", { skip: reason }, () => {
-    const inTime = VIEWS.filter((view) => view !== "everybody");
-    compare(royals, [1, 52, 700], 57, inTime);
+    // Everybody is the same persons for nearly any focus, and takes the longest.
+    const others = VIEWS.filter((view) => view !== "everybody");
+    compare(royals, [1, 52, 700], 57, others);
+    compare(royals, [1], 57, ["everybody"]);
 });
