@@ -141,7 +141,7 @@ Drawn drawWhole(const gedcom::GedcomData& data, const DrawOptions& options) {
 
 Drawn drawOnSheets(const gedcom::GedcomData& data, const DrawOptions& options) {
     TerminalProgress progress;
-    PaperDrawing drawn = drawOnPaper(
+    draw::PaperDrawing drawn = drawOnPaper(
         options.paper, options.request,
         [&](const LayoutRequest& request) { return contentOf(data, options, request, progress); },
         [&](const draw::DrawingContent& content) { return drawingOptions(options, content); });

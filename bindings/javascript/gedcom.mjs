@@ -9,7 +9,7 @@ import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { readPicture } from "./picture.mjs";
-import { drawingNumbers, factBits, pictureNumbers } from "./pictureOptions.mjs";
+import { drawingNumbers, factBits, paperNumbers, pictureNumbers } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { searchWith } from "./search.mjs";
@@ -104,6 +104,18 @@ function detailedFactFrom([tag, value, date, place, details]) {
 
 function detailedNameFrom([text, type, nickname, details]) {
     return { text, type, nickname, details: detailsFrom(details) };
+}
+
+function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes, sheets]) {
+    return {
+        width: width / 1000,
+        height: height / 1000,
+        scale: scale / 1000,
+        smallestName: smallestName / 1000,
+        smallestText: smallestText / 1000,
+        cutBoxes,
+        sheets: sheets.map(([row, column, svg]) => ({ row, column, svg })),
+    };
 }
 
 // Closes what nobody holds any more and nobody closed.
@@ -227,6 +239,21 @@ export class GedcomFile {
         return this.#instance.text(pointer);
     }
 
+    sheets(focus, options = {}, drawing = {}, onPaper = {}) {
+        const { exports } = this.#instance;
+        const file = this.#opened();
+        const { theme, boxes, facts, title } = drawingNumbers(drawing);
+        const { paper, rows, columns, scale } = paperNumbers(onPaper);
+        this.#setPictureOptions(focus, options);
+        const pointer = this.#instance.withText(title, (text) =>
+            this.#instance.withText(paper, (name) =>
+                exports.gedcom_sheets(file, focus, theme, boxes, facts, text, name, rows, columns, scale),
+            ),
+        );
+        if (pointer === 0) this.#refuse();
+        return sheetsFrom(JSON.parse(this.#instance.text(pointer)));
+    }
+
     #setPictureOptions(focus, options) {
         const { exports } = this.#instance;
         const numbers = pictureNumbers(options);
@@ -240,7 +267,7 @@ export class GedcomFile {
 
     #refuse() {
         const message = this.#instance.text(this.#instance.exports.last_text());
-        const status = message === "too large" ? "tooLarge" : "layoutFailed";
+        const status = message === "too large" || message === "too many sheets" ? "tooLarge" : "layoutFailed";
         throw new LayoutError(status, message, "", []);
     }
 

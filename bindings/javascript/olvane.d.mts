@@ -237,6 +237,39 @@ export interface DrawingOptions {
     readonly title?: string | undefined;
 }
 
+/** Paper to draw on. */
+export interface PaperOptions {
+    /** A4 to A0, letter, or WIDTHxHEIGHT in millimetres. A4 if not given. */
+    readonly paper?: string | undefined;
+    /** So many sheets, 1 to 100 each way, and the picture as large as they allow. 1 if not given. */
+    readonly rows?: number | undefined;
+    readonly columns?: number | undefined;
+    /** By the size at 96 px an inch, on as many sheets as that takes; rows and columns do not count then. */
+    readonly scale?: number | undefined;
+}
+
+/** One sheet of paper, as the text of an SVG file; rows and columns count from 0. */
+export interface PaperSheet {
+    readonly row: number;
+    readonly column: number;
+    readonly svg: string;
+}
+
+/** A picture on sheets of paper; blank sheets are left out. */
+export interface PaperSheets {
+    /** Of one sheet as it lies, in millimetres. */
+    readonly width: number;
+    readonly height: number;
+    /** By the size at 96 px an inch. */
+    readonly scale: number;
+    /** In points on paper; 0 where there is none. */
+    readonly smallestName: number;
+    readonly smallestText: number;
+    /** Boxes that no sheet shows whole. */
+    readonly cutBoxes: number;
+    readonly sheets: readonly PaperSheet[];
+}
+
 /** A name by its parts; either may be empty. */
 export interface NameParts {
     readonly given: string;
@@ -639,6 +672,8 @@ export class GedcomFile {
      * in options are those of the boxes' form instead. Throws as picture does.
      */
     svg(focus: number, options?: PictureOptions, drawing?: DrawingOptions): string;
+    /** The same picture on sheets of paper, the same bytes that the command draws with --fit. */
+    sheets(focus: number, options?: PictureOptions, drawing?: DrawingOptions, paper?: PaperOptions): PaperSheets;
     /** As that of Olvane. */
     readonly texts: Texts;
     /** Everybody as a map, as bytes; olvane/charts/MapIndex.h of the C++ sources describes their form. */

@@ -109,6 +109,17 @@ export function drawingNumbers({ theme = "light", boxes = "usual", show = [], ti
     };
 }
 
+/** A paper and its sheets, with the command's meaning. */
+export function paperNumbers({ paper = "A4", rows = 1, columns = 1, scale = 0, ...rest }) {
+    const unknown = Object.keys(rest)[0];
+    if (unknown !== undefined) throw new TypeError(`there is no option ${unknown}, but paper, rows, columns, scale`);
+    for (const [name, value] of Object.entries({ rows, columns })) plainNumber(name, value, { least: 1, most: 100 });
+    if (scale !== 0 && !(scale >= 0.01 && scale <= 100)) {
+        throw new RangeError(`scale is ${quoted(scale)}, and takes 0 or a number of 0.01 to 100`);
+    }
+    return { paper: String(paper), rows, columns, scale };
+}
+
 /** All options as numbers, in the order of set_picture_options. */
 export function pictureNumbers(options) {
     if (typeof options !== "object" || options === null) {

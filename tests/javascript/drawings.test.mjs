@@ -7,8 +7,9 @@
 import assert from "node:assert/strict";
 import { execFile } from "node:child_process";
 import { existsSync } from "node:fs";
-import { readFile } from "node:fs/promises";
-import { availableParallelism } from "node:os";
+import { mkdtemp, readdir, readFile, rm } from "node:fs/promises";
+import { availableParallelism, tmpdir } from "node:os";
+import { join } from "node:path";
 import { describe, test } from "node:test";
 import { promisify } from "node:util";
 
@@ -134,6 +135,51 @@ describe("what the module draws", () => {
         assert.throws(() => file.svg(1, {}, { show: ["hats"] }), /show is "hats"/);
         assert.throws(() => file.svg(1, {}, { colour: "red" }), /there is no option colour/);
         assert.throws(() => file.svg(99999), { status: "invalidPerson" });
+        file.close();
+    });
+});
+
+const kPapers = {
+    oneSheet: [{ paper: "A4" }, ["--fit", "A4"], 1],
+    poster: [{ paper: "letter", rows: 2, columns: 3 }, ["--fit", "letter", "--sheets", "2x3"], 6],
+    scaled: [{ paper: "A3", scale: 1 }, ["--fit", "A3", "--scale", "1"], 0],
+};
+
+describe("what the module draws on paper", () => {
+    for (const [name, [paper, extra, most]] of Object.entries(kPapers)) {
+        test(`is what the command draws: ${name}`, async () => {
+            const file = await fileOf(kSample);
+            const folder = await mkdtemp(join(tmpdir(), "olvane-sheets-"));
+            try {
+                for (const view of ["family", "everybody"]) {
+                    const { sheets, smallestName } = file.sheets(1, { view, unknownParents: false }, {}, paper);
+                    const out = join(folder, `${view}.svg`);
+                    const args = ["draw", kSample, "--focus", "1", "--view", view, "-o", out, ...extra];
+                    const { stderr } = await run(kCommand, args);
+                    const names = (await readdir(folder)).filter((entry) => entry.startsWith(view)).sort();
+                    const drawn = await Promise.all(names.map((entry) => readFile(join(folder, entry), "utf8")));
+                    assert.deepEqual(
+                        sheets.map(({ svg }) => svg),
+                        drawn,
+                    );
+                    assert.ok(sheets.length >= 1 && (most === 0 ? sheets.length > 1 : sheets.length <= most));
+                    // Rounded once more here: half a tenth beside the command's figure at most.
+                    const printed = Number(/names of at least ([0-9.]+) points/.exec(stderr)[1]);
+                    assert.ok(Math.abs(smallestName - printed) <= 0.0511, `${smallestName} ${printed}`);
+                }
+            } finally {
+                await rm(folder, { recursive: true });
+                file.close();
+            }
+        });
+    }
+
+    test("is refused for no paper, wrong numbers and too many sheets", async () => {
+        const file = await fileOf(kSample);
+        assert.throws(() => file.sheets(1, {}, {}, { paper: "B9" }), /B9 is no paper/);
+        assert.throws(() => file.sheets(1, {}, {}, { rows: 0 }), /rows is 0/);
+        assert.throws(() => file.sheets(1, {}, {}, { pages: 2 }), /there is no option pages/);
+        assert.throws(() => file.sheets(1, {}, {}, { scale: 100 }), { status: "tooLarge" });
         file.close();
     });
 });

@@ -1,9 +1,11 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A picture of an open GEDCOM file as SVG, the same bytes that the command draws, and what its boxes and lines say.
+// A picture of an open GEDCOM file as SVG, whole or on sheets of paper, the same bytes that the command draws, and what
+// its boxes and lines say.
 
 #include <array>
+#include <cmath>
 #include <cstddef>
 #include <exception>
 #include <stdexcept>
@@ -12,6 +14,8 @@
 
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Views.h>
+#include <olvane/draw/Paper.h>
+#include <olvane/draw/PaperDrawing.h>
 #include <olvane/draw/SvgDrawing.h>
 #include <olvane/source/GedcomLabels.h>
 
@@ -61,10 +65,15 @@ std::string labelText(const kin::PersonLabel& label) {
     return std::move(json).take();
 }
 
-// boxes: 0 for what suits the view, 1 for tall ones, 2 for wide ones.
-PictureRequest requestOnPaper(kin::Place focus, int boxes) {
+// boxes: 0 for what suits the view, 1 for tall ones, 2 for wide ones. Folded for an aspect other than 0, on which the
+// sizes depend.
+PictureRequest requestOnPaper(kin::Place focus, int boxes, double aspect = 0) {
     PictureRequest request = requestOf(focus);
     charts::ChartRequest& chart = request.view.chart;
+    if (aspect > 0) {
+        chart.aspect = aspect;
+        chart.compact = true;
+    }
     const charts::BoxForm usual = charts::usualBoxForm(chart.view, chart.direction);
     charts::setBoxForm(chart, boxes == 0   ? usual
                               : boxes == 1 ? charts::BoxForm::tall
@@ -72,32 +81,102 @@ PictureRequest requestOnPaper(kin::Place focus, int boxes) {
     return request;
 }
 
+// An empty title is made of the focus's name; another one stands above the picture as well.
+draw::DrawingOptions drawingOf(const PictureRequest& request, const draw::DrawingContent& content, int theme,
+                               const char* title) {
+    draw::DrawingOptions options;
+    options.theme = &themeOf(theme);
+    options.headline = *title != '\0';
+    options.title =
+        options.headline ? title : draw::titleOf(charts::nameOf(request.view.chart.view), content);
+    return options;
+}
+
+// Lengths and sizes are in thousandths, as JavaScript divides them.
+std::string sheetsJson(const draw::PaperDrawing& drawn) {
+    const draw::SheetPlan& plan = drawn.drawing.plan;
+    JsonText json;
+    json.begin();
+    for (const double value :
+         {plan.paper.width, plan.paper.height, drawn.scale, drawn.points.smallestName, drawn.points.smallest})
+        json.number(std::llround(value * 1000));
+    json.number(static_cast<long long>(plan.cutBoxes));
+    json.begin();
+    for (std::size_t i = 0; i < plan.sheets.size(); ++i) {
+        json.begin();
+        json.number(plan.sheets[i].row);
+        json.number(plan.sheets[i].column);
+        json.string(drawn.drawing.sheets[i].svg);
+        json.end();
+    }
+    json.end();
+    json.end();
+    return std::move(json).take();
+}
+
+// What a failed drawing has to say; null in its place.
+const char* refusal() {
+    try {
+        throw;
+    } catch (const draw::TooManySheets&) {
+        lastText = "too many sheets";
+    } catch (const std::length_error&) {
+        lastText = "too large";
+    } catch (const std::exception& error) {
+        lastText = error.what();
+    }
+    return nullptr;
+}
+
 }  // namespace
 }  // namespace olvane::js
 
 using namespace olvane;
 
-// With the picture's options, sizes apart. An empty title is made of the focus's name; another one stands above the
-// picture as well. Null for a picture that is refused; last_text then says why.
+// With the picture's options, sizes apart. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_svg")
 const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
                       const char* title) {
     try {
         const js::PictureRequest request = js::requestOnPaper(focus - 1, boxes);
         const draw::DrawingContent content = js::contentOf(*file, request, facts);
-        draw::DrawingOptions options;
-        options.theme = &js::themeOf(theme);
-        options.headline = *title != '\0';
-        options.title =
-            options.headline ? title : draw::titleOf(charts::nameOf(request.view.chart.view), content);
-        js::lastText = draw::drawSvg(content, options).svg;
+        js::lastText = draw::drawSvg(content, js::drawingOf(request, content, theme, title)).svg;
         return js::lastText.c_str();
-    } catch (const std::length_error&) {
-        js::lastText = "too large";
-    } catch (const std::exception& error) {
-        js::lastText = error.what();
+    } catch (...) {
+        return js::refusal();
     }
-    return nullptr;
+}
+
+// The same on sheets of paper, as JSON: width and height of a sheet in millimetres, the scale, the sizes of the
+// smallest name and of the smallest text in points, all in thousandths; how many boxes are on no sheet whole; and of
+// each sheet its row, its column and its SVG. scale is by the size at 96 px an inch, 0 for what fits rows and columns.
+OLVANE_EXPORT("gedcom_sheets")
+const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
+                         const char* title, const char* paper, int rows, int columns, double scale) {
+    try {
+        const auto size = draw::paperOf(paper);
+        if (!size) throw std::invalid_argument(std::string(paper) + " is no paper");
+        draw::SheetRequest sheets;
+        sheets.paper = *size;
+        sheets.rows = rows;
+        sheets.columns = columns;
+        sheets.scale = scale * draw::kMillimetresOfPx;
+        draw::PaperSubject subject;
+        subject.folded = js::requestOf(focus - 1).view.chart.view == charts::View::everybody;
+        // Everybody takes less of the paper in wide boxes.
+        const int form = subject.folded && boxes == 0 ? 2 : boxes;
+        const js::PictureRequest request = js::requestOnPaper(focus - 1, form);
+        subject.contentOf = [&](double aspect) {
+            return js::contentOf(*file, js::requestOnPaper(focus - 1, form, aspect), facts);
+        };
+        subject.optionsOf = [&](const draw::DrawingContent& content) {
+            return js::drawingOf(request, content, theme, title);
+        };
+        js::lastText = js::sheetsJson(draw::drawOnPaper(sheets, subject));
+        return js::lastText.c_str();
+    } catch (...) {
+        return js::refusal();
+    }
 }
 
 // Birth, death and further lines of a person's box; facts as for gedcom_svg.

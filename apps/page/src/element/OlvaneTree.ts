@@ -6,7 +6,16 @@
 // no dialog and stores nothing. Everything inside lies in its own shadow tree, so that any number of them stand
 // on one page.
 
-import { type DrawingTheme, type GedcomFile, LayoutError, type Olvane, type Person, type PictureOptions } from "olvane";
+import {
+    type DrawingTheme,
+    type GedcomFile,
+    LayoutError,
+    type Olvane,
+    type PaperOptions,
+    type PaperSheets,
+    type Person,
+    type PictureOptions,
+} from "olvane";
 import { html, setAttributes, svg } from "../base/dom";
 import type { ViewName } from "../base/views";
 import { type Messages, messagesFor } from "../messages";
@@ -351,6 +360,14 @@ export class OlvaneTree extends HTMLElement {
         const { opened, shownState } = this;
         return opened && shownState && this.picture
             ? opened.svg(shownState, theme, this.messages.language as PictureOptions["language"])
+            : null;
+    }
+
+    /** The whole picture on sheets of paper, in its colours; null before any. */
+    sheets(paper: PaperOptions): PaperSheets | null {
+        const { opened, shownState } = this;
+        return opened && shownState && this.picture
+            ? opened.sheets(shownState, paper, this.messages.language as PictureOptions["language"])
             : null;
     }
 

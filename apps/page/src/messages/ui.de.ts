@@ -120,6 +120,17 @@ export const uiGerman: UiMessages = {
     saveSvg: "Als SVG sichern",
     savePng: "Als PNG sichern",
     print: "Drucken…",
+    paper: {
+        title: "Auf gewähltem Papier oder als Poster drucken…",
+        paper: "Papier",
+        letter: "Letter (US-Brief)",
+        rows: "Reihen von Blättern",
+        columns: "Spalten von Blättern",
+        names: (sheets, points) =>
+            `${sheets} ${sheets === 1 ? "Blatt" : "Blätter"}, Namen mit mindestens ${points} Punkt.`,
+        cut: (boxes) =>
+            boxes === 1 ? "1 Kasten steht auf keinem Blatt ganz." : `${boxes} Kästen stehen auf keinem Blatt ganz.`,
+    },
     saved: (name) => `Gesichert als ${name}.`,
     savedSmaller: (name, percent) =>
         `Gesichert als ${name}, in ${percent} % der Größe: größer zeichnen Browser nicht. SVG hat keine Grenze.`,

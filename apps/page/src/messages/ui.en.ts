@@ -119,6 +119,16 @@ export const uiEnglish: UiMessages = {
     saveSvg: "Save as SVG",
     savePng: "Save as PNG",
     print: "Print…",
+    paper: {
+        title: "Print on chosen paper or as a poster…",
+        paper: "Paper",
+        letter: "Letter",
+        rows: "Rows of sheets",
+        columns: "Columns of sheets",
+        names: (sheets, points) =>
+            `${sheets} ${sheets === 1 ? "sheet" : "sheets"}, names of at least ${points} points.`,
+        cut: (boxes) => (boxes === 1 ? "1 box is on no sheet whole." : `${boxes} boxes are on no sheet whole.`),
+    },
     saved: (name) => `Saved as ${name}.`,
     savedSmaller: (name, percent) =>
         `Saved as ${name}, at ${percent} % of its size: browsers draw no larger one. SVG has no such limit.`,

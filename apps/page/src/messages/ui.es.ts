@@ -124,6 +124,19 @@ export const uiSpanish: UiMessages = {
     saveSvg: "Guardar como SVG",
     savePng: "Guardar como PNG",
     print: "Imprimir…",
+    paper: {
+        title: "Imprimir en el papel elegido o como póster…",
+        paper: "Papel",
+        letter: "Carta",
+        rows: "Filas de hojas",
+        columns: "Columnas de hojas",
+        names: (sheets, points) =>
+            `${sheets} ${sheets === 1 ? "hoja" : "hojas"}, nombres de al menos ${points} puntos.`,
+        cut: (boxes) =>
+            boxes === 1
+                ? "1 recuadro no está entero en ninguna hoja."
+                : `${boxes} recuadros no están enteros en ninguna hoja.`,
+    },
     saved: (name) => `Guardado como ${name}.`,
     savedSmaller: (name, percent) =>
         `Guardado como ${name}, al ${percent} % de su tamaño: los navegadores no dibujan nada mayor. SVG no tiene ese límite.`,

@@ -101,6 +101,16 @@ export interface UiMessages {
     readonly saveSvg: string;
     readonly savePng: string;
     readonly print: string;
+    // Printing on chosen paper; points is a number as the language writes it.
+    readonly paper: {
+        readonly title: string;
+        readonly paper: string;
+        readonly letter: string;
+        readonly rows: string;
+        readonly columns: string;
+        readonly names: (sheets: number, points: string) => string;
+        readonly cut: (boxes: number) => string;
+    };
     readonly saved: (name: string) => string;
     readonly savedSmaller: (name: string, percent: number) => string;
     readonly pictureFailed: string;

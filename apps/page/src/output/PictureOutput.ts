@@ -3,9 +3,10 @@
 
 // The ways out of the page: the picture as SVG or PNG in the colours of the screen, and on paper in its own.
 
-import type { DrawingTheme } from "olvane";
+import type { DrawingTheme, PaperOptions, PaperSheets } from "olvane";
 import type { UiMessages } from "../messages/ui";
 import type { Notices } from "../ui/Notices";
+import { PaperDialog } from "./PaperDialog";
 import { PrintSheet } from "./printing";
 import { pngOf, saveFile, svgBlob } from "./saving";
 
@@ -15,19 +16,36 @@ export interface Subject {
     readonly title: string;
     // The text of an SVG file.
     drawing(theme: DrawingTheme): string;
+    // On paper, in the colours of paper.
+    sheets(paper: PaperOptions): PaperSheets | null;
 }
 
 export class PictureOutput {
-    readonly sheet = new PrintSheet(() => {
-        const subject = this.subject();
-        return subject && { title: subject.title, drawing: subject.drawing("print") };
-    });
+    readonly sheet = new PrintSheet(
+        () => this.paper?.sheets ?? null,
+        () => {
+            const subject = this.subject();
+            return subject && { title: subject.title, drawing: subject.drawing("print") };
+        },
+    );
+    private paper: PaperDialog | null = null;
 
     // subject gives what is to be seen at the time, or null before any family is open.
     constructor(
         private readonly subject: () => Subject | null,
         private readonly notices: Notices,
     ) {}
+
+    /** Makes what holds words; the dialog is to stand in the document. */
+    rebuild(ui: UiMessages): HTMLDialogElement {
+        this.paper?.element.remove();
+        this.paper = new PaperDialog(ui, (paper) => this.subject()?.sheets(paper) ?? null);
+        return this.paper.element;
+    }
+
+    choosePaper(): void {
+        if (this.subject()) this.paper?.open();
+    }
 
     saveSvg(ui: UiMessages): void {
         const subject = this.subject();

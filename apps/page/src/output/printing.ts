@@ -2,8 +2,9 @@
 // SPDX-License-Identifier: MIT
 
 // Puts the whole picture on one sheet of paper under its title, lying or standing as suits it, in colours made
-// for paper.
+// for paper; or on the sheets that were chosen, each on a page of its own.
 
+import type { PaperSheets } from "olvane";
 import { html } from "../base/dom";
 import { drawingElement } from "./saving";
 
@@ -15,28 +16,50 @@ export interface Printed {
 
 export class PrintSheet {
     readonly element = html("div", { id: "print-sheet", "aria-hidden": "true" });
-    private orientation: CSSStyleSheet | null = null;
+    private pageRule: CSSStyleSheet | null = null;
 
-    // draw makes the picture whenever the browser is about to print, or gives null when there is none.
-    constructor(draw: () => Printed | null) {
-        addEventListener("beforeprint", () => this.fill(draw()));
+    // Asked whenever the browser is about to print: sheets for those that were chosen, null where none were; draw
+    // for the picture, null when there is none.
+    constructor(sheets: () => PaperSheets | null, draw: () => Printed | null) {
+        addEventListener("beforeprint", () => {
+            this.empty();
+            const chosen = sheets();
+            if (chosen) this.fillSheets(chosen);
+            else this.fill(draw());
+        });
         addEventListener("afterprint", () => this.empty());
     }
 
     private fill(printed: Printed | null): void {
-        this.empty();
         if (!printed) return;
         const { svg, width, height } = drawingElement(printed.drawing);
         svg.setAttribute("width", "100%");
         svg.setAttribute("height", "100%");
         this.element.append(html("p", { dir: "auto" }, printed.title), svg);
-        this.orientation = new CSSStyleSheet();
-        this.orientation.insertRule(`@page { size: ${width > height ? "landscape" : "portrait"}; margin: 10mm; }`);
-        document.adoptedStyleSheets = [...document.adoptedStyleSheets, this.orientation];
+        this.setPage(`size: ${width > height ? "landscape" : "portrait"}; margin: 10mm;`);
+    }
+
+    // The margins are part of each sheet.
+    private fillSheets({ width, height, sheets }: PaperSheets): void {
+        this.element.classList.add("sheets");
+        for (const { svg } of sheets) {
+            const page = html("div", { class: "page" }, drawingElement(svg).svg);
+            // A page that is as high as the paper makes a blank one after it in some browsers.
+            page.style.height = `${height - 0.5}mm`;
+            this.element.append(page);
+        }
+        this.setPage(`size: ${width}mm ${height}mm; margin: 0;`);
+    }
+
+    private setPage(rules: string): void {
+        this.pageRule = new CSSStyleSheet();
+        this.pageRule.insertRule(`@page { ${rules} }`);
+        document.adoptedStyleSheets = [...document.adoptedStyleSheets, this.pageRule];
     }
 
     private empty(): void {
         this.element.replaceChildren();
-        document.adoptedStyleSheets = document.adoptedStyleSheets.filter((sheet) => sheet !== this.orientation);
+        this.element.classList.remove("sheets");
+        document.adoptedStyleSheets = document.adoptedStyleSheets.filter((sheet) => sheet !== this.pageRule);
     }
 }

@@ -79,6 +79,7 @@ export class App implements ChromeActions {
     private unread: EmbeddedFamily | null = null;
     private isLayingOut = false; // a map
     private readonly output = new PictureOutput(() => this.subject(), this.notices);
+    private paperDialog!: HTMLDialogElement;
     private readonly files: FileOpening;
 
     constructor(
@@ -503,6 +504,10 @@ export class App implements ChromeActions {
         window.print();
     }
 
+    choosePaper(): void {
+        this.output.choosePaper();
+    }
+
     togglePanel(): void {
         this.panelOpen = !this.panelOpen;
         remember("panel", this.panelOpen ? "yes" : "no");
@@ -582,6 +587,7 @@ export class App implements ChromeActions {
         this.notices.setDismissLabel(ui.errors.dismiss);
         this.cover.textContent = ui.welcome.dropNow;
         this.maps.rebuild(ui);
+        this.paperDialog = this.output.rebuild(ui);
         this.arrange();
     }
 
@@ -602,7 +608,7 @@ export class App implements ChromeActions {
         if (!main.isConnected) this.root.append(main);
         main.before(chrome.bar);
         if (!this.firstHint.hidden) main.before(this.firstHint);
-        this.root.append(chrome.keys, chrome.diagnostics, ...always);
+        this.root.append(chrome.keys, chrome.diagnostics, this.paperDialog, ...always);
         const count = family?.persons.length ?? this.maps.count;
         chrome.showFamily(family?.title ?? document.title, this.ui.personCount(count));
         this.showKept();
@@ -644,6 +650,7 @@ export class App implements ChromeActions {
             title: shownTitle,
             name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)),
             drawing: (theme) => this.tree.drawing(theme) ?? "",
+            sheets: (paper) => this.tree.sheets(paper),
         };
     }
 

@@ -37,6 +37,7 @@ export interface ChromeActions extends SearchSource, ViewActions {
     setPhotos(shown: boolean): void;
     savePng(): void;
     print(): void;
+    choosePaper(): void;
     togglePanel(): void;
 }
 
@@ -362,6 +363,7 @@ export class Chrome {
             item("save-svg", ui.saveSvg, () => actions.saveSvg()),
             item("save-png", ui.savePng, () => actions.savePng()),
             item("print", ui.print, () => actions.print()),
+            item("print-sheets", ui.paper.title, () => actions.choosePaper()),
             item("open-file", ui.openFile, () => actions.openFile()),
             this.encodingRow,
             this.keepRow,

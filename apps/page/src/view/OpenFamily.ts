@@ -3,7 +3,15 @@
 
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
-import type { DrawingTheme, GedcomFamily as Family, GedcomFile, Person, PictureOptions } from "olvane";
+import type {
+    DrawingTheme,
+    GedcomFamily as Family,
+    GedcomFile,
+    PaperOptions,
+    PaperSheets,
+    Person,
+    PictureOptions,
+} from "olvane";
 import { Photographs } from "../engine/photographs";
 import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
@@ -38,6 +46,10 @@ export class OpenFamily {
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
         return this.file.svg(state.focus, optionsOf(state, language), { theme, show: state.show });
+    }
+
+    sheets(state: ViewState, paper: PaperOptions, language: PictureOptions["language"]): PaperSheets {
+        return this.file.sheets(state.focus, optionsOf(state, language), { theme: "print", show: state.show }, paper);
     }
 
     // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.
