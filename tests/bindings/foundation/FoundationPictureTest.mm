@@ -1,0 +1,283 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// A host on Foundation gets the picture that one in C++ gets, or an error that says what failed.
+
+#import <bindings/foundation/FoundationHosts.h>
+#import <olvane/foundation/OlvanePicture.h>
+#import <olvane/foundation/OlvaneViewerBridge.h>
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <memory>
+#include <stdexcept>
+#include <string>
+
+#include <olvane/charts/Views.h>
+#include <olvane/picture/PictureJson.h>
+#include <support/CaseRun.h>
+#include <support/FamilyText.h>
+
+// Answers a number that is no id where it is asked for the father of 42.
+@interface WrongFatherHost : CaseFoundationHost
+@end
+
+@implementation WrongFatherHost
+
+- (int64_t)fatherForPersonWithID:(int64_t)personId {
+    return personId == 42 ? (INT64_C(1) << 32) + 4 : [super fatherForPersonWithID:personId];
+}
+
+@end
+
+// Raises where it is asked for children.
+@interface ClosedHost : CaseFoundationHost
+@end
+
+@implementation ClosedHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    (void)personId;
+    [NSException raise:NSGenericException format:@"the data base is closed"];
+    return nil;
+}
+
+@end
+
+// Throws an exception of C++ where it is asked for children.
+@interface CxxThrowingHost : CaseFoundationHost
+@end
+
+@implementation CxxThrowingHost
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    (void)personId;
+    throw std::runtime_error("the data base is closed");
+}
+
+@end
+
+// Asks for a picture and for a text of its own when it is asked for children.
+@interface NestingHost : CaseFoundationHost {
+    NSInteger _innerCode;
+    NSUInteger _innerLength;
+}
+- (NSInteger)innerCode;
+- (NSUInteger)innerLength;
+@end
+
+@implementation NestingHost
+
+- (NSInteger)innerCode {
+    return _innerCode;
+}
+
+- (NSUInteger)innerLength {
+    return _innerLength;
+}
+
+- (NSArray*)childrenForPersonWithID:(int64_t)personId {
+    if (_innerCode == 0) {
+        NSError* error = nil;
+        _innerCode = -1;
+        [OlvanePicture pictureOfDataSource:self focus:17 options:nil error:&error];
+        _innerCode = [error code];
+        OlvaneViewerBridge* bridge = [[[OlvaneViewerBridge alloc] initWithManagerWrap:self] autorelease];
+        _innerLength = [[bridge valuesForPersonId:17] length];
+    }
+    return [super childrenForPersonWithID:personId];
+}
+
+@end
+
+namespace {
+
+namespace charts = olvane::charts;
+using support::CaseFile;
+using support::family;
+
+const char* const kThreeGenerations = "17+42: 5 6f; 3+4: 17 18; 1+2: 3; 5+8: 9";
+
+class FoundationPicture : public testing::Test {
+protected:
+    void SetUp() override { pool_ = [[NSAutoreleasePool alloc] init]; }
+    void TearDown() override { [pool_ release]; }
+
+    template <class Host>
+    Host* hostOf(const CaseFile& input) {
+        return [[[Host alloc] initWithCase:input] autorelease];
+    }
+
+    // The error of the family view around 17.
+    NSError* errorOf(id host, OlvanePictureOptions* options = nil, std::int64_t focus = 17) {
+        NSError* error = nil;
+        OlvanePicture* picture = [OlvanePicture pictureOfDataSource:host
+                                                              focus:focus
+                                                            options:options
+                                                              error:&error];
+        EXPECT_TRUE(picture == nil);
+        EXPECT_TRUE([[error domain] isEqual:OlvaneErrorDomain]);
+        return error;
+    }
+
+    std::string descriptionOf(NSError* error) { return [[error localizedDescription] UTF8String]; }
+
+private:
+    NSAutoreleasePool* pool_ = nil;
+};
+
+TEST_F(FoundationPicture, isThatOfAHostInCxxInEveryView) {
+    const CaseFile input = family(kThreeGenerations);
+    for (int view = OlvaneViewFamily; view <= OlvaneViewEverybody; ++view) {
+        OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:view];
+        options.other = 9;
+        NSError* error = nil;
+        OlvanePicture* picture = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                              focus:17
+                                                            options:options
+                                                              error:&error];
+        ASSERT_TRUE(picture != nil) << view << ": " << descriptionOf(error);
+        EXPECT_TRUE(error == nil);
+        charts::ViewRequest request;
+        request.chart.view = static_cast<charts::View>(view);
+        request.chart.effort = 1;
+        const auto expected =
+            charts::pictureOfHost(std::make_shared<support::CaseManager>(input), 17, request, 9);
+        EXPECT_EQ(olvane::picture::pictureJson(expected), [[picture json] UTF8String]) << view;
+        EXPECT_EQ(expected.boxes.size(), [picture boxCount]);
+        EXPECT_EQ(expected.lines.size(), [picture lineCount]);
+        EXPECT_EQ(expected.arcs.size(), [picture arcCount]);
+        const int32_t focus = [picture focus];
+        EXPECT_EQ(17, [picture boxes][focus].personId);
+    }
+}
+
+// The couple 17 and 42 with the child 5: three boxes of 40 by 20 and one family.
+TEST_F(FoundationPicture, hasBoxesFamiliesAndLinesAsRecords) {
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewDescendants];
+    options.boxWidth = 40;
+    options.boxHeight = 20;
+    OlvanePicture* picture = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(family("17+42: 5"))
+                                                          focus:17
+                                                        options:options
+                                                          error:NULL];
+    ASSERT_EQ(3u, [picture boxCount]);
+    EXPECT_EQ(40, [picture boxes][0].width);
+    EXPECT_EQ(20, [picture boxes][0].height);
+    ASSERT_EQ(1u, [picture familyCount]);
+    const OlvaneFamily couple = [picture families][0];
+    ASSERT_EQ(2u, couple.parentCount);
+    ASSERT_EQ(1u, couple.childCount);
+    const int32_t* members = [picture members] + couple.firstMember;
+    EXPECT_EQ(17, [picture boxes][members[0]].personId);
+    EXPECT_EQ(42, [picture boxes][members[1]].personId);
+    EXPECT_EQ(5, [picture boxes][members[2]].personId);
+    EXPECT_EQ(couple.lineCount, [picture lineCount]);
+    EXPECT_LT(0u, [picture lineCount]);
+}
+
+TEST_F(FoundationPicture, takesOptionsAsProperties) {
+    const CaseFile input = family(kThreeGenerations);
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewFamily];
+    OlvanePicture* all = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                      focus:17
+                                                    options:options
+                                                      error:NULL];
+    options.familySiblings = NO;
+    options.unknownParents = NO;
+    OlvanePicture* few = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                      focus:17
+                                                    options:options
+                                                      error:NULL];
+    const auto has = [](OlvanePicture* picture, std::int64_t person, int kind) {
+        for (NSUInteger i = 0; i < [picture boxCount]; ++i) {
+            const OlvaneBox& box = [picture boxes][i];
+            if (box.personId == person && box.kind == kind) return true;
+        }
+        return false;
+    };
+    EXPECT_TRUE(has(all, 18, 0));
+    EXPECT_TRUE(has(all, 0, 1));
+    EXPECT_FALSE(has(few, 18, 0));
+    EXPECT_FALSE(has(few, 0, 1));
+}
+
+TEST_F(FoundationPicture, namesOperationPersonAndCauseWhereTheHostRaises) {
+    NSError* error = errorOf(hostOf<ClosedHost>(family(kThreeGenerations)));
+    EXPECT_EQ(OlvaneErrorHostFailed, [error code]);
+    EXPECT_TRUE(
+        [[[error userInfo] objectForKey:OlvaneErrorOperationKey] isEqual:@"childrenForPersonWithID:"]);
+    EXPECT_EQ(17, [[[error userInfo] objectForKey:OlvaneErrorPersonKey] longLongValue]);
+    EXPECT_TRUE([[[error userInfo] objectForKey:OlvaneErrorCauseKey]
+        isEqual:@"NSGenericException: the data base is closed"]);
+    EXPECT_EQ("childrenForPersonWithID: for person 17: NSGenericException: the data base is closed",
+              descriptionOf(error));
+}
+
+TEST_F(FoundationPicture, reportsARaiseOfEachOperation) {
+    for (std::size_t i = 0; i < support::kHostOperationCount; ++i) {
+        CaseFile input = family(kThreeGenerations);
+        input.failures[static_cast<support::HostOperation>(i)].insert(1);
+        NSError* error = errorOf(hostOf<CaseFoundationHost>(input));
+        EXPECT_EQ(OlvaneErrorHostFailed, [error code]) << i;
+        const std::string name(support::operationName(static_cast<support::HostOperation>(i)));
+        NSString* selector = [[error userInfo] objectForKey:OlvaneErrorOperationKey];
+        EXPECT_EQ(0u, std::string([selector UTF8String]).find(name + ":"));
+    }
+}
+
+TEST_F(FoundationPicture, reportsWhateverElseTheHostThrows) {
+    EXPECT_EQ("childrenForPersonWithID: for person 17: an exception without a text",
+              descriptionOf(errorOf(hostOf<ThrowingHost>(family("17+42")))));
+    EXPECT_EQ("childrenForPersonWithID: for person 17: the data base is closed",
+              descriptionOf(errorOf(hostOf<CxxThrowingHost>(family("17+42")))));
+    EXPECT_EQ(OlvaneErrorHostFailed, [errorOf(hostOf<RaisingListHost>(family("17+42: 5"))) code]);
+    EXPECT_EQ(OlvaneErrorHostFailed, [errorOf(hostOf<NullListHost>(family("17+42: 5"))) code]);
+    NSError* date = errorOf(hostOf<NilDateHost>(family("17+42")));
+    EXPECT_TRUE([[[date userInfo] objectForKey:OlvaneErrorCauseKey] isEqual:@"answered nil"]);
+}
+
+TEST_F(FoundationPicture, refusesNumbersThatAreNoIds) {
+    NSError* answer = errorOf(hostOf<WrongFatherHost>(family(kThreeGenerations)));
+    EXPECT_EQ(OlvaneErrorInvalidId, [answer code]);
+    EXPECT_EQ(
+        "fatherForPersonWithID: for person 42: answered 4294967300, which is no id: ids are 1 to 2147483647",
+        descriptionOf(answer));
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(family(kThreeGenerations));
+    EXPECT_EQ(OlvaneErrorInvalidPerson, [errorOf(host, nil, 17 + (std::int64_t{1} << 32)) code]);
+}
+
+TEST_F(FoundationPicture, refusesNoSourceAndOptionsOutOfRange) {
+    EXPECT_EQ(OlvaneErrorInvalidArgument, [errorOf(nil) code]);
+    CaseFoundationHost* host = hostOf<CaseFoundationHost>(family(kThreeGenerations));
+    for (const int view : {-1, 10, 256}) {
+        NSError* error = errorOf(host, [OlvanePictureOptions optionsForView:view]);
+        EXPECT_EQ(OlvaneErrorInvalidArgument, [error code]) << view;
+        EXPECT_EQ("view is none of the views", descriptionOf(error));
+    }
+    EXPECT_TRUE([OlvanePicture pictureOfDataSource:nil focus:17 options:nil error:NULL] == nil);
+}
+
+TEST_F(FoundationPicture, refusesANestedCallAndLeavesTheBridgeToAnswer) {
+    NestingHost* host = hostOf<NestingHost>(family(kThreeGenerations));
+    OlvanePicture* picture = [OlvanePicture pictureOfDataSource:host focus:17 options:nil error:NULL];
+    EXPECT_EQ(OlvaneErrorNestedCall, [host innerCode]);
+    EXPECT_EQ(support::layoutText(family(kThreeGenerations)).size(), [host innerLength]);
+    EXPECT_LT(0u, [picture boxCount]);
+}
+
+TEST_F(FoundationPicture, releasesItsSourceAfterTheCall) {
+    const int before = [CaseFoundationHost alive];
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    CaseFoundationHost* host = [[CaseFoundationHost alloc] initWithCase:family("17+42: 5")];
+    OlvanePicture* picture = [[OlvanePicture pictureOfDataSource:host focus:17 options:nil
+                                                           error:NULL] retain];
+    [host release];
+    [pool release];
+    EXPECT_EQ(before, [CaseFoundationHost alive]);
+    EXPECT_LT(0u, [picture boxCount]);
+    [picture release];
+}
+
+}  // namespace
