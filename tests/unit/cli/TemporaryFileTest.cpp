@@ -11,6 +11,8 @@
 #include <string>
 #include <system_error>
 
+#include "ScratchFolder.h"
+
 namespace olvane::cli {
 namespace {
 
@@ -18,22 +20,16 @@ namespace fs = std::filesystem;
 
 class TemporaryFiles : public testing::Test {
 protected:
-    TemporaryFiles() : folder_(fs::temp_directory_path() / "olvane-temporary-file-test") {
-        fs::remove_all(folder_);
-        fs::create_directory(folder_);
-    }
-    ~TemporaryFiles() override { fs::remove_all(folder_); }
-
-    fs::path place() const { return folder_ / "out.svg"; }
+    fs::path place() const { return folder_.path("out.svg"); }
     void write(const std::string& text) const { std::ofstream(place()) << text; }
     std::string content() const {
         std::ifstream file(place());
         return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
     }
-    auto files() const { return std::distance(fs::directory_iterator(folder_), fs::directory_iterator()); }
+    std::size_t files() const { return folder_.names().size(); }
 
 private:
-    fs::path folder_;
+    ScratchFolder folder_;
 };
 
 TEST_F(TemporaryFiles, standInTheirPlaceOncePublished) {
@@ -45,12 +41,12 @@ TEST_F(TemporaryFiles, standInTheirPlaceOncePublished) {
         file.keep();
     }
     EXPECT_EQ(content(), "new");
-    EXPECT_EQ(files(), 1);
+    EXPECT_EQ(files(), 1u);
 }
 
 TEST_F(TemporaryFiles, leaveNothingWhereTheyAreNotKept) {
     { TemporaryFile file(place(), "new"); }
-    EXPECT_EQ(files(), 0);
+    EXPECT_EQ(files(), 0u);
     write("old");
     {
         TemporaryFile file(place(), "new");
@@ -58,7 +54,7 @@ TEST_F(TemporaryFiles, leaveNothingWhereTheyAreNotKept) {
         EXPECT_EQ(content(), "new");
     }
     EXPECT_EQ(content(), "old");
-    EXPECT_EQ(files(), 1);
+    EXPECT_EQ(files(), 1u);
 }
 
 TEST_F(TemporaryFiles, keepThePermissionsOfWhatTheyReplace) {

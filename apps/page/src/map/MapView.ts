@@ -45,6 +45,7 @@ export class MapView {
     private cameFrom = kNobody; // the child from whom keys went up
     private kin: Kin = kNoKin;
     private asked = 0; // for a frame; 0 for none
+    private awaitsSize = false; // shows everything once the window is laid out
 
     constructor(
         readonly map: FamilyMap,
@@ -101,8 +102,9 @@ export class MapView {
 
     // --- where it stands ---
 
-    /** In the form of an address: the middle in points, and px a point. */
+    /** In the form of an address: the middle in points, and px a point; empty as long as it is not laid out. */
     get place(): string {
+        if (this.awaitsSize) return "";
         const { x, y, k } = this.camera.place;
         return `${Math.round(x)},${Math.round(y)},${Number(k.toPrecision(4))}`;
     }
@@ -117,7 +119,9 @@ export class MapView {
         this.measure();
         const [x, y, k] = place.split(",").map(Number) as [number, number, number];
         this.select(this.map.person(number));
-        this.camera.jump([x, y, k].every(Number.isFinite) && k > 0 ? { x, y, k } : this.camera.whole);
+        const isPlace = [x, y, k].every(Number.isFinite) && k > 0;
+        this.awaitsSize = !isPlace && this.canvas.clientWidth === 0;
+        this.camera.jump(isPlace ? { x, y, k } : this.camera.whole);
     }
 
     takeKeys(): void {
@@ -252,7 +256,8 @@ export class MapView {
     private resized(): void {
         if (this.canvas.clientWidth === 0) return; // hidden
         this.measure();
-        this.camera.jump(this.camera.place);
+        this.camera.jump(this.awaitsSize ? this.camera.whole : this.camera.place);
+        this.awaitsSize = false;
         this.draw();
     }
 

@@ -308,8 +308,9 @@ export class App implements ChromeActions {
     }
 
     private showMap(address: string): void {
-        this.maps.show(this.ui, address);
+        this.maps.reveal(this.ui);
         this.arrange();
+        this.maps.show(this.ui, address);
     }
 
     // In a worker, or where the browser has none for a page like this, here.

@@ -74,6 +74,13 @@ export class MapHost {
         this.map = this.search = this.view = null;
     }
 
+    /** The map is there, so that it can be laid out; where it stands, show says. */
+    reveal(ui: UiMessages): void {
+        if (!this.map) return;
+        this.element.hidden = false;
+        this.makeView(ui);
+    }
+
     show(ui: UiMessages, address: string): void {
         if (!this.map) return;
         const parts = new URLSearchParams(address.replace(/^#/, ""));
