@@ -72,8 +72,8 @@ private:
                 put(title, (title.empty() ? "" : "; "), mark.title);
                 return true;
             });
-            marks.push_back(
-                {joined("+", whole(static_cast<long long>(count - kMostMarks + 1))), title, place});
+            const std::size_t left = count - kMostMarks + 1;
+            marks.push_back({joined("+", whole(static_cast<long long>(left))), title, place});
         }
     }
 
