@@ -44,7 +44,7 @@ const draw::DrawingTheme& themeOf(int number) {
 }
 
 draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, unsigned facts) {
-    const gedcom::GedcomLabels labels(file.data, factsOf(facts));
+    gedcom::GedcomLabels labels(file.data, factsOf(facts));
     draw::DrawingContent content;
     content.picture = pictureOf(file, request);
     content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };

@@ -9,6 +9,7 @@
 #include <memory>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <olvane/charts/Views.h>
@@ -61,9 +62,9 @@ OLVANE_EXPORT("host_picture") std::vector<double>* hostPicture(std::int32_t focu
         const olvane_host host = js::hostOfJavaScript();
         const charts::ViewRequest view = js::requestOf(0).view;
         // The other person of a kinship is written down as a place, one less than the id.
-        const picture::Picture picture =
+        picture::Picture picture =
             charts::pictureOfHost(c::sourceOf(host), focus, view, std::int64_t{view.chart.to} + 1);
-        answer = js::pictureAnswer([&] { return picture; });
+        answer = js::pictureAnswer([&] { return std::move(picture); });
     };
     js::lastStatus = OLVANE_NESTED_CALL;
     c::unlessNested([&] { js::lastStatus = c::guarded(ask, failure); });
