@@ -40,8 +40,9 @@ class CheckTerms(unittest.TestCase):
         self.assertEqual(1, len(findings("check_options_told.py", "")))
 
     def test_longer_words_and_names_that_hosts_know_stay(self) -> None:
-        self.assertEqual([], findings("a.cpp", "untold intellect isAddNode layoutUnknownChildren business\n"))
+        self.assertEqual([], findings("a.cpp", "untold intellect isAddNode layoutUnknownChildren busY business\n"))
         self.assertEqual(1, len(findings("a.cpp", "// an add-node\n")))
+        self.assertEqual(1, len(findings("a.cpp", "float busX;\n")))
 
 
 if __name__ == "__main__":

@@ -27,7 +27,7 @@ struct AddNodeValues {
 //
 // Holds: keyToPerson and personToKey mirror each other. Entries are never changed or removed, and only the
 //        operations here add any.
-// Fails: a look-up of an unknown key or unknown parent throws std::out_of_range ("Unable to find key in
+// Fails: looking up a key that nobody has, or an id of no unknown parent, throws std::out_of_range ("Unable to find key in
 //        unordered_map."). No text is refused a key.
 class OLVANE_API ViewerGlue {
 public:

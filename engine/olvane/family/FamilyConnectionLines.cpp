@@ -100,7 +100,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfLoneParent(Tre
     drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = at.y + treeSize.nodeHeight;
-    drop.barY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
+    drop.busY = static_cast<float>(treeSize.vertPadding * 0.25 + drop.startY);
     return drop;
 }
 
@@ -113,7 +113,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropToChildOfCouple(TreeVie
     drop.x = person.gender ? at.x + treeSize.horzPadding * -0.5f
                            : treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = person.getSpouseLine(spouse.personId).y1;
-    drop.barY = at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f;
+    drop.busY = at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f;
     return drop;
 }
 
@@ -125,9 +125,9 @@ TreeLine TreeViewFamilyLayouter::drawDropBarAndStem(const Drop& drop, TreeViewPe
     const float stemX = cutToWholePoint(at.x + treeSize.nodeWidth * 0.5f);
     TreeLine line;
     LineCourse course(line);
-    course.draw(holder, drop.x, drop.startY, drop.x, drop.barY);
-    course.draw(child, stemX, drop.barY, drop.x, drop.barY);
-    course.draw(child, stemX, at.y, stemX, drop.barY);
+    course.draw(holder, drop.x, drop.startY, drop.x, drop.busY);
+    course.draw(child, stemX, drop.busY, drop.x, drop.busY);
+    course.draw(child, stemX, at.y, stemX, drop.busY);
     if (lineRecord != nullptr) lineRecord->addChildLines(holder, child, *drop.parent, drop.other);
     return line;
 }
@@ -141,7 +141,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromCouple(TreeViewPers
     drop.other = mother;
     drop.x = treeSize.nodeWidth + (at.x + treeSize.horzPadding * 0.5f);
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight * 0.5f);
-    drop.barY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
+    drop.busY = cutToWholePoint(at.y + treeSize.nodeHeight + treeSize.vertPadding * 0.5f);
     return drop;
 }
 
@@ -152,7 +152,7 @@ TreeViewFamilyLayouter::Drop TreeViewFamilyLayouter::dropFromSingleParent(TreeVi
     drop.parent = &parent;
     drop.x = at.x + treeSize.nodeWidth * 0.5f;
     drop.startY = cutToWholePoint(at.y + treeSize.nodeHeight);
-    drop.barY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
+    drop.busY = cutToWholePoint(treeSize.vertPadding * 0.25 + drop.startY);
     return drop;
 }
 

@@ -50,7 +50,7 @@ void TreeViewFamilyLayouter::measureSpouseWithSharedChildren(TreeViewPerson& per
     spouse.layoutWidth = (step + stepGaps) + (horzPaddingForNodesCount(sharedCount) + shared);
 }
 
-// A only childless child gets the width of a couple, so that it comes out under the middle of the pair.
+// An only child without children gets the width of a couple, so that it comes out under the middle of the pair.
 float TreeViewFamilyLayouter::sharedChildrenWidth(TreeViewPerson& person, TreeViewPerson& spouse) {
     const bool onlyChild =
         countOfChildren(person, spouse.personId) == 1 && countOfChildren(spouse, TreeViewPerson::kNoKey) == 0;

@@ -90,7 +90,7 @@ private:
     struct Drop {
         float x;
         float startY;
-        float barY;
+        float busY;
         TreeViewPerson* parent;
         TreeViewPerson* other = nullptr;  // null for a lone parent
     };

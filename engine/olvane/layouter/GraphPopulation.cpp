@@ -28,7 +28,7 @@ bool allHavePlaces(const ChildrenSet& set) {
 // The children of several persons, for asking whether a record is among them.
 //
 // Records that all have a place are in one order, by key, so they are looked up in the sets where they lie.
-// Others may contradict each other's order (see above), and then an answer depends on the insertion order by which one
+// Others may contradict each other's order (see above), and then an answer depends on the order in which one
 // set was filled with all of them: one plain insert after another.
 class ChildrenOfOthers {
 public:

@@ -77,8 +77,8 @@ private:
     void addParentLines(Person& person);
     void addCoupleLines(Person& person, Person& father, Person& mother);
     void addLoneParentLines(Person& person, Person& parent);
-    void addBarAndStem(Person& lower, Line& line, float dropX, float barY) const;
-    float loneParentBarY(float startY) const;
+    void addBarAndStem(Person& lower, Line& line, float dropX, float busY) const;
+    float loneParentBusY(float startY) const;
 };
 
 }  // namespace plain

@@ -7,7 +7,7 @@
 //
 //      [husband]--+--[wife]        + dropX
 //                 |   drop
-//           +-----+   barY
+//           +-----+   busY
 //           |         stem
 //        [child]
 //
@@ -72,20 +72,20 @@ void FamilyLayouter::addChildLine(Person& person, Person& child, Person& spouse)
     const bool lone = spouse.key == person.key;
     float dropX = 0.0F;
     float startY = 0.0F;
-    float barY = 0.0F;
+    float busY = 0.0F;
     if (lone) {
         dropX = spouse.corner.x + size.nodeWidth * 0.5F;
         startY = spouse.corner.y + size.nodeHeight;
-        barY = static_cast<float>(quarterBelow(size.vertPadding, startY));
+        busY = static_cast<float>(quarterBelow(size.vertPadding, startY));
     } else {
         dropX = person.male ? spouse.corner.x + size.horzPadding * -0.5F
                             : size.nodeWidth + (spouse.corner.x + size.horzPadding * 0.5F);
         startY = spouseLine(person, spouse.key).y1;
-        barY = spouse.corner.y + size.nodeHeight + size.vertPadding * 0.5F;
+        busY = spouse.corner.y + size.nodeHeight + size.vertPadding * 0.5F;
     }
     Line line;
-    addSegment(spouse, line, Segment{dropX, startY, dropX, barY, false});
-    addBarAndStem(child, line, dropX, barY);
+    addSegment(spouse, line, Segment{dropX, startY, dropX, busY, false});
+    addBarAndStem(child, line, dropX, busY);
     if (lone) {
         addLoneEdge(person, person, child, line);
     } else {
@@ -98,23 +98,23 @@ void FamilyLayouter::addSiblingLine(Person& person, Person& sibling) {
     if (sibling.key == person.key) return;
     float dropX = 0.0F;
     float startY = 0.0F;
-    float barY = 0.0F;
+    float busY = 0.0F;
     Line line;
     if (data.isAddNode(sibling.parentKey)) {
         Person& father = fatherOf(person);
         dropX = size.nodeWidth + (father.corner.x + size.horzPadding * 0.5F);
         startY = cutPoint(father.corner.y + size.nodeHeight * 0.5F);
-        barY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
-        addSegment(father, line, Segment{dropX, startY, dropX, barY, false});
+        busY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
+        addSegment(father, line, Segment{dropX, startY, dropX, busY, false});
     } else {
         const bool fathers = person.fatherIndex != -1 && fatherOf(person).key == sibling.parentKey;
         Person& parent = fathers ? fatherOf(person) : motherOf(person);
         dropX = parent.corner.x + size.nodeWidth * 0.5F;
         startY = cutPoint(parent.corner.y + size.nodeHeight);
-        barY = loneParentBarY(startY);
-        addSegment(parent, line, Segment{dropX, startY, dropX, barY, false});
+        busY = loneParentBusY(startY);
+        addSegment(parent, line, Segment{dropX, startY, dropX, busY, false});
     }
-    addBarAndStem(sibling, line, dropX, barY);
+    addBarAndStem(sibling, line, dropX, busY);
     addSiblingEdge(person, sibling, line);
 }
 
@@ -159,34 +159,34 @@ void FamilyLayouter::addParentLines(Person& person) {
 void FamilyLayouter::addCoupleLines(Person& person, Person& father, Person& mother) {
     const float dropX = size.nodeWidth + (father.corner.x + size.horzPadding * 0.5F);
     const float startY = cutPoint(father.corner.y + size.nodeHeight * 0.5F);
-    const float barY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
+    const float busY = cutPoint(father.corner.y + size.nodeHeight + size.vertPadding * 0.5F);
     const float fatherRight = father.corner.x + size.nodeWidth;
     Line line;
-    addSegment(father, line, Segment{dropX, startY, dropX, barY, false});
+    addSegment(father, line, Segment{dropX, startY, dropX, busY, false});
     father.segments.push_back(Segment{fatherRight, startY, mother.corner.x, startY, true});
     spouseEdge(father, mother, Line({{fatherRight, startY}, {dropX, startY}, {mother.corner.x, startY}}));
-    addBarAndStem(person, line, dropX, barY);
+    addBarAndStem(person, line, dropX, busY);
     addCoupleEdge(spouseEdge(father, mother, Line()), person, line);
 }
 
 void FamilyLayouter::addLoneParentLines(Person& person, Person& parent) {
     const float dropX = parent.corner.x + size.nodeWidth * 0.5F;
     const float startY = cutPoint(parent.corner.y + size.nodeHeight);
-    const float barY = loneParentBarY(startY);
+    const float busY = loneParentBusY(startY);
     Line line;
-    addSegment(parent, line, Segment{dropX, startY, dropX, barY, false});
-    addBarAndStem(person, line, dropX, barY);
+    addSegment(parent, line, Segment{dropX, startY, dropX, busY, false});
+    addBarAndStem(person, line, dropX, busY);
     addLoneEdge(parent, parent, person, line);
 }
 
-void FamilyLayouter::addBarAndStem(Person& lower, Line& line, float dropX, float barY) const {
+void FamilyLayouter::addBarAndStem(Person& lower, Line& line, float dropX, float busY) const {
     const float stemX = cutPoint(lower.corner.x + size.nodeWidth * 0.5F);
-    addSegment(lower, line, Segment{stemX, barY, dropX, barY, false});
-    addSegment(lower, line, Segment{stemX, lower.corner.y, stemX, barY, false});
+    addSegment(lower, line, Segment{stemX, busY, dropX, busY, false});
+    addSegment(lower, line, Segment{stemX, lower.corner.y, stemX, busY, false});
 }
 
 // The sum is cut as a double, before it could be rounded to a float.
-float FamilyLayouter::loneParentBarY(float startY) const {
+float FamilyLayouter::loneParentBusY(float startY) const {
     return cutPoint(quarterBelow(size.vertPadding, startY));
 }
 
