@@ -125,7 +125,8 @@ private:
 
     static kin::UnionState stateOf(const Family& family) {
         if (family.divorced) return kin::UnionState::divorced;
-        return family.married ? kin::UnionState::married : kin::UnionState::unknown;
+        if (family.married) return kin::UnionState::married;
+        return family.notMarried ? kin::UnionState::unmarried : kin::UnionState::unknown;
     }
 
     std::string_view placeOfMarriage(FamilyId number) const {

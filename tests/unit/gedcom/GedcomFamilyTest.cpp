@@ -78,6 +78,12 @@ TEST(GedcomFamily, keepsNamesDatesAndFamilies) {
     EXPECT_THAT(table.familyChildren(2), ElementsAre(FamilyChild{1, kin::ChildKind::birth}));
 }
 
+TEST(GedcomFamily, keepsThatACoupleNeverMarried) {
+    const olvane::Family table = familyOf(
+        read(document("0 @I1@ INDI\n0 @I2@ INDI\n0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 MARR N\n")));
+    EXPECT_EQ(table.family(1).state, kin::UnionState::unmarried);
+}
+
 TEST(GedcomFamily, answersAsTheFileDoesWhereRecordsContradictEachOther) {
     expectSameAnswers(read(document(
         "0 @I1@ INDI\n1 FAMS @F1@\n1 FAMC @F1@\n0 @I2@ INDI\n1 FAMC @F2@\n0 @I3@ INDI\n1 FAMS @F1@\n"
