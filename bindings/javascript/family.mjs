@@ -74,13 +74,14 @@ function pairsFrom(run, names) {
     return pairs;
 }
 
-export class Family {
+export class Family extends EventTarget {
     #instance;
     #pointer;
     #token = {};
 
     /** @private olvane.family makes it. */
     constructor(instance, rows, pointer = create(instance, rows)) {
+        super();
         this.#instance = instance;
         this.#pointer = pointer;
         unclosed.register(this, { instance, pointer }, this.#token);
@@ -206,6 +207,12 @@ export class Family {
         });
     }
 
+    gedcom() {
+        const pointer = this.#instance.exports.family_gedcom(this.#opened());
+        if (pointer === 0) throw new OutOfMemory();
+        return this.#instance.text(pointer);
+    }
+
     layout(focus, options = undefined) {
         return this.#layOut(focus, options, 0).records;
     }
@@ -297,6 +304,7 @@ export class Family {
             ),
         );
         if (outcome !== 0) throw thrown(instance, outcome);
+        this.dispatchEvent(new Event("change"));
     }
 
     #layOut(focus, options, withText) {

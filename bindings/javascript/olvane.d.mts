@@ -786,7 +786,7 @@ export class FamilyError extends Error {
  * A family that the module holds, made by olvane.family. What is wrong is refused with FamilyError before anything
  * changes. Memory outside of JavaScript is held until close, or until nobody holds the family any more.
  */
-export class Family {
+export class Family extends EventTarget {
     private constructor();
     readonly size: number;
     readonly memoryBytes: number;
@@ -823,6 +823,11 @@ export class Family {
      * after an edit makes an index.
      */
     search(text: string, limit?: number): SearchHit[];
+    /**
+     * The family as the text of a GEDCOM file. The person of id 17 has the identifier "17" in it, and family 5 is "F5". Of the
+     * fields, occupation, note, birthPlace and deathPlace become what GEDCOM has for them, all others facts of that type.
+     */
+    gedcom(): string;
     layout(focus: number, options?: Options): LayoutRecord[];
     layoutText(focus: number, options?: Options): string;
     /** The picture of any view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */

@@ -356,3 +356,37 @@ test("memory that runs out is an error, and the family stays as it was", async (
     assert.deepEqual(family.ids, [1, 2, 3]);
     assert.equal(family.person(3).father, 1);
 });
+
+test("a family is written as a GEDCOM file, which says the same", () => {
+    const family = olvane.family({ persons: rows });
+    const file = olvane.readGedcom(new TextEncoder().encode(family.gedcom()), "own.ged");
+    assert.deepEqual(
+        file.persons.map(({ xref, father, mother, birth }) => [xref, father, mother, birth?.written ?? ""]),
+        [
+            ["1", 0, 0, "1850"],
+            ["2", 0, 0, "1852"],
+            ["3", 1, 2, ""],
+        ],
+    );
+    assert.equal(file.persons[1].name, "\u00c5sa");
+    assert.deepEqual(
+        file.factsOfPerson(2).map(({ tag, value }) => [tag, value]),
+        [
+            ["BIRT", ""],
+            ["FACT", "smith"],
+        ],
+    );
+    file.close();
+});
+
+test("a family announces each change, and none that is refused", () => {
+    const family = olvane.family({ persons: rows });
+    let changes = 0;
+    family.addEventListener("change", () => ++changes);
+    family.setField(1, "job", "baker");
+    family.removePerson(3);
+    assert.equal(changes, 2);
+    assert.throws(() => family.removePerson(3), FamilyError);
+    assert.equal(changes, 2);
+    assert.equal(family.copy().size, 2);
+});

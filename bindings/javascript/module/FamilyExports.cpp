@@ -20,6 +20,7 @@
 #include <olvane/kin/Family.h>
 #include <olvane/kin/FamilyDataSource.h>
 #include <olvane/kin/PersonIndex.h>
+#include <olvane/source/FamilyGedcom.h>
 
 #include "JsonText.h"
 #include "LayoutAnswer.h"
@@ -430,6 +431,16 @@ const char* familySearch(HeldFamily* family, const char* text, std::size_t limit
     try {
         const kin::FamilySearchTexts texts(family->table);
         js::lastFamilyJson = js::searchJson(family->index(), texts, text, limit);
+        return js::lastFamilyJson.c_str();
+    } catch (const std::exception&) {
+        return nullptr;
+    }
+}
+
+// The table as a GEDCOM file. Null for want of memory.
+OLVANE_EXPORT("family_gedcom") const char* familyGedcom(const HeldFamily* family) {
+    try {
+        js::lastFamilyJson = gedcom::gedcomTextOf(family->table);
         return js::lastFamilyJson.c_str();
     } catch (const std::exception&) {
         return nullptr;
