@@ -50,7 +50,8 @@ async function bundled(entry, settings) {
 
 // What would end the element early may stand in a script only as an escape.
 async function bundledScript() {
-    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript } })).replaceAll(
+    const plugins = [styleText, withoutTables];
+    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript }, plugins })).replaceAll(
         "</script",
         "<\\/script",
     );
@@ -80,6 +81,14 @@ const styleText = {
             contents: await minifiedStyle(path),
             loader: "text",
         }));
+    },
+};
+
+// Families of a program's own are for sites; the page reads files.
+const withoutTables = {
+    name: "without-tables",
+    setup(bundle) {
+        bundle.onResolve({ filter: /^\.\/family\.mjs$/ }, () => ({ path: here("src/engine/noFamily.ts") }));
     },
 };
 

@@ -1,6 +1,11 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
+import type { Olvane } from "./olvane.mjs";
+
+/** The engine that all elements of the page share, for families of the program's own. */
+export declare function sharedEngine(): Promise<Olvane>;
+
 /** What is looked at. Numbers of persons count from 1 in the order of the file. */
 export interface ViewState {
     readonly focus: number;
@@ -46,6 +51,12 @@ export interface Person {
     readonly children: readonly number[];
 }
 
+/** A family of the program's own: a Family of the package olvane, or whatever answers as one does. */
+export interface FamilyData extends Pick<EventTarget, "addEventListener" | "removeEventListener"> {
+    /** The text of a GEDCOM file, with everybody as they are now. */
+    gedcom(): string;
+}
+
 export interface OlvaneTreeEventMap {
     /** Another person is selected: the panel is about them. */
     select: CustomEvent<{ person: Person }>;
@@ -72,6 +83,13 @@ export declare class OlvaneTree extends HTMLElement {
      * place stay with the persons of the same xrefs. Rejects where the bytes are no GEDCOM, and then shows what it showed before.
      */
     update(bytes: Uint8Array): Promise<void>;
+    /**
+     * A family of the program's own in place of a file. It is shown again after each of its "change" events: once for all
+     * changes that are made in a row. Focus, selection and place stay as update() keeps them. A person's xref is the id.
+     */
+    data: FamilyData | null;
+    /** Shows data as it is now, for data without events. */
+    refresh(): Promise<void>;
     /** Draws the inside of boxes, from the upper left corner of each; null for the usual. */
     renderBox: ((person: Person, box: { width: number; height: number }) => SVGElement | null) | null;
     /** Which part of the picture is in sight: the zoom, and the middle of the window in points from that of the focus. */

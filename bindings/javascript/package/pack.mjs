@@ -132,8 +132,10 @@ async function packElement() {
     await mkdir(folder, { recursive: true });
     await copyFile(values.element, join(folder, "olvane-tree.mjs"));
     await bundle(values.element, join(folder, "olvane-tree.cjs"), { format: "cjs" });
-    for (const ending of ["d.mts", "d.cts"])
-        await copyFile(here("olvane-tree.d.mts"), join(folder, `olvane-tree.${ending}`));
+    const types = await readFile(here("olvane-tree.d.mts"), "utf8");
+    await writeFile(join(folder, "olvane-tree.d.mts"), types);
+    await writeFile(join(folder, "olvane-tree.d.cts"), types.replace("./olvane.mjs", "./olvane.cjs"));
+    for (const ending of ["d.mts", "d.cts"]) await copyFile(here("../olvane.d.mts"), join(folder, `olvane.${ending}`));
     await copyFile(here("../../../apps/page/src/element/custom-elements.json"), join(folder, "custom-elements.json"));
     await copyFile(here("README.olvane-tree.md"), join(folder, "README.md"));
     await bundle(values.element, join(folder, "olvane-tree.iife.js"), { format: "iife", globalName: "olvaneTree" });

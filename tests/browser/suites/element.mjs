@@ -152,6 +152,108 @@ describe("element", () => {
         await end();
     });
 
+    test("a program's own family is drawn, and each change to it while its picture stays in place", async () => {
+        files.set(
+            "/own.html",
+            `<!doctype html><olvane-tree focus="17" style="height: 500px"></olvane-tree><script type="module">
+            import { sharedEngine } from "./olvane-tree.mjs";
+            const olvane = await sharedEngine();
+            window.family = olvane.family({ persons: [
+                { id: 17, sex: "m", given: "Karl", surname: "Berg", birth: "1850-05-03", occupation: "smith" },
+                { id: 42, sex: "f", given: "Anna", surname: "Holm" },
+                { id: 5, sex: "f", given: "Ida", surname: "Berg", father: 17, mother: 42 },
+                { id: 9, sex: "m", given: "Nils", surname: "Berg", father: 17, mother: 42 },
+            ] });
+            document.querySelector("olvane-tree").data = family;
+            </script>`,
+        );
+        const { page, end } = await open("/own.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        await page.evaluate(() => {
+            const tree = document.querySelector("olvane-tree");
+            tree.zoomBy(1.2);
+            tree.select(3);
+        });
+        // Where boxes stand on the screen, what they say, who is selected; once nothing moves.
+        const look = () =>
+            page.evaluate(async () => {
+                const tree = document.querySelector("olvane-tree");
+                const shown = () => {
+                    const boxes = [...tree.shadowRoot.querySelectorAll(".boxes > g[data-xref]")];
+                    const named = boxes.filter(({ dataset }) => dataset.xref !== "");
+                    const areaOf = (box) => box.querySelector(".frame").getBoundingClientRect();
+                    const focus = areaOf(tree.shadowRoot.querySelector(".box.focus"));
+                    return {
+                        place: [focus.x, focus.y, focus.width].map((value) => Math.round(value)),
+                        xrefs: named.map(({ dataset }) => dataset.xref).sort(),
+                        words: named.map((box) => box.querySelector(".frame").getAttribute("aria-label")).join("; "),
+                        selected: tree.selected.xref,
+                    };
+                };
+                let last = "";
+                for (let calm = 0; calm < 4;) {
+                    await new Promise((next) => setTimeout(next, 60));
+                    const now = JSON.stringify(shown());
+                    calm = now === last ? calm + 1 : 0;
+                    last = now;
+                }
+                return JSON.parse(last);
+            });
+        const change = async (run) => (await page.evaluate(run), look());
+        const first = await look();
+        assert.deepEqual(first.xrefs, ["17", "42", "5", "9"]);
+        assert.match(first.words, /Karl Berg, born 1850/);
+        assert.equal(first.selected, "5");
+        const renamed = await change(() => window.family.setNames(9, [{ kind: "given", text: "Olof" }]));
+        assert.match(renamed.words, /Olof/);
+        assert.doesNotMatch(renamed.words, /Nils/);
+        const grown = await change(() => {
+            window.family.addPerson({ id: 3, sex: "f", father: 17, mother: 42 });
+            window.family.setNames(3, [{ text: "Eva Berg" }]);
+        });
+        assert.deepEqual(grown.xrefs, ["17", "3", "42", "5", "9"]);
+        assert.match(grown.words, /Eva Berg/);
+        const smaller = await change(() => window.family.removePerson(9));
+        assert.deepEqual(smaller.xrefs, ["17", "3", "42", "5"]);
+        for (const later of [renamed, grown, smaller]) {
+            assert.deepEqual(later.place, first.place);
+            assert.equal(later.selected, "5");
+        }
+        const views = await page.evaluate(() => {
+            const tree = document.querySelector("olvane-tree");
+            const names = ["family", "pedigree", "near", "ancestors", "descendants", "hourglass", "relatives", "fan"];
+            return [...names, "everybody", "kinship"].filter(
+                (view) => !tree.show({ view, to: 3 }) || !/Karl/.test(tree.saveSvg()),
+            );
+        });
+        assert.deepEqual(views, []);
+        await end();
+    });
+
+    test("a family that loses everybody, or that a program no longer shows, breaks nothing", async () => {
+        const { page, end } = await open("/own.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const seen = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            const later = () => new Promise((next) => setTimeout(next, 100));
+            const boxes = () => tree.shadowRoot.querySelectorAll(".boxes > g").length;
+            for (const id of window.family.ids) window.family.removePerson(id);
+            await later();
+            const empty = boxes();
+            window.family.addPerson({ id: 8, sex: "f" });
+            await later();
+            const again = boxes();
+            tree.data = null;
+            window.family.addPerson({ id: 9, sex: "f", mother: 8 });
+            await later();
+            return { empty, again, released: boxes() };
+        });
+        assert.equal(seen.empty, 0);
+        assert.ok(seen.again > 0);
+        assert.equal(seen.released, seen.again);
+        await end();
+    });
+
     test("a program draws boxes itself, and what is read out of them stays", async () => {
         const { page, end } = await open("/one.html");
         await page.waitForSelector("olvane-tree .box.focus");

@@ -10,7 +10,7 @@
 
 import assert from "node:assert/strict";
 import { execFileSync, spawn } from "node:child_process";
-import { existsSync, mkdirSync, mkdtempSync, readdirSync, readFileSync, rmSync, writeFileSync } from "node:fs";
+import { cpSync, existsSync, mkdirSync, mkdtempSync, readdirSync, readFileSync, rmSync, writeFileSync } from "node:fs";
 import { createServer } from "node:http";
 import { createRequire } from "node:module";
 import { tmpdir } from "node:os";
@@ -32,6 +32,8 @@ const kTools = values.quick
           "esbuild@0.28",
           "playwright-core@1.58",
           "vite@7",
+          "react@19",
+          "react-dom@19",
           "webpack@5",
           "webpack-cli@6",
           "rollup@4",
@@ -190,6 +192,8 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
             const svg = await page.evaluate(() => document.querySelector("olvane-tree").saveSvg());
             for (const name of ["Henry", "Anne", "Elizabeth", "Edmund", "Margaret"])
                 assert.ok(svg.includes(name), `${name} is not drawn`);
+            await page.click("#add");
+            await page.waitForFunction(() => document.querySelector("olvane-tree").saveSvg().includes("Clara"));
             assert.deepEqual(await page.evaluate(() => globalThis.refused), ["style-src-attr"]);
         } finally {
             await page.close();
@@ -246,6 +250,27 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
                   );
                   run(bin("vite"), ["build", "--logLevel", "error"], join(work, "vite"));
                   return titleOf(`${address}/vite/out/index.html`);
+              },
+              async "the example in React, built by vite"() {
+                  cpSync(new URL("../../../examples/javascript/react", import.meta.url), join(work, "react"), {
+                      recursive: true,
+                  });
+                  run(bin("vite"), ["build", "--logLevel", "error"], join(work, "react"));
+                  const page = await browser.newPage();
+                  try {
+                      await page.goto(`${address}/react/dist/index.html`);
+                      await page.locator('olvane-tree [data-xref="3"]').first().click();
+                      await page.fill("input", "Ida Renamed");
+                      await page.click("text=Rename");
+                      await page.waitForFunction(() => /Renamed/.test(document.querySelector("olvane-tree").saveSvg()));
+                      await page.selectOption("select", "descendants");
+                      return await page.evaluate(() => {
+                          const { state, picture } = document.querySelector("olvane-tree");
+                          return state.view === "descendants" ? String(picture.boxes.length) : state.view;
+                      });
+                  } finally {
+                      await page.close();
+                  }
               },
               async "vite dev, with a worker"() {
                   const port = 5300 + Math.floor(Math.random() * 500);

@@ -55,6 +55,12 @@ const kKinshipDelay = 600; // ms after the picture of a larger family, when its 
 /** What stands in the box of a person, which has this width and height in points; null for the usual. */
 export type BoxRenderer = (person: Person, box: { width: number; height: number }) => SVGElement | null;
 
+/** A family of the program's own: a Family of the package olvane, or whatever answers as one does. */
+export interface FamilyData extends Pick<EventTarget, "addEventListener" | "removeEventListener"> {
+    /** The text of a GEDCOM file, with everybody as they are now. */
+    gedcom(): string;
+}
+
 export interface OlvaneTreeEvents {
     /** Another person is selected: the panel is about them. */
     select: CustomEvent<{ person: Person }>;
@@ -95,6 +101,8 @@ export class OlvaneTree extends HTMLElement {
     private kinshipTimer = 0;
     private boxRenderer: BoxRenderer | null = null;
     private redrawTimer = 0;
+    private ownData: FamilyData | null = null;
+    private willRefresh = false;
     private isInUse = false; // by a pointer that was pressed in the picture and has not left it
 
     constructor() {
@@ -126,6 +134,17 @@ export class OlvaneTree extends HTMLElement {
         if (!this.hasAttribute("data-theme")) this.applyTheme();
         const src = this.getAttribute("src");
         if (src && !this.opened) this.loadAttribute(src);
+        this.takeEarlyProperties();
+    }
+
+    // What was set before the browser knew the element hides the property of that name.
+    private takeEarlyProperties(): void {
+        for (const name of ["data", "renderBox"] as const) {
+            if (!Object.hasOwn(this, name)) continue;
+            const value = this[name];
+            Reflect.deleteProperty(this, name);
+            Object.assign(this, { [name]: value });
+        }
     }
 
     disconnectedCallback(): void {
@@ -170,9 +189,13 @@ export class OlvaneTree extends HTMLElement {
         await this.open(new Uint8Array(await response.arrayBuffer()), name);
     }
 
-    // Nobody waits for what an attribute asks for, so a failure is an event.
     private loadAttribute(address: string): void {
-        this.load(address).catch((error: unknown) => {
+        this.orReport(this.load(address));
+    }
+
+    // Nobody waits for what an attribute or a property asks for, so a failure is an event.
+    private orReport(work: Promise<void>): void {
+        work.catch((error: unknown) => {
             const message = error instanceof Error ? error.message : String(error);
             this.dispatchEvent(new ErrorEvent("error", { message, error }));
         });
@@ -213,6 +236,36 @@ export class OlvaneTree extends HTMLElement {
         else this.showInPanel(again);
         this.sight = sight;
     }
+
+    /**
+     * A family of the program's own in place of a file. It is shown again after each of its "change" events: once for all
+     * changes that are made in a row. What stays then is as in update().
+     */
+    get data(): FamilyData | null {
+        return this.ownData;
+    }
+
+    set data(data: FamilyData | null) {
+        this.ownData?.removeEventListener("change", this.dataChanged);
+        this.ownData = data;
+        data?.addEventListener("change", this.dataChanged);
+        this.dataChanged();
+    }
+
+    /** Shows data as it is now, for data without events. */
+    async refresh(): Promise<void> {
+        const { ownData } = this;
+        if (ownData) await this.update(new TextEncoder().encode(ownData.gedcom()));
+    }
+
+    private readonly dataChanged = (): void => {
+        if (this.willRefresh) return;
+        this.willRefresh = true;
+        queueMicrotask(() => {
+            this.willRefresh = false;
+            this.orReport(this.refresh());
+        });
+    };
 
     /**
      * Draws the inside of boxes: an SVG element with its origin in the box's upper left corner, or null for the usual. What is
@@ -637,5 +690,12 @@ function middleOf({ x, y, width, height }: Box): { x: number; y: number } {
 
 /** Makes <olvane-tree> known to the browser; once is enough. */
 export function defineOlvaneTree(): void {
+    // Frameworks set an attribute as the property of its name where there is one: here that would be the method.
+    Object.defineProperty(OlvaneTree.prototype, "focus", {
+        get: () => HTMLElement.prototype.focus,
+        set(this: OlvaneTree, person: unknown) {
+            this.setAttribute("focus", String(person));
+        },
+    });
     if (!customElements.get("olvane-tree")) customElements.define("olvane-tree", OlvaneTree);
 }
