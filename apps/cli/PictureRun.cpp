@@ -5,10 +5,9 @@
 
 #include <cli/PictureRun.h>
 
-#include <algorithm>
-#include <span>
 #include <utility>
 
+#include <olvane/picture/HiddenPersons.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
 
@@ -35,62 +34,19 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& requ
     if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
 
-bool PictureRun::isHidden(std::int64_t id) const {
-    return id > 0 && static_cast<std::size_t>(id) <= hidden_.size() &&
-           hidden_[static_cast<std::size_t>(id - 1)];
-}
-
 picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
     gedcom::GedcomDataSource people(data_, parents_);
     charts::ViewRequest view = view_;
     view.chart.focus = graph_.placeOf(focus);
     picture::Picture picture = charts::pictureOf(limitedSource(people), graph_, view);
-    if (!hidden_.empty()) hideIn(picture);
+    picture::hidePersons(hidden_, picture);
     return picture;
-}
-
-void PictureRun::hideIn(picture::Picture& picture) const {
-    const auto isHiddenBox = [&](picture::Index box) {
-        return isHidden(picture.boxes[static_cast<std::size_t>(box)].id);
-    };
-    for (picture::Box& box : picture.boxes) {
-        if (isHidden(box.id)) box.furtherParents = 0;
-    }
-    for (picture::Family& family : picture.families) {
-        const auto parents = picture.parents(family);
-        const auto children = picture.children(family);
-        for (std::size_t i = 0; i < children.size(); ++i) {
-            if (isHiddenBox(children[i])) {
-                picture.childKinds[family.firstMember + family.parentCount + i] = kin::ChildKind::unknown;
-            }
-        }
-        if (std::none_of(parents.begin(), parents.end(), isHiddenBox)) continue;
-        family.number = 0;
-        family.style = kin::UnionState::unknown;
-    }
-    hideWaysIn(picture);
-}
-
-// The words of a way state an adoption and whether a marriage lasts, and those at its ends state all ways.
-void PictureRun::hideWaysIn(picture::Picture& picture) const {
-    for (picture::Way& way : picture.ways) {
-        const auto boxes = picture.boxesOf(way);
-        if (std::none_of(boxes.begin(), boxes.end(), [&](picture::Index box) {
-                return isHidden(picture.boxes[static_cast<std::size_t>(box)].id);
-            })) {
-            continue;
-        }
-        way.words.clear();
-        if (way.kind == picture::WayKind::legal) way.kind = picture::WayKind::blood;
-        picture.focusIs.clear();
-        picture.otherIs.clear();
-    }
 }
 
 picture::PictureFacts PictureRun::facts() const {
     picture::PictureFacts facts;
     facts.person = [this](std::int64_t id) {
-        if (isHidden(id)) return std::string(kLivingJson);
+        if (picture::isHidden(hidden_, id)) return std::string(kLivingJson);
         return personJson(data_, static_cast<gedcom::PersonId>(id), hiddenNames_)
             .dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);
     };

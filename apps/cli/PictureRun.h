@@ -26,8 +26,7 @@ public:
     // hidden: of whom nothing is stated, an entry for each person; empty for nobody.
     PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden);
 
-    // Of hidden persons there are boxes and who belongs to which family: no kind of a hidden child, none of their further parents, neither number
-    // nor state of a family with a hidden partner or without a partner who is known, no words of a way over them.
+    // Of hidden persons as picture::hidePersons leaves it.
     picture::Picture pictureOf(gedcom::PersonId focus) const;
 
     // What the file adds in JSON; of a hidden person {"living": true}. Valid as long as this lives.
@@ -37,10 +36,6 @@ public:
     std::string jsonOf(gedcom::PersonId focus) const;
 
 private:
-    bool isHidden(std::int64_t id) const;
-    void hideIn(picture::Picture& picture) const;
-    void hideWaysIn(picture::Picture& picture) const;
-
     const gedcom::GedcomData& data_;
     charts::ViewRequest view_;
     std::vector<bool> hidden_;

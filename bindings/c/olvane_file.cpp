@@ -5,11 +5,8 @@
 
 #include <olvane_file.h>
 
-#include <functional>
 #include <memory>
-#include <mutex>
 #include <new>
-#include <optional>
 #include <stdexcept>
 #include <string>
 #include <string_view>
@@ -17,24 +14,26 @@
 #include <vector>
 
 #include "FamilyInternal.h"
+#include "FileInternal.h"
 #include "LayoutInternal.h"
 
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Views.h>
 #include <olvane/draw/SvgDrawing.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/gedcom/HiddenNames.h>
 #include <olvane/kin/DataCheck.h>
 #include <olvane/kin/FamilyLabels.h>
 #include <olvane/kin/Kinship.h>
 #include <olvane/kin/KinshipJson.h>
 #include <olvane/kin/RemarkJson.h>
+#include <olvane/picture/HiddenPersons.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomFamily.h>
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomLabels.h>
 #include <olvane/source/GedcomLives.h>
 #include <olvane/source/LimitedDataSource.h>
-#include <olvane/source/PersonFinder.h>
 
 namespace gedcom = olvane::gedcom;
 namespace charts = olvane::charts;
@@ -45,43 +44,6 @@ struct olvane_result {
     std::string text;
 };
 
-// The opaque file. What is made at the first need is made once, by whichever thread comes first.
-struct olvane_file {
-    explicit olvane_file(gedcom::GedcomData read) : data(std::move(read)) {}
-
-    const kin::KinGraph& graph() const {
-        const std::lock_guard<std::mutex> lock(guard_);
-        if (!graph_) graph_ = gedcom::kinGraphOf(data);
-        return *graph_;
-    }
-
-    std::string kinship(std::int64_t a, std::int64_t b) const {
-        const kin::KinGraph& everybody = graph();
-        const std::lock_guard<std::mutex> lock(guard_);
-        if (!kinships_) kinships_ = std::make_unique<kin::KinshipFinder>(everybody);
-        const kin::Kinship found = kinships_->between(everybody.placeOf(a), everybody.placeOf(b));
-        return kin::kinshipJson(everybody, found);
-    }
-
-    std::vector<gedcom::PersonId> meant(const std::string& who) const {
-        const std::lock_guard<std::mutex> lock(guard_);
-        if (!finder_) finder_ = std::make_unique<gedcom::PersonFinder>(data);
-        return finder_->meant(who);
-    }
-
-    bool has(std::int64_t person) const {
-        return person >= 1 && person <= static_cast<std::int64_t>(data.personCount());
-    }
-
-    const gedcom::GedcomData data;
-
-private:
-    mutable std::mutex guard_;
-    mutable std::optional<kin::KinGraph> graph_;
-    mutable std::unique_ptr<kin::KinshipFinder> kinships_;
-    mutable std::unique_ptr<gedcom::PersonFinder> finder_;
-};
-
 namespace {
 
 // What a call refuses, with the status that says so.
@@ -89,8 +51,6 @@ struct Refusal {
     olvane_status status;
     std::string text;
 };
-
-constexpr std::size_t kMostRelatives = 5000000;  // a thousand times what charts of real families ask for
 
 void keep(olvane_result** result, std::string text) noexcept {
     if (!result) return;
@@ -192,6 +152,7 @@ charts::ViewRequest requestOf(const olvane_draw_options& options, const kin::Kin
     chart.up = options.up;
     chart.down = options.down;
     if (options.generations > 0) chart.layout.generations = options.generations;
+    charts::flagBeyondGenerations(chart);
     chart.focus = graph.placeOf(focus);
     if (chart.view == charts::View::kinship) {
         chart.to = graph.placeOf(options.to);
@@ -211,15 +172,31 @@ std::string svgOf(draw::DrawingContent content, const olvane_draw_options& optio
     return draw::drawSvg(content, drawing).svg;
 }
 
+std::vector<bool> hiddenIn(const olvane_file& file, const olvane_draw_options& options) {
+    if (options.year < 0 || options.year > olvane::c::kLastYear) {
+        refuseOption("year", std::to_string(options.year), "1 to 9999, or 0 for the present one");
+    }
+    return options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
+}
+
+gedcom::HiddenTexts hiddenTexts(const gedcom::GedcomData& data, const std::vector<bool>& hidden) {
+    if (hidden.empty()) return {};
+    const gedcom::HiddenNames names(data, hidden);
+    return {hidden, [names](std::string_view text) { return names.shownPlace(text); },
+            [names](std::string_view text) { return names.shownText(text); }};
+}
+
 std::string drawnFromFile(const olvane_file& file, std::int64_t focus, const olvane_draw_options& options) {
     requirePerson(file.has(focus), focus);
     gedcom::GedcomDataSource people(file.data);
-    const auto source = std::make_shared<gedcom::LimitedDataSource>(people, kMostRelatives);
+    const auto source = std::make_shared<gedcom::LimitedDataSource>(people, olvane::c::kMostRelatives);
     const gedcom::ShownFacts shown{options.dates != 0, options.places != 0, options.occupation != 0,
                                    options.marriage != 0};
-    const gedcom::GedcomLabels labels(file.data, shown);
+    const std::vector<bool> hidden = hiddenIn(file, options);
+    const gedcom::GedcomLabels labels(file.data, shown, hiddenTexts(file.data, hidden));
     draw::DrawingContent content;
     content.picture = charts::pictureOf(source, file.graph(), requestOf(options, file.graph(), focus));
+    olvane::picture::hidePersons(hidden, content.picture);
     content.labelOf = [&labels](std::int64_t id) { return labels.ofPerson(id); };
     content.familyLabelOf = [&labels](std::uint32_t number) { return labels.ofFamily(number); };
     return svgOf(std::move(content), options);
@@ -228,6 +205,7 @@ std::string drawnFromFile(const olvane_file& file, std::int64_t focus, const olv
 std::string drawnFromTable(const olvane::Family& table, std::int64_t focus,
                            const olvane_draw_options& options) {
     requirePerson(table.hasPerson(focus), focus);
+    if (options.hide_living != 0) refuseOption("hide_living", "1", "0 where a table is drawn");
     const kin::KinGraph graph = olvane::kinGraphOf(table);
     draw::DrawingContent content;
     content.picture = charts::pictureOf(std::make_shared<olvane::FamilyDataSource>(table), graph,
@@ -269,8 +247,9 @@ gedcom::ReadOptions readOptions(std::uint32_t flags) {
     return options;
 }
 
+template <class Read>
 olvane_status opened(olvane_file** file, olvane_result** failure, std::uint32_t flags,
-                     const std::function<gedcom::GedcomData(const gedcom::ReadOptions&)>& read) noexcept {
+                     const Read& read) noexcept {
     *file = nullptr;
     return answered(failure, [&] {
         if ((flags & ~OLVANE_READ_FACTS) != 0)
@@ -340,6 +319,18 @@ olvane_status olvane_file_kinship(const olvane_file* file, int64_t a, int64_t b,
         requirePerson(file->has(a), a);
         requirePerson(file->has(b), b);
         *json = new olvane_result{file->kinship(a, b)};
+    });
+}
+
+olvane_status olvane_family_kinship(const olvane_family* family, int64_t a, int64_t b, olvane_result** json) {
+    if (!family || !json) return OLVANE_INVALID_ARGUMENT;
+    return answered(json, [&] {
+        requirePerson(family->table.hasPerson(a), a);
+        requirePerson(family->table.hasPerson(b), b);
+        const kin::KinGraph graph = olvane::kinGraphOf(family->table);
+        kin::KinshipFinder finder(graph);
+        *json =
+            new olvane_result{kin::kinshipJson(graph, finder.between(graph.placeOf(a), graph.placeOf(b)))};
     });
 }
 

@@ -76,6 +76,10 @@ OLVANE_C_API olvane_status olvane_file_layout(const olvane_file* file, int32_t v
 OLVANE_C_API olvane_status olvane_file_kinship(const olvane_file* file, int64_t a, int64_t b,
                                                olvane_result** json);
 
+/* The same of a table. */
+OLVANE_C_API olvane_status olvane_family_kinship(const olvane_family* family, int64_t a, int64_t b,
+                                                 olvane_result** json);
+
 /* What may be odd in the data, as a JSON array: {"kind": ..., "person": ..., "family": ..., "text": ...} for each. */
 OLVANE_C_API olvane_status olvane_file_remarks(const olvane_file* file, olvane_result** json);
 
@@ -100,6 +104,9 @@ typedef struct olvane_draw_options {
     int32_t places;     /* 1 for places of birth and death; of a file that was read with OLVANE_READ_FACTS */
     int32_t occupation; /* 1 for the first occupation; of a file that was read with OLVANE_READ_FACTS */
     int32_t marriage;   /* 1 for the year at each line of a marriage */
+    int32_t
+        hide_living; /* of a file: 1 to state nothing of whoever may be living, as "olvane draw --hide-living" */
+    int32_t year;    /* the year that hide_living counts from; the present one by default */
 } olvane_draw_options;
 
 /* Opens a file, draws a person of it, and closes it: the picture that "olvane draw" makes. options may be null. */

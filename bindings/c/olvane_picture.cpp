@@ -7,17 +7,23 @@
 
 #include <cstddef>
 #include <functional>
+#include <limits>
 #include <memory>
 #include <new>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
 #include "FamilyInternal.h"
+#include "FileInternal.h"
 #include "LayoutInternal.h"
 
 #include <olvane/charts/Views.h>
+#include <olvane/picture/HiddenPersons.h>
 #include <olvane/picture/LayoutPicture.h>
 #include <olvane/picture/PictureJson.h>
+#include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/LimitedDataSource.h>
 
 // The opaque picture.
 struct olvane_picture {
@@ -63,7 +69,8 @@ olvane_picture_box boxOf(const picture::Box& box) {
             box.hiddenParents,
             box.hiddenPartners,
             box.hiddenChildren,
-            box.furtherParents};
+            box.furtherParents,
+            0};
 }
 
 olvane_picture_family familyOf(const picture::Family& family) {
@@ -132,6 +139,8 @@ const Entry* dataOrNull(const std::vector<Entry>& entries) {
     return entries.empty() ? nullptr : entries.data();
 }
 
+constexpr std::int64_t kGreatestId = std::numeric_limits<std::int32_t>::max();
+
 // Whether a number is one of an enumeration that counts from 0.
 bool isOneOf(std::int32_t number, std::int32_t count) {
     return number >= 0 && number < count;
@@ -146,7 +155,8 @@ bool areInRange(const olvane_picture_options& options) {
            options.up >= 0 && options.down >= 0 && isOneOf(options.direction, 4) &&
            isOneOf(options.fan_of, 2) && options.fan_angle >= 90 && options.fan_angle <= 360 &&
            isOneOf(options.ways, 3) && options.most_ways >= 0 && isOneOf(options.language, 3) &&
-           options.marks >= -1 && isOneOf(options.effort, 101) && olvane::c::areInRange(options.layout);
+           options.marks >= -1 && isOneOf(options.effort, 101) &&
+           isOneOf(options.year, olvane::c::kLastYear + 1) && olvane::c::areInRange(options.layout);
 }
 
 charts::ViewRequest requestOf(const olvane_picture_options& options) {
@@ -181,16 +191,37 @@ olvane_picture_options chosenOptions(const olvane_picture_options* options) {
     return chosen;
 }
 
-// Runs what makes a picture, and fills it; a failure is stated in an empty picture.
-olvane_status make(const std::function<picture::Picture()>& work, olvane_picture** picture) noexcept {
+// Runs what fills a picture; a failure is stated in an empty picture.
+template <class Work>
+olvane_status make(const Work& work, olvane_picture** picture) noexcept {
     try {
         auto made = std::make_unique<olvane_picture>();
-        const olvane_status status = olvane::c::guarded([&] { fill(work(), *made); }, made->failure);
+        const olvane_status status = olvane::c::guarded([&] { work(*made); }, made->failure);
         *picture = made.release();
         return status;
     } catch (...) {
         return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
     }
+}
+
+void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_picture_options& options,
+                  olvane_picture& to) {
+    const auto placeOf = [&file](std::int64_t person) {
+        if (!file.has(person)) throw std::out_of_range("no person of the file");
+        return file.graph().placeOf(person);
+    };
+    charts::ViewRequest request = requestOf(options);
+    request.chart.focus = placeOf(focus);
+    if (request.chart.view == charts::View::kinship) request.chart.to = placeOf(options.other);
+    olvane::gedcom::GedcomDataSource people(file.data);
+    const auto source =
+        std::make_shared<olvane::gedcom::LimitedDataSource>(people, olvane::c::kMostRelatives);
+    picture::Picture made = charts::pictureOf(source, file.graph(), request);
+    const std::vector<bool> hidden =
+        options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
+    picture::hidePersons(hidden, made);
+    fill(made, to);
+    for (olvane_picture_box& box : to.boxes) box.living = picture::isHidden(hidden, box.id) ? 1 : 0;
 }
 
 }  // namespace
@@ -214,9 +245,20 @@ olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focu
     if (!picture) return OLVANE_INVALID_ARGUMENT;
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
-    if (!family || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
-    return make([&] { return charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other); },
-                picture);
+    if (!family || !areInRange(chosen) || chosen.hide_living != 0) return OLVANE_INVALID_ARGUMENT;
+    const auto work = [&](olvane_picture& made) {
+        fill(charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other), made);
+    };
+    return make(work, picture);
+}
+
+olvane_status olvane_picture_of_file(const olvane_file* file, int64_t focus,
+                                     const olvane_picture_options* options, olvane_picture** picture) {
+    if (!picture) return OLVANE_INVALID_ARGUMENT;
+    *picture = nullptr;
+    const olvane_picture_options chosen = chosenOptions(options);
+    if (!file || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    return make([&](olvane_picture& made) { fillFromFile(*file, focus, chosen, made); }, picture);
 }
 
 olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
@@ -224,12 +266,16 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
     if (!picture) return OLVANE_INVALID_ARGUMENT;
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
-    if (!host || !olvane::c::isComplete(*host) || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
-    const auto work = [&] {
-        return charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other);
+    if (!host || !olvane::c::isComplete(*host) || !areInRange(chosen) || chosen.hide_living != 0) {
+        return OLVANE_INVALID_ARGUMENT;
+    }
+    const auto work = [&](olvane_picture& made) {
+        if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
+        fill(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other), made);
     };
     olvane_status status = OLVANE_NESTED_CALL;
-    olvane::c::unlessNested([&] { status = make(work, picture); });
+    const auto makeIt = [&] { status = make(work, picture); };
+    olvane::c::unlessNested(std::cref(makeIt));  // a copy would allocate, outside of all guards
     return status;
 }
 

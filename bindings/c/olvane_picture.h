@@ -22,6 +22,7 @@
 
 #include <olvane.h>
 #include <olvane_family.h>
+#include <olvane_file.h>
 
 #ifdef __cplusplus
 extern "C" {
@@ -64,6 +65,7 @@ typedef struct olvane_picture_box {
     int32_t hidden_children;
     int32_t
         further_parents; /* families that the person is a child of, beside the first, with no parent shown */
+    int32_t living;      /* 1 for a person of whom nothing is to be stated, where hide_living was asked for */
 } olvane_picture_box;
 
 /* Persons joined by lines. Its members lie side by side in members, one or two parents first, the father or the
@@ -205,6 +207,8 @@ typedef struct olvane_picture_options {
     int32_t effort;          /* everybody: 0 to 100 */
     int32_t all_parts;       /* everybody: 1 for those as well who are not connected with the focus */
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
+    int32_t hide_living; /* of a file: 1 to state nothing of whoever may be living, and to say who that is */
+    int32_t year;        /* the year that hide_living counts from; 0 for the present one */
     olvane_options
         layout; /* the box and the gaps of every view; family, near: shown; pedigree: generations */
 } olvane_picture_options;
@@ -221,6 +225,11 @@ OLVANE_C_API olvane_status olvane_picture_of_family(const olvane_family* family,
                                                     const olvane_picture_options* options,
                                                     olvane_picture** picture);
 OLVANE_C_API olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
+                                                  const olvane_picture_options* options,
+                                                  olvane_picture** picture);
+
+/* The same of an open file. OLVANE_INVALID_PERSON for a focus or another person who is not in it. */
+OLVANE_C_API olvane_status olvane_picture_of_file(const olvane_file* file, int64_t focus,
                                                   const olvane_picture_options* options,
                                                   olvane_picture** picture);
 

@@ -169,12 +169,15 @@ def draw(
     places: bool = False,
     occupation: bool = False,
     marriage: bool = False,
+    hide_living: bool = False,
+    year: int = 0,
 ) -> Svg:
     """Draw one person of a GEDCOM file or of a Family in one call, as "olvane draw" does.
 
     source is a path, the bytes of a file, a File that is open, or a Family, whose persons are named by their ids alone.
     to is the other person of a kinship; up and down are generations, 0 for all; generations is of a pedigree; places and
-    occupation need a File that was read with facts. Raises FileError.
+    occupation need a File that was read with facts. hide_living, of a file, states nothing of whoever may be living in the
+    year, 0 for the present one. Raises FileError.
     """
     options: dict[str, Any] = {
         "up": up,
@@ -189,6 +192,8 @@ def draw(
         "places": places,
         "occupation": occupation,
         "marriage": marriage,
+        "hide_living": hide_living,
+        "year": year,
     }
     if isinstance(source, Family):
         chosen = _draw_options(view, to=_person_number(to), **options)
@@ -215,6 +220,8 @@ class _DrawOptions(ctypes.Structure):
         ("places", c_int32),
         ("occupation", c_int32),
         ("marriage", c_int32),
+        ("hide_living", c_int32),
+        ("year", c_int32),
     ]
 
 

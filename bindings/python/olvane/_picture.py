@@ -1,23 +1,15 @@
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
-"""A layout as a picture: boxes, the families that join them, and lines that are routed around all boxes."""
+"""What a picture holds: boxes, the families that join them, and lines that are routed around all boxes."""
 
 from __future__ import annotations
 
-import ctypes
 from collections.abc import Callable
-from ctypes import POINTER, byref, c_double, c_float, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
 from dataclasses import dataclass
 from enum import IntEnum
-from typing import Any
 
-from olvane import _native
-from olvane._errors import LayoutError, Status
-from olvane._family import ChildKind, Family, FamilyState
-from olvane._host import Host
-from olvane._layout import _laid_out, _message, _request, _Request
-from olvane._options import Options, View
-from olvane._svg import Svg, plain_drawing
+from olvane._family import ChildKind, FamilyState
+from olvane._svg import Svg, plain_drawing, round_drawing
 
 
 class LineRole(IntEnum):
@@ -30,6 +22,14 @@ class LineRole(IntEnum):
     LINK = 4  # where there are no levels
 
 
+class WayKind(IntEnum):
+    """How a way between two persons runs."""
+
+    BLOOD = 0
+    LEGAL = 1  # by adoption and the like
+    MARRIAGE = 2
+
+
 class MarkKind(IntEnum):
     """What is expressed without a line."""
 
@@ -39,11 +39,26 @@ class MarkKind(IntEnum):
 
 
 @dataclass(frozen=True, slots=True)
+class PictureArc:
+    """A piece of a ring, in degrees clockwise from the top; ring 0 is the middle.
+
+    line is the place of the box at which its line of descent begins.
+    """
+
+    ring: int
+    start: float
+    end: float
+    line: int | None
+
+
+@dataclass(frozen=True, slots=True)
 class PictureBox:
     """One box. (x, y) is its upper-left corner, in points.
 
     id is None for an unknown parent, and child_of is then the place of the box whose parent it is. repeat is 0 for a person
-    with one box; else it counts the person's boxes from 1. The hidden counts are 0 where no Family is laid out.
+    with one box; else it counts the person's boxes from 1. The hidden counts are relatives without a box, and
+    further_parents families that the person is a child of, beside the first, with no parent shown. living is set where
+    hide_living was asked for and nothing is to be stated of the person. arc is of round charts, whose boxes have no size.
     """
 
     id: int | None
@@ -58,6 +73,9 @@ class PictureBox:
     hidden_parents: int
     hidden_partners: int
     hidden_children: int
+    further_parents: int = 0
+    living: bool = False
+    arc: PictureArc | None = None
 
 
 @dataclass(frozen=True, slots=True)
@@ -99,208 +117,53 @@ class PictureMark:
 
 
 @dataclass(frozen=True, slots=True)
+class PictureWay:
+    """A way between the two persons of a kinship. Its words say what the other person is to the focus by this way alone.
+
+    boxes run from the focus to the other person; ancestors are those at its top. lines are straight pieces as x1, y1, x2,
+    y2, along the lines of families.
+    """
+
+    kind: WayKind
+    boxes: tuple[int, ...]
+    ancestors: tuple[int, ...]
+    words: str
+    lines: tuple[tuple[float, float, float, float], ...]
+
+
+@dataclass(frozen=True, slots=True)
 class Picture:
-    """Boxes in the order of the layout, families with their lines, and marks. focus is the place of the focus's box."""
+    """Boxes in the order of the layout, families with their lines, and marks. focus is the place of the focus's box.
+
+    Of a kinship, other is the place of the other person's box, focus_is and other_is say in words what each is to the other,
+    and ways has those by blood first, the nearest first. Of a fan, ring i reaches from rings[i] to rings[i + 1] around
+    middle.
+    """
 
     focus: int
     boxes: tuple[PictureBox, ...]
     families: tuple[PictureFamily, ...]
     marks: tuple[PictureMark, ...]
+    view: str = "family"
+    other: int | None = None
+    focus_is: str = ""
+    other_is: str = ""
+    ways: tuple[PictureWay, ...] = ()
+    rings: tuple[float, ...] = ()
+    middle: tuple[float, float] | None = None
 
     def svg(self, label: Callable[[int], str] = str) -> Svg:
         """A plain drawing; label gives the text of a person's box, and is the id by default."""
+        texts = ["" if box.id is None else label(box.id) for box in self.boxes]
+        if self.middle is not None:
+            arcs = [box.arc for box in self.boxes if box.arc is not None]
+            return round_drawing(
+                self.middle, self.rings, ((arc.ring, arc.start, arc.end, text) for arc, text in zip(arcs, texts))
+            )
         return plain_drawing(
-            ((box.x, box.y, box.width, box.height, "" if box.id is None else label(box.id)) for box in self.boxes),
+            ((box.x, box.y, box.width, box.height, text) for box, text in zip(self.boxes, texts)),
             ((line.x1, line.y1, line.x2, line.y2) for family in self.families for line in family.lines),
         )
 
     def _repr_svg_(self) -> str:
         return self.svg()
-
-
-def picture(
-    host: Host | Family,
-    focus: int,
-    view: View = View.FAMILY,
-    options: Options | None = None,
-    *,
-    unknown_parents: bool = True,
-) -> Picture:
-    """The picture of a layout. Raises what :func:`layout` raises."""
-    known = host._pointer if isinstance(host, Family) else None
-
-    def read(request: _Request) -> Picture:
-        made = c_void_p()
-        status = _create(request._layout, known, 1 if unknown_parents else 0, byref(made))
-        try:
-            if status != Status.OK:
-                raise LayoutError(Status(status), _message(status), "", [])
-            return _picture_of(made)
-        finally:
-            _free(made)
-
-    return _laid_out(_request(host, focus, view, options), read)
-
-
-_NO_PLACE = -1
-_UNKNOWN_PARENT = 1
-
-
-class _Box(ctypes.Structure):
-    _fields_ = [
-        ("id", c_int64),
-        ("x", c_double),
-        ("y", c_double),
-        ("width", c_float),
-        ("height", c_float),
-        ("kind", c_int32),
-        ("sex", c_int32),
-        ("child_of", c_int32),
-        ("repeat", c_int32),
-        ("flag", c_int32),
-        ("hidden_parents", c_int32),
-        ("hidden_partners", c_int32),
-        ("hidden_children", c_int32),
-        ("further_parents", c_int32),
-    ]
-
-
-class _Family(ctypes.Structure):
-    _fields_ = [
-        ("first_member", c_uint32),
-        ("parent_count", c_uint32),
-        ("child_count", c_uint32),
-        ("first_line", c_uint32),
-        ("line_count", c_uint32),
-        ("number", c_uint32),
-        ("state", c_int32),
-    ]
-
-
-class _Line(ctypes.Structure):
-    _fields_ = [
-        ("x1", c_double),
-        ("y1", c_double),
-        ("x2", c_double),
-        ("y2", c_double),
-        ("role", c_int32),
-        ("child", c_int32),
-        ("first_bridge", c_uint32),
-        ("bridge_count", c_uint32),
-    ]
-
-
-class _Mark(ctypes.Structure):
-    _fields_ = [("kind", c_int32), ("number", c_int32), ("boxes", c_int32 * 3)]
-
-
-class _Arrays(ctypes.Structure):
-    _fields_ = [
-        ("struct_size", c_size_t),
-        ("boxes", POINTER(_Box)),
-        ("box_count", c_size_t),
-        ("families", POINTER(_Family)),
-        ("family_count", c_size_t),
-        ("members", POINTER(c_int32)),
-        ("child_kinds", POINTER(c_int32)),
-        ("member_count", c_size_t),
-        ("lines", POINTER(_Line)),
-        ("line_count", c_size_t),
-        ("bridges", POINTER(c_double)),
-        ("bridge_count", c_size_t),
-        ("marks", POINTER(_Mark)),
-        ("mark_count", c_size_t),
-        ("focus", c_int32),
-        ("other", c_int32),
-        ("arcs", c_void_p),
-        ("arc_count", c_size_t),
-        ("ring_radii", POINTER(c_double)),
-        ("ring_radius_count", c_size_t),
-        ("middle_x", c_double),
-        ("middle_y", c_double),
-        ("ways", c_void_p),
-        ("way_count", c_size_t),
-        ("way_boxes", POINTER(c_int32)),
-        ("way_box_count", c_size_t),
-        ("way_pieces", c_void_p),
-        ("way_piece_count", c_size_t),
-        ("focus_is", ctypes.c_char_p),
-        ("other_is", ctypes.c_char_p),
-    ]
-
-
-def _place(number: int) -> int | None:
-    return None if number == _NO_PLACE else number
-
-
-def _picture_of(made: c_void_p) -> Picture:
-    arrays = _Arrays(struct_size=ctypes.sizeof(_Arrays))
-    status = _read(made, byref(arrays))
-    if status != Status.OK:
-        raise LayoutError(Status(status), _message(status), "", [])
-    return Picture(
-        focus=arrays.focus,
-        boxes=tuple(_box(arrays.boxes[i]) for i in range(arrays.box_count)),
-        families=tuple(_family(arrays, arrays.families[i]) for i in range(arrays.family_count)),
-        marks=tuple(_mark(arrays.marks[i]) for i in range(arrays.mark_count)),
-    )
-
-
-def _box(box: Any) -> PictureBox:
-    return PictureBox(
-        id=None if box.kind == _UNKNOWN_PARENT else box.id,
-        x=box.x,
-        y=box.y,
-        width=box.width,
-        height=box.height,
-        sex=box.sex,
-        child_of=_place(box.child_of),
-        repeat=box.repeat,
-        flag=box.flag != 0,
-        hidden_parents=box.hidden_parents,
-        hidden_partners=box.hidden_partners,
-        hidden_children=box.hidden_children,
-    )
-
-
-def _family(arrays: Any, family: Any) -> PictureFamily:
-    first_child = family.first_member + family.parent_count
-    children = range(first_child, first_child + family.child_count)
-    return PictureFamily(
-        parents=tuple(arrays.members[i] for i in range(family.first_member, first_child)),
-        children=tuple(arrays.members[i] for i in children),
-        child_kinds=tuple(ChildKind(arrays.child_kinds[i]) for i in children),
-        state=FamilyState(family.state),
-        number=family.number or None,
-        lines=tuple(
-            _line(arrays, arrays.lines[i]) for i in range(family.first_line, family.first_line + family.line_count)
-        ),
-    )
-
-
-def _line(arrays: Any, line: Any) -> PictureLine:
-    bridges = range(line.first_bridge, line.first_bridge + line.bridge_count)
-    return PictureLine(
-        line.x1,
-        line.y1,
-        line.x2,
-        line.y2,
-        LineRole(line.role),
-        _place(line.child),
-        tuple(arrays.bridges[i] for i in bridges),
-    )
-
-
-def _mark(mark: Any) -> PictureMark:
-    return PictureMark(MarkKind(mark.kind), mark.number, tuple(box for box in mark.boxes if box != _NO_PLACE))
-
-
-_create = _native.library.olvane_picture_create
-_create.argtypes = [c_void_p, c_void_p, c_int, POINTER(c_void_p)]
-_create.restype = c_int
-_read = _native.library.olvane_picture_read
-_read.argtypes = [c_void_p, POINTER(_Arrays)]
-_read.restype = c_int
-_free = _native.library.olvane_picture_free
-_free.argtypes = [c_void_p]
-_free.restype = None

@@ -5,12 +5,15 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <fstream>
 #include <functional>
+#include <memory>
 #include <set>
 #include <string>
 
 #include <gtest/gtest.h>
 
+#include <olvane_file.h>
 #include <olvane_picture.h>
 
 #include <unit/bindings-c/CallbackHost.h>
@@ -126,15 +129,11 @@ TEST(CMemoryOfGoldenCases, thatRunsOutAnywhereIsAStatus) {
     }
 }
 
-TEST(CMemoryOfPictures, thatRunsOutAnywhereIsAStatusAndLeavesNothing) {
-    const unit::Answer answer = unit::familyOf(lookingHost(), 17);
-    const auto makeOne = [&answer] {
-        olvane_picture* picture = nullptr;
-        const olvane_status status = olvane_picture_create(answer.layout.get(), nullptr, 1, &picture);
-        EXPECT_EQ(status == OLVANE_OK, picture != nullptr);
-        olvane_picture_free(picture);
-        return status;
-    };
+// One call that makes a thing out of what is there already, and frees it.
+typedef std::function<olvane_status()> MakeOne;
+
+// Each allocation fails in turn, and nothing is left behind. What a sort or a cache does without may succeed all the same.
+void expectNothingLeftWhereverMemoryRunsOut(const MakeOne& makeOne, int doneAllTheSame) {
     ASSERT_EQ(OLVANE_OK, makeOne());  // what happens for the first time only
     const std::int64_t before = unit::allocationsMade();
     makeOne();
@@ -155,7 +154,146 @@ TEST(CMemoryOfPictures, thatRunsOutAnywhereIsAStatusAndLeavesNothing) {
             EXPECT_EQ(OLVANE_OUT_OF_MEMORY, status) << n;
         }
     }
-    EXPECT_GE(2, madeAllTheSame);  // a stable sort does without its buffer
+    EXPECT_GE(doneAllTheSame, madeAllTheSame);
+}
+
+// A stable sort does without its buffer.
+constexpr int kBuffersOfSorts = 2;
+
+TEST(CMemoryOfPictures, thatRunsOutAnywhereIsAStatusAndLeavesNothing) {
+    const unit::Answer answer = unit::familyOf(lookingHost(), 17);
+    const auto makeOne = [&answer] {
+        olvane_picture* picture = nullptr;
+        const olvane_status status = olvane_picture_create(answer.layout.get(), nullptr, 1, &picture);
+        EXPECT_EQ(status == OLVANE_OK, picture != nullptr);
+        olvane_picture_free(picture);
+        return status;
+    };
+    expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+}
+
+TEST(CMemoryOfPictures, thatRunsOutWhileAHostIsAskedIsAStatusAndLeavesNothing) {
+    const olvane_host host = lookingHost();
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        SCOPED_TRACE(view);
+        olvane_picture_options options;
+        ASSERT_EQ(OLVANE_OK, olvane_picture_options_default(view, &options));
+        options.other = 5;
+        const auto makeOne = [&host, &options] {
+            olvane_picture* picture = nullptr;
+            const olvane_status status = olvane_picture_of_host(&host, 17, &options, &picture);
+            olvane_picture_free(picture);
+            return status == OLVANE_HOST_FAILED ? OLVANE_OUT_OF_MEMORY : status;  // the host reports it, too
+        };
+        expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+    }
+}
+
+// A couple and their child, who was born in 1990.
+const std::string kFile =
+    "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n"
+    "0 @I1@ INDI\n1 NAME Ada /Berg/\n1 SEX F\n1 BIRT\n2 DATE 1 MAY 1960\n2 PLAC Ulm\n1 FAMS @F1@\n"
+    "0 @I2@ INDI\n1 NAME Bo /Carl/\n1 SEX M\n1 FAMS @F1@\n"
+    "0 @I3@ INDI\n1 NAME Cy /Carl/\n1 SEX M\n1 BIRT\n2 DATE 1990\n1 FAMC @F1@\n"
+    "0 @F1@ FAM\n1 HUSB @I2@\n1 WIFE @I1@\n1 CHIL @I3@\n0 TRLR\n";
+
+struct FreeFile {
+    void operator()(olvane_file* file) const { olvane_file_free(file); }
+};
+typedef std::unique_ptr<olvane_file, FreeFile> FilePointer;
+
+FilePointer readFile() {
+    olvane_file* file = nullptr;
+    olvane_file_read(kFile.data(), kFile.size(), "here.ged", OLVANE_READ_FACTS, &file, nullptr);
+    return FilePointer(file);
+}
+
+TEST(CMemoryOfFiles, thatRunsOutWhileOneIsReadLeavesNothing) {
+    const auto makeOne = [] {
+        olvane_file* file = nullptr;
+        olvane_result* failure = nullptr;
+        const olvane_status status =
+            olvane_file_read(kFile.data(), kFile.size(), "here.ged", OLVANE_READ_FACTS, &file, &failure);
+        EXPECT_EQ(status == OLVANE_OK, file != nullptr);
+        olvane_file_free(file);
+        olvane_result_free(failure);
+        return status;
+    };
+    expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+}
+
+TEST(CMemoryOfFiles, thatRunsOutWhileOneIsDrawnFromItsPathLeavesNothing) {
+    const std::string path = testing::TempDir() + "c_allocations_test.ged";
+    std::ofstream(path) << kFile;
+    for (const char* view : {"family", "hourglass", "kinship", "fan"}) {
+        SCOPED_TRACE(view);
+        olvane_draw_options options = {};
+        options.struct_size = sizeof options;
+        options.view = view;
+        options.to = 2;
+        options.places = 1;
+        options.hide_living = 1;
+        options.year = 2020;
+        const auto makeOne = [&] {
+            olvane_result* svg = nullptr;
+            const olvane_status status = olvane_draw_file(path.c_str(), "Cy Carl", &options, &svg);
+            olvane_result_free(svg);
+            return status;
+        };
+        expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+    }
+}
+
+TEST(CMemoryOfFiles, thatRunsOutInAQuestionLeavesNothing) {
+    const auto kinship = [] {
+        const FilePointer file = readFile();
+        olvane_result* json = nullptr;
+        const olvane_status status =
+            file ? olvane_file_kinship(file.get(), 1, 3, &json) : OLVANE_OUT_OF_MEMORY;
+        olvane_result_free(json);
+        return status;
+    };
+    const auto remarks = [] {
+        const FilePointer file = readFile();
+        olvane_result* json = nullptr;
+        const olvane_status status = file ? olvane_file_remarks(file.get(), &json) : OLVANE_OUT_OF_MEMORY;
+        olvane_result_free(json);
+        return status;
+    };
+    const auto table = [] {
+        const FilePointer file = readFile();
+        olvane_family* family = nullptr;
+        olvane_result* json = nullptr;
+        olvane_status status = file ? olvane_file_family(file.get(), &family) : OLVANE_OUT_OF_MEMORY;
+        if (status == OLVANE_OK) status = olvane_family_kinship(family, 1, 3, &json);
+        olvane_family_free(family);
+        olvane_result_free(json);
+        return status;
+    };
+    for (const MakeOne& makeOne : {MakeOne(kinship), MakeOne(remarks), MakeOne(table)}) {
+        expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+    }
+}
+
+// Every view of a file that is read anew each time, so that what it keeps is made anew as well.
+TEST(CMemoryOfFiles, thatRunsOutInAPictureLeavesNothing) {
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        SCOPED_TRACE(view);
+        olvane_picture_options options;
+        ASSERT_EQ(OLVANE_OK, olvane_picture_options_default(view, &options));
+        options.other = 2;
+        options.hide_living = 1;
+        options.year = 2020;
+        const auto makeOne = [&options] {
+            const FilePointer file = readFile();
+            olvane_picture* picture = nullptr;
+            const olvane_status status =
+                file ? olvane_picture_of_file(file.get(), 3, &options, &picture) : OLVANE_OUT_OF_MEMORY;
+            olvane_picture_free(picture);
+            return status;
+        };
+        expectNothingLeftWhereverMemoryRunsOut(makeOne, kBuffersOfSorts);
+    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Hosts, CMemory, testing::Bool(),

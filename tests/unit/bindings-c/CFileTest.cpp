@@ -92,6 +92,23 @@ TEST(CFile, drawsEveryView) {
     EXPECT_EQ(OLVANE_OK, drawn(file, 3, &kinship).first);
 }
 
+TEST(CFile, hidesWhoeverMayBeLiving) {
+    const File file = opened(
+        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n"
+        "0 @I1@ INDI\n1 NAME Ada /Berg/\n1 BIRT\n2 DATE 1990\n0 TRLR\n");
+    olvane_draw_options options = view("family");
+    EXPECT_NE(std::string::npos, drawn(file, 1, &options).second.find("Ada"));
+    options.hide_living = 1;
+    EXPECT_EQ(std::string::npos, drawn(file, 1, &options).second.find("Ada"));
+    options.year = 2099;
+    EXPECT_EQ(std::string::npos, drawn(file, 1, &options).second.find("Ada"));
+    options.year = 2100;
+    EXPECT_NE(std::string::npos, drawn(file, 1, &options).second.find("Ada"));
+    options.year = 10000;
+    EXPECT_EQ("year is '10000', and takes 1 to 9999, or 0 for the present one",
+              drawn(file, 1, &options).second);
+}
+
 TEST(CFile, saysWhatIsWrong) {
     olvane_result* failure = nullptr;
     olvane_file* file = nullptr;

@@ -76,6 +76,75 @@ TEST(CViews, ofATableAreThoseOfTheLibrary) {
     }
 }
 
+struct FileDeleter {
+    void operator()(olvane_file* file) const { olvane_file_free(file); }
+};
+
+// 1 and 2 have a child 3, born in 1990.
+std::unique_ptr<olvane_file, FileDeleter> fileOfThree() {
+    const std::string bytes =
+        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n"
+        "0 @I1@ INDI\n1 NAME A\n1 SEX M\n1 DEAT Y\n1 FAMS @F1@\n"
+        "0 @I2@ INDI\n1 NAME B\n1 SEX F\n1 DEAT Y\n1 FAMS @F1@\n"
+        "0 @I3@ INDI\n1 NAME C\n1 SEX M\n1 BIRT\n2 DATE 1990\n1 FAMC @F1@\n2 PEDI adopted\n"
+        "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I3@\n0 TRLR\n";
+    olvane_file* file = nullptr;
+    EXPECT_EQ(OLVANE_OK, olvane_file_read(bytes.data(), bytes.size(), "here.ged", 0, &file, nullptr));
+    return std::unique_ptr<olvane_file, FileDeleter>(file);
+}
+
+TEST(CViews, ofAFileAreThoseOfItsTable) {
+    const auto file = fileOfThree();
+    olvane_family* table = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_file_family(file.get(), &table));
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        olvane_picture_options options = optionsFor(view);
+        options.other = 2;
+        olvane_picture* ofFile = nullptr;
+        olvane_picture* ofTable = nullptr;
+        EXPECT_EQ(OLVANE_OK, olvane_picture_of_file(file.get(), 3, &options, &ofFile)) << view;
+        EXPECT_EQ(OLVANE_OK, olvane_picture_of_family(table, 3, &options, &ofTable)) << view;
+        EXPECT_EQ(jsonOf(PicturePointer(ofFile)), jsonOf(PicturePointer(ofTable))) << view;
+    }
+    olvane_family_free(table);
+}
+
+TEST(CViews, ofAFileStateNothingOfTheLiving) {
+    const auto file = fileOfThree();
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_ANCESTORS);
+    options.hide_living = 1;
+    options.year = 2020;
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_file(file.get(), 3, &options, &made));
+    const PicturePointer picture(made);
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    ASSERT_EQ(3U, arrays.box_count);
+    for (std::size_t i = 0; i < arrays.box_count; ++i) {
+        EXPECT_EQ(arrays.boxes[i].id == 3 ? 1 : 0, arrays.boxes[i].living) << arrays.boxes[i].id;
+    }
+    ASSERT_EQ(1U, arrays.family_count);
+    const olvane_picture_family& family = arrays.families[0];
+    EXPECT_EQ(5, arrays.child_kinds[family.first_member + family.parent_count]);  // not that he is adopted
+}
+
+TEST(CViews, ofNobodyAreRefused) {
+    const auto file = fileOfThree();
+    const auto family = table();
+    olvane_picture* made = nullptr;
+    EXPECT_EQ(OLVANE_INVALID_PERSON, olvane_picture_of_file(file.get(), 4, nullptr, &made));
+    olvane_picture_free(made);
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_KINSHIP);
+    options.other = 4294967297;
+    EXPECT_EQ(OLVANE_INVALID_PERSON, olvane_picture_of_file(file.get(), 3, &options, &made));
+    olvane_picture_free(made);
+    options = optionsFor(OLVANE_PICTURE_FAMILY);
+    options.hide_living = 1;  // a table says nothing of years
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 3, &options, &made));
+    EXPECT_EQ(nullptr, made);
+}
+
 TEST(CViews, ofKinshipHaveWaysAndWords) {
     const auto family = table();
     olvane_picture_options options = optionsFor(OLVANE_PICTURE_KINSHIP);

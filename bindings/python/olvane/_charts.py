@@ -1,0 +1,197 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+"""The picture of any view in one call: of a host that is asked, of a family, or of a file."""
+
+from __future__ import annotations
+
+import operator
+import os
+from collections.abc import Callable, Sequence
+from ctypes import byref, c_void_p
+from typing import Any, Literal
+
+from olvane import _picture_native as _native_picture
+from olvane._errors import HostError, LayoutError, Status
+from olvane._family import Family
+from olvane._file import DrawView, File
+from olvane._host import Host
+from olvane._layout import _Answers, _focus_number, _message, _options_struct, _watching_for_strays
+from olvane._options import Options, View
+from olvane._picture import Picture
+
+_VIEWS: tuple[DrawView, ...] = (
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+)
+_DIRECTIONS = ("down", "up", "left", "right")
+_FANS = ("ancestors", "descendants")
+_WAYS = ("blood", "marriage", "both")
+_LANGUAGES = ("en", "de", "es")
+_GREATEST_COUNT = 2**31 - 1
+_LAST_YEAR = 9999
+
+
+def picture(
+    source: Host | Family | File | str | os.PathLike[str] | bytes,
+    focus: int | str,
+    view: View | DrawView = View.FAMILY,
+    options: Options | None = None,
+    *,
+    unknown_parents: bool = True,
+    up: int = 0,
+    down: int = 0,
+    direction: Literal["down", "up", "left", "right"] = "down",
+    spouses: bool = True,
+    siblings: bool = False,
+    compact: bool = False,
+    fan_of: Literal["ancestors", "descendants"] = "ancestors",
+    fan_angle: float = 360,
+    to: int | str = 0,
+    by: Literal["blood", "marriage", "both"] = "both",
+    most_ways: int = 8,
+    language: Literal["en", "de", "es"] = "en",
+    marks: int | Literal["all"] = 0,
+    effort: int = 1,
+    all_parts: bool = False,
+    hide_living: bool = False,
+    year: int = 0,
+) -> Picture:
+    """The picture of any view around a person, as values: boxes, families with their lines, marks and ways.
+
+    source is a Family, a Host that is asked as far as the view reaches, a File, or the path or the bytes of one; persons of
+    a file may be named by a text, as :func:`olvane.draw` says. options has the size of the boxes, the gaps of every view,
+    who is shown (family, near) and the generations of a pedigree. What a view has no use for is ignored, but must be in
+    its range:
+
+    - up, down: generations of ancestors and of descendants, 0 for all; direction: where later generations stand.
+    - spouses: of descendants; siblings: of ancestors; compact: trees packed tighter.
+    - fan_of, fan_angle: whom a fan shows, and how far it reaches, in degrees, 90 to 360.
+    - to, by, most_ways (0 for all), language: the other person of a kinship, its ways and its words.
+    - marks ("all" for all), effort (0 to 100), all_parts: of everybody.
+    - unknown_parents: family and pedigree; boxes for parents who are not known.
+    - hide_living, year: of a file; nothing is stated of whoever may be living in the year, 0 for the present one, and
+      their boxes say living.
+
+    Raises HostError and LayoutError as :func:`layout` does, FileError for a file that cannot be read and for a text that
+    means nobody or several persons, and TypeError or ValueError for an option that is not allowed.
+    """
+    if isinstance(source, str | bytes | os.PathLike):
+        source = File(source)
+    name = _view_name(view)
+    chosen = _native_picture.OptionsStruct()
+    _native_picture.options_default(_VIEWS.index(name), byref(chosen))
+    if options is not None:
+        chosen.layout = _options_struct(options)
+    for flag, value in (
+        ("unknown_parents", unknown_parents),
+        ("spouses", spouses),
+        ("siblings", siblings),
+        ("compact", compact),
+        ("all_parts", all_parts),
+        ("hide_living", hide_living),
+    ):
+        setattr(chosen, flag, 1 if value else 0)
+    chosen.up = _whole("up", up, 0, _GREATEST_COUNT)
+    chosen.down = _whole("down", down, 0, _GREATEST_COUNT)
+    chosen.direction = _choice("direction", direction, _DIRECTIONS)
+    chosen.fan_of = _choice("fan_of", fan_of, _FANS)
+    chosen.fan_angle = _angle(fan_angle)
+    chosen.ways = _choice("by", by, _WAYS)
+    chosen.most_ways = _whole("most_ways", most_ways, 0, _GREATEST_COUNT)
+    chosen.language = _choice("language", language, _LANGUAGES)
+    chosen.marks = -1 if marks == "all" else _whole("marks", marks, 0, _GREATEST_COUNT)
+    chosen.effort = _whole("effort", effort, 0, 100)
+    chosen.year = _whole("year", year, 0, _LAST_YEAR)
+    if hide_living and not isinstance(source, File):
+        raise ValueError("hide_living is of a file: a host and a Family say nothing of the years of a life")
+    chosen.other = _number(source, to)
+    return _made(source, _number(source, focus), name, chosen)
+
+
+def _number(source: Host | Family | File, person: int | str) -> int:
+    if isinstance(person, str):
+        if not isinstance(source, File):
+            raise TypeError(f"a person of a family is named by an id, not by {person!r}")
+        return source.find(person)
+    return _focus_number(person)
+
+
+def _made(source: Host | Family | File, focus: int, view: DrawView, chosen: _native_picture.OptionsStruct) -> Picture:
+    if isinstance(source, File | Family):
+        call = _native_picture.of_file if isinstance(source, File) else _native_picture.of_family
+        pointer = source._pointer
+        return _read(lambda made: int(call(pointer, focus, byref(chosen), made)), focus, view)
+    answers = _Answers(source)
+    callbacks = answers.callbacks()
+
+    def ask(made: Any) -> int:
+        with _watching_for_strays(answers):
+            status: int = _native_picture.of_host(byref(callbacks), focus, byref(chosen), made)
+        _raise_kept(answers, status)
+        return status
+
+    return _read(ask, focus, view)
+
+
+def _raise_kept(answers: _Answers, status: int) -> None:
+    """Raises what the host raised, as it is or as the cause of a HostError."""
+    raised = answers.take_raised()
+    try:
+        if raised is not None and not isinstance(raised, Exception):
+            raise raised
+        if raised is not None and status != Status.OUT_OF_MEMORY:
+            raise HostError(Status.HOST_FAILED, answers.failure(raised), "", []) from raised
+    finally:
+        del raised  # whose frames may hold this one
+
+
+def _read(make: Callable[[Any], int], focus: int, view: DrawView) -> Picture:
+    made = c_void_p()
+    try:
+        status = make(byref(made))
+        if status != Status.OK:
+            reason = _native_picture.failure_of(made) or _message(status)
+            raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
+        return _native_picture.picture_of(made, view)
+    finally:
+        _native_picture.free(made)
+
+
+def _view_name(view: View | DrawView) -> DrawView:
+    name = view.value if isinstance(view, View) else view
+    for known in _VIEWS:
+        if name == known:
+            return known
+    raise TypeError(f"view is {view!r}, and takes a View or one of {', '.join(_VIEWS)}")
+
+
+def _choice(name: str, given: str, allowed: Sequence[str]) -> int:
+    if given not in allowed:
+        raise ValueError(f"{name} is {given!r}, and takes one of {', '.join(allowed)}")
+    return allowed.index(given)
+
+
+def _whole(name: str, given: object, least: int, most: int) -> int:
+    try:
+        whole = operator.index(given)  # type: ignore[arg-type]
+    except TypeError:
+        raise TypeError(f"{name} is {given!r}, and takes a whole number") from None
+    if not least <= whole <= most:
+        raise ValueError(f"{name} is {whole}, and takes a whole number of {least} to {most}")
+    return whole
+
+
+def _angle(given: float) -> float:
+    if isinstance(given, bool) or not isinstance(given, int | float):
+        raise TypeError(f"fan_angle is {given!r}, and takes a number")
+    if not 90 <= given <= 360:
+        raise ValueError(f"fan_angle is {given}, and takes a number of 90 to 360")
+    return float(given)

@@ -1,0 +1,278 @@
+# SPDX-FileCopyrightText: The Olvane developers
+# SPDX-License-Identifier: MIT
+"""A picture as ctypes sees it, and its way into dataclasses."""
+
+from __future__ import annotations
+
+import ctypes
+from ctypes import POINTER, byref, c_char_p, c_double, c_float, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
+from typing import Any
+
+from olvane import _native
+from olvane._errors import LayoutError, Status
+from olvane._family import ChildKind, FamilyState
+from olvane._picture import (
+    LineRole,
+    MarkKind,
+    Picture,
+    PictureArc,
+    PictureBox,
+    PictureFamily,
+    PictureLine,
+    PictureMark,
+    PictureWay,
+    WayKind,
+)
+
+
+class OptionsStruct(ctypes.Structure):
+    """olvane_picture_options"""
+
+    _fields_ = [
+        ("struct_size", c_size_t),
+        ("view", c_int32),
+        ("up", c_int32),
+        ("down", c_int32),
+        ("direction", c_int32),
+        ("spouses", c_int32),
+        ("siblings", c_int32),
+        ("compact", c_int32),
+        ("fan_of", c_int32),
+        ("fan_angle", c_double),
+        ("other", c_int64),
+        ("ways", c_int32),
+        ("most_ways", c_int32),
+        ("language", c_int32),
+        ("marks", c_int32),
+        ("effort", c_int32),
+        ("all_parts", c_int32),
+        ("unknown_parents", c_int32),
+        ("hide_living", c_int32),
+        ("year", c_int32),
+        ("layout", _native.OptionsStruct),
+    ]
+
+
+_NO_PLACE = -1
+_UNKNOWN_PARENT = 1
+
+
+class _Box(ctypes.Structure):
+    _fields_ = [
+        ("id", c_int64),
+        ("x", c_double),
+        ("y", c_double),
+        ("width", c_float),
+        ("height", c_float),
+        ("kind", c_int32),
+        ("sex", c_int32),
+        ("child_of", c_int32),
+        ("repeat", c_int32),
+        ("flag", c_int32),
+        ("hidden_parents", c_int32),
+        ("hidden_partners", c_int32),
+        ("hidden_children", c_int32),
+        ("further_parents", c_int32),
+        ("living", c_int32),
+    ]
+
+
+class _Family(ctypes.Structure):
+    _fields_ = [
+        ("first_member", c_uint32),
+        ("parent_count", c_uint32),
+        ("child_count", c_uint32),
+        ("first_line", c_uint32),
+        ("line_count", c_uint32),
+        ("number", c_uint32),
+        ("state", c_int32),
+    ]
+
+
+class _Line(ctypes.Structure):
+    _fields_ = [
+        ("x1", c_double),
+        ("y1", c_double),
+        ("x2", c_double),
+        ("y2", c_double),
+        ("role", c_int32),
+        ("child", c_int32),
+        ("first_bridge", c_uint32),
+        ("bridge_count", c_uint32),
+    ]
+
+
+class _Mark(ctypes.Structure):
+    _fields_ = [("kind", c_int32), ("number", c_int32), ("boxes", c_int32 * 3)]
+
+
+class _Arc(ctypes.Structure):
+    _fields_ = [("start", c_double), ("end", c_double), ("ring", c_int32), ("line", c_int32)]
+
+
+class _Way(ctypes.Structure):
+    _fields_ = [
+        ("first_box", c_uint32),
+        ("box_count", c_uint32),
+        ("ancestor_count", c_uint32),
+        ("first_piece", c_uint32),
+        ("piece_count", c_uint32),
+        ("kind", c_int32),
+        ("words", c_char_p),
+    ]
+
+
+class _Piece(ctypes.Structure):
+    _fields_ = [("x1", c_double), ("y1", c_double), ("x2", c_double), ("y2", c_double)]
+
+
+class _Arrays(ctypes.Structure):
+    _fields_ = [
+        ("struct_size", c_size_t),
+        ("boxes", POINTER(_Box)),
+        ("box_count", c_size_t),
+        ("families", POINTER(_Family)),
+        ("family_count", c_size_t),
+        ("members", POINTER(c_int32)),
+        ("child_kinds", POINTER(c_int32)),
+        ("member_count", c_size_t),
+        ("lines", POINTER(_Line)),
+        ("line_count", c_size_t),
+        ("bridges", POINTER(c_double)),
+        ("bridge_count", c_size_t),
+        ("marks", POINTER(_Mark)),
+        ("mark_count", c_size_t),
+        ("focus", c_int32),
+        ("other", c_int32),
+        ("arcs", POINTER(_Arc)),
+        ("arc_count", c_size_t),
+        ("ring_radii", POINTER(c_double)),
+        ("ring_radius_count", c_size_t),
+        ("middle_x", c_double),
+        ("middle_y", c_double),
+        ("ways", POINTER(_Way)),
+        ("way_count", c_size_t),
+        ("way_boxes", POINTER(c_int32)),
+        ("way_box_count", c_size_t),
+        ("way_pieces", POINTER(_Piece)),
+        ("way_piece_count", c_size_t),
+        ("focus_is", c_char_p),
+        ("other_is", c_char_p),
+    ]
+
+
+def _place(number: int) -> int | None:
+    return None if number == _NO_PLACE else number
+
+
+def _text(text: bytes | None) -> str:
+    return (text or b"").decode("utf-8")
+
+
+def picture_of(made: c_void_p, view: str) -> Picture:
+    """All of a picture that the library holds."""
+    arrays = _Arrays(struct_size=ctypes.sizeof(_Arrays))
+    status = _read(made, byref(arrays))
+    if status != Status.OK:
+        raise LayoutError(Status(status), f"the picture cannot be read: {Status(status).name}", "", [])
+    is_round = arrays.arc_count > 0
+    return Picture(
+        focus=arrays.focus,
+        boxes=tuple(_box(arrays.boxes[i], arrays.arcs[i] if is_round else None) for i in range(arrays.box_count)),
+        families=tuple(_family(arrays, arrays.families[i]) for i in range(arrays.family_count)),
+        marks=tuple(_mark(arrays.marks[i]) for i in range(arrays.mark_count)),
+        view=view,
+        other=_place(arrays.other),
+        focus_is=_text(arrays.focus_is),
+        other_is=_text(arrays.other_is),
+        ways=tuple(_way(arrays, arrays.ways[i]) for i in range(arrays.way_count)),
+        rings=tuple(arrays.ring_radii[i] for i in range(arrays.ring_radius_count)),
+        middle=(arrays.middle_x, arrays.middle_y) if is_round else None,
+    )
+
+
+def failure_of(made: c_void_p) -> str:
+    """What went wrong in making a picture; the empty text where nothing is stated."""
+    text = c_char_p()
+    return _text(text.value) if made and _failure(made, byref(text)) == Status.OK else ""
+
+
+def _box(box: Any, arc: Any) -> PictureBox:
+    return PictureBox(
+        id=None if box.kind == _UNKNOWN_PARENT else box.id,
+        x=box.x,
+        y=box.y,
+        width=box.width,
+        height=box.height,
+        sex=box.sex,
+        child_of=_place(box.child_of),
+        repeat=box.repeat,
+        flag=box.flag != 0,
+        hidden_parents=box.hidden_parents,
+        hidden_partners=box.hidden_partners,
+        hidden_children=box.hidden_children,
+        further_parents=box.further_parents,
+        living=box.living != 0,
+        arc=None if arc is None else PictureArc(arc.ring, arc.start, arc.end, _place(arc.line)),
+    )
+
+
+def _way(arrays: Any, way: Any) -> PictureWay:
+    first_ancestor = way.first_box + way.box_count
+    pieces = (arrays.way_pieces[i] for i in range(way.first_piece, way.first_piece + way.piece_count))
+    return PictureWay(
+        kind=WayKind(way.kind),
+        boxes=tuple(arrays.way_boxes[i] for i in range(way.first_box, first_ancestor)),
+        ancestors=tuple(arrays.way_boxes[i] for i in range(first_ancestor, first_ancestor + way.ancestor_count)),
+        words=_text(way.words),
+        lines=tuple((piece.x1, piece.y1, piece.x2, piece.y2) for piece in pieces),
+    )
+
+
+def _family(arrays: Any, family: Any) -> PictureFamily:
+    first_child = family.first_member + family.parent_count
+    children = range(first_child, first_child + family.child_count)
+    return PictureFamily(
+        parents=tuple(arrays.members[i] for i in range(family.first_member, first_child)),
+        children=tuple(arrays.members[i] for i in children),
+        child_kinds=tuple(ChildKind(arrays.child_kinds[i]) for i in children),
+        state=FamilyState(family.state),
+        number=family.number or None,
+        lines=tuple(
+            _line(arrays, arrays.lines[i]) for i in range(family.first_line, family.first_line + family.line_count)
+        ),
+    )
+
+
+def _line(arrays: Any, line: Any) -> PictureLine:
+    bridges = range(line.first_bridge, line.first_bridge + line.bridge_count)
+    return PictureLine(
+        line.x1,
+        line.y1,
+        line.x2,
+        line.y2,
+        LineRole(line.role),
+        _place(line.child),
+        tuple(arrays.bridges[i] for i in bridges),
+    )
+
+
+def _mark(mark: Any) -> PictureMark:
+    return PictureMark(MarkKind(mark.kind), mark.number, tuple(box for box in mark.boxes if box != _NO_PLACE))
+
+
+def _declared(name: str, result: Any, *arguments: Any) -> Any:
+    function = getattr(_native.library, name)
+    function.argtypes = arguments
+    function.restype = result
+    return function
+
+
+_CHOICES = POINTER(OptionsStruct)
+options_default = _declared("olvane_picture_options_default", c_int, c_int32, _CHOICES)
+of_family = _declared("olvane_picture_of_family", c_int, c_void_p, c_int64, _CHOICES, POINTER(c_void_p))
+of_file = _declared("olvane_picture_of_file", c_int, c_void_p, c_int64, _CHOICES, POINTER(c_void_p))
+of_host = _declared("olvane_picture_of_host", c_int, POINTER(_native.HostStruct), c_int64, _CHOICES, POINTER(c_void_p))
+free = _declared("olvane_picture_free", None, c_void_p)
+_read = _declared("olvane_picture_read", c_int, c_void_p, POINTER(_Arrays))
+_failure = _declared("olvane_picture_failure", c_int, c_void_p, POINTER(c_char_p))
