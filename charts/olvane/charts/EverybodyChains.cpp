@@ -12,13 +12,13 @@
 #include <array>
 #include <numeric>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 struct Couple {
     std::int32_t other;

@@ -6,13 +6,13 @@
 #include <algorithm>
 #include <numeric>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // Which person stands for the component of each: joined with path halving, the smaller place on top.
 class Joined {

@@ -14,16 +14,16 @@
 #include <queue>
 #include <utility>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
+using kin::at;
+
 using picture::Index;
 using picture::kNone;
-
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
 
 constexpr double kUnknown = std::numeric_limits<double>::quiet_NaN();
 // Boxes stay before lines do, and all that was there before what is new.

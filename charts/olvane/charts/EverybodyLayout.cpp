@@ -10,14 +10,13 @@
 #include <olvane/charts/EverybodyFoldInternal.h>
 #include <olvane/charts/EverybodyLevelsInternal.h>
 #include <olvane/charts/EverybodyMarksInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // What lies between a row and the first track under it, and between two tracks; and the steps in which gaps grow,
 // so that one more bar more seldom moves all that lies below. Units: points.

@@ -10,13 +10,13 @@
 #include <algorithm>
 #include <limits>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // head stands at least least rows below tail.
 struct Link {

@@ -11,13 +11,13 @@
 #include <array>
 #include <queue>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // Two uprights that would lie on one another cost more than any number of crossings.
 constexpr std::int32_t kCollision = 1 << 20;

@@ -6,14 +6,13 @@
 #include <algorithm>
 
 #include <olvane/charts/EverybodyReachInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // As many lines as fit below a box of the usual width, or above it.
 constexpr int kMostLinesAtBox = 12;

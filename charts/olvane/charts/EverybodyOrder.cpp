@@ -8,14 +8,13 @@
 #include <utility>
 
 #include <olvane/charts/EverybodyReachInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 std::int64_t crossingPairs(const std::vector<Reach>& reaches) {
     std::int64_t crossings = 0;

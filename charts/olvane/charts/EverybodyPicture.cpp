@@ -5,16 +5,16 @@
 
 #include <algorithm>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
+using kin::at;
+
 using picture::Index;
 using picture::LineRole;
-
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
 
 constexpr double kPartGap = 80;
 // Between the marriage lines of two unions of one couple.

@@ -9,8 +9,11 @@
 #include <vector>
 
 #include <olvane/charts/EverybodyOrderInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::charts {
+
+using kin::at;
 
 // The outermost ends of a strand, in places along the row above and along the row below. Where it has no end,
 // it is left and right of everything.
@@ -68,8 +71,6 @@ public:
     std::uint8_t& flipped(std::int32_t node) { return flipped_[at(node)]; }
 
 private:
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
-
     const Rows& rows_;
     std::vector<std::int32_t> first_;
     std::vector<std::uint8_t> flipped_;

@@ -5,13 +5,13 @@
 
 #include <algorithm>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::charts {
 
 namespace {
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // An end that a union has at a box, and the gap that it lies in.
 struct BoxEnd {

@@ -1,8 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Coordinates come from sines, which libraries compute differently in the last bit. So they are computed here, by
-// a series, and are the same on every machine.
+// Coordinates come from picture::onCircle, which gives the same bits on every machine.
 
 #include <olvane/charts/FanInternal.h>
 
@@ -11,41 +10,16 @@
 #include <utility>
 
 #include <olvane/charts/Charts.h>
+#include <olvane/picture/Circle.h>
 
 namespace olvane::charts {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
+using picture::onCircle;
+using Point = picture::CirclePoint;
+
 constexpr int kBroadRings = 3;  // wide cells, whose text follows the ring
-
-// The sine of an angle from -90 to 90 degrees, to 1e-15: Taylor's series.
-double sineOfQuarter(double degrees) {
-    const double x = degrees * (kPi / 180);
-    double term = x;
-    double sum = x;
-    for (int n = 1; n <= 12; ++n) {
-        term = -term * x * x / ((2.0 * n) * (2.0 * n + 1));
-        sum += term;
-    }
-    return sum;
-}
-
-double sine(double degrees) {
-    degrees -= std::floor((degrees + 180) / 360) * 360;  // -180 to 180
-    if (degrees > 90) degrees = 180 - degrees;
-    if (degrees < -90) degrees = -180 - degrees;
-    return sineOfQuarter(degrees);
-}
-
-struct Point {
-    double x;
-    double y;
-};
-
-Point onCircle(double degrees, double radius) {
-    return {radius * sine(degrees), -radius * sine(degrees + 90)};
-}
 
 class FanPicture {
 public:

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include <olvane/charts/ViewRequest.h>
+#include <olvane/kin/Index.h>
 #include <olvane/kin/KinGraph.h>
 
 namespace olvane::charts {
@@ -19,9 +20,7 @@ constexpr Index kNone = -1;
 // In Plan::boxOf: shown, but without a box so far.
 constexpr Index kAwaitsBox = -2;
 
-inline std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // How far apart lines of different families run, in points: parallel pieces, and ends of lines on one box.
 constexpr double kTrackStep = 5;

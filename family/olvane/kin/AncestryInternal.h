@@ -8,6 +8,7 @@
 #include <span>
 #include <vector>
 
+#include <olvane/kin/Index.h>
 #include <olvane/kin/KinLinksInternal.h>
 
 namespace olvane::kin {
@@ -60,14 +61,6 @@ public:
 
 private:
     static constexpr std::uint8_t kBothSides = 3;
-
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
-
-    template <class Value>
-    static std::span<const Value> slice(const std::vector<Value>& values,
-                                        const std::vector<std::uint32_t>& start, std::int32_t place) {
-        return {values.data() + start[at(place)], start[at(place) + 1] - start[at(place)]};
-    }
 
     std::span<const UpLink> linksUp(Node node) const {
         return which_ == Links::blood ? links_.upByBlood(node) : links_.up(node);

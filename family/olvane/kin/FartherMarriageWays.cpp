@@ -8,6 +8,7 @@
 #include <limits>
 #include <unordered_map>
 
+#include <olvane/kin/Index.h>
 #include <olvane/kin/KinSumsInternal.h>
 #include <olvane/kin/MarriageWaysInternal.h>
 
@@ -56,8 +57,6 @@ public:
     }
 
 private:
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
-
     void goOn(std::int32_t index) {
         const Step here = steps_[at(index)];
         if (here.to == b_) return;

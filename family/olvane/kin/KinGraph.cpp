@@ -11,13 +11,11 @@
 #include <string>
 #include <utility>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::kin {
 
 namespace {
-
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
 
 // Lists by place, from (place, value) pairs in the order in which each list shall have them.
 template <class Pairs>

@@ -8,6 +8,7 @@
 #include <span>
 #include <vector>
 
+#include <olvane/kin/Index.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Kinship.h>
 
@@ -68,14 +69,6 @@ public:
     const KinGraph& graph() const { return graph_; }
 
 private:
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
-
-    template <class Value>
-    static std::span<const Value> slice(const std::vector<Value>& values,
-                                        const std::vector<std::uint32_t>& start, std::int32_t place) {
-        return {values.data() + start[at(place)], start[at(place) + 1] - start[at(place)]};
-    }
-
     void addUpLinks();
     void addNeighbors();
 

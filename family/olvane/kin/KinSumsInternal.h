@@ -8,6 +8,7 @@
 #include <vector>
 
 #include <olvane/kin/AncestryInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::kin {
 
@@ -64,8 +65,6 @@ private:
         std::vector<double> gene;
         std::vector<std::uint64_t> chains;
     };
-
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
 
     void findShares();
     void setPersonShare(Spot person);

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include <olvane/kin/AncestryInternal.h>
+#include <olvane/kin/Index.h>
 
 namespace olvane::kin {
 
@@ -52,8 +53,6 @@ private:
         std::int32_t climbed;
         Bond bond;
     };
-
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
 
     Advance advance(Spot spot) const;
     bool isOnlyLink(Spot spot, SpotLink& link) const;

@@ -8,6 +8,7 @@
 #include <optional>
 #include <vector>
 
+#include <olvane/kin/Index.h>
 #include <olvane/kin/KinLinksInternal.h>
 
 namespace olvane::kin {
@@ -62,8 +63,6 @@ private:
         std::int32_t radius() const { return static_cast<std::int32_t>(rings.size()) - 1; }
     };
     using CountsByReadings = std::array<std::uint64_t, kReadingSets>;
-
-    static std::size_t at(std::int32_t place) { return static_cast<std::size_t>(place); }
 
     // -1 where the side has not reached the person.
     std::int32_t distance(const Side& side, Place person) const;

@@ -11,6 +11,8 @@
 #include <array>
 #include <utility>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::kin {
 
 namespace {
@@ -33,8 +35,6 @@ private:
         Place person;
         std::size_t nextParent;
     };
-
-    static std::size_t at(Place place) { return static_cast<std::size_t>(place); }
 
     std::array<Place, 2> parentsOf(Place person) const {
         const auto unions = graph_.unionsAsChild(person);

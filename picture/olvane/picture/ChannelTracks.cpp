@@ -15,6 +15,8 @@
 #include <tuple>
 #include <utility>
 
+#include <olvane/kin/Index.h>
+
 namespace olvane::picture {
 
 namespace {
@@ -23,9 +25,7 @@ constexpr double kBarRoom = 3;           // points; bars nearer than this do not
 constexpr std::size_t kMostActive = 64;  // overlapping bars that are compared with a new one
 constexpr int kRounds = 4;
 
-std::size_t at(Index i) {
-    return static_cast<std::size_t>(i);
-}
+using kin::at;
 
 // Sorted places of verticals, by bar.
 class BarEnds {

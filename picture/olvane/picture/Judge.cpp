@@ -16,6 +16,7 @@
 #include <unordered_map>
 #include <utility>
 
+#include <olvane/kin/Index.h>
 #include <olvane/picture/PieceGeometryInternal.h>
 #include <olvane/picture/RectSweepInternal.h>
 
@@ -39,9 +40,7 @@ Pair ordered(Index a, Index b) {
     return {std::min(a, b), std::max(a, b)};
 }
 
-std::size_t at(Index i) {
-    return static_cast<std::size_t>(i);
-}
+using kin::at;
 
 Rect rectOf(const Box& box, double margin = 0) {
     return {box.x - margin, box.y - margin, box.x + static_cast<double>(box.width) + margin,

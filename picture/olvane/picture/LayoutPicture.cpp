@@ -13,6 +13,7 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/kin/Index.h>
 #include <olvane/picture/FurtherParents.h>
 
 namespace olvane::picture {
@@ -21,9 +22,7 @@ namespace {
 
 constexpr kin::UnionPlace kNoUnion = -1;
 
-std::size_t at(std::int32_t place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 struct FamilyChild {
     Index box = kNone;

@@ -13,6 +13,7 @@
 #include <tuple>
 #include <utility>
 
+#include <olvane/kin/Index.h>
 #include <olvane/picture/ChannelTracksInternal.h>
 #include <olvane/picture/RoutePlanInternal.h>
 #include <olvane/picture/RowsInternal.h>
@@ -23,9 +24,7 @@ namespace {
 
 constexpr double kLeastTrack = 2.125;  // points between tracks where rows are not moved
 
-std::size_t at(Index i) {
-    return static_cast<std::size_t>(i);
-}
+using kin::at;
 
 // To an eighth of a point, so that places are short in every notation and exact in binary.
 double snapped(double place) {

@@ -13,6 +13,7 @@
 #include <tuple>
 #include <utility>
 
+#include <olvane/kin/Index.h>
 #include <olvane/picture/LaneOccupancyInternal.h>
 
 namespace olvane::picture {
@@ -26,9 +27,7 @@ constexpr double kLegPitch = 6;        // between the heights of lines that leav
 constexpr double kLegReach = 25;       // from a box to the farthest of those
 constexpr std::size_t kMostGaps = 64;  // looked at when something has to pass through a row
 
-std::size_t at(Index i) {
-    return static_cast<std::size_t>(i);
-}
+using kin::at;
 
 VerticalEnd onBar(Index bar) {
     return {bar, kNone, 0};

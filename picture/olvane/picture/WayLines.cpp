@@ -12,6 +12,7 @@
 #include <cstdlib>
 #include <tuple>
 
+#include <olvane/kin/Index.h>
 #include <olvane/picture/PieceGeometryInternal.h>
 
 namespace olvane::picture {
@@ -22,9 +23,7 @@ constexpr double kNear = 0.01;       // points
 constexpr double kSideBySide = 2.5;  // points between ways that share a line
 constexpr double kIntoBox = 6;       // points that a way reaches into a box
 
-std::size_t at(Index place) {
-    return static_cast<std::size_t>(place);
-}
+using kin::at;
 
 // A part of a horizontal or vertical line.
 struct Part {
