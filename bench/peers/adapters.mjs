@@ -19,9 +19,8 @@ import { join } from 'node:path';
 import { pathToFileURL } from 'node:url';
 
 import { unionsOf } from './families.mjs';
+import { HEIGHT, topolaOptions, WIDTH } from './topolaBoxes.mjs';
 
-const WIDTH = 55;
-const HEIGHT = 80;
 const GAP_X = 25;
 const GAP_Y = 30;
 const FOCUS = 1;
@@ -74,24 +73,12 @@ async function relativesTree() {
 // The chart of all relatives; for a pedigree the chart of ancestors, which is quicker there. Both up to where they
 // begin to write into a page.
 async function topola(shape) {
-  const { CompositeRenderer, JsonDataProvider, AncestorChart, RelativesChart } = require('topola');
+  const library = require('topola');
+  const { JsonDataProvider, AncestorChart, RelativesChart } = library;
   const { layOutDescendants } = require('topola/dist/descendant-chart.js');
   const { getAncestorsTree } = require('topola/dist/ancestor-chart.js');
   const { ChartUtil, getChartInfo } = require('topola/dist/chart-util.js');
-  class FixedBoxes extends CompositeRenderer {
-    getPreferredIndiSize() {
-      return [WIDTH, HEIGHT];
-    }
-    getCss() {
-      return '';
-    }
-    render() {}
-  }
-  const page = { querySelector: () => ({ __data__: 0 }) }; // asked for its style element alone
-  const optionsFor = (data) => {
-    const options = { data, startIndi: `I${FOCUS}`, svgSelector: page };
-    return Object.assign(options, { renderer: new FixedBoxes(options) });
-  };
+  const optionsFor = (data) => topolaOptions(library, data, `I${FOCUS}`);
   const layOutAncestors = (options) => {
     const ancestors = new AncestorChart(options).createHierarchy();
     return new ChartUtil(options).layOutChart(ancestors, { flipVertically: true });

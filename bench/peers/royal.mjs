@@ -9,18 +9,17 @@ import { readFileSync } from 'node:fs';
 import { createRequire } from 'node:module';
 import { join } from 'node:path';
 import { pathToFileURL } from 'node:url';
+import { HEIGHT, topolaOptions, WIDTH } from './topolaBoxes.mjs';
 
 const folder = process.env.OLVANE_PEERS;
 const require = createRequire(join(folder, 'package.json'));
-const { CompositeRenderer, JsonDataProvider, AncestorChart, DescendantChart } = require('topola');
+const topola = require('topola');
+const { JsonDataProvider, AncestorChart, DescendantChart } = topola;
 const { layOutDescendants } = require('topola/dist/descendant-chart.js');
 const { ChartUtil } = require('topola/dist/chart-util.js');
 const { calculateTree } = await import(
   pathToFileURL(join(folder, 'node_modules/family-chart/dist/family-chart.esm.js'))
 );
-
-const WIDTH = 55;
-const HEIGHT = 80;
 
 function readGedcom(text) {
   const indis = [];
@@ -44,31 +43,16 @@ function readGedcom(text) {
   return { indis, fams };
 }
 
-class FixedBoxes extends CompositeRenderer {
-  getPreferredIndiSize() {
-    return [WIDTH, HEIGHT];
-  }
-  getCss() {
-    return '';
-  }
-  render() {}
-}
-
 const { indis, fams } = readGedcom(readFileSync(process.argv[2], 'latin1'));
 const data = new JsonDataProvider({ indis, fams });
-const page = { querySelector: () => ({ __data__: 0 }) };
-
-function topolaOptions(person) {
-  const options = { data, startIndi: person, svgSelector: page };
-  return Object.assign(options, { renderer: new FixedBoxes(options) });
-}
+const optionsFor = (person) => topolaOptions(topola, data, person);
 
 function topolaAncestors(person) {
-  const options = topolaOptions(person);
+  const options = optionsFor(person);
   return new ChartUtil(options).layOutChart(new AncestorChart(options).createHierarchy(), { flipVertically: true });
 }
 
-const topolaDescendants = (person) => layOutDescendants(new DescendantChart(topolaOptions(person)).options);
+const topolaDescendants = (person) => layOutDescendants(new DescendantChart(optionsFor(person)).options);
 
 const famOf = new Map(fams.map((fam) => [fam.id, fam]));
 const entries = indis.map(({ id, sex, famc, fams: own }) => {
