@@ -390,10 +390,8 @@ private:
     DrawOptions completedDrawOptions() const {
         DrawOptions options = drawOptions_;
         completeViewOptions(*draw_, options.request);
-        widenSideways(*draw_, options.request);
+        widenSideways(*draw_, options.request, options.paper.onPaper());
         checkPaperOptions(options.paper, options.output);
-        const bool foldedForPaper = options.paper.onPaper() && options.request.view() == View::everybody;
-        if (foldedForPaper && !isGiven(*draw_, "--boxes")) options.request.boxes = BoxForm::wide;
         for (const std::string& what : drawShown_) {
             options.shown.dates = options.shown.dates || what == "dates";
             options.shown.places = options.shown.places || what == "places";
@@ -428,9 +426,11 @@ private:
     }
 
     // Pictures that lie sideways have wide boxes, and what is checked is the picture.
-    static void widenSideways(const CLI::App& command, LayoutRequest& request) {
-        if (command.count("--boxes") > 0) return;
-        request.boxes = charts::usualBoxForm(request.view(), request.chart.direction);
+    static void widenSideways(const CLI::App& command, LayoutRequest& request, bool onPaper = false) {
+        if (isGiven(command, "--boxes")) return;
+        const charts::Direction direction = request.chart.direction;
+        request.boxes = onPaper ? charts::usualBoxFormOnPaper(request.view(), direction)
+                                : charts::usualBoxForm(request.view(), direction);
     }
 
     CLI::App app_{"Family trees from GEDCOM files: lists persons, lays out families and draws them.",

@@ -22,10 +22,7 @@ void appendFacts(JsonText& json, const gedcom::GedcomData& data, std::span<const
     json.begin();
     for (const gedcom::Fact& fact : facts) {
         json.begin();
-        json.string(fact.tag);
-        json.string(fact.value);
-        appendDate(json, fact.date);
-        json.string(fact.place);
+        appendFact(json, fact);
         appendDetails(json, gedcom::factDetails(data, fact));
         json.end();
     }

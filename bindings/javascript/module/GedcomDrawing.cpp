@@ -65,19 +65,29 @@ std::string labelText(const kin::PersonLabel& label) {
     return std::move(json).take();
 }
 
-// boxes: 0 for what suits the view, 1 for tall ones, 2 for wide ones. Folded for an aspect other than 0, on which the
-// sizes depend.
-PictureRequest requestOnPaper(kin::Place focus, int boxes, double aspect = 0) {
+enum class Boxes : int { usual, tall, wide };
+
+charts::BoxForm formOf(Boxes boxes, charts::BoxForm usual) {
+    if (boxes == Boxes::usual) return usual;
+    return boxes == Boxes::tall ? charts::BoxForm::tall : charts::BoxForm::wide;
+}
+
+PictureRequest requestInOnePiece(kin::Place focus, Boxes boxes) {
+    PictureRequest request = requestOf(focus);
+    charts::ChartRequest& chart = request.view.chart;
+    charts::setBoxForm(chart, formOf(boxes, charts::usualBoxForm(chart.view, chart.direction)));
+    return request;
+}
+
+// Folded for an aspect other than 0, on which the sizes depend.
+PictureRequest requestOnPaper(kin::Place focus, Boxes boxes, double aspect = 0) {
     PictureRequest request = requestOf(focus);
     charts::ChartRequest& chart = request.view.chart;
     if (aspect > 0) {
         chart.aspect = aspect;
         chart.compact = true;
     }
-    const charts::BoxForm usual = charts::usualBoxForm(chart.view, chart.direction);
-    charts::setBoxForm(chart, boxes == 0   ? usual
-                              : boxes == 1 ? charts::BoxForm::tall
-                                           : charts::BoxForm::wide);
+    charts::setBoxForm(chart, formOf(boxes, charts::usualBoxFormOnPaper(chart.view, chart.direction)));
     return request;
 }
 
@@ -133,12 +143,12 @@ const char* refusal() {
 
 using namespace olvane;
 
-// With the picture's options, sizes apart. Null for a picture that is refused; last_text then says why.
+// With the picture's options, sizes apart; boxes is one of Boxes. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_svg")
 const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
                       const char* title) {
     try {
-        const js::PictureRequest request = js::requestOnPaper(focus - 1, boxes);
+        const js::PictureRequest request = js::requestInOnePiece(focus - 1, static_cast<js::Boxes>(boxes));
         const draw::DrawingContent content = js::contentOf(*file, request, facts);
         js::lastText = draw::drawSvg(content, js::drawingOf(request, content, theme, title)).svg;
         return js::lastText.c_str();
@@ -162,10 +172,9 @@ const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int 
         sheets.columns = columns;
         sheets.scale = scale * draw::kMillimetresOfPx;
         draw::PaperSubject subject;
-        subject.folded = js::requestOf(focus - 1).view.chart.view == charts::View::everybody;
-        // Everybody takes less of the paper in wide boxes.
-        const int form = subject.folded && boxes == 0 ? 2 : boxes;
+        const auto form = static_cast<js::Boxes>(boxes);
         const js::PictureRequest request = js::requestOnPaper(focus - 1, form);
+        subject.folded = request.view.chart.view == charts::View::everybody;
         subject.contentOf = [&](double aspect) {
             return js::contentOf(*file, js::requestOnPaper(focus - 1, form, aspect), facts);
         };

@@ -144,10 +144,7 @@ std::string factsText(std::span<const gedcom::Fact> facts) {
     json.begin();
     for (const gedcom::Fact& fact : facts) {
         json.begin();
-        json.string(fact.tag);
-        json.string(fact.value);
-        appendDate(json, fact.date);
-        json.string(fact.place);
+        appendFact(json, fact);
         json.end();
     }
     json.end();

@@ -59,6 +59,13 @@ void appendDate(JsonText& json, const gedcom::GedcomDate& date) {
     json.end();
 }
 
+void appendFact(JsonText& json, const gedcom::Fact& fact) {
+    json.string(fact.tag);
+    json.string(fact.value);
+    appendDate(json, fact.date);
+    json.string(fact.place);
+}
+
 void appendDetails(JsonText& json, const gedcom::Details& details) {
     if (details.isEmpty()) return json.number(0);
     json.begin();

@@ -19,4 +19,7 @@ void appendDate(JsonText& json, const gedcom::GedcomDate& date);
 // 0 where there are none; else in the order of the fields of Details. A quality that is not given is -1.
 void appendDetails(JsonText& json, const gedcom::Details& details);
 
+// Tag, value, date and place, as entries of a list that is begun.
+void appendFact(JsonText& json, const gedcom::Fact& fact);
+
 }  // namespace olvane::js

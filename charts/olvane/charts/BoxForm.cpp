@@ -22,6 +22,10 @@ BoxForm usualBoxForm(View view, Direction direction) {
     return direction == Direction::left || direction == Direction::right ? BoxForm::wide : BoxForm::tall;
 }
 
+BoxForm usualBoxFormOnPaper(View view, Direction direction) {
+    return view == View::everybody ? BoxForm::wide : usualBoxForm(view, direction);
+}
+
 TreeSize treeSizeOf(BoxForm form) {
     TreeSize size = familyTreeSize();
     if (form == BoxForm::wide) {

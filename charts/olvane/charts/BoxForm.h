@@ -17,6 +17,9 @@ enum class BoxForm : std::uint8_t { tall, wide };
 // What suits a view: wide boxes where generations stand side by side.
 OLVANE_API BoxForm usualBoxForm(View view, Direction direction);
 
+// The same for sheets of paper, of which everybody takes less in wide boxes.
+OLVANE_API BoxForm usualBoxFormOnPaper(View view, Direction direction);
+
 // The sizes of the engine's views, in points.
 OLVANE_API TreeSize treeSizeOf(BoxForm form);
 
