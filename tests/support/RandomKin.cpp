@@ -3,6 +3,7 @@
 
 #include <RandomKin.h>
 
+#include <algorithm>
 #include <random>
 #include <vector>
 
@@ -88,6 +89,27 @@ kin::KinGraph hostileKin(std::uint64_t seed, int persons, int unions) {
         const kin::UnionPlace u = builder.addUnion(one, other, static_cast<kin::UnionState>(dice.below(4)));
         for (int children = dice.below(4); children > 0; --children) {
             builder.addChild(u, dice.below(persons), static_cast<kin::ChildKind>(dice.below(6)));
+        }
+    }
+    return builder.build();
+}
+
+kin::KinGraph denseKin(std::uint64_t seed) {
+    Dice dice(seed);
+    kin::KinGraphBuilder builder;
+    const int persons = 2 + dice.below(24);
+    for (int i = 0; i < persons; ++i) builder.addPerson(i + 1, dice.sex());
+    const int unions = 1 + dice.below(40);
+    const int few = std::min(persons, 1 + dice.below(4));
+    for (int i = 0; i < unions; ++i) {
+        const kin::Place one = dice.oneIn(3) ? dice.below(persons) : dice.below(few);
+        const kin::Place other = dice.oneIn(4)   ? kin::kNobody
+                                 : dice.oneIn(2) ? dice.below(few)
+                                                 : dice.below(persons);
+        const kin::UnionPlace u = builder.addUnion(one, other, kin::UnionState::married);
+        for (int children = dice.below(4); children > 0; --children) {
+            const kin::Place child = dice.oneIn(3) ? dice.below(persons) : persons - 1 - dice.below(few);
+            builder.addChild(u, child, kin::ChildKind::birth);
         }
     }
     return builder.build();

@@ -16,4 +16,7 @@ namespace olvane::test {
 kin::KinGraph soundKin(std::uint64_t seed, int persons);
 kin::KinGraph hostileKin(std::uint64_t seed, int persons, int unions);
 
+// Most unions of a few persons, and most children a few others: more lines at their boxes than any family has.
+kin::KinGraph denseKin(std::uint64_t seed);
+
 }  // namespace olvane::test

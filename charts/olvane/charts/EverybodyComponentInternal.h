@@ -39,6 +39,8 @@ public:
         return {values_.data() + first, start_[static_cast<std::size_t>(list) + 1] - first};
     }
     std::int32_t count() const { return static_cast<std::int32_t>(start_.size()) - 1; }
+    // How many values all lists before this one have.
+    std::size_t countBefore(std::int32_t list) const { return start_[static_cast<std::size_t>(list)]; }
 
 private:
     std::vector<std::uint32_t> start_ = {0};

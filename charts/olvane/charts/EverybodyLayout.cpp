@@ -7,6 +7,7 @@
 #include <cmath>
 #include <utility>
 
+#include <olvane/charts/EverybodyCollisionsInternal.h>
 #include <olvane/charts/EverybodyFoldInternal.h>
 #include <olvane/charts/EverybodyLevelsInternal.h>
 #include <olvane/charts/EverybodyMarksInternal.h>
@@ -46,13 +47,21 @@ public:
     }
 
     // Couples first, since who stands side by side is in one row. Then rows, which need the couples; then the order
-    // in the rows, which decides over crossings; then places, which keep the order; lines last.
+    // in the rows, which decides over crossings; then places, which keep the order; lines last. Where lines of two
+    // families have no room beside one another after all, one becomes a mark: so this ends.
     void layOut() {
         l_.chains = weldCouples(l_.part);
         measureChains();
         if (earlier_ == nullptr || !placeAsBefore()) place();
         report(ChartStep::lines);
         l_.lines = routeGaps(l_.rows, endRanges());
+        for (auto ends = endsInTheWay(l_.rows, l_.lines); !ends.empty();
+             ends = endsInTheWay(l_.rows, l_.lines)) {
+            for (const std::int32_t end : ends) markLinkOfEnd(l_.part, l_.chains, l_.rows, end, l_.marked);
+            rebuildRows();
+            measureEnds();
+            l_.lines = routeGaps(l_.rows, endRanges());
+        }
         stackRows();
     }
 
@@ -67,7 +76,7 @@ private:
     void place() {
         report(ChartStep::rows);
         const std::vector<std::int32_t> rows = chooseRows(l_.part, l_.chains, levelEffort());
-        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
+        l_.marked = marksForWantOfRoom(l_.part, l_.chains, roomForLines());
         if (options_.marks < 0) markAllSecondLinks(l_.part, l_.chains, rows, l_.marked);
         orderRows(rows);
         measureEnds();
@@ -84,7 +93,7 @@ private:
         }
         const KeptRows kept = rowsAsBefore(l_.part, l_.chains, *earlier_, widths);
         if (kept.rowOfChain.empty()) return false;
-        l_.marked = marksForWantOfRoom(l_.part, l_.chains);
+        l_.marked = marksForWantOfRoom(l_.part, l_.chains, roomForLines());
         if (options_.marks < 0) {
             markAllSecondLinks(l_.part, l_.chains, kept.rowOfChain, l_.marked);
         } else if (options_.marks > 0) {
@@ -128,6 +137,30 @@ private:
                 width += boxes_.width(l_.part, person) + l_.sizes.gap;
             l_.sizes.width.push_back(width);
         }
+    }
+
+    // So many that ends stand kLeastStep apart.
+    LineRoom roomForLines() const {
+        constexpr double kLeastStep = 4;
+        const auto linesIn = [](double points, double step, std::int32_t most) {
+            return static_cast<std::int32_t>(std::clamp(points / step + 1, 1.0, static_cast<double>(most)));
+        };
+        LineRoom room(l_.part.persons.size());
+        room.ofCouple = linesIn(2 * coupleEndRoom(), kLeastStep, LineRoom::kMostOfCouple);
+        for (std::int32_t person = 0; person < l_.part.personCount(); ++person) {
+            room.atBox[at(person)] = linesIn(2 * boxEndRoom(person), kLeastStep, LineRoom::kMostAtBox);
+            const double up = boxes_.height(l_.part, person) / 2 - kMarriageMargin;
+            room.marriages[at(person)] = linesIn(up, kMarriageGap, LineRoom::kMostOfCouple);
+        }
+        return room;
+    }
+    // How far from the middle a line may end at a box, and between two partners.
+    double boxEndRoom(std::int32_t person) const {
+        return std::max(0.0, boxes_.width(l_.part, person) / 2 - kBoxMargin);
+    }
+    double coupleEndRoom() const {
+        constexpr double kCoupleMargin = 4;
+        return std::max(0.0, l_.sizes.gap / 2 - kCoupleMargin);
     }
 
     void orderRows(const std::vector<std::int32_t>& unfolded) {
@@ -177,7 +210,19 @@ private:
             }
             nodes.resize(kept);
         }
+        if (!l_.left.empty()) l_.left = placesIn(rows);
         l_.rows = std::move(rows);
+    }
+
+    // Of the nodes that are left in rows with fewer passes.
+    std::vector<double> placesIn(const Rows& rows) const {
+        std::vector<double> left(at(rows.nodeCount()), 0);
+        std::copy_n(l_.left.begin(), rows.chainCount, left.begin());
+        for (std::int32_t node = rows.chainCount; node < rows.nodeCount(); ++node) {
+            const std::int32_t u = rows.passUnion[at(node - rows.chainCount)];
+            left[at(node)] = l_.left[at(passAt(l_.rows, u, rows.row[at(node)]))];
+        }
+        return left;
     }
 
     static std::int32_t passAt(const Rows& rows, std::int32_t u, std::int32_t row) {
@@ -231,10 +276,8 @@ private:
             double room = 0;
             if (!l_.rows.isPass(end.node)) {
                 const std::int32_t person = l_.chains.persons[end.node][at(end.sub / 2)];
-                room =
-                    end.sub % 2 == 1 ? l_.sizes.gap / 2 - 4 : boxes_.width(l_.part, person) / 2 - kBoxMargin;
+                room = end.sub % 2 == 1 ? coupleEndRoom() : boxEndRoom(person);
             }
-            room = std::max(0.0, room);
             ranges.push_back({wanted, wanted - room, wanted + room});
         }
         for (std::int32_t chain = 0; chain < l_.rows.chainCount; ++chain) spreadEnds(chain, ranges);

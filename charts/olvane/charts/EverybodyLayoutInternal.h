@@ -13,6 +13,11 @@
 
 namespace olvane::charts {
 
+// Between the marriage lines of two unions of one couple, and the least between them and the edges of the boxes.
+// Units: points.
+constexpr double kMarriageGap = 6;
+constexpr double kMarriageMargin = 2;
+
 // One part of the family, placed and routed, before it is a picture.
 struct PartLayout {
     Component part;

@@ -14,10 +14,6 @@ namespace {
 
 using kin::at;
 
-// As many lines as fit below a box of the usual width, or above it.
-constexpr int kMostLinesAtBox = 12;
-constexpr int kMostLinesOfCouple = 4;
-
 bool standApart(const Component& part, const Chains& chains, std::int32_t u) {
     const auto& two = part.partners[at(u)];
     return two[0] >= 0 && two[1] >= 0 && !chains.areNeighbours(two[0], two[1]);
@@ -48,35 +44,61 @@ void forEachChildLink(const Component& part, const Visit& visit) {
 
 }  // namespace
 
-MarkedLinks marksForWantOfRoom(const Component& part, const Chains& chains) {
+MarkedLinks marksForWantOfRoom(const Component& part, const Chains& chains, const LineRoom& room) {
     MarkedLinks marked;
-    std::vector<int> above(part.persons.size(), 0);
-    std::vector<int> below(part.persons.size(), 0);
-    std::vector<int> between(part.persons.size(), 0);  // by the left one of a couple side by side
+    std::vector<std::int32_t> above(part.persons.size(), 0);
+    std::vector<std::int32_t> below(part.persons.size(), 0);
+    std::vector<std::int32_t> between(part.persons.size(), 0);  // by the left one of a couple side by side
     std::vector<std::uint8_t> full(part.unions.size(), 0);
     marked.partner.assign(part.unions.size(), 0);
     for (std::int32_t u = 0; u < part.unionCount(); ++u) {
         const auto& two = part.partners[at(u)];
         if (two[0] >= 0 && two[1] >= 0 && !standApart(part, chains, u)) {
             const bool zeroFirst = chains.slot[at(two[0])] < chains.slot[at(two[1])];
-            if (between[at(two[zeroFirst ? 0 : 1])]++ < kMostLinesOfCouple) continue;
+            const std::int32_t most =
+                std::min({room.ofCouple, room.marriages[at(two[0])], room.marriages[at(two[1])]});
+            if (between[at(two[zeroFirst ? 0 : 1])]++ < most) continue;
             full[at(u)] = 1;
             marked.partner[at(u)] = 2;
             continue;
         }
         std::uint8_t fullSides = 0;
         for (std::uint8_t side = 0; side < 2; ++side) {
-            if (two[side] < 0 || below[at(two[side])]++ < kMostLinesAtBox) continue;
+            if (two[side] < 0 || below[at(two[side])]++ < room.atBox[at(two[side])]) continue;
             marked.partner[at(u)] = static_cast<std::uint8_t>(side + 1);
             ++fullSides;
         }
         if (fullSides == (two[0] >= 0 ? 1 : 0) + (two[1] >= 0 ? 1 : 0)) full[at(u)] = 1;
     }
     forEachChildLink(part, [&](std::int32_t u, std::int32_t child, std::size_t) {
-        const bool noRoom = full[at(u)] != 0 || above[at(child)]++ >= kMostLinesAtBox;
+        const bool noRoom = full[at(u)] != 0 || above[at(child)]++ >= room.atBox[at(child)];
         marked.child.push_back(noRoom ? 1 : 0);
     });
     return marked;
+}
+
+void markLinkOfEnd(const Component& part, const Chains& chains, const Rows& rows, std::int32_t end,
+                   MarkedLinks& marked) {
+    const Rows::End& where = rows.ends[at(end)];
+    const std::int32_t u = rows.strands[at(rows.strandOfEnd[at(end)])].unionPlace;
+    const bool oneBox = !rows.isPass(where.node) && where.sub % 2 == 0;
+    const std::int32_t person = oneBox ? chains.persons[where.node][at(where.sub / 2)] : -1;
+    const auto& two = part.partners[at(u)];
+    const std::size_t link = part.children.countBefore(u);
+    bool found = false;
+    if (oneBox && rows.isBelow(end)) {
+        for (std::size_t i = 0; i < part.children[u].size(); ++i) {
+            if (part.children[u][i] != person) continue;
+            marked.child[link + i] = 1;
+            found = true;
+        }
+    } else if (oneBox && two[0] >= 0 && two[1] >= 0 && marked.partner[at(u)] == 0) {
+        marked.partner[at(u)] = two[0] == person ? 1 : 2;
+        found = true;
+    }
+    if (found) return;
+    if (two[0] >= 0 && two[1] >= 0 && marked.partner[at(u)] == 0) marked.partner[at(u)] = 2;
+    for (std::size_t i = 0; i < part.children[u].size(); ++i) marked.child[link + i] = 1;
 }
 
 void markAllSecondLinks(const Component& part, const Chains& chains,
@@ -84,7 +106,8 @@ void markAllSecondLinks(const Component& part, const Chains& chains,
     std::vector<std::int32_t> kept(at(chains.count()), -1);
     const auto rowAbove = [&](std::int32_t u) {
         const auto& two = part.partners[at(u)];
-        return rowOfChain[at(chains.chain[at(two[0] >= 0 ? two[0] : two[1])])];
+        const bool zeroHasLine = two[1] < 0 || (two[0] >= 0 && marked.partner[at(u)] != 1);
+        return rowOfChain[at(chains.chain[at(zeroHasLine ? two[0] : two[1])])];
     };
     for (std::int32_t u = 0; u < part.unionCount(); ++u) {
         if (marked.partner[at(u)] != 0) continue;

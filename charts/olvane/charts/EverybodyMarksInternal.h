@@ -10,8 +10,25 @@
 
 namespace olvane::charts {
 
+// How many lines there is room for: for boxes of the usual size, as many as there may be at most.
+struct LineRoom {
+    static constexpr std::int32_t kMostAtBox = 12;
+    static constexpr std::int32_t kMostOfCouple = 4;
+
+    explicit LineRoom(std::size_t persons) : atBox(persons, kMostAtBox), marriages(persons, kMostOfCouple) {}
+
+    std::vector<std::int32_t> atBox;        // by person: below the box, and above it
+    std::vector<std::int32_t> marriages;    // by person: beside one another, to a partner next to the box
+    std::int32_t ofCouple = kMostOfCouple;  // down from between two partners
+};
+
 // No link as a mark, but those for which a box has no room: beyond so many lines below a box, or above it.
-MarkedLinks marksForWantOfRoom(const Component& part, const Chains& chains);
+MarkedLinks marksForWantOfRoom(const Component& part, const Chains& chains, const LineRoom& room);
+
+// The link of an end becomes a mark. Where several links share the end, between partners or on the way past a row, all
+// links of the union do, so that nothing of it is left to draw there.
+void markLinkOfEnd(const Component& part, const Chains& chains, const Rows& rows, std::int32_t end,
+                   MarkedLinks& marked);
 
 // Every second link a mark: each chain keeps the links to the first parents above it, and no line joins partners
 // who stand apart. Marks that are there stay.

@@ -17,8 +17,6 @@ using picture::Index;
 using picture::LineRole;
 
 constexpr double kPartGap = 80;
-// Between the marriage lines of two unions of one couple.
-constexpr double kMarriageGap = 6;
 
 class PictureBuilder {
 public:
@@ -128,7 +126,8 @@ private:
             const auto& two = l_->part.partners[at(other)];
             if ((two[0] == a && two[1] == b) || (two[0] == b && two[1] == a)) ++before;
         }
-        const double room = std::max(0.0, std::min(double{left.height}, double{right.height}) / 2 - 2);
+        const double room =
+            std::max(0.0, std::min(double{left.height}, double{right.height}) / 2 - kMarriageMargin);
         const double away = std::min(before * kMarriageGap, room);
         const double y = left.y + double{left.height} / 2 + (hasDrop ? away : -away);
         addLine(left.x + double{left.width}, y, right.x, y, LineRole::marriage);
@@ -136,7 +135,7 @@ private:
     }
 
     void addLine(double x1, double y1, double x2, double y2, LineRole role, Index child = picture::kNone) {
-        if (x1 == x2 && y1 == y2) return;
+        if (x1 == x2 && y1 == y2 && role != LineRole::marriage) return;  // boxes without a gap are joined
         picture::Line line;
         line.x1 = x1;
         line.y1 = y1;

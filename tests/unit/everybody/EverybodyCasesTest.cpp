@@ -129,6 +129,28 @@ TEST_F(EverybodyCases, oneHundredUnionsOfOneCouple) {
     expectReadable();
 }
 
+// Above each child stands a parent of all others, too: what hangs from the one must be drawn above the other's lines,
+// and the other way round, and there are as many of both as there is room for.
+TEST_F(EverybodyCases, twelveFamiliesOfEachParentAboveTheSameChildren) {
+    const Place parents[] = {person(), person()};
+    const Place children[] = {person(), person()};
+    for (int i = 0; i < 6; ++i) {
+        for (const Place parent : parents) family(parent, kNobody, {children[0], children[1]});
+    }
+    draw();
+    expectReadable();
+}
+
+TEST_F(EverybodyCases, couplesWithoutAGapAreJoined) {
+    const Place man = person();
+    family(man, person(Sex::female), {});
+    graph_ = builder_.build();
+    EverybodyOptions options;
+    options.sizes.gapX = 0;
+    picture_ = everybodyChart(graph_, options);
+    expectReadable();
+}
+
 TEST_F(EverybodyCases, twelveHundredSpouses) {
     const Place a = person();
     for (int i = 0; i < 1200; ++i) family(a, person(Sex::female), {person()});

@@ -114,7 +114,8 @@ std::vector<Laid> layRows(const olvane::kin::KinGraph& graph, std::int64_t effor
         Laid one;
         one.part = std::move(part);
         one.chains = weldCouples(one.part);
-        one.marked = marksForWantOfRoom(one.part, one.chains);
+        one.marked =
+            marksForWantOfRoom(one.part, one.chains, olvane::charts::LineRoom(one.part.persons.size()));
         one.rows = makeRows(one.part, one.chains, chooseRows(one.part, one.chains, effort), one.marked);
         laid.push_back(std::move(one));
     }

@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <map>
 #include <numeric>
+#include <random>
 #include <set>
 #include <string>
 #include <tuple>
@@ -259,10 +260,56 @@ TEST(Everybody, takesBoxesOfAnySize) {
         options.boxSizes = sizes;
         const Picture picture = everybodyChart(made.graph, options);
         const Judgement j = olvane::picture::judge(picture, &made.graph);
-        EXPECT_EQ(std::tuple(j.overlaps, j.hits, j.unjoined, *j.untold), std::tuple(0U, 0U, 0U, 0U))
+        EXPECT_EQ(std::tuple(j.overlaps, j.hits, j.tracks, j.touches, j.unjoined, *j.untold),
+                  std::tuple(0U, 0U, 0U, 0U, 0U, 0U))
             << made.name;
         for (std::size_t i = 0; i < sizes.size(); ++i)
             EXPECT_EQ(picture.boxes[i].width, sizes[i].width) << made.name;
+    }
+}
+
+// What a host may ask for with a family: lines are never one on another, whatever room there is for them.
+EverybodyOptions anyOptions(std::uint64_t seed, int persons, std::vector<olvane::charts::BoxSize>& sizes) {
+    std::mt19937_64 random(seed + 1000);
+    const auto below = [&random](int count) {
+        return static_cast<int>(random() % static_cast<std::uint64_t>(count));
+    };
+    EverybodyOptions options;
+    options.onePart = false;
+    options.marks = below(6) - 1;
+    options.effort = below(2);
+    options.direction = static_cast<Direction>(below(4));
+    options.compact = below(2) == 0;
+    if (below(4) == 0) options.foldAspect = 0;
+    if (below(6) == 0) options.aspect = 0.5 + below(4);
+    if (below(2) == 0) {
+        options.sizes.gapX = static_cast<float>(1 + below(30));
+        options.sizes.gapY = static_cast<float>(below(40));
+    }
+    for (int i = 0; i < persons && seed % 2 == 0; ++i) {
+        const int width = 4 + below(100);
+        sizes.push_back({static_cast<float>(width), static_cast<float>(4 + below(100))});
+    }
+    options.boxSizes = sizes;
+    return options;
+}
+
+// In the last one a union hangs from its second partner, below a child of it who is an ancestor of hers.
+TEST(Everybody, keepsLinesApartWhereMoreMeetThanThereIsRoomFor) {
+    std::vector<std::uint64_t> seeds(300);
+    std::iota(seeds.begin(), seeds.end(), std::uint64_t{0});
+    seeds.push_back(1282);
+    for (const std::uint64_t seed : seeds) {
+        const KinGraph graph = olvane::test::denseKin(seed);
+        std::vector<olvane::charts::BoxSize> sizes;
+        const EverybodyOptions options = anyOptions(seed, graph.personCount(), sizes);
+        const Judgement j = olvane::picture::judge(everybodyChart(graph, options), &graph);
+        EXPECT_EQ(std::tuple(j.overlaps, j.hits, j.tracks, j.touches, j.unjoined, *j.untold, j.slanted),
+                  std::tuple(0U, 0U, 0U, 0U, 0U, 0U, 0U))
+            << "seed " << seed;
+        if (options.marks < 0) {
+            EXPECT_EQ(j.crossings, 0U) << "seed " << seed;
+        }
     }
 }
 

@@ -61,7 +61,8 @@ void printFamily(std::uint64_t seed) {
     const auto graph = olvane::test::soundKin(seed, 10 + static_cast<int>(seed % 31));
     const Component part = componentsOf(graph).front();
     const Chains chains = weldCouples(part);
-    const MarkedLinks marked = marksForWantOfRoom(part, chains);
+    const MarkedLinks marked =
+        marksForWantOfRoom(part, chains, olvane::charts::LineRoom(part.persons.size()));
     const Rows rows = makeRows(part, chains, chooseRows(part, chains, kEffort), marked);
     printProblem(rows, countCrossings(rows, findOrder(rows, kEffort, kStarts)));
 }
