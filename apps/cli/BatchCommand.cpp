@@ -7,6 +7,7 @@
 
 #include <cli/Commands.h>
 
+#include <algorithm>
 #include <charconv>
 #include <csignal>
 #include <filesystem>
@@ -33,6 +34,8 @@ namespace olvane::cli {
 namespace {
 
 constexpr std::size_t kBlock = 256;
+// Bytes of a line that a thread writes ahead; longer ones, of which a block could fill the memory, are written in turn.
+constexpr std::size_t kMostOfLine = 256 * 1024;
 constexpr int kInterrupted = 130;  // what shells make of an interrupt
 
 volatile std::sig_atomic_t interrupted = 0;
@@ -141,39 +144,82 @@ std::string barOf(std::size_t done, std::size_t total) {
            std::string(40 - width, ' ') + "]";
 }
 
-// What follows the id on a line.
-using Answer = std::function<std::string(gedcom::PersonId id)>;
+// Writes text.
+using Writing = std::function<void(const picture::TextSink& write)>;
+// Works out what follows the id on a line, and leaves the writing to be done: once or several times, on any thread.
+using Answer = std::function<Writing(gedcom::PersonId id)>;
 
 struct BatchLine {
     std::string text;
     bool isKnown = false;
+    Writing
+        rest;  // set where the line is longer than a thread may hold: what stands between text and the line end
 };
 
 // JSON has line ends between its values alone.
-std::string onOneLine(std::string json) {
-    std::string line;
-    for (std::size_t at = 0; at < json.size(); ++at) {
-        if (json[at] != '\n') {
-            line += json[at];
-        } else {
-            while (at + 1 < json.size() && json[at + 1] == ' ') ++at;
+class OneLine {
+public:
+    explicit OneLine(const picture::TextSink& write) : write_(write) {}
+
+    void add(std::string_view json) {
+        while (!json.empty()) {
+            if (isAfterLineEnd_) json.remove_prefix(std::min(json.find_first_not_of(' '), json.size()));
+            if (json.empty()) return;
+            const std::size_t end = std::min(json.find('\n'), json.size());
+            write_(json.substr(0, end));
+            isAfterLineEnd_ = end < json.size();
+            json.remove_prefix(end + (isAfterLineEnd_ ? 1 : 0));
         }
+    }
+
+private:
+    const picture::TextSink& write_;
+    bool isAfterLineEnd_ = false;
+};
+
+BatchLine lineFor(const BatchFocus& focus, const Answer& answer) {
+    if (focus.id == 0) return {escapedField(focus.written) + "\t\n", false, nullptr};
+    BatchLine line{std::to_string(focus.id) + "\t", true, answer(focus.id)};
+    const std::size_t start = line.text.size();
+    bool isWhole = true;
+    line.rest([&](std::string_view piece) {
+        isWhole = isWhole && line.text.size() + piece.size() <= kMostOfLine;
+        if (isWhole) line.text += piece;
+    });
+    if (isWhole) {
+        line.rest = nullptr;
+        line.text += '\n';
+    } else {
+        line.text.resize(start);
+        line.text.shrink_to_fit();
     }
     return line;
 }
 
-BatchLine lineFor(const BatchFocus& focus, const Answer& answer) {
-    if (focus.id == 0) return {escapedField(focus.written) + "\t\n", false};
-    return {std::to_string(focus.id) + "\t" + answer(focus.id) + "\n", true};
+void writeLine(const BatchLine& line) {
+    if (!line.rest) return writeReport(line.text);
+    writeReport([&line](const picture::TextSink& write) {
+        write(line.text);
+        line.rest(write);
+        write("\n");
+    });
 }
 
 // The result text of a view of the engine, or else the picture.
 Answer answerOf(const gedcom::GedcomData& data, const LayoutRequest& request) {
     if (isEngineView(request.view())) {
-        return [&](gedcom::PersonId id) { return layoutText(data, id, request); };
+        return [&](gedcom::PersonId id) {
+            return [text = layoutText(data, id, request)](const picture::TextSink& write) { write(text); };
+        };
     }
     const auto run = std::make_shared<PictureRun>(data, request, std::vector<bool>());
-    return [run](gedcom::PersonId id) { return onOneLine(run->jsonOf(id)); };
+    return [run](gedcom::PersonId id) {
+        const auto picture = std::make_shared<const picture::Picture>(run->pictureOf(id));
+        return [run, picture](const picture::TextSink& write) {
+            OneLine line(write);
+            run->writeJson(*picture, [&line](std::string_view piece) { line.add(piece); });
+        };
+    };
 }
 
 }  // namespace
@@ -196,7 +242,7 @@ int runBatch(const BatchOptions& options) {
             if (interrupted == 0) lines[i] = lineFor(block[i], answer);
         });
         for (std::size_t i = 0; i < lines.size() && interrupted == 0; ++i, ++done) {
-            writeStandardOutput(lines[i].text);
+            writeLine(lines[i]);
             if (lines[i].isKnown) continue;
             ++unknown;
             progress.clear();

@@ -16,18 +16,22 @@ namespace olvane::cli {
 
 namespace {
 
-std::string outputOf(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options) {
-    if (options.format == LayoutFormat::json) {
-        TerminalProgress progress;
-        LayoutRequest request = options.request;
-        request.chart.progress = progress.ofChart();
-        return PictureRun(data, request, hiddenPersons(data, options.hiding)).jsonOf(focus);
-    }
+void writeLayout(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options,
+                 const picture::TextSink& write) {
     const std::string text = layoutText(data, focus, options.request);
-    if (options.format == LayoutFormat::text) return text + "\n";
-    return layoutJson(data, focus, options.request, readLayoutText(text),
-                      hiddenPersons(data, options.hiding)) +
-           "\n";
+    if (options.format == LayoutFormat::text) return write(text + "\n");
+    writeLayoutJson(data, focus, options.request, readLayoutText(text), hiddenPersons(data, options.hiding),
+                    write);
+}
+
+void printPicture(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutOptions& options) {
+    TerminalProgress progress;
+    LayoutRequest request = options.request;
+    request.chart.progress = progress.ofChart();
+    const PictureRun run(data, request, hiddenPersons(data, options.hiding));
+    const picture::Picture picture = run.pictureOf(focus);
+    progress.clear();
+    writeReport([&](const picture::TextSink& write) { run.writeJson(picture, write); });
 }
 
 }  // namespace
@@ -35,7 +39,11 @@ std::string outputOf(const gedcom::GedcomData& data, gedcom::PersonId focus, con
 int runLayout(const LayoutOptions& options) {
     const gedcom::GedcomData data = readFile(options.input);
     const gedcom::PersonId focus = chooseFocus(data, options.focus);
-    writeReport(outputOf(data, focus, options));
+    if (options.format == LayoutFormat::json) {
+        printPicture(data, focus, options);
+    } else {
+        writeReport([&](const picture::TextSink& write) { writeLayout(data, focus, options, write); });
+    }
     return 0;
 }
 

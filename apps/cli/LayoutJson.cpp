@@ -21,42 +21,51 @@ Json segmentJson(const LayoutSegment& segment) {
     return {{"x1", segment.x1}, {"y1", segment.y1}, {"x2", segment.x2}, {"y2", segment.y2}};
 }
 
-Json boxJson(const gedcom::GedcomData& data, const LayoutRecord& record, const std::vector<bool>& living,
-             const gedcom::HiddenNames& hiddenNames) {
-    Json json;
-    json["id"] = record.id;
-    json["x"] = record.x;
-    json["y"] = record.y;
-    json["hasHiddenRelatives"] = record.hasHiddenRelatives;
-    json["segments"] = Json::array();
-    for (const LayoutSegment& segment : record.segments) json["segments"].push_back(segmentJson(segment));
+void writeBox(const gedcom::GedcomData& data, const LayoutRecord& record, const std::vector<bool>& living,
+              const gedcom::HiddenNames& hiddenNames, JsonOutput& json) {
+    json.beginObject();
+    json.field("id", Json(record.id));
+    json.field("x", Json(record.x));
+    json.field("y", Json(record.y));
+    json.field("hasHiddenRelatives", Json(record.hasHiddenRelatives));
+    json.key("segments");
+    json.beginList();
+    for (const LayoutSegment& segment : record.segments) json.value(segmentJson(segment));
+    json.endList();
     if (record.addNode) {
-        json["addNode"] = {{"sex", record.addNode->male ? "male" : "female"},
-                           {"child", record.addNode->childId}};
+        json.field("addNode", Json{{"sex", record.addNode->male ? "male" : "female"},
+                                   {"child", record.addNode->childId}});
     } else if (!living.empty() && living[static_cast<std::size_t>(record.id - 1)]) {
-        json["living"] = true;
+        json.field("living", Json(true));
     } else {
-        json["person"] = personJson(data, static_cast<gedcom::PersonId>(record.id), hiddenNames);
+        json.key("person");
+        json.beginObject();
+        writePersonFields(data, static_cast<gedcom::PersonId>(record.id), hiddenNames, json);
+        json.endObject();
     }
-    return json;
+    json.endObject();
 }
 
 }  // namespace
 
-std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
-                       const std::vector<LayoutRecord>& records, const std::vector<bool>& living) {
+void writeLayoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
+                     const std::vector<LayoutRecord>& records, const std::vector<bool>& living,
+                     const picture::TextSink& write) {
     const TreeSize size = charts::treeSizeOf(request.boxes);
     const gedcom::HiddenNames hiddenNames(data, living);
-    Json json;
-    json["format"] = kFormatVersion;
-    json["view"] = request.view() == View::pedigree ? "pedigree" : "family";
-    json["focus"] = focus;
-    json["boxWidth"] = static_cast<int>(size.nodeWidth);
-    json["boxHeight"] = static_cast<int>(size.nodeHeight);
-    json["boxes"] = Json::array();
-    for (const LayoutRecord& record : records)
-        json["boxes"].push_back(boxJson(data, record, living, hiddenNames));
-    return json.dump(1, ' ', false, Json::error_handler_t::replace);
+    JsonOutput json(write, JsonOutput::Form::indented);
+    json.beginObject();
+    json.field("format", Json(kFormatVersion));
+    json.field("view", std::string_view(request.view() == View::pedigree ? "pedigree" : "family"));
+    json.field("focus", Json(focus));
+    json.field("boxWidth", Json(static_cast<int>(size.nodeWidth)));
+    json.field("boxHeight", Json(static_cast<int>(size.nodeHeight)));
+    json.key("boxes");
+    json.beginList();
+    for (const LayoutRecord& record : records) writeBox(data, record, living, hiddenNames, json);
+    json.endList();
+    json.endObject();
+    write("\n");
 }
 
 }  // namespace olvane::cli

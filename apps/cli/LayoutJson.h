@@ -3,11 +3,11 @@
 
 #pragma once
 
-#include <string>
 #include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/host/LayoutText.h>
+#include <olvane/picture/TextSink.h>
 
 #include <cli/LayoutRun.h>
 
@@ -17,7 +17,8 @@ namespace olvane::cli {
 // docs/layout.schema.json.
 //
 // living: whose data are left out, an entry for each person; empty for nobody.
-std::string layoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
-                       const std::vector<LayoutRecord>& records, const std::vector<bool>& living);
+void writeLayoutJson(const gedcom::GedcomData& data, gedcom::PersonId focus, const LayoutRequest& request,
+                     const std::vector<LayoutRecord>& records, const std::vector<bool>& living,
+                     const picture::TextSink& write);
 
 }  // namespace olvane::cli

@@ -145,7 +145,13 @@ void writeStandardOutput(std::string_view content) {
 }
 
 void writeReport(std::string_view text) {
-    writeStandardOutput(textFor(STDOUT_FILENO, text));
+    writeReport([text](const picture::TextSink& write) { write(text); });
+}
+
+void writeReport(const std::function<void(const picture::TextSink& write)>& make) {
+    TextPieces pieces(STDOUT_FILENO, writeStandardOutput);
+    make([&pieces](std::string_view piece) { pieces.add(piece); });
+    pieces.finish();
 }
 
 }  // namespace olvane::cli

@@ -3,10 +3,13 @@
 
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
+
+#include <olvane/picture/TextSink.h>
 
 #include <cli/InputFiles.h>
 
@@ -67,5 +70,7 @@ void writeStandardOutput(std::string_view content);
 
 // As writeStandardOutput, for text that holds what a file says: on a terminal it is written as visibleText.
 void writeReport(std::string_view text);
+// The same for a long report, which goes out while it is made.
+void writeReport(const std::function<void(const picture::TextSink& write)>& make);
 
 }  // namespace olvane::cli

@@ -28,13 +28,11 @@ std::vector<gedcom::PersonId> everybody(const gedcom::GedcomData& data) {
     return all;
 }
 
-std::string textOf(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
-                   ListFormat format) {
-    if (format == ListFormat::tsv) return peopleTable(data, persons);
-    if (format == ListFormat::json) return peopleJson(data, persons);
-    std::string text;
-    for (const gedcom::PersonId id : persons) text += personLine(data, id) + "\n";
-    return text;
+void writePeople(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                 ListFormat format, const picture::TextSink& write) {
+    if (format == ListFormat::tsv) return writePeopleTable(data, persons, write);
+    if (format == ListFormat::json) return writePeopleJson(data, persons, write);
+    for (const gedcom::PersonId id : persons) write(personLine(data, id) + "\n");
 }
 
 }  // namespace
@@ -44,7 +42,7 @@ int runPeople(const PeopleOptions& options) {
     const bool needsFacts = options.format != ListFormat::text || !words.empty();
     const gedcom::GedcomData data = needsFacts ? readFileWithFacts(options.input) : readFile(options.input);
     const auto persons = words.empty() ? everybody(data) : gedcom::PersonFinder(data).find(words);
-    writeReport(textOf(data, persons, options.format));
+    writeReport([&](const picture::TextSink& write) { writePeople(data, persons, options.format, write); });
     if (!persons.empty()) return 0;
     printMessage(
         options.input.file + ": " +

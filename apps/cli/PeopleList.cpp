@@ -16,37 +16,53 @@ using Json = nlohmann::ordered_json;
 
 constexpr int kFormatVersion = 1;
 
-std::string lineOf(const gedcom::GedcomData& data, gedcom::PersonId id) {
+void writeLine(const gedcom::GedcomData& data, gedcom::PersonId id, const picture::TextSink& write) {
     const gedcom::Person& person = data.person(id);
     const gedcom::PersonName& name = data.firstName(id);
-    return tableLine({std::to_string(id), person.xref, sexName(person.sex), gedcom::displayName(name),
-                      name.given, name.surname, person.dead ? "true" : "false", person.birth.written,
-                      gedcom::sortText(person.birth), placeOf(data, id, "BIRT"), person.death.written,
-                      gedcom::sortText(person.death), placeOf(data, id, "DEAT")});
+    TableLineOutput line(write);
+    line.cell(std::to_string(id));
+    line.cell(person.xref);
+    line.cell(sexName(person.sex));
+    line.cell([&name](const picture::TextSink& sink) { gedcom::writeDisplayName(name, sink); });
+    line.cell(name.given);
+    line.cell(name.surname);
+    line.cell(person.dead ? "true" : "false");
+    line.cell(person.birth.written);
+    line.cell(gedcom::sortText(person.birth));
+    line.cell(placeOf(data, id, "BIRT"));
+    line.cell(person.death.written);
+    line.cell(gedcom::sortText(person.death));
+    line.cell(placeOf(data, id, "DEAT"));
+    line.finish();
 }
 
 }  // namespace
 
-std::string peopleTable(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons) {
-    std::string text =
+void writePeopleTable(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                      const picture::TextSink& write) {
+    write(
         "id\txref\tsex\tname\tgiven\tsurname\tdead\tbirth\tbirth_sort\tbirth_place\tdeath\tdeath_sort\tdeath_"
-        "place\n";
-    for (const gedcom::PersonId id : persons) text += lineOf(data, id);
-    return text;
+        "place\n");
+    for (const gedcom::PersonId id : persons) writeLine(data, id, write);
 }
 
-std::string peopleJson(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons) {
-    Json json;
-    json["format"] = kFormatVersion;
-    json["file"] = data.file();
-    json["persons"] = Json::array();
+void writePeopleJson(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                     const picture::TextSink& write) {
+    JsonOutput json(write, JsonOutput::Form::indented);
+    json.beginObject();
+    json.field("format", Json(kFormatVersion));
+    json.field("file", std::string_view(data.file()));
+    json.key("persons");
+    json.beginList();
     for (const gedcom::PersonId id : persons) {
-        Json person;
-        person["id"] = id;
-        person.update(personJson(data, id));
-        json["persons"].push_back(std::move(person));
+        json.beginObject();
+        json.field("id", Json(id));
+        writePersonFields(data, id, {}, json);
+        json.endObject();
     }
-    return json.dump(1, ' ', false, Json::error_handler_t::replace) + "\n";
+    json.endList();
+    json.endObject();
+    write("\n");
 }
 
 }  // namespace olvane::cli

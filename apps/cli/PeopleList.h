@@ -3,10 +3,10 @@
 
 #pragma once
 
-#include <string>
 #include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/picture/TextSink.h>
 
 namespace olvane::cli {
 
@@ -14,9 +14,11 @@ namespace olvane::cli {
 
 // Tab-separated values, a heading first: id, xref, sex, name, given, surname, dead, birth, birth_sort, birth_place, death,
 // death_sort, death_place. Cells are as tableCell makes them.
-std::string peopleTable(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons);
+void writePeopleTable(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                      const picture::TextSink& write);
 
 // JSON of the form of docs/people.schema.json.
-std::string peopleJson(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons);
+void writePeopleJson(const gedcom::GedcomData& data, const std::vector<gedcom::PersonId>& persons,
+                     const picture::TextSink& write);
 
 }  // namespace olvane::cli

@@ -14,10 +14,10 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 void addEvent(const gedcom::GedcomData& data, gedcom::PersonId id, const char* name, std::string_view tag,
-              const gedcom::GedcomDate& date, const gedcom::HiddenNames& hiddenNames, Json& json) {
-    if (!hiddenNames.shownPlace(date.written).empty()) json[name] = dateJson(date);
+              const gedcom::GedcomDate& date, const gedcom::HiddenNames& hiddenNames, JsonOutput& json) {
+    if (!hiddenNames.shownPlace(date.written).empty()) json.field(name, dateJson(date));
     const std::string_view place = hiddenNames.shownPlace(placeOf(data, id, tag));
-    if (!place.empty()) json[std::string(name) + "Place"] = std::string(place);
+    if (!place.empty()) json.field(std::string(name) + "Place", place);
 }
 
 }  // namespace
@@ -58,19 +58,19 @@ Json dateJson(const gedcom::GedcomDate& date) {
     return json;
 }
 
-Json personJson(const gedcom::GedcomData& data, gedcom::PersonId id, const gedcom::HiddenNames& hiddenNames) {
+void writePersonFields(const gedcom::GedcomData& data, gedcom::PersonId id,
+                       const gedcom::HiddenNames& hiddenNames, JsonOutput& json) {
     const gedcom::Person& person = data.person(id);
     const gedcom::PersonName& name = data.firstName(id);
-    Json json;
-    json["xref"] = std::string(hiddenNames.shownText(person.xref));
-    json["name"] = gedcom::displayName(name);
-    json["given"] = std::string(name.given);
-    json["surname"] = std::string(name.surname);
-    json["sex"] = sexName(person.sex);
-    json["dead"] = person.dead;
+    json.field("xref", hiddenNames.shownText(person.xref));
+    json.key("name");
+    json.text([&name](const picture::TextSink& write) { gedcom::writeDisplayName(name, write); });
+    json.field("given", name.given);
+    json.field("surname", name.surname);
+    json.field("sex", std::string_view(sexName(person.sex)));
+    json.field("dead", Json(person.dead));
     addEvent(data, id, "birth", "BIRT", person.birth, hiddenNames, json);
     addEvent(data, id, "death", "DEAT", person.death, hiddenNames, json);
-    return json;
 }
 
 }  // namespace olvane::cli

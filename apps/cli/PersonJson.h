@@ -10,6 +10,8 @@
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/gedcom/HiddenNames.h>
 
+#include <cli/JsonOutput.h>
+
 namespace olvane::cli {
 
 // "male", "female", "other"
@@ -22,9 +24,9 @@ std::string_view placeOf(const gedcom::GedcomData& data, gedcom::PersonId id, st
 // A date: "written", "shown", and where it could be read "year" and "sort".
 nlohmann::ordered_json dateJson(const gedcom::GedcomDate& date);
 
-// What a file says of a person, each field by name; birth and death only where it gives a date, their places only where
-// facts were read. Texts that name somebody hidden are left out.
-nlohmann::ordered_json personJson(const gedcom::GedcomData& data, gedcom::PersonId id,
-                                  const gedcom::HiddenNames& hiddenNames = {});
+// What a file says of a person, each field by name, into an object that is open; birth and death only where it gives a
+// date, their places only where facts were read. Texts that name somebody hidden are left out.
+void writePersonFields(const gedcom::GedcomData& data, gedcom::PersonId id,
+                       const gedcom::HiddenNames& hiddenNames, JsonOutput& json);
 
 }  // namespace olvane::cli

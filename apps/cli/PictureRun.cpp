@@ -45,10 +45,12 @@ picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
 
 picture::PictureFacts PictureRun::facts() const {
     picture::PictureFacts facts;
-    facts.person = [this](std::int64_t id) {
-        if (picture::isHidden(hidden_, id)) return std::string(kLivingJson);
-        return personJson(data_, static_cast<gedcom::PersonId>(id), hiddenNames_)
-            .dump(-1, ' ', false, nlohmann::ordered_json::error_handler_t::replace);
+    facts.person = [this](std::int64_t id, const picture::TextSink& write) {
+        if (picture::isHidden(hidden_, id)) return write(kLivingJson);
+        JsonOutput json(write, JsonOutput::Form::compact);
+        json.beginObject();
+        writePersonFields(data_, static_cast<gedcom::PersonId>(id), hiddenNames_, json);
+        json.endObject();
     };
     facts.familyXref = [this](std::uint32_t number) {
         return std::string(hiddenNames_.shownText(data_.family(number).xref));
@@ -61,8 +63,8 @@ picture::PictureFacts PictureRun::facts() const {
     return facts;
 }
 
-std::string PictureRun::jsonOf(gedcom::PersonId focus) const {
-    return picture::pictureJson(pictureOf(focus), facts());
+void PictureRun::writeJson(const picture::Picture& picture, const picture::TextSink& write) const {
+    picture::writePictureJson(picture, facts(), write);
 }
 
 }  // namespace olvane::cli

@@ -3,7 +3,6 @@
 
 #pragma once
 
-#include <string>
 #include <vector>
 
 #include <olvane/charts/Views.h>
@@ -32,8 +31,8 @@ public:
     // What the file adds in JSON; of a hidden person {"living": true}. Valid as long as this lives.
     picture::PictureFacts facts() const;
 
-    // As olvane layout prints it.
-    std::string jsonOf(gedcom::PersonId focus) const;
+    // A picture of this run as olvane layout prints it.
+    void writeJson(const picture::Picture& picture, const picture::TextSink& write) const;
 
 private:
     const gedcom::GedcomData& data_;

@@ -25,19 +25,54 @@ bool beginsLikeFormula(std::string_view text) {
                        [text](std::string_view sign) { return text.starts_with(sign); });
 }
 
-std::string quoted(std::string_view text) {
-    std::string cell = "\"";
-    for (const char c : text) cell.append(c == '"' ? 2 : 1, c);
-    return cell + '"';
+// A cell that begins with a quotation mark has them twice.
+std::string cellPart(std::string_view text, bool isQuoted) {
+    std::string part;
+    part.reserve(text.size());
+    for (const char c : text) part.append(isQuoted && c == '"' ? 2 : 1, isControl(c) ? ' ' : c);
+    return part;
 }
+
+// A cell in pieces: what it begins with decides on its form.
+class CellOutput {
+public:
+    explicit CellOutput(const picture::TextSink& write) : write_(write) {}
+
+    void add(std::string_view text) {
+        constexpr std::size_t kPieceBytes = 64 * 1024;
+        if (text.empty()) return;
+        if (isStart_) begin(text);
+        isStart_ = false;
+        for (; !text.empty(); text.remove_prefix(std::min(text.size(), kPieceBytes))) {
+            write_(cellPart(text.substr(0, kPieceBytes), isQuoted_));
+        }
+    }
+
+    void finish() {
+        if (isQuoted_) write_("\"");
+    }
+
+private:
+    void begin(std::string_view text) {
+        isQuoted_ = text.starts_with('"');
+        if (beginsLikeFormula(text)) write_("'");
+        if (isQuoted_) write_("\"");
+    }
+
+    const picture::TextSink& write_;
+    bool isStart_ = true;
+    bool isQuoted_ = false;
+};
 
 }  // namespace
 
 std::string tableCell(std::string_view text) {
-    std::string cell(text);
-    std::replace_if(cell.begin(), cell.end(), isControl, ' ');
-    if (beginsLikeFormula(cell)) return "'" + cell;
-    return cell.starts_with('"') ? quoted(cell) : cell;
+    std::string cell;
+    const picture::TextSink write = [&cell](std::string_view piece) { cell += piece; };
+    CellOutput output(write);
+    output.add(text);
+    output.finish();
+    return cell;
 }
 
 std::string tableLine(std::initializer_list<std::string_view> cells) {
@@ -45,6 +80,22 @@ std::string tableLine(std::initializer_list<std::string_view> cells) {
     for (const std::string_view cell : cells) line += tableCell(cell) + '\t';
     line.back() = '\n';
     return line;
+}
+
+void TableLineOutput::cell(std::string_view text) {
+    cell([text](const picture::TextSink& write) { write(text); });
+}
+
+void TableLineOutput::cell(const std::function<void(const picture::TextSink& write)>& make) {
+    if (!isFirst_) write_("\t");
+    isFirst_ = false;
+    CellOutput output(write_);
+    make([&output](std::string_view piece) { output.add(piece); });
+    output.finish();
+}
+
+void TableLineOutput::finish() {
+    write_("\n");
 }
 
 std::string escapedField(std::string_view text) {

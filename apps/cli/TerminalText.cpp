@@ -5,10 +5,12 @@
 
 #include <cli/TerminalText.h>
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 #include <cstdint>
 #include <cstdio>
+#include <utility>
 
 #include <unistd.h>
 
@@ -34,6 +36,17 @@ bool isUnsafe(std::uint32_t character) {
     if (character == 0 || character == '\t' || character == '\n') return false;
     if (character < 0x20 || (character >= 0x7F && character <= 0x9F)) return true;
     return (character >= 0x2028 && character <= 0x202E) || (character >= 0x2066 && character <= 0x2069);
+}
+
+constexpr std::size_t kPieceBytes = 64 * 1024;
+
+// How much of the text ends before a character of which only a part is there.
+std::size_t endOfWhole(std::string_view text) {
+    const std::size_t size = text.size();
+    const auto byte = [text](std::size_t i) { return static_cast<unsigned char>(text[i]); };
+    if (size >= 1 && byte(size - 1) >= 0xC0U) return size - 1;
+    if (size >= 2 && byte(size - 2) >= 0xE0U && byte(size - 2) < 0xF0U) return size - 2;
+    return size;
 }
 
 std::size_t lengthOf(std::uint32_t character) {
@@ -62,6 +75,30 @@ std::string visibleText(std::string_view text) {
 
 std::string textFor(int descriptor, std::string_view text) {
     return ::isatty(descriptor) != 0 ? visibleText(text) : std::string(text);
+}
+
+TextPieces::TextPieces(int descriptor, picture::TextSink write)
+    : write_(std::move(write)), isTerminal_(::isatty(descriptor) != 0) {}
+
+void TextPieces::add(std::string_view piece) {
+    while (!piece.empty()) {
+        const std::size_t some = std::min(piece.size(), kPieceBytes);
+        pending_ += piece.substr(0, some);
+        piece.remove_prefix(some);
+        if (pending_.size() < kPieceBytes) continue;
+        const std::size_t end = endOfWhole(pending_);
+        pass(std::string_view(pending_).substr(0, end));
+        pending_.erase(0, end);
+    }
+}
+
+void TextPieces::finish() {
+    if (!pending_.empty()) pass(pending_);
+    pending_.clear();
+}
+
+void TextPieces::pass(std::string_view text) {
+    isTerminal_ ? write_(visibleText(text)) : write_(text);
 }
 
 }  // namespace olvane::cli

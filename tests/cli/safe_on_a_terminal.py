@@ -46,6 +46,7 @@ def main():
         ["people", file, "--format", "json"],
         ["check", file],
         ["layout", file, "--focus", "3", "--format", "json"],
+        ["batch", file, "--view", "near"],
         ["layout", file, "--focus", "Leftt"],
         ["layout", file, "--focus", "e"],
         ["people", file, "\x1b]0;title\x07"],

@@ -42,25 +42,52 @@ bool endsUnspaced(std::string_view text) {
     return start > 0 && beginsUnspaced(text.substr(start - 1));
 }
 
-// The value with a space for each slash, but none between characters that are written without, and no two in
-// a row. Ends once the text is longer than so many bytes.
-std::string withoutSlashes(std::string_view written, std::size_t mostBytes) {
-    std::string text;
-    text.reserve(std::min(written.size(), mostBytes));
-    bool space = false;
-    bool slash = false;
-    for (std::size_t at = 0; at < written.size() && text.size() <= mostBytes; ++at) {
-        if (written[at] == ' ' || written[at] == '/') {
-            space = space || written[at] == ' ';
-            slash = slash || written[at] == '/';
-            continue;
+constexpr std::size_t kPartBytes = 64 * 1024;
+
+bool isSeparator(char c) {
+    return c == ' ' || c == '/';
+}
+
+// The characters at the start of a text up to a space or slash, or as many as make a handy part.
+std::string_view partOf(std::string_view text) {
+    std::size_t end = 0;
+    while (end < text.size() && end < kPartBytes && !isSeparator(text[end])) ++end;
+    while (end < text.size() && end > 1 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80) --end;
+    return text.substr(0, end);
+}
+
+// Visits the parts of the value with a space for each slash, but none between characters that are written without, and
+// no two in a row; until the visitor returns false. Returns whether there was any.
+template <typename Visitor>
+bool forEachPartWithoutSlashes(std::string_view written, const Visitor& visit) {
+    std::string_view previous;
+    while (!written.empty()) {
+        bool space = false;
+        bool slash = false;
+        for (; !written.empty() && isSeparator(written.front()); written.remove_prefix(1)) {
+            (written.front() == ' ' ? space : slash) = true;
         }
-        const bool parted = space || (slash && !(endsUnspaced(text) && beginsUnspaced(written.substr(at))));
-        if (parted && !text.empty()) text += ' ';
-        text += written[at];
-        space = slash = false;
+        if (written.empty()) break;
+        const bool parted = space || (slash && !(endsUnspaced(previous) && beginsUnspaced(written)));
+        if (parted && !previous.empty() && !visit(" ")) return true;
+        previous = partOf(written);
+        if (!visit(previous)) return true;
+        written.remove_prefix(previous.size());
     }
-    return text;
+    return !previous.empty();
+}
+
+// The same of the name as displayName has it; a piece of the record is a part as it is.
+template <typename Visitor>
+void forEachPart(const PersonName& name, const Visitor& visit) {
+    if (forEachPartWithoutSlashes(name.written, visit)) return;
+    bool isAny = false;
+    for (const std::string_view piece : {name.prefix, name.given, name.surname, name.suffix}) {
+        if (piece.empty()) continue;
+        if ((isAny && !visit(" ")) || !visit(piece)) return;
+        isAny = true;
+    }
+    if (!isAny) visit(name.nickname);
 }
 
 // A piece that was cut may end within a character.
@@ -82,15 +109,19 @@ std::string displayName(const PersonName& name) {
 }
 
 std::string displayName(const PersonName& name, std::size_t mostBytes) {
-    std::string text = withoutSlashes(name.written, mostBytes);
-    if (!text.empty()) return cutToBytes(std::move(text), mostBytes);
-    for (const std::string_view piece : {name.prefix, name.given, name.surname, name.suffix}) {
-        if (piece.empty() || text.size() > mostBytes) continue;
-        if (!text.empty()) text += ' ';
-        text += piece.substr(0, std::min(piece.size(), mostBytes));
-    }
-    if (text.empty()) text = name.nickname.substr(0, std::min(name.nickname.size(), mostBytes));
+    std::string text;
+    forEachPart(name, [&](std::string_view part) {
+        text += part.substr(0, mostBytes);
+        return text.size() <= mostBytes;
+    });
     return cutToBytes(std::move(text), mostBytes);
+}
+
+void writeDisplayName(const PersonName& name, const std::function<void(std::string_view)>& write) {
+    forEachPart(name, [&](std::string_view part) {
+        write(part);
+        return true;
+    });
 }
 
 GedcomData::GedcomData(GedcomTables tables) : tables_(std::move(tables)) {}

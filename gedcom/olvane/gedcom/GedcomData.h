@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <memory>
 #include <span>
@@ -47,6 +48,9 @@ std::string displayName(const PersonName& name);
 // The same, of a longer name the beginning that has at most so many bytes, in whole characters. Time and memory grow
 // with what comes back, not with the name.
 std::string displayName(const PersonName& name, std::size_t mostBytes);
+
+// The whole name in pieces of whole characters, so that a long one is not copied.
+void writeDisplayName(const PersonName& name, const std::function<void(std::string_view piece)>& write);
 
 // A run of a list that all records share.
 struct Slice {

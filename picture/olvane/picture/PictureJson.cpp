@@ -19,6 +19,7 @@ namespace {
 
 constexpr double kDecimals = 1000;
 constexpr double kMostThousandths = 9e18;
+constexpr std::size_t kPieceBytes = 64 * 1024;
 
 // Rounded to thousandths, without trailing zeros; what is not finite is 0.
 std::string number(double value) {
@@ -56,9 +57,10 @@ std::string field(std::string_view name, double value) {
 
 class PictureWriter {
 public:
-    PictureWriter(const Picture& picture, const PictureFacts& facts) : picture_(picture), facts_(facts) {}
+    PictureWriter(const Picture& picture, const PictureFacts& facts, const TextSink& sink)
+        : picture_(picture), facts_(facts), sink_(sink) {}
 
-    std::string write() {
+    void write() {
         const std::int64_t focus =
             picture_.focus == kNone ? 0 : picture_.boxes[static_cast<std::size_t>(picture_.focus)].id;
         json_ = "{\n \"format\": 2,\n \"view\": " + quoted(picture_.view) +
@@ -67,33 +69,70 @@ public:
             json_ += " \"rings\": " + listOf(picture_.ringRadii, number) +
                      field("middleX", picture_.middleX) + field("middleY", picture_.middleY) + ",\n";
         }
-        addList("boxes", picture_.boxes.size(), [this](std::size_t i) { return boxJson(i); });
+        addList("boxes", picture_.boxes.size(), [this](std::size_t i) { addBox(i); });
         json_ += ",\n";
         addList("families", picture_.families.size(),
-                [this](std::size_t i) { return familyJson(picture_.families[i]); });
+                [this](std::size_t i) { json_ += familyJson(picture_.families[i]); });
         json_ += ",\n";
         addList("marks", picture_.marks.size(),
-                [this](std::size_t i) { return markJson(picture_.marks[i]); });
+                [this](std::size_t i) { json_ += markJson(picture_.marks[i]); });
         if (picture_.other != kNone) {
             json_ += ",\n \"other\": " +
                      std::to_string(picture_.boxes[static_cast<std::size_t>(picture_.other)].id) +
                      ",\n \"focusIs\": " + quoted(picture_.focusIs) +
                      ",\n \"otherIs\": " + quoted(picture_.otherIs) + ",\n";
             addList("ways", picture_.ways.size(),
-                    [this](std::size_t i) { return wayJson(picture_.ways[i]); });
+                    [this](std::size_t i) { json_ += wayJson(picture_.ways[i]); });
         }
-        return std::move(json_) + "\n}\n";
+        json_ += "\n}\n";
+        flush();
     }
 
 private:
     template <class Entry>
-    void addList(std::string_view name, std::size_t count, Entry entry) {
+    void addList(std::string_view name, std::size_t count, Entry addEntry) {
         json_ += " " + quoted(name) + ": [";
-        for (std::size_t i = 0; i < count; ++i) json_ += (i == 0 ? "\n  " : ",\n  ") + entry(i);
+        for (std::size_t i = 0; i < count; ++i) {
+            json_ += i == 0 ? "\n  " : ",\n  ";
+            addEntry(i);
+            if (json_.size() >= kPieceBytes) flush();
+        }
         json_ += count == 0 ? "]" : "\n ]";
     }
 
-    std::string boxJson(std::size_t i) const {
+    void flush() {
+        sink_(json_);
+        json_.clear();
+    }
+
+    void addBox(std::size_t i) {
+        const Box& box = picture_.boxes[i];
+        json_ += placeOfBox(i);
+        if (box.kind != BoxKind::unknownParent) {
+            json_ += personFields(box);
+            addPerson(box.id);
+        }
+        json_ += '}';
+    }
+
+    // What a data source writes may be long, so it goes past this writer's own text.
+    void addPerson(std::int64_t id) {
+        if (!facts_.person) return;
+        bool isFirst = true;
+        facts_.person(id, [&](std::string_view piece) {
+            if (piece.empty()) return;
+            if (isFirst) json_ += ", \"person\": ";
+            isFirst = false;
+            if (json_.size() + piece.size() < kPieceBytes) {
+                json_ += piece;
+                return;
+            }
+            flush();
+            sink_(piece);
+        });
+    }
+
+    std::string placeOfBox(std::size_t i) const {
         const Box& box = picture_.boxes[i];
         std::string json = "{\"id\": " + std::to_string(box.id) + ", \"kind\": " + quoted(nameOf(box.kind));
         if (picture_.isRound()) {
@@ -107,21 +146,18 @@ private:
         if (box.kind == BoxKind::unknownParent) {
             json += ", \"sex\": " + quoted(nameOf(box.sex));
             if (box.childOf != kNone) json += ", \"childOf\": " + std::to_string(box.childOf);
-        } else {
-            json += personFields(box);
         }
-        return json + "}";
+        return json;
     }
 
-    std::string personFields(const Box& box) const {
+    static std::string personFields(const Box& box) {
         std::string json = ", \"repeat\": " + std::to_string(box.repeat) +
                            ", \"hidden\": {\"parents\": " + std::to_string(box.hiddenParents) +
                            ", \"partners\": " + std::to_string(box.hiddenPartners) +
                            ", \"children\": " + std::to_string(box.hiddenChildren) + "}";
         if (box.furtherParents > 0) json += ", \"furtherParents\": " + std::to_string(box.furtherParents);
         if (box.hasFlag) json += std::string(", \"flag\": ") + (box.flag ? "true" : "false");
-        const std::string person = facts_.person ? facts_.person(box.id) : std::string();
-        return person.empty() ? json : json + ", \"person\": " + person;
+        return json;
     }
 
     std::string familyJson(const Family& family) const {
@@ -178,13 +214,20 @@ private:
 
     const Picture& picture_;
     const PictureFacts& facts_;
-    std::string json_;
+    const TextSink& sink_;
+    std::string json_;  // what the sink has not yet
 };
 
 }  // namespace
 
+void writePictureJson(const Picture& picture, const PictureFacts& facts, const TextSink& write) {
+    PictureWriter(picture, facts, write).write();
+}
+
 std::string pictureJson(const Picture& picture, const PictureFacts& facts) {
-    return PictureWriter(picture, facts).write();
+    std::string json;
+    writePictureJson(picture, facts, [&json](std::string_view piece) { json += piece; });
+    return json;
 }
 
 }  // namespace olvane::picture

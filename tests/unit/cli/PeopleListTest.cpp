@@ -20,6 +20,20 @@ gedcom::GedcomData read(const std::string& records) {
                                    "a.ged", options);
 }
 
+using Ids = std::vector<gedcom::PersonId>;
+
+std::string peopleTable(const gedcom::GedcomData& data, const Ids& persons) {
+    std::string text;
+    writePeopleTable(data, persons, [&text](std::string_view piece) { text += piece; });
+    return text;
+}
+
+std::string peopleJson(const gedcom::GedcomData& data, const Ids& persons) {
+    std::string text;
+    writePeopleJson(data, persons, [&text](std::string_view piece) { text += piece; });
+    return text;
+}
+
 TEST(PeopleList, hasEveryFieldApart) {
     const auto data = read(
         "0 @I1@ INDI\n1 NAME Ada /Lund/\n1 SEX F\n1 BIRT\n2 DATE 3 MAY 1801\n2 PLAC Bern\n1 DEAT\n2 DATE ABT "

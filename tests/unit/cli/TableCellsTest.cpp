@@ -3,6 +3,8 @@
 
 #include <cli/TableCells.h>
 
+#include <string>
+
 #include <gtest/gtest.h>
 
 namespace olvane::cli {
@@ -31,6 +33,29 @@ TEST(TableCells, areQuotedWhereTheyBeginWithAQuotationMark) {
 
 TEST(TableCells, areOneLineWithTabsBetween) {
     EXPECT_EQ(tableLine({"a", "b\tc\nd", ""}), "a\tb c d\t\n");
+}
+
+// The same cells one after the other, the first in pieces of so many bytes.
+std::string lineInPieces(std::string_view first, std::string_view second, std::size_t bytes) {
+    std::string text;
+    const picture::TextSink write = [&text](std::string_view piece) { text += piece; };
+    TableLineOutput line(write);
+    line.cell([first, bytes](const picture::TextSink& sink) {
+        for (std::size_t at = 0; at < first.size(); at += bytes) sink(first.substr(at, bytes));
+    });
+    line.cell(second);
+    line.finish();
+    return text;
+}
+
+TEST(TableLineOutput, hasTheBytesOfTheWholeLine) {
+    const std::string longCell = "\"" + std::string(100'000, '"') + "\t" + std::string(100'000, 'a');
+    for (const char* cell : {"", "=1", "\"a\"\tb", "\xEF\xBC\x9D", "a=\"b", "''"}) {
+        for (const std::size_t bytes : {3U, 100U}) {
+            EXPECT_EQ(lineInPieces(cell, "-x", bytes), tableLine({cell, "-x"})) << cell;
+        }
+    }
+    EXPECT_EQ(lineInPieces(longCell, longCell, 3), tableLine({longCell, longCell}));
 }
 
 TEST(EscapedField, hasNeitherTabsNorLineEnds) {

@@ -3,6 +3,8 @@
 
 // Names: pieces from their own lines or from the slashes, in scripts of every direction.
 
+#include <algorithm>
+#include <random>
 #include <string>
 
 #include <gtest/gtest.h>
@@ -149,6 +151,60 @@ TEST(Names, aLongNameIsCutInWholeCharacters) {
     name.written = longName;
     EXPECT_EQ(displayName(name, 10), "xxxxxxxxxx");
     EXPECT_LT(displayName(name, 10).capacity(), 100U);
+}
+
+// Byte by byte: what is written gets a space where a space stood, or a slash between letters of alphabets.
+std::string plainDisplayName(const std::string& written) {
+    static const std::string kUnspaced = "小";
+    std::string text;
+    bool space = false;
+    bool slash = false;
+    for (std::size_t at = 0; at < written.size(); ++at) {
+        if (written[at] == ' ' || written[at] == '/') {
+            (written[at] == ' ' ? space : slash) = true;
+            continue;
+        }
+        const bool unspaced = text.ends_with(kUnspaced) && written.substr(at).starts_with(kUnspaced);
+        if (!text.empty() && (space || (slash && !unspaced))) text += ' ';
+        text += written[at];
+        space = slash = false;
+    }
+    return text;
+}
+
+TEST(Names, aNameInPiecesIsTheWholeName) {
+    std::mt19937 random(11);
+    for (int round = 0; round < 2000; ++round) {
+        std::string written;
+        for (auto i = random() % 12; i > 0; --i) {
+            const char* const kParts[] = {" ", "/", "a", "ü", "小", "小小", "b c"};
+            written += kParts[random() % 7];
+            if (random() % 100 == 0) written += std::string(100'000, 'x') + "ü";
+        }
+        PersonName name;
+        name.written = written;
+        std::string text;
+        std::size_t longest = 0;
+        writeDisplayName(name, [&](std::string_view piece) {
+            EXPECT_FALSE(!piece.empty() && (static_cast<unsigned char>(piece.front()) & 0xC0) == 0x80);
+            longest = std::max(longest, piece.size());
+            text += piece;
+        });
+        ASSERT_EQ(text, plainDisplayName(written)) << written;
+        ASSERT_EQ(displayName(name), text) << written;
+        EXPECT_LT(longest, 100'000U);
+    }
+}
+
+TEST(Names, piecesOfARecordAreJoinedBySpaces) {
+    PersonName name;
+    name.written = "/ /";
+    name.given = "Ada";
+    name.suffix = "jr.";
+    name.nickname = "A";
+    std::string text;
+    writeDisplayName(name, [&text](std::string_view piece) { text += piece; });
+    EXPECT_EQ(text, "Ada jr.");
 }
 
 }  // namespace

@@ -56,7 +56,11 @@ Picture smallPicture() {
 
 TEST(PictureJson, saysEverythingInOrder) {
     PictureFacts facts;
-    facts.person = [](std::int64_t id) { return "{\"xref\": \"I" + std::to_string(id) + "\"}"; };
+    facts.person = [](std::int64_t id, const olvane::picture::TextSink& write) {
+        write("");
+        write("{\"xref\": \"I");
+        write(std::to_string(id) + "\"}");
+    };
     facts.familyXref = [](std::uint32_t) { return "F\"3"; };
     facts.familyLabel = [](std::uint32_t) { return "1839"; };
     EXPECT_EQ(pictureJson(smallPicture(), facts), R"({
