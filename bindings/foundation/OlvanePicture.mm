@@ -6,6 +6,7 @@
 #import <olvane/foundation/OlvanePicture.h>
 
 #import "Raised.h"
+#import "Texts.h"
 
 #include <cstddef>
 #include <memory>
@@ -38,16 +39,6 @@ struct Arrays {
     std::vector<OlvaneArc> arcs;
 };
 
-std::string utf8Of(NSString* text) {
-    const char* bytes = [text UTF8String];
-    return bytes ? bytes : "";
-}
-
-NSString* textOf(const std::string& bytes) {
-    NSString* text = [NSString stringWithUTF8String:bytes.c_str()];
-    return text ? text : [NSString stringWithCString:bytes.c_str() encoding:NSISOLatin1StringEncoding];
-}
-
 // Asks the source. What it raises becomes an exception of C++, thrown outside of the handler.
 template <class Call>
 auto ask(const Call& call) {
@@ -60,7 +51,7 @@ auto ask(const Call& call) {
         asked.answer = asked.call();
     };
     NSException* raised = olvaneRaisedBy(run, &context);
-    if (raised) throw std::runtime_error(utf8Of([raised name]) + ": " + utf8Of([raised reason]));
+    if (raised) throw std::runtime_error(olvaneUtf8Of([raised name]) + ": " + olvaneUtf8Of([raised reason]));
     return std::move(context.answer);
 }
 
@@ -106,7 +97,7 @@ public:
         typedef std::pair<bool, std::string> Answer;
         Answer answer = ask([&] {
             NSString* date = [source dateForPersonWithID:person isBirth:isBirth];
-            return Answer(date != nil, utf8Of(date));
+            return Answer(date != nil, olvaneUtf8Of(date));
         });
         if (!answer.first) throw std::runtime_error("answered nil");
         return std::move(answer.second);
@@ -207,7 +198,7 @@ std::unique_ptr<Arrays> arraysOf(picture::Picture made) {
 NSString* selectorOf(olvane::HostOperation operation) {
     if (operation == olvane::HostOperation::isPreferredSpouse) return @"isPreferredSpouse:ofPerson:";
     if (operation == olvane::HostOperation::date) return @"dateForPersonWithID:isBirth:";
-    return [textOf(nameOf(operation)) stringByAppendingString:@":"];
+    return [olvaneTextOf(nameOf(operation)) stringByAppendingString:@":"];
 }
 
 NSInteger codeOf(olvane::CheckedStatus status) {
@@ -234,7 +225,7 @@ NSInteger codeOf(olvane::CheckedStatus status) {
 NSError* errorOf(const olvane::CheckedOutcome& outcome) {
     const olvane::FailureReason& reason = outcome.reason;
     const bool lacksMemory = outcome.status == olvane::CheckedStatus::outOfMemory;
-    NSString* cause = lacksMemory ? @"there is not enough memory" : textOf(reason.cause);
+    NSString* cause = lacksMemory ? @"there is not enough memory" : olvaneTextOf(reason.cause);
     NSString* description = cause;
     NSMutableDictionary* info = [NSMutableDictionary dictionary];
     if (reason.person != 0) {
@@ -350,14 +341,14 @@ const Arrays& arraysIn(const void* held) {
 }
 
 - (NSString*)focusIs {
-    return textOf(arraysIn(_picture).picture.focusIs);
+    return olvaneTextOf(arraysIn(_picture).picture.focusIs);
 }
 - (NSString*)otherIs {
-    return textOf(arraysIn(_picture).picture.otherIs);
+    return olvaneTextOf(arraysIn(_picture).picture.otherIs);
 }
 
 - (NSString*)json {
-    return textOf(picture::pictureJson(arraysIn(_picture).picture));
+    return olvaneTextOf(picture::pictureJson(arraysIn(_picture).picture));
 }
 
 @end

@@ -203,5 +203,6 @@ enum {
     OlvaneErrorInvalidId = 4,        // an operation answered a number that is not 1 to 2147483647
     OlvaneErrorLayoutFailed = 5,     // the data leave no picture
     OlvaneErrorOutOfMemory = 6,
-    OlvaneErrorNestedCall = 7
+    OlvaneErrorNestedCall = 7,
+    OlvaneErrorUnreadable = 8  // a file that cannot be read
 };
