@@ -7,6 +7,8 @@
 
 #include <olvane/picture/TextMetrics.h>
 
+#include <algorithm>
+
 #include <olvane/picture/FontAdvancesInternal.h>
 #include <olvane/picture/TextPropertiesInternal.h>
 
@@ -24,6 +26,10 @@ constexpr int kEmojiAdvance = 128;
 // U+2028 and U+2029 end a line as well.
 bool isSpaceControl(std::int32_t c) {
     return c == '\t' || c == '\n' || c == '\r' || c == 0x2028 || c == 0x2029;
+}
+
+bool isPrintableAscii(char c) {
+    return c >= ' ' && c <= '~';
 }
 
 bool xmlAllows(std::int32_t c) {
@@ -50,6 +56,8 @@ int advanceOf(std::int32_t c, bool bold) {
 }  // namespace
 
 std::string cleanText(std::string_view text) {
+    // Most texts are, and need no look at their characters.
+    if (std::all_of(text.begin(), text.end(), isPrintableAscii)) return std::string(text);
     std::string clean;
     clean.reserve(text.size());
     forEachCharacter(text, [&clean](std::int32_t character, std::string_view bytes) {

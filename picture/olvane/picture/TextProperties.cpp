@@ -6,6 +6,7 @@
 #include <olvane/picture/TextPropertiesInternal.h>
 
 #include <algorithm>
+#include <array>
 #include <vector>
 
 namespace olvane::picture {
@@ -35,15 +36,8 @@ std::vector<std::int32_t> unpackedRuns() {
     return firsts;
 }
 
-bool isContinuation(char c) {
-    return (static_cast<unsigned char>(c) & 0xC0u) == 0x80u;
-}
-
-}  // namespace
-
-TextProperties textPropertiesOf(std::int32_t character) {
+TextProperties propertiesInTable(std::int32_t character) {
     static const std::vector<std::int32_t> kFirsts = unpackedRuns();
-    if (character < 0 || character > 0x10FFFF) character = kReplacement;
     const auto run = std::upper_bound(kFirsts.begin(), kFirsts.end(), character) - kFirsts.begin() - 1;
     const TextRecord& record = kTextRecords[kTextRunRecords[run]];
     TextProperties properties{static_cast<GraphemeClass>(record.grapheme),
@@ -55,6 +49,32 @@ TextProperties textPropertiesOf(std::int32_t character) {
         properties.line = LineClass::h3;
     }
     return properties;
+}
+
+// Most characters of names and dates, which need no search then.
+constexpr std::int32_t kAsciiCount = 128;
+typedef std::array<TextProperties, kAsciiCount> AsciiProperties;
+
+const AsciiProperties& asciiProperties() {
+    static const AsciiProperties kProperties = [] {
+        AsciiProperties properties;
+        for (std::int32_t c = 0; c < kAsciiCount; ++c)
+            properties[static_cast<std::size_t>(c)] = propertiesInTable(c);
+        return properties;
+    }();
+    return kProperties;
+}
+
+bool isContinuation(char c) {
+    return (static_cast<unsigned char>(c) & 0xC0u) == 0x80u;
+}
+
+}  // namespace
+
+TextProperties textPropertiesOf(std::int32_t character) {
+    if (character < 0 || character > 0x10FFFF) character = kReplacement;
+    return character < kAsciiCount ? asciiProperties()[static_cast<std::size_t>(character)]
+                                   : propertiesInTable(character);
 }
 
 std::int32_t decodeFront(std::string_view text, std::size_t& size) {
