@@ -11,48 +11,23 @@
 #include <exception>
 #include <memory>
 #include <new>
-#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
 #include <vector>
 
 #include <olvane/kin/Family.h>
-#include <olvane/kin/FamilyDataSource.h>
-#include <olvane/kin/PersonIndex.h>
 #include <olvane/source/FamilyGedcom.h>
 
+#include "HeldFamily.h"
 #include "JsonText.h"
 #include "LayoutAnswer.h"
-#include "PictureRequest.h"
 #include "SearchJson.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
 namespace {
-
-// A family, with what is made of it when somebody first asks: itself as a data source, and its index.
-struct HeldFamily {
-    Family table;
-    std::shared_ptr<OlvaneViewerManagerWrapProtocol> source{};
-    std::optional<kin::PersonIndex> personIndex{};
-
-    const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& asSource() {
-        if (!source) source = std::make_shared<FamilyDataSource>(table);
-        return source;
-    }
-
-    const kin::PersonIndex& index() {
-        if (!personIndex) personIndex.emplace(table);
-        return *personIndex;
-    }
-
-    void forgetWhatWasMade() {
-        source.reset();  // which shares the table's rows
-        personIndex.reset();
-    }
-};
 
 // Columns on their way in. JavaScript gives each a place to be written to, which lives as long as this object.
 struct ColumnsInMaking {
@@ -456,12 +431,4 @@ js::LayoutAnswer* familyLayout(HeldFamily* family, int view, double focus, int w
     } catch (const std::bad_alloc&) {
         return nullptr;
     }
-}
-
-// As gedcom_picture, of a person by id.
-OLVANE_EXPORT("family_picture") std::vector<double>* familyPicture(HeldFamily* family, std::int32_t focus) {
-    return js::pictureAnswer([&] {
-        const charts::ViewRequest view = js::requestOf(0).view;
-        return charts::pictureOf(family->table, focus, view, std::int64_t{view.chart.to} + 1);
-    });
 }

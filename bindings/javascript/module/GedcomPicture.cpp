@@ -3,11 +3,6 @@
 
 // Pictures of an open GEDCOM file, and of a host in JavaScript, as runs of numbers.
 
-#include <cstddef>
-#include <exception>
-#include <functional>
-#include <memory>
-#include <stdexcept>
 #include <string>
 #include <utility>
 #include <vector>
@@ -24,20 +19,6 @@
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
-
-std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make) {
-    try {
-        const picture::Picture picture = make();
-        auto numbers = std::make_unique<std::vector<double>>(numbersOf(picture));
-        lastText = textsOf(picture);
-        return numbers.release();
-    } catch (const std::length_error&) {
-        lastText = "too large";
-    } catch (const std::exception& error) {
-        lastText = error.what();
-    }
-    return nullptr;
-}
 
 namespace {
 
@@ -74,16 +55,4 @@ OLVANE_EXPORT("host_picture") std::vector<double>* hostPicture(std::int32_t focu
 
 OLVANE_EXPORT("picture_status") int pictureStatus() {
     return js::lastStatus;
-}
-
-OLVANE_EXPORT("picture_numbers") const double* pictureNumbers(const std::vector<double>* answer) {
-    return answer->data();
-}
-
-OLVANE_EXPORT("picture_count") std::size_t pictureCount(const std::vector<double>* answer) {
-    return answer->size();
-}
-
-OLVANE_EXPORT("picture_free") void pictureFree(std::vector<double>* answer) {
-    delete answer;
 }

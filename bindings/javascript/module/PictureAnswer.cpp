@@ -5,10 +5,17 @@
 
 #include "PictureAnswer.h"
 
+#include <cstddef>
+#include <exception>
 #include <initializer_list>
+#include <memory>
+#include <stdexcept>
 #include <utility>
 
 #include "JsonText.h"
+#include "OpenFile.h"
+
+#define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
 namespace {
@@ -100,4 +107,30 @@ std::vector<double> numbersOf(const picture::Picture& picture) {
     return numbers;
 }
 
+std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make) {
+    try {
+        const picture::Picture picture = make();
+        auto numbers = std::make_unique<std::vector<double>>(numbersOf(picture));
+        lastText = textsOf(picture);
+        return numbers.release();
+    } catch (const std::length_error&) {
+        lastText = "too large";
+    } catch (const std::exception& error) {
+        lastText = error.what();
+    }
+    return nullptr;
+}
+
 }  // namespace olvane::js
+
+OLVANE_EXPORT("picture_numbers") const double* pictureNumbers(const std::vector<double>* answer) {
+    return answer->data();
+}
+
+OLVANE_EXPORT("picture_count") std::size_t pictureCount(const std::vector<double>* answer) {
+    return answer->size();
+}
+
+OLVANE_EXPORT("picture_free") void pictureFree(std::vector<double>* answer) {
+    delete answer;
+}

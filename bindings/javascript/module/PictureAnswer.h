@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -17,5 +18,8 @@ std::vector<double> numbersOf(const picture::Picture& picture);
 
 // The words of a kinship as a JSON array: those of the focus, of the other person, and of each way.
 std::string textsOf(const picture::Picture& picture);
+
+// The numbers of the picture that make gives, with its words in last_text; null where it failed, and last_text says why.
+std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make);
 
 }  // namespace olvane::js

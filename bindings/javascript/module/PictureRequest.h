@@ -3,9 +3,6 @@
 
 #pragma once
 
-#include <functional>
-#include <vector>
-
 #include <olvane/charts/Views.h>
 #include <olvane/source/GedcomDataSource.h>
 
@@ -24,8 +21,5 @@ struct PictureRequest {
 PictureRequest requestOf(kin::Place focus);
 
 picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked);
-
-// The numbers of the picture that make gives, with its words in last_text; null where it failed, and last_text says why.
-std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make);
 
 }  // namespace olvane::js
