@@ -22,6 +22,7 @@ const { values } = parseArgs({
 if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
 
 const kBinding = process.env.OLVANE_JAVASCRIPT ?? here("../../bindings/javascript");
+const { lettersOf, packedLzma } = await import(`${kBinding}/package/packing.mjs`);
 
 // One script with all that it imports. settings are esbuild's.
 async function bundled(entry, settings) {
@@ -40,6 +41,7 @@ async function bundled(entry, settings) {
         define: { "import.meta.url": '"data:,"', ...settings.define },
         alias: {
             olvane: `${kBinding}/olvane.mjs`,
+            "olvane-unpack": `${kBinding}/package/unpack.mjs`,
             // The page moves things by itself, so most of what zooming could do beside that stays out.
             "d3-transition": here("src/scene/noTransition.ts"),
             "d3-interpolate": here("src/scene/noInterpolation.ts"),
@@ -49,19 +51,17 @@ async function bundled(entry, settings) {
 }
 
 // What would end the element early may stand in a script only as an escape.
-async function bundledScript() {
+async function bundledScript(entry) {
     const plugins = [styleText, withoutTables];
-    return (await bundled("src/main.ts", { format: "iife", define: { kReadingScript }, plugins })).replaceAll(
-        "</script",
-        "<\\/script",
-    );
+    const script = await bundled(entry, { format: "iife", define: { kReadingScript }, plugins });
+    return script.replaceAll("</script", "<\\/script");
 }
 
 async function writeElement(path, engine) {
     const banner = "// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n";
     const script = await bundled("src/element/package.ts", {
         format: "esm",
-        define: { kPackedModule: JSON.stringify(engine), kReadingScript },
+        define: { kPackedModule: JSON.stringify(lettersOf(packedLzma(engine))), kReadingScript },
     });
     await writeFile(path, banner + script + "\n");
     const packed = gzipSync(script, { level: 9 }).length;
@@ -97,10 +97,10 @@ const kPageStyles = ["colours", "controls", "shell", "map"].map((name) => here(`
 const hashOf = (text) => "'sha256-" + createHash("sha256").update(text).digest("base64") + "'";
 
 // No network at all: what is not listed is refused.
-function policyOf(script, style) {
+function policyOf(start, script, style) {
     return [
         "default-src 'none'",
-        `script-src ${hashOf(script)} 'wasm-unsafe-eval'`,
+        `script-src ${hashOf(start)} ${hashOf(script)} 'wasm-unsafe-eval'`,
         `style-src ${hashOf(style)}`,
         "img-src data: blob:",
         // Large files are read in a worker, and maps are laid out in one.
@@ -114,13 +114,26 @@ function policyOf(script, style) {
 // The worker's script is a text in the page's.
 const kReadingScript = JSON.stringify(await bundled(`${kBinding}/readingWorker.mjs`, { format: "iife" }));
 
-const [script, style] = await Promise.all([bundledScript(), minifiedStyle(...kPageStyles)]);
-const engine = gzipSync(await readFile(values.wasm), { level: 9 }).toString("base64");
-const parts = { policy: policyOf(script, style), style, script, engine };
+const [start, script, style] = await Promise.all([
+    bundledScript("src/start.ts"),
+    bundledScript("src/main.ts"),
+    minifiedStyle(...kPageStyles),
+]);
+const engine = await readFile(values.wasm);
+// All in one, since what is packed together is packed better.
+const whole = [style, script, engine].map((part) => Buffer.from(part));
+const parts = {
+    policy: policyOf(start, script, style),
+    styleSize: whole[0].length,
+    scriptSize: whole[1].length,
+    parts: lettersOf(packedLzma(Buffer.concat(whole))),
+    start,
+};
 const template = await readFile(here("src/page.html"), "utf8");
 const page = template.replace(/\{\{(\w+)\}\}/g, (_, name) => parts[name]);
 await writeFile(values.out, page);
 console.log(
-    `${values.out}: ${page.length} characters (script ${script.length}, style ${style.length}, engine ${engine.length})`,
+    `${values.out}: ${page.length} characters (packed ${parts.parts.length}: style ${whole[0].length}, ` +
+        `script ${whole[1].length}, engine ${engine.length} bytes)`,
 );
 if (values.element) await writeElement(values.element, engine);

@@ -15,7 +15,7 @@ import { createRequire } from "node:module";
 import { join } from "node:path";
 import { fileURLToPath } from "node:url";
 import { parseArgs } from "node:util";
-import { gzipSync } from "node:zlib";
+import { lettersOf, packedLzma } from "./packing.mjs";
 
 const here = (path) => fileURLToPath(new URL(path, import.meta.url));
 const text = { type: "string" };
@@ -48,7 +48,7 @@ async function bundle(entry, file, { format, define = {}, banner = "", globalNam
     });
 }
 
-const kPackedModule = JSON.stringify(gzipSync(await readFile(values.wasm), { level: 9 }).toString("base64"));
+const kPackedModule = JSON.stringify(lettersOf(packedLzma(await readFile(values.wasm))));
 
 async function writePackage(folder, content) {
     await writeFile(join(folder, "package.json"), JSON.stringify(content, null, 4) + "\n");

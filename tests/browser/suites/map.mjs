@@ -9,7 +9,7 @@ import { readFileSync } from "node:fs";
 import { describe, test } from "node:test";
 import { gunzipSync, gzipSync } from "node:zlib";
 import axe from "axe-core";
-import { fileFor, kTwoAtOnce, photograph, sample, visitEmpty, visitFile } from "../support/browser.mjs";
+import { engineIn, fileFor, kTwoAtOnce, photograph, sample, visitEmpty, visitFile } from "../support/browser.mjs";
 import { livingFamily } from "../support/families.mjs";
 
 const command = process.env.OLVANE_COMMAND;
@@ -146,9 +146,8 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
 
     test("browser and command make the same bytes of one family", async () => {
         const { text } = darwins();
-        const engine = gunzipSync(Buffer.from(/id="olvane-engine">([^<]*)</.exec(text)[1], "base64"));
         const { loadOlvane } = await import(`${process.env.OLVANE_SOURCES}/bindings/javascript/olvane.mjs`);
-        const olvane = await loadOlvane(engine);
+        const olvane = await loadOlvane(await engineIn(text));
         const file = olvane.readGedcom(sample("darwin-wedgwood.ged"), "darwin.ged");
         assert.deepEqual(Buffer.from(file.mapIndex()), mapBytes(text));
         file.close();

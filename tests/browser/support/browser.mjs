@@ -52,6 +52,14 @@ export function fileFor(name, content) {
     return path;
 }
 
+/** The module that a page holds. */
+export async function engineIn(page) {
+    const unpack = `${process.env.OLVANE_SOURCES}/bindings/javascript/package/unpack.mjs`;
+    const { bytesOfLetters, unpackLzma } = await import(unpack);
+    const [, style, script, letters] = /id="olvane-parts" data-style="(\d+)" data-script="(\d+)">([^<]*)</.exec(page);
+    return unpackLzma(bytesOfLetters(letters)).slice(Number(style) + Number(script));
+}
+
 /** The page without a family. settings are those of a browser context. */
 export async function visitEmpty(settings = {}, hash = "") {
     return visitFile(process.env.OLVANE_PAGE, settings, hash);

@@ -5,17 +5,17 @@
 // when the first viewer asks for it.
 
 import { loadOlvane, type Olvane } from "olvane";
-import { bytesOfBase64, gunzip } from "../engine/archive";
+import { bytesOfLetters, unpackLzma } from "olvane-unpack";
 import { defineOlvaneTree, OlvaneTree } from "./OlvaneTree";
 
-/** Put in by the build: the module, packed and written as text. */
+/** Put in by the build: the module, packed and written as letters. */
 declare const kPackedModule: string;
 
 let engine: Promise<Olvane> | null = null;
 
 /** The engine that all viewers of the page share. */
 export function sharedEngine(): Promise<Olvane> {
-    engine ??= gunzip(bytesOfBase64(kPackedModule)).then(loadOlvane);
+    engine ??= Promise.resolve(kPackedModule).then((letters) => loadOlvane(unpackLzma(bytesOfLetters(letters))));
     return engine;
 }
 

@@ -25,9 +25,8 @@ export interface EmbeddedFamily {
     readonly hasMap: boolean;
 }
 
-export async function startEngine(): Promise<Olvane> {
-    const packed = document.getElementById("olvane-engine")?.textContent ?? "";
-    return loadOlvane(await gunzip(bytesOfBase64(packed)));
+export function startEngine(): Promise<Olvane> {
+    return loadOlvane(self.olvanePage.engine);
 }
 
 export async function embeddedFamily(): Promise<EmbeddedFamily | null> {

@@ -5,7 +5,6 @@
 // with an engine and a family of its own, and ends with the map.
 
 import { loadOlvane } from "olvane";
-import { bytesOfBase64, gunzip } from "./archive";
 
 /** A GEDCOM text as the page has read it. */
 export interface MapSource {
@@ -15,7 +14,7 @@ export interface MapSource {
 }
 
 interface Order extends MapSource {
-    readonly engine: string; // as it is packed in the page
+    readonly engine: Uint8Array<ArrayBuffer>; // the module
 }
 
 // What the page's parts want to be there when they are loaded, though no worker has it.
@@ -34,14 +33,13 @@ export function serveMap(): void {
 }
 
 async function mapOf({ engine, bytes, name, encoding }: Order): Promise<Uint8Array<ArrayBuffer>> {
-    const olvane = await loadOlvane(await gunzip(bytesOfBase64(engine)));
+    const olvane = await loadOlvane(engine);
     return olvane.readGedcom(bytes, name, { encoding }).mapIndex();
 }
 
 /** In the page. Rejects where there can be no worker, or the map is refused. */
 export function mapInWorker(source: MapSource): Promise<Uint8Array<ArrayBuffer>> {
-    const script = document.querySelector("script:not([type])")?.textContent ?? "";
-    const engine = document.getElementById("olvane-engine")?.textContent ?? "";
+    const { script, engine } = self.olvanePage;
     const address = URL.createObjectURL(new Blob([kPrelude, script], { type: "text/javascript" }));
     const worker = new Worker(address);
     const answer = new Promise<Uint8Array<ArrayBuffer>>((resolve, reject) => {
