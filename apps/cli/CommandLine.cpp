@@ -17,6 +17,7 @@
 #include <cli/Commands.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
+#include <cli/OptionChecks.h>
 #include <cli/PaperOptions.h>
 #include <cli/UsageError.h>
 #include <cli/ViewOptions.h>
@@ -59,9 +60,7 @@ void addFile(CLI::App& command, InputOptions& input) {
 void addListFormat(CLI::App& command, ListFormat& format, const char* help) {
     static const std::map<std::string, ListFormat> kFormats = {
         {"text", ListFormat::text}, {"tsv", ListFormat::tsv}, {"json", ListFormat::json}};
-    command.add_option("--format", format, help)
-        ->transform(CLI::CheckedTransformer(kFormats))
-        ->type_name("text|tsv|json");
+    command.add_option("--format", format, help)->transform(choice(kFormats))->type_name("text|tsv|json");
 }
 
 void addFocus(CLI::App& command, std::string& focus) {
@@ -84,7 +83,7 @@ void addHideLiving(CLI::App& command, HidingOptions& hiding, const std::string& 
         .add_option("--year", hiding.year,
                     "The year that --hide-living counts from; this year if not given, or an earlier one of "
                     "SOURCE_DATE_EPOCH")
-        ->check(CLI::Range(1, 9999))
+        ->check(wholeNumber(1, 9999))
         ->type_name("YEAR");
 }
 
@@ -176,7 +175,7 @@ private:
                 "text: a record for each box on one line, of the views family and pedigree (their default); "
                 "json: the picture with names and dates of the persons (default of the other views); json1: "
                 "the older form of json, of family and pedigree")
-            ->transform(CLI::CheckedTransformer(std::map<std::string, LayoutFormat>{
+            ->transform(choice(std::map<std::string, LayoutFormat>{
                 {"text", LayoutFormat::text}, {"json", LayoutFormat::json}, {"json1", LayoutFormat::json1}}))
             ->type_name("text|json|json1");
         addViewOptions(*layout_, layoutOptions_.request, "default tall");
@@ -198,7 +197,7 @@ private:
         draw_
             ->add_option("--theme", drawOptions_.theme,
                          "Colours: light (default), dark, or print for little ink")
-            ->check(CLI::IsMember({"light", "dark", "print"}))
+            ->check(word({"light", "dark", "print"}))
             ->type_name("light|dark|print");
         draw_->add_option("--title", drawOptions_.title, "Title above the picture; none is drawn without it")
             ->type_name("TEXT");
@@ -211,7 +210,7 @@ private:
                 "What boxes say beside names and years, a list of dates (in full), places, occupation, "
                 "and marriage for its year at the line of the couple")
             ->delimiter(',')
-            ->check(CLI::IsMember({"dates", "places", "occupation", "marriage"}))
+            ->check(word({"dates", "places", "occupation", "marriage"}))
             ->type_name("WHAT,...");
         addHideLiving(*draw_, drawOptions_.hiding);
     }
@@ -272,15 +271,15 @@ private:
                 "--format", kinOptions_.json,
                 "text: what B is to A, then a line for each way (default); json: the ways, how many there "
                 "are, and the kinship coefficient")
-            ->transform(CLI::CheckedTransformer(kFormats))
+            ->transform(choice(kFormats))
             ->type_name("text|json");
         kin_->add_option("--ways", kinOptions_.ways, "The most ways of each sort that are listed; default 50")
-            ->check(CLI::Range(1, 1000000))
+            ->check(wholeNumber(1, 1000000))
             ->type_name("N");
         kin_->add_option(
                 "--language", kinOptions_.language,
                 "Language of the words: en, de or es; that of the environment when not given, or English")
-            ->check(CLI::IsMember({"en", "de", "es"}))
+            ->check(word({"en", "de", "es"}))
             ->type_name("en|de|es");
     }
 
@@ -356,7 +355,7 @@ private:
                     "--photos", pageOptions_.photoSize,
                     "Put photographs into the page, scaled down to so many pixels on the longer side: those "
                     "in the .gdz archive, or in the folder of the file and below it")
-                ->check(CLI::Range(16, 4096))
+                ->check(wholeNumber(16, 4096))
                 ->type_name("SIZE")
                 ->excludes(media);
         needsFile(notes);

@@ -11,6 +11,7 @@
 
 #include <olvane/draw/Sheets.h>
 
+#include <cli/OptionChecks.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -79,11 +80,11 @@ void addPaperOptions(CLI::App& command, PaperOptions& options) {
             "--scale", options.scale,
             "Size of the picture, by its size at 96 px an inch; with --fit, on as many sheets as that "
             "takes, up to 1,000")
-        ->check(CLI::Range(0.01, 100.0))
+        ->check(number(0.01, 100.0))
         ->type_name("S")
         ->group(group);
     command.add_option("--dpi", options.dpi, "Pixels an inch of a .png: 96 when not given, 192 on paper")
-        ->check(CLI::Range(10.0, 2400.0))
+        ->check(number(10.0, 2400.0))
         ->type_name("N")
         ->group(group);
 }

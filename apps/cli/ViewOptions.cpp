@@ -12,6 +12,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include <cli/OptionChecks.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -108,14 +109,14 @@ void addView(CLI::App& command, LayoutRequest& request) {
             "and relatives (the descendants of every ancestor): any number of generations, each person once; "
             "fan: ancestors or descendants in rings; kinship: everybody on the ways to --to; everybody: the "
             "whole connected family")
-        ->transform(CLI::CheckedTransformer(views()))
+        ->transform(choice(views()))
         ->type_name("VIEW");
     command
         .add_option("--generations", request.chart.layout.generations,
                     "Generations, the focus's own included. Of a pedigree 1 to 12, default 5: N generations "
                     "are up to "
                     "2^N - 1 boxes. Of other views, up and down, 2 and more; 0, the default, is all of them")
-        ->check(CLI::NonNegativeNumber)
+        ->check(wholeNumber(0))
         ->type_name("N");
 }
 
@@ -126,17 +127,17 @@ void addReach(CLI::App& command, charts::ChartRequest& chart) {
                                                                          {"right", charts::Direction::right}};
     const std::string group = kDepthGroup;
     command.add_option("--up", chart.up, "Generations above the focus; 0, the default, is all")
-        ->check(CLI::NonNegativeNumber)
+        ->check(wholeNumber(0))
         ->type_name("N")
         ->group(group);
     command.add_option("--down", chart.down, "Generations below the focus; 0, the default, is all")
-        ->check(CLI::NonNegativeNumber)
+        ->check(wholeNumber(0))
         ->type_name("N")
         ->group(group);
     command
         .add_option("--direction", chart.direction,
                     "Where later generations stand: down (default), up, left or right of earlier ones")
-        ->transform(CLI::CheckedTransformer(kDirections))
+        ->transform(choice(kDirections))
         ->type_name("down|up|left|right")
         ->group(group);
 }
@@ -154,13 +155,13 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
                                                                  {"descendants", charts::FanOf::descendants}};
     command
         .add_option("--of", chart.fanOf, "Whom a fan shows in its rings: ancestors (default) or descendants")
-        ->transform(CLI::CheckedTransformer(kFansOf))
+        ->transform(choice(kFansOf))
         ->type_name("ancestors|descendants")
         ->group(group);
     command
         .add_option("--angle", chart.fanAngle,
                     "How far a fan reaches around its middle: 90 to 360 (default) degrees")
-        ->check(CLI::Range(90.0, 360.0))
+        ->check(number(90.0, 360.0))
         ->type_name("DEGREES")
         ->group(group);
 }
@@ -180,13 +181,13 @@ void addKinshipOptions(CLI::App& command, LayoutRequest& request) {
     command
         .add_option("--by", request.chart.ways,
                     "Which ways are shown: by blood, by marriage or both (default)")
-        ->transform(CLI::CheckedTransformer(kChoices))
+        ->transform(choice(kChoices))
         ->type_name("blood|marriage|both")
         ->group(group);
     command
         .add_option("--ways", request.chart.mostWays,
                     "The most ways shown, the nearest first; default 8, 0 for all")
-        ->check(CLI::NonNegativeNumber)
+        ->check(wholeNumber(0))
         ->type_name("N")
         ->group(group);
 }
@@ -200,7 +201,7 @@ void addLanguage(CLI::App& command, kin::Language& language) {
     command
         .add_option("--language", language,
                     "The language of a kinship's words and of remarks; English when not given")
-        ->transform(CLI::CheckedTransformer(kNames))
+        ->transform(choice(kNames))
         ->type_name("en|de|es")
         ->group(kKinshipGroup);
 }
@@ -212,13 +213,21 @@ void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
                     "How many second links to parents may become marks, for fewer crossings; default 0, all "
                     "for all of "
                     "them")
-        ->transform(CLI::Transformer(std::map<std::string, int>{{"all", -1}}).description(""))
+        ->transform(CLI::Validator(
+            [](std::string& text) {
+                const bool isAll = text == "all";
+                if (isAll) text = "-1";
+                return isAll || wholeNumber(0)(text).empty()
+                           ? std::string()
+                           : "'" + text + "' is neither a whole number of 0 or more nor all";
+            },
+            ""))
         ->type_name("N|all")
         ->group(group);
     command
         .add_option("--effort", chart.effort,
                     "0 is quickest; each step more takes up to twice the time; default 1")
-        ->check(CLI::Range(0, 10))
+        ->check(wholeNumber(0, 10))
         ->type_name("N")
         ->group(group);
     command
@@ -242,7 +251,7 @@ void addParents(CLI::App& command, LayoutRequest& request) {
         .add_option("--parents", request.parents.order,
                     "Whose parents come first where somebody is a child of several families: those by birth "
                     "(default), who adopted, or the first in the file")
-        ->transform(CLI::CheckedTransformer(kOrders))
+        ->transform(choice(kOrders))
         ->type_name("birth|adoptive|all-in-order");
 }
 
@@ -251,7 +260,7 @@ void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defa
     command
         .add_option("--boxes", request.boxes,
                     "Form of the boxes: tall (55 by 80) or wide (105 by 40); " + defaults)
-        ->transform(CLI::CheckedTransformer(kForms))
+        ->transform(choice(kForms))
         ->type_name("tall|wide");
 }
 
