@@ -22,7 +22,7 @@ void checkPerson(const kin::KinGraph& graph, kin::Place person) {
 }
 
 bool isLength(float value) {
-    return std::isfinite(value) && value >= 0;
+    return value >= 0 && value <= kLargestSize;
 }
 
 void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
@@ -30,10 +30,7 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
     bool good =
         isLength(sizes.boxWidth) && isLength(sizes.boxHeight) && isLength(sizes.gapX) && isLength(sizes.gapY);
     for (const BoxSize& size : request.boxSizes) good = good && isLength(size.width) && isLength(size.height);
-    if (!good) throw std::invalid_argument("sizes of boxes and gaps must be finite and not negative");
-    if (!std::isfinite(request.aspect) || request.aspect < 0) {
-        throw std::invalid_argument("an aspect must be finite and not negative");
-    }
+    if (!good) throw std::invalid_argument("sizes of boxes and gaps must be between 0 and a million points");
     if (!request.boxSizes.empty() &&
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("there must be one box size for each person");
@@ -105,8 +102,19 @@ const char* nameOf(View view) {
     return "";
 }
 
+void checkRequest(const ChartRequest& request) {
+    if (request.up < 0 || request.down < 0 || request.mostWays < 0) {
+        throw std::invalid_argument("numbers of generations and of ways must not be negative");
+    }
+    if (!std::isfinite(request.aspect) || request.aspect < 0) {
+        throw std::invalid_argument("an aspect must be finite and not negative");
+    }
+    if (!std::isfinite(request.fanAngle)) throw std::invalid_argument("the angle of a fan must be finite");
+}
+
 picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request) {
     checkPerson(graph, request.focus);
+    checkRequest(request);
     checkSizes(graph, request);
     picture::Picture picture = chartWithoutCounts(graph, request);
     picture::countFurtherParents(picture, graph);

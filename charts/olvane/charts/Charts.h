@@ -20,8 +20,9 @@ OLVANE_API const char* nameOf(View view);
 // Units: points. The least x and y of all boxes are 0; lines may reach beyond by what runs around boxes.
 // Holds: the same graph and request give the same picture, byte for byte, on every machine.
 // Fails: std::out_of_range for a focus (in the kinship view, another person) that the graph does not have;
-//        std::invalid_argument for sizes that are negative or not finite, for boxSizes that are neither empty
-//        nor one for each person, and for the views family and pedigree, which the engine makes.
+//        std::invalid_argument for sizes that are not between 0 and kLargestSize, numbers of generations or ways that
+//        are negative, an angle that is not finite, for boxSizes that are neither empty nor one for each
+//        person, and for the views family and pedigree, which the engine makes.
 OLVANE_API picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request);
 
 }  // namespace olvane::charts

@@ -15,7 +15,7 @@ void require(bool condition, const char* cause) {
 }
 
 bool isSize(float size) {
-    return std::isfinite(size) && size >= 0;
+    return size >= 0 && size <= kLargestSize;
 }
 
 template <class Enumeration>
@@ -40,7 +40,8 @@ void checkNumbers(const ChartRequest& chart) {
     require(chart.marks >= -1, "marks is below -1");
     require(chart.effort >= 0 && chart.effort <= 100, "effort is not between 0 and 100");
     require(isSize(sizes.boxWidth) && isSize(sizes.boxHeight) && isSize(sizes.gapX) && isSize(sizes.gapY),
-            "a size is below 0 or not finite");
+            "a size is not between 0 and a million points");
+    require(chart.aspect >= 0 && std::isfinite(chart.aspect), "aspect is below 0 or not finite");
     require(chart.boxSizes.empty(), "boxSizes are for a graph, not for a host");
 }
 

@@ -3,6 +3,7 @@
 
 #include <olvane/charts/SelectionInternal.h>
 
+#include <limits>
 #include <utility>
 
 #include <olvane/charts/NearPersonsInternal.h>
@@ -53,7 +54,9 @@ public:
             ends.push_back(roots.size());
         }
         const int above = static_cast<int>(lineLevels_.size()) - 1;
-        descend(roots, ends, generations == kAllGenerations ? kAllGenerations : generations + above);
+        const bool all =
+            generations == kAllGenerations || generations > std::numeric_limits<int>::max() - above;
+        descend(roots, ends, all ? kAllGenerations : generations + above);
     }
 
     // The children of the families that somebody of the line is a child of.

@@ -30,6 +30,9 @@ enum class View : std::uint8_t {
 // Where later generations stand, seen from earlier ones: below, above, to the left or to the right.
 enum class Direction : std::uint8_t { down, up, left, right };
 
+// No box and no gap may be larger, in points: so places stay exact in whatever chart.
+constexpr float kLargestSize = 1000000;
+
 // The size of a box and the least gaps around it, in points. gapX lies between neighbours of one generation and
 // gapY between generations, whichever way the chart runs.
 struct ChartSizes {

@@ -32,6 +32,11 @@ bool isOfEngine(View view) {
 picture::Picture enginePictureOf(const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& source,
                                  const kin::KinGraph* known, std::int64_t focus, const ViewRequest& request) {
     const LayoutOptions options = layoutOptionsOf(request);
+    const TreeSize& sizes = options.sizes;
+    for (const float size : {sizes.nodeWidth, sizes.nodeHeight, sizes.horzPadding, sizes.vertPadding}) {
+        if (size >= 0 && size <= kLargestSize) continue;
+        throw std::invalid_argument("sizes of boxes and gaps must be between 0 and a million points");
+    }
     const TypedLayout layout = request.chart.view == View::family ? familyLayout(focus, source, options)
                                                                   : pedigreeLayout(focus, source, options);
     picture::LayoutPictureOptions drawn;
@@ -44,7 +49,9 @@ picture::Picture enginePictureOf(const std::shared_ptr<OlvaneViewerManagerWrapPr
 // generations up and down, and cousins and their children beside.
 ReachAround reachOf(const ChartRequest& chart) {
     constexpr int kAll = std::numeric_limits<int>::max();
-    const auto oneMore = [](int generations) { return generations == 0 ? kAll : generations + 1; };
+    const auto oneMore = [](int generations) {
+        return generations == 0 || generations == kAll ? kAll : generations + 1;
+    };
     const bool fanOfDescendants = chart.view == View::fan && chart.fanOf == FanOf::descendants;
     ReachAround reach;
     reach.up = 1;

@@ -22,7 +22,8 @@ struct ViewRequest {
 // The picture of any view, in one call. The engine's two views ask the source, all others the graph; both speak of
 // the same persons, by the same ids.
 //
-// Fails: as chartOf, familyLayout and pedigreeLayout, and with whatever the source throws.
+// Fails: as chartOf, familyLayout and pedigreeLayout, with std::invalid_argument for sizes that are not between 0 and
+//        kLargestSize, and with whatever the source throws.
 OLVANE_API picture::Picture pictureOf(const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& source,
                                       const kin::KinGraph& graph, const ViewRequest& request);
 

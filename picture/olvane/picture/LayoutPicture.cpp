@@ -4,6 +4,7 @@
 #include <olvane/picture/LayoutPicture.h>
 
 #include <algorithm>
+#include <cmath>
 #include <cstddef>
 #include <map>
 #include <set>
@@ -23,6 +24,12 @@ namespace {
 constexpr kin::UnionPlace kNoUnion = -1;
 
 using kin::at;
+
+// As the coordinates are cut, and like them within the range of an int.
+float wholeSize(float size) {
+    constexpr float kGreatest = 2147483520;  // the greatest float below 2^31
+    return size > 0 ? std::trunc(std::min(size, kGreatest)) : 0;
+}
 
 struct FamilyChild {
     Index box = kNone;
@@ -79,8 +86,8 @@ private:
         Box result;
         result.x = box.x;
         result.y = box.y;
-        result.width = static_cast<float>(static_cast<int>(layout_.sizes.nodeWidth));
-        result.height = static_cast<float>(static_cast<int>(layout_.sizes.nodeHeight));
+        result.width = wholeSize(layout_.sizes.nodeWidth);
+        result.height = wholeSize(layout_.sizes.nodeHeight);
         if (isUnknown(box)) {
             result.kind = BoxKind::unknownParent;
             result.sex = box.kind == TypedLayout::BoxKind::unknownFather ? kin::Sex::male : kin::Sex::female;

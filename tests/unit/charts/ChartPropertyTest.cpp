@@ -7,6 +7,7 @@
 
 #include <olvane/charts/Charts.h>
 #include <olvane/picture/Judge.h>
+#include <olvane/picture/PictureJson.h>
 
 #include <algorithm>
 #include <map>
@@ -17,6 +18,7 @@
 
 #include "AnyKin.h"
 #include "PlainCharts.h"
+#include "PlainKinship.h"
 
 using namespace olvane::kin;
 using namespace olvane::charts;
@@ -58,6 +60,8 @@ ChartRequest requestOf(unsigned seed, View view, const KinGraph& graph) {
     request.direction = static_cast<Direction>(choose(4));
     request.spouses = choose(4) != 0;
     request.compact = choose(4) == 0;
+    request.siblings = choose(4) == 0;
+    request.fanOf = static_cast<FanOf>(choose(2));
     return request;
 }
 
@@ -125,10 +129,68 @@ TEST(ChartProperties, showTheVeryPersonsThatThePlainRulesName) {
     });
 }
 
+TEST(ChartProperties, fansAndEverybodyShowTheVeryPersonsThatThePlainRulesName) {
+    forRandomCharts({View::fan, View::everybody},
+                    [](const KinGraph& graph, const ChartRequest& request, const Picture& picture) {
+                        EXPECT_EQ(personsIn(graph, picture),
+                                  request.view == View::fan ? plain::fanPersonsOf(graph, request)
+                                                            : plain::connectedWith(graph, request.focus));
+                    });
+}
+
+// All ways by blood that there are, against a list of every chain; hostile families have too many chains.
+TEST(ChartProperties, kinshipByBloodShowsTheWaysOfTheListOfAllChains) {
+    std::size_t related = 0;
+    for (unsigned seed = 1; seed <= kFamilies; ++seed) {
+        const Chooser choose(seed);
+        const int persons = 2 + choose(30);
+        const KinGraph graph = AnyKin::make(persons, choose(persons), true, choose).graph();
+        ChartRequest request = requestOf(seed, View::kinship, graph);
+        request.ways = WayChoice::blood;
+        request.mostWays = 0;
+        SCOPED_TRACE("family " + std::to_string(seed));
+        std::set<Place> onWays{request.focus, request.to};
+        for (const bool byBlood : {true, false}) {
+            for (const KinWay& way : plain::Kinship(graph).ways(request.focus, request.to, byBlood)) {
+                onWays.insert(way.persons.begin(), way.persons.end());
+                onWays.insert(way.ancestors.begin(), way.ancestors.end());
+            }
+        }
+        const Picture picture = chartOf(graph, request);
+        ASSERT_EQ(personsIn(graph, picture), onWays);
+        related += picture.ways.empty() ? 0 : 1;
+    }
+    EXPECT_GT(related, 20U);
+}
+
+TEST(ChartProperties, aChildStandsInTheNextLevelBelowTheParentsThatItsLineComesFrom) {
+    std::vector<View> views = kRowViews;
+    views.push_back(View::kinship);
+    forRandomCharts(views, [](const KinGraph& graph, const ChartRequest& request, const Picture& picture) {
+        (void)graph;
+        const auto levelAt = [&](auto box) {
+            return levelOf(picture.boxes[static_cast<std::size_t>(box)], request.direction);
+        };
+        std::map<double, int> places;
+        for (std::size_t box = 0; box < picture.boxes.size(); ++box) places[levelAt(box)] = 0;
+        int count = 0;
+        for (auto& [level, place] : places) place = count++;
+        for (const auto& family : picture.families) {
+            for (const auto& line : picture.linesOf(family)) {
+                if (line.child == olvane::picture::kNone) continue;
+                for (const auto parent : picture.parents(family)) {
+                    EXPECT_EQ(places.at(levelAt(line.child)), places.at(levelAt(parent)) + 1);
+                }
+            }
+        }
+    });
+}
+
 TEST(ChartProperties, generationsAreThoseOfThePlainRules) {
     forRandomCharts(
         {View::ancestors, View::descendants},
         [](const KinGraph& graph, const ChartRequest& request, const Picture& picture) {
+            if (request.siblings) return;
             const std::map<Place, int> generations = plain::generationsOf(graph, request);
             std::map<int, std::set<double>> levels;
             for (const Box& box : picture.boxes) {
@@ -176,8 +238,8 @@ TEST(ChartProperties, couplesShareARowAndChildrenOfOneCoupleStandInTheOrderOfThe
 }
 
 TEST(ChartProperties, doNotDependOnTheOrderOfPersonsInTheData) {
-    const std::vector<View> views{View::ancestors, View::descendants, View::hourglass, View::relatives,
-                                  View::fan};
+    const std::vector<View> views{View::near,      View::ancestors, View::descendants, View::hourglass,
+                                  View::relatives, View::fan,       View::kinship};
     for (unsigned seed = 1; seed <= kFamilies; ++seed) {
         const AnyKin family = familyOf(seed);
         std::vector<int> order(static_cast<std::size_t>(family.persons));
@@ -193,6 +255,7 @@ TEST(ChartProperties, doNotDependOnTheOrderOfPersonsInTheData) {
             ChartRequest request = requestOf(seed, view, graph);
             const Picture picture = chartOf(graph, request);
             request.focus = shuffled.placeOf(graph.id(request.focus));
+            request.to = shuffled.placeOf(graph.id(request.to));
             const Picture other = chartOf(shuffled, request);
             ASSERT_EQ(picture.boxes.size(), other.boxes.size());
             for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
@@ -200,6 +263,29 @@ TEST(ChartProperties, doNotDependOnTheOrderOfPersonsInTheData) {
                 ASSERT_EQ(picture.boxes[i].x, other.boxes[i].x);
                 ASSERT_EQ(picture.boxes[i].y, other.boxes[i].y);
             }
+        }
+    }
+}
+
+// Whoever is in the data beside those who are shown, and before them.
+TEST(ChartProperties, doNotDependOnPersonsWhoAreNotConnected) {
+    for (unsigned seed = 1; seed <= kFamilies; ++seed) {
+        const AnyKin family = familyOf(seed);
+        AnyKin more = family;
+        more.persons += 5;
+        more.unions.push_back({{family.persons, family.persons + 1}, {family.persons + 2}});
+        std::vector<int> order(static_cast<std::size_t>(more.persons));
+        std::iota(order.begin(), order.end(), 0);
+        std::rotate(order.begin(), order.end() - 5, order.end());
+        const KinGraph graph = family.graph();
+        const KinGraph larger = more.graph(order);
+        for (int view = static_cast<int>(View::near); view <= static_cast<int>(View::everybody); ++view) {
+            ChartRequest request = requestOf(seed, static_cast<View>(view), graph);
+            const std::string json = olvane::picture::pictureJson(chartOf(graph, request));
+            request.focus = larger.placeOf(graph.id(request.focus));
+            request.to = larger.placeOf(graph.id(request.to));
+            EXPECT_EQ(olvane::picture::pictureJson(chartOf(larger, request)), json)
+                << "family " << seed << ", " << nameOf(request.view);
         }
     }
 }

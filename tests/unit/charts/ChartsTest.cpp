@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <set>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -531,6 +532,78 @@ TEST(AwkwardFamilies, anAdoptedChildHasBothItsParentFamilies) {
     EXPECT_TRUE(drawn.picture.marks.empty());
 }
 
+// In every view and every direction: each person once, nothing that misleads, every relation drawn or marked.
+void expectSoundInEveryView(const KinFamily& family, const std::string& focus, const std::string& other) {
+    const KinGraph& graph = family.graph();
+    for (int view = static_cast<int>(View::near); view <= static_cast<int>(View::everybody); ++view) {
+        for (int choice = 0; choice < 8; ++choice) {
+            ChartRequest request = requestFor(static_cast<View>(view), family[focus]);
+            request.to = family[other];
+            request.direction = static_cast<Direction>(choice % 4);
+            request.fanOf = static_cast<FanOf>(choice / 4);
+            request.compact = choice >= 4;
+            request.siblings = choice >= 4;
+            SCOPED_TRACE(std::string(nameOf(request.view)) + " " + std::to_string(choice));
+            const Picture picture = chartOf(graph, request);
+            const Judgement judged = judge(picture, &graph);
+            EXPECT_EQ(judged.persons, judged.boxes);
+            EXPECT_EQ(judged.overlaps + judged.unjoined + judged.untold.value_or(1) + judged.unmarked, 0U);
+            if (request.view == View::fan) continue;
+            EXPECT_EQ(judged.hits + judged.tracks + judged.touches + judged.slanted, 0U);
+        }
+    }
+}
+
+TEST(AwkwardFamilies, childrenOfOneKnownParentInEveryView) {
+    expectSoundInEveryView(
+        KinFamily{"? + Mutter: A.m B.f", "Vater + ?: C.m", "A + ?: D.f", "Vater + Mutter: E.m"}, "Mutter",
+        "D");
+}
+
+TEST(AwkwardFamilies, coupleOfOneSexInEveryView) {
+    expectSoundInEveryView(KinFamily{"Anna.f + Berta.f: Kind.x(adopted) Zweites.m",
+                                     "Carl.m + Dirk.m: Drittes.f(adopted)", "Zweites + Drittes: Enkel.m"},
+                           "Anna", "Enkel");
+}
+
+TEST(AwkwardFamilies, unknownSexInEveryView) {
+    const KinFamily family{"X.x + Y.x: Z.x W.x", "Z + V.x: U.x"};
+    expectSoundInEveryView(family, "X", "U");
+    const Drawn drawn(family, requestFor(View::descendants, family["X"]));
+    EXPECT_EQ(drawn["X"].sex, Sex::unknown);
+    EXPECT_LT(drawn["X"].x, drawn["Y"].x);
+}
+
+TEST(AwkwardFamilies, parentFamiliesOfEveryKindInEveryView) {
+    const KinFamily family{"Vater + Mutter: Kind.m", "Wahlvater + Wahlmutter: Kind(adopted)",
+                           "Pfleger + Pflegerin: Kind(foster)", "Stiefvater + Mutter: Kind(step)",
+                           "Kind + Frau: Enkel.f"};
+    expectSoundInEveryView(family, "Kind", "Vater");
+    expectSoundInEveryView(family, "Enkel", "Stiefvater");
+    const Drawn drawn(family, requestFor(View::ancestors, family["Kind"]));
+    EXPECT_EQ(drawn.picture.boxes.size(), 8U);
+    std::multiset<ChildKind> kinds;
+    for (const auto& one : drawn.picture.families) kinds.insert(drawn.picture.kinds(one)[0]);
+    EXPECT_EQ(kinds, (std::multiset<ChildKind>{ChildKind::birth, ChildKind::adopted, ChildKind::foster,
+                                               ChildKind::step}));
+}
+
+TEST(AwkwardFamilies, doubleCousinsAndTheirMarriageInEveryView) {
+    expectSoundInEveryView(
+        KinFamily{"A + B: C.m D.m", "E + F: G.f H.f", "C + G: I.m", "D + H: J.f", "I + J: K.m"}, "A", "K");
+}
+
+TEST(AwkwardFamilies, halfSiblingsOfBothParentsInEveryView) {
+    expectSoundInEveryView(
+        KinFamily{"Vater + Erste: A.m", "Vater + Zweite: B.f", "Dritter + Zweite: C.m", "A + B: D.m"},
+        "Vater", "C");
+}
+
+TEST(AwkwardFamilies, ownAncestorInEveryView) {
+    expectSoundInEveryView(KinFamily{"A + B: C.m", "C + D: A"}, "A", "C");
+    expectSoundInEveryView(KinFamily{"Ouroboros + Frau: Ouroboros"}, "Ouroboros", "Frau");
+}
+
 TEST(AwkwardFamilies, twelveHundredSpousesAreDrawn) {
     KinGraphBuilder builder;
     const Place man = builder.addPerson(1, Sex::male);
@@ -597,6 +670,35 @@ TEST(Charts, refuseTheViewsOfTheEngine) {
     const KinFamily family{"Adam + Eva"};
     EXPECT_THROW(chartOf(family.graph(), requestFor(View::family, 0)), std::invalid_argument);
     EXPECT_THROW(chartOf(family.graph(), requestFor(View::pedigree, 0)), std::invalid_argument);
+}
+
+TEST(Charts, refuseNumbersThatMeanNothing) {
+    const KinFamily family{"Adam + Eva"};
+    const auto isRefused = [&](void (*change)(ChartRequest&)) {
+        ChartRequest request = requestFor(View::hourglass, 0);
+        change(request);
+        try {
+            chartOf(family.graph(), request);
+        } catch (const std::invalid_argument&) {
+            return true;
+        }
+        return false;
+    };
+    EXPECT_FALSE(isRefused([](ChartRequest&) {}));
+    EXPECT_TRUE(isRefused([](ChartRequest& request) { request.up = -1; }));
+    EXPECT_TRUE(isRefused([](ChartRequest& request) { request.down = -1; }));
+    EXPECT_TRUE(isRefused([](ChartRequest& request) { request.mostWays = -1; }));
+    EXPECT_TRUE(isRefused([](ChartRequest& request) { request.sizes.gapY = 1.1F * kLargestSize; }));
+    EXPECT_TRUE(isRefused(
+        [](ChartRequest& request) { request.fanAngle = std::numeric_limits<double>::quiet_NaN(); }));
+}
+
+TEST(Charts, takeAsManyGenerationsAsAnIntCanSay) {
+    const KinFamily family{"Opa + Oma: Vater.m Onkel.m", "Vater + Mutter: Ich.m", "Onkel + Tante: Base.f"};
+    ChartRequest request = requestFor(View::relatives, family["Ich"]);
+    const std::size_t all = chartOf(family.graph(), request).boxes.size();
+    request.up = request.down = std::numeric_limits<int>::max();
+    EXPECT_EQ(chartOf(family.graph(), request).boxes.size(), all);
 }
 
 TEST(Charts, refuseSizesThatAreNone) {

@@ -122,10 +122,11 @@ TEST(CheckedPicture, saysWhichOptionIsOutOfItsRange) {
     ViewRequest size = requestFor(View::family);
     size.chart.sizes.gapX = -1;
     ViewRequest view = requestFor(static_cast<View>(10));
-    const std::pair<ViewRequest, std::string> wrong[] = {{angle, "fanAngle is not between 90 and 360"},
-                                                         {up, "up is below 0"},
-                                                         {size, "a size is below 0 or not finite"},
-                                                         {view, "view is none of the views"}};
+    const std::pair<ViewRequest, std::string> wrong[] = {
+        {angle, "fanAngle is not between 90 and 360"},
+        {up, "up is below 0"},
+        {size, "a size is not between 0 and a million points"},
+        {view, "view is none of the views"}};
     for (const auto& [request, cause] : wrong) {
         const CheckedPicture checked = checkedPicture(source(), 3, request);
         EXPECT_EQ(CheckedStatus::invalidArgument, checked.status);

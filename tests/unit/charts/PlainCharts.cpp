@@ -89,6 +89,56 @@ std::set<Place> personsOf(const KinGraph& graph, const ChartRequest& request) {
     if (request.spouses && request.view != View::ancestors) {
         for (const Place person : std::set<Place>(persons)) persons.merge(spousesOf(graph, person));
     }
+    if (request.siblings && request.view != View::relatives) {
+        const std::set<Place> before = persons;
+        for (const auto& [person, distance] : ancestors) {
+            for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
+                const auto children = graph.children(u);
+                const bool isChild = std::find(children.begin(), children.end(), person) != children.end();
+                const auto& two = graph.partners(u);
+                if (isChild && (before.contains(two[0]) || before.contains(two[1]))) {
+                    persons.insert(children.begin(), children.end());
+                }
+            }
+        }
+    }
+    return persons;
+}
+
+std::set<Place> fanPersonsOf(const KinGraph& graph, const ChartRequest& request) {
+    if (request.fanOf == olvane::charts::FanOf::descendants) {
+        ChartRequest descendants = request;
+        descendants.view = View::descendants;
+        return personsOf(graph, descendants);
+    }
+    const auto firstParents = [&graph](Place person) {
+        std::set<Place> parents;
+        if (graph.unionsAsChild(person).empty()) return parents;
+        for (const Place parent : graph.partners(graph.unionsAsChild(person)[0])) {
+            if (parent != kNobody) parents.insert(parent);
+        }
+        return parents;
+    };
+    constexpr int kMostRings = 25;
+    const int most = std::min(limitOf(request.up), kMostRings);
+    std::set<Place> persons;
+    for (const auto& [person, distance] : stepsFrom({{request.focus, 0}}, most, firstParents)) {
+        persons.insert(person);
+    }
+    return persons;
+}
+
+std::set<Place> connectedWith(const KinGraph& graph, Place focus) {
+    std::set<Place> persons{focus};
+    for (bool grown = true; grown;) {
+        const std::size_t before = persons.size();
+        for (const Place person : std::set<Place>(persons)) {
+            persons.merge(parentsOf(graph, person));
+            persons.merge(childrenOf(graph, person));
+            persons.merge(spousesOf(graph, person));
+        }
+        grown = persons.size() > before;
+    }
     return persons;
 }
 
