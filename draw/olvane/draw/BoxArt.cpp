@@ -8,7 +8,9 @@
 #include <olvane/draw/BoxArtInternal.h>
 
 #include <algorithm>
+#include <limits>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include <olvane/draw/SvgTextInternal.h>
@@ -31,21 +33,40 @@ constexpr double kSilhouetteWidth = 44;
 constexpr double kSilhouetteHeight = 40;
 constexpr double kYearsSize = 10.5;
 constexpr double kYearsPitch = 14;
-constexpr double kBadgeHeight = 15;
+constexpr double kDescent = 0.22;  // of letters, in sizes
+constexpr double kMarkInside = 3;  // by which a mark at the edge reaches into its box, where no text goes
+constexpr double kBadgeHeight = kMarkInside + kMarkOutside;
 constexpr double kBadgeSize = 10;
 constexpr double kBadgeInset = 6;
+constexpr double kWideBadgeInset = 2;  // at the foot of a wide box
 constexpr double kFocusBorder = 4;
 constexpr double kCaptionSize = 10.5;
 constexpr double kCaptionPitch = 13;
+constexpr double kCaptionFrame = 5;   // above and below its lines together
+constexpr double kCaptionInside = 1;  // by which a caption reaches into the border of its box
 constexpr std::size_t kMostCaptionLines = 3;
-constexpr double kCaptionOver = 40;  // by which a caption may be wider than its box
-constexpr double kNameGap = 3;       // between lines of a name
+constexpr double kNameGap = 3;  // between lines of a name
 constexpr double kLargestName = 13;
 constexpr double kSmallestName = 10;
 constexpr std::size_t kMostNameLines = 8;
 
 bool isWide(const BoxFrame& box) {
     return box.width > box.height;
+}
+
+// A pill with a title of its own.
+struct Badge {
+    std::string text;
+    std::string title;
+    bool hollow = false;
+    double x = 0;
+
+    double width() const { return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9); }
+};
+
+// On top of a tall box, where the silhouette leaves room, and at the foot of a wide one, beside the years.
+double badgeTopOf(const BoxFrame& box) {
+    return isWide(box) ? box.height - kBadgeHeight - kWideBadgeInset : kBadgeInset;
 }
 
 // What a box leaves for text.
@@ -58,8 +79,20 @@ struct TextRoom {
     double largestName = kLargestName;
     double smallestName = kSmallestName;
     double nameGap = kNameGap;  // between lines of a name
+    double lastLineGap = 3;     // from the last baseline to the bottom
     double yearsSize = kYearsSize;
     double yearsPitch = kYearsPitch;
+    // Text that reaches below `narrowFrom` has no more room than this: badges stand beside it.
+    double narrowWidth = 0;
+    double narrowFrom = std::numeric_limits<double>::infinity();
+
+    // Of a line of years or details, counted from the last one.
+    double widthOfFact(std::size_t fromLast) const {
+        const double below =
+            lastBaseline() - yearsPitch * static_cast<double>(fromLast) + yearsSize * kDescent;
+        return below > narrowFrom ? std::min(narrowWidth, width) : width;
+    }
+    double lastBaseline() const { return bottom - lastLineGap; }
 
     // Two lines of the smallest letters.
     double leastNameHeight() const { return 2 * (smallestName + nameGap); }
@@ -78,12 +111,12 @@ bool isForPaper(const BoxFrame& box) {
 
 TextRoom paperRoomOf(const BoxFrame& box) {
     constexpr double kSide = 5;
-    constexpr double kEdge = 2;
-    TextRoom room{box.width / 2, box.width - 2 * kSide, kEdge, box.height - kEdge, true};
+    const double edge = box.marks.empty() ? 2 : kMarkInside + 1;
+    TextRoom room{box.width / 2, box.width - 2 * kSide, edge, box.height - edge, true};
     if (isWide(box)) {
         room.x = kSide;
         room.centred = false;
-    } else if (box.hasHidden() || box.repeatNumber > 0) {
+    } else if (box.hasHidden() || box.repeatNumber > 0 || box.box->furtherParents > 0) {
         room.top = kBadgeInset + kBadgeHeight;
     }
     const double least = leastNameOf(box);
@@ -92,16 +125,28 @@ TextRoom paperRoomOf(const BoxFrame& box) {
     room.nameGap = 0.06 * least;
     room.yearsSize = std::max(kYearsSize, 0.6 * least);
     room.yearsPitch = room.yearsSize;
+    room.lastLineGap = 0.2 * room.yearsSize;
     return room;
 }
 
-TextRoom textRoomOf(const BoxFrame& box) {
+TextRoom usualRoomOf(const BoxFrame& box) {
     if (isForPaper(box)) return paperRoomOf(box);
     if (isWide(box)) {
         const double left = kInset + kSilhouetteWidth + kInset;
         return {left, box.width - left - kInset, 4, box.height - 5, false};
     }
     return {box.width / 2, box.width - 2 * kInset, 55, box.height - 6, true};
+}
+
+TextRoom textRoomOf(const BoxFrame& box, const std::vector<Badge>& badges) {
+    TextRoom room = usualRoomOf(box);
+    if (!isWide(box) || badges.empty()) return room;
+    room.narrowFrom = badgeTopOf(box);
+    room.narrowWidth = room.width;
+    for (const Badge& badge : badges) {
+        room.narrowWidth = std::min(room.narrowWidth, badge.x - kBadgeInset / 2 - room.x);
+    }
+    return room;
 }
 
 picture::FittedName nameOf(const kin::PersonLabel& label, const TextRoom& room, double height) {
@@ -112,28 +157,26 @@ picture::FittedName nameOf(const kin::PersonLabel& label, const TextRoom& room, 
     return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst, names);
 }
 
-std::vector<std::string> yearLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
-    const Font font{room.yearsSize, false};
-    std::vector<std::string> parts;
-    if (!label.birth.empty()) parts.push_back("* " + cleanText(label.birth));
-    if (!label.death.empty()) parts.push_back("\xE2\x80\xA0 " + cleanText(label.death));
-    if (parts.size() == 2) {
-        const std::string both = parts[0] + "  " + parts[1];
-        if (textWidth(both, font) <= room.width) return {both};
-    }
-    for (std::string& part : parts) part = fitLine(part, font, room.width);
-    return parts;
-}
-
-// Years, then as many details as leave room for two lines of a name.
+// Years in one line if they fit, then as many details as leave room for two lines of a name.
 std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
     const Font font{room.yearsSize, false};
-    std::vector<std::string> lines = yearLinesOf(label, room);
+    std::vector<std::string> years;
+    if (!label.birth.empty()) years.push_back("* " + cleanText(label.birth));
+    if (!label.death.empty()) years.push_back("\xE2\x80\xA0 " + cleanText(label.death));
     const double spare = room.bottom - room.top - room.leastNameHeight();
     const auto most = static_cast<std::size_t>(std::max(0.0, spare / room.yearsPitch));
-    for (const std::string& detail : label.details) {
-        if (lines.size() >= most) break;
-        lines.push_back(fitLine(cleanText(detail), font, room.width));
+    const auto detailsBelow = [&](std::size_t lines) {
+        return std::min(label.details.size(), most - std::min(most, lines));
+    };
+    if (years.size() == 2) {
+        const std::string both = years[0] + "  " + years[1];
+        if (textWidth(both, font) <= room.widthOfFact(detailsBelow(1))) years = {both};
+    }
+    std::vector<std::string> lines = std::move(years);
+    const std::size_t details = detailsBelow(lines.size());
+    for (std::size_t i = 0; i < details; ++i) lines.push_back(cleanText(label.details[i]));
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        lines[i] = fitLine(lines[i], font, room.widthOfFact(lines.size() - 1 - i));
     }
     return lines;
 }
@@ -181,17 +224,18 @@ void appendYears(std::string& svg, const std::vector<std::string>& lines, const 
 
 // Names in the middle of what the years leave.
 void appendTexts(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
-                 const DrawingTheme& theme) {
-    const TextRoom room = textRoomOf(box);
+                 const std::vector<Badge>& badges, const DrawingTheme& theme) {
+    const TextRoom room = textRoomOf(box, badges);
     const std::vector<std::string> years = factLinesOf(label, room);
     const double gap = isForPaper(box) ? 0 : 2;
-    const double namesBottom =
+    const double yearsTop =
         room.bottom - room.yearsPitch * static_cast<double>(years.size()) - (years.empty() ? 0 : gap);
+    const double namesBottom = std::min(yearsTop, room.narrowFrom);
     const double namesHeight = namesBottom - room.top;
     const picture::FittedName names = nameOf(label, room, namesHeight);
     const double used = static_cast<double>(names.lines.size()) * (names.size + room.nameGap);
     appendNames(svg, names, room, room.top + std::max(0.0, (namesHeight - used) / 2), theme);
-    appendYears(svg, years, room, room.bottom - (isForPaper(box) ? 0.2 * room.yearsSize : 3), theme);
+    appendYears(svg, years, room, room.lastBaseline(), theme);
     if (box.text == nullptr) return;
     if (!names.lines.empty()) box.text->addName(names.size);
     if (!years.empty()) box.text->add(room.yearsSize);
@@ -286,16 +330,6 @@ std::string furtherSentence(const picture::Box& box) {
     return joined("Has further parents in ", whole(box.furtherParents), " families, who are not shown");
 }
 
-struct Badge {
-    std::string text;
-    std::string title;
-    bool hollow = false;
-    double x = 0;
-
-    double width() const { return std::max(kBadgeHeight + 3, textWidth(text, {kBadgeSize, true}) + 9); }
-};
-
-// A pill with a title of its own.
 void appendBadgeAt(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
     const std::string_view fill = badge.hollow ? theme.page : theme.badge;
     const std::string_view ink = badge.hollow ? theme.text : theme.badgeText;
@@ -307,44 +341,39 @@ void appendBadgeAt(std::string& svg, double y, const Badge& badge, const Drawing
     svg += "</g>\n";
 }
 
-// On top of a tall box, where the silhouette leaves room, and at the foot of a wide one, beside the years.
-void appendBadge(std::string& svg, const BoxFrame& box, const Badge& badge, const DrawingTheme& theme) {
-    appendBadgeAt(svg, isWide(box) ? box.height - kBadgeHeight - kBadgeInset : kBadgeInset, badge, theme);
-}
-
 // The count of hidden relatives in the right corner; the repeat mark and that of further parents in the left one, or
 // before it in a wide box.
-void appendBadges(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
-                  const DrawingTheme& theme) {
+std::vector<Badge> badgesOf(const BoxFrame& box, bool isLiving) {
+    std::vector<Badge> badges;
     double right = box.width - kBadgeInset;
     if (box.hasHidden()) {
-        Badge badge{hiddenMark(box, label.living), hiddenSentence(box, label.living)};
+        Badge badge{hiddenMark(box, isLiving), hiddenSentence(box, isLiving)};
         badge.x = right - badge.width();
         right = badge.x - kBadgeInset / 2;
-        if (box.text != nullptr) box.text->add(kBadgeSize);
-        appendBadge(svg, box, badge, theme);
+        badges.push_back(std::move(badge));
     }
     double left = kBadgeInset;
-    const auto placeHollow = [&](Badge& badge) {
+    const auto addHollow = [&](const std::string& text, const std::string& title) {
+        Badge badge{text, title, true};
         badge.x = isWide(box) ? right - badge.width() : left;
         right -= badge.width() + kBadgeInset / 2;
         left += badge.width() + kBadgeInset / 2;
+        badges.push_back(std::move(badge));
     };
-    if (box.repeatNumber > 0) {
-        Badge badge{"=" + std::to_string(box.repeatNumber), repeatSentence(box), true};
-        placeHollow(badge);
-        if (box.text != nullptr) box.text->add(kBadgeSize);
-        appendBadge(svg, box, badge, theme);
+    if (box.repeatNumber > 0) addHollow("=" + std::to_string(box.repeatNumber), repeatSentence(box));
+    if (box.box->furtherParents > 0 && !isLiving) {
+        addHollow(std::string(kTwoUp), furtherSentence(*box.box));
     }
-    if (box.box->furtherParents > 0 && !label.living) {
-        Badge badge{std::string(kTwoUp), furtherSentence(*box.box), true};
-        placeHollow(badge);
-        if (box.text != nullptr) box.text->add(kBadgeSize);
-        appendBadge(svg, box, badge, theme);
-    }
+    return badges;
 }
 
-// Side by side in the middle of the upper or lower edge, half outside.
+void appendBadges(std::string& svg, const BoxFrame& box, const std::vector<Badge>& badges,
+                  const DrawingTheme& theme) {
+    for (const Badge& badge : badges) appendBadgeAt(svg, badgeTopOf(box), badge, theme);
+    if (box.text != nullptr && !badges.empty()) box.text->add(kBadgeSize);
+}
+
+// Side by side at the upper or lower edge, mostly outside.
 void appendMarks(std::string& svg, const BoxFrame& box, MarkPlace place, const DrawingTheme& theme) {
     double width = 0;
     std::vector<Badge> badges;
@@ -354,11 +383,12 @@ void appendMarks(std::string& svg, const BoxFrame& box, MarkPlace place, const D
         if (box.text != nullptr) box.text->add(kBadgeSize);
         width += badges.back().width() + (badges.size() > 1 ? kBadgeInset / 2 : 0);
     }
-    double x = (box.width - width) / 2;
+    // In a wide box beside the middle, where the line of a couple leaves that lies sideways.
+    double x = isWide(box) ? kInset : (box.width - width) / 2;
     for (Badge& badge : badges) {
         badge.x = x;
         x += badge.width() + kBadgeInset / 2;
-        appendBadgeAt(svg, (place == MarkPlace::top ? 0 : box.height) - kBadgeHeight / 2, badge, theme);
+        appendBadgeAt(svg, place == MarkPlace::top ? -kMarkOutside : box.height - kMarkInside, badge, theme);
     }
 }
 
@@ -367,18 +397,28 @@ void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& them
     appendMarks(svg, box, MarkPlace::bottom, theme);
 }
 
-// What the person is to the other one of a kinship, on a plate outside the box that touches its edge.
+// From the edge of a box to its caption, which touches the border, or the marks that stand at this edge.
+double captionGapOf(const BoxFrame& box) {
+    const MarkPlace place = box.captionOnTop ? MarkPlace::top : MarkPlace::bottom;
+    const bool hasMarks = std::any_of(box.marks.begin(), box.marks.end(),
+                                      [place](const BoxMark& mark) { return mark.place == place; });
+    return hasMarks ? kMarkOutside + 1 : -kCaptionInside;
+}
+
+// What the person is to the other one of a kinship, on a plate outside the box.
 void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
     if (box.caption.empty()) return;
     const Font font{kCaptionSize, true};
-    const picture::FittedText text = picture::fitText(
-        cleanText(cutText(box.caption)), font, box.width + kCaptionOver - 2 * kInset, kMostCaptionLines);
+    const double lines = (box.captionRoom - captionGapOf(box) - kCaptionFrame) / kCaptionPitch;
+    const auto most = static_cast<std::size_t>(std::clamp<double>(lines, 1, kMostCaptionLines));
+    const picture::FittedText text =
+        picture::fitText(cleanText(cutText(box.caption)), font, box.width + kCaptionOver - 2 * kInset, most);
     double width = 0;
     for (const std::string& line : text.lines) width = std::max(width, textWidth(line, font));
     width += 2 * kInset;
-    const double height = static_cast<double>(text.lines.size()) * kCaptionPitch + 5;
+    const double height = static_cast<double>(text.lines.size()) * kCaptionPitch + kCaptionFrame;
     const double x = (box.width - width) / 2;
-    const double y = box.captionOnTop ? kFocusBorder - height : box.height - kFocusBorder;
+    const double y = box.captionOnTop ? -captionGapOf(box) - height : box.height + captionGapOf(box);
     put(svg, "<rect x=\"", number(x), "\" y=\"", number(y), "\" width=\"", number(width), "\" height=\"",
         number(height), "\" rx=\"6\" fill=\"", theme.focus, "\"/>\n");
     double baseline = y + kCaptionPitch - 1.5;
@@ -453,8 +493,9 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
     if (!isForPaper(box)) appendSilhouette(svg, box, shown.sex, theme);
-    appendTexts(svg, box, shown, theme);
-    appendBadges(svg, box, label, theme);
+    const std::vector<Badge> badges = badgesOf(box, label.living);
+    appendTexts(svg, box, shown, badges, theme);
+    appendBadges(svg, box, badges, theme);
     appendMarks(svg, box, theme);
     appendCaption(svg, box, theme);
     svg += "</g>\n";
@@ -473,7 +514,7 @@ void appendUnknownParentBox(std::string& svg, const BoxFrame& box, const std::st
     const double middleY = isWide(box) ? box.height / 2 : box.height / 2 - 18;
     put(svg, "<path d=\"M", number(middleX - 11), " ", number(middleY), "h22m-11 -11v22\" stroke=\"",
         theme.unknownParent, "\" stroke-width=\"3\" stroke-linecap=\"round\" fill=\"none\"/>\n");
-    const TextRoom room = textRoomOf(box);
+    const TextRoom room = textRoomOf(box, {});
     const double baseline = isWide(box) ? box.height / 2 + 4 : box.height / 2 + 22;
     appendTextLine(svg, room.x, baseline, invitation,
                    {anchorAttribute(room, invitation), {12, false}, theme.quietText});

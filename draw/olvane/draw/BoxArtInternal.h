@@ -11,6 +11,14 @@
 
 namespace olvane::draw {
 
+// How far a caption reaches beyond its box, at most: three lines, and marks between them and the box.
+constexpr double kCaptionReach = 58;
+
+// What a caption is wider than its box, at most.
+constexpr double kCaptionOver = 40;
+// How far a mark at the edge of a box reaches out of it.
+constexpr double kMarkOutside = 12;
+
 // One box of a picture: where it stands, and what is special about it.
 //
 // Units: px.
@@ -25,6 +33,7 @@ struct BoxFrame {
     bool isCommonAncestor = false;  // at the top of a way
     std::string caption;            // what the one of a kinship is to the other; at the lower or upper edge
     bool captionOnTop = false;
+    double captionRoom = kCaptionReach;  // beyond that edge, to the next box with its marks
     // A person with several boxes has a number, the same in each; 0 for everybody else.
     int repeatNumber = 0;
     int repeatCount = 0;
@@ -39,9 +48,6 @@ struct BoxFrame {
 
 // What is said of a person, each text cut to what can be read.
 kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);
-
-// How far a caption reaches beyond its box, at most.
-constexpr double kCaptionReach = 40;
 
 // The definitions that boxes refer to. Once, ahead of all boxes.
 void appendBoxDefinitions(std::string& svg);

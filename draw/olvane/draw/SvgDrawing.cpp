@@ -173,6 +173,21 @@ private:
             frame.caption = picture.focusIs;
         }
         frame.captionOnTop = !frame.caption.empty() && hasLineBelow(picture, *frame.box);
+        if (!frame.caption.empty()) frame.captionRoom = captionRoomOf(*frame.box, frame.captionOnTop);
+    }
+
+    // To the marks of the next box above or below.
+    double captionRoomOf(const picture::Box& box, bool above) const {
+        constexpr double kBeside = kCaptionOver / 2 / Frame::kScale;
+        const auto right = [](const picture::Box& of) { return of.x + static_cast<double>(of.width); };
+        const auto foot = [](const picture::Box& of) { return of.y + static_cast<double>(of.height); };
+        double room = kCaptionReach;
+        for (const picture::Box& other : content_.picture.boxes) {
+            if (right(other) < box.x - kBeside || other.x > right(box) + kBeside) continue;
+            const double distance = above ? box.y - foot(other) : other.y - foot(box);
+            if (distance >= 0) room = std::min(room, distance * Frame::kScale - kMarkOutside);
+        }
+        return room;
     }
 
     void findCommonAncestors() {
