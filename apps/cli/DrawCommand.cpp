@@ -154,6 +154,19 @@ Drawn drawOnSheets(const gedcom::GedcomData& data, const DrawOptions& options) {
     return {std::move(drawn.drawing.sheets), drawn.title};
 }
 
+// An SVG is shown with the fonts of its reader, who may have others; so it is written all the same.
+void warnOfMissingFonts(const std::string& output, const std::vector<draw::SvgPicture>& sheets) {
+    std::string missing;
+    try {
+        missing = missingFonts(sheets);
+    } catch (const UsageError&) {
+        return;  // without the libraries, nothing is known of this machine's fonts
+    }
+    if (missing.empty()) return;
+    printMessage((output == kStandardOutput ? "standard output" : output) + ": " + missing +
+                 "; another machine may show it");
+}
+
 }  // namespace
 
 int runDraw(const DrawOptions& options) {
@@ -163,7 +176,11 @@ int runDraw(const DrawOptions& options) {
     const gedcom::GedcomData data =
         options.shown.needFacts() ? readFileWithFacts(options.input) : readFile(options.input);
     const Drawn drawn = options.paper.onPaper() ? drawOnSheets(data, options) : drawWhole(data, options);
-    if (form != Form::svg) requireFonts(drawn.sheets);
+    if (form == Form::svg) {
+        warnOfMissingFonts(options.output, drawn.sheets);
+    } else {
+        requireFonts(drawn.sheets);
+    }
     if (form == Form::pdf) {
         const double scale = options.paper.onPaper() || options.paper.scale <= 0 ? 1 : options.paper.scale;
         writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, sourceDate()), rules);

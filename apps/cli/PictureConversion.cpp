@@ -10,6 +10,7 @@
 #include <cmath>
 #include <cstdio>
 #include <memory>
+#include <optional>
 #include <stdexcept>
 #include <utility>
 
@@ -93,32 +94,74 @@ int userUnitFor(const std::vector<draw::SvgPicture>& pages, double scale) {
     return std::max(1, static_cast<int>(std::ceil(longest / kLongestPdf)));
 }
 
+// The characters of all fonts together, since a renderer goes on to the next one for what a font lacks.
+class FontCharacters {
+public:
+    FontCharacters() : lib_(renderLibraries()) {
+        FcPattern* const pattern = lib_.FcPatternCreate();
+        lib_.FcConfigSubstitute(nullptr, pattern, FcMatchPattern);
+        lib_.FcDefaultSubstitute(pattern);
+        FcResult result = FcResultMatch;
+        if (FcFontSet* const fonts = lib_.FcFontSort(nullptr, pattern, FcTrue, &characters_, &result)) {
+            lib_.FcFontSetDestroy(fonts);
+        }
+        lib_.FcPatternDestroy(pattern);
+    }
+    FontCharacters(const FontCharacters&) = delete;
+    FontCharacters& operator=(const FontCharacters&) = delete;
+    ~FontCharacters() {
+        if (characters_ != nullptr) lib_.FcCharSetDestroy(characters_);
+    }
+
+    bool has(std::uint32_t character) const {
+        return characters_ != nullptr && lib_.FcCharSetHasChar(characters_, character) != FcFalse;
+    }
+
+private:
+    const RenderLibraries& lib_;
+    FcCharSet* characters_ = nullptr;
+};
+
 int pixels(double length) {
     return std::max(1, static_cast<int>(std::ceil(length)));
 }
 
 }  // namespace
 
-void requireFonts(const std::vector<draw::SvgPicture>& pictures) {
-    const RenderLibraries& lib = renderLibraries();
-    const auto pattern = owned(lib.FcPatternCreate(), lib.FcPatternDestroy);
-    lib.FcConfigSubstitute(nullptr, pattern.get(), FcMatchPattern);
-    lib.FcDefaultSubstitute(pattern.get());
-    FcCharSet* characters = nullptr;
-    FcResult result = FcResultMatch;
-    // All fonts together, since a renderer goes on to the next one for what a font lacks.
-    const auto fonts =
-        owned(lib.FcFontSort(nullptr, pattern.get(), FcTrue, &characters, &result), lib.FcFontSetDestroy);
-    const auto shown = owned(characters, lib.FcCharSetDestroy);
-    const auto hasFont = [&](std::uint32_t c) {
-        return shown != nullptr && lib.FcCharSetHasChar(shown.get(), c) != FcFalse;
+namespace {
+
+// known: up to where characters are taken to have a font, so that nobody asks the libraries.
+std::string missingFontsBeyond(std::uint32_t known, const std::vector<draw::SvgPicture>& pictures) {
+    std::optional<FontCharacters> shown;
+    const auto hasFont = [&shown, known](std::uint32_t character) {
+        if (character <= known) return true;
+        if (!shown) shown.emplace();
+        return shown->has(character);
     };
+    std::vector<MissingScript> missing;
     for (const draw::SvgPicture& picture : pictures) {
-        const std::string missing = missingFontsText(missingScripts(picture.svg, hasFont));
-        if (missing.empty()) continue;
-        throw std::runtime_error(
-            missing + "; install it, or write an .svg, which is shown with the fonts of its reader");
+        for (MissingScript& script : missingScripts(picture.svg, hasFont)) {
+            const bool isListed =
+                std::any_of(missing.begin(), missing.end(),
+                            [&](const MissingScript& other) { return other.script == script.script; });
+            if (!isListed) missing.push_back(std::move(script));
+        }
     }
+    return missingFontsText(missing);
+}
+
+}  // namespace
+
+std::string missingFonts(const std::vector<draw::SvgPicture>& pictures) {
+    constexpr std::uint32_t kLastLatin = 0x024F;
+    return missingFontsBeyond(kLastLatin, pictures);
+}
+
+void requireFonts(const std::vector<draw::SvgPicture>& pictures) {
+    const std::string missing = missingFontsBeyond(0, pictures);
+    if (missing.empty()) return;
+    throw std::runtime_error(missing +
+                             "; install it, or write an .svg, which is shown with the fonts of its reader");
 }
 
 double pngScale(const draw::SvgPicture& picture, double wanted) {

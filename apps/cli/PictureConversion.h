@@ -17,6 +17,10 @@ namespace olvane::cli {
 //
 // Fails: throws UsageError where the libraries are not installed, std::runtime_error where they fail.
 
+// Which letters no font of this machine shows: "no font shows Thai (in Debian: fonts-thai-tlwg)"; empty where there are
+// none. Every font is taken to have Latin letters, so that the libraries are opened for others alone.
+std::string missingFonts(const std::vector<draw::SvgPicture>& pictures);
+
 // Refuses pictures with letters that no font of this machine shows, which would come out as empty boxes.
 // Fails: throws std::runtime_error that names the scripts and packages of Debian that have fonts for them.
 void requireFonts(const std::vector<draw::SvgPicture>& pictures);

@@ -17,6 +17,10 @@ namespace {
 
 }  // namespace
 
+std::string missingFonts(const std::vector<draw::SvgPicture>&) {
+    refuse();
+}
+
 void requireFonts(const std::vector<draw::SvgPicture>&) {
     refuse();
 }

@@ -8,8 +8,10 @@
 
 #include <algorithm>
 #include <utility>
+#include <vector>
 
 #include <olvane/draw/SvgTextInternal.h>
+#include <olvane/picture/MarriageLabels.h>
 #include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
@@ -20,13 +22,15 @@ using picture::cleanText;
 using picture::cutText;
 
 using picture::Family;
+using picture::LabelSide;
 using picture::Line;
 using picture::LineRole;
 
 constexpr double kLineWidth = 1.6;
 constexpr double kBridge = 4;  // px, the radius of a jump
 constexpr double kLabelSize = 9.5;
-constexpr double kLabelLift = 4;  // px, from a marriage line to its label
+constexpr double kLabelRise =
+    picture::kLabelHeight * kLabelSize;  // px, of a digit above the line it stands on
 
 LineStyle styleOf(kin::UnionState state) {
     switch (state) {
@@ -62,7 +66,9 @@ class FamilyPen {
 public:
     FamilyPen(SvgPicture& svg, const DrawingContent& content, const DrawingOptions& options,
               const Frame& frame)
-        : svg_(svg), content_(content), picture_(content.picture), options_(options), frame_(frame) {}
+        : svg_(svg), content_(content), picture_(content.picture), options_(options), frame_(frame) {
+        if (content.familyLabelOf) labelPlaces_ = marriageLabelPlaces(picture_, kLabelSize / Frame::kScale);
+    }
 
     LineStylesUsed drawAll() {
         put(svg_.svg, "<g fill=\"none\" stroke=\"", options_.theme->line, "\" stroke-width=\"",
@@ -144,25 +150,21 @@ private:
         }
     }
 
-    // Over the first piece of marriage that lies flat, in page colour around, so that lines below do not show.
+    // In page colour around, so that lines below do not show.
     void appendLabel(const Family& family) {
         if (!content_.familyLabelOf || family.number == 0) return;
-        const auto lines = picture_.linesOf(family);
-        const auto marriage = std::find_if(lines.begin(), lines.end(), [](const Line& line) {
-            return line.role == LineRole::marriage && line.y1 == line.y2 && line.x1 != line.x2;
-        });
-        const auto upright = std::find_if(lines.begin(), lines.end(),
-                                          [](const Line& line) { return line.role == LineRole::marriage; });
+        const auto& place = labelPlaces_[static_cast<std::size_t>(&family - picture_.families.data())];
         const std::string text = cleanText(cutText(content_.familyLabelOf(family.number)));
-        if (text.empty() || upright == lines.end()) return;
-        const bool isFlat = marriage != lines.end();
-        const Line& line = isFlat ? *marriage : *upright;
-        const double x = (frame_.x(line.x1) + frame_.x(line.x2)) / 2 + (isFlat ? 0 : kLabelLift);
-        const double y =
-            (frame_.y(line.y1) + frame_.y(line.y2)) / 2 - (isFlat ? kLabelLift : -kLabelSize / 3);
+        if (text.empty() || place.side == LabelSide::none) return;
+        const bool isBeside = place.side == LabelSide::right;
+        constexpr double kLift = picture::kLabelGap * kLabelSize;
+        const double x = frame_.x(place.x) + (isBeside ? kLift : 0);
+        const double y = frame_.y(place.y) + (isBeside                         ? kLabelSize / 3
+                                              : place.side == LabelSide::above ? -kLift
+                                                                               : kLift + kLabelRise);
         svg_.text.add(kLabelSize);
         put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\"",
-            (isFlat ? " text-anchor=\"middle\"" : ""), " font-size=\"", number(kLabelSize), "\" fill=\"",
+            (isBeside ? "" : " text-anchor=\"middle\""), " font-size=\"", number(kLabelSize), "\" fill=\"",
             options_.theme->quietText, "\" stroke=\"", options_.theme->page,
             "\" stroke-width=\"3\" paint-order=\"stroke\">", Escaped{text}, "</text>");
     }
@@ -187,6 +189,7 @@ private:
     const picture::Picture& picture_;
     const DrawingOptions& options_;
     const Frame& frame_;
+    std::vector<picture::LabelPlace> labelPlaces_;  // of each family, where labels are asked for
     LineStylesUsed used_{};
 };
 
