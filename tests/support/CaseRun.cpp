@@ -9,6 +9,7 @@
 #include <support/GraphText.h>
 
 #include <olvane/boundary/HostText.h>
+#include <olvane/boundary/TypedLayoutWriterInternal.h>
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>

@@ -14,7 +14,6 @@
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/boundary/ViewerGlue.h>
 #include <olvane/graph/TreeViewPerson.h>
-#include <olvane/layouter/LineRecord.h>
 #include <olvane/layouter/TreeViewLayouter.h>
 
 namespace olvane {
@@ -87,12 +86,6 @@ struct ResultBounds {
 // Fails: std::out_of_range for a person of an unknown key, before anything is written, and for a person of
 //        negative id without a record of an unknown parent, behind its segments.
 OLVANE_API TreeViewPerson::Visitor resultWriter(ViewerGlue& glue, ResultBounds& bounds, std::string& text);
-
-// Fills the typed layout, and its text too if asked to, from a layouter that has run with this record.
-// Fails: as resultWriter, with what was written so far in the result.
-OLVANE_API void writeTypedLayout(SharedTreeViewer::TreeViewLayouter& layouter, ViewerGlue& glue,
-                                 const SharedTreeViewer::LineRecord& record, bool withText,
-                                 TypedLayout& result);
 
 // Does the work and swallows whatever it throws: the caller is left with what was written so far.
 template <class Work>

@@ -13,7 +13,7 @@
 #include <olvane/boundary/LayoutPieces.h>
 
 #include <olvane/boundary/DecimalInternal.h>
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
 
 #include <cstddef>
 #include <cstring>

@@ -12,10 +12,10 @@
 #include <string>
 
 #include <olvane/boundary/LayoutPieces.h>
+#include <olvane/boundary/TypedLayoutWriterInternal.h>
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
-#include <olvane/graph/WholePoint.h>
-#include <olvane/layouter/LineRecord.h>
+#include <olvane/graph/WholePointInternal.h>
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
 namespace olvane {

@@ -20,8 +20,9 @@
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/graph/PersonWalksInternal.h>
-#include <olvane/graph/WholePoint.h>
-#include <olvane/layouter/LineCourse.h>
+#include <olvane/graph/WholePointInternal.h>
+#include <olvane/layouter/LineCourseInternal.h>
+#include <olvane/layouter/LineRecordInternal.h>
 
 #include <span>
 #include <utility>

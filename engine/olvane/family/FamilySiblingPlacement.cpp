@@ -11,7 +11,7 @@
 // start from unlike distances, and each difference below shows in hosts' pictures.
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
 
 #include <algorithm>
 

@@ -9,6 +9,7 @@
 
 #include <olvane/family/FamilyTraversalInternal.h>
 #include <olvane/layouter/AncestorStackingInternal.h>
+#include <olvane/layouter/DirectLineInternal.h>
 
 namespace SharedTreeViewer {
 

@@ -14,7 +14,7 @@
 
 #include <olvane/family/TreeViewFamilyLayouter.h>
 #include <olvane/graph/PersonWalksInternal.h>
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
 
 #include <algorithm>
 

@@ -11,6 +11,7 @@
 #include <olvane/family/TreeViewFamilyLayouter.h>
 
 #include <olvane/family/FamilyOptions.h>
+#include <olvane/layouter/LineRecordInternal.h>
 
 #include <utility>
 

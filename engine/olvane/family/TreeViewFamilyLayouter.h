@@ -8,7 +8,6 @@
 
 #include <olvane/Export.h>
 #include <olvane/detail/KeySet.h>
-#include <olvane/layouter/DirectLine.h>
 #include <olvane/layouter/TreeViewLayouter.h>
 
 namespace SharedTreeViewer {

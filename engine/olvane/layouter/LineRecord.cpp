@@ -6,7 +6,7 @@
 // A spouse is numbered after the person that it hangs from, and a mother after the father, so the parent with
 // the greater number has hardly ever a second family: the search for a family looks at one.
 
-#include <olvane/layouter/LineRecord.h>
+#include <olvane/layouter/LineRecordInternal.h>
 
 #include <algorithm>
 #include <utility>

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <boost/function.hpp>
 #include <boost/make_shared.hpp>
 #include <boost/unordered_map.hpp>
 
@@ -16,12 +17,17 @@
 #include <olvane/detail/Arena.h>
 #include <olvane/graph/TreeViewGenerationEdge.h>
 #include <olvane/graph/TreeViewPerson.h>
-#include <olvane/layouter/LineRecord.h>
 #include <olvane/layouter/TreeSize.h>
 
 namespace SharedTreeViewer {
 
+class LineRecord;
+
 typedef boost::unordered_map<std::string, bool> OptionMap;
+
+// Called with each person on a line of descent: the person, whether it has neighbours to hang from, and a walk
+// over those neighbours. With false the walk is empty and must not be called.
+typedef boost::function<void(TreeViewPerson&, bool, const TreeViewPerson::Iterator&)> DirectLineVisitor;
 
 // What the layouters of all views share: the focus person, from whom the whole graph hangs, the options, the
 // sizes, the way to the data, the record of who has been admitted, the growth of the graph, and a few
@@ -52,7 +58,8 @@ public:
     // Visits each person of the finished graph once, in the order of the result.
     virtual void graphIterator(const Visitor& visitor) = 0;
 
-    // From now on what each line is for is recorded too. The record must outlive layoutForFocusNID.
+    // For the typed layout: from now on what each line is for is recorded too. The record must outlive
+    // layoutForFocusNID.
     void recordLinesIn(LineRecord& record) { lineRecord = &record; }
 
     // The option's value, or the default where the key is absent. Never enters the key.

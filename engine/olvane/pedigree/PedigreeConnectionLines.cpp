@@ -17,7 +17,9 @@
 
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
+#include <olvane/layouter/LineCourseInternal.h>
+#include <olvane/layouter/LineRecordInternal.h>
 
 #include <algorithm>
 #include <cstdint>

@@ -8,8 +8,10 @@
 #include <olvane/pedigree/TreeViewPedigreeLayouter.h>
 
 #include <olvane/graph/PersonWalksInternal.h>
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
 #include <olvane/layouter/AncestorStackingInternal.h>
+#include <olvane/layouter/DirectLineInternal.h>
+#include <olvane/layouter/LineRecordInternal.h>
 
 #include <cmath>
 #include <cstdint>

@@ -7,11 +7,11 @@
 #include <vector>
 
 #include <olvane/Export.h>
-#include <olvane/layouter/DirectLine.h>
-#include <olvane/layouter/LineCourse.h>
 #include <olvane/layouter/TreeViewLayouter.h>
 
 namespace SharedTreeViewer {
+
+class LineCourse;
 
 // The pedigree view: a chart lying on its side. The focus stands at the left with its spouses below it and
 // its children in a column to its left; to its right one column for each generation of preferred ancestors,

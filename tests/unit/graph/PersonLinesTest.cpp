@@ -11,7 +11,7 @@
 #include <gtest/gtest.h>
 
 #include <olvane/graph/TreeViewPerson.h>
-#include <olvane/graph/WholePoint.h>
+#include <olvane/graph/WholePointInternal.h>
 #include <unit/graph/Visits.h>
 
 namespace {
