@@ -40,8 +40,8 @@ static int male(void* context, int64_t person, int32_t* sex) {
 }
 
 int main(void) {
-    const olvane_host host = {sizeof host, NULL, no_parent, no_parent, no_list, no_list,
-                              not_preferred, alive,     no_date,   male};
+    const olvane_host host = {sizeof host, NULL,          no_parent, no_parent, no_list,
+                              no_list,     not_preferred, alive,     no_date,   male};
     olvane_layout* layout = NULL;
     int code = 0;
     const olvane_status status = olvane_layout_family(&host, 17, NULL, &layout);

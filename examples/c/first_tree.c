@@ -113,8 +113,8 @@ static void draw(const olvane_record* boxes, size_t count, FILE* svg) {
 }
 
 int main(void) {
-    const olvane_host host = {sizeof host, NULL, father_of, mother_of, spouses_of, children_of, is_preferred_spouse,
-                              is_dead, date_of,   sex_of};
+    const olvane_host host = {sizeof host,         NULL,    father_of, mother_of, spouses_of, children_of,
+                              is_preferred_spouse, is_dead, date_of,   sex_of};
     const olvane_record* boxes = NULL;
     size_t count = 0;
     olvane_layout* layout = NULL;

@@ -64,8 +64,8 @@ static int sex_of(void* context, int64_t person, int32_t* sex) {
 
 int main(void) {
     int questions = 0;
-    olvane_host host = {sizeof host, &questions,          father_of, knows_no_parent, spouses_of, children_of,
-                        is_preferred_spouse, is_dead,   date_of,         sex_of};
+    olvane_host host = {sizeof host, &questions,          father_of, knows_no_parent, spouses_of,
+                        children_of, is_preferred_spouse, is_dead,   date_of,         sex_of};
     const olvane_record* records = NULL;
     size_t count = 0;
     const char* text = NULL;
