@@ -9,7 +9,7 @@ import { test } from "node:test";
 
 import { olvane } from "./module.mjs";
 
-const fixture = JSON.parse(await readFile(new URL("../unit/kin/data/search.json", import.meta.url)));
+const fixture = JSON.parse(await readFile(new URL("../fixtures/search.json", import.meta.url)));
 
 function tableOf(persons) {
     const names = persons.flatMap(({ id, names }) => names.map(([kind, text]) => ({ person: id, kind, text })));

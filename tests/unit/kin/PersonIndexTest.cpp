@@ -21,7 +21,7 @@ using nlohmann::json;
 namespace {
 
 const json& fixture() {
-    static const json kFixture = json::parse(std::ifstream(OLVANE_SEARCH_FIXTURE));
+    static const json kFixture = json::parse(std::ifstream(OLVANE_FIXTURES "/search.json"));
     return kFixture;
 }
 
