@@ -9,9 +9,11 @@
 #include <functional>
 #include <limits>
 #include <memory>
+#include <mutex>
 #include <new>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "FamilyInternal.h"
@@ -46,8 +48,11 @@ struct olvane_picture {
     std::vector<olvane_picture_piece> wayPieces;
     std::string focusIs;
     std::string otherIs;
-    std::string json;
     std::string failure;
+
+    olvane::picture::Picture source;  // of which the text is made at the first question
+    mutable std::mutex guard;
+    mutable std::string json;
 };
 
 namespace {
@@ -114,7 +119,7 @@ void fillKinship(const picture::Picture& from, olvane_picture& to) {
     });
 }
 
-void fill(const picture::Picture& from, olvane_picture& to) {
+void fill(picture::Picture from, olvane_picture& to) {
     copyAll(from.boxes, to.boxes, boxOf);
     copyAll(from.families, to.families, familyOf);
     copyAll(from.lines, to.lines, lineOf);
@@ -131,7 +136,7 @@ void fill(const picture::Picture& from, olvane_picture& to) {
     to.middleX = from.middleX;
     to.middleY = from.middleY;
     fillKinship(from, to);
-    to.json = picture::pictureJson(from);
+    to.source = std::move(from);
 }
 
 template <class Entry>
@@ -220,7 +225,7 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
     const std::vector<bool> hidden =
         options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
     picture::hidePersons(hidden, made);
-    fill(made, to);
+    fill(std::move(made), to);
     for (olvane_picture_box& box : to.boxes) box.living = picture::isHidden(hidden, box.id) ? 1 : 0;
 }
 
@@ -350,6 +355,15 @@ olvane_status olvane_picture_read(const olvane_picture* picture, olvane_picture_
 
 olvane_status olvane_picture_json(const olvane_picture* picture, const char** text, size_t* length) {
     if (!picture || !text) return OLVANE_INVALID_ARGUMENT;
+    *text = "";
+    if (length) *length = 0;
+    if (picture->boxes.empty()) return OLVANE_OK;  // after a failure
+    try {
+        const std::lock_guard<std::mutex> lock(picture->guard);
+        if (picture->json.empty()) picture->json = picture::pictureJson(picture->source);
+    } catch (...) {
+        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
+    }
     *text = picture->json.c_str();
     if (length) *length = picture->json.size();
     return OLVANE_OK;
