@@ -322,22 +322,22 @@ export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
 
 export function readGedcomIn(worker, { module }, bytes, name, { encoding = "", onProgress, signal } = {}) {
     return new Promise((done, failed) => {
-        const end = (settle, value) => {
+        const fail = (error) => {
             worker.terminate();
-            settle(value);
+            failed(error);
         };
-        signal?.addEventListener("abort", () => end(failed, signal.reason), { once: true });
-        worker.onerror = (event) => end(failed, new Error(event.message || "the worker could not be started"));
+        signal?.addEventListener("abort", () => fail(signal.reason), { once: true });
+        worker.onerror = (event) => fail(new Error(event.message || "the worker could not be started"));
         worker.onmessage = async ({ data: { part, file, table, memory, refused, message } }) => {
             if (part !== undefined) return onProgress?.(part);
-            if (message !== undefined) return end(failed, refused ? new GedcomError(message) : new Error(message));
+            if (message !== undefined) return fail(refused ? new GedcomError(message) : new Error(message));
             try {
-                end(done, new GedcomFile(await Instance.withMemory(module, memory), file, name, table));
+                done(new GedcomFile(await Instance.withMemory(module, memory), file, name, table));
             } catch (error) {
-                end(failed, error);
+                fail(error);
             }
         };
-        if (signal?.aborted) end(failed, signal.reason);
+        if (signal?.aborted) fail(signal.reason);
         else worker.postMessage({ module, bytes, name, encoding });
     });
 }

@@ -845,7 +845,7 @@ export interface WorkerReadOptions {
 }
 
 /** Lets a worker read files for Olvane.readGedcomIn. Called in the worker, with its global scope. */
-export function serveReading(scope: { onmessage: unknown; postMessage: unknown }): void;
+export function serveReading(scope: { onmessage: unknown; postMessage: unknown; close: unknown }): void;
 
 export class Olvane {
     readonly texts: Texts;
@@ -871,7 +871,7 @@ export class Olvane {
     readGedcom(bytes: Uint8Array, name?: string, options?: { readonly encoding?: string }): GedcomFile;
     /**
      * As readGedcom, in a worker that has called serveReading: the page stays free, hears of progress and may end the
-     * reading. The worker is ended in any case. Rejects with GedcomError for a file that is refused, with the signal's reason
+     * reading. The worker ends by itself. Rejects with GedcomError for a file that is refused, with the signal's reason
      * where it was ended, and with Error where the worker cannot run.
      */
     readGedcomIn(worker: Worker, bytes: Uint8Array, name?: string, options?: WorkerReadOptions): Promise<GedcomFile>;

@@ -491,7 +491,8 @@ export class App implements ChromeActions {
     /** Opens what was kept on an earlier visit. */
     async openKept(): Promise<void> {
         const kept = await keptFile();
-        if (!kept || this.tree.family) return;
+        if (!kept) return this.files.warmUp();
+        if (this.tree.family) return;
         this.isKept = true;
         await this.openDropped([new File([kept.bytes], kept.name)]);
     }

@@ -12,6 +12,8 @@ import { readingWorker } from "../engine/readingWorker";
 import type { UiMessages } from "../messages/ui";
 
 const kLargeFile = 2 ** 20; // bytes; a smaller one is read in less time than a worker takes to start
+const kWarmUpPause = 300; // ms
+const kMadeUp = 1000; // persons
 const kMostBytes = 128 * 2 ** 20; // of a file
 
 /** A file that was read and has somebody in it. */
@@ -33,8 +35,31 @@ export class FileOpening {
         readonly whole: Uint8Array<ArrayBuffer>;
     } | null = null;
 
+    private warmUpTimer = 0;
+    private warmingUp: Promise<void> | null = null;
+
     /** What was read last. */
     source: MapSource | null = null;
+
+    /**
+     * Browsers compile well only what has run for a while, WebKit slowly and beside the page. A made-up family is read and drawn
+     * while nobody waits, so that the first file opens as quickly as later ones.
+     */
+    warmUp(): void {
+        this.warmUpTimer = window.setTimeout(() => {
+            this.warmingUp = this.readMadeUp().catch(() => {
+                // Where no worker can be started the first file takes its time.
+            });
+        }, kWarmUpPause);
+    }
+
+    private async readMadeUp(): Promise<void> {
+        const bytes = new TextEncoder().encode(madeUpGedcom());
+        const file = await this.engine.readGedcomIn(readingWorker(), bytes, "");
+        file.picture(kMadeUp / 4);
+        file.kinshipWords(kMadeUp / 4, [1, 2, kMadeUp / 2]);
+        file.close();
+    }
 
     openEmbedded({ bytes, name, title, photographs }: EmbeddedFamily): OpenedFile {
         return this.read(bytes, name, title, photographs);
@@ -90,6 +115,9 @@ export class FileOpening {
         photographs: Photographs,
         options: WorkerReadOptions,
     ): Promise<OpenedFile> {
+        clearTimeout(this.warmUpTimer);
+        // Two workers at once that compile the same code keep each other from it in WebKit.
+        await this.warmingUp;
         try {
             const file = await this.engine.readGedcomIn(readingWorker(), bytes, name, options);
             const opened = this.checked(file, name, "", photographs);
@@ -114,6 +142,27 @@ export class FileOpening {
         }
         return { file, name, photographs, title: title || name.replace(/\.(ged|gdz|gedcom|zip)$/i, "") };
     }
+}
+
+// Couples of two who follow each other, each with up to four children.
+function madeUpGedcom(): string {
+    const lines = ["0 HEAD", "1 CHAR UTF-8"];
+    for (let i = 0; i < kMadeUp; ++i) {
+        lines.push(`0 @I${i}@ INDI`, `1 NAME Given${i} /Surname${i}/`, `1 SEX ${i % 2 ? "M" : "F"}`);
+        lines.push(
+            "1 BIRT",
+            `2 DATE ${1 + (i % 28)} MAY ${1400 + i}`,
+            `2 PLAC Town ${i}`,
+            "1 DEAT",
+            `2 DATE ABT ${1450 + i}`,
+        );
+        lines.push(`1 FAMS @F${i >> 1}@`, `1 FAMC @F${i >> 2}@`);
+    }
+    for (let i = 0; i < kMadeUp / 2; ++i) {
+        lines.push(`0 @F${i}@ FAM`, `1 HUSB @I${2 * i + 1}@`, `1 WIFE @I${2 * i}@`);
+        for (let child = 4 * i; child < 4 * i + 4; ++child) lines.push(`1 CHIL @I${child}@`);
+    }
+    return lines.join("\n");
 }
 
 class EmptyFileError extends Error {}
