@@ -50,9 +50,11 @@ struct olvane_picture {
     std::string otherIs;
     std::string failure;
 
-    olvane::picture::Picture source;  // of which the text is made at the first question
+    olvane::picture::Picture
+        source;  // of which the text is made at the first question, and a later picture's places
     mutable std::mutex guard;
     mutable std::string json;
+    std::int32_t direction = 0;  // of a view in one call
 };
 
 namespace {
@@ -185,8 +187,16 @@ charts::ViewRequest requestOf(const olvane_picture_options& options) {
     chart.layout = olvane::c::layoutOptionsOf(options.layout);
     chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
                    options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
+    const olvane_picture* earlier = options.earlier;
+    if (earlier && earlier->direction == options.direction && earlier->source.view == "everybody")
+        chart.earlier = &earlier->source;
     request.unknownParents = options.unknown_parents != 0;
     return request;
+}
+
+void fillAsked(picture::Picture from, const olvane_picture_options& options, olvane_picture& to) {
+    fill(std::move(from), to);
+    to.direction = options.direction;
 }
 
 olvane_picture_options chosenOptions(const olvane_picture_options* options) {
@@ -225,7 +235,7 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
     const std::vector<bool> hidden =
         options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
     picture::hidePersons(hidden, made);
-    fill(std::move(made), to);
+    fillAsked(std::move(made), options, to);
     for (olvane_picture_box& box : to.boxes) box.living = picture::isHidden(hidden, box.id) ? 1 : 0;
 }
 
@@ -252,7 +262,7 @@ olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focu
     const olvane_picture_options chosen = chosenOptions(options);
     if (!family || !areInRange(chosen) || chosen.hide_living != 0) return OLVANE_INVALID_ARGUMENT;
     const auto work = [&](olvane_picture& made) {
-        fill(charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other), made);
+        fillAsked(charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other), chosen, made);
     };
     return make(work, picture);
 }
@@ -276,7 +286,8 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
     }
     const auto work = [&](olvane_picture& made) {
         if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
-        fill(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other), made);
+        fillAsked(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other),
+                  chosen, made);
     };
     olvane_status status = OLVANE_NESTED_CALL;
     const auto makeIt = [&] { status = make(work, picture); };

@@ -211,6 +211,10 @@ typedef struct olvane_picture_options {
     int32_t year;        /* the year that hide_living counts from; 0 for the present one */
     olvane_options
         layout; /* the box and the gaps of every view; family, near: shown; pedigree: generations */
+    /* Everybody: an earlier picture of everybody, or null. It is read during the call only. Whoever is in both, by id,
+       stays where that picture has them as far as the change allows; it is not looked at if it is of another view or
+       direction, or if less than half of the family is in it. */
+    const olvane_picture* earlier;
 } olvane_picture_options;
 
 /* Everything at its usual value, as said above, for the view. */

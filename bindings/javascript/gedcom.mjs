@@ -210,6 +210,10 @@ export class GedcomFile {
         return readPicture(this.#instance, options, exports.gedcom_picture(file, focus)) ?? this.#refuse();
     }
 
+    takePlacesOf(earlier) {
+        return this.#instance.exports.gedcom_take_places(this.#opened(), earlier.#opened()) !== 0;
+    }
+
     mapIndex() {
         const { exports } = this.#instance;
         const map = exports.gedcom_map(this.#opened());

@@ -192,8 +192,8 @@ export interface PictureOptions {
     /** Everybody: width by height of the paper that wide generations are folded for; 0 for no paper. */
     aspect?: number | undefined;
     /**
-     * Everybody: keep the places of the last picture of everybody that was made with this option, of this file or of
-     * an earlier version of it whose persons have the same numbers; false.
+     * Everybody: keep the places of the last picture of everybody that was made with this option of this file, or of
+     * the one before it (GedcomFile.takePlacesOf); false.
      */
     keepPlaces?: boolean | undefined;
     /** Family and pedigree: whether unknown parents have boxes; true. */
@@ -667,6 +667,11 @@ export class GedcomFile {
     layoutText(focus: number, options?: Options): string;
     /** The picture of a view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
     picture(focus: number, options?: PictureOptions): Picture;
+    /**
+     * This file is a later version of another, which is open still: its next picture with keepPlaces keeps the places of
+     * the other's last one, for all persons who have the same xref in both. False where there is no such picture.
+     */
+    takePlacesOf(earlier: GedcomFile): boolean;
     /**
      * The picture as the text of an SVG file, byte for byte as olvane draw writes it for the same options; the sizes
      * in options are those of the boxes' form instead. Throws as picture does.

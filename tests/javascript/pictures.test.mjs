@@ -112,7 +112,9 @@ test("everybody keeps the places of the picture before, where that is asked for"
         .replace("0 @F1@ FAM", "0 @I7@ INDI\n1 FAMC @F1@\n0 @F1@ FAM");
     const grown = olvane.readGedcom(new TextEncoder().encode(larger), "larger.ged");
     const options = { view: "everybody", keepPlaces: true };
+    assert.equal(grown.takePlacesOf(file), false);
     const before = placesOf(file.picture(1, options));
+    assert.equal(grown.takePlacesOf(file), true);
     const after = placesOf(grown.picture(1, options));
     assert.equal(after.size, 7);
     const moved = (places) => [...before].filter(([id, place]) => places.get(id) !== place).length;
@@ -120,6 +122,21 @@ test("everybody keeps the places of the picture before, where that is asked for"
     assert.equal(moved(after), 2);
     assert.equal(moved(placesOf(grown.picture(1, { view: "everybody" }))), 4);
     assert.throws(() => file.picture(1, { view: "everybody", aspect: Number.NaN }), RangeError);
+});
+
+test("persons of a later version of a file keep their places by xref, whatever their numbers", () => {
+    const first = family
+        .replace("1 CHIL @I4@\n", "1 CHIL @I7@\n1 CHIL @I4@\n")
+        .replace("0 @I1@ INDI", "0 @I7@ INDI\n1 FAMC @F1@\n0 @I1@ INDI");
+    const grown = olvane.readGedcom(new TextEncoder().encode(first), "larger.ged");
+    assert.deepEqual([grown.persons[0].xref, grown.persons[1].xref], ["I7", "I1"]);
+    const options = { view: "everybody", keepPlaces: true };
+    const before = file.picture(1, options).boxes;
+    grown.takePlacesOf(file);
+    const { boxes } = grown.picture(2, options);
+    const relative = (box, focus) => `${box.x - focus.x} ${box.y - focus.y}`;
+    const moved = before.filter((box, i) => relative(box, before[0]) !== relative(boxes[i + 1], boxes[1]));
+    assert.equal(moved.length, 2);
 });
 
 test("what cannot be asked for is refused by its name", () => {

@@ -8,15 +8,23 @@
 #include <string>
 #include <utility>
 
+#include <olvane/charts/ViewRequest.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Kinship.h>
 #include <olvane/kin/PersonIndex.h>
+#include <olvane/picture/Picture.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomSearchTexts.h>
 
 namespace olvane::js {
+
+// A chart of everybody whose places a later one may keep.
+struct KeptChart {
+    picture::Picture picture;
+    charts::Direction direction = charts::Direction::down;
+};
 
 // A GEDCOM file in the module's memory, with what is made of it when somebody first asks.
 struct OpenFile {
@@ -55,6 +63,7 @@ struct OpenFile {
     gedcom::ParentChoice chosenParents;
     std::optional<kin::KinshipFinder> kinshipFinder;
     std::optional<kin::PersonIndex> personIndex;
+    std::optional<KeptChart> everybody;
 };
 
 // Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for so many.

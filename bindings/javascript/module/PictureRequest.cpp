@@ -7,6 +7,9 @@
 
 #include <cstddef>
 #include <memory>
+#include <new>
+#include <optional>
+#include <string_view>
 #include <vector>
 
 #include <olvane/charts/BoxForm.h>
@@ -86,19 +89,37 @@ PictureRequest requestOf(kin::Place focus) {
 }
 
 picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked) {
-    static picture::Picture kept;
-    static charts::Direction keptDirection = charts::Direction::down;
     gedcom::GedcomDataSource source(file.data, asked.parents);
     const auto limited = std::make_shared<gedcom::LimitedDataSource>(source, kMostRelatives);
     charts::ViewRequest view = asked.view;
-    const bool mayKeep = asked.keepsPlaces && !kept.boxes.empty() && keptDirection == view.chart.direction;
-    if (mayKeep) view.chart.earlier = &kept;
+    std::optional<KeptChart>& kept = file.everybody;
+    if (asked.keepsPlaces && kept && kept->direction == view.chart.direction)
+        view.chart.earlier = &kept->picture;
     picture::Picture picture = charts::pictureOf(limited, file.kin(asked.parents), view);
-    if (asked.keepsPlaces) {
-        kept = picture;
-        keptDirection = view.chart.direction;
-    }
+    if (asked.keepsPlaces) kept = KeptChart{picture, view.chart.direction};
     return picture;
+}
+
+// The file's next chart of everybody keeps the places of the earlier file's last one. Whoever has an xref is the person
+// of that xref there; nobody else is in both. False where there is no such chart.
+bool takePlaces(OpenFile& file, const OpenFile& earlier) {
+    if (!earlier.everybody) return false;
+    file.everybody = earlier.everybody;
+    for (picture::Box& box : file.everybody->picture.boxes) {
+        const auto number = static_cast<std::size_t>(box.id);
+        const bool isPerson = number > 0 && number <= earlier.data.personCount();
+        const std::string_view xref = isPerson ? earlier.data.persons()[number - 1].xref : std::string_view();
+        box.id = xref.empty() ? 0 : file.data.personByXref(xref);
+    }
+    return true;
+}
+
+OLVANE_EXPORT("gedcom_take_places") int gedcomTakePlaces(OpenFile* file, const OpenFile* earlier) {
+    try {
+        return takePlaces(*file, *earlier) ? 1 : 0;
+    } catch (const std::bad_alloc&) {
+        return 0;
+    }
 }
 
 // Room for so many numbers, which JavaScript fills before it asks for a picture.

@@ -14,7 +14,7 @@ namespace olvane::js {
 struct PictureRequest {
     charts::ViewRequest view;
     gedcom::ParentChoice parents;
-    bool keepsPlaces = false;  // everybody: of the last picture that was asked for so
+    bool keepsPlaces = false;  // everybody: of the file's last picture that was asked for so
 };
 
 // What JavaScript last asked of a picture, for a focus.

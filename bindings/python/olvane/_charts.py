@@ -63,6 +63,7 @@ def picture(
     all_parts: bool = False,
     hide_living: bool = False,
     year: int = 0,
+    earlier: Picture | None = None,
 ) -> Picture:
     """The picture of any view around a person, as values: boxes, families with their lines, marks and ways.
 
@@ -76,6 +77,8 @@ def picture(
     - fan_of, fan_angle: whom a fan shows, and how far it reaches, in degrees, 90 to 360.
     - to, by, most_ways (0 for all), language: the other person of a kinship, its ways and its words.
     - marks ("all" for all), effort (0 to 100), all_parts: of everybody.
+    - earlier: an earlier picture of everybody, in the same direction; whoever is in both, by id, stays where it has them
+      as far as the change allows. A copy of a picture keeps nothing.
     - unknown_parents: family and pedigree; boxes for parents who are not known.
     - hide_living, year: of a file; nothing is stated of whoever may be living in the year, 0 for the present one, and
       their boxes say living.
@@ -113,6 +116,11 @@ def picture(
     if hide_living and not isinstance(source, File):
         raise ValueError("hide_living is of a file: a host and a Family say nothing of the years of a life")
     chosen.other = _number(source, to)
+    if earlier is not None and not isinstance(earlier, Picture):
+        raise TypeError(f"earlier is {earlier!r}, and takes a Picture")
+    kept = None if earlier is None else earlier._kept
+    if isinstance(kept, _native_picture.KeptPicture):
+        chosen.earlier = kept.pointer
     return _made(source, _number(source, focus), name, chosen)
 
 
@@ -155,14 +163,12 @@ def _raise_kept(answers: _Answers, status: int) -> None:
 
 def _read(make: Callable[[Any], int], focus: int, view: DrawView) -> Picture:
     made = c_void_p()
-    try:
-        status = make(byref(made))
-        if status != Status.OK:
-            reason = _native_picture.failure_of(made) or _message(status)
-            raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
-        return _native_picture.picture_of(made, view)
-    finally:
-        _native_picture.free(made)
+    kept = _native_picture.KeptPicture(made)
+    status = make(byref(made))
+    if status != Status.OK:
+        reason = _native_picture.failure_of(made) or _message(status)
+        raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
+    return _native_picture.picture_of(made, view, kept if view == "everybody" else None)
 
 
 def _view_name(view: View | DrawView) -> DrawView:

@@ -5,7 +5,7 @@
 from __future__ import annotations
 
 from collections.abc import Callable
-from dataclasses import dataclass
+from dataclasses import dataclass, field
 from enum import IntEnum
 
 from olvane._family import ChildKind, FamilyState
@@ -151,6 +151,8 @@ class Picture:
     ways: tuple[PictureWay, ...] = ()
     rings: tuple[float, ...] = ()
     middle: tuple[float, float] | None = None
+    # Of everybody: what the library keeps of it, for a later picture's places.
+    _kept: object = field(default=None, repr=False, compare=False)
 
     def svg(self, label: Callable[[int], str] = str) -> Svg:
         """A plain drawing; label gives the text of a person's box, and is the id by default."""

@@ -50,6 +50,7 @@ class OptionsStruct(ctypes.Structure):
         ("hide_living", c_int32),
         ("year", c_int32),
         ("layout", _native.OptionsStruct),
+        ("earlier", c_void_p),
     ]
 
 
@@ -169,7 +170,26 @@ def _text(text: bytes | None) -> str:
     return (text or b"").decode("utf-8")
 
 
-def picture_of(made: c_void_p, view: str) -> Picture:
+class KeptPicture:
+    """A picture that the library holds until nobody needs it any more. A copy of a Picture has none."""
+
+    __slots__ = ("pointer",)
+
+    def __init__(self, pointer: c_void_p) -> None:
+        self.pointer = pointer
+
+    def __del__(self) -> None:
+        free(self.pointer)
+
+    def __reduce__(self) -> tuple[Any, tuple[()]]:
+        return _nothing, ()
+
+
+def _nothing() -> None:
+    return None
+
+
+def picture_of(made: c_void_p, view: str, kept: KeptPicture | None = None) -> Picture:
     """All of a picture that the library holds."""
     arrays = _Arrays(struct_size=ctypes.sizeof(_Arrays))
     status = _read(made, byref(arrays))
@@ -188,6 +208,7 @@ def picture_of(made: c_void_p, view: str) -> Picture:
         ways=tuple(_way(arrays, arrays.ways[i]) for i in range(arrays.way_count)),
         rings=tuple(arrays.ring_radii[i] for i in range(arrays.ring_radius_count)),
         middle=(arrays.middle_x, arrays.middle_y) if is_round else None,
+        _kept=kept,
     )
 
 

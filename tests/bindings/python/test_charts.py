@@ -2,6 +2,7 @@
 # SPDX-License-Identifier: MIT
 """Every view as values: what olvane.picture returns is what the command prints, of files, tables and hosts."""
 
+import copy
 import json
 import os
 import pathlib
@@ -228,6 +229,22 @@ class Views(unittest.TestCase):
             if view != "fan":
                 picture = olvane.picture(AWKWARD, 6, view, options, to=2)
                 self.assertEqual({(90, 30)}, {(box.width, box.height) for box in picture.boxes}, view)
+
+    def test_ofEverybodyKeepThePlacesOfAnEarlierOne(self) -> None:
+        rows = {1: (0, 0), 2: (0, 0), 4: (1, 2), 5: (1, 2), 6: (0, 0), 7: (4, 6)}
+        parents = [{"id": person, "father": father, "mother": mother} for person, (father, mother) in rows.items()]
+        before = olvane.picture(olvane.Family(parents), 7, "everybody")
+        grown = olvane.Family([{"id": 9, "father": 1, "mother": 2}, *parents])
+        anew = olvane.picture(grown, 7, "everybody")
+        kept = olvane.picture(grown, 7, "everybody", earlier=before)
+        column = {box.id: box.x - before.boxes[before.focus].x for box in before.boxes}
+        moved = [b.id for b in kept.boxes if b.id in column and b.x - kept.boxes[kept.focus].x != column[b.id]]
+        self.assertEqual([5], moved)  # makes room beside its new sibling
+        self.assertNotEqual(anew.boxes, kept.boxes)
+        self.assertEqual(anew.boxes, olvane.picture(grown, 7, "everybody", earlier=copy.deepcopy(before)).boxes)
+        self.assertEqual(before, copy.deepcopy(before))
+        with self.assertRaisesRegex(TypeError, "takes a Picture"):
+            olvane.picture(grown, 7, "everybody", earlier="before")  # type: ignore[arg-type]
 
     def test_areShownByANotebook(self) -> None:
         for view in VIEWS:

@@ -230,6 +230,63 @@ describe("element", () => {
         await end();
     });
 
+    test("in the chart of everybody those who are there stay in place when somebody is added", async () => {
+        files.set(
+            "/everybody.html",
+            `<!doctype html><olvane-tree view="everybody" focus="7" style="height: 500px"></olvane-tree><script type="module">
+            import { sharedEngine } from "./olvane-tree.mjs";
+            window.olvane = await sharedEngine();
+            const [a, b] = [{ father: 1, mother: 2 }, { father: 4, mother: 6 }];
+            window.persons = [{ id: 1 }, { id: 2 }, { id: 4, ...a }, { id: 5, ...a }, { id: 6 }, { id: 7, ...b }];
+            window.grown = [{ id: 9, ...a }, ...persons];
+            document.querySelector("olvane-tree").data = olvane.family({ persons });
+            </script>`,
+        );
+        const { page, end } = await open("/everybody.html");
+        // How far each box stands from that of the focus, in widths of a box.
+        const places = () =>
+            page.evaluate(() => {
+                const tree = document.querySelector("olvane-tree");
+                const frames = [...tree.shadowRoot.querySelectorAll(".boxes > g[data-xref] .frame")];
+                const areaOf = (frame) => frame.getBoundingClientRect();
+                const focus = areaOf(tree.shadowRoot.querySelector(".box.focus .frame"));
+                return frames.map((frame) => [
+                    frame.closest("g[data-xref]").dataset.xref,
+                    ((areaOf(frame).x - focus.x) / focus.width).toFixed(2),
+                ]);
+            });
+        const shown = (count) =>
+            page.waitForFunction(
+                (boxes) =>
+                    document.querySelector("olvane-tree").shadowRoot.querySelectorAll(".boxes > g").length === boxes,
+                count,
+            );
+        await shown(6);
+        await page.waitForTimeout(500);
+        const before = new Map(await places());
+        await page.evaluate(() =>
+            document
+                .querySelector("olvane-tree")
+                .update(new TextEncoder().encode(olvane.family({ persons: grown }).gedcom())),
+        );
+        await shown(7);
+        await page.waitForTimeout(500);
+        const moved = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
+        assert.deepEqual(
+            moved.map(([xref]) => xref),
+            ["5"],
+        ); // makes room beside its new sibling
+        await page.evaluate(() =>
+            document
+                .querySelector("olvane-tree")
+                .open(new TextEncoder().encode(olvane.family({ persons: grown }).gedcom())),
+        );
+        await page.waitForTimeout(800);
+        const anew = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
+        assert.ok(anew.length > moved.length, `anew ${anew.join("; ")}`);
+        await end();
+    });
+
     test("a family that loses everybody, or that a program no longer shows, breaks nothing", async () => {
         const { page, end } = await open("/own.html");
         await page.waitForSelector("olvane-tree .box.focus");

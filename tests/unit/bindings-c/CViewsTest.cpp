@@ -76,6 +76,38 @@ TEST(CViews, ofATableAreThoseOfTheLibrary) {
     }
 }
 
+TEST(CViews, ofEverybodyKeepsThePlacesOfAnEarlierOne) {
+    const auto family = table();
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_EVERYBODY);
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer before(made);
+    olvane::PersonRow row;
+    row.id = 9;
+    row.father = 1;
+    row.mother = 2;
+    family->table.addPerson(row);
+    const std::int64_t children[] = {9, 3, 5};
+    family->table.setChildren(1, children);
+    family->table.setChildren(2, children);
+    olvane::charts::ViewRequest request;
+    request.chart.view = olvane::charts::View::everybody;
+    const std::string fromScratch =
+        olvane::picture::pictureJson(olvane::charts::pictureOf(family->table, 7, request));
+    const auto drawn = [&](std::int32_t direction) {
+        olvane_picture* later = nullptr;
+        options.direction = direction;
+        EXPECT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &later));
+        return jsonOf(PicturePointer(later));
+    };
+    options.earlier = before.get();
+    EXPECT_NE(drawn(0), fromScratch);
+    const std::string sideways = drawn(3);
+    options.earlier = nullptr;
+    EXPECT_EQ(drawn(0), fromScratch);
+    EXPECT_EQ(drawn(3), sideways);
+}
+
 struct FileDeleter {
     void operator()(olvane_file* file) const { olvane_file_free(file); }
 };

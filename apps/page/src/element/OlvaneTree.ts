@@ -224,6 +224,7 @@ export class OlvaneTree extends HTMLElement {
         if (!opened || !shownState || !OlvaneTree.engine) return this.open(bytes);
         const engine = await OlvaneTree.engine();
         const family = new OpenFamily(engine.readGedcom(bytes, opened.file.name), opened.title, opened.livingHidden);
+        family.file.takePlacesOf(opened.file);
         const address = addressOf(shownState, opened.persons);
         const selected = this.selected?.xref ?? "";
         const state = readAddress(address, family.persons, { ...kUsualState, focus: family.bestFocus() });

@@ -17,6 +17,11 @@ import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
 import { optionsOf, type ViewState } from "./ViewState";
 
+// What is on the screen stays where it is when somebody is added; what is printed is laid out for its paper.
+function keeping(options: PictureOptions): PictureOptions {
+    return options.view === "everybody" ? { ...options, keepPlaces: true } : options;
+}
+
 export class OpenFamily {
     readonly persons: readonly Person[];
     readonly families: readonly Family[];
@@ -39,13 +44,13 @@ export class OpenFamily {
 
     // Throws LayoutError.
     picture(state: ViewState, language: PictureOptions["language"]): Picture {
-        const values = this.file.picture(state.focus, optionsOf(state, language));
+        const values = this.file.picture(state.focus, keeping(optionsOf(state, language)));
         return new Picture(state.view, state.direction, state.focus, values);
     }
 
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
-        return this.file.svg(state.focus, optionsOf(state, language), { theme, show: state.show });
+        return this.file.svg(state.focus, keeping(optionsOf(state, language)), { theme, show: state.show });
     }
 
     sheets(state: ViewState, paper: PaperOptions, language: PictureOptions["language"]): PaperSheets {
