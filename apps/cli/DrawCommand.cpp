@@ -98,30 +98,50 @@ std::string sheetName(const std::string& output, std::size_t sheet, std::size_t 
     return name.str();
 }
 
-std::string pngSheet(const std::string& path, const draw::SvgPicture& sheet, double scale) {
+std::string pngSheet(const std::string& path, const draw::SvgPicture& sheet, double scale,
+                     TerminalProgress& progress) {
     if (pngScale(sheet, scale) < scale) {
+        progress.clear();
         printMessage(path + ": made smaller, since a PNG cannot be that large; .svg and .pdf can");
     }
     return pngOf(sheet, scale);
 }
 
-std::string contentOfSheet(const std::string& path, Form form, const draw::SvgPicture& sheet, double scale) {
-    return form == Form::png ? pngSheet(path, sheet, scale) : sheet.svg;
+std::string contentOfSheet(const std::string& path, Form form, const draw::SvgPicture& sheet, double scale,
+                           TerminalProgress& progress) {
+    return form == Form::png ? pngSheet(path, sheet, scale, progress) : sheet.svg;
+}
+
+// To turn so much text into a PNG or a PDF takes about half a second.
+bool takesLong(const std::vector<draw::SvgPicture>& sheets) {
+    constexpr std::size_t kLargeText = 500'000;
+    std::size_t size = 0;
+    for (const draw::SvgPicture& sheet : sheets) size += sheet.svg.size();
+    return size >= kLargeText;
+}
+
+void reportSheet(std::size_t sheet, std::size_t count, bool isLong, TerminalProgress& progress) {
+    const std::string text = "writing sheet " + std::to_string(sheet) + " of " + std::to_string(count);
+    isLong ? progress.announce(text) : progress.show(text);
 }
 
 // All of them or none: half a wall of sheets is of no use.
 void writeSheets(const DrawOptions& options, Form form, const std::vector<draw::SvgPicture>& sheets,
                  const OutputRules& rules) {
+    TerminalProgress progress;
+    const bool isLong = form == Form::png && takesLong(sheets);
     const double size = options.paper.onPaper() ? 1 : options.paper.scale > 0 ? options.paper.scale : 1;
     const double scale = size * options.paper.pixelsOfPx();
     if (sheets.size() == 1) {
-        return writeOutput(options.output, contentOfSheet(options.output, form, sheets.front(), scale),
-                           rules);
+        if (isLong) progress.announce("writing the PNG");
+        return writeOutput(options.output,
+                           contentOfSheet(options.output, form, sheets.front(), scale, progress), rules);
     }
     OutputSet set(rules);
     for (std::size_t i = 0; i < sheets.size(); ++i) {
         const std::string path = sheetName(options.output, i + 1, sheets.size());
-        set.add(path, contentOfSheet(path, form, sheets[i], scale));
+        reportSheet(i + 1, sheets.size(), isLong, progress);
+        set.add(path, contentOfSheet(path, form, sheets[i], scale, progress));
     }
     set.finish();
 }
@@ -183,6 +203,8 @@ int runDraw(const DrawOptions& options) {
     }
     if (form == Form::pdf) {
         const double scale = options.paper.onPaper() || options.paper.scale <= 0 ? 1 : options.paper.scale;
+        TerminalProgress progress;
+        if (takesLong(drawn.sheets)) progress.announce("writing the PDF");
         writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, sourceDate()), rules);
     } else {
         writeSheets(options, form, drawn.sheets, rules);

@@ -6,13 +6,17 @@
 #include <cli/FileReading.h>
 
 #include <cstddef>
+#include <cstdint>
+#include <filesystem>
 #include <map>
+#include <system_error>
 
 #include <olvane/gedcom/GedcomReader.h>
 
 #include <cli/InputBytes.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
+#include <cli/TerminalProgress.h>
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -45,7 +49,18 @@ void report(const gedcom::GedcomData& data) {
                  " more; '" + command + "' lists them all");
 }
 
+// A file of this size takes about half a second.
+constexpr std::uintmax_t kLargeFile = 32'000'000;
+
+bool isLarge(const std::string& path) {
+    std::error_code noSize;
+    const std::uintmax_t size = std::filesystem::file_size(path, noSize);
+    return !noSize && size >= kLargeFile;
+}
+
 gedcom::GedcomData readSource(const std::string& path, const gedcom::ReadOptions& options) {
+    TerminalProgress progress;
+    if (isLarge(path)) progress.announce("reading the file");
     if (path != kStandardInput) return gedcom::readGedcomFile(path, options);
     return gedcom::readGedcomBytes(readInputBytes(path), inputName(path), options);
 }

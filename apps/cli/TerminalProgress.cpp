@@ -39,7 +39,11 @@ TerminalProgress::TerminalProgress()
       chart_([this](ChartStep step, double share) { show(sentenceOf(step, share)); }) {}
 
 void TerminalProgress::show(const std::string& text) {
-    if (!isTerminal_ || text == shown_ || std::chrono::steady_clock::now() - start_ < kQuick) return;
+    if (std::chrono::steady_clock::now() - start_ >= kQuick) announce(text);
+}
+
+void TerminalProgress::announce(const std::string& text) {
+    if (!isTerminal_ || text == shown_) return;
     std::cerr << "\r\x1B[K" << text << std::flush;
     shown_ = text;
 }

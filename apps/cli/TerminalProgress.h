@@ -23,6 +23,8 @@ public:
 
     // text: of less than 80 columns.
     void show(const std::string& text);
+    // Before one call that is known to take long: also in the first half second.
+    void announce(const std::string& text);
     void clear();
 
     // What shows the steps of a chart; null where there is no terminal. Valid as long as this lives.

@@ -3,7 +3,7 @@
 # SPDX-License-Identifier: MIT
 """Long work shows on a terminal how far it is, in a line that is gone at the end; in a pipe, and of quick work, nothing.
 
-Usage: progress_on_a_terminal.py PATH/TO/olvane GEDCOMFILE
+Usage: progress_on_a_terminal.py PATH/TO/olvane GEDCOMFILE [converts]     converts: it writes PDF
 """
 
 import os
@@ -32,6 +32,12 @@ def made_family():
             below = 200 * (row + 1)
             lines += [f"1 CHIL @I{below + 2 * place}@", f"1 CHIL @I{below + 2 * ((41 * place + 13) % 100) + 1}@"]
     return "\n".join([*lines, "0 TRLR", ""])
+
+
+def large_file():
+    """Mostly a note, since it is the size that takes long."""
+    line = "2 CONT " + 240 * "x" + "\n"
+    return "0 HEAD\n0 @I1@ INDI\n1 NAME A\n1 NOTE\n" + 140_000 * line + "0 TRLR\n"
 
 
 def shown(text):
@@ -72,6 +78,7 @@ def batch_with_a_pause(olvane, file):
 
 def main():
     olvane, small = sys.argv[1:3]
+    converts = "converts" in sys.argv[3:]
     with tempfile.TemporaryDirectory() as folder:
         file = os.path.join(folder, "made.ged")
         with open(file, "w", encoding="utf-8") as made:
@@ -79,6 +86,13 @@ def main():
         everybody = ["--view", "everybody", "--effort", "4"]
         check([olvane, "draw", file, "--focus", "1", "-o", "-", *everybody], [b"ordering rows: ", b"drawing"])
         check([olvane, "layout", file, "--focus", "1", "--format", "json", *everybody], [b"%", b"routing lines"])
+        large = os.path.join(folder, "large.ged")
+        with open(large, "w", encoding="utf-8") as made:
+            made.write(large_file())
+        check([olvane, "layout", large, "--focus", "1"], [b"reading the file"])
+        if converts:
+            drawing = [olvane, "draw", file, "--focus", "1", "--view", "everybody", "--effort", "0"]
+            check([*drawing, "-o", os.path.join(folder, "made.pdf")], [b"writing the PDF"])
     slow = batch_with_a_pause(olvane, small)
     expect(shown(slow)[-1:] == [b"2"] and slow.endswith(CLEAR), f"no count of a batch: {slow!r}")
     quick = on_terminal([olvane, "layout", small, "--focus", "1"])
