@@ -4,6 +4,7 @@
 // bench_charts: what is wrong in the charts of every person of a real GEDCOM file, and how long they take.
 //
 //     bench_charts [VIEW...]      judges and times these views, or all that have rows, of every person
+//     bench_charts --step N       the times alone, of every N-th person: those that peers/royal.mjs has
 //
 // Of each person the least of three times is kept, typed picture included. The file is named by
 // OLVANE_BENCH_GEDCOM, or is history/royal92.ged below the folder that OLVANE_GEDCOM_DIR names.
@@ -84,19 +85,39 @@ ChartRequest requestFor(View view, olvane::kin::Place focus) {
     return request;
 }
 
+// The least of a few rounds, in milliseconds.
+double timeOf(const olvane::kin::KinGraph& graph, const ChartRequest& request, Picture& picture) {
+    double least = std::numeric_limits<double>::infinity();
+    for (int round = 0; round < kRounds; ++round) {
+        const auto start = std::chrono::steady_clock::now();
+        picture = olvane::charts::chartOf(graph, request);
+        const std::chrono::duration<double, std::milli> taken = std::chrono::steady_clock::now() - start;
+        least = std::min(least, taken.count());
+    }
+    return least;
+}
+
+void printTimes(const olvane::kin::KinGraph& graph, olvane::kin::Place step) {
+    for (const View view : {View::ancestors, View::descendants, View::relatives}) {
+        std::vector<double> times;
+        std::size_t most = 0;
+        for (olvane::kin::Place person = 0; person < graph.personCount(); person += step) {
+            Picture picture;
+            times.push_back(timeOf(graph, requestFor(view, person), picture));
+            most = std::max(most, picture.boxes.size());
+        }
+        const double slowest = *std::max_element(times.begin(), times.end());
+        std::printf("| Olvane, %s | %zu | %.4f | %.2f | %zu |\n", olvane::charts::nameOf(view), times.size(),
+                    middleOf(times), slowest, most);
+    }
+}
+
 Totals measure(const olvane::kin::KinGraph& graph, View view) {
     Totals totals;
     for (olvane::kin::Place person = 0; person < graph.personCount(); ++person) {
         const ChartRequest request = requestFor(view, person);
-        double least = std::numeric_limits<double>::infinity();
         Picture picture;
-        for (int round = 0; round < kRounds; ++round) {
-            const auto start = std::chrono::steady_clock::now();
-            picture = olvane::charts::chartOf(graph, request);
-            const std::chrono::duration<double, std::milli> taken = std::chrono::steady_clock::now() - start;
-            least = std::min(least, taken.count());
-        }
-        totals.times.push_back(least);
+        totals.times.push_back(timeOf(graph, request, picture));
         totals.add(olvane::picture::judge(picture, &graph));
     }
     return totals;
@@ -106,7 +127,7 @@ void print(View view, Totals totals) {
     const double slowest = *std::max_element(totals.times.begin(), totals.times.end());
     std::printf(
         "| %s | %zu | %zu | %zu | %zu | %zu | %zu | %zu | %zu | %zu | %zu | %zu of %zu | %zu | %.1f | "
-        "%.3f | %.2f |\n",
+        "%.4f | %.2f |\n",
         olvane::charts::nameOf(view), totals.boxes, totals.most, totals.overlaps, totals.hits, totals.tracks,
         totals.touches, totals.unjoined, totals.untold, totals.unmarked, totals.crossings, totals.sideBySide,
         totals.couples, totals.marks, middleOf(totals.areas), middleOf(totals.times), slowest);
@@ -160,6 +181,10 @@ int main(int argc, char** argv) {
         }
         const olvane::gedcom::GedcomData data = olvane::gedcom::readGedcomFile(path);
         const auto graph = olvane::gedcom::kinGraphOf(data);
+        if (argc == 3 && std::string(argv[1]) == "--step") {
+            printTimes(graph, std::max(1, std::atoi(argv[2])));
+            return 0;
+        }
         std::printf(
             "| view | boxes | most | overlaps | hits | tracks | touches | unjoined | untold | unmarked | "
             "crossings | side by side | marks | area | median ms | slowest ms |\n"
