@@ -578,7 +578,7 @@ export interface KinshipWords {
 
 /** How two persons are related. */
 export interface Kinship {
-    /** What b is to a: "second cousin, in 3 ways"; empty where they are not related. */
+    /** What b is to a: "second cousin; related in 3 ways"; empty where they are not related. */
     readonly text: string;
     /** Nearest first, of each sort 50 at most. Of those over marriages, the shortest alone. */
     readonly ways: readonly KinshipWay[];

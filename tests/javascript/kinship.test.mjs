@@ -36,7 +36,7 @@ test("the words of many persons are those of each, but for how many ways there a
     assert.equal(words.length, persons.length);
     persons.forEach((person, i) => {
         const whole = darwins.kinship(charles, person).text;
-        assert.equal(words[i].text, whole.replaceAll(/, in \d+ ways/g, ""), `person ${person}`);
+        assert.equal(words[i].text, whole.replaceAll(/; related in \d+ ways/g, ""), `person ${person}`);
         assert.equal(words[i].short === "", whole === "");
     });
     assert.equal(words[emma - 1].short, "wife");

@@ -11,7 +11,7 @@
 
 namespace olvane::kin {
 
-// What B is to A, in words: "second cousin once removed", "half sister", "wife and first cousin, in 2 ways".
+// What B is to A, in words: "second cousin once removed", "half sister", "wife and first cousin; related in 2 ways".
 // A spouse, a relative in law or a step relative who is a farther relative by blood, too, is named as both; other ways
 // over marriages are named where there is none by blood. An adoptive relation is named as such.
 // Empty where there is no way at all.

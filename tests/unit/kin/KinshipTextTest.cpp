@@ -92,9 +92,11 @@ TEST(KinshipText, relativesBesideTheLineCountDegreesAndRemovals) {
 
 TEST(KinshipText, bothSidesAtOnceSayNeitherAndHowManyWaysThereAre) {
     const KinFamily family{"Abel + Anna: Bert.m Bea.f Bodo.m", "Bert + Bea: Theo.m"};
-    expectRows(family, "Theo",
-               {{"Bodo", "uncle, in 2 ways", "Onkel, auf 2 Wegen", "tío, por 2 vías"},
-                {"Abel", "grandfather, in 2 ways", "Großvater, auf 2 Wegen", "abuelo, por 2 vías"}});
+    expectRows(
+        family, "Theo",
+        {{"Bodo", "uncle; related in 2 ways", "Onkel; verwandt auf 2 Wegen", "tío; parentesco por 2 vías"},
+         {"Abel", "grandfather; related in 2 ways", "Großvater; verwandt auf 2 Wegen",
+          "abuelo; parentesco por 2 vías"}});
 }
 
 TEST(KinshipText, doubleCousinsHaveAWord) {
@@ -152,7 +154,9 @@ TEST(KinshipText, aWifeWhoIsACousinIsBoth) {
     expectRows(
         family, "Charles",
         {{"Emma", "wife and first cousin", "Ehefrau und Cousine ersten Grades", "esposa y prima hermana"}});
-    expectRows(family, "George", {{"Emma", "mother, in 2 ways", "Mutter, auf 2 Wegen", "madre, por 2 vías"}});
+    expectRows(family, "George",
+               {{"Emma", "mother; related in 2 ways", "Mutter; verwandt auf 2 Wegen",
+                 "madre; parentesco por 2 vías"}});
 }
 
 // Words with and without the side; ways over several marriages are not said beside one by blood.

@@ -127,7 +127,7 @@ public:
         return near + " and " + far;
     }
     std::string inWays(const std::string& relation, const std::string& count) const override {
-        return relation + ", in " + count + " ways";
+        return relation + "; related in " + count + " ways";
     }
     std::string byMarriage(const std::string& links) const override {
         return "related by marriage over " + links + " links";

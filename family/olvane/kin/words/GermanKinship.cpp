@@ -209,7 +209,7 @@ public:
         return near + " und " + far;
     }
     std::string inWays(const std::string& relation, const std::string& count) const override {
-        return relation + ", auf " + count + " Wegen";
+        return relation + "; verwandt auf " + count + " Wegen";
     }
     std::string byMarriage(const std::string& links) const override {
         return "verschwägert über " + links + " Verbindungen";

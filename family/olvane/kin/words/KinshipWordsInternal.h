@@ -51,7 +51,7 @@ public:
     virtual Noun spouseOf(const Noun& spouse, const Noun& relative) const = 0;
     // "wife and first cousin"
     virtual std::string both(const std::string& near, const std::string& far) const = 0;
-    // "second cousin, in 3 ways"
+    // "second cousin; related in 3 ways"
     virtual std::string inWays(const std::string& relation, const std::string& count) const = 0;
     // "related by marriage over 7 links"
     virtual std::string byMarriage(const std::string& links) const = 0;

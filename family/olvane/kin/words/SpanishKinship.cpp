@@ -135,7 +135,7 @@ public:
         return near + " y " + far;
     }
     std::string inWays(const std::string& relation, const std::string& count) const override {
-        return relation + ", por " + count + " vías";
+        return relation + "; parentesco por " + count + " vías";
     }
     std::string byMarriage(const std::string& links) const override {
         return "pariente por matrimonio a través de " + links + " vínculos";
