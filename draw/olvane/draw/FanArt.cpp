@@ -45,10 +45,18 @@ constexpr int kLegendPitch = 22;
 constexpr double kLegendSize = 11.5;
 
 // Fills for lines of descent, dark text on light and light text on dark pages, all with a contrast of 4.5.
-constexpr auto kLightFills = std::to_array<std::string_view>(
-    {"#dbe9f6", "#fde3c8", "#dcefd3", "#f6d9e0", "#e6def2", "#f4edc4", "#d3eeec", "#e9e4dd"});
-constexpr auto kDarkFills = std::to_array<std::string_view>(
-    {"#24405c", "#5a3d1f", "#2b4a26", "#5a2b3a", "#40325a", "#4d4719", "#1f4a48", "#453f37"});
+constexpr auto kLightFills =
+    std::to_array<std::string_view>({"#dbe9f6", "#fde3c8", "#dcefd3", "#f6d9e0", "#e6def2", "#f4edc4",
+                                     "#d3eeec", "#e9e4dd", "#bdd0ee", "#f8c6b0", "#c3dba2", "#dcbfe4"});
+constexpr auto kDarkFills =
+    std::to_array<std::string_view>({"#24405c", "#5a3d1f", "#2b4a26", "#5a2b3a", "#40325a", "#4d4719",
+                                     "#1f4a48", "#453f37", "#1c3f80", "#702f22", "#44590f", "#63306f"});
+
+// So many colours take turns that the last line of descent, which may lie beside the first, has another one.
+std::size_t coloursInTurn(std::size_t lines) {
+    const std::size_t most = kLightFills.size();
+    return lines > 1 && lines % most == 1 ? most - 1 : most;
+}
 
 bool isDark(std::string_view colour) {
     return colour.size() == 7 && colour[1] < '8';
@@ -111,9 +119,9 @@ private:
         const Index line = own == picture::kNone ? static_cast<Index>(i) : own;
         const auto found = std::lower_bound(lines_.begin(), lines_.end(), line);
         if (found == lines_.end() || *found != line) return coloursOf(i).fill;
-        const auto place = static_cast<std::size_t>(found - lines_.begin());
-        return isDark(theme().page) ? kDarkFills[place % kDarkFills.size()]
-                                    : kLightFills[place % kLightFills.size()];
+        const std::size_t place =
+            static_cast<std::size_t>(found - lines_.begin()) % coloursInTurn(lines_.size());
+        return isDark(theme().page) ? kDarkFills[place] : kLightFills[place];
     }
 
     const BoxColours& coloursOf(std::size_t i) const {

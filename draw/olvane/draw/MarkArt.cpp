@@ -6,6 +6,7 @@
 
 #include <olvane/draw/MarkArtInternal.h>
 
+#include <algorithm>
 #include <cstddef>
 
 #include <olvane/draw/SvgTextInternal.h>
@@ -36,9 +37,13 @@ public:
     std::vector<std::vector<BoxMark>> take() { return std::move(marks_); }
 
 private:
+    // Once, however many children of one family are elsewhere.
     void add(Index box, const char* sign, const Mark& mark, const std::string& title, MarkPlace place) {
         if (box == picture::kNone) return;
-        marks_[static_cast<std::size_t>(box)].push_back({joined(sign, whole(mark.number)), title, place});
+        std::vector<BoxMark>& marks = marks_[static_cast<std::size_t>(box)];
+        const std::string text = joined(sign, whole(mark.number));
+        const auto isThere = [&text](const BoxMark& one) { return one.text == text; };
+        if (std::none_of(marks.begin(), marks.end(), isThere)) marks.push_back({text, title, place});
     }
 
     void addParents(const Mark& mark) {
