@@ -11,7 +11,7 @@ import type { BoxLook } from "./boxArt";
 const kYearsSize = 10;
 const kInset = 4; // points on each side of a text
 const kLeastRoom = 14; // points; less shows no text at all
-const kLines = 4; // colours for lines of descent
+const kLines = 12; // colours for lines of descent
 
 const radians = (degrees: number) => (degrees * Math.PI) / 180;
 

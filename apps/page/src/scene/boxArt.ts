@@ -54,6 +54,8 @@ export interface BoxLook {
 }
 
 const kUsualHeight = 104; // of a tall box without room for a photograph
+const kMarkHeight = 17;
+const kMarkInside = 4; // by which marks and counts reach into a box, where no text goes
 const kInset = 7; // px from the border to any text
 const kTwoNameLines = 36; // px that a wide box has for them at least
 const kYearsSize = 11;
@@ -95,7 +97,7 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     if (look.hidden >= 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);
     if (look.further) appendFurtherMark(box, look.further);
-    if (look.caption) appendCaption(box, look.caption, look.texts, sizes);
+    if (look.caption) appendCaption(box, look, sizes);
     if (look.marks.length > 0) appendMarks(box, look, sizes);
     return box;
 }
@@ -261,16 +263,16 @@ function text(
     return line;
 }
 
-// On the upper edge, where neither names nor lines go.
+// On the upper edge, where no lines go.
 function appendBadge(box: SVGGElement, { hidden, texts }: BoxLook, { width: nodeWidth }: Extent): void {
     const label = hidden > 0 ? "+" + hidden : "+";
     const width = Math.max(20, texts.width(label, 10.5, true) + 10);
     const badge = svg("g", {
         class: "badge",
         "aria-hidden": "true",
-        transform: `translate(${nodeWidth - width + 8} -9)`,
+        transform: `translate(${nodeWidth - width + 8} ${kMarkInside - kMarkHeight})`,
     });
-    badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
+    badge.append(svg("rect", { width, height: kMarkHeight, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
 }
 
@@ -278,8 +280,12 @@ function appendBadge(box: SVGGElement, { hidden, texts }: BoxLook, { width: node
 function appendMarks(box: SVGGElement, { marks, texts }: BoxLook, { height }: Extent): void {
     const label = marks.slice(0, 3).join(" \u00b7 ") + (marks.length > 3 ? " \u2026" : "");
     const width = Math.max(20, texts.width(label, 10.5, true) + 10);
-    const badge = svg("g", { class: "mark", "aria-hidden": "true", transform: `translate(-8 ${height - 9})` });
-    badge.append(svg("rect", { width, height: 17, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
+    const badge = svg("g", {
+        class: "mark",
+        "aria-hidden": "true",
+        transform: `translate(-8 ${height - kMarkInside})`,
+    });
+    badge.append(svg("rect", { width, height: kMarkHeight, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
 }
 
@@ -306,12 +312,13 @@ function appendFurtherMark(box: SVGGElement, title: string): void {
     box.append(mark);
 }
 
-// Below the box, touching it.
-function appendCaption(box: SVGGElement, caption: string, texts: Texts, { width, height }: Extent): void {
+// Below the box, touching it or its marks.
+function appendCaption(box: SVGGElement, { caption, marks, texts }: BoxLook, { width, height }: Extent): void {
     const room = width + 36;
     const { lines } = texts.fitName({ given: caption, surname: "" }, { width: room - 16, height: 48, lines: 3 });
     const wide = Math.min(room, Math.max(...lines.map((line) => texts.width(line, kKinSize, true))) + 16);
-    const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${height - 2})` });
+    const top = marks.length > 0 ? height - kMarkInside + kMarkHeight + 1 : height - 2;
+    const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${top})` });
     plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
     lines.forEach((line, i) =>
         plate.append(
