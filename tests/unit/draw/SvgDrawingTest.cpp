@@ -357,6 +357,22 @@ TEST_F(Picture, whatIsElsewhereHasANumberAtBothEnds) {
               2u);
 }
 
+// Two children of one couple are elsewhere: the mark at their parent stands once.
+TEST_F(Picture, aMarkOfSeveralChildrenStandsOnceAtTheirParent) {
+    for (const picture::Index child : {3, 4}) {
+        content_.picture.marks.push_back({{child, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
+    }
+    const std::string svg = draw();
+    EXPECT_EQ(countOf(svg,
+                      ">\xE2\x86\x91"
+                      "7</text>"),
+              2u);
+    EXPECT_EQ(countOf(svg,
+                      ">\xE2\x86\x93"
+                      "7</text>"),
+              1u);
+}
+
 TEST_F(Picture, manyMarksOfOneBoxAreCounted) {
     for (int i = 1; i <= 9; ++i) {
         content_.picture.marks.push_back({{4, 2, picture::kNone}, i, picture::MarkKind::parentsElsewhere});
