@@ -360,7 +360,8 @@ TEST_F(Picture, whatIsElsewhereHasANumberAtBothEnds) {
 // Two children of one couple are elsewhere: the mark at their parent stands once.
 TEST_F(Picture, aMarkOfSeveralChildrenStandsOnceAtTheirParent) {
     for (const picture::Index child : {3, 4}) {
-        content_.picture.marks.push_back({{child, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
+        content_.picture.marks.push_back(
+            {{child, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
     }
     const std::string svg = draw();
     EXPECT_EQ(countOf(svg,
