@@ -4,39 +4,31 @@
 // The page around the viewer: the bar, the dialogs, the address and what the browser's own history keeps of it.
 // Files come in through FileOpening; everything about the picture is the viewer's.
 
-import type { GedcomFile, Person, ShownFact } from "olvane";
-import { iconButton } from "../base/controls";
+import type { GedcomFile } from "olvane";
 import { html, recall, remember } from "../base/dom";
-import { type ChartDirection, type RelativeName, type ViewName } from "../base/views";
+import type { ViewName } from "../base/views";
 import { OlvaneTree, type OlvaneTreeEvents } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
 import { mapInWorker } from "../engine/mapWorker";
 import { Photographs } from "../engine/photographs";
-import { type UiMessages, uiLanguages, uiMessagesFor } from "../messages/ui";
+import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import { PictureOutput, type Subject } from "../output/PictureOutput";
 import { copyText, fileNameOf } from "../output/saving";
 import { Notices } from "../ui/Notices";
 import type { OuterKey } from "../ui/pictureKeys";
 import { OpenFamily } from "../view/OpenFamily";
 import { linkOf, looksIn } from "../view/SharedLink";
-import {
-    addressOf,
-    clampDepth,
-    clampGenerations,
-    kUsualState,
-    readAddress,
-    sameState,
-    unknownPersonIn,
-    type ViewState,
-} from "../view/ViewState";
+import { addressOf, kUsualState, readAddress, sameState, unknownPersonIn, type ViewState } from "../view/ViewState";
 import { Chrome, type ChromeActions } from "./Chrome";
 import { fileInput, takeDrops } from "./dropping";
 import { FileOpening, type OpenedFile } from "./FileOpening";
 import { FileRemarks } from "./FileRemarks";
+import { Finding } from "./Finding";
+import { FirstHint } from "./FirstHint";
 import { Journey } from "./Journey";
 import { canKeep, keepFile, keptFile, removeKeptFile } from "./KeptFile";
 import { isMapAddress, mapComplaint, MapHost } from "./MapHost";
-import type { Found } from "./searchReasons";
+import { PictureSwitches } from "./PictureSwitches";
 import { kThemeChoices, Theme, type ThemeChoice } from "./theme";
 import { CancelledError, Reading } from "./Reading";
 import { Welcome } from "./Welcome";
@@ -70,11 +62,13 @@ export class App implements ChromeActions {
         (address) => this.arriveAt(address),
         window.self !== window.top && !new URLSearchParams(location.search).has("history"),
     );
-    private readonly firstHint = html("div", { id: "first-hint", role: "status", hidden: true });
+    private readonly firstHint = new FirstHint();
     private readonly maps = new MapHost({
         openPerson: (number) => this.leaveMap({ focus: number }),
         mapSettled: (address) => this.journey.replace(address),
     });
+    private readonly switches = new PictureSwitches(this.tree);
+    private readonly finding = new Finding(this.tree, this.maps);
     // The family beside an embedded map, which is read when somebody leaves the map.
     private unread: EmbeddedFamily | null = null;
     private isLayingOut = false; // a map
@@ -200,18 +194,11 @@ export class App implements ChromeActions {
         if (family.livingHidden) this.notices.show(this.ui.livingHidden);
     }
 
-    // Where a notice would lie over the picture, the hint has a row of its own until somebody has done something.
+    // Where a notice would lie over the picture, the hint has a row of its own.
     private showFirstHint(): void {
         if (!matchMedia(kNarrow).matches) return this.notices.show(this.ui.firstHint);
-        const dismiss = iconButton("hint-dismiss", "close", this.ui.errors.dismiss, () => this.hideFirstHint());
-        this.firstHint.replaceChildren(html("p", {}, this.ui.firstHint), dismiss);
-        this.firstHint.hidden = false;
+        this.firstHint.show(this.ui);
         this.arrange();
-    }
-
-    private hideFirstHint(): void {
-        this.firstHint.hidden = true;
-        this.firstHint.remove();
     }
 
     // What a link says of colours, language and zoom holds for this visit; what the reader chose before stays theirs.
@@ -241,11 +228,6 @@ export class App implements ChromeActions {
 
     // --- the way through the family ---
 
-    private travel(change: Partial<ViewState>): void {
-        const { state } = this.tree;
-        if (state && !sameState({ ...state, ...change }, state)) this.tree.show(change, null, true);
-    }
-
     private arrive(state: ViewState): void {
         this.arriving = true;
         this.tree.show(state);
@@ -274,9 +256,9 @@ export class App implements ChromeActions {
     private listen(): void {
         const on = <Name extends keyof OlvaneTreeEvents>(name: Name, act: (event: OlvaneTreeEvents[Name]) => void) =>
             this.tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
-        on("select", () => this.hideFirstHint());
+        on("select", () => this.firstHint.hide());
         on("focuschange", ({ detail }) => {
-            if (detail.byUser) this.hideFirstHint();
+            if (detail.byUser) this.firstHint.hide();
             if (!this.arriving) this.journey.add(addressOf(detail.state, this.tree.family!.persons));
             this.showState();
         });
@@ -292,7 +274,7 @@ export class App implements ChromeActions {
 
     setView(view: ViewName): void {
         if (this.maps.isShown) this.leaveMap({ view });
-        else this.travel({ view });
+        else this.switches.travel({ view });
     }
 
     // --- the map ---
@@ -348,7 +330,7 @@ export class App implements ChromeActions {
         const { family, state } = this.tree;
         if (!family || !state) return;
         this.hideMap();
-        if (!sameState({ ...state, ...wanted }, state)) this.travel(wanted);
+        if (!sameState({ ...state, ...wanted }, state)) this.switches.travel(wanted);
         else if (!isNew) this.journey.add(addressOf(state, family.persons));
         this.showState();
     }
@@ -365,25 +347,6 @@ export class App implements ChromeActions {
         return this.tree.family !== null;
     }
 
-    setDepth(which: "up" | "down", generations: number): void {
-        this.travel({ [which]: clampDepth(generations, this.tree.state?.[which] ?? 0) });
-    }
-
-    setDirection(direction: ChartDirection): void {
-        this.travel({ direction });
-    }
-
-    setRelative(name: RelativeName, shown: boolean): void {
-        const hidden = new Set(this.tree.state?.hidden);
-        if (shown) hidden.delete(name);
-        else hidden.add(name);
-        this.travel({ hidden });
-    }
-
-    setGenerations(generations: number): void {
-        this.travel({ generations: clampGenerations(generations) });
-    }
-
     setKinshipInBoxes(shown: boolean): void {
         remember("kinship", shown ? "yes" : "no");
         this.showKinship(shown);
@@ -392,21 +355,6 @@ export class App implements ChromeActions {
     private showKinship(shown: boolean): void {
         this.kinshipInBoxes = shown;
         this.tree.setAttribute("kinship", shown ? "boxes" : "none");
-    }
-
-    setFact(fact: ShownFact, shown: boolean): void {
-        const show = new Set(this.tree.state?.show);
-        if (shown) show.add(fact);
-        else show.delete(fact);
-        this.travel({ show });
-    }
-
-    setCompact(compact: boolean): void {
-        this.travel({ compact });
-    }
-
-    setUnknownParents(shown: boolean): void {
-        this.travel({ unknownParents: shown });
     }
 
     setEncoding(encoding: string): void {
@@ -433,10 +381,6 @@ export class App implements ChromeActions {
         this.ui = uiMessagesFor(language);
         this.tree.setAttribute("language", language);
         this.rebuildUi();
-    }
-
-    setPhotos(photos: boolean): void {
-        this.travel({ photos });
     }
 
     back(): void {
@@ -548,44 +492,21 @@ export class App implements ChromeActions {
             event.preventDefault();
     }
 
-    // --- the search's questions ---
-
-    find(text: string, limit: number): readonly Found[] {
-        const { family } = this.tree;
-        if (!family) return this.maps.find(text, limit);
-        return family.file.search(text, limit).map((hit) => ({ person: family.person(hit.person)!, hit }));
-    }
-
-    person(id: number): Person | undefined {
-        return this.tree.family?.person(id);
-    }
-
-    nameOf(person: Person): string {
-        return this.tree.nameOf(person);
-    }
-
-    yearsOf(person: Person): string {
-        return this.tree.yearsOf(person);
-    }
-
-    kinshipOf(person: Person): string {
-        return this.tree.kinshipOf(person);
-    }
-
-    choose(person: Person): void {
-        if (this.maps.isShown) return this.maps.goTo(person.id);
-        this.tree.focusOn(person.id);
-        this.tree.takeKeys();
-    }
-
     // --- showing ---
 
     // Makes everything that holds words.
     private rebuildUi(): void {
         const { ui } = this;
         document.documentElement.lang = ui.language;
-        this.chrome = new Chrome(ui, this, { theme: this.theme.choice, kinshipInBoxes: this.kinshipInBoxes });
-        this.welcome = new Welcome(ui, () => this.openFile(), this.languageChooser());
+        this.chrome = new Chrome(ui, this, this.switches, this.finding, {
+            theme: this.theme.choice,
+            kinshipInBoxes: this.kinshipInBoxes,
+        });
+        this.welcome = new Welcome(
+            ui,
+            () => this.openFile(),
+            (language) => this.setLanguage(language),
+        );
         this.notices.setDismissLabel(ui.errors.dismiss);
         this.cover.textContent = ui.welcome.dropNow;
         this.maps.rebuild(ui);
@@ -609,7 +530,7 @@ export class App implements ChromeActions {
         for (const child of [...this.root.children]) if (child !== main) child.remove();
         if (!main.isConnected) this.root.append(main);
         main.before(chrome.bar);
-        if (!this.firstHint.hidden) main.before(this.firstHint);
+        if (!this.firstHint.element.hidden) main.before(this.firstHint.element);
         this.root.append(chrome.keys, chrome.diagnostics, this.paperDialog, ...always);
         const count = family?.persons.length ?? this.maps.count;
         chrome.showFamily(family?.title ?? document.title, this.ui.personCount(count));
@@ -650,19 +571,10 @@ export class App implements ChromeActions {
         if (!shownTitle || !focus) return null;
         return {
             title: shownTitle,
-            name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.nameOf(focus)),
+            name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.tree.nameOf(focus)),
             drawing: (theme) => this.tree.drawing(theme) ?? "",
             sheets: (paper) => this.tree.sheets(paper),
         };
-    }
-
-    private languageChooser(): HTMLElement {
-        const select = html("select", { id: "language", "aria-label": this.ui.languageLabel });
-        for (const { language, languageName } of uiLanguages) {
-            select.append(html("option", { value: language, selected: language === this.ui.language }, languageName));
-        }
-        select.addEventListener("change", () => this.setLanguage(select.value));
-        return select;
     }
 }
 

@@ -4,7 +4,7 @@
 // The bar at the top with its two panels, the buttons that float over the picture, the legend, and the
 // dialogs. All of it is made anew when the language changes.
 
-import type { Person, ShownFact } from "olvane";
+import type { ShownFact } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
 import { hasGroups, kRelativeNames, kShownFacts, type RelativeName } from "../base/views";
 import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
@@ -12,18 +12,15 @@ import { checkbox, iconButton, switchRow } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import { icon } from "../base/icons";
 import type { ListedRemark } from "./FileRemarks";
+import type { Finding } from "./Finding";
 import { Popover } from "./Popover";
-import { SearchBox, type SearchSource } from "./SearchBox";
+import type { PictureSwitches } from "./PictureSwitches";
+import { SearchBox } from "./SearchBox";
 import { type ViewActions, ViewChooser } from "./ViewChooser";
 import { kThemeChoices, type ThemeChoice } from "./theme";
 
-export interface ChromeActions extends SearchSource, ViewActions {
-    person(id: number): Person | undefined;
-    setRelative(name: RelativeName, shown: boolean): void;
-    setGenerations(generations: number): void;
+export interface ChromeActions extends ViewActions {
     setKinshipInBoxes(shown: boolean): void;
-    setUnknownParents(shown: boolean): void;
-    setFact(fact: ShownFact, shown: boolean): void;
     // Reads the file again; empty for the file's own word.
     setEncoding(encoding: string): void;
     setTheme(theme: ThemeChoice): void;
@@ -34,7 +31,6 @@ export interface ChromeActions extends SearchSource, ViewActions {
     saveSvg(): void;
     copyLink(): void;
     setKept(isKept: boolean): void;
-    setPhotos(shown: boolean): void;
     savePng(): void;
     print(): void;
     choosePaper(): void;
@@ -103,9 +99,11 @@ export class Chrome {
     constructor(
         private readonly ui: UiMessages,
         private readonly actions: ChromeActions,
+        private readonly pictureSwitches: PictureSwitches,
+        private readonly finding: Finding,
         looks: ChromeLooks,
     ) {
-        this.search = new SearchBox(actions, ui);
+        this.search = new SearchBox(finding, ui);
         this.buttons = {
             back: iconButton("back", "back", ui.back, () => actions.back()),
             forward: iconButton("forward", "forward", ui.forward, () => actions.forward()),
@@ -114,17 +112,17 @@ export class Chrome {
             panel: iconButton("panel-button", "panel", ui.panel.toggle, () => actions.togglePanel()),
         };
         this.fewer = iconButton("generations-fewer", "minus", ui.fewer, () =>
-            actions.setGenerations(this.shownGenerations - 1),
+            pictureSwitches.setGenerations(this.shownGenerations - 1),
         );
         this.more = iconButton("generations-more", "plus", ui.more, () =>
-            actions.setGenerations(this.shownGenerations + 1),
+            pictureSwitches.setGenerations(this.shownGenerations + 1),
         );
         this.keys = this.keyDialog();
         this.diagnostics = html("dialog", { id: "diagnostics", "aria-labelledby": "diagnostics-title" });
         this.diagnosticsButton = iconButton("diagnostics-button", "warning", "", () => this.openDiagnostics());
         this.diagnosticsButton.hidden = true;
-        this.views = new ViewChooser(ui, actions);
-        this.unknownParents = checkbox("unknown-parents", (checked) => actions.setUnknownParents(checked));
+        this.views = new ViewChooser(ui, actions, pictureSwitches);
+        this.unknownParents = checkbox("unknown-parents", (checked) => pictureSwitches.setUnknownParents(checked));
         this.encoding.append(html("option", { value: "" }, ui.encodingAuto));
         for (const name of kEncodings) this.encoding.append(html("option", { value: name }, name));
         this.encoding.addEventListener("change", () => actions.setEncoding(this.encoding.value));
@@ -135,7 +133,7 @@ export class Chrome {
             this.keep,
             html("span", {}, ui.keep.label, html("small", {}, ui.keep.hint)),
         );
-        this.photos = checkbox("photos-in-boxes", (checked) => actions.setPhotos(checked));
+        this.photos = checkbox("photos-in-boxes", (checked) => pictureSwitches.setPhotos(checked));
         this.photosRow = html(
             "label",
             { class: "switch", hidden: true },
@@ -263,16 +261,16 @@ export class Chrome {
 
     // Leads to a person whom a remark is about.
     private personButton(id: number): HTMLElement | null {
-        const person = this.actions.person(id);
+        const person = this.finding.person(id);
         if (!person) return null;
         const button = html(
             "button",
             { type: "button", class: "plain to-person", "data-person-id": id, dir: "auto" },
-            this.actions.nameOf(person),
+            this.finding.nameOf(person),
         );
         onClick(button, () => {
             this.diagnostics.close();
-            this.actions.choose(person);
+            this.finding.choose(person);
         });
         return button;
     }
@@ -301,16 +299,16 @@ export class Chrome {
     }
 
     private optionsPanel(looks: ChromeLooks): HTMLElement {
-        const { ui, actions } = this;
+        const { ui, actions, pictureSwitches } = this;
         const relatives = html("fieldset", {}, html("legend", {}, ui.relatives));
         for (const name of kRelativeNames) {
-            const input = checkbox("show-" + name, (checked) => actions.setRelative(name, checked));
+            const input = checkbox("show-" + name, (checked) => pictureSwitches.setRelative(name, checked));
             this.switches.set(name, input);
             relatives.append(html("label", { class: "switch" }, input, html("span", {}, ui.relativeNames[name])));
         }
         const facts = html("fieldset", {}, html("legend", {}, ui.shownFacts.label));
         for (const fact of kShownFacts) {
-            const input = checkbox("fact-" + fact, (checked) => actions.setFact(fact, checked));
+            const input = checkbox("fact-" + fact, (checked) => pictureSwitches.setFact(fact, checked));
             this.facts.set(fact, input);
             facts.append(switchRow(input, ui.shownFacts[fact]));
         }

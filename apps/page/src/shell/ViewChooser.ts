@@ -18,6 +18,7 @@ import {
 } from "../base/views";
 import type { UiMessages } from "../messages/ui";
 import type { ViewState } from "../view/ViewState";
+import type { PictureSwitches } from "./PictureSwitches";
 import { Popover } from "./Popover";
 
 const kMostCounted = 10; // generations; one step further on the slider is all of them
@@ -26,9 +27,6 @@ export interface ViewActions {
     setView(view: ViewName): void;
     /** Shows everybody as a map. */
     setMap(): void;
-    setDepth(which: "up" | "down", generations: number): void;
-    setDirection(direction: ChartDirection): void;
-    setCompact(compact: boolean): void;
 }
 
 export class ViewChooser {
@@ -44,6 +42,7 @@ export class ViewChooser {
     constructor(
         private readonly ui: UiMessages,
         private readonly actions: ViewActions,
+        switches: PictureSwitches,
     ) {
         const views = html("div", { class: "views", role: "group", "aria-label": ui.views.label });
         for (const view of kViewNames) views.append(this.viewButton(view));
@@ -57,12 +56,12 @@ export class ViewChooser {
         views.append(this.map);
         this.direction = html("select", { id: "direction" });
         for (const name of kDirections) this.direction.append(html("option", { value: name }, ui.directions[name]));
-        this.direction.addEventListener("change", () => actions.setDirection(this.direction.value as ChartDirection));
+        this.direction.addEventListener("change", () => switches.setDirection(this.direction.value as ChartDirection));
         this.directionRow = html("label", { class: "row" }, html("span", {}, ui.direction), this.direction);
-        this.compact = checkbox("compact", (checked) => actions.setCompact(checked));
+        this.compact = checkbox("compact", (checked) => switches.setCompact(checked));
         this.compactRow = switchRow(this.compact, ui.compact);
         for (const which of ["up", "down"] as const)
-            this.depths.set(which, new Depth(which, ui, (n) => actions.setDepth(which, n)));
+            this.depths.set(which, new Depth(which, ui, (n) => switches.setDepth(which, n)));
         this.popover = new Popover(
             iconButton("views-button", "views", ui.views.label, () => {}),
             html(

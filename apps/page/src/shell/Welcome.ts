@@ -3,14 +3,14 @@
 
 // The page before any family is open, and the invitation that covers it while a file is dragged over it.
 
-import type { UiMessages } from "../messages/ui";
+import { type UiMessages, uiLanguages } from "../messages/ui";
 import { html, onClick, svg } from "../base/dom";
 import { icon } from "../base/icons";
 
 export class Welcome {
     readonly element: HTMLElement;
 
-    constructor(ui: UiMessages, choose: () => void, languageChooser: HTMLElement) {
+    constructor(ui: UiMessages, choose: () => void, chooseLanguage: (language: string) => void) {
         const { welcome } = ui;
         const button = html("button", { id: "choose-file", type: "button", class: "main" }, welcome.choose);
         onClick(button, choose);
@@ -28,9 +28,18 @@ export class Welcome {
                 html("p", { class: "quiet" }, welcome.kinds),
             ),
             html("p", { class: "privacy" }, icon("lock"), html("span", {}, welcome.privacy)),
-            languageChooser,
+            languageChooser(ui, chooseLanguage),
         );
     }
+}
+
+function languageChooser(ui: UiMessages, choose: (language: string) => void): HTMLElement {
+    const select = html("select", { id: "language", "aria-label": ui.languageLabel });
+    for (const { language, languageName } of uiLanguages) {
+        select.append(html("option", { value: language, selected: language === ui.language }, languageName));
+    }
+    select.addEventListener("change", () => choose(select.value));
+    return select;
 }
 
 // A small family: two parents, the one in the middle, and two children.

@@ -1,0 +1,45 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The search's questions, asked of the family that is open, or of the map while there is nothing else.
+
+import type { Person } from "olvane";
+import type { OlvaneTree } from "../element/OlvaneTree";
+import type { MapHost } from "./MapHost";
+import type { SearchSource } from "./SearchBox";
+import type { Found } from "./searchReasons";
+
+export class Finding implements SearchSource {
+    constructor(
+        private readonly tree: OlvaneTree,
+        private readonly maps: MapHost,
+    ) {}
+
+    find(text: string, limit: number): readonly Found[] {
+        const { family } = this.tree;
+        if (!family) return this.maps.find(text, limit);
+        return family.file.search(text, limit).map((hit) => ({ person: family.person(hit.person)!, hit }));
+    }
+
+    person(id: number): Person | undefined {
+        return this.tree.family?.person(id);
+    }
+
+    nameOf(person: Person): string {
+        return this.tree.nameOf(person);
+    }
+
+    yearsOf(person: Person): string {
+        return this.tree.yearsOf(person);
+    }
+
+    kinshipOf(person: Person): string {
+        return this.tree.kinshipOf(person);
+    }
+
+    choose(person: Person): void {
+        if (this.maps.isShown) return this.maps.goTo(person.id);
+        this.tree.focusOn(person.id);
+        this.tree.takeKeys();
+    }
+}
