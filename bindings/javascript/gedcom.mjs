@@ -21,8 +21,8 @@ const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other",
 
 function dateFrom(values) {
     if (values === 0) return null;
-    const [written, year, month, day, mark, lastYear, shown] = values;
-    return { written, year, month, day, mark: MARKS[mark], lastYear, shown };
+    const [written, year, month, day, mark, lastYear, shown, period] = values;
+    return { written, year, month, day, mark: MARKS[mark], lastYear, shown, period: period !== 0 };
 }
 
 function parentFamiliesFrom(values) {
@@ -52,6 +52,7 @@ function personFrom(values, index) {
         children,
         parentFamilies: parentFamiliesFrom(values[12]),
         coupleFamilies: values[13],
+        surnameFirst: values[14] !== 0,
     };
 }
 

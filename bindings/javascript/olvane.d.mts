@@ -136,17 +136,22 @@ export class HostError extends LayoutError {
     readonly cause: unknown;
 }
 
-export type PictureView =
-    | "family"
-    | "pedigree"
-    | "near"
-    | "ancestors"
-    | "descendants"
-    | "hourglass"
-    | "relatives"
-    | "fan"
-    | "kinship"
-    | "everybody";
+export const PICTURE_VIEWS: readonly [
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+];
+export type PictureView = (typeof PICTURE_VIEWS)[number];
+
+/** Where later generations can stand, seen from earlier ones. */
+export const DIRECTIONS: readonly ["down", "up", "left", "right"];
 
 /**
  * What to draw. What is undefined is as if it were not given; a name that is none of these and a value of another
@@ -166,7 +171,7 @@ export interface PictureOptions {
     /** Generations of descendants below the focus; 0 for all. */
     down?: number | undefined;
     /** Where later generations stand, seen from earlier ones; down. */
-    direction?: "down" | "up" | "left" | "right" | undefined;
+    direction?: (typeof DIRECTIONS)[number] | undefined;
     /** Descendants with their spouses; true. */
     spouses?: boolean | undefined;
     /** Ancestors with their siblings; false. */
@@ -214,7 +219,8 @@ export interface PictureOptions {
 export type DrawingTheme = "light" | "dark" | "print";
 
 /** What boxes and lines say beside names and years: dates as written, places, the first occupation, the year of a marriage. */
-export type ShownFact = "dates" | "places" | "occupation" | "marriage";
+export const FACTS: readonly ["dates", "places", "occupation", "marriage"];
+export type ShownFact = (typeof FACTS)[number];
 
 /** What the box of a person says beside the name. A text is empty where nothing is known. */
 export interface PersonLabel {
@@ -299,6 +305,8 @@ export interface Texts {
     fitLine(text: string, size: number, width: number, bold?: boolean): string;
     /** In bold letters of 10 to 13 px, as large as the room allows. */
     fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
+    /** Whether the first letter that has a direction is of a script that runs from right to left. */
+    runsRightToLeft(text: string): boolean;
 }
 
 /** A place in one of the lists of a picture. */
@@ -427,6 +435,8 @@ export interface GedcomDate {
     readonly lastYear: number;
     /** The year for a person to read: "1819", "~1819", "<1819", ">1819", "1819-1825", "44 BC". */
     readonly shown: string;
+    /** Says how long something lasted, from, until or between, where the mark alone says after, before or between. */
+    readonly period: boolean;
 }
 
 /** Something that a file states of a person or a couple. */
@@ -509,6 +519,8 @@ export interface Person {
     readonly name: string;
     readonly given: string;
     readonly surname: string;
+    /** The file writes the surname first, so it is read first. */
+    readonly surnameFirst: boolean;
     /** All the names of the person, the first one included. */
     readonly names: readonly string[];
     readonly sex: Sex;
@@ -869,6 +881,8 @@ export class Olvane {
         diagnostic: Pick<Diagnostic, "what" | "done" | "quoted">,
         language?: string,
     ): { readonly text: string; readonly hint: string };
+    /** The member of a GEDZIP archive that the file of a medium stands for; null for what lies outside the archive. */
+    archiveMember(file: string): string | null;
     /**
      * Reads the bytes of a GEDCOM file, 5.5 to 7.0, in any encoding that is known. Where the file's own word on its
      * encoding is wrong, options name another, such as "windows-1251". Throws GedcomError.

@@ -14,7 +14,7 @@ export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
 export { Family } from "./family.mjs";
 export { GedcomFile } from "./gedcom.mjs";
 export { serveReading } from "./reading.mjs";
-export { PERSON_NOT_FOUND, Shown } from "./values.mjs";
+export { DIRECTIONS, FACTS, PERSON_NOT_FOUND, PICTURE_VIEWS, Shown } from "./values.mjs";
 
 export class Olvane {
     #instance;
@@ -45,6 +45,14 @@ export class Olvane {
 
     diagnosticWords(diagnostic, language = "en") {
         return diagnosticWords(this.#instance, diagnostic, language);
+    }
+
+    archiveMember(file) {
+        const instance = this.#instance;
+        return instance.withText(file, (pointer) => {
+            const member = instance.exports.archive_member(pointer);
+            return member === 0 ? null : instance.text(member);
+        });
     }
 
     readGedcom(bytes, name = "family.ged", options = {}) {

@@ -3,21 +3,8 @@
 
 // What a caller asks of a picture, checked before the module hears of it, as options.mjs does for layouts.
 
-import { Shown } from "./values.mjs";
+import { DIRECTIONS, FACTS, PICTURE_VIEWS, Shown } from "./values.mjs";
 
-export const VIEWS = [
-    "family",
-    "pedigree",
-    "near",
-    "ancestors",
-    "descendants",
-    "hourglass",
-    "relatives",
-    "fan",
-    "kinship",
-    "everybody",
-];
-const DIRECTIONS = ["down", "up", "left", "right"];
 const FANS = ["ancestors", "descendants"];
 const WAYS = ["blood", "marriage", "both"];
 
@@ -28,7 +15,7 @@ const MOST = 2 ** 31 - 1;
 
 /** In the order of set_picture_options. */
 const OPTIONS = {
-    view: { words: VIEWS, usual: "family" },
+    view: { words: PICTURE_VIEWS, usual: "family" },
     shown: { least: 0, most: Shown.all, usual: Shown.all },
     generations: { least: 1, most: 1000, usual: 5 },
     to: { least: 0, most: MOST, usual: 0 },
@@ -90,7 +77,6 @@ function numberOf(name, value, option) {
 
 const THEMES = ["light", "dark", "print"];
 const BOXES = ["usual", "tall", "wide"];
-const FACTS = ["dates", "places", "occupation", "marriage"];
 
 /** Facts beside names and years, as bits. */
 export function factBits(show) {

@@ -44,6 +44,12 @@ export class Texts {
         });
     }
 
+    runsRightToLeft(text) {
+        return this.#remembered(`d/${text}`, () =>
+            this.#instance.withText(text, (pointer) => this.#instance.exports.runs_right_to_left(pointer) !== 0),
+        );
+    }
+
     #answer(pointer) {
         if (pointer === 0) throw new Error("the module found no memory for a text");
         return this.#instance.text(pointer);

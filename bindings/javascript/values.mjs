@@ -17,6 +17,22 @@ export const Shown = Object.freeze({
     all: 0xff,
 });
 
+/** All views, by the numbers that the module has for them, and so the next two lists. */
+export const PICTURE_VIEWS = Object.freeze([
+    "family",
+    "pedigree",
+    "near",
+    "ancestors",
+    "descendants",
+    "hourglass",
+    "relatives",
+    "fan",
+    "kinship",
+    "everybody",
+]);
+export const DIRECTIONS = Object.freeze(["down", "up", "left", "right"]);
+export const FACTS = Object.freeze(["dates", "places", "occupation", "marriage"]);
+
 export const STATUSES = [
     "ok",
     "invalidArgument",

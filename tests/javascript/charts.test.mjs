@@ -9,20 +9,9 @@ import { execFileSync } from "node:child_process";
 import { existsSync, readFileSync } from "node:fs";
 import test from "node:test";
 
+import { PICTURE_VIEWS } from "../../bindings/javascript/olvane.mjs";
 import { olvane } from "./module.mjs";
 
-const VIEWS = [
-    "family",
-    "pedigree",
-    "near",
-    "ancestors",
-    "descendants",
-    "hourglass",
-    "relatives",
-    "fan",
-    "kinship",
-    "everybody",
-];
 const command = process.env.OLVANE_COMMAND;
 
 // As the command writes them: to thousandths, halves away from zero, without a negative zero.
@@ -97,7 +86,12 @@ test(
     "every view of the bundled family is the same in WebAssembly and natively",
     { skip: !command && "no command" },
     () => {
-        compare(new URL("../../samples/darwin-wedgwood.ged", import.meta.url).pathname, [1, 2, 17, 60], 30, VIEWS);
+        compare(
+            new URL("../../samples/darwin-wedgwood.ged", import.meta.url).pathname,
+            [1, 2, 17, 60],
+            30,
+            PICTURE_VIEWS,
+        );
     },
 );
 
@@ -107,7 +101,7 @@ const reason = !command
     : !existsSync(royals) && "OLVANE_GEDCOM_DIR is not set, or has no history/royal92.ged";
 test("every view of a large family is the same in WebAssembly and natively", { skip: reason }, () => {
     // Everybody is the same persons for nearly any focus, and takes the longest.
-    const others = VIEWS.filter((view) => view !== "everybody");
+    const others = PICTURE_VIEWS.filter((view) => view !== "everybody");
     compare(royals, [1, 52, 700], 57, others);
     compare(royals, [1], 57, ["everybody"]);
 });

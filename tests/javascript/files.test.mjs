@@ -60,7 +60,16 @@ test("persons, families and facts are given as the file has them", () => {
         names: ['Johann "Grüber"\\', "Li Wei"],
         sex: "male",
         dead: false,
-        birth: { written: "ABT 1819", year: 1819, month: 0, day: 0, mark: "about", lastYear: 0, shown: "~1819" },
+        birth: {
+            written: "ABT 1819",
+            year: 1819,
+            month: 0,
+            day: 0,
+            mark: "about",
+            lastYear: 0,
+            shown: "~1819",
+            period: false,
+        },
         death: null,
         father: 0,
         mother: 0,
@@ -68,6 +77,7 @@ test("persons, families and facts are given as the file has them", () => {
         children: [3],
         parentFamilies: [],
         coupleFamilies: [1],
+        surnameFirst: false,
     });
     assert.deepEqual(file.persons[2].parentFamilies, [{ family: 1, pedigree: "adopted" }]);
     assert.equal(file.persons[2].sex, "other");

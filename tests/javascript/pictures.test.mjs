@@ -6,7 +6,7 @@
 import assert from "node:assert/strict";
 import test from "node:test";
 
-import { HostError, LayoutError, PERSON_NOT_FOUND } from "../../bindings/javascript/olvane.mjs";
+import { HostError, LayoutError, PERSON_NOT_FOUND, PICTURE_VIEWS } from "../../bindings/javascript/olvane.mjs";
 import { olvane } from "./module.mjs";
 
 // A couple with a child of their own and an adopted one; the husband's parents are divorced.
@@ -235,18 +235,7 @@ const shownIds = ({ boxes }) =>
         .sort();
 
 test("every view is drawn of a family that is handed over, and of a host that is asked", () => {
-    for (const view of [
-        "family",
-        "pedigree",
-        "near",
-        "ancestors",
-        "descendants",
-        "hourglass",
-        "relatives",
-        "fan",
-        "kinship",
-        "everybody",
-    ]) {
+    for (const view of PICTURE_VIEWS) {
         const options = { view, to: 5 };
         const ofTable = olvane.picture(table, 7, options);
         const ofHost = olvane.picture(host, 7, options);

@@ -23,10 +23,12 @@ export function person(id: number, name: string, more: Partial<Person> = {}): Pe
         children: [],
         parentFamilies: [],
         coupleFamilies: [],
+        surnameFirst: false,
         ...more,
     };
 }
 
 export function date(year: number, more: Partial<GedcomDate> = {}): GedcomDate {
-    return { written: String(year), year, month: 0, day: 0, mark: "exact", lastYear: 0, shown: String(year), ...more };
+    const written = String(year);
+    return { written, year, month: 0, day: 0, mark: "exact", lastYear: 0, shown: written, period: false, ...more };
 }

@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // Bundles each test beside this file and runs them all with node's own runner: node test/run.mjs
-// OLVANE_RESULTS may name a file for the results, as the reporter "junit" has them.
+// OLVANE_RESULTS may name a file for the results, as the reporter "junit" has them; OLVANE_JAVASCRIPT the folder of the
+// JavaScript binding where it is not that of these sources.
 
 import { spawnSync } from "node:child_process";
 import { mkdtempSync, readdirSync, rmSync } from "node:fs";
@@ -12,6 +13,7 @@ import { fileURLToPath } from "node:url";
 import { build } from "esbuild";
 
 const here = dirname(fileURLToPath(import.meta.url));
+const binding = process.env.OLVANE_JAVASCRIPT ?? join(here, "../../../bindings/javascript");
 const tests = readdirSync(here).filter((name) => name.endsWith(".test.ts"));
 const folder = mkdtempSync(join(tmpdir(), "olvane-page-test-"));
 try {
@@ -22,6 +24,7 @@ try {
         bundle: true,
         format: "esm",
         platform: "node",
+        alias: { olvane: join(binding, "olvane.mjs") },
         sourcemap: "inline",
         logLevel: "warning",
     });

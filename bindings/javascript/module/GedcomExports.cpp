@@ -12,7 +12,9 @@
 #include <string>
 #include <string_view>
 
+#include <olvane/gedcom/GedcomMedia.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/source/GedcomLabels.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "GedcomJson.h"
@@ -82,6 +84,7 @@ void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonI
     writeIds(json, data.children(id));
     writeParentFamilies(json, data.parentLinks(id));
     writeCoupleFamilies(json, data.coupleLinks(id));
+    json.number(gedcom::isSurnameFirst(data.firstName(id)) ? 1 : 0);
     json.end();
 }
 
@@ -205,6 +208,18 @@ js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus, int withT
         js::layOutSource(limited, static_cast<js::View>(view), focus, withText != 0, *answer);
         return answer.release();
     } catch (const std::bad_alloc&) {
+        return nullptr;
+    }
+}
+
+// The member of an archive that the FILE of a medium stands for; null for what lies outside.
+OLVANE_EXPORT("archive_member") const char* archiveMember(const char* file) {
+    try {
+        const auto member = gedcom::memberOfArchive(file);
+        if (!member) return nullptr;
+        js::lastText = *member;
+        return js::lastText.c_str();
+    } catch (const std::exception&) {
         return nullptr;
     }
 }

@@ -8,6 +8,8 @@
 #include <string_view>
 #include <vector>
 
+#include <olvane/gedcom/GedcomPeriod.h>
+
 namespace olvane::js {
 namespace {
 
@@ -56,6 +58,7 @@ void appendDate(JsonText& json, const gedcom::GedcomDate& date) {
     json.number(static_cast<int>(date.mark));
     json.number(date.lastYear);
     json.string(gedcom::displayYear(date));
+    json.number(gedcom::isPeriod(date) ? 1 : 0);
     json.end();
 }
 

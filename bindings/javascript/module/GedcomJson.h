@@ -13,7 +13,8 @@
 
 namespace olvane::js {
 
-// 0 for a date that is not given; else what was written, year, month, day, mark, last year and the text of the year.
+// 0 for a date that is not given; else what was written, year, month, day, mark, last year, the text of the year, and
+// whether it is a period.
 void appendDate(JsonText& json, const gedcom::GedcomDate& date);
 
 // 0 where there are none; else in the order of the fields of Details. A quality that is not given is -1.

@@ -59,6 +59,14 @@ const char* fitName(const char* given, const char* surname, int surnameFirst, do
     });
 }
 
+OLVANE_EXPORT("runs_right_to_left") int runsRightToLeft(const char* text) {
+    try {
+        return picture::runsRightToLeft(readable(text)) ? 1 : 0;
+    } catch (const std::exception&) {
+        return 0;
+    }
+}
+
 OLVANE_EXPORT("font_families") const char* fontFamilies() {
     return picture::kFontFamilies.data();
 }

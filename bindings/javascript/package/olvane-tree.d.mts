@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-import type { Olvane } from "./olvane.mjs";
+import type { DIRECTIONS, Olvane, PictureView } from "./olvane.mjs";
 
 /** The engine that all elements of the page share, for families of the program's own. */
 export declare function sharedEngine(): Promise<Olvane>;
@@ -9,23 +9,13 @@ export declare function sharedEngine(): Promise<Olvane>;
 /** What is looked at. Numbers of persons count from 1 in the order of the file. */
 export interface ViewState {
     readonly focus: number;
-    readonly view:
-        | "family"
-        | "pedigree"
-        | "near"
-        | "ancestors"
-        | "descendants"
-        | "hourglass"
-        | "relatives"
-        | "fan"
-        | "kinship"
-        | "everybody";
+    readonly view: PictureView;
     /** Columns of the pedigree, the focus's own included. */
     readonly generations: number;
     /** Of the other charts: generations above and below the focus, 0 for all. */
     readonly up: number;
     readonly down: number;
-    readonly direction: "down" | "up" | "left" | "right";
+    readonly direction: (typeof DIRECTIONS)[number];
     /** The other person of the kinship view; 0 for nobody. */
     readonly to: number;
     /** Whether parents who are not known have boxes, in the family view and the pedigree. */

@@ -8,7 +8,7 @@ import operator
 import os
 from collections.abc import Callable, Sequence
 from ctypes import byref, c_void_p
-from typing import Any, Literal
+from typing import Any, Literal, get_args
 
 from olvane import _picture_native as _native_picture
 from olvane._errors import HostError, LayoutError, Status
@@ -19,18 +19,7 @@ from olvane._layout import _Answers, _focus_number, _message, _options_struct, _
 from olvane._options import Options, View
 from olvane._picture import Picture
 
-_VIEWS: tuple[DrawView, ...] = (
-    "family",
-    "pedigree",
-    "near",
-    "ancestors",
-    "descendants",
-    "hourglass",
-    "relatives",
-    "fan",
-    "kinship",
-    "everybody",
-)
+_VIEWS: tuple[DrawView, ...] = get_args(DrawView)
 _DIRECTIONS = ("down", "up", "left", "right")
 _FANS = ("ancestors", "descendants")
 _WAYS = ("blood", "marriage", "both")

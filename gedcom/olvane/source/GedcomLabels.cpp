@@ -33,10 +33,14 @@ void setName(const PersonName& name, kin::PersonLabel& label) {
     label.surname = beginningOf(name.surname);
     if (label.given.empty() && label.surname.empty())
         label.given = displayName(name, GedcomLabels::kMostLabelBytes);
-    label.surnameFirst = name.written.starts_with('/') && !name.written.ends_with('/');
+    label.surnameFirst = isSurnameFirst(name);
 }
 
 }  // namespace
+
+bool isSurnameFirst(const PersonName& name) {
+    return name.written.starts_with('/') && !name.written.ends_with('/');
+}
 
 GedcomLabels::GedcomLabels(const GedcomData& data, ShownFacts shown, HiddenTexts hidden)
     : data_(&data), shown_(shown), hidden_(std::move(hidden)) {}

@@ -35,6 +35,9 @@ struct HiddenTexts {
     std::function<std::string_view(std::string_view)> shownText;
 };
 
+// Whether a name is written, and so read, with the surname first: "/Nagy/ Ilona".
+bool isSurnameFirst(const PersonName& name);
+
 // What a file says of the persons and families of a picture.
 //
 // Holds: refers to the data, which must outlive it. Safe to ask on several threads. Texts are at most kMostLabelBytes

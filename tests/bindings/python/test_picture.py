@@ -2,10 +2,16 @@
 # SPDX-License-Identifier: MIT
 """A picture in Python: boxes, families and lines as dataclasses, of a family and of a host."""
 
+import json
+import pathlib
 import unittest
 from collections.abc import Iterable
+from typing import get_args
 
 import olvane
+
+
+FIXTURES = pathlib.Path(__file__).parents[2] / "fixtures"
 
 
 class Couple:
@@ -38,6 +44,22 @@ class Couple:
 
 def ends(line: olvane.PictureLine) -> set[tuple[float, float]]:
     return {(line.x1, line.y1), (line.x2, line.y2)}
+
+
+class Names(unittest.TestCase):
+    """Those that libraries and other languages are tried with as well."""
+
+    rows = json.loads((FIXTURES / "views.json").read_text(encoding="utf-8"))
+
+    def test_views_have_the_names_of_the_rows(self) -> None:
+        self.assertEqual(list(get_args(olvane.DrawView)), [view["name"] for view in self.rows["views"]])
+
+    def test_relatives_have_the_numbers_of_the_rows(self) -> None:
+        def bare(name: str) -> str:
+            return name.replace("_", "").lower()
+
+        numbers = {bare(shown.name or ""): shown.value for shown in olvane.Shown}
+        self.assertEqual(numbers, {bare(name): value for name, value in self.rows["relatives"].items()})
 
 
 class Pictures(unittest.TestCase):

@@ -4,24 +4,13 @@
 // The names of views and directions, of the groups of relatives that can be switched off, and of the facts that can be
 // switched on.
 
-import type { PictureView, ShownFact } from "olvane";
+import { DIRECTIONS, FACTS, PICTURE_VIEWS, type PictureView, Shown } from "olvane";
 
 export type ViewName = PictureView;
 
-export const kViewNames = [
-    "family",
-    "pedigree",
-    "near",
-    "ancestors",
-    "descendants",
-    "hourglass",
-    "relatives",
-    "fan",
-    "kinship",
-    "everybody",
-] as const satisfies readonly ViewName[];
+export const kViewNames = PICTURE_VIEWS;
 
-export const kDirections = ["down", "up", "left", "right"] as const;
+export const kDirections = DIRECTIONS;
 export type ChartDirection = (typeof kDirections)[number];
 
 // Views whose relatives are switched by groups.
@@ -46,19 +35,18 @@ export function hasCompact(view: ViewName): boolean {
 }
 
 /** What boxes and lines can say beside names and years, in the order of the switches. */
-export const kShownFacts = ["dates", "places", "occupation", "marriage"] as const satisfies readonly ShownFact[];
+export const kShownFacts = FACTS;
 
-// In the order of the switches. A bit is the engine's own.
-export const kRelatives = {
-    siblings: 0x04,
-    siblingSpouses: 0x08,
-    niecesNephews: 0x10,
-    auntsUncles: 0x01,
-    cousins: 0x02,
-    greatGrandparents: 0x40,
-    spousesOfChildren: 0x80,
-    grandchildren: 0x20,
-} as const;
+// In the order of the switches.
+export const kRelativeNames = [
+    "siblings",
+    "siblingSpouses",
+    "niecesNephews",
+    "auntsUncles",
+    "cousins",
+    "greatGrandparents",
+    "spousesOfChildren",
+    "grandchildren",
+] as const satisfies readonly (keyof typeof Shown)[];
 
-export type RelativeName = keyof typeof kRelatives;
-export const kRelativeNames = Object.keys(kRelatives) as RelativeName[];
+export type RelativeName = (typeof kRelativeNames)[number];

@@ -62,18 +62,6 @@ export class Archive {
     }
 }
 
-/** The member that the FILE of a medium stands for; null for what lies outside the archive. */
-export function memberName(file: string): string | null {
-    let name = file;
-    try {
-        name = decodeURIComponent(file);
-    } catch {
-        // A path with a percent sign of its own.
-    }
-    const isOutside = /[\\:\0]/.test(name) || name.split("/").some((step) => ["", ".", ".."].includes(step));
-    return isOutside ? null : name;
-}
-
 interface Entry {
     readonly name: string;
     readonly method: number; // 0 as it is, 8 deflated

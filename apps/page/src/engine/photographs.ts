@@ -4,7 +4,7 @@
 // The photographs that came with a family: inside the page, or in the archive that was dropped. What a file links to
 // elsewhere is never fetched.
 
-import { type Archive, memberName } from "./archive";
+import type { Archive } from "./archive";
 
 const kMostBytes = 32 * 2 ** 20; // of one photograph, unpacked
 
@@ -25,9 +25,10 @@ export class Photographs {
         );
     }
 
-    static inArchive(archive: Archive): Photographs {
+    /** memberOf is the module's archiveMember. */
+    static inArchive(archive: Archive, memberOf: (file: string) => string | null): Photographs {
         return new Photographs((file) => {
-            const name = memberName(file);
+            const name = memberOf(file);
             return name === null || !archive.has(name) ? null : archive.bytesOf(name, kMostBytes).catch(() => null);
         });
     }

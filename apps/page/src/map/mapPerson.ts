@@ -25,11 +25,12 @@ export function mapPerson(map: FamilyMap, person: number): Person {
         children: [],
         parentFamilies: [],
         coupleFamilies: [],
+        surnameFirst: false,
     };
 }
 
 function yearAlone(year: number): GedcomDate | null {
     if (year === 0) return null;
     const written = String(year);
-    return { written, year, month: 0, day: 0, mark: "exact", lastYear: 0, shown: written };
+    return { written, year, month: 0, day: 0, mark: "exact", lastYear: 0, shown: written, period: false };
 }

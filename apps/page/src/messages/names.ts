@@ -6,8 +6,6 @@
 import type { GedcomDate, Person } from "olvane";
 import type { DateMark, Messages } from "../messages";
 
-export type Direction = "ltr" | "rtl";
-
 /** The name to show, and a word for one who has none. */
 export function nameOf(person: Person, messages: Messages): string {
     return person.name ? shortened(person.name) : messages.unknownName;
@@ -42,11 +40,9 @@ function yearText(date: GedcomDate | null, messages: Messages): string {
     return date && date.year !== 0 ? textOf(date, 0, 0, date.mark, messages) : "";
 }
 
-// GEDCOM writes FROM and TO of what lasted; as dates they mean no more than AFT, BEF and BET do.
-const kLasting = /^\s*(FROM|TO)\b/i;
-
-function lastingMarkOf({ mark, written }: GedcomDate): DateMark {
-    if (!kLasting.test(written)) return mark;
+// As dates the beginning and the end of what lasted mean no more than after and before do.
+function lastingMarkOf({ mark, period }: GedcomDate): DateMark {
+    if (!period) return mark;
     if (mark === "between") return "lasting";
     return mark === "after" ? "since" : mark === "before" ? "until" : mark;
 }
@@ -64,15 +60,4 @@ function textOf(date: GedcomDate, month: number, day: number, mark: DateMark, me
 export function placeText(place: string): string {
     const parts = place.split(",").map((part) => part.trim());
     return parts.filter((part) => part !== "").join(", ");
-}
-
-// Hebrew, Arabic, Syriac, Thaana, N'Ko and their neighbours, the forms for printing, the old scripts of the east,
-// and the two marks of direction themselves.
-const kRightToLeft = /[\u0590-\u08ff\u200f\ufb1d-\ufdff\ufe70-\ufeff\u{10800}-\u{10fff}\u{1e800}-\u{1efff}]/u;
-const kStrong = /[\p{L}\u200e\u200f\u061c]/u;
-
-/** By the first letter; left to right for a text without letters. */
-export function directionOf(text: string): Direction {
-    const strong = kStrong.exec(text);
-    return strong && kRightToLeft.test(strong[0]) ? "rtl" : "ltr";
 }

@@ -7,7 +7,7 @@
 import type { NameParts, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { directionOf, nameOf, yearsOf } from "../messages/names";
+import { nameOf, yearsOf } from "../messages/names";
 import type { BoxLook } from "./boxArt";
 import type { BoxContents } from "./Scene";
 import type { KinshipTexts } from "../view/KinshipTexts";
@@ -108,7 +108,7 @@ export class PictureContents implements BoxContents {
             sex: person.sex,
             name: nameParts(person, messages),
             texts: this.texts,
-            rightToLeft: directionOf(person.name) === "rtl",
+            rightToLeft: this.texts.runsRightToLeft(person.name),
             inside: this.wording.render?.(person, box) ?? null,
             photo: this.wording.portraitOf?.(person.id) ?? null,
             years: dates.join("  ") || shortYears(person),
@@ -170,9 +170,8 @@ function datesOf({ birth, death }: PersonLabel): string[] {
     return [birth && "* " + birth, death && "\u2020 " + death].filter(Boolean);
 }
 
-// Surname first where the file writes it first.
 function nameParts(person: Person, messages: Messages): NameParts {
-    const { given, surname, name } = person;
+    const { given, surname, surnameFirst } = person;
     if (!given || !surname) return { given: nameOf(person, messages), surname: "" };
-    return { given, surname, surnameFirst: name.startsWith(surname) && !name.endsWith(surname) };
+    return { given, surname, surnameFirst };
 }

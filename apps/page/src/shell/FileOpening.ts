@@ -88,7 +88,9 @@ export class FileOpening {
         const archive = isArchive(bytes) ? new Archive(bytes) : null;
         const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
         if (gedcom.length === 0) throw new EmptyFileError();
-        const photographs = archive ? Photographs.inArchive(archive) : Photographs.none;
+        const photographs = archive
+            ? Photographs.inArchive(archive, (name) => this.engine.archiveMember(name))
+            : Photographs.none;
         const opened =
             gedcom.length < kLargeFile
                 ? this.read(gedcom, file.name, "", photographs)

@@ -3,7 +3,7 @@
 
 // What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
 
-import type { Person, PictureOptions, ShownFact } from "olvane";
+import { type Person, type PictureOptions, Shown, type ShownFact } from "olvane";
 import {
     type ChartDirection,
     hasCompact,
@@ -12,7 +12,6 @@ import {
     hasUp,
     kDirections,
     kRelativeNames,
-    kRelatives,
     kShownFacts,
     kViewNames,
     type RelativeName,
@@ -41,7 +40,7 @@ export interface ViewState {
     readonly show: ReadonlySet<ShownFact>;
     // Whether boxes show photographs.
     readonly photos: boolean;
-    // Names of kRelatives that are switched off.
+    // Relatives who are switched off.
     readonly hidden: ReadonlySet<RelativeName>;
 }
 
@@ -103,7 +102,7 @@ export function optionsOf(state: ViewState, language: PictureOptions["language"]
 }
 
 function shownBits(state: ViewState): number {
-    return kRelativeNames.reduce((bits, name) => (state.hidden.has(name) ? bits : bits | kRelatives[name]), 0);
+    return kRelativeNames.reduce((bits, name) => (state.hidden.has(name) ? bits : bits | Shown[name]), 0);
 }
 
 export function sameState(a: ViewState, b: ViewState): boolean {

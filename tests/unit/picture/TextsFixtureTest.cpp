@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+// The rows that the module for JavaScript is tried with as well.
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+#include <nlohmann/json.hpp>
+#include <string>
+
+#include <olvane/picture/TextFit.h>
+
+namespace olvane::picture {
+namespace {
+
+using nlohmann::json;
+
+const json& fixture() {
+    static const json kRows = json::parse(std::ifstream(OLVANE_FIXTURES "/texts.json"));
+    return kRows;
+}
+
+TEST(TextsFixture, aLineIsShortenedAsInTheRows) {
+    for (const json& row : fixture()["lines"]) {
+        const std::string text = row["text"];
+        EXPECT_EQ(fitLine(cleanText(text), {row["size"], row["bold"]}, row["width"]), row["line"]) << text;
+    }
+}
+
+TEST(TextsFixture, aNameIsBrokenIntoTheLinesOfTheRows) {
+    for (const json& row : fixture()["names"]) {
+        const std::string given = row["given"];
+        const std::string surname = row["surname"];
+        const FittedName name =
+            fitName(given, surname, row.value("surnameFirst", false), {row["width"], row["height"]});
+        EXPECT_EQ(name.size, row["size"]) << given;
+        EXPECT_EQ(json(name.lines), row["lines"]) << given;
+    }
+}
+
+TEST(TextsFixture, aTextRunsAsItsFirstLetterDoes) {
+    for (const std::string text : fixture()["fromTheRight"]) EXPECT_TRUE(runsRightToLeft(text)) << text;
+    for (const std::string text : fixture()["fromTheLeft"]) EXPECT_FALSE(runsRightToLeft(text)) << text;
+}
+
+}  // namespace
+}  // namespace olvane::picture
