@@ -50,6 +50,7 @@ ChartRequest requestFrom(const Bytes& choose, const KinGraph& graph) {
     request.fanAngle = 90 + 10 * choose(28);
     request.ways = static_cast<WayChoice>(choose(3));
     request.compact = choose(2) == 0;
+    request.mirrored = choose(2) == 0;
     return request;
 }
 

@@ -366,11 +366,20 @@ private:
     // Without a family these would change nothing.
     void needsFile(CLI::Option* option) { option->needs(page_->get_option("FILE")); }
 
+    static void refuseMirroredText(const LayoutRequest& request, bool isPicture) {
+        if (!request.chart.mirrored || isPicture) return;
+        throw UsageError(
+            "--mirror changes pictures, and no result text; --format json of olvane layout is a picture");
+    }
+
     LayoutOptions completedLayoutOptions() const {
         LayoutOptions options = layoutOptions_;
         completeViewOptions(*layout_, options.request);
         options.request.unknownParents = true;  // they are in the layout
-        if (isEngineView(options.request.view())) return options;
+        if (isEngineView(options.request.view())) {
+            refuseMirroredText(options.request, options.format == LayoutFormat::json);
+            return options;
+        }
         if (!isGiven(*layout_, "--format")) options.format = LayoutFormat::json;
         if (options.format != LayoutFormat::json) {
             throw UsageError(
@@ -383,6 +392,7 @@ private:
     BatchOptions completedBatchOptions() const {
         BatchOptions options = batchOptions_;
         completeViewOptions(*batch_, options.request);
+        refuseMirroredText(options.request, !isEngineView(options.request.view()));
         return options;
     }
 

@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/charts/BoxForm.h>
@@ -25,6 +26,7 @@ struct LayoutRequest {
     charts::ChartRequest chart{};
     BoxForm boxes = BoxForm::tall;
     std::string to;  // of the kinship view, as the user names the person; checked by PictureRun
+    std::vector<std::string> folds;  // "I5:down", "I5"; checked by PictureRun
     gedcom::ParentChoice parents{};
     bool unknownParents = false;  // a picture of a view of the engine has boxes for parents who are not known
 

@@ -8,6 +8,7 @@
 #include <utility>
 
 #include <olvane/picture/HiddenPersons.h>
+#include <olvane/picture/PictureNames.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomKin.h>
 
@@ -20,6 +21,21 @@ namespace {
 
 constexpr const char* kLivingJson = "{\"living\": true}";
 
+// "Ann Berg:down"; without a branch, all three of the person.
+std::vector<charts::Fold> foldsOf(const gedcom::GedcomData& data, const std::string& word) {
+    constexpr picture::Branch kBranches[] = {picture::Branch::up, picture::Branch::down,
+                                             picture::Branch::beside};
+    for (const picture::Branch branch : kBranches) {
+        const std::string end = ":" + std::string(picture::nameOf(branch));
+        if (!word.ends_with(end)) continue;
+        return {{chooseFocus(data, word.substr(0, word.size() - end.size())), branch}};
+    }
+    const gedcom::PersonId person = chooseFocus(data, word);
+    std::vector<charts::Fold> folds;
+    for (const picture::Branch branch : kBranches) folds.push_back({person, branch});
+    return folds;
+}
+
 }  // namespace
 
 PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden)
@@ -31,6 +47,9 @@ PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& requ
       graph_(gedcom::kinGraphOf(data, request.parents)) {
     charts::setBoxForm(view_.chart, request.boxes);
     charts::flagBeyondGenerations(view_.chart);
+    for (const std::string& word : request.folds) {
+        for (const charts::Fold& fold : foldsOf(data, word)) folds_.push_back(fold);
+    }
     if (request.view() == View::kinship) view_.chart.to = graph_.placeOf(chooseFocus(data, request.to));
 }
 
@@ -38,6 +57,7 @@ picture::Picture PictureRun::pictureOf(gedcom::PersonId focus) const {
     gedcom::GedcomDataSource people(data_, parents_);
     charts::ViewRequest view = view_;
     view.chart.focus = graph_.placeOf(focus);
+    view.chart.folded = folds_;
     picture::Picture picture = charts::pictureOf(limitedSource(people), graph_, view);
     picture::hidePersons(hidden_, picture);
     return picture;

@@ -37,6 +37,7 @@ public:
 private:
     const gedcom::GedcomData& data_;
     charts::ViewRequest view_;
+    std::vector<charts::Fold> folds_;
     std::vector<bool> hidden_;
     gedcom::HiddenNames hiddenNames_;
     gedcom::ParentChoice parents_;

@@ -81,6 +81,7 @@ const std::vector<OptionUse>& optionUses() {
         {"--direction", kDirected},
         {"--compact",
          {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives, View::kinship}},
+        {"--fold", {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives}},
         {"--siblings", {View::ancestors, View::hourglass}},
         {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
         {"--to", {View::kinship}},
@@ -164,6 +165,20 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
         ->check(number(90.0, 360.0))
         ->type_name("DEGREES")
         ->group(group);
+}
+
+void addFolds(CLI::App& command, LayoutRequest& request) {
+    command
+        .add_option(
+            "--fold", request.folds,
+            "Leave out a branch of somebody, named like the one of --focus: ancestors, descendants, or "
+            "partners and siblings with theirs; all three without a word behind the colon. The box says how "
+            "many persons that hides")
+        ->delimiter(',')
+        ->type_name("WHO[:up|down|beside],...")
+        ->group(kDepthGroup);
+    command.add_flag("--mirror", request.chart.mirrored,
+                     "Exchange right and left in the picture, for those who read from right to left");
 }
 
 void addOtherPerson(CLI::App& command, LayoutRequest& request) {
@@ -313,6 +328,7 @@ void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string
     addBoxes(command, request, boxDefaults);
     addReach(command, request.chart);
     addChartOptions(command, request.chart);
+    addFolds(command, request);
     addOtherPerson(command, request);
     addKinshipOptions(command, request);
     addLanguage(command, request.chart.language);

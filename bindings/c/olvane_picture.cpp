@@ -48,6 +48,7 @@ struct olvane_picture {
     std::vector<olvane_picture_piece> wayPieces;
     std::string focusIs;
     std::string otherIs;
+    std::vector<olvane_picture_folded> folded;
     std::string failure;
 
     olvane::picture::Picture
@@ -55,6 +56,7 @@ struct olvane_picture {
     mutable std::mutex guard;
     mutable std::string json;
     std::int32_t direction = 0;  // of a view in one call
+    bool mirrored = false;
 };
 
 namespace {
@@ -138,6 +140,10 @@ void fill(picture::Picture from, olvane_picture& to) {
     to.middleX = from.middleX;
     to.middleY = from.middleY;
     fillKinship(from, to);
+    copyAll(from.folded, to.folded, [](const picture::FoldedBranch& folded) {
+        return olvane_picture_folded{folded.box, folded.count, static_cast<std::int32_t>(folded.branch),
+                                     static_cast<std::int32_t>(folded.side)};
+    });
     to.source = std::move(from);
 }
 
@@ -158,6 +164,10 @@ bool areInRange(const olvane_picture_options& options) {
     for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding}) {
         if (!(size >= 0)) return false;
     }
+    if (!options.folds && options.fold_count > 0) return false;
+    for (std::size_t i = 0; i < options.fold_count; ++i) {
+        if (!isOneOf(options.folds[i].branch, 3)) return false;
+    }
     return options.struct_size == sizeof(olvane_picture_options) && isOneOf(options.view, 10) &&
            options.up >= 0 && options.down >= 0 && isOneOf(options.direction, 4) &&
            isOneOf(options.fan_of, 2) && options.fan_angle >= 90 && options.fan_angle <= 360 &&
@@ -166,7 +176,7 @@ bool areInRange(const olvane_picture_options& options) {
            isOneOf(options.year, olvane::c::kLastYear + 1) && olvane::c::areInRange(options.layout);
 }
 
-charts::ViewRequest requestOf(const olvane_picture_options& options) {
+charts::ViewRequest viewOf(const olvane_picture_options& options) {
     charts::ViewRequest request;
     charts::ChartRequest& chart = request.chart;
     chart.view = static_cast<charts::View>(options.view);
@@ -176,6 +186,7 @@ charts::ViewRequest requestOf(const olvane_picture_options& options) {
     chart.spouses = options.spouses != 0;
     chart.siblings = options.siblings != 0;
     chart.compact = options.compact != 0;
+    chart.mirrored = options.mirrored != 0;
     chart.fanOf = static_cast<charts::FanOf>(options.fan_of);
     chart.fanAngle = options.fan_angle;
     chart.ways = static_cast<charts::WayChoice>(options.ways);
@@ -188,7 +199,7 @@ charts::ViewRequest requestOf(const olvane_picture_options& options) {
     chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
                    options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
     const olvane_picture* earlier = options.earlier;
-    if (earlier && earlier->direction == options.direction && earlier->source.view == "everybody")
+    if (earlier && earlier->direction == options.direction && earlier->mirrored == chart.mirrored && earlier->source.view == "everybody")
         chart.earlier = &earlier->source;
     request.unknownParents = options.unknown_parents != 0;
     return request;
@@ -197,7 +208,22 @@ charts::ViewRequest requestOf(const olvane_picture_options& options) {
 void fillAsked(picture::Picture from, const olvane_picture_options& options, olvane_picture& to) {
     fill(std::move(from), to);
     to.direction = options.direction;
+    to.mirrored = options.mirrored != 0;
 }
+// A request, and the folds that it refers to.
+struct Request {
+    explicit Request(const olvane_picture_options& options) : view(viewOf(options)) {
+        for (std::size_t i = 0; i < options.fold_count; ++i) {
+            folds.push_back({options.folds[i].person, static_cast<picture::Branch>(options.folds[i].branch)});
+        }
+        view.chart.folded = folds;
+    }
+    Request(const Request&) = delete;
+    Request& operator=(const Request&) = delete;
+
+    std::vector<charts::Fold> folds;
+    charts::ViewRequest view;
+};
 
 olvane_picture_options chosenOptions(const olvane_picture_options* options) {
     olvane_picture_options chosen;
@@ -225,13 +251,14 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
         if (!file.has(person)) throw std::out_of_range("no person of the file");
         return file.graph().placeOf(person);
     };
-    charts::ViewRequest request = requestOf(options);
-    request.chart.focus = placeOf(focus);
-    if (request.chart.view == charts::View::kinship) request.chart.to = placeOf(options.other);
+    Request request(options);
+    charts::ChartRequest& chart = request.view.chart;
+    chart.focus = placeOf(focus);
+    if (chart.view == charts::View::kinship) chart.to = placeOf(options.other);
     olvane::gedcom::GedcomDataSource people(file.data);
     const auto source =
         std::make_shared<olvane::gedcom::LimitedDataSource>(people, olvane::c::kMostRelatives);
-    picture::Picture made = charts::pictureOf(source, file.graph(), request);
+    picture::Picture made = charts::pictureOf(source, file.graph(), request.view);
     const std::vector<bool> hidden =
         options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
     picture::hidePersons(hidden, made);
@@ -262,7 +289,7 @@ olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focu
     const olvane_picture_options chosen = chosenOptions(options);
     if (!family || !areInRange(chosen) || chosen.hide_living != 0) return OLVANE_INVALID_ARGUMENT;
     const auto work = [&](olvane_picture& made) {
-        fillAsked(charts::pictureOf(family->table, focus, requestOf(chosen), chosen.other), chosen, made);
+        fillAsked(charts::pictureOf(family->table, focus, Request(chosen).view, chosen.other), chosen, made);
     };
     return make(work, picture);
 }
@@ -286,7 +313,7 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
     }
     const auto work = [&](olvane_picture& made) {
         if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
-        fillAsked(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, requestOf(chosen), chosen.other),
+        fillAsked(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).view, chosen.other),
                   chosen, made);
     };
     olvane_status status = OLVANE_NESTED_CALL;
@@ -360,7 +387,9 @@ olvane_status olvane_picture_read(const olvane_picture* picture, olvane_picture_
                dataOrNull(picture->wayPieces),
                picture->wayPieces.size(),
                picture->focusIs.c_str(),
-               picture->otherIs.c_str()};
+               picture->otherIs.c_str(),
+               dataOrNull(picture->folded),
+               picture->folded.size()};
     return OLVANE_OK;
 }
 

@@ -127,6 +127,14 @@ typedef struct olvane_picture_piece {
     double y2;
 } olvane_picture_piece;
 
+/* A branch that is left out: count persons would have boxes with it, on that side of the box. */
+typedef struct olvane_picture_folded {
+    int32_t box;
+    int32_t count;
+    int32_t branch; /* of olvane_fold */
+    int32_t side;   /* 0 top, 1 right, 2 bottom, 3 left */
+} olvane_picture_folded;
+
 /* All arrays of a picture; those of no entries are null. */
 typedef struct olvane_picture_arrays {
     size_t
@@ -161,6 +169,8 @@ typedef struct olvane_picture_arrays {
     size_t way_piece_count;
     const char* focus_is; /* what the focus is to the other person, in words; empty without a way */
     const char* other_is;
+    const olvane_picture_folded* folded;
+    size_t folded_count;
 } olvane_picture_arrays;
 
 typedef struct olvane_picture olvane_picture;
@@ -187,6 +197,13 @@ typedef enum olvane_picture_view {
     OLVANE_PICTURE_EVERYBODY = 9
 } olvane_picture_view;
 
+/* A branch of a person that is left out: everybody to whom only it leads. */
+typedef struct olvane_fold {
+    int64_t person;
+    int32_t
+        branch; /* 0 ancestors, 1 descendants, 2 partners and, of the focus and its ancestors, siblings with theirs */
+} olvane_fold;
+
 /* What a view has no use for is ignored. */
 typedef struct olvane_picture_options {
     size_t struct_size;      /* sizeof(olvane_picture_options); olvane_picture_options_default sets it */
@@ -209,6 +226,10 @@ typedef struct olvane_picture_options {
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
     int32_t hide_living; /* of a file: 1 to state nothing of whoever may be living, and to say who that is */
     int32_t year;        /* the year that hide_living counts from; 0 for the present one */
+    int32_t mirrored;        /* 1 for right and left exchanged */
+    const olvane_fold*
+        folds; /* near, ancestors, descendants, hourglass, relatives; may be null without any */
+    size_t fold_count;
     olvane_options
         layout; /* the box and the gaps of every view; family, near: shown; pedigree: generations */
     /* Everybody: an earlier picture of everybody, or null. It is read during the call only. Whoever is in both, by id,

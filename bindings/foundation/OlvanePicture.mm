@@ -144,6 +144,7 @@ charts::ViewRequest requestOf(OlvanePictureOptions* options) {
     chart.spouses = options.spouses;
     chart.siblings = options.siblings;
     chart.compact = options.compact;
+    chart.mirrored = options.mirrored;
     chart.fanOf = choice<charts::FanOf>(options.fanOf);
     chart.fanAngle = options.fanAngle;
     chart.ways = choice<charts::WayChoice>(options.ways);

@@ -16,6 +16,7 @@
 @synthesize spouses = _spouses;
 @synthesize siblings = _siblings;
 @synthesize compact = _compact;
+@synthesize mirrored = _mirrored;
 @synthesize fanOf = _fanOf;
 @synthesize fanAngle = _fanAngle;
 @synthesize other = _other;

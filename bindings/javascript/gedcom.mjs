@@ -8,7 +8,7 @@ import { GedcomError, LayoutError } from "./errors.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
-import { readPicture } from "./picture.mjs";
+import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
 import { drawingNumbers, factBits, paperNumbers, pictureNumbers } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
@@ -209,6 +209,16 @@ export class GedcomFile {
         const file = this.#opened();
         this.#setPictureOptions(focus, options);
         return readPicture(this.#instance, options, exports.gedcom_picture(file, focus)) ?? this.#refuse();
+    }
+
+    branches(focus, person, options = {}) {
+        const { exports } = this.#instance;
+        const file = this.#opened();
+        this.#setPictureOptions(focus, options);
+        const answer = exports.gedcom_branches(file, focus, this.#person(person));
+        if (answer === 0) this.#refuse();
+        const numbers = new Int32Array(exports.memory.buffer, answer >>> 0, 6);
+        return BRANCHES.map((branch, i) => ({ branch, count: numbers[2 * i], side: SIDES[numbers[2 * i + 1]] }));
     }
 
     takePlacesOf(earlier) {

@@ -194,6 +194,10 @@ export interface PictureOptions {
     effort?: number | undefined;
     /** Everybody: those as well who are not connected with the focus; false. */
     allParts?: boolean | undefined;
+    /** Every view: right and left exchanged; false. */
+    mirrored?: boolean | undefined;
+    /** Near, ancestors, descendants, hourglass, relatives: branches that are left out; none. */
+    folded?: Iterable<Fold> | undefined;
     /** Everybody: width by height of the paper that wide generations are folded for; 0 for no paper. */
     aspect?: number | undefined;
     /**
@@ -381,6 +385,27 @@ export interface PictureMark {
     readonly boxes: readonly PictureIndex[];
 }
 
+/** Ancestors; descendants; or partners and, of the focus and its ancestors, siblings with theirs. */
+export type Branch = "up" | "down" | "beside";
+
+/** A branch of a person that is left out: everybody to whom only it leads. */
+export interface Fold {
+    readonly person: number;
+    readonly branch: Branch;
+}
+
+/** How many persons a branch has for itself, and on which side of the box it stands. */
+export interface BranchSize {
+    readonly branch: Branch;
+    readonly count: number;
+    readonly side: "top" | "right" | "bottom" | "left";
+}
+
+/** A branch that is left out. */
+export interface FoldedBranch extends BranchSize {
+    readonly box: PictureIndex;
+}
+
 /** What is drawn, as values. arcs has one entry for each box of a round chart, and is empty otherwise. */
 export interface Picture {
     readonly view: PictureView;
@@ -391,6 +416,7 @@ export interface Picture {
     readonly rings: PictureRings | null;
     readonly families: readonly PictureFamily[];
     readonly marks: readonly PictureMark[];
+    readonly folded: readonly FoldedBranch[];
     /** Of the view of kinship; else null. */
     readonly kinship: PictureKinship | null;
 }
@@ -679,6 +705,11 @@ export class GedcomFile {
     layoutText(focus: number, options?: Options): string;
     /** The picture of a view, with its lines. Throws LayoutError, and TypeError and RangeError as the options say. */
     picture(focus: number, options?: PictureOptions): Picture;
+    /**
+     * The branches up, down and beside of a person in a picture, with how many persons each hides where it is folded, or
+     * would hide.
+     */
+    branches(focus: number, person: number, options?: PictureOptions): readonly BranchSize[];
     /**
      * This file is a later version of another, which is open still: its next picture with keepPlaces keeps the places of
      * the other's last one, for all persons who have the same xref in both. False where there is no such picture.

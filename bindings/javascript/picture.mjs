@@ -10,7 +10,10 @@ const STYLES = ["married", "divorced", "unmarried", "unknown"];
 const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
 const WAY_KINDS = ["blood", "legal", "marriage"];
-const HEAD = 15;
+/** In the order of the module's numbers. */
+export const BRANCHES = ["up", "down", "beside"];
+export const SIDES = ["top", "right", "bottom", "left"];
+const HEAD = 16;
 
 function boxAt(n, at, index) {
     return {
@@ -92,7 +95,7 @@ export function pictureFrom(view, numbers, texts) {
         middleX,
         middleY,
     ] = numbers;
-    const [other, wayCount, wayBoxCount, pieceCount] = numbers.subarray(11, HEAD);
+    const [other, wayCount, wayBoxCount, pieceCount, foldedCount] = numbers.subarray(11, HEAD);
     // Lists refer to those behind them, so each is read where it lies before any is put together.
     const starts = {};
     let at = HEAD;
@@ -111,6 +114,7 @@ export function pictureFrom(view, numbers, texts) {
     place("ways", wayCount, 6);
     place("wayBoxes", wayBoxCount, 1);
     place("pieces", pieceCount, 4);
+    place("folded", foldedCount, 4);
     const list = (name, count, size, make) =>
         Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
     const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
@@ -133,6 +137,12 @@ export function pictureFrom(view, numbers, texts) {
                 : { radii: Array.from(numbers.subarray(starts.rings, starts.rings + ringCount)), middleX, middleY },
         families: list("families", familyCount, 7, (start) => familyAt(numbers, start, members, lines)),
         marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
+        folded: list("folded", foldedCount, 4, (start) => ({
+            box: numbers[start],
+            count: numbers[start + 1],
+            branch: BRANCHES[numbers[start + 2]],
+            side: SIDES[numbers[start + 3]],
+        })),
         kinship:
             other < 0
                 ? null

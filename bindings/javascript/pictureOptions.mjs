@@ -3,6 +3,7 @@
 
 // What a caller asks of a picture, checked before the module hears of it, as options.mjs does for layouts.
 
+import { BRANCHES } from "./picture.mjs";
 import { DIRECTIONS, FACTS, PICTURE_VIEWS, Shown } from "./values.mjs";
 
 const FANS = ["ancestors", "descendants"];
@@ -43,6 +44,8 @@ const OPTIONS = {
     gapY: { size: true, usual: 30 },
     aspect: { size: true, usual: 0 },
     keepPlaces: { flag: true, usual: false },
+    mirrored: { flag: true, usual: false },
+    folded: { folds: true, usual: [] },
 };
 
 function quoted(value) {
@@ -70,7 +73,17 @@ function plainNumber(name, value, { least, most, size }) {
     throw new RangeError(`${name} is ${value}, and takes a whole number of ${least} to ${most}`);
 }
 
+/** How many folds there are, then the person and the branch of each. */
+function foldNumbers(folds) {
+    const numbers = [...folds].flatMap(({ person, branch }) => [
+        plainNumber("folded", person, { least: 1, most: MOST }),
+        wordNumber("folded", branch, BRANCHES),
+    ]);
+    return [numbers.length / 2, ...numbers];
+}
+
 function numberOf(name, value, option) {
+    if (option.folds) return foldNumbers(value);
     if (option.words) return wordNumber(name, value, option.words);
     return option.flag ? flagNumber(name, value) : plainNumber(name, value, option);
 }
@@ -116,5 +129,5 @@ export function pictureNumbers(options) {
             throw new TypeError(`there is no option ${name}, but ${Object.keys(OPTIONS).join(", ")}`);
         }
     }
-    return Object.entries(OPTIONS).map(([name, option]) => numberOf(name, options[name] ?? option.usual, option));
+    return Object.entries(OPTIONS).flatMap(([name, option]) => numberOf(name, options[name] ?? option.usual, option));
 }

@@ -139,6 +139,36 @@ test("persons of a later version of a file keep their places by xref, whatever t
     assert.equal(moved.length, 2);
 });
 
+test("branches are counted, left out and counted again", () => {
+    const options = { view: "descendants" };
+    const sizesOf = (sizes) => sizes.map(({ branch, count, side }) => `${branch} ${count} ${side}`);
+    const whole = file.picture(5, options);
+    assert.deepEqual(whole.folded, []);
+    assert.deepEqual(sizesOf(file.branches(5, 1, options)), ["up 0 top", "down 2 bottom", "beside 1 right"]);
+    const folded = [{ person: 1, branch: "down" }];
+    const picture = file.picture(5, { ...options, folded });
+    assert.deepEqual(picture.boxes.map(({ id }) => id).sort(), [1, 2, 5, 6]);
+    const box = picture.boxes.find(({ id }) => id === 1).index;
+    assert.deepEqual(picture.folded, [{ box, count: 2, branch: "down", side: "bottom" }]);
+    assert.deepEqual(sizesOf(file.branches(5, 1, { ...options, folded, mirrored: true })), [
+        "up 0 top",
+        "down 2 bottom",
+        "beside 1 left",
+    ]);
+    assert.throws(() => file.picture(5, { ...options, folded: [{ person: 1, branch: "aside" }] }), TypeError);
+    assert.throws(() => file.branches(5, 7, options), RangeError);
+});
+
+test("a mirrored picture has right and left exchanged", () => {
+    for (const view of ["family", "pedigree", "descendants", "fan", "everybody"]) {
+        const [plain, mirrored] = [false, true].map((on) => file.picture(5, { view, mirrored: on }));
+        const middles = ({ boxes }) => boxes.map(({ x, width }) => x + width / 2);
+        const axis = middles(plain)[0] + middles(mirrored)[0];
+        for (const [i, x] of middles(plain).entries())
+            assert.ok(Math.abs(x + middles(mirrored)[i] - axis) < 1e-6, view);
+    }
+});
+
 test("what cannot be asked for is refused by its name", () => {
     assert.throws(() => file.picture(1, { view: "tree" }), /view is "tree", and takes one of family, pedigree/);
     assert.throws(() => file.picture(1, { depth: 3 }), /there is no option depth/);

@@ -11,7 +11,7 @@ _olvane() {
         words=("${COMP_WORDS[@]}"); cword=$COMP_CWORD; cur=${words[cword]}; prev=${words[cword - 1]}
     fi
     local commands="people layout draw batch check kin judge page"
-    local view="--view --generations --boxes --parents --up --down --direction --compact --siblings --no-spouses --to --by --ways --language --marks --effort --all-parts --of --angle"
+    local view="--view --generations --boxes --parents --up --down --direction --mirror --fold --compact --siblings --no-spouses --to --by --ways --language --marks --effort --all-parts --of --angle"
     local family="--no-aunts-uncles --no-cousins --no-siblings --no-sibling-spouses --no-nieces-nephews \
         --no-grandchildren --no-great-grandparents --no-spouses-of-children"
     local living="--hide-living --year"
@@ -25,7 +25,7 @@ _olvane() {
         --parents) COMPREPLY=($(compgen -W "birth adoptive all-in-order" -- "$cur")); return ;;
         --by) COMPREPLY=($(compgen -W "blood marriage both" -- "$cur")); return ;;
         --effort) COMPREPLY=($(compgen -W "0 1 2 3 4" -- "$cur")); return ;;
-        --ways | --marks | --to) return ;;
+        --ways | --marks | --to | --fold) return ;;
         --direction) COMPREPLY=($(compgen -W "down up left right" -- "$cur")); return ;;
         --up | --down) COMPREPLY=($(compgen -W "0 1 2 3 4 5 6 7 8" -- "$cur")); return ;;
         --generations) COMPREPLY=($(compgen -W "1 2 3 4 5 6 7 8 9 10 11 12" -- "$cur")); return ;;

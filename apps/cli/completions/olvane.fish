@@ -21,6 +21,8 @@ complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l generations
 complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l up -x -a '(seq 0 8)' -d 'Generations above the focus'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l down -x -a '(seq 0 8)' -d 'Generations below the focus'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts page" -l direction -x -a 'down up left right' -d 'Where later generations stand'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l mirror -d 'Exchange right and left'
+complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l fold -x -d 'Leave out branches: WHO[:up|down|beside],...'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l compact -d 'Pack a tree tighter'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l siblings -d 'Show siblings of ancestors'
 complete -c olvane -n "__fish_seen_subcommand_from $layouts" -l no-spouses -d 'Leave out spouses of descendants'

@@ -20,7 +20,8 @@ using js::HeldFamily;
 // As gedcom_picture, of a person by id.
 OLVANE_EXPORT("family_picture") std::vector<double>* familyPicture(HeldFamily* family, std::int32_t focus) {
     return js::pictureAnswer([&] {
-        const charts::ViewRequest view = js::requestOf(0).view;
+        const js::PictureRequest request = js::requestOf(0);
+        const charts::ViewRequest view = js::viewOf(request);
         return charts::pictureOf(family->table, focus, view, std::int64_t{view.chart.to} + 1);
     });
 }

@@ -3,10 +3,14 @@
 
 // Pictures of an open GEDCOM file, and of a host in JavaScript, as runs of numbers.
 
+#include <array>
+#include <cstdint>
+#include <exception>
 #include <string>
 #include <utility>
 #include <vector>
 
+#include <olvane/charts/Folding.h>
 #include <olvane/charts/Views.h>
 
 #include <LayoutInternal.h>
@@ -35,13 +39,35 @@ OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* fil
     return js::pictureAnswer([&] { return js::pictureOf(*file, js::requestOf(focus - 1)); });
 }
 
-// The same of a host in JavaScript. Null where it failed; picture_status then says how, and last_text why.
+// How many persons the branches up, down and beside of a person have for themselves, and on which side of the box each
+// stands: six numbers. Null for a picture that is refused; last_text then says why.
+OLVANE_EXPORT("gedcom_branches")
+const std::int32_t* gedcomBranches(OpenFile* file, std::int32_t focus, std::int32_t person) {
+    static std::array<std::int32_t, 6> answer;
+    try {
+        const js::PictureRequest request = js::requestOf(focus - 1);
+        const charts::ChartRequest chart = js::viewOf(request).chart;
+        const auto sizes = charts::branchSizes(file->kin(request.parents), chart, person);
+        for (std::size_t i = 0; i < sizes.size(); ++i) {
+            const auto branch = static_cast<picture::Branch>(i);
+            answer.at(2 * i) = sizes.at(i);
+            answer.at(2 * i + 1) = static_cast<std::int32_t>(charts::sideOf(branch, chart));
+        }
+        return answer.data();
+    } catch (const std::exception& error) {
+        js::lastText = error.what();
+        return nullptr;
+    }
+}
+
+// A picture of a host in JavaScript. Null where it failed; picture_status then says how, and last_text why.
 OLVANE_EXPORT("host_picture") std::vector<double>* hostPicture(std::int32_t focus) {
     std::vector<double>* answer = nullptr;
     std::string failure;
     const auto ask = [&] {
         const olvane_host host = js::hostOfJavaScript();
-        const charts::ViewRequest view = js::requestOf(0).view;
+        const js::PictureRequest request = js::requestOf(0);
+        const charts::ViewRequest view = js::viewOf(request);
         // The other person of a kinship is written down as a place, one less than the id.
         picture::Picture picture =
             charts::pictureOfHost(c::sourceOf(host), focus, view, std::int64_t{view.chart.to} + 1);

@@ -24,6 +24,7 @@ namespace olvane::js {
 struct KeptChart {
     picture::Picture picture;
     charts::Direction direction = charts::Direction::down;
+    bool mirrored = false;
 };
 
 // A GEDCOM file in the module's memory, with what is made of it when somebody first asks.

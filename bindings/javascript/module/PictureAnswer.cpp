@@ -56,6 +56,11 @@ void appendMark(std::vector<double>& numbers, const picture::Mark& mark) {
                      static_cast<double>(mark.boxes[2])});
 }
 
+void appendFolded(std::vector<double>& numbers, const picture::FoldedBranch& folded) {
+    append(numbers, {static_cast<double>(folded.box), static_cast<double>(folded.count),
+                     static_cast<double>(folded.branch), static_cast<double>(folded.side)});
+}
+
 void appendWay(std::vector<double>& numbers, const picture::Way& way) {
     append(numbers, {static_cast<double>(way.firstBox), static_cast<double>(way.boxCount),
                      static_cast<double>(way.ancestorCount), static_cast<double>(way.firstPiece),
@@ -76,7 +81,7 @@ std::string textsOf(const picture::Picture& picture) {
 
 std::vector<double> numbersOf(const picture::Picture& picture) {
     std::vector<double> numbers;
-    numbers.reserve(15 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
+    numbers.reserve(16 + kBoxNumbers * picture.boxes.size() + 2 * picture.members.size() +
                     kLineNumbers * picture.lines.size());
     append(numbers,
            {static_cast<double>(picture.boxes.size()), static_cast<double>(picture.arcs.size()),
@@ -85,7 +90,8 @@ std::vector<double> numbersOf(const picture::Picture& picture) {
             static_cast<double>(picture.marks.size()), static_cast<double>(picture.focus),
             static_cast<double>(picture.ringRadii.size()), picture.middleX, picture.middleY,
             static_cast<double>(picture.other), static_cast<double>(picture.ways.size()),
-            static_cast<double>(picture.wayBoxes.size()), static_cast<double>(picture.wayPieces.size())});
+            static_cast<double>(picture.wayBoxes.size()), static_cast<double>(picture.wayPieces.size()),
+            static_cast<double>(picture.folded.size())});
     for (const picture::Box& box : picture.boxes) appendBox(numbers, box);
     for (const picture::Arc& arc : picture.arcs) {
         append(numbers, {static_cast<double>(arc.ring), arc.from, arc.to, static_cast<double>(arc.line)});
@@ -104,6 +110,7 @@ std::vector<double> numbersOf(const picture::Picture& picture) {
     for (const picture::WayPiece& piece : picture.wayPieces) {
         append(numbers, {piece.x1, piece.y1, piece.x2, piece.y2});
     }
+    for (const picture::FoldedBranch& folded : picture.folded) appendFolded(numbers, folded);
     return numbers;
 }
 

@@ -85,18 +85,30 @@ PictureRequest requestOf(kin::Place focus) {
     chart.sizes.gapY = static_cast<float>(options.number());
     chart.aspect = options.number();
     asked.keepsPlaces = options.flag() && chart.view == charts::View::everybody;
+    chart.mirrored = options.flag();
+    for (int left = options.next<int>(); left > 0; --left) {
+        const auto person = options.next<std::int64_t>();
+        asked.folded.push_back({person, options.next<picture::Branch>()});
+    }
     return asked;
+}
+
+charts::ViewRequest viewOf(const PictureRequest& request) {
+    charts::ViewRequest view = request.view;
+    view.chart.folded = request.folded;
+    return view;
 }
 
 picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked) {
     gedcom::GedcomDataSource source(file.data, asked.parents);
     const auto limited = std::make_shared<gedcom::LimitedDataSource>(source, kMostRelatives);
-    charts::ViewRequest view = asked.view;
+    charts::ViewRequest view = viewOf(asked);
     std::optional<KeptChart>& kept = file.everybody;
-    if (asked.keepsPlaces && kept && kept->direction == view.chart.direction)
+    if (asked.keepsPlaces && kept && kept->direction == view.chart.direction &&
+        kept->mirrored == view.chart.mirrored)
         view.chart.earlier = &kept->picture;
     picture::Picture picture = charts::pictureOf(limited, file.kin(asked.parents), view);
-    if (asked.keepsPlaces) kept = KeptChart{picture, view.chart.direction};
+    if (asked.keepsPlaces) kept = KeptChart{picture, view.chart.direction, view.chart.mirrored};
     return picture;
 }
 

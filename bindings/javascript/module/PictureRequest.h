@@ -14,11 +14,15 @@ namespace olvane::js {
 struct PictureRequest {
     charts::ViewRequest view;
     gedcom::ParentChoice parents;
+    std::vector<charts::Fold> folded;
     bool keepsPlaces = false;  // everybody: of the file's last picture that was asked for so
 };
 
-// What JavaScript last asked of a picture, for a focus.
+// What JavaScript last asked of a picture, for a focus. view has no branches folded: viewOf adds them.
 PictureRequest requestOf(kin::Place focus);
+
+// Refers to the request, which must outlive it.
+charts::ViewRequest viewOf(const PictureRequest& request);
 
 picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked);
 

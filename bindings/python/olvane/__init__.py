@@ -35,6 +35,7 @@ from olvane._kinship import Kinship, KinWay, MarriageWay, kin
 from olvane._layout import MOST_RELATIVES, family_layout, layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
 from olvane._picture import (
+    FoldedBranch,
     LineRole,
     MarkKind,
     Picture,
@@ -58,6 +59,7 @@ __all__ = [
     "FamilyState",
     "File",
     "FileError",
+    "FoldedBranch",
     "Host",
     "HostError",
     "Kinship",

@@ -6,7 +6,7 @@ from __future__ import annotations
 
 import operator
 import os
-from collections.abc import Callable, Sequence
+from collections.abc import Callable, Iterable, Sequence
 from ctypes import byref, c_void_p
 from typing import Any, Literal, get_args
 
@@ -17,7 +17,7 @@ from olvane._file import DrawView, File
 from olvane._host import Host
 from olvane._layout import _Answers, _focus_number, _message, _options_struct, _watching_for_strays
 from olvane._options import Options, View
-from olvane._picture import Picture
+from olvane._picture import BRANCHES, Branch, Picture
 
 _VIEWS: tuple[DrawView, ...] = get_args(DrawView)
 _DIRECTIONS = ("down", "up", "left", "right")
@@ -53,6 +53,8 @@ def picture(
     hide_living: bool = False,
     year: int = 0,
     earlier: Picture | None = None,
+    mirrored: bool = False,
+    folded: Iterable[tuple[int | str, Branch]] = (),
 ) -> Picture:
     """The picture of any view around a person, as values: boxes, families with their lines, marks and ways.
 
@@ -71,6 +73,9 @@ def picture(
     - unknown_parents: family and pedigree; boxes for parents who are not known.
     - hide_living, year: of a file; nothing is stated of whoever may be living in the year, 0 for the present one, and
       their boxes say living.
+    - mirrored: right and left exchanged; folded: branches that are left out of near, ancestors, descendants, hourglass and
+      relatives: a person with "up" (ancestors), "down" (descendants) or "beside" (partners and, of the focus and its
+      ancestors, siblings with theirs).
 
     Raises HostError and LayoutError as :func:`layout` does, FileError for a file that cannot be read and for a text that
     means nobody or several persons, and TypeError or ValueError for an option that is not allowed.
@@ -89,6 +94,7 @@ def picture(
         ("compact", compact),
         ("all_parts", all_parts),
         ("hide_living", hide_living),
+        ("mirrored", mirrored),
     ):
         setattr(chosen, flag, 1 if value else 0)
     chosen.up = _whole("up", up, 0, _GREATEST_COUNT)
@@ -105,6 +111,9 @@ def picture(
     if hide_living and not isinstance(source, File):
         raise ValueError("hide_living is of a file: a host and a Family say nothing of the years of a life")
     chosen.other = _number(source, to)
+    folds = [(_number(source, person), _choice("folded", branch, BRANCHES)) for person, branch in folded]
+    chosen.folds = (_native_picture.Fold * len(folds))(*folds)
+    chosen.fold_count = len(folds)
     if earlier is not None and not isinstance(earlier, Picture):
         raise TypeError(f"earlier is {earlier!r}, and takes a Picture")
     kept = None if earlier is None else earlier._kept

@@ -7,9 +7,17 @@ from __future__ import annotations
 from collections.abc import Callable
 from dataclasses import dataclass, field
 from enum import IntEnum
+from typing import Literal
 
 from olvane._family import ChildKind, FamilyState
 from olvane._svg import Svg, plain_drawing, round_drawing
+
+
+Branch = Literal["up", "down", "beside"]
+Side = Literal["top", "right", "bottom", "left"]
+# In the order of the library's numbers.
+BRANCHES: tuple[Branch, ...] = ("up", "down", "beside")
+SIDES: tuple[Side, ...] = ("top", "right", "bottom", "left")
 
 
 class LineRole(IntEnum):
@@ -132,6 +140,16 @@ class PictureWay:
 
 
 @dataclass(frozen=True, slots=True)
+class FoldedBranch:
+    """A branch that is left out: count persons would have boxes with it, on that side of the box."""
+
+    box: int
+    branch: Branch
+    side: Side
+    count: int
+
+
+@dataclass(frozen=True, slots=True)
 class Picture:
     """Boxes in the order of the layout, families with their lines, and marks. focus is the place of the focus's box.
 
@@ -151,6 +169,7 @@ class Picture:
     ways: tuple[PictureWay, ...] = ()
     rings: tuple[float, ...] = ()
     middle: tuple[float, float] | None = None
+    folded: tuple[FoldedBranch, ...] = ()
     # Of everybody: what the library keeps of it, for a later picture's places.
     _kept: object = field(default=None, repr=False, compare=False)
 

@@ -12,6 +12,9 @@ from olvane import _native
 from olvane._errors import LayoutError, Status
 from olvane._family import ChildKind, FamilyState
 from olvane._picture import (
+    BRANCHES,
+    SIDES,
+    FoldedBranch,
     LineRole,
     MarkKind,
     Picture,
@@ -23,6 +26,12 @@ from olvane._picture import (
     PictureWay,
     WayKind,
 )
+
+
+class Fold(ctypes.Structure):
+    """olvane_fold"""
+
+    _fields_ = [("person", c_int64), ("branch", c_int32)]
 
 
 class OptionsStruct(ctypes.Structure):
@@ -49,6 +58,9 @@ class OptionsStruct(ctypes.Structure):
         ("unknown_parents", c_int32),
         ("hide_living", c_int32),
         ("year", c_int32),
+        ("mirrored", c_int32),
+        ("folds", POINTER(Fold)),
+        ("fold_count", c_size_t),
         ("layout", _native.OptionsStruct),
         ("earlier", c_void_p),
     ]
@@ -127,6 +139,10 @@ class _Piece(ctypes.Structure):
     _fields_ = [("x1", c_double), ("y1", c_double), ("x2", c_double), ("y2", c_double)]
 
 
+class _Folded(ctypes.Structure):
+    _fields_ = [("box", c_int32), ("count", c_int32), ("branch", c_int32), ("side", c_int32)]
+
+
 class _Arrays(ctypes.Structure):
     _fields_ = [
         ("struct_size", c_size_t),
@@ -159,6 +175,8 @@ class _Arrays(ctypes.Structure):
         ("way_piece_count", c_size_t),
         ("focus_is", c_char_p),
         ("other_is", c_char_p),
+        ("folded", POINTER(_Folded)),
+        ("folded_count", c_size_t),
     ]
 
 
@@ -208,6 +226,7 @@ def picture_of(made: c_void_p, view: str, kept: KeptPicture | None = None) -> Pi
         ways=tuple(_way(arrays, arrays.ways[i]) for i in range(arrays.way_count)),
         rings=tuple(arrays.ring_radii[i] for i in range(arrays.ring_radius_count)),
         middle=(arrays.middle_x, arrays.middle_y) if is_round else None,
+        folded=tuple(_folded(arrays.folded[i]) for i in range(arrays.folded_count)),
         _kept=kept,
     )
 
@@ -236,6 +255,10 @@ def _box(box: Any, arc: Any) -> PictureBox:
         living=box.living != 0,
         arc=None if arc is None else PictureArc(arc.ring, arc.start, arc.end, _place(arc.line)),
     )
+
+
+def _folded(folded: Any) -> FoldedBranch:
+    return FoldedBranch(folded.box, BRANCHES[folded.branch], SIDES[folded.side], folded.count)
 
 
 def _way(arrays: Any, way: Any) -> PictureWay:

@@ -5,9 +5,11 @@
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/FanInternal.h>
+#include <olvane/charts/FoldingInternal.h>
 #include <olvane/charts/SelectionInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
 #include <olvane/picture/FurtherParents.h>
+#include <olvane/picture/Mirror.h>
 
 #include <cmath>
 #include <stdexcept>
@@ -53,6 +55,18 @@ EverybodyOptions everybodyOptions(const ChartRequest& request) {
     return options;
 }
 
+// The earlier picture is mirrored as well, so that places are compared as they are laid out.
+picture::Picture everybodyPicture(const kin::KinGraph& graph, const ChartRequest& request) {
+    EverybodyOptions options = everybodyOptions(request);
+    picture::Picture earlier;
+    if (request.mirrored && request.earlier != nullptr) {
+        earlier = *request.earlier;
+        picture::mirror(earlier);
+        options.earlier = &earlier;
+    }
+    return everybodyChart(graph, options);
+}
+
 picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartRequest& request) {
     switch (request.view) {
         case View::near:
@@ -64,7 +78,7 @@ picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartReque
         case View::fan:
             return fanChart(graph, request);
         case View::everybody:
-            return everybodyChart(graph, everybodyOptions(request));
+            return everybodyPicture(graph, request);
         case View::kinship:
             checkPerson(graph, request.to);
             return kinshipChart(graph, request);
@@ -118,6 +132,8 @@ picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request
     checkSizes(graph, request);
     picture::Picture picture = chartWithoutCounts(graph, request);
     picture::countFurtherParents(picture, graph);
+    if (request.mirrored) picture::mirror(picture);
+    if (canFold(request.view)) addFolded(picture, graph, request);
     return picture;
 }
 

@@ -3,8 +3,12 @@
 
 #include <olvane/charts/SelectionInternal.h>
 
+#include <algorithm>
+#include <cstdint>
 #include <limits>
+#include <span>
 #include <utility>
+#include <vector>
 
 #include <olvane/charts/NearPersonsInternal.h>
 
@@ -13,10 +17,52 @@ namespace olvane::charts {
 namespace {
 
 constexpr int kAllGenerations = 0;
+const auto kAdmitAll = [](kin::Place) { return true; };
+
+// Where a walk from the focus outwards must not go on.
+class ClosedBranches {
+public:
+    ClosedBranches(const kin::KinGraph& graph, std::span<const Fold> folded) : graph_(graph) {
+        for (const Fold& fold : folded) {
+            const kin::Place person = graph.placeOf(fold.person);
+            if (person == kin::kNobody) continue;
+            if (fold.branch == picture::Branch::up) up_.push_back(person);
+            if (fold.branch == picture::Branch::beside) beside_.push_back(person);
+            if (fold.branch == picture::Branch::down) close(graph.unionsAsPartner(person));
+        }
+        std::sort(up_.begin(), up_.end());
+        std::sort(beside_.begin(), beside_.end());
+        std::sort(unions_.begin(), unions_.end());
+    }
+
+    // Of the focus and its ancestors, siblings are beside as well; of others they are their parents' descendants.
+    void closeSiblings(const std::vector<bool>& isLine) {
+        for (const kin::Place person : beside_) {
+            if (isLine[at(person)]) close(graph_.unionsAsChild(person));
+        }
+        std::sort(unions_.begin(), unions_.end());
+    }
+
+    bool toParents(kin::Place person) const { return has(up_, person); }
+    bool toPartners(kin::Place person) const { return has(beside_, person); }
+    bool toChildren(kin::UnionPlace u) const { return has(unions_, u); }
+
+private:
+    static bool has(const std::vector<std::int32_t>& places, std::int32_t place) {
+        return !places.empty() && std::binary_search(places.begin(), places.end(), place);
+    }
+    void close(std::span<const kin::UnionPlace> unions) {
+        unions_.insert(unions_.end(), unions.begin(), unions.end());
+    }
+
+    const kin::KinGraph& graph_;
+    std::vector<std::int32_t> up_, beside_, unions_;
+};
 
 class Selector {
 public:
-    Selector(const kin::KinGraph& graph, kin::Place focus) : graph_(graph) {
+    Selector(const kin::KinGraph& graph, kin::Place focus, std::span<const Fold> folded = {})
+        : graph_(graph), closed_(graph, folded) {
         chosen_.shown.assign(at(graph.personCount()), false);
         chosen_.isLine.assign(at(graph.personCount()), false);
         addToLine(focus);
@@ -29,6 +75,7 @@ public:
         for (std::size_t i = 0; i < chosen_.line.size(); ++i) {
             if (i == lineLevels_.back()) lineLevels_.push_back(chosen_.line.size());
             if (generations != kAllGenerations && lineLevels_.size() > at(generations)) break;
+            if (closed_.toParents(chosen_.line[i])) continue;
             for (const kin::UnionPlace u : graph_.unionsAsChild(chosen_.line[i])) {
                 for (const kin::Place parent : graph_.partners(u)) {
                     if (parent == kin::kNobody || chosen_.isLine[at(parent)] || !admit(parent)) continue;
@@ -37,14 +84,17 @@ public:
             }
         }
         if (lineLevels_.back() != chosen_.line.size()) lineLevels_.push_back(chosen_.line.size());
+        closed_.closeSiblings(chosen_.isLine);
     }
 
     // The descendants of the focus to so many generations.
-    void addDescendants(int generations) { descend({chosen_.line[0]}, {1}, generations); }
+    void addDescendants(int generations) { descend({chosen_.line[0]}, {1}, generations, kAdmitAll); }
 
     // The descendants of the focus and of every ancestor, to so many generations below the focus's own. The
-    // earliest generation comes first, so that everybody is met over the most generous way.
-    void addRelatives(int generations) {
+    // earliest generation comes first, so that everybody is met over the most generous way, though not over somebody
+    // whom `admit` refuses.
+    template <class Admit>
+    void addRelatives(int generations, const Admit& admit) {
         std::vector<kin::Place> roots;
         std::vector<std::size_t> ends;
         for (std::size_t level = lineLevels_.size(); level-- > 0;) {
@@ -56,7 +106,7 @@ public:
         const int above = static_cast<int>(lineLevels_.size()) - 1;
         const bool all =
             generations == kAllGenerations || generations > std::numeric_limits<int>::max() - above;
-        descend(roots, ends, all ? kAllGenerations : generations + above);
+        descend(roots, ends, all ? kAllGenerations : generations + above, admit);
     }
 
     // The children of the families that somebody of the line is a child of.
@@ -64,7 +114,7 @@ public:
         for (const kin::Place person : chosen_.line) {
             for (const kin::UnionPlace u : graph_.unionsAsChild(person)) {
                 const auto& two = graph_.partners(u);
-                if (!isShown(two[0]) && !isShown(two[1])) continue;
+                if (closed_.toChildren(u) || (!isShown(two[0]) && !isShown(two[1]))) continue;
                 for (const kin::Place child : graph_.children(u)) show(child);
             }
         }
@@ -73,6 +123,7 @@ public:
     void addSpouses() {
         const std::size_t end = chosen_.persons.size();
         for (std::size_t i = 0; i < end; ++i) {
+            if (closed_.toPartners(chosen_.persons[i])) continue;
             for (const kin::UnionPlace u : graph_.unionsAsPartner(chosen_.persons[i])) {
                 const kin::Place other = graph_.otherPartner(u, chosen_.persons[i]);
                 if (other != kin::kNobody) show(other);
@@ -101,8 +152,9 @@ private:
     }
 
     // Roots by generation: those up to ends[i] stand in generation i, and their children in generation i + 1.
-    void descend(const std::vector<kin::Place>& roots, const std::vector<std::size_t>& ends,
-                 int generations) {
+    template <class Admit>
+    void descend(const std::vector<kin::Place>& roots, const std::vector<std::size_t>& ends, int generations,
+                 const Admit& admit) {
         std::vector<bool> met(at(graph_.personCount()), false);
         std::vector<kin::Place> level;
         std::vector<kin::Place> next;
@@ -117,8 +169,9 @@ private:
             next.clear();
             for (const kin::Place person : level) {
                 for (const kin::UnionPlace u : graph_.unionsAsPartner(person)) {
+                    if (closed_.toChildren(u)) continue;
                     for (const kin::Place child : graph_.children(u)) {
-                        if (met[at(child)]) continue;
+                        if (met[at(child)] || !admit(child)) continue;
                         met[at(child)] = true;
                         show(child);
                         next.push_back(child);
@@ -130,22 +183,43 @@ private:
     }
 
     const kin::KinGraph& graph_;
+    ClosedBranches closed_;
     Selection chosen_;
     std::vector<std::size_t> lineLevels_;  // where each generation of the line ends
 };
 
-const auto kAdmitAll = [](kin::Place) { return true; };
+// Everybody whom a walk finds that keeps to those persons and turns around at the folded branches.
+std::vector<bool> foundAmong(const std::vector<kin::Place>& persons, const kin::KinGraph& graph,
+                             kin::Place focus, std::span<const Fold> folded) {
+    const auto isAmong = [&persons](kin::Place person) {
+        return std::binary_search(persons.begin(), persons.end(), person);
+    };
+    Selector selector(graph, focus, folded);
+    selector.addAncestors(kAllGenerations, isAmong);
+    selector.addRelatives(kAllGenerations, isAmong);
+    selector.addSpouses();
+    return selector.take().shown;
+}
+
+// The engine chooses them, and folds nothing: those whom only a folded branch leads to are left out afterwards.
+Selection selectNear(const kin::KinGraph& graph, const ChartRequest& request) {
+    std::vector<kin::Place> persons = nearPersons(graph, request.focus, request.layout);
+    if (!request.folded.empty()) {
+        const std::vector<bool> all = foundAmong(persons, graph, request.focus, {});
+        const std::vector<bool> left = foundAmong(persons, graph, request.focus, request.folded);
+        std::erase_if(persons, [&](kin::Place person) { return all[at(person)] && !left[at(person)]; });
+    }
+    return selectionOf(graph, request.focus, persons);
+}
 
 }  // namespace
 
 Selection selectPersons(const kin::KinGraph& graph, const ChartRequest& request) {
-    if (request.view == View::near) {
-        return selectionOf(graph, request.focus, nearPersons(graph, request.focus, request.layout));
-    }
-    Selector selector(graph, request.focus);
+    if (request.view == View::near) return selectNear(graph, request);
+    Selector selector(graph, request.focus, request.folded);
     if (request.view != View::descendants) selector.addAncestors(request.up, kAdmitAll);
     if (request.view == View::relatives) {
-        selector.addRelatives(request.down);
+        selector.addRelatives(request.down, kAdmitAll);
     } else if (request.view != View::ancestors) {
         selector.addDescendants(request.down);
     }

@@ -54,6 +54,14 @@ enum class FanOf : std::uint8_t { ancestors, descendants };
 // Which ways between two persons the kinship view draws.
 enum class WayChoice : std::uint8_t { blood, marriage, both };
 
+// A branch of a person, by id, that is left out.
+struct Fold {
+    std::int64_t person = 0;
+    picture::Branch branch = picture::Branch::down;
+
+    bool operator==(const Fold&) const = default;
+};
+
 // What chart to make. A view ignores the options that it has no use for.
 //
 // Holds: numbers of generations count from the focus, and 0 means all of them. boxSizes is empty, or has one
@@ -74,6 +82,10 @@ struct ChartRequest {
     // Trees: generations packed tighter. Parents need not stand over the middle of their children. Everybody: lines
     // lie closer together.
     bool compact = false;
+    bool mirrored = false;  // every view: right and left exchanged
+    // Near, ancestors, descendants, hourglass, relatives: what is left out; read during the call only. Persons who are
+    // not shown and branches that hide nobody are passed over.
+    std::span<const Fold> folded;
 
     FanOf fanOf = FanOf::ancestors;
     double fanAngle = 360;  // degrees, 90 to 360

@@ -9,6 +9,7 @@
 #include <olvane/kin/FamilyAround.h>
 #include <olvane/kin/FamilyDataSource.h>
 #include <olvane/picture/LayoutPicture.h>
+#include <olvane/picture/Mirror.h>
 
 namespace olvane::charts {
 
@@ -42,7 +43,9 @@ picture::Picture enginePictureOf(const std::shared_ptr<OlvaneViewerManagerWrapPr
     picture::LayoutPictureOptions drawn;
     drawn.known = known;
     drawn.unknownParents = request.unknownParents;
-    return picture::pictureOf(layout, drawn);
+    picture::Picture picture = picture::pictureOf(layout, drawn);
+    if (request.chart.mirrored) picture::mirror(picture);
+    return picture;
 }
 
 // One generation more than is shown, so that those without a box are counted. The family view reaches three

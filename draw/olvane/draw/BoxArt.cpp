@@ -25,6 +25,7 @@ using picture::cutText;
 using picture::fitLine;
 using picture::Font;
 using picture::runsRightToLeft;
+using picture::Side;
 using picture::textWidth;
 
 // All in px.
@@ -346,7 +347,10 @@ void appendBadgeAt(std::string& svg, double y, const Badge& badge, const Drawing
 std::vector<Badge> badgesOf(const BoxFrame& box, bool isLiving) {
     std::vector<Badge> badges;
     double right = box.width - kBadgeInset;
-    if (box.hasHidden()) {
+    // What is folded counts those whom it hides.
+    const bool isFolded =
+        std::any_of(box.marks.begin(), box.marks.end(), [](const BoxMark& mark) { return mark.isFolded; });
+    if (box.hasHidden() && !isFolded) {
         Badge badge{hiddenMark(box, isLiving), hiddenSentence(box, isLiving)};
         badge.x = right - badge.width();
         right = badge.x - kBadgeInset / 2;
@@ -373,33 +377,43 @@ void appendBadges(std::string& svg, const BoxFrame& box, const std::vector<Badge
     if (box.text != nullptr && !badges.empty()) box.text->add(kBadgeSize);
 }
 
-// Side by side at the upper or lower edge, mostly outside.
-void appendMarks(std::string& svg, const BoxFrame& box, MarkPlace place, const DrawingTheme& theme) {
+// Where a row of badges so wide begins: mostly outside of the upper or lower edge, half outside at the sides. In a wide box
+// beside the middle, where the line of a couple leaves that lies sideways.
+std::pair<double, double> markStart(const BoxFrame& box, Side side, double width) {
+    if (side == Side::left || side == Side::right) {
+        return {(side == Side::left ? 0 : box.width) - width / 2, (box.height - kBadgeHeight) / 2};
+    }
+    return {isWide(box) ? kInset : (box.width - width) / 2,
+            side == Side::top ? -kMarkOutside : box.height - kMarkInside};
+}
+
+// Side by side at an edge.
+void appendMarks(std::string& svg, const BoxFrame& box, Side place, const DrawingTheme& theme) {
     double width = 0;
     std::vector<Badge> badges;
     for (const BoxMark& mark : box.marks) {
         if (mark.place != place) continue;
-        badges.push_back({mark.text, mark.title, true});
+        badges.push_back({mark.text, mark.title, !mark.isFolded});
         if (box.text != nullptr) box.text->add(kBadgeSize);
         width += badges.back().width() + (badges.size() > 1 ? kBadgeInset / 2 : 0);
     }
-    // In a wide box beside the middle, where the line of a couple leaves that lies sideways.
-    double x = isWide(box) ? kInset : (box.width - width) / 2;
+    auto [x, y] = markStart(box, place, width);
     for (Badge& badge : badges) {
         badge.x = x;
         x += badge.width() + kBadgeInset / 2;
-        appendBadgeAt(svg, place == MarkPlace::top ? -kMarkOutside : box.height - kMarkInside, badge, theme);
+        appendBadgeAt(svg, y, badge, theme);
     }
 }
 
 void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
-    appendMarks(svg, box, MarkPlace::top, theme);
-    appendMarks(svg, box, MarkPlace::bottom, theme);
+    for (const Side side : {Side::top, Side::right, Side::bottom, Side::left}) {
+        appendMarks(svg, box, side, theme);
+    }
 }
 
 // From the edge of a box to its caption, which touches the border, or the marks that stand at this edge.
 double captionGapOf(const BoxFrame& box) {
-    const MarkPlace place = box.captionOnTop ? MarkPlace::top : MarkPlace::bottom;
+    const Side place = box.captionOnTop ? Side::top : Side::bottom;
     const bool hasMarks = std::any_of(box.marks.begin(), box.marks.end(),
                                       [place](const BoxMark& mark) { return mark.place == place; });
     return hasMarks ? kMarkOutside + 1 : -kCaptionInside;

@@ -18,6 +18,7 @@ namespace {
 using picture::Index;
 using picture::Mark;
 using picture::MarkKind;
+using picture::Side;
 
 constexpr std::size_t kMostMarks = 3;
 constexpr const char* kUp = "\xE2\x86\x91";
@@ -32,13 +33,14 @@ public:
             if (mark.kind == MarkKind::partnersElsewhere) addPartners(mark);
         }
         for (std::vector<BoxMark>& marks : marks_) shorten(marks);
+        for (const picture::FoldedBranch& folded : picture.folded) addFolded(folded);
     }
 
     std::vector<std::vector<BoxMark>> take() { return std::move(marks_); }
 
 private:
     // Once, however many children of one family are elsewhere.
-    void add(Index box, const char* sign, const Mark& mark, const std::string& title, MarkPlace place) {
+    void add(Index box, const char* sign, const Mark& mark, const std::string& title, Side place) {
         if (box == picture::kNone) return;
         std::vector<BoxMark>& marks = marks_[static_cast<std::size_t>(box)];
         const std::string text = joined(sign, whole(mark.number));
@@ -48,23 +50,31 @@ private:
 
     void addParents(const Mark& mark) {
         add(mark.boxes[0], kUp, mark, joined("Child of whoever is marked ", kDown, whole(mark.number)),
-            MarkPlace::top);
+            Side::top);
         for (const Index parent : {mark.boxes[1], mark.boxes[2]}) {
             add(parent, kDown, mark, joined("Parent of who is marked ", kUp, whole(mark.number)),
-                MarkPlace::bottom);
+                Side::bottom);
         }
     }
 
     void addPartners(const Mark& mark) {
         for (const Index partner : {mark.boxes[0], mark.boxes[1]}) {
             add(partner, kBoth, mark,
-                joined("Partner of who is marked ", kBoth, whole(mark.number), " as well"),
-                MarkPlace::bottom);
+                joined("Partner of who is marked ", kBoth, whole(mark.number), " as well"), Side::bottom);
         }
     }
 
+    void addFolded(const picture::FoldedBranch& folded) {
+        const std::string count = joined(whole(folded.count));
+        const std::string_view noun = folded.branch == picture::Branch::up     ? "ancestors"
+                                      : folded.branch == picture::Branch::down ? "descendants"
+                                                                               : "partners and siblings";
+        marks_[static_cast<std::size_t>(folded.box)].push_back(
+            {"+" + count, joined("Folded ", noun, ": ", count), folded.side, true});
+    }
+
     static void shorten(std::vector<BoxMark>& marks) {
-        for (const MarkPlace place : {MarkPlace::top, MarkPlace::bottom}) {
+        for (const Side place : {Side::top, Side::bottom}) {
             std::size_t count = 0;
             for (const BoxMark& mark : marks) {
                 if (mark.place == place) ++count;

@@ -10,17 +10,16 @@
 
 namespace olvane::draw {
 
-enum class MarkPlace : std::uint8_t { top, bottom };
-
 // A sign at the edge of a box, and what it says.
 struct BoxMark {
     std::string text;
     std::string title;
-    MarkPlace place = MarkPlace::top;
+    picture::Side place = picture::Side::top;
+    bool isFolded = false;  // counts whom a folded branch has
 };
 
-// The signs of every box for what is expressed without a line, in the order of the marks. At most three stand
-// at one edge; a last one says how many more there are.
+// The signs of every box for what is expressed without a line, in the order of the marks: at most three stand at one
+// edge, and a last one says how many more there are. Then those of its folded branches.
 std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture);
 
 }  // namespace olvane::draw

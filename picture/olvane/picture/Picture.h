@@ -98,6 +98,20 @@ struct Mark {
     MarkKind kind = MarkKind::samePerson;
 };
 
+// The relatives of one person in one direction: ancestors, descendants, or partners and siblings with theirs.
+enum class Branch : std::uint8_t { up, down, beside };
+
+enum class Side : std::uint8_t { top, right, bottom, left };
+
+// A branch that was asked to be left out: count persons, 1 or more, would have boxes with it. They would stand on that
+// side of the box.
+struct FoldedBranch {
+    Index box = kNone;
+    std::int32_t count = 0;
+    Branch branch = Branch::down;
+    Side side = Side::bottom;
+};
+
 // How two persons are related by a way that a picture shows.
 enum class WayKind : std::uint8_t { blood, legal, marriage };
 
@@ -143,6 +157,7 @@ struct Picture {
     std::vector<Line> lines;
     std::vector<double> bridges;
     std::vector<Mark> marks;
+    std::vector<FoldedBranch> folded;
     // Of a picture of kinship: the other person, the ways, those by blood first, and in words what the focus is to
     // the other person and the other one to the focus; empty where no way is known.
     Index other = kNone;

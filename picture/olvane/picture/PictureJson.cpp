@@ -76,6 +76,11 @@ public:
         json_ += ",\n";
         addList("marks", picture_.marks.size(),
                 [this](std::size_t i) { json_ += markJson(picture_.marks[i]); });
+        if (!picture_.folded.empty()) {
+            json_ += ",\n";
+            addList("folded", picture_.folded.size(),
+                    [this](std::size_t i) { json_ += foldedJson(picture_.folded[i]); });
+        }
         if (picture_.other != kNone) {
             json_ += ",\n \"other\": " +
                      std::to_string(picture_.boxes[static_cast<std::size_t>(picture_.other)].id) +
@@ -200,6 +205,12 @@ private:
                       [](const WayPiece& piece) {
                           return listOf(std::array{piece.x1, piece.y1, piece.x2, piece.y2}, number);
                       }) +
+               "}";
+    }
+
+    static std::string foldedJson(const FoldedBranch& folded) {
+        return "{\"box\": " + std::to_string(folded.box) + ", \"branch\": " + quoted(nameOf(folded.branch)) +
+               ", \"side\": " + quoted(nameOf(folded.side)) + ", \"count\": " + std::to_string(folded.count) +
                "}";
     }
 

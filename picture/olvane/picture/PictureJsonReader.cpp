@@ -121,6 +121,7 @@ public:
         findFocus(integerAt<std::int64_t>(json, "focus"));
         for (const Json& family : listAt(json, "families")) readFamily(family);
         for (const Json& mark : listAt(json, "marks")) readMark(mark);
+        for (const Json& folded : listAt(json, "folded")) readFolded(folded);
         readOther(json);
         for (const Json& way : listAt(json, "ways")) readWay(way);
         return std::move(picture_);
@@ -282,6 +283,16 @@ private:
         if (boxes.empty() || boxes.size() > 3) fail("a mark has one to three boxes");
         for (std::size_t i = 0; i < boxes.size(); ++i) mark.boxes[i] = placeOf(boxes[i], "boxes");
         picture_.marks.push_back(mark);
+    }
+
+    void readFolded(const Json& json) {
+        FoldedBranch folded;
+        folded.box = placeAt(json, "box");
+        if (folded.box == kNone) fail("a folded branch has no box");
+        folded.count = integerAt<std::int32_t>(json, "count");
+        folded.branch = namedValue(find(json, "branch"), 3, Branch::down);
+        folded.side = namedValue(find(json, "side"), 4, Side::bottom);
+        picture_.folded.push_back(folded);
     }
 
     Picture picture_;

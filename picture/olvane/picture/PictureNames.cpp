@@ -49,4 +49,12 @@ std::string_view nameOf(WayKind kind) {
     return nameIn(std::to_array<std::string_view>({"blood", "legal", "marriage"}), kind);
 }
 
+std::string_view nameOf(Branch branch) {
+    return nameIn(std::to_array<std::string_view>({"up", "down", "beside"}), branch);
+}
+
+std::string_view nameOf(Side side) {
+    return nameIn(std::to_array<std::string_view>({"top", "right", "bottom", "left"}), side);
+}
+
 }  // namespace olvane::picture

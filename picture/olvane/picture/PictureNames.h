@@ -17,5 +17,7 @@ std::string_view nameOf(BoxKind kind);
 std::string_view nameOf(LineRole role);
 std::string_view nameOf(MarkKind kind);
 std::string_view nameOf(WayKind kind);
+std::string_view nameOf(Branch branch);
+std::string_view nameOf(Side side);
 
 }  // namespace olvane::picture

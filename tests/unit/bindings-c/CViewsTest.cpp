@@ -197,6 +197,35 @@ TEST(CViews, ofKinshipHaveWaysAndWords) {
     EXPECT_GT(arrays.way_piece_count, 3U);
 }
 
+TEST(CViews, foldBranchesAndAreMirrored) {
+    const auto family = table();
+    const olvane_fold folds[] = {{7, 0}};  // the ancestors of the focus
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_ANCESTORS);
+    options.folds = folds;
+    options.fold_count = 1;
+    options.mirrored = 1;
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer picture(made);
+    olvane::charts::ViewRequest request;
+    const olvane::charts::Fold fold{7, olvane::picture::Branch::up};
+    request.chart.view = olvane::charts::View::ancestors;
+    request.chart.mirrored = true;
+    request.chart.folded = {&fold, 1};
+    EXPECT_EQ(jsonOf(picture),
+              olvane::picture::pictureJson(olvane::charts::pictureOf(family->table, 7, request)));
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    EXPECT_EQ(arrays.box_count, 1U);
+    ASSERT_EQ(arrays.folded_count, 1U);
+    EXPECT_EQ(arrays.folded[0].box, 0);
+    EXPECT_EQ(arrays.folded[0].branch, 0);
+    EXPECT_GT(arrays.folded[0].count, 1);
+    options.folds = nullptr;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
+}
+
 TEST(CViews, ofARoundChartHaveArcs) {
     const auto family = table();
     const olvane_picture_options options = optionsFor(OLVANE_PICTURE_FAN);

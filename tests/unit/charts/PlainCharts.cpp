@@ -10,6 +10,7 @@ namespace plain {
 using namespace olvane::kin;
 using olvane::charts::ChartRequest;
 using olvane::charts::View;
+using olvane::picture::Branch;
 
 namespace {
 
@@ -71,9 +72,35 @@ int limitOf(int generations) {
 }  // namespace
 
 std::set<Place> personsOf(const KinGraph& graph, const ChartRequest& request) {
-    const auto up = [&graph](Place person) { return parentsOf(graph, person); };
-    const auto down = [&graph](Place person) { return childrenOf(graph, person); };
     std::map<Place, int> ancestors{{request.focus, 0}};
+    const auto isFolded = [&](Place person, Branch branch) {
+        return std::any_of(request.folded.begin(), request.folded.end(),
+                           [&](const olvane::charts::Fold& fold) {
+                               return graph.placeOf(fold.person) == person && fold.branch == branch;
+                           });
+    };
+    const auto up = [&](Place person) {
+        return isFolded(person, Branch::up) ? std::set<Place>() : parentsOf(graph, person);
+    };
+    // Not to the children of a couple of whom one has them folded, nor to those whose brother or sister in the line
+    // has siblings folded.
+    const auto isClosed = [&](UnionPlace u) {
+        const auto children = graph.children(u);
+        return std::any_of(graph.partners(u).begin(), graph.partners(u).end(),
+                           [&](Place partner) { return isFolded(partner, Branch::down); }) ||
+               std::any_of(children.begin(), children.end(), [&](Place child) {
+                   return ancestors.contains(child) && isFolded(child, Branch::beside);
+               });
+    };
+    const auto down = [&](Place person) {
+        std::set<Place> children;
+        for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
+            const auto& two = graph.partners(u);
+            if ((two[0] != person && two[1] != person) || isClosed(u)) continue;
+            children.insert(graph.children(u).begin(), graph.children(u).end());
+        }
+        return children;
+    };
     if (request.view != View::descendants) ancestors = stepsFrom(ancestors, limitOf(request.up), up);
     std::map<Place, int> descendants{{request.focus, 0}};
     if (request.view == View::relatives) {
@@ -87,7 +114,9 @@ std::set<Place> personsOf(const KinGraph& graph, const ChartRequest& request) {
     for (const auto& [person, distance] : ancestors) persons.insert(person);
     for (const auto& [person, distance] : descendants) persons.insert(person);
     if (request.spouses && request.view != View::ancestors) {
-        for (const Place person : std::set<Place>(persons)) persons.merge(spousesOf(graph, person));
+        for (const Place person : std::set<Place>(persons)) {
+            if (!isFolded(person, Branch::beside)) persons.merge(spousesOf(graph, person));
+        }
     }
     if (request.siblings && request.view != View::relatives) {
         const std::set<Place> before = persons;

@@ -27,6 +27,7 @@ public:
         for (int i = 0; i < families; ++i) addFamily();
         const int marks = upTo(3);
         for (int i = 0; i < marks; ++i) addMark();
+        for (int i = upTo(3); i > 0; --i) addFolded();
         return picture_;
     }
 
@@ -68,6 +69,15 @@ private:
         }
         family.lineCount = static_cast<std::uint32_t>(picture_.lines.size()) - family.firstLine;
         picture_.families.push_back(family);
+    }
+
+    void addFolded() {
+        picture::FoldedBranch folded;
+        folded.box = upTo(static_cast<int>(picture_.boxes.size()) - 1);
+        folded.count = 1 + upTo(50);
+        folded.branch = static_cast<picture::Branch>(upTo(2));
+        folded.side = static_cast<picture::Side>(upTo(3));
+        picture_.folded.push_back(folded);
     }
 
     void addMark() {

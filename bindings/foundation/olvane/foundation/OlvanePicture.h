@@ -36,7 +36,7 @@ enum {
     int64_t _other;
     double _fanAngle;
     float _boxWidth, _boxHeight, _gapX, _gapY;
-    BOOL _spouses, _siblings, _compact, _allParts, _unknownParents;
+    BOOL _spouses, _siblings, _compact, _mirrored, _allParts, _unknownParents;
     BOOL _auntsUncles, _cousins, _familySiblings, _siblingSpouses, _niecesNephews, _grandchildren;
     BOOL _greatGrandparents, _spousesOfChildren;
 }
@@ -56,6 +56,7 @@ enum {
 @property(nonatomic, assign) BOOL spouses;   // of descendants: YES
 @property(nonatomic, assign) BOOL siblings;  // of ancestors: NO
 @property(nonatomic, assign) BOOL compact;   // trees packed tighter: NO
+@property(nonatomic, assign) BOOL mirrored;  // right and left exchanged: NO
 
 @property(nonatomic, assign) int fanOf;        // 0 ancestors, 1 descendants
 @property(nonatomic, assign) double fanAngle;  // 90 to 360
