@@ -199,7 +199,8 @@ charts::ViewRequest viewOf(const olvane_picture_options& options) {
     chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
                    options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
     const olvane_picture* earlier = options.earlier;
-    if (earlier && earlier->direction == options.direction && earlier->mirrored == chart.mirrored && earlier->source.view == "everybody")
+    if (earlier && earlier->direction == options.direction && earlier->mirrored == chart.mirrored &&
+        earlier->source.view == "everybody")
         chart.earlier = &earlier->source;
     request.unknownParents = options.unknown_parents != 0;
     return request;
@@ -313,8 +314,9 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
     }
     const auto work = [&](olvane_picture& made) {
         if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
-        fillAsked(charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).view, chosen.other),
-                  chosen, made);
+        fillAsked(
+            charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).view, chosen.other),
+            chosen, made);
     };
     olvane_status status = OLVANE_NESTED_CALL;
     const auto makeIt = [&] { status = make(work, picture); };

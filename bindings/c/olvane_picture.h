@@ -226,7 +226,7 @@ typedef struct olvane_picture_options {
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
     int32_t hide_living; /* of a file: 1 to state nothing of whoever may be living, and to say who that is */
     int32_t year;        /* the year that hide_living counts from; 0 for the present one */
-    int32_t mirrored;        /* 1 for right and left exchanged */
+    int32_t mirrored;    /* 1 for right and left exchanged */
     const olvane_fold*
         folds; /* near, ancestors, descendants, hourglass, relatives; may be null without any */
     size_t fold_count;

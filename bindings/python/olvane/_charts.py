@@ -111,7 +111,9 @@ def picture(
     if hide_living and not isinstance(source, File):
         raise ValueError("hide_living is of a file: a host and a Family say nothing of the years of a life")
     chosen.other = _number(source, to)
-    folds = [(_number(source, person), _choice("folded", branch, BRANCHES)) for person, branch in folded]
+    folds = [
+        _native_picture.Fold(_number(source, person), _choice("folded", branch, BRANCHES)) for person, branch in folded
+    ]
     chosen.folds = (_native_picture.Fold * len(folds))(*folds)
     chosen.fold_count = len(folds)
     if earlier is not None and not isinstance(earlier, Picture):

@@ -131,6 +131,10 @@ def picture_json(picture: olvane.Picture) -> dict[str, Any]:
             {"kind": MARKS[mark.kind], "boxes": list(mark.boxes), "number": mark.number} for mark in picture.marks
         ],
     }
+    if picture.folded:
+        made["folded"] = [
+            {"box": one.box, "branch": one.branch, "side": one.side, "count": one.count} for one in picture.folded
+        ]
     if picture.middle is not None:
         made |= {"rings": list(picture.rings), "middleX": picture.middle[0], "middleY": picture.middle[1]}
     if picture.view == "kinship":
@@ -200,6 +204,9 @@ class Views(unittest.TestCase):
             ("descendants", {"down": 2, "spouses": False}, ["--down=2", "--no-spouses"]),
             ("hourglass", {"up": 1, "down": 1, "direction": "up"}, ["--up=1", "--down=1", "--direction=up"]),
             ("relatives", {"up": 1, "down": 1, "direction": "left"}, ["--up=1", "--down=1", "--direction=left"]),
+            ("relatives", {"folded": [("I1", "down"), (5, "up")]}, ["--fold=I1:down,I5:up"]),
+            ("hourglass", {"direction": "right", "mirrored": True}, ["--direction=right", "--mirror"]),
+            ("family", {"mirrored": True}, ["--mirror"]),
             ("fan", {"fan_of": "descendants", "fan_angle": 180.5}, ["--of=descendants", "--angle=180.5"]),
             ("kinship", {"to": "I2", "by": "blood", "most_ways": 1}, ["--to=2", "--by=blood", "--ways=1"]),
             ("kinship", {"to": 2, "language": "de"}, ["--to=2", "--language=de"]),
