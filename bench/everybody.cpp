@@ -328,6 +328,7 @@ int run(const std::vector<std::string>& arguments) {
         printHead();
         measureOurs(graph, 0, 1, "Olvane");
         measureOurs(graph, 60, 1, "Olvane, 60 marks");
+        measureOurs(graph, 343, 1, "Olvane, 343 marks");
         measureOurs(graph, -1, 1, "Olvane, all second links marks");
         measureOurs(graph, 0, 4, "Olvane, effort 4");
     } else if (arguments[1] == "--graph") {

@@ -169,6 +169,7 @@ private:
         fold();
         if (options_.marks < 0) return;
         report(ChartStep::order);
+        const MarkedLinks forced = l_.marked;
         l_.order = findOrder(l_.rows, orderEffort(), starts(),
                              [this](double share) { report(ChartStep::order, share); });
         for (std::int32_t left = options_.marks, batch = (left + 2) / 3; left > 0; left -= batch) {
@@ -179,6 +180,71 @@ private:
             rebuildRows();
             reduceCrossings(l_.rows, l_.order, orderEffort() / 3);
         }
+        constexpr std::int32_t kManyUnions = 10'000;
+        if (options_.marks > 0 && l_.part.unionCount() <= kManyUnions) fromAllMarks(unfolded, forced);
+    }
+
+    // The other way to as many marks: all second links first, in an order without crossings, and then lines for those
+    // that cross the fewest. It is taken where it ends in fewer crossings, which is where marks are many.
+    void fromAllMarks(const std::vector<std::int32_t>& unfolded, const MarkedLinks& forced) {
+        MarkedLinks allMarked = forced;
+        markAllSecondLinks(l_.part, l_.chains, unfolded, allMarked);
+        const std::int32_t all = marksIn(allMarked) - marksIn(forced);
+        if (all / 3 > options_.marks) return;
+        const Rows rows = std::move(l_.rows);
+        const RowOrder order = std::move(l_.order);
+        const MarkedLinks marked = std::move(l_.marked);
+        l_.marked = std::move(allMarked);
+        const std::int32_t lines = std::max(0, all - options_.marks);
+        l_.rows = makeRows(l_.part, l_.chains, unfolded, l_.marked);
+        l_.order = walkOrder(l_.rows);
+        fold();
+        const std::int32_t drawn =
+            drawBestLinks(l_.part, l_.chains, l_.rows, l_.order, lines, forced, l_.marked);
+        rebuildRows();
+        if (lines > 0) reduceCrossings(l_.rows, l_.order, orderEffort() / 3);
+        exchangeMarks(lines, forced);
+        if (drawn == lines && countCrossings(l_.rows, l_.order) < countCrossings(rows, order)) {
+            l_.marksMade = all - lines;
+            return;
+        }
+        l_.rows = rows;
+        l_.order = order;
+        l_.marked = marked;
+    }
+
+    // Some of the worst lines become marks and as many marks lines, for as long as that removes crossings.
+    void exchangeMarks(std::int32_t lines, const MarkedLinks& forced) {
+        constexpr int kMostRounds = 6;
+        std::int64_t crossings = countCrossings(l_.rows, l_.order);
+        for (int round = 0; round < kMostRounds && crossings > 0; ++round) {
+            const Rows rows = l_.rows;
+            const RowOrder order = l_.order;
+            const MarkedLinks marked = l_.marked;
+            const std::int32_t wanted = std::min(lines, 2 + lines / 8);
+            const std::int32_t made =
+                markWorstLinks(l_.part, l_.chains, l_.rows, l_.order, wanted, l_.marked);
+            rebuildRows();
+            const std::int32_t drawn =
+                drawBestLinks(l_.part, l_.chains, l_.rows, l_.order, made, forced, l_.marked);
+            rebuildRows();
+            reduceCrossings(l_.rows, l_.order, orderEffort() / 12);
+            const std::int64_t after = countCrossings(l_.rows, l_.order);
+            if (drawn == made && after < crossings) {
+                crossings = after;
+                continue;
+            }
+            l_.rows = rows;
+            l_.order = order;
+            l_.marked = marked;
+            return;
+        }
+    }
+
+    static std::int32_t marksIn(const MarkedLinks& marked) {
+        const auto isMark = [](std::uint8_t mark) { return mark != 0; };
+        return static_cast<std::int32_t>(std::count_if(marked.child.begin(), marked.child.end(), isMark) +
+                                         std::count_if(marked.partner.begin(), marked.partner.end(), isMark));
     }
 
     int starts() const {

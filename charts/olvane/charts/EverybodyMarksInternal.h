@@ -39,4 +39,10 @@ void markAllSecondLinks(const Component& part, const Chains& chains,
 std::int32_t markWorstLinks(const Component& part, const Chains& chains, const Rows& rows,
                             const RowOrder& order, std::int32_t count, MarkedLinks& marked);
 
+// Up to count marks, but none of forced, are lines again: those that cross the fewest lines in this order, of links to
+// the next row and along one. Returns how many.
+std::int32_t drawBestLinks(const Component& part, const Chains& chains, const Rows& rows,
+                           const RowOrder& order, std::int32_t count, const MarkedLinks& forced,
+                           MarkedLinks& marked);
+
 }  // namespace olvane::charts

@@ -107,6 +107,41 @@ const kTasks = {
         await walk.until(() => location.hash.includes("view=everybody"));
         return walk.picture();
     },
+    "see everybody as a map, and follow kin by keys": async (walk) => {
+        await walk.click("#views-button");
+        await walk.click("#choose-map");
+        await walk.until(() => location.hash.startsWith("#map=") && one("#map-card h2") !== null);
+        await walk.window.evaluate(() => one("#map canvas").focus());
+        const before = await walk.text("#map-card h2");
+        await walk.press("ArrowUp");
+        const parent = await walk.text("#map-card h2");
+        assert.notEqual(parent, before);
+        await walk.press("ArrowDown");
+        assert.equal(await walk.text("#map-card h2"), before);
+        // What is drawn is not the page's colour alone.
+        const colours = await walk.window.evaluate(() => {
+            const { width, height } = one("#map canvas");
+            const { data } = one("#map canvas").getContext("2d").getImageData(0, 0, width, height);
+            const seen = new Set();
+            for (let at = 0; at < data.length; at += 4) seen.add((data[at] << 16) | (data[at + 1] << 8) | data[at + 2]);
+            return seen.size;
+        });
+        assert.ok(colours > 3, `${colours} colours`);
+        return `${before}, ${parent}`;
+    },
+    "find somebody on the map and go to their family": async (walk) => {
+        await walk.click("#views-button");
+        await walk.click("#choose-map");
+        await walk.until(() => location.hash.startsWith("#map="));
+        await walk.click("#search");
+        await walk.type("josiah 1730");
+        await walk.press("Enter");
+        await walk.until(() => /Josiah/.test(one("#map-card h2")?.textContent));
+        await walk.window.evaluate(() => one("#map canvas").focus());
+        await walk.press("Enter");
+        await walk.until(() => /Josiah/.test(one("#side-panel h2")?.textContent));
+        return walk.focus();
+    },
     "copy a link to what is seen": async (walk) => {
         await walk.window.evaluate(() => {
             const keep = (text) => Promise.resolve((window.copied = text));

@@ -128,6 +128,25 @@ TEST(Everybody, makesNoMoreMarksThanAreAskedFor) {
     }
 }
 
+TEST(Everybody, crossesNoLinesWithAtLeastAsManyMarksAsThereAreSecondLinks) {
+    for (const Made& made : families(40)) {
+        EXPECT_EQ(olvane::picture::judge(chart(made.graph, 1000)).crossings, 0U) << made.name;
+    }
+}
+
+// From an order that is best with all lines, marking one after the other leaves 573 crossings here.
+TEST(Everybody, crossesLittleWithNearlyAllSecondLinksAsMarks) {
+    std::size_t crossings = 0;
+    for (std::uint64_t seed = 0; seed < 6; ++seed) {
+        const KinGraph graph = olvane::test::soundKin(seed, 400);
+        const std::size_t all = chart(graph, -1).marks.size();
+        const Picture picture = chart(graph, static_cast<int>(all * 9 / 10));
+        EXPECT_LE(picture.marks.size(), all * 9 / 10) << "seed " << seed;
+        crossings += olvane::picture::judge(picture).crossings;
+    }
+    EXPECT_LE(crossings, 190U);
+}
+
 // The middle of each box down the picture: rows have one middle.
 std::map<std::int64_t, double> middles(const Picture& picture) {
     std::map<std::int64_t, double> middles;
