@@ -75,28 +75,24 @@ gedcom::GedcomData read(const InputOptions& input, gedcom::ReadOptions options =
     }
 }
 
+gedcom::GedcomData readAndReport(const InputOptions& input, const gedcom::ReadOptions& options = {}) {
+    gedcom::GedcomData data = read(input, options);
+    report(data);
+    return data;
+}
+
 }  // namespace
 
 gedcom::GedcomData readFile(const InputOptions& input) {
-    gedcom::GedcomData data = read(input);
-    report(data);
-    return data;
+    return readAndReport(input);
 }
 
 gedcom::GedcomData readFileWithFacts(const InputOptions& input) {
-    gedcom::ReadOptions options;
-    options.facts = true;
-    gedcom::GedcomData data = read(input, options);
-    report(data);
-    return data;
+    return readAndReport(input, {.facts = true});
 }
 
 gedcom::GedcomData readFileWithDetails(const InputOptions& input) {
-    gedcom::ReadOptions options;
-    options.details = true;
-    gedcom::GedcomData data = read(input, options);
-    report(data);
-    return data;
+    return readAndReport(input, {.details = true});
 }
 
 gedcom::GedcomData readFileQuietly(const InputOptions& input) {
