@@ -17,6 +17,9 @@ struct CalendarDate {
     int day = 0;
 };
 
+// The last year that a date is read of, of either era.
+constexpr int kLastYear = 9999;
+
 // The highest day number of the month; 0 for a month that the calendar does not have.
 int daysInMonth(Calendar calendar, int year, int month);
 

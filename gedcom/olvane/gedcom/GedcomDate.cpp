@@ -20,8 +20,6 @@
 namespace olvane::gedcom {
 namespace {
 
-constexpr int kLastYear = 9999;
-
 constexpr bool isSpace(char c) {
     return c == ' ' || c == '\t' || c == '\n' || c == '\r';
 }
@@ -483,39 +481,6 @@ void readSingle(Words& words, DateMark mark, GedcomDate& date) {
     if (read && onlyPhraseLeft(words)) store(*read, mark, date);
 }
 
-std::string yearText(int year) {
-    return year < 0 ? std::to_string(-year) + " BC" : std::to_string(year);
-}
-
-// Appends the number in so many digits at least.
-void appendPadded(std::string& text, int number, std::size_t digits) {
-    const std::string plain = std::to_string(number);
-    if (plain.size() < digits) text.append(digits - plain.size(), '0');
-    text.append(plain);
-}
-
-// Years B.C. are turned round, so that they sort: "-9955" is 44 B.C.
-std::string sortableDate(const CalendarDate& date) {
-    std::string text;
-    if (date.year < 0) text.push_back('-');
-    appendPadded(text, date.year < 0 ? kLastYear + date.year : date.year, 4);
-    for (const int part : {date.month, date.day}) {
-        if (part == 0) break;
-        text.push_back('-');
-        appendPadded(text, part, 2);
-    }
-    return text;
-}
-
-// The day, month or year before, as fine as the date is.
-CalendarDate justBefore(const CalendarDate& date) {
-    CalendarDate before =
-        previousDay({date.year, date.month == 0 ? 1 : date.month, date.day == 0 ? 1 : date.day});
-    if (date.day == 0) before.day = 0;
-    if (date.month == 0) before.month = 0;
-    return before;
-}
-
 }  // namespace
 
 namespace {
@@ -662,27 +627,6 @@ GedcomDate parseGedcomDate(std::string_view written) {
             if (!readYearRange(text, date)) readSingle(words, signs, date);
     }
     return date;
-}
-
-std::string sortText(const GedcomDate& date) {
-    if (!date.isRead()) return {};
-    const CalendarDate day = {date.year, date.month, date.day};
-    if (date.mark == DateMark::after) return sortableDate(day) + "~";
-    if (date.mark == DateMark::before && date.year > -kLastYear) return sortableDate(justBefore(day)) + "~";
-    return sortableDate(day);
-}
-
-std::string displayYear(const GedcomDate& date) {
-    if (!date.isRead()) return std::string(date.written);
-    std::string text;
-    if (date.mark == DateMark::about) text.push_back('~');
-    if (date.mark == DateMark::before) text.push_back('<');
-    if (date.mark == DateMark::after) text.push_back('>');
-    text.append(yearText(date.year));
-    if (date.mark == DateMark::between && date.lastYear != 0 && date.lastYear != date.year) {
-        text.append("-").append(yearText(date.lastYear));
-    }
-    return text;
 }
 
 }  // namespace olvane::gedcom
