@@ -26,6 +26,7 @@ CLI::Validator choice(const std::map<std::string, Value>& values) {
         [values, transform](std::string& text) {
             if (values.contains(text)) return transform(text);
             std::vector<std::string> words;
+            words.reserve(values.size());
             for (const auto& [word, value] : values) words.push_back(word);
             return noneOf(text, words);
         },

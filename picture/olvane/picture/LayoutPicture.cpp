@@ -27,7 +27,7 @@ using kin::at;
 
 // As the coordinates are cut, and like them within the range of an int.
 float wholeSize(float size) {
-    constexpr float kGreatest = 2147483520;  // the greatest float below 2^31
+    constexpr float kGreatest = 2147483520.0F;  // the greatest float below 2^31
     return size > 0 ? std::trunc(std::min(size, kGreatest)) : 0;
 }
 
