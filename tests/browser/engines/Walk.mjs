@@ -50,14 +50,20 @@ export class Walk {
         });
     }
 
-    async click(selector, times = 1) {
+    /** The middle of the first of them that is drawn, brought into sight. */
+    async placeOf(selector) {
         const place = await this.window.evaluate((selector) => {
-            const part = one(selector);
-            part?.scrollIntoView?.({ block: "nearest" });
+            const part = all(selector).find((one) => one.getClientRects().length > 0);
+            if (part && !part.closest("#tree")) part.scrollIntoView({ block: "nearest" });
             const area = part?.getBoundingClientRect();
             return area ? { x: area.left + area.width / 2, y: area.top + area.height / 2 } : null;
         }, selector);
         if (!place) throw new Error(`${this.window.name}: there is no ${selector}`);
+        return place;
+    }
+
+    async click(selector, times = 1) {
+        const place = await this.placeOf(selector);
         this.clicks += times;
         await this.window.clickAt(place, times);
         await this.still();

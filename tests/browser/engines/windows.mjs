@@ -63,6 +63,14 @@ class PuppeteerWindow {
         await this.page.mouse.click(x, y, { count: times });
     }
 
+    async tapAt({ x, y }, times = 1) {
+        for (let i = 0; i < times; ++i) await this.page.touchscreen.tap(x, y);
+    }
+
+    resize(size) {
+        return this.page.setViewport(size);
+    }
+
     async type(text) {
         await this.page.keyboard.type(text);
     }
@@ -134,17 +142,27 @@ class WebDriverWindow {
         return answer.value;
     }
 
-    async clickAt({ x, y }, times = 1) {
+    clickAt(place, times = 1) {
+        return this.pointer("mouse", place, times);
+    }
+
+    tapAt(place, times = 1) {
+        return this.pointer("touch", place, times);
+    }
+
+    async pointer(pointerType, { x, y }, times) {
         const clicks = Array.from({ length: times }, () => [
             { type: "pointerDown", button: 0 },
             { type: "pointerUp", button: 0 },
         ]).flat();
         const move = { type: "pointerMove", x: Math.round(x), y: Math.round(y), duration: 0 };
         await this.send("POST", "/actions", {
-            actions: [
-                { type: "pointer", id: "mouse", parameters: { pointerType: "mouse" }, actions: [move, ...clicks] },
-            ],
+            actions: [{ type: "pointer", id: pointerType, parameters: { pointerType }, actions: [move, ...clicks] }],
         });
+    }
+
+    resize(size) {
+        return this.send("POST", "/window/rect", { x: 0, y: 0, ...size });
     }
 
     async type(text) {

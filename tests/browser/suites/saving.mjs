@@ -159,6 +159,17 @@ describe("saving", kTwoAtOnce, () => {
         assert.equal(pagesOf(pdf), sheets);
         // A4 in points, upright or across.
         assert.match(pdf.toString("latin1"), /\/MediaBox \[0 0 (59[45][.0-9]* 84[12]|84[12][.0-9]* 59[45])/);
+        await page.selectOption("#purpose", "grandparents");
+        assert.match(page.url(), /view=hourglass/);
+        assert.match(page.url(), /up=2/);
+        assert.deepEqual(
+            await page.evaluate(() => ["paper", "sheet-rows", "sheet-columns"].map((id) => one("#" + id).value)),
+            ["A4", "1", "1"],
+        );
+        assert.match(await message(), /^1 sheet, /);
+        await page.selectOption("#purpose", "everybody");
+        assert.match(page.url(), /view=everybody/);
+        assert.equal(await page.inputValue("#paper"), "A0");
         await visit.click("#print-dialog-close");
         assert.equal(pagesOf(await page.pdf({ preferCSSPageSize: true })), 1);
         await visit.end();

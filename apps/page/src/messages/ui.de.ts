@@ -123,6 +123,15 @@ export const uiGerman: UiMessages = {
     paper: {
         title: "Auf gewähltem Papier oder als Poster drucken…",
         paper: "Papier",
+        purpose: "Bild",
+        shown: "Was zu sehen ist",
+        print: "Drucken oder als PDF sichern…",
+        purposes: {
+            grandparents: "Großeltern und alle darunter auf A4",
+            ancestors: "Alle Vorfahren auf A3",
+            descendants: "Alle Nachfahren auf zwei A3",
+            everybody: "Alle als Poster A0",
+        },
         letter: "Letter (US-Brief)",
         rows: "Reihen von Blättern",
         columns: "Spalten von Blättern",

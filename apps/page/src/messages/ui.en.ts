@@ -122,6 +122,15 @@ export const uiEnglish: UiMessages = {
     paper: {
         title: "Print on chosen paper or as a poster…",
         paper: "Paper",
+        purpose: "Picture",
+        shown: "What is shown",
+        print: "Print, or save as PDF…",
+        purposes: {
+            grandparents: "Grandparents and below on A4",
+            ancestors: "All ancestors on A3",
+            descendants: "All descendants on two A3",
+            everybody: "Everybody as a poster A0",
+        },
         letter: "Letter",
         rows: "Rows of sheets",
         columns: "Columns of sheets",

@@ -127,6 +127,15 @@ export const uiSpanish: UiMessages = {
     paper: {
         title: "Imprimir en el papel elegido o como póster…",
         paper: "Papel",
+        purpose: "Imagen",
+        shown: "Lo que se ve",
+        print: "Imprimir o guardar como PDF…",
+        purposes: {
+            grandparents: "Abuelos y todos los de abajo en A4",
+            ancestors: "Todos los antepasados en A3",
+            descendants: "Todos los descendientes en dos A3",
+            everybody: "Todos en un póster A0",
+        },
         letter: "Carta",
         rows: "Filas de hojas",
         columns: "Columnas de hojas",

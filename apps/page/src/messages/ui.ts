@@ -105,6 +105,10 @@ export interface UiMessages {
     readonly paper: {
         readonly title: string;
         readonly paper: string;
+        readonly purpose: string;
+        readonly shown: string;
+        readonly print: string;
+        readonly purposes: Readonly<Record<"grandparents" | "ancestors" | "descendants" | "everybody", string>>;
         readonly letter: string;
         readonly rows: string;
         readonly columns: string;

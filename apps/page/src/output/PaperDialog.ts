@@ -7,13 +7,24 @@ import type { PaperOptions, PaperSheets } from "olvane";
 import { iconButton } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import type { UiMessages } from "../messages/ui";
+import type { ViewState } from "../view/ViewState";
 import { svgBlob } from "./saving";
 
 const kPapers = ["A4", "A3", "A2", "A1", "A0", "letter"] as const;
 const kMostOneWay = 10; // sheets
 
+/** What is often printed: a view, and the paper for it. */
+const kPurposes = {
+    grandparents: { paper: "A4", rows: 1, columns: 1, shows: { view: "hourglass", up: 2, down: 0 } },
+    ancestors: { paper: "A3", rows: 1, columns: 1, shows: { view: "ancestors", up: 0 } },
+    descendants: { paper: "A3", rows: 1, columns: 2, shows: { view: "descendants", down: 0 } },
+    everybody: { paper: "A0", rows: 1, columns: 1, shows: { view: "everybody" } },
+} as const;
+export type Purpose = keyof typeof kPurposes;
+
 export class PaperDialog {
     readonly element: HTMLDialogElement;
+    private readonly purpose = html("select", { id: "purpose" });
     private readonly paper = html("select", { id: "paper" });
     private readonly rows = html("select", { id: "sheet-rows" });
     private readonly columns = html("select", { id: "sheet-columns" });
@@ -23,10 +34,11 @@ export class PaperDialog {
     private addresses: string[] = [];
     private shown: PaperSheets | null = null;
 
-    // sheetsOf gives what is shown on that paper, or null before any family is open.
+    // sheetsOf gives what is shown on that paper, or null before any family is open; look shows another view.
     constructor(
         private readonly ui: UiMessages,
         private readonly sheetsOf: (paper: PaperOptions) => PaperSheets | null,
+        private readonly look: (wanted: Partial<ViewState>) => void,
     ) {
         const close = iconButton("print-dialog-close", "close", ui.close, () => this.element.close());
         const choice = (label: string, select: HTMLSelectElement) =>
@@ -35,6 +47,7 @@ export class PaperDialog {
             "dialog",
             { id: "print-dialog", "aria-labelledby": "print-dialog-title" },
             html("div", { class: "dialog-head" }, html("h2", { id: "print-dialog-title" }, ui.paper.title), close),
+            choice(ui.paper.purpose, this.purpose),
             choice(ui.paper.paper, this.paper),
             choice(ui.paper.rows, this.rows),
             choice(ui.paper.columns, this.columns),
@@ -42,6 +55,10 @@ export class PaperDialog {
             this.message,
             this.print,
         );
+        this.purpose.append(html("option", { value: "" }, ui.paper.shown));
+        for (const value of Object.keys(kPurposes) as Purpose[])
+            this.purpose.append(html("option", { value }, ui.paper.purposes[value]));
+        this.purpose.addEventListener("change", () => this.choosePurpose());
         for (const value of kPapers) {
             this.paper.append(html("option", { value }, value === "letter" ? ui.paper.letter : value));
         }
@@ -50,7 +67,7 @@ export class PaperDialog {
         }
         for (const select of [this.paper, this.rows, this.columns])
             select.addEventListener("change", () => this.show());
-        this.print.textContent = ui.print;
+        this.print.textContent = ui.paper.print;
         onClick(this.print, () => window.print());
         this.element.addEventListener("close", () => this.empty());
     }
@@ -61,7 +78,18 @@ export class PaperDialog {
     }
 
     open(): void {
+        this.purpose.value = "";
         this.element.showModal();
+        this.show();
+    }
+
+    private choosePurpose(): void {
+        const chosen = kPurposes[this.purpose.value as Purpose] as (typeof kPurposes)[Purpose] | undefined;
+        if (!chosen) return;
+        this.paper.value = chosen.paper;
+        this.rows.value = String(chosen.rows);
+        this.columns.value = String(chosen.columns);
+        this.look(chosen.shows);
         this.show();
     }
 

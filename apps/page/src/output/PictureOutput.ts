@@ -6,6 +6,7 @@
 import type { DrawingTheme, PaperOptions, PaperSheets } from "olvane";
 import type { UiMessages } from "../messages/ui";
 import type { Notices } from "../ui/Notices";
+import type { ViewState } from "../view/ViewState";
 import { PaperDialog } from "./PaperDialog";
 import { PrintSheet } from "./printing";
 import { pngOf, saveFile, svgBlob } from "./saving";
@@ -18,6 +19,8 @@ export interface Subject {
     drawing(theme: DrawingTheme): string;
     // On paper, in the colours of paper.
     sheets(paper: PaperOptions): PaperSheets | null;
+    // Shows another view in its place.
+    look(wanted: Partial<ViewState>): void;
 }
 
 export class PictureOutput {
@@ -39,7 +42,11 @@ export class PictureOutput {
     /** Makes what holds words; the dialog is to stand in the document. */
     rebuild(ui: UiMessages): HTMLDialogElement {
         this.paper?.element.remove();
-        this.paper = new PaperDialog(ui, (paper) => this.subject()?.sheets(paper) ?? null);
+        this.paper = new PaperDialog(
+            ui,
+            (paper) => this.subject()?.sheets(paper) ?? null,
+            (wanted) => this.subject()?.look(wanted),
+        );
         return this.paper.element;
     }
 

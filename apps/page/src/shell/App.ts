@@ -574,6 +574,7 @@ export class App implements ChromeActions {
             name: fileNameOf(this.fileName.replace(/\.[^.]*$/, ""), this.tree.nameOf(focus)),
             drawing: (theme) => this.tree.drawing(theme) ?? "",
             sheets: (paper) => this.tree.sheets(paper),
+            look: (wanted) => void this.tree.show(wanted, null, true),
         };
     }
 }
