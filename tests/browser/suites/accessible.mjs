@@ -93,6 +93,11 @@ describe("accessible", kTwoAtOnce, () => {
         await page.click("#keys-button");
         await expectNoViolation(visit, "keys");
         await page.keyboard.press("Escape");
+        await page.click("#file-button");
+        await page.click("#print-sheets");
+        await page.waitForSelector(".sheet-preview img");
+        await expectNoViolation(visit, "choice of paper");
+        await page.keyboard.press("Escape");
         await page.click("#legend summary");
         await page.fill("#search", "darwin");
         await expectNoViolation(visit, "search and legend");
