@@ -11,6 +11,7 @@ const kSuites = [
     "walking",
     "searching",
     "options",
+    "folding",
     "saving",
     "hostile",
     "looks",

@@ -15,6 +15,7 @@ import {
     sameState,
     unknownPersonIn,
     type ViewState,
+    withFold,
     withNextParents,
 } from "../src/view/ViewState";
 import { person } from "./persons";
@@ -44,6 +45,8 @@ test("an address leads back to the state that it was made of", () => {
     const states: ViewState[] = [
         { ...usual, view: "pedigree", generations: 7 },
         { ...usual, view: "hourglass", up: 0, down: 30, direction: "left", compact: true },
+        { ...usual, mirrored: false },
+        { ...usual, view: "near", mirrored: true, folded: [{ person: 2, branch: "beside" }] },
         { ...usual, view: "fan", up: 9 },
         { ...usual, view: "kinship", to: 4, direction: "right" },
         { ...usual, hidden: new Set(["cousins", "siblings"]), unknownParents: false, photos: true },
@@ -54,6 +57,17 @@ test("an address leads back to the state that it was made of", () => {
         const address = addressOf(state, persons);
         assert.ok(sameState(readAddress(address, persons, usual), state), address);
     }
+});
+
+test("folds of an address that name nobody or no branch are passed over", () => {
+    const { folded } = readAddress("#view=near&fold=I1.up,I1.aside,nobody.down,2.down", persons, usual);
+    assert.deepEqual(folded, [
+        { person: 1, branch: "up" },
+        { person: 2, branch: "down" },
+    ]);
+    const state = { ...usual, folded };
+    assert.deepEqual(withFold(state, 2, "down"), [{ person: 1, branch: "up" }]);
+    assert.deepEqual(withFold(state, 1, "down"), [...folded, { person: 1, branch: "down" }]);
 });
 
 test("what a view has no use for is not in its address", () => {

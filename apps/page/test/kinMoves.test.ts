@@ -66,6 +66,8 @@ test("a chart that lies otherwise is walked as it lies", () => {
     const pedigree = new Picture("pedigree", "down", 1, values(sideways));
     assert.equal(leads(pedigree, 1, "right"), 2);
     assert.equal(leads(pedigree, 1, "left"), 6);
+    const mirrored = boxes.map(({ index, id, x, y }) => box(index, id, y, x));
+    assert.equal(leads(new Picture("pedigree", "down", 1, values(mirrored), true), 1, "left"), 2);
 });
 
 test("a parent who is not known is reached, and left again", () => {

@@ -29,6 +29,7 @@ export function values(boxes: readonly PictureBox[], more: Partial<PictureValues
         boxes,
         families: [],
         marks: [],
+        folded: [],
         arcs: [],
         rings: null,
         kinship: null,

@@ -29,6 +29,11 @@ export function hasDirection(view: ViewName): boolean {
     return !["family", "pedigree", "fan"].includes(view);
 }
 
+// Views whose branches fold.
+export function hasFolds(view: ViewName): boolean {
+    return hasCompact(view) && view !== "kinship";
+}
+
 // Views whose generations can be packed tighter.
 export function hasCompact(view: ViewName): boolean {
     return hasDirection(view) && view !== "everybody";

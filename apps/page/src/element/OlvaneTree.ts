@@ -7,6 +7,8 @@
 // on one page.
 
 import {
+    type Branch,
+    type BranchSize,
     type DrawingTheme,
     type GedcomFile,
     LayoutError,
@@ -17,7 +19,7 @@ import {
     type PictureOptions,
 } from "olvane";
 import { html, setAttributes, svg } from "../base/dom";
-import type { ViewName } from "../base/views";
+import { hasFolds, type ViewName } from "../base/views";
 import { type Messages, messagesFor } from "../messages";
 import { nameOf, yearsOf } from "../messages/names";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
@@ -38,8 +40,10 @@ import {
     factsIn,
     kUsualState,
     readAddress,
+    type Reader,
     sameState,
     type ViewState,
+    withFold,
     withNextParents,
 } from "../view/ViewState";
 import { viewerStyles } from "./styles";
@@ -51,6 +55,8 @@ const kWarmUpPause = 120; // ms
 const kWarmEnough = 12; // ms; what takes less needs no warming
 const kRedrawDelay = 60; // ms
 const kKinshipDelay = 600; // ms after the picture of a larger family, when its boxes are in their places
+
+const kRightToLeft = /^(ar|dv|fa|he|iw|ps|sd|ug|ur|yi)\b/i; // languages
 
 /** What stands in the box of a person, which has this width and height in points; null for the usual. */
 export type BoxRenderer = (person: Person, box: { width: number; height: number }) => SVGElement | null;
@@ -109,13 +115,13 @@ export class OlvaneTree extends HTMLElement {
         super();
         this.shadow = this.attachShadow({ mode: "open", delegatesFocus: false });
         this.shadow.adoptedStyleSheets = [...viewerStyles()];
-        const language = this.getAttribute("language") ?? navigator.language;
-        this.messages = messagesFor(language);
-        this.ui = uiMessagesFor(language);
+        this.messages = messagesFor(this.languageTag);
+        this.ui = uiMessagesFor(this.languageTag);
         this.scene = new Scene(this.surface, {
             opened: (box) => this.openBox(box),
             selected: (box) => this.selectBox(box),
             furtherParents: (box) => this.showFurtherParents(box),
+            folded: (box, branch) => this.fold(box, branch),
             active: (box) => this.showInPanel(box.person || box.child),
             pointed: (box, element) => this.pointAt(box, element),
             moved: (placing) => this.moved(placing),
@@ -306,7 +312,7 @@ export class OlvaneTree extends HTMLElement {
         const start = performance.now();
         let picture: Picture;
         try {
-            picture = opened.picture(state, this.messages.language as PictureOptions["language"]);
+            picture = opened.picture(state, this.reader);
         } catch (error) {
             this.shownState ??= state;
             this.emit("refused", { tooLarge: error instanceof LayoutError && error.status === "tooLarge" });
@@ -340,6 +346,26 @@ export class OlvaneTree extends HTMLElement {
     private showFurtherParents(box: Box): void {
         const person = this.opened?.person(box.person);
         if (person && this.shownState) this.show(withNextParents(person, this.shownState), box, true);
+    }
+
+    // Folds a branch or unfolds it, in place; the keys stay on the box.
+    private fold(box: Box, branch: Branch): void {
+        const { shownState } = this;
+        if (!shownState || !box.person) return;
+        const keys = holdsKeys(this.shadow);
+        this.show({ folded: withFold(shownState, box.person, branch) }, box, true);
+        const again = this.picture?.boxOfKey(box.key);
+        if (again) this.scene.activate(again, keys);
+    }
+
+    // In what language pictures are, and which way it is read.
+    private get reader(): Reader {
+        const rightToLeft = getComputedStyle(this).direction === "rtl" || kRightToLeft.test(this.languageTag);
+        return { language: this.messages.language as PictureOptions["language"], rightToLeft };
+    }
+
+    private get languageTag(): string {
+        return this.getAttribute("language") ?? navigator.language;
     }
 
     /** Makes a person the focus, from the box where they stand. */
@@ -412,17 +438,13 @@ export class OlvaneTree extends HTMLElement {
     /** The whole picture as the text of an SVG file; null before any. */
     drawing(theme: DrawingTheme): string | null {
         const { opened, shownState } = this;
-        return opened && shownState && this.picture
-            ? opened.svg(shownState, theme, this.messages.language as PictureOptions["language"])
-            : null;
+        return opened && shownState && this.picture ? opened.svg(shownState, theme, this.reader) : null;
     }
 
     /** The whole picture on sheets of paper, in its colours; null before any. */
     sheets(paper: PaperOptions): PaperSheets | null {
         const { opened, shownState } = this;
-        return opened && shownState && this.picture
-            ? opened.sheets(shownState, paper, this.messages.language as PictureOptions["language"])
-            : null;
+        return opened && shownState && this.picture ? opened.sheets(shownState, paper, this.reader) : null;
     }
 
     /** What the picture is called; empty before any. */
@@ -468,6 +490,8 @@ export class OlvaneTree extends HTMLElement {
                 this.takeKeys();
             },
             relate: (person) => void this.show({ view: "kinship", to: person }, null, true),
+            waysAddressOf: (person) =>
+                addressOf({ ...this.shownState!, view: "kinship", to: person }, this.opened!.persons),
             nextBox: (person) => this.nextBox(person),
             addressOf: (person) => addressOf({ ...this.shownState!, focus: person }, this.opened!.persons),
         });
@@ -524,6 +548,7 @@ export class OlvaneTree extends HTMLElement {
             focus: opened.person(shownState.focus)!,
             kinship: isFocus ? "" : (this.contents?.kinshipOf(person.id) ?? ""),
             boxes: picture.boxesOf(person.id).length,
+            showsWays: picture.kinship !== null,
         });
     }
 
@@ -567,6 +592,7 @@ export class OlvaneTree extends HTMLElement {
             panBy: (dx, dy) => this.scene.camera.panBy(dx, dy),
             chooseActive: () => this.chooseActive(),
             nextBox: () => this.nextBox(),
+            fold: (branch) => this.foldActive(branch),
             home: () => this.home(),
             zoomIn: () => this.zoomBy(1.35),
             zoomOut: () => this.zoomBy(1 / 1.35),
@@ -579,6 +605,8 @@ export class OlvaneTree extends HTMLElement {
         if (!this.opened || event.defaultPrevented) return;
         const target = event.composedPath()[0] as Element;
         if (target.matches("input:not([type=checkbox]), select, textarea")) return;
+        const branch = [" ", "Enter"].includes(event.key) && target.getAttribute("data-branch");
+        if (branch && this.foldActive(branch as Branch)) return event.preventDefault();
         if (this.press(event)) event.preventDefault();
     }
 
@@ -592,6 +620,13 @@ export class OlvaneTree extends HTMLElement {
 
     private chooseActive(): void {
         if (this.scene.active) this.openBox(this.scene.active);
+    }
+
+    private foldActive(branch: Branch): boolean {
+        const box = this.scene.active;
+        if (!box || !this.contents?.branchesOf(box).some((mark) => mark.branch === branch)) return false;
+        this.fold(box, branch);
+        return true;
     }
 
     private nextBox(person = this.scene.active?.person ?? 0): void {
@@ -610,8 +645,14 @@ export class OlvaneTree extends HTMLElement {
             kinshipInBoxes: this.getAttribute("kinship") !== "none",
             show: this.shownState?.show ?? kUsualState.show,
             render: this.boxRenderer,
+            branchesOf: (person) => this.branchesOf(family, person),
             portraitOf: this.shownState?.photos ? (person) => family.portraitOf(person, () => this.redrawSoon()) : null,
         });
+    }
+
+    private branchesOf(family: OpenFamily, person: number): readonly BranchSize[] {
+        const state = this.shownState;
+        return state && hasFolds(state.view) ? family.branches(state, person, this.reader) : [];
     }
 
     // In a large family or picture the boxes come first; what is written into them of kinship follows, found out a little
@@ -641,7 +682,7 @@ export class OlvaneTree extends HTMLElement {
             const { shownState } = this;
             if (!opened || this.opened !== opened || !this.picture || !shownState) return;
             const start = performance.now();
-            opened.picture(shownState, this.messages.language as PictureOptions["language"]);
+            opened.picture(shownState, this.reader);
             if (performance.now() - start > kWarmEnough && times > 1) this.warmUp(times - 1);
         }, kWarmUpPause);
     }

@@ -3,7 +3,7 @@
 
 // The texts of the page's own parts, in each language that it speaks.
 
-import type { ShownFact } from "olvane";
+import type { Branch, ShownFact } from "olvane";
 import type { ChartDirection, RelativeName, ViewName } from "../base/views";
 import { uiGerman } from "./ui.de";
 import { uiEnglish } from "./ui.en";
@@ -83,6 +83,12 @@ export interface UiMessages {
     readonly shownFacts: Readonly<Record<"label" | ShownFact, string>>;
     /** Generations packed tighter. */
     readonly compact: string;
+    readonly mirrored: string;
+    // What a branch is called, and what folds it, unfolds it and says that it is folded; n persons are hidden.
+    readonly branches: Readonly<Record<Branch, string>>;
+    readonly fold: (branch: string, name: string, n: number) => string;
+    readonly unfold: (branch: string, name: string, n: number) => string;
+    readonly folded: (branch: string, n: number) => string;
     readonly encoding: string;
     readonly encodingAuto: string;
     readonly file: string;

@@ -4,11 +4,11 @@
 // What stands in each box and what is read out for it. Kinship is stated only once it is known, since a search
 // through a large family must not hold up the picture.
 
-import type { NameParts, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
+import type { BranchSize, NameParts, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { nameOf, yearsOf } from "../messages/names";
-import type { BoxLook } from "./boxArt";
+import type { BoxLook, BranchMark } from "./boxArt";
 import type { BoxContents } from "./Scene";
 import type { KinshipTexts } from "../view/KinshipTexts";
 import type { OpenFamily } from "../view/OpenFamily";
@@ -24,6 +24,8 @@ export interface Wording {
     /** The address of somebody's photograph, null where there is none; null where boxes show none. */
     readonly render: ((person: Person, box: Box) => SVGElement | null) | null;
     readonly portraitOf: ((person: number) => string | null) | null;
+    /** The branches of a person in the picture. */
+    readonly branchesOf: (person: number) => readonly BranchSize[];
 }
 
 export class PictureContents implements BoxContents {
@@ -77,6 +79,20 @@ export class PictureContents implements BoxContents {
         return person ? this.personLook(person, box) : this.missingLook(box);
     }
 
+    // What can be folded or unfolded at a box.
+    branchesOf(box: Box): BranchMark[] {
+        const branches = box.person ? this.wording.branchesOf(box.person) : [];
+        return branches.filter(({ count }) => count > 0).map((size) => this.branchMark(box, size));
+    }
+
+    private branchMark(box: Box, size: BranchSize): BranchMark {
+        const { ui, messages } = this.wording;
+        const isFolded = box.folded.some(({ branch }) => branch === size.branch);
+        const name = nameOf(this.family.person(box.person)!, messages);
+        const label = (isFolded ? ui.unfold : ui.fold)(ui.branches[size.branch], name, size.count);
+        return { ...size, isFolded, label };
+    }
+
     labelOf(family: PictureFamily): string {
         const { show } = this.wording;
         return show.has("marriage") && family.number > 0 ? this.family.file.labelOfFamily(family.number, show) : "";
@@ -96,7 +112,8 @@ export class PictureContents implements BoxContents {
             ...(says?.details ?? []),
             isFocus ? ui.inFocus : kinship,
             boxes > 1 && ui.severalBoxes(boxes),
-            hidden >= 0 && ui.hiddenCount(hidden),
+            hidden >= 0 && box.folded.length === 0 && ui.hiddenCount(hidden),
+            ...box.folded.map(({ branch, count }) => ui.folded(ui.branches[branch], count)),
             box.caption,
             box.kinshipPlace === "ancestor" && ui.commonAncestor,
             box.furtherParents > 0 && ui.furtherParents,
@@ -117,6 +134,7 @@ export class PictureContents implements BoxContents {
             factHeight: factHeight(show),
             kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
             hidden,
+            folded: box.folded.map((branch) => this.branchMark(box, branch)),
             further: box.furtherParents > 0 ? ui.furtherParents : "",
             caption: box.caption,
             kinshipPlace: box.kinshipPlace,
@@ -146,6 +164,7 @@ export class PictureContents implements BoxContents {
             factHeight: factHeight(this.wording.show),
             kinship: null,
             hidden: -1,
+            folded: [],
             further: "",
             caption: "",
             kinshipPlace: null,

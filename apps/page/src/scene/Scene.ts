@@ -7,17 +7,18 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
-import type { PictureFamily, Texts } from "olvane";
-import { prefersStillness, svg } from "../base/dom";
+import type { Branch, PictureFamily, Texts } from "olvane";
+import { prefersStillness, setAttributes, svg } from "../base/dom";
 import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
 import { arcPath } from "./arcArt";
-import { type BoxLook, drawBox, handleOf, repaintBox } from "./boxArt";
+import { type BoxLook, type BranchMark, drawBox, drawBranch, handleOf, repaintBox } from "./boxArt";
 import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 import { drawFamily } from "./familyLines";
 import { drawWays } from "./wayLines";
 
 const kMostReadable = 420; // boxes in sight
+const kMostPointed = 3000; // boxes of a picture in which branches are counted at each box under the pointer
 const kGlideTime = 520; // ms
 const kFadeTime = 200; // ms, as in styles/viewer.css
 const kLineWidth = 1.6; // points
@@ -32,6 +33,8 @@ export interface SceneEvents {
     active(box: Box): void;
     // The mark of further parents was clicked or tapped.
     furtherParents(box: Box): void;
+    // The mark of a branch was clicked or tapped.
+    folded(box: Box, branch: Branch): void;
     pointed(box: Box | null, element: SVGGElement | null): void;
     moved(placing: Placing): void;
 }
@@ -41,6 +44,7 @@ export interface BoxContents {
     // Measures what is written; its fonts are those of the boxes.
     readonly texts: Texts;
     lookOf(box: Box): BoxLook;
+    branchesOf(box: Box): readonly BranchMark[];
     // What stands at the marriage line of a family; empty for nothing.
     labelOf(family: PictureFamily): string;
 }
@@ -104,6 +108,25 @@ export class Scene {
     // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
     redraw(): void {
         for (const [box, element] of this.elements) repaintBox(element, this.contents.lookOf(box), box);
+        this.markBranches();
+    }
+
+    // At the selected box and the one under the pointer stands what folds their branches.
+    private markBranches(): void {
+        if (!this.picture || this.glide) return;
+        const { length } = this.picture.boxes;
+        for (const control of this.boxLayer.querySelectorAll(".fold[role]")) control.remove();
+        const boxes = new Set([this.activeBox, length <= kMostPointed ? this.pointedBox : null]);
+        for (const box of boxes) {
+            const element = box && this.elements.get(box);
+            if (!element || this.isFar) continue;
+            for (const mark of this.contents.branchesOf(box)) {
+                const control = drawBranch(mark, this.contents.texts, box);
+                setAttributes(control, { role: "button", "aria-label": mark.label });
+                if (box === this.activeBox) control.setAttribute("tabindex", "0");
+                element.append(control);
+            }
+        }
     }
 
     restyle(contents: BoxContents): void {
@@ -144,6 +167,7 @@ export class Scene {
         if (takeKeys) this.focusActive();
         this.bringIntoSight(box);
         this.lightFamilies();
+        this.markBranches();
         this.events.active(box);
     }
 
@@ -169,6 +193,7 @@ export class Scene {
         if (this.pointedBox === box) return;
         this.pointedBox = box;
         this.lightFamilies();
+        this.markBranches();
     }
 
     private lightFamilies(): void {
@@ -181,26 +206,30 @@ export class Scene {
     private begin(picture: Picture): void {
         this.camera.place(this.opening(picture));
         this.update();
+        this.markBranches();
     }
 
     private arrive(before: Picture, picture: Picture, held: Box, oldElements: Map<Box, SVGGElement>): void {
         const { k, x, y } = this.camera.placing;
+        // With the same focus the box that was acted on keeps its place, else it hands it to the new one.
+        const heir = (before.focus === picture.focus && picture.boxOfKey(held.key)) || picture.focusBox;
         const oldCentre = middleOf(before.areaOf(held));
-        const newCentre = middleOf(picture.areaOf(picture.focusBox));
+        const newCentre = middleOf(picture.areaOf(heir));
         const shift = { x: newCentre.x - oldCentre.x, y: newCentre.y - oldCentre.y };
         const start = { k, x: x - shift.x * k, y: y - shift.y * k };
-        const target = this.comfortable(picture, start, before.view !== picture.view);
+        const target = this.comfortable(picture, heir, start, before.view !== picture.view);
         if (prefersStillness()) {
             this.ghosts.replaceChildren();
             this.camera.place(target);
+            this.markBranches();
             return;
         }
 
         const from = new Map<string, Point>();
         for (const box of before.boxes) from.set(box.key, { x: box.x + shift.x, y: box.y + shift.y });
-        from.set(picture.focusBox.key, {
-            x: oldCentre.x + shift.x - picture.focusBox.width / 2,
-            y: oldCentre.y + shift.y - picture.focusBox.height / 2,
+        from.set(heir.key, {
+            x: oldCentre.x + shift.x - heir.width / 2,
+            y: oldCentre.y + shift.y - heir.height / 2,
         });
         this.glide = { start: performance.now(), from };
         // Whoever was found far away is not travelled to: the way would show, and draw, all that lies between.
@@ -218,11 +247,11 @@ export class Scene {
         return this.camera.opening(picture.bounds, middleOf(picture.areaOf(picture.focusBox)));
     }
 
-    // Near to where it starts: only so far that the focus stands well in the window, and the whole picture
+    // Near to where it starts: only so far that the box stands well in the window, and the whole picture
     // where the zoom of the moment has room for it.
-    private comfortable(picture: Picture, start: Placing, otherView: boolean): Placing {
+    private comfortable(picture: Picture, box: Box, start: Placing, otherView: boolean): Placing {
         if (otherView) return this.opening(picture);
-        const near = this.camera.including(picture.areaOf(picture.focusBox), 0.3, start);
+        const near = this.camera.including(picture.areaOf(box), 0.3, start);
         return this.camera.includingWhole(picture.bounds, near);
     }
 
@@ -264,6 +293,7 @@ export class Scene {
         this.glide = null;
         this.drawn = null;
         this.update();
+        this.markBranches();
     };
 
     private put(box: Box, element: SVGGElement, part: number): void {
@@ -385,6 +415,8 @@ export class Scene {
             const box = this.boxAt(event.target);
             if (!box) return;
             if ((event.target as Element).closest(".further")) return events.furtherParents(box);
+            const branch = (event.target as Element).closest(".fold")?.getAttribute("data-branch");
+            if (branch) return events.folded(box, branch as Branch);
             // The second of two quick clicks opens what the first one selected.
             const isSecond = event.detail > 1 && box === lastClicked;
             lastClicked = box;

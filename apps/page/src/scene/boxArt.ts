@@ -5,7 +5,7 @@
 // left and lines beside it. Sex is shown by corners and silhouette as well as by colour. Colours come from the
 // page's themes.
 
-import type { NameParts, Sex, Texts } from "olvane";
+import type { BranchSize, NameParts, Sex, Texts } from "olvane";
 import { svg } from "../base/dom";
 import type { Box } from "../view/Picture";
 import { appendArc, lineClass } from "./arcArt";
@@ -15,6 +15,12 @@ import { kSilhouettes } from "../base/silhouettes";
 export interface Extent {
     readonly width: number;
     readonly height: number;
+}
+
+// The mark of a branch: with a count where it is folded, else a stroke that folds it. label says what a click does.
+export interface BranchMark extends BranchSize {
+    readonly isFolded: boolean;
+    readonly label: string;
 }
 
 // Everything that a box shows and says.
@@ -41,6 +47,8 @@ export interface BoxLook {
     readonly kinship: string | null;
     // Relatives without a box: -1 for none, 0 for an unknown number.
     readonly hidden: number;
+    // Marks of branches that are left out.
+    readonly folded: readonly BranchMark[];
     // What the mark of further parents says; empty without one.
     readonly further: string;
     // What the one of a kinship is to the other, at both ends.
@@ -94,7 +102,8 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
         box.append(look.inside);
     } else if (sizes.width > 1.5 * sizes.height) appendWideText(box, look, sizes);
     else appendTallText(box, look, sizes);
-    if (look.hidden >= 0) appendBadge(box, look, sizes);
+    for (const mark of look.folded) box.append(drawBranch(mark, look.texts, sizes));
+    if (look.hidden >= 0 && look.folded.length === 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);
     if (look.further) appendFurtherMark(box, look.further);
     if (look.caption) appendCaption(box, look, sizes);
@@ -287,6 +296,26 @@ function appendMarks(box: SVGGElement, { marks, texts }: BoxLook, { height }: Ex
     });
     badge.append(svg("rect", { width, height: kMarkHeight, rx: 8.5 }), svg("text", { x: width / 2, y: 12.3 }, label));
     box.append(badge);
+}
+
+/** On the edge where the branch stands or would stand. */
+export function drawBranch(
+    { branch, side, count, isFolded, label }: BranchMark,
+    texts: Texts,
+    box: Extent,
+): SVGElement {
+    const sign = isFolded ? "+" + count : "\u2212";
+    const wide = Math.max(20, texts.width(sign, 10.5, true) + 10);
+    const x = side === "left" ? 0 : side === "right" ? box.width : box.width / 2;
+    const y = side === "top" ? -4 : side === "bottom" ? box.height + 4 : box.height / 2;
+    return svg(
+        "g",
+        { class: isFolded ? "fold badge" : "fold mark", "data-branch": branch, transform: `translate(${x} ${y})` },
+        svg("title", {}, label),
+        svg("rect", { class: "reach", x: -wide / 2 - 3, y: -13, width: wide + 6, height: 26 }),
+        svg("rect", { x: -wide / 2, y: -8.5, width: wide, height: 17, rx: 8.5 }),
+        svg("text", { y: 3.8, "aria-hidden": "true" }, sign),
+    );
 }
 
 function appendDuplicateMark(box: SVGGElement): void {

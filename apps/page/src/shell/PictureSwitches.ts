@@ -37,6 +37,10 @@ export class PictureSwitches {
         this.travel({ show: switched(this.tree.state?.show, fact, shown) });
     }
 
+    setMirrored(mirrored: boolean): void {
+        this.travel({ mirrored });
+    }
+
     setCompact(compact: boolean): void {
         this.travel({ compact });
     }

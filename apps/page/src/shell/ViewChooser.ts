@@ -38,6 +38,7 @@ export class ViewChooser {
     private readonly directionRow: HTMLElement;
     private readonly compact: HTMLInputElement;
     private readonly compactRow: HTMLElement;
+    private readonly mirrored: HTMLInputElement;
 
     constructor(
         private readonly ui: UiMessages,
@@ -60,6 +61,7 @@ export class ViewChooser {
         this.directionRow = html("label", { class: "row" }, html("span", {}, ui.direction), this.direction);
         this.compact = checkbox("compact", (checked) => switches.setCompact(checked));
         this.compactRow = switchRow(this.compact, ui.compact);
+        this.mirrored = checkbox("mirrored", (checked) => switches.setMirrored(checked));
         for (const which of ["up", "down"] as const)
             this.depths.set(which, new Depth(which, ui, (n) => switches.setDepth(which, n)));
         this.popover = new Popover(
@@ -71,11 +73,13 @@ export class ViewChooser {
                 ...[...this.depths.values()].map((depth) => depth.row),
                 this.directionRow,
                 this.compactRow,
+                switchRow(this.mirrored, ui.mirrored),
             ),
         );
     }
 
-    show({ view, up, down, direction, to, compact }: ViewState): void {
+    show({ view, up, down, direction, to, compact, mirrored }: ViewState): void {
+        this.mirrored.checked = mirrored === true;
         for (const [name, button] of this.buttons) {
             button.setAttribute("aria-pressed", String(name === view));
             // Ways lead to a second person, who is chosen in the panel about them.

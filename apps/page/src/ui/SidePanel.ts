@@ -5,7 +5,7 @@
 // relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
 // drawn up.
 
-import type { DetailedFact, DetailedName, GedcomFamily as Family, Person, PersonDetails } from "olvane";
+import type { DetailedFact, DetailedName, GedcomFamily as Family, KinshipWay, Person, PersonDetails } from "olvane";
 import { factLabel, type Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { dateText, nameOf, placeText, yearsOf } from "../messages/names";
@@ -40,6 +40,8 @@ export interface PanelEvents {
     choose(person: number): void;
     // Draws the ways between the person and the focus.
     relate(person: number): void;
+    // Where a link to them leads.
+    waysAddressOf(person: number): string;
     nextBox(person: number): void;
     addressOf(person: number): string;
 }
@@ -49,6 +51,8 @@ export interface Standing {
     readonly focus: Person;
     readonly kinship: string;
     readonly boxes: number;
+    // Whether the picture shows the ways between the two.
+    readonly showsWays: boolean;
 }
 
 export class SidePanel {
@@ -91,6 +95,7 @@ export class SidePanel {
         const known = family.file.detailsOfPerson(person.id);
         const sections = [
             this.header(person, standing),
+            standing.kinship === "" ? null : this.ways(person, family, standing),
             this.details.media(known.media),
             this.facts(known),
             this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
@@ -129,6 +134,32 @@ export class SidePanel {
             );
         }
         return header;
+    }
+
+    // Every way between the two in words, found when first asked for, each a link to the picture of them.
+    private ways(person: Person, family: OpenFamily, { focus, showsWays }: Standing): HTMLElement {
+        const section = html("details", { id: "ways" }, html("summary", {}, this.ui.waysBetween));
+        const open = () => {
+            if (section.childElementCount > 1) return;
+            const { ways } = family.file.kinship(focus.id, person.id, this.ui.language);
+            section.append(this.list(ways, (way) => this.way(way, person, family)));
+        };
+        section.addEventListener("toggle", open);
+        if (showsWays) open();
+        section.open = showsWays;
+        return section;
+    }
+
+    private way({ text, persons }: KinshipWay, person: Person, family: OpenFamily): HTMLElement {
+        const names = persons.map((id) => isolated(nameOf(family.person(id)!, this.messages)));
+        const link = html(
+            "a",
+            { class: "way", href: this.events.waysAddressOf(person.id) },
+            html("span", {}, text),
+            html("span", { class: "detail" }, ...names.flatMap((name, i) => (i > 0 ? [" \u2013 ", name] : [name]))),
+        );
+        this.follow(link, () => this.events.relate(person.id));
+        return link;
     }
 
     private button(id: string, label: string, action: () => void): HTMLElement {
@@ -292,11 +323,16 @@ export class SidePanel {
             html("bdi", { class: "name" }, nameOf(person, this.messages)),
             html("span", { class: "years" }, [yearsOf(person, this.messages), note].filter(Boolean).join(", ")),
         );
+        this.follow(link, () => this.events.select(person.id));
+        return link;
+    }
+
+    // What a link does here; with a key that opens it elsewhere, it is the browser's.
+    private follow(link: HTMLElement, action: () => void): void {
         onClick(link, (event) => {
             if (event.ctrlKey || event.metaKey || event.shiftKey) return;
             event.preventDefault();
-            this.events.select(person.id);
+            action();
         });
-        return link;
     }
 }

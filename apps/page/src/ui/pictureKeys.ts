@@ -3,6 +3,7 @@
 
 // What the keys do in the picture and beside it.
 
+import type { Branch } from "olvane";
 import type { Direction } from "../view/kinMoves";
 
 export interface KeyActions {
@@ -10,6 +11,8 @@ export interface KeyActions {
     panBy(dx: number, dy: number): void;
     chooseActive(): void;
     nextBox(): void;
+    // Folds a branch of the box that the keys stand on, or unfolds it. Answers whether there is one.
+    fold(branch: Branch): boolean;
     home(): void;
     zoomIn(): void;
     zoomOut(): void;
@@ -44,6 +47,9 @@ const kInPicture: Readonly<Record<string, (actions: KeyActions) => unknown>> = {
     " ": (actions) => actions.chooseActive(),
     Home: (actions) => actions.home(),
     n: (actions) => actions.nextBox(),
+    u: (actions) => actions.fold("up"),
+    d: (actions) => actions.fold("down"),
+    b: (actions) => actions.fold("beside"),
 };
 
 const kWithAlt: Readonly<Record<string, (actions: KeyActions) => unknown>> = {

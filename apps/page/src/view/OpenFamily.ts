@@ -4,6 +4,7 @@
 // The family that is open: its persons, its pictures, and how everybody is related to the focus.
 
 import type {
+    BranchSize,
     DrawingTheme,
     GedcomFamily as Family,
     GedcomFile,
@@ -15,7 +16,7 @@ import type {
 import { Photographs } from "../engine/photographs";
 import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
-import { optionsOf, type ViewState } from "./ViewState";
+import { optionsOf, type Reader, type ViewState } from "./ViewState";
 
 // What is on the screen stays where it is when somebody is added; what is printed is laid out for its paper.
 function keeping(options: PictureOptions): PictureOptions {
@@ -43,18 +44,24 @@ export class OpenFamily {
     }
 
     // Throws LayoutError.
-    picture(state: ViewState, language: PictureOptions["language"]): Picture {
-        const values = this.file.picture(state.focus, keeping(optionsOf(state, language)));
-        return new Picture(state.view, state.direction, state.focus, values);
+    picture(state: ViewState, reader: Reader): Picture {
+        const options = keeping(optionsOf(state, reader));
+        const values = this.file.picture(state.focus, options);
+        return new Picture(state.view, state.direction, state.focus, values, options.mirrored);
+    }
+
+    // What hangs from a person in the picture. Throws LayoutError.
+    branches(state: ViewState, person: number, reader: Reader): readonly BranchSize[] {
+        return this.file.branches(state.focus, person, optionsOf(state, reader));
     }
 
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
-    svg(state: ViewState, theme: DrawingTheme, language: PictureOptions["language"]): string {
-        return this.file.svg(state.focus, keeping(optionsOf(state, language)), { theme, show: state.show });
+    svg(state: ViewState, theme: DrawingTheme, reader: Reader): string {
+        return this.file.svg(state.focus, keeping(optionsOf(state, reader)), { theme, show: state.show });
     }
 
-    sheets(state: ViewState, paper: PaperOptions, language: PictureOptions["language"]): PaperSheets {
-        return this.file.sheets(state.focus, optionsOf(state, language), { theme: "print", show: state.show }, paper);
+    sheets(state: ViewState, paper: PaperOptions, reader: Reader): PaperSheets {
+        return this.file.sheets(state.focus, optionsOf(state, reader), { theme: "print", show: state.show }, paper);
     }
 
     // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.

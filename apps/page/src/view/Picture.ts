@@ -5,7 +5,7 @@
 // box to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
 // upper-left corner.
 
-import type { PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
+import type { FoldedBranch, PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
 import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
 import type { ChartDirection, ViewName } from "../base/views";
 
@@ -34,6 +34,8 @@ export interface Box {
     readonly caption: string;
     // In a picture of kinship: at the end beside the focus, or at the top of a way.
     readonly kinshipPlace: "other" | "ancestor" | null;
+    // Branches of the person that are left out.
+    readonly folded: readonly FoldedBranch[];
     // Its piece of a ring, in a round chart.
     readonly arc: BoxArc | null;
 }
@@ -76,6 +78,7 @@ export class Picture {
         readonly direction: ChartDirection,
         readonly focus: number,
         values: PictureValues,
+        readonly mirrored = false,
     ) {
         const numbers = markNumbers(values.marks);
         const lines = [...new Set(values.arcs.map((arc) => arc.line))].filter((line) => line !== null);
@@ -126,7 +129,7 @@ export class Picture {
 
     private boxOf(
         from: PictureBox,
-        { boxes: all, focus, kinship }: PictureValues,
+        { boxes: all, focus, kinship, folded }: PictureValues,
         marks: ReadonlyMap<number, number[]>,
         arc: BoxArc | null,
     ): Box {
@@ -140,6 +143,7 @@ export class Picture {
             marks: marks.get(index) ?? [],
             caption: !kinship ? "" : index === kinship.other ? kinship.otherIs : index === focus ? kinship.focusIs : "",
             kinshipPlace: placeInKinship(index, kinship),
+            folded: folded.filter((branch) => branch.box === index),
         };
         this.byKey.set(key, box);
         const copies = this.byPerson.get(person);

@@ -3,7 +3,7 @@
 
 // What is looked at: the focus, the view and its options. Every state is an address that can be passed on.
 
-import { type Person, type PictureOptions, Shown, type ShownFact } from "olvane";
+import { type Branch, type Fold, type Person, type PictureOptions, Shown, type ShownFact } from "olvane";
 import {
     type ChartDirection,
     hasCompact,
@@ -36,6 +36,10 @@ export interface ViewState {
     readonly parentFamily: number;
     // Whether generations are packed tighter, in the charts.
     readonly compact: boolean;
+    // Whether right and left are exchanged; null for what suits the language.
+    readonly mirrored: boolean | null;
+    // Branches that are left out, in the order in which they were folded.
+    readonly folded: readonly Fold[];
     // What boxes and lines say beside names and years.
     readonly show: ReadonlySet<ShownFact>;
     // Whether boxes show photographs.
@@ -64,6 +68,8 @@ export const kUsualState: ViewState = {
     parentsOf: 0,
     parentFamily: 0,
     compact: false,
+    mirrored: null,
+    folded: [],
     show: new Set(),
     photos: false,
     hidden: new Set(),
@@ -86,15 +92,25 @@ export function factHeight(show: ReadonlySet<ShownFact>): number {
     return [...show].reduce((height, fact) => height + kFactPitch * kFactLines[fact], 0);
 }
 
+/** For whom pictures are made. */
+export interface Reader {
+    readonly language?: PictureOptions["language"];
+    readonly rightToLeft?: boolean;
+}
+
 /** What to ask of the module for a state. */
-export function optionsOf(state: ViewState, language: PictureOptions["language"] = "en"): PictureOptions {
+export function optionsOf(state: ViewState, { language = "en", rightToLeft = false }: Reader = {}): PictureOptions {
     const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact } = state;
+    const { folded, mirrored } = state;
     const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
     const tall = state.photos ? kTallWithPhoto : kTall;
     const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : tall;
     return {
         ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact, language },
         shown: shownBits(state),
+        folded,
+        mostWays: 0,
+        mirrored: mirrored ?? rightToLeft,
         ...sizes,
         height: sizes.height + factHeight(state.show),
         gapX: sizes.gapX + (sizes === tall && state.show.has("marriage") ? kLabelRoom : 0),
@@ -117,12 +133,24 @@ export function sameState(a: ViewState, b: ViewState): boolean {
             "to",
             "unknownParents",
             "compact",
+            "mirrored",
             "photos",
             "parentFamily",
             "parentsOf",
         ] as const
     ).every((name) => a[name] === b[name]);
-    return same && sameSet(a.hidden, b.hidden) && sameSet(a.show, b.show);
+    const sameFolds = String(a.folded.map(foldName)) === String(b.folded.map(foldName));
+    return same && sameFolds && sameSet(a.hidden, b.hidden) && sameSet(a.show, b.show);
+}
+
+function foldName({ person, branch }: Fold): string {
+    return `${person}.${branch}`;
+}
+
+/** With a branch folded, or unfolded where it was. */
+export function withFold(state: ViewState, person: number, branch: Branch): readonly Fold[] {
+    const others = state.folded.filter((fold) => fold.person !== person || fold.branch !== branch);
+    return others.length < state.folded.length ? others : [...others, { person, branch }];
 }
 
 function sameSet<Name>(a: ReadonlySet<Name>, b: ReadonlySet<Name>): boolean {
@@ -143,6 +171,8 @@ export function addressOf(state: ViewState, persons: readonly Person[]): string 
     if (hasDirection(view) && state.direction !== "down") parts.set("direction", state.direction);
     if (view === "kinship" && state.to) parts.set("to", persons[state.to - 1]?.xref || String(state.to));
     if (hasCompact(view) && state.compact) parts.set("compact", "yes");
+    if (state.mirrored !== null) parts.set("mirror", state.mirrored ? "yes" : "no");
+    if (state.folded.length > 0) parts.set("fold", state.folded.map((fold) => foldWord(fold, persons)).join(","));
     if (state.show.size > 0) parts.set("show", kShownFacts.filter((fact) => state.show.has(fact)).join(","));
     if (state.photos) parts.set("photos", "boxes");
     const hide = [...state.hidden, ...(state.unknownParents ? [] : [kUnknownParents])];
@@ -163,6 +193,8 @@ const kParts = [
     "direction",
     "to",
     "compact",
+    "mirror",
+    "fold",
     "show",
     "photos",
     "hide",
@@ -187,6 +219,8 @@ export function readAddress(address: string, persons: readonly Person[], usual: 
         ...parentsIn(parts.get("parents") ?? "", persons),
         unknownParents: !hidden.includes(kUnknownParents),
         compact: parts.get("compact") === "yes",
+        mirrored: parts.get("mirror") === "yes" ? true : parts.get("mirror") === "no" ? false : null,
+        folded: foldsIn(parts.get("fold") ?? "", persons),
         show: factsIn(parts.get("show") ?? ""),
         photos: parts.get("photos") === "boxes",
         hidden: new Set(kRelativeNames.filter((name) => hidden.includes(name))),
@@ -230,6 +264,23 @@ function parentsIn(text: string, persons: readonly Person[]): Pick<ViewState, "p
     const [parentsOf = 0, parentFamily = 0] = text.split(".").map(Number);
     const isKnown = persons[parentsOf - 1]?.parentFamilies.some(({ family }) => family === parentFamily);
     return isKnown ? { parentsOf, parentFamily } : { parentsOf: 0, parentFamily: 0 };
+}
+
+const kMostFolds = 200; // of an address
+const kBranches: readonly string[] = ["up", "down", "beside"] satisfies readonly Branch[];
+
+// "I7.down"; by number where the xref has a sign of the list.
+function foldWord({ person, branch }: Fold, persons: readonly Person[]): string {
+    const xref = persons[person - 1]?.xref ?? "";
+    return `${xref && !/[.,]/.test(xref) ? xref : person}.${branch}`;
+}
+
+function foldsIn(text: string, persons: readonly Person[]): Fold[] {
+    return text
+        .split(",", kMostFolds)
+        .map((word) => word.split("."))
+        .map(([who = "", branch = ""]) => ({ person: personIn(who, persons), branch: branch as Branch }))
+        .filter(({ person, branch }) => person > 0 && kBranches.includes(branch));
 }
 
 /** The state in which the person stands in the middle with the next of several families of parents. */

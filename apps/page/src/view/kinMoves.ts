@@ -19,18 +19,11 @@ export function boxTowards(from: Box, direction: Direction, picture: Picture, fa
 }
 
 // Where parents lie, seen from their children: above in most charts, at the right in a pedigree.
-function waysOf(picture: Picture): readonly [toParents: Direction, toChildren: Direction] {
-    if (picture.view === "pedigree") return ["right", "left"];
-    switch (picture.direction) {
-        case "up":
-            return ["down", "up"];
-        case "left":
-            return ["right", "left"];
-        case "right":
-            return ["left", "right"];
-        default:
-            return ["up", "down"];
-    }
+function waysOf({ view, direction, mirrored }: Picture): readonly [toParents: Direction, toChildren: Direction] {
+    if (view !== "pedigree" && direction === "up") return ["down", "up"];
+    if (view !== "pedigree" && direction === "down") return ["up", "down"];
+    const atRight = (view === "pedigree" || direction === "left") !== mirrored;
+    return atRight ? ["right", "left"] : ["left", "right"];
 }
 
 function kinBoxes(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box[] {
