@@ -149,6 +149,7 @@ const kRoads = {
         return titleOf(`${address}/iife/index.html`);
     },
     async "a wrong response for the module is named"() {
+        rmSync(join(work, "wrong"), { recursive: true, force: true }); // of an earlier run
         write("wrong/olvane.mjs", readFileSync(join(work, "node_modules/olvane/olvane.mjs"), "utf8"));
         write("wrong/index.html", kPage(`<script type="module">${kMain("./olvane.mjs")}</script>`));
         const missing = await titleOf(`${address}/wrong/index.html`);
