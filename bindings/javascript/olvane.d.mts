@@ -205,6 +205,8 @@ export interface PictureOptions {
      * the one before it (GedcomFile.takePlacesOf); false.
      */
     keepPlaces?: boolean | undefined;
+    /** Of a text at the lines of marriages, in points: families then have a place for it; 0 for none. */
+    labelSize?: number | undefined;
     /** Family and pedigree: whether unknown parents have boxes; true. */
     unknownParents?: boolean | undefined;
     /** Whose parents come first where somebody is a child of several families: those by birth, if not given. */
@@ -376,6 +378,18 @@ export interface PictureFamily {
     readonly childKinds: readonly ("birth" | "adopted" | "foster" | "step" | "sealing" | "unknown")[];
     readonly style: "married" | "divorced" | "unmarried" | "unknown";
     readonly lines: readonly PictureLine[];
+    /**
+     * Where a year stands at the marriage line, so that it covers no year of another marriage: a place on the line, and the
+     * side of it. Null without a marriage line, and where no labelSize was asked for.
+     */
+    readonly label: PictureLabel | null;
+}
+
+/** Above and below its line a text has its middle at x, to the right it begins there, 0.4 of its size away. */
+export interface PictureLabel {
+    readonly x: number;
+    readonly y: number;
+    readonly side: "above" | "below" | "right";
 }
 
 /** What is expressed without a line; the boxes of one number belong together. */

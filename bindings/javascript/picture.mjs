@@ -10,6 +10,7 @@ const STYLES = ["married", "divorced", "unmarried", "unknown"];
 const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
 const WAY_KINDS = ["blood", "legal", "marriage"];
+const LABEL_SIDES = ["none", "above", "below", "right"];
 /** In the order of the module's numbers. */
 export const BRANCHES = ["up", "down", "beside"];
 export const SIDES = ["top", "right", "bottom", "left"];
@@ -33,7 +34,12 @@ function boxAt(n, at, index) {
     };
 }
 
-function familyAt(n, at, members, lines) {
+function labelAt(n, at) {
+    const side = LABEL_SIDES[n[at + 2]];
+    return side === undefined || side === "none" ? null : { x: n[at], y: n[at + 1], side };
+}
+
+function familyAt(n, at, members, lines, label) {
     const [firstMember, firstLine, childCount, lineCount, number, parentCount, style] = n.subarray(at, at + 7);
     const firstChild = firstMember + parentCount;
     const children = members.slice(firstChild, firstChild + childCount);
@@ -44,6 +50,7 @@ function familyAt(n, at, members, lines) {
         childKinds: children.map((member) => CHILD_KINDS[member.kind]),
         style: STYLES[style],
         lines: lines.slice(firstLine, firstLine + lineCount),
+        label,
     };
 }
 
@@ -115,6 +122,7 @@ export function pictureFrom(view, numbers, texts) {
     place("wayBoxes", wayBoxCount, 1);
     place("pieces", pieceCount, 4);
     place("folded", foldedCount, 4);
+    place("labels", familyCount, 3); // where they were asked for
     const list = (name, count, size, make) =>
         Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
     const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
@@ -135,7 +143,9 @@ export function pictureFrom(view, numbers, texts) {
             ringCount === 0
                 ? null
                 : { radii: Array.from(numbers.subarray(starts.rings, starts.rings + ringCount)), middleX, middleY },
-        families: list("families", familyCount, 7, (start) => familyAt(numbers, start, members, lines)),
+        families: list("families", familyCount, 7, (start, index) =>
+            familyAt(numbers, start, members, lines, labelAt(numbers, starts.labels + 3 * index)),
+        ),
         marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
         folded: list("folded", foldedCount, 4, (start) => ({
             box: numbers[start],

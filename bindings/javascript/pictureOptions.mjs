@@ -44,6 +44,7 @@ const OPTIONS = {
     gapY: { size: true, usual: 30 },
     aspect: { size: true, usual: 0 },
     keepPlaces: { flag: true, usual: false },
+    labelSize: { size: true, usual: 0 },
     mirrored: { flag: true, usual: false },
     folded: { folds: true, usual: [] },
 };

@@ -106,6 +106,22 @@ function placesOf({ boxes }) {
     return new Map(boxes.map(({ id, x, y }) => [id, `${x - left} ${y - top}`]));
 }
 
+test("a family has a place for the year of its marriage, where one is asked for", () => {
+    const labelled = file.picture(1, { labelSize: 5 }).families;
+    const marriageOf = ({ lines }) => lines.filter(({ role }) => role === "marriage");
+    assert.ok(labelled.some(({ label }) => label !== null));
+    for (const family of labelled) {
+        const on = marriageOf(family).filter(({ x1, y1, x2, y2 }) => {
+            const { x, y } = family.label;
+            return x >= Math.min(x1, x2) && x <= Math.max(x1, x2) && y >= Math.min(y1, y2) && y <= Math.max(y1, y2);
+        });
+        assert.equal(on.length > 0, marriageOf(family).length > 0);
+    }
+    for (const { label } of file.picture(1).families) assert.equal(label, null);
+    for (const { label } of file.picture(1, { view: "fan", labelSize: 5 }).families) assert.equal(label, null);
+    assert.throws(() => file.picture(1, { labelSize: -1 }), RangeError);
+});
+
 test("everybody keeps the places of the picture before, where that is asked for", () => {
     const larger = family
         .replace("1 CHIL @I4@\n", "1 CHIL @I7@\n1 CHIL @I4@\n")

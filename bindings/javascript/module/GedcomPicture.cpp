@@ -12,6 +12,7 @@
 
 #include <olvane/charts/Folding.h>
 #include <olvane/charts/Views.h>
+#include <olvane/picture/MarriageLabels.h>
 
 #include <LayoutInternal.h>
 
@@ -34,9 +35,20 @@ olvane_status lastStatus = OLVANE_OK;
 using namespace olvane;
 using js::OpenFile;
 
-// With the words of a kinship in last_text. Null for a picture that is refused; last_text then says why.
+// With the words of a kinship in last_text, and behind its numbers a place for each family's label where labels are asked for. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* file, std::int32_t focus) {
-    return js::pictureAnswer([&] { return js::pictureOf(*file, js::requestOf(focus - 1)); });
+    std::vector<picture::LabelPlace> labels;
+    const auto make = [&] {
+        const js::PictureRequest asked = js::requestOf(focus - 1);
+        picture::Picture picture = js::pictureOf(*file, asked);
+        if (asked.labelSize > 0) labels = picture::marriageLabelPlaces(picture, asked.labelSize);
+        return picture;
+    };
+    return js::pictureAnswer(make, [&labels](std::vector<double>& numbers) {
+        for (const picture::LabelPlace& label : labels) {
+            numbers.insert(numbers.end(), {label.x, label.y, static_cast<double>(label.side)});
+        }
+    });
 }
 
 // How many persons the branches up, down and beside of a person have for themselves, and on which side of the box each

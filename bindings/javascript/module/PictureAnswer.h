@@ -19,7 +19,10 @@ std::vector<double> numbersOf(const picture::Picture& picture);
 // The words of a kinship as a JSON array: those of the focus, of the other person, and of each way.
 std::string textsOf(const picture::Picture& picture);
 
-// The numbers of the picture that make gives, with its words in last_text; null where it failed, and last_text says why.
-std::vector<double>* pictureAnswer(const std::function<picture::Picture()>& make);
+// The numbers of the picture that make gives, and what addMore puts behind them, with its words in last_text; null where it
+// failed, and last_text says why.
+std::vector<double>* pictureAnswer(
+    const std::function<picture::Picture()>& make,
+    const std::function<void(std::vector<double>& numbers)>& addMore = nullptr);
 
 }  // namespace olvane::js

@@ -85,6 +85,7 @@ PictureRequest requestOf(kin::Place focus) {
     chart.sizes.gapY = static_cast<float>(options.number());
     chart.aspect = options.number();
     asked.keepsPlaces = options.flag() && chart.view == charts::View::everybody;
+    asked.labelSize = options.number();
     chart.mirrored = options.flag();
     for (int left = options.next<int>(); left > 0; --left) {
         const auto person = options.next<std::int64_t>();

@@ -16,6 +16,7 @@ struct PictureRequest {
     gedcom::ParentChoice parents;
     std::vector<charts::Fold> folded;
     bool keepsPlaces = false;  // everybody: of the file's last picture that was asked for so
+    double labelSize = 0;      // in points, of a text at the line of a marriage; 0 where none is wanted
 };
 
 // What JavaScript last asked of a picture, for a focus. view has no branches folded: viewOf adds them.

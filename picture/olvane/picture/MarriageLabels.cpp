@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Years at marriage lines. A few places along the lines of each family are tried in turn, the longest line first; what
-// could be in the way is found for all families by one sweep.
+// could be in the way is looked for in the rows that they lie in.
 
 #include <olvane/picture/MarriageLabels.h>
 
@@ -11,8 +11,9 @@
 #include <cmath>
 #include <cstddef>
 #include <span>
+#include <utility>
 
-#include <olvane/picture/RectSweepInternal.h>
+#include <olvane/picture/RectSweepInternal.h>  // for Rect
 
 namespace olvane::picture {
 
@@ -21,6 +22,7 @@ namespace {
 // Parts of a line's length, in the order in which they are tried.
 constexpr auto kParts = std::to_array<double>(
     {0.5, 0.25, 0.75, 0.375, 0.625, 0.125, 0.875, 0.0625, 0.9375, 0.1875, 0.8125, 0.3125, 0.6875});
+constexpr double kRowHeight = 40;  // points
 // What is least to be covered counts most.
 constexpr int kLabelCovered = 10000;
 constexpr int kBoxCovered = 100;
@@ -37,11 +39,12 @@ double lengthOf(const Line& line) {
 std::vector<Line> marriageLines(const Picture& picture, const Family& family) {
     std::vector<Line> lines;
     for (const Line& line : picture.linesOf(family)) {
-        if (line.role == LineRole::marriage) lines.push_back(line);
+        if (line.role != LineRole::marriage) continue;
+        const double length = isLevel(line) ? lengthOf(line) : 0;
+        std::size_t place = lines.size();
+        while (place > 0 && length > (isLevel(lines[place - 1]) ? lengthOf(lines[place - 1]) : 0)) --place;
+        lines.insert(lines.begin() + static_cast<std::ptrdiff_t>(place), line);
     }
-    const auto upright = std::stable_partition(lines.begin(), lines.end(), isLevel);
-    std::stable_sort(lines.begin(), upright,
-                     [](const Line& a, const Line& b) { return lengthOf(a) > lengthOf(b); });
     return lines;
 }
 
@@ -103,25 +106,48 @@ private:
     // All that may lie under a text at the lines of each crowded family.
     void findObstacles() {
         if (crowded_.empty()) return;
-        std::vector<Rect> rects;
-        for (const std::size_t f : crowded_) rects.push_back(reachOf(lines_[f]));
-        for (const Box& box : picture_.boxes) rects.push_back(rectOf(box));
-        for (const Line& line : picture_.lines) rects.push_back(rectOf(line));
-        const std::size_t count = crowded_.size();
-        const std::size_t firstLine = count + picture_.boxes.size();
-        obstacles_.resize(count);
-        RectSweep(rects).forEachPair([&](std::size_t a, std::size_t b) {
-            const auto [reach, other] = std::minmax(a, b);
-            if (reach >= count) return;
-            if (other < count) {
-                obstacles_[reach].families.push_back(other);
-                obstacles_[other].families.push_back(reach);
-            } else if (other < firstLine) {
-                obstacles_[reach].boxes.push_back(rects[other]);
-            } else {
-                obstacles_[reach].lines.push_back(rects[other]);
+        obstacles_.resize(crowded_.size());
+        for (const std::size_t f : crowded_) reaches_.push_back(reachOf(lines_[f]));
+        makeRows();
+        for (const Box& box : picture_.boxes) addObstacle(rectOf(box), &Obstacles::boxes);
+        for (const Line& line : picture_.lines) addObstacle(rectOf(line), &Obstacles::lines);
+    }
+
+    // Each crowded family in every row that its reach touches, so that a box or line is held against few of them.
+    void makeRows() {
+        constexpr double kMostRows = 4096;
+        double last = reaches_.front().y2;
+        top_ = reaches_.front().y1;
+        for (const Rect& reach : reaches_) {
+            top_ = std::min(top_, reach.y1);
+            last = std::max(last, reach.y2);
+        }
+        rowHeight_ = std::max((last - top_) / kMostRows, kRowHeight);
+        const double count = (last - top_) / rowHeight_;
+        rows_.resize(static_cast<std::size_t>(count < kMostRows ? count : kMostRows) + 1);
+        for (std::size_t i = 0; i < reaches_.size(); ++i) {
+            for (std::size_t row = rowOf(reaches_[i].y1); row <= rowOf(reaches_[i].y2); ++row) {
+                rows_[row].push_back(i);
             }
-        });
+        }
+    }
+
+    std::size_t rowOf(double y) const {
+        const double row = (y - top_) / rowHeight_;
+        if (!(row > 0)) return 0;
+        return row < static_cast<double>(rows_.size()) ? static_cast<std::size_t>(row) : rows_.size() - 1;
+    }
+
+    // Where both are in several rows, they meet in the first of them.
+    template <class List>
+    void addObstacle(const Rect& rect, List list) {
+        const std::size_t first = rowOf(rect.y1);
+        for (std::size_t row = first; row <= rowOf(rect.y2); ++row) {
+            for (const std::size_t i : rows_[row]) {
+                if (row != std::max(first, rowOf(reaches_[i].y1)) || !meet(rect, reaches_[i])) continue;
+                (obstacles_[i].*list).push_back(rect);
+            }
+        }
     }
 
     Rect reachOf(std::span<const Line> lines) const {
@@ -132,7 +158,8 @@ private:
                      std::max(reach.y2, rect.y2)};
         }
         const double width = (kLabelWidth + kLabelGap) * size_;
-        const double height = (kLabelHeight + kLabelGap) * size_;
+        // Twice a text, so that two texts that meet are in the row of either one's line.
+        const double height = 2 * (kLabelHeight + kLabelGap) * size_;
         return {reach.x1 - width, reach.y1 - height, reach.x2 + width, reach.y2 + height};
     }
 
@@ -178,7 +205,7 @@ private:
         const Rect text = textRect(place);
         const Obstacles& near = obstacles_[i];
         int covered = 0;
-        for (const std::size_t other : near.families) {
+        for (const std::size_t other : rows_[rowOf(place.y)]) {
             if (other < i && meet(text, textRect(places_[crowded_[other]]))) covered += kLabelCovered;
         }
         for (const Rect& box : near.boxes) covered += meet(text, box) ? kBoxCovered : 0;
@@ -187,7 +214,6 @@ private:
     }
 
     struct Obstacles {
-        std::vector<std::size_t> families;  // places in crowded_
         std::vector<Rect> boxes;
         std::vector<Rect> lines;
     };
@@ -197,7 +223,11 @@ private:
     std::vector<std::vector<Line>> lines_;  // of marriage, for each family
     std::vector<LabelPlace> places_;
     std::vector<std::size_t> crowded_;
-    std::vector<Obstacles> obstacles_;  // beside crowded_
+    std::vector<Rect> reaches_;  // beside crowded_, as obstacles_
+    std::vector<Obstacles> obstacles_;
+    std::vector<std::vector<std::size_t>> rows_;  // of places in crowded_, from the top down
+    double top_ = 0;
+    double rowHeight_ = kRowHeight;
 };
 
 }  // namespace

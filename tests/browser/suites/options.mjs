@@ -114,6 +114,19 @@ describe("options", kTwoAtOnce, () => {
         const overlap = (a, b) => a.left < b.right && b.left < a.right && a.top < b.bottom && b.top < a.bottom;
         const met = labels.flatMap((a, i) => labels.slice(i + 1).flatMap((b) => (overlap(a, b) ? [[a, b]] : [])));
         assert.deepEqual(met, []);
+        const frames = await visit.page.locator("#tree .frame").evaluateAll((all) =>
+            all.map((frame) => {
+                const { left, right, top, bottom } = frame.getBoundingClientRect();
+                return { left, right, top, bottom };
+            }),
+        );
+        // A digit is narrower than the room that the browser gives its text, by the stroke around it.
+        const inner = ({ left, right, top, bottom }) => {
+            const edge = (right - left) / 8;
+            return { left: left + edge, right: right - edge, top: top + edge, bottom: bottom - edge };
+        };
+        const covered = labels.filter((label) => frames.some((frame) => overlap(inner(label), frame)));
+        assert.deepEqual(covered, []);
         await visit.end();
     });
 

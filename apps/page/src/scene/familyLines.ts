@@ -4,12 +4,12 @@
 // Draws the lines of one family as an element of their own: one path for what parents and children share, one for
 // each child who came to them otherwise than by birth. Where a line jumps over another family's, it makes an arc.
 
-import type { PictureLine } from "olvane";
+import type { PictureLabel, PictureLine } from "olvane";
 import { svg } from "../base/dom";
 import type { FamilyLines } from "../view/Picture";
+import { kLabelSize } from "../view/ViewState";
 
 const kBridge = 4; // points, half of what an arc spans
-const kLabelLift = 4; // points, from a marriage line to its label
 
 /** label stands at the marriage line; empty for none. */
 export function drawFamily({ index, family }: FamilyLines, label: string): SVGGElement {
@@ -26,21 +26,20 @@ export function drawFamily({ index, family }: FamilyLines, label: string): SVGGE
     if (marriages.length > 0) group.append(svg("path", { class: "line marriage", d: marriages.join("") }));
     if (rest.length > 0) group.append(svg("path", { class: "line", d: rest.join("") }));
     for (const [kind, paths] of own) group.append(svg("path", { class: "line " + kind, d: paths.join("") }));
-    if (label) appendLabel(group, family.lines, label);
+    if (label && family.label) appendLabel(group, family.label, label);
     return group;
 }
 
-// Above the longest level marriage line, where lines of several marriages have parted; else beside an upright one.
-function appendLabel(group: SVGGElement, lines: readonly PictureLine[], label: string): void {
-    const marriages = lines.filter(({ role }) => role === "marriage");
-    const lengthOf = ({ x1, x2 }: PictureLine): number => Math.abs(x2 - x1);
-    const isLevel = ({ x1, y1, x2, y2 }: PictureLine): boolean => y1 === y2 && x1 !== x2;
-    const level = marriages.filter(isLevel).sort((a, b) => lengthOf(b) - lengthOf(a))[0];
-    const line = level ?? marriages[0];
-    if (!line) return;
-    const x = (line.x1 + line.x2) / 2 + (level ? 0 : kLabelLift);
-    const y = (line.y1 + line.y2) / 2 + (level ? -kLabelLift : kLabelLift);
-    group.append(svg("text", { class: level ? "marriage-label" : "marriage-label upright", x, y }, label));
+// Where the picture has room for it.
+function appendLabel(group: SVGGElement, { x, y, side }: PictureLabel, label: string): void {
+    const gap = 0.4 * kLabelSize;
+    const isBeside = side === "right";
+    const place = {
+        x: x + (isBeside ? gap : 0),
+        y: y + (isBeside ? kLabelSize / 3 : side === "above" ? -gap : gap + 0.75 * kLabelSize),
+    };
+    const kind = isBeside ? "marriage-label upright" : "marriage-label";
+    group.append(svg("text", { class: kind, "font-size": kLabelSize, ...place }, label));
 }
 
 function pathOf({ x1, y1, x2, y2, bridges }: PictureLine): string {

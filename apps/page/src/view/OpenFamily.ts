@@ -16,7 +16,7 @@ import type {
 import { Photographs } from "../engine/photographs";
 import { KinshipTexts } from "./KinshipTexts";
 import { Picture } from "./Picture";
-import { optionsOf, type Reader, type ViewState } from "./ViewState";
+import { kLabelSize, optionsOf, type Reader, type ViewState } from "./ViewState";
 
 // What is on the screen stays where it is when somebody is added; what is printed is laid out for its paper.
 function keeping(options: PictureOptions): PictureOptions {
@@ -46,7 +46,8 @@ export class OpenFamily {
     // Throws LayoutError.
     picture(state: ViewState, reader: Reader): Picture {
         const options = keeping(optionsOf(state, reader));
-        const values = this.file.picture(state.focus, options);
+        const labelSize = state.show.has("marriage") ? kLabelSize : 0;
+        const values = this.file.picture(state.focus, { ...options, labelSize });
         return new Picture(state.view, state.direction, state.focus, values, options.mirrored);
     }
 

@@ -92,6 +92,9 @@ export function factHeight(show: ReadonlySet<ShownFact>): number {
     return [...show].reduce((height, fact) => height + kFactPitch * kFactLines[fact], 0);
 }
 
+/** Of the text at a marriage line, in points. */
+export const kLabelSize = 9.5;
+
 /** For whom pictures are made. */
 export interface Reader {
     readonly language?: PictureOptions["language"];
