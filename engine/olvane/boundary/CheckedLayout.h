@@ -76,6 +76,8 @@ struct CheckedLayout : CheckedOutcome {
 //
 // The two lists of relatives are read whole before the first question about an entry.
 // Fails: never with an exception.
+// Nested: refused within an operation of another checked call. A call of the C library is not: it has an engine of its own,
+//         so that neither disturbs the other.
 // Threads: several calls may run at once, each with a data source of its own or one that is safe to share.
 OLVANE_API CheckedLayout checkedLayout(TypedLayout::View view, std::int64_t focusId,
                                        const std::shared_ptr<OlvaneViewerManagerWrapProtocol>& source,

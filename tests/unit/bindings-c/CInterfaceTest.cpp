@@ -17,6 +17,7 @@
 #include <gtest/gtest.h>
 
 #include <olvane/Version.h>
+#include <olvane/boundary/CheckedLayout.h>
 #include <olvane/family/FamilyOptions.h>
 #include <support/CaseRun.h>
 #include <support/FamilyMaker.h>
@@ -395,6 +396,33 @@ TEST(CNesting, isRefusedAndLeavesTheOuterLayoutAlone) {
     EXPECT_EQ(OLVANE_HOST_FAILED, familyOf(callbacks, 17).status);
     EXPECT_EQ(OLVANE_NESTED_CALL, nested.inner);
     EXPECT_EQ(OLVANE_OK, familyOf(nested.callbacks, 17).status);
+}
+
+// A source of the C++ engine that lays out another family by the C library within its questions.
+class AskingManager : public support::CaseManager {
+public:
+    using CaseManager::CaseManager;
+
+    std::int64_t fatherForPersonWithID(std::int64_t id) override {
+        const Answer answer = familyOf(host.callbacks(), 3);
+        allAreRight = allAreRight && answer.status == OLVANE_OK && answer.text() == innerText;
+        return CaseManager::fatherForPersonWithID(id);
+    }
+
+    CallbackHost host{family("3: 5 6")};
+    std::string innerText = familyOf(host.callbacks(), 3).text();
+    bool allAreRight = true;
+};
+
+// The library has an engine of its own, with unknown parents of its own: neither layout sees the other.
+TEST(CNesting, withinACheckedCallInCppLeavesBothLayoutsAlone) {
+    const auto manager = std::make_shared<AskingManager>(family("17+42: 5 6"));
+    const auto result = olvane::checkedLayout(olvane::TypedLayout::View::family, 17, manager);
+    EXPECT_TRUE(result.isOk()) << result.reason.text();
+    EXPECT_TRUE(manager->allAreRight);
+    const auto alone = std::make_shared<support::CaseManager>(family("17+42: 5 6"));
+    EXPECT_EQ(olvane::checkedLayout(olvane::TypedLayout::View::family, 17, alone).layout.text,
+              result.layout.text);
 }
 
 TEST(CThreads, layOutTheirOwnFamiliesAtOnce) {
