@@ -25,4 +25,7 @@ function(olvane_build_small)
   foreach(target IN LISTS OLVANE_SMALL_TARGETS)
     target_compile_options(${target} PRIVATE -Oz -finline-functions)
   endforeach()
+  # Of the pictures, what only a picture with years of marriages runs through.
+  set_source_files_properties(${PROJECT_SOURCE_DIR}/picture/olvane/picture/MarriageLabels.cpp
+    TARGET_DIRECTORY olvane_picture PROPERTIES COMPILE_OPTIONS "-Oz;-finline-functions")
 endfunction()
