@@ -17,6 +17,7 @@ import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
 import { drawFamily } from "./familyLines";
 import { drawWays } from "./wayLines";
 
+const kDoubleTap = 400; // ms
 const kMostReadable = 420; // boxes in sight
 const kMostPointed = 3000; // boxes of a picture in which branches are counted at each box under the pointer
 const kGlideTime = 520; // ms
@@ -411,6 +412,7 @@ export class Scene {
     private listen(): void {
         const { surface, events } = this;
         let lastClicked: Box | null = null;
+        let lastTime = 0;
         surface.addEventListener("click", (event) => {
             const box = this.boxAt(event.target);
             if (!box) return;
@@ -418,8 +420,11 @@ export class Scene {
             const branch = (event.target as Element).closest(".fold")?.getAttribute("data-branch");
             if (branch) return events.folded(box, branch as Branch);
             // The second of two quick clicks opens what the first one selected.
-            const isSecond = event.detail > 1 && box === lastClicked;
-            lastClicked = box;
+            // Browsers count clicks of a mouse, but not all of them those of a finger.
+            const isQuick = event.detail > 1 || event.timeStamp - lastTime < kDoubleTap;
+            const isSecond = isQuick && box === lastClicked;
+            lastClicked = isSecond ? null : box;
+            lastTime = event.timeStamp;
             if (isSecond) return events.opened(box);
             if (box.person && box !== this.activeBox) this.activate(box, false);
             events.selected(box);
