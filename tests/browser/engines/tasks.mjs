@@ -80,7 +80,22 @@ export const kTasks = {
         await walk.until(() => location.hash.includes("view=kinship"));
         return walk.picture();
     },
+    "list every way between the two": async (walk) => {
+        const { xref, keys } = await fatherOfFocus(walk);
+        await walk.select(xref, keys);
+        await drawPanel(walk);
+        await walk.act("#ways summary");
+        await walk.until(() => one("#ways a") !== null);
+        return walk.text("#ways");
+    },
     "see all descendants": seeing("descendants"),
+    "fold the descendants of somebody": async (walk) => {
+        await seeing("descendants")(walk);
+        await walk.act("#views-button"); // closes the list of views, which may lie over the box
+        await walk.act('#tree .box.focus .fold[role][data-branch="down"]');
+        await walk.until(() => location.hash.includes("fold="));
+        return walk.picture();
+    },
     "see all ancestors": seeing("ancestors"),
     "see the hourglass": seeing("hourglass"),
     "see the fan": seeing("fan"),
