@@ -15,12 +15,11 @@ target_include_directories(Boost::headers INTERFACE ${boost_alone})
 add_compile_options(-fwasm-exceptions)
 add_link_options(-fwasm-exceptions)
 
-# A page carries the module, so bytes count beside time. What every click runs through, engine and pictures, is built for
-# speed, and so is the reader of files: WebKit spends seconds on putting its many small functions together itself. The rest is
-# built for size, where it is hardly slower. For size, em++ puts no function into its callers but leaves that to the linker,
-# which sees too late what falls away with it; with the option below the compiler makes less code, and faster code.
+# A page carries the module, so bytes count beside time. The engine is built for speed, the rest for size: with the small
+# functions in their callers that takes no longer, and browsers have less to compile. For size, em++ leaves those
+# functions to the linker, which sees too late what falls away with them, so the compiler is asked for it by name.
 set(CMAKE_CXX_FLAGS_RELEASE "-O2 -DNDEBUG")
-set(OLVANE_SMALL_TARGETS olvane_family olvane_gedcom_source olvane_charts olvane_draw olvane_wasm olvane_core)
+set(OLVANE_SMALL_TARGETS olvane_picture olvane_gedcom olvane_family olvane_gedcom_source olvane_charts olvane_draw olvane_wasm olvane_core)
 function(olvane_build_small)
   foreach(target IN LISTS OLVANE_SMALL_TARGETS)
     target_compile_options(${target} PRIVATE -Oz -finline-functions)
