@@ -3,12 +3,12 @@
 
 #include <cli/InputBytes.h>
 
-#include <algorithm>
 #include <cerrno>
 #include <cstddef>
 #include <cstring>
 
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cli/InputFiles.h>
@@ -22,18 +22,25 @@ namespace {
     throw UsageError(inputName(path) + ": cannot be read: " + std::strerror(errno));
 }
 
-std::string readDescriptor(int descriptor, const std::string& path) {
+// What a file has, so that it is read in one go, and a byte that then finds its end.
+std::size_t roomFor(int descriptor) {
     constexpr std::size_t kBlock = 64 * 1024;
-    std::string bytes;
-    for (ssize_t got = 1; got != 0;) {
-        const std::size_t filled = bytes.size();
-        bytes.resize(filled + std::max(filled, kBlock));
+    struct stat status = {};
+    const bool isFile = ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode) && status.st_size > 0;
+    return isFile ? static_cast<std::size_t>(status.st_size) + 1 : kBlock;
+}
+
+std::string readDescriptor(int descriptor, const std::string& path) {
+    std::string bytes(roomFor(descriptor), '\0');
+    std::size_t filled = 0;
+    for (ssize_t got = 1; got != 0; filled += static_cast<std::size_t>(got)) {
+        if (filled == bytes.size()) bytes.resize(2 * filled);
         do {
             got = ::read(descriptor, bytes.data() + filled, bytes.size() - filled);
         } while (got < 0 && errno == EINTR);
         if (got < 0) refuse(path);
-        bytes.resize(filled + static_cast<std::size_t>(got));
     }
+    bytes.resize(filled);
     return bytes;
 }
 

@@ -126,7 +126,6 @@ def main():
                     if command[0] == "judge":
                         write_picture(olvane, short_file, out)
                     memory -= most_memory([olvane, *words_of(command, short_file, out)])[2]
-                size = out.with_suffix(".json").stat().st_size if command[0] == "judge" else SIZE
                 kind = f"{family}: {' '.join(command)}"
                 print(f"{memory / size:5.2f} times its size: {kind}", flush=True)
                 if memory > MOST * size or status not in (0, 1):

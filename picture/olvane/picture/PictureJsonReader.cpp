@@ -303,7 +303,12 @@ private:
 
 Picture readPictureJson(std::string_view json) {
     if (isTooDeep(json)) fail("it is nested too deeply");
-    const Json parsed = Json::parse(json, nullptr, false);
+    // Names are of no use here, and may be long.
+    const auto isRead = [](int, Json::parse_event_t event, const Json& value) {
+        return event != Json::parse_event_t::key ||
+               (value != "name" && value != "given" && value != "surname");
+    };
+    const Json parsed = Json::parse(json, isRead, false);
     if (parsed.is_discarded()) fail("it is not JSON");
     return PictureReader().read(parsed);
 }
