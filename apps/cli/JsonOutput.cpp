@@ -40,7 +40,7 @@ std::string dumped(const Json& value, int indent) {
 void JsonOutput::key(std::string_view name) {
     separate();
     write_("\"");
-    write_(name);
+    addText(name);
     write_(form_ == Form::indented ? "\": " : "\":");
     hasKey_ = true;
 }
