@@ -72,6 +72,7 @@ public:
         : data_(data), options_(options), hiddenNames_(data, options.hidden) {}
 
     std::string text() && {
+        reserveForNames();
         nameRecords();
         writeHeader();
         for (PersonId id = 1; id <= data_.personCount(); ++id) writePerson(id);
@@ -82,6 +83,19 @@ public:
     }
 
 private:
+    // A name can be as long as a file, and a text that grows when it must holds what it has twice meanwhile.
+    void reserveForNames() {
+        constexpr std::size_t kUsualRecord = 512;
+        std::size_t bytes = (data_.personCount() + 1) * kUsualRecord;
+        for (PersonId id = 1; id <= data_.personCount(); ++id) {
+            if (isHidden(id)) continue;
+            for (const PersonName& name : data_.names(id)) {
+                bytes += name.written.size() + name.given.size() + name.surname.size();
+            }
+        }
+        text_.reserve(bytes);
+    }
+
     bool isHidden(PersonId id) const {
         return id != 0 && id <= options_.hidden.size() && options_.hidden[id - 1];
     }
