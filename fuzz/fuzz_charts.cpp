@@ -73,7 +73,9 @@ void judgeChart(const KinGraph& graph, const ChartRequest& request, bool usualSi
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     const Bytes choose(data, size);
     const int persons = 1 + choose(60);
-    const KinGraph graph = AnyKin::make(persons, choose(60), choose(2) == 0, choose).graph();
+    const int unions = choose(60);
+    const bool isOrderly = choose(2) == 0;
+    const KinGraph graph = AnyKin::make(persons, unions, isOrderly, choose).graph();
     ChartRequest request = requestFrom(choose, graph);
     std::vector<BoxSize> sizes;
     const bool usualSizes = choose(4) != 0;

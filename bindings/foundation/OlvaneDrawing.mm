@@ -9,19 +9,11 @@
 
 #include <array>
 #include <cstddef>
-#include <exception>
-#include <new>
 #include <string>
 
-#include "FileDrawing.h"
-#include "FileInternal.h"
-
-#include <olvane/gedcom/GedcomReader.h>
+#include "GuardedDrawing.h"
 
 namespace {
-
-namespace c = olvane::c;
-namespace gedcom = olvane::gedcom;
 
 // The entry of a list, or the text of a number that is none of it, which is refused by name.
 template <std::size_t count>
@@ -65,15 +57,21 @@ olvane_draw_options optionsOf(OlvaneDrawingOptions* options, Texts& texts) {
     return chosen;
 }
 
-std::string drawn(NSString* path, NSString* who, OlvaneDrawingOptions* options) {
-    Texts texts;
-    olvane_draw_options chosen = optionsOf(options, texts);
-    gedcom::ReadOptions reading;
-    reading.facts = chosen.places != 0 || chosen.occupation != 0;
-    const olvane_file file(gedcom::readGedcomFile(olvaneUtf8Of(path), reading));
-    if (options.view == OlvaneViewKinship)
-        chosen.to = c::personMeant(file, olvaneUtf8Of(options.other).c_str());
-    return c::drawnFromFile(file, c::personMeant(file, olvaneUtf8Of(who).c_str()), chosen);
+NSInteger codeOf(GuardedDrawing::Status status) {
+    switch (status) {
+        case GuardedDrawing::Status::invalidPerson:
+            return OlvaneErrorInvalidPerson;
+        case GuardedDrawing::Status::invalidArgument:
+            return OlvaneErrorInvalidArgument;
+        case GuardedDrawing::Status::unreadable:
+            return OlvaneErrorUnreadable;
+        case GuardedDrawing::Status::outOfMemory:
+            return OlvaneErrorOutOfMemory;
+        case GuardedDrawing::Status::drawn:
+        case GuardedDrawing::Status::failed:
+            break;
+    }
+    return OlvaneErrorLayoutFailed;
 }
 
 NSError* errorOf(NSInteger code, NSString* cause) {
@@ -91,21 +89,20 @@ NSError* errorOf(NSInteger code, NSString* cause) {
                options:(OlvaneDrawingOptions*)options
                  error:(NSError**)error {
     OlvaneDrawingOptions* chosen = options ? options : [OlvaneDrawingOptions optionsForView:OlvaneViewFamily];
-    NSInteger code = OlvaneErrorLayoutFailed;
+    NSInteger code = OlvaneErrorOutOfMemory;
     NSString* cause = @"there is not enough memory";
     try {
-        return olvaneTextOf(drawn(path, who, chosen));
-    } catch (const c::Refusal& refusal) {
-        const bool isPerson = refusal.status == OLVANE_INVALID_PERSON;
-        code = isPerson ? OlvaneErrorInvalidPerson : OlvaneErrorInvalidArgument;
-        cause = olvaneTextOf(refusal.text);
-    } catch (const gedcom::GedcomError& unreadable) {
-        code = OlvaneErrorUnreadable;
-        cause = olvaneTextOf(unreadable.what());
-    } catch (const std::bad_alloc&) {
-        code = OlvaneErrorOutOfMemory;
-    } catch (const std::exception& failure) {
-        cause = olvaneTextOf(failure.what());
+        Texts texts;
+        const olvane_draw_options given = optionsOf(chosen, texts);
+        const std::string other = olvaneUtf8Of(chosen.other);
+        const GuardedDrawing drawing =
+            guardedDrawing(olvaneUtf8Of(path), olvaneUtf8Of(who),
+                           chosen.view == OlvaneViewKinship ? &other : nullptr, given);
+        if (drawing.status == GuardedDrawing::Status::drawn) return olvaneTextOf(drawing.text);
+        code = codeOf(drawing.status);
+        if (!drawing.text.empty()) cause = olvaneTextOf(drawing.text);
+    } catch (...) {
+        code = OlvaneErrorOutOfMemory;  // nothing else can fail here
     }
     if (error) *error = errorOf(code, cause);
     return nil;

@@ -109,15 +109,19 @@ public:
         descend(roots, ends, all ? kAllGenerations : generations + above, admit);
     }
 
-    // The children of the families that somebody of the line is a child of.
+    // The children of the families that somebody of the line is a child of. A parent who is there as a sibling alone, as
+    // in families that run in a circle, does not count, so that the order of the line has no say.
     void addSiblings() {
+        std::vector<kin::Place> siblings;
         for (const kin::Place person : chosen_.line) {
             for (const kin::UnionPlace u : graph_.unionsAsChild(person)) {
                 const auto& two = graph_.partners(u);
                 if (closed_.toChildren(u) || (!isShown(two[0]) && !isShown(two[1]))) continue;
-                for (const kin::Place child : graph_.children(u)) show(child);
+                const auto children = graph_.children(u);
+                siblings.insert(siblings.end(), children.begin(), children.end());
             }
         }
+        addPersons(siblings);
     }
 
     void addSpouses() {

@@ -46,7 +46,9 @@ private:
 AnyKin familyOf(unsigned seed) {
     const Chooser choose(seed);
     const int persons = 2 + choose(40);
-    return AnyKin::make(persons, choose(persons), choose(3) != 0, choose);
+    const int unions = choose(persons);
+    const bool isOrderly = choose(3) != 0;
+    return AnyKin::make(persons, unions, isOrderly, choose);
 }
 
 ChartRequest requestOf(unsigned seed, View view, const KinGraph& graph) {

@@ -138,7 +138,9 @@ void forRandomFolds(const Check& check) {
             return static_cast<int>(random() % static_cast<unsigned>(count));
         };
         const int persons = 2 + choose(30);
-        const KinGraph graph = AnyKin::make(persons, choose(persons), choose(3) != 0, choose).graph();
+        const int unions = choose(persons);
+        const bool isOrderly = choose(3) != 0;
+        const KinGraph graph = AnyKin::make(persons, unions, isOrderly, choose).graph();
         for (const View view : kFoldingViews) {
             ChartRequest request;
             request.view = view;

@@ -138,6 +138,7 @@ std::set<Place> fanPersonsOf(const KinGraph& graph, const ChartRequest& request)
     if (request.fanOf == olvane::charts::FanOf::descendants) {
         ChartRequest descendants = request;
         descendants.view = View::descendants;
+        descendants.siblings = false;  // which a fan has no place for
         return personsOf(graph, descendants);
     }
     const auto firstParents = [&graph](Place person) {

@@ -61,7 +61,8 @@ TEST(ViewsFixture, aViewTakesTheOptionsOfItsRowAndNoOthers) {
         {"down", {"--down", "2"}},
         {"direction", {"--direction", "left"}},
         {"compact", {"--compact"}}};
-    for (const json& row : fixture("views.json")["views"]) {
+    const json all = fixture("views.json");  // outlives the loop
+    for (const json& row : all["views"]) {
         const std::vector<std::string> taken = row["command"];
         for (const auto& [name, arguments] : options) {
             const bool isTaken = std::find(taken.begin(), taken.end(), name) != taken.end();
@@ -71,7 +72,8 @@ TEST(ViewsFixture, aViewTakesTheOptionsOfItsRowAndNoOthers) {
 }
 
 TEST(AddressesFixture, aPageGetsTheAddressOfTheRow) {
-    for (const json& row : fixture("addresses.json")["rows"]) {
+    const json all = fixture("addresses.json");  // outlives the loop
+    for (const json& row : all["rows"]) {
         CLI::App command;
         LayoutRequest request;
         addPageViewOptions(command, request);

@@ -122,7 +122,9 @@ private:
 
 DrawingContent contentOf(const Chooser& choose, charts::View view) {
     const int persons = 2 + choose(40);
-    const kin::KinGraph graph = AnyKin::make(persons, choose(persons), choose(3) != 0, choose).graph();
+    const int unions = choose(persons);
+    const bool isOrderly = choose(3) != 0;
+    const kin::KinGraph graph = AnyKin::make(persons, unions, isOrderly, choose).graph();
     charts::ChartRequest request;
     request.view = view;
     request.focus = choose(persons);

@@ -44,7 +44,8 @@ kin::Place placeOf(const std::string& xref) {
 
 TEST(PersonsFixture, namesAndYearsAreThoseOfTheRows) {
     const GedcomLabels labels(persons());
-    for (const json& row : fixture("persons.json")["persons"]) {
+    const json all = fixture("persons.json");  // outlives the loop
+    for (const json& row : all["persons"]) {
         const PersonId id = idOf(row["xref"]);
         const kin::PersonLabel label = labels.ofPerson(id);
         EXPECT_EQ(displayName(persons().firstName(id)), row["name"]);
@@ -58,7 +59,8 @@ TEST(PersonsFixture, namesAndYearsAreThoseOfTheRows) {
 
 TEST(PersonsFixture, aPeriodIsDistinguishedFromAnUncertainDate) {
     const char* const kMarks[] = {"exact", "about", "before", "after", "between"};
-    for (const json& row : fixture("persons.json")["periods"]) {
+    const json all = fixture("persons.json");  // outlives the loop
+    for (const json& row : all["periods"]) {
         const std::string written = row["date"];
         const GedcomDate date = parseGedcomDate(written);
         EXPECT_EQ(kMarks[static_cast<std::size_t>(date.mark)], row["mark"]) << written;
@@ -69,7 +71,8 @@ TEST(PersonsFixture, aPeriodIsDistinguishedFromAnUncertainDate) {
 TEST(PersonsFixture, kinshipHasTheWordsOfTheRows) {
     const kin::KinGraph graph = kinGraphOf(persons());
     kin::KinshipFinder finder(graph);
-    for (const json& row : fixture("persons.json")["kinship"]) {
+    const json all = fixture("persons.json");  // outlives the loop
+    for (const json& row : all["kinship"]) {
         const kin::Kinship kinship = finder.between(placeOf(row["from"]), placeOf(row["to"]));
         for (const kin::Language language : kin::kLanguages) {
             EXPECT_EQ(kin::kinshipText(graph, kinship, language), row[std::string(languageCode(language))]);
@@ -91,7 +94,8 @@ TEST(PersonsFixture, remarksHaveTheWordsOfTheRows) {
 }
 
 TEST(MembersFixture, aMediumStandsForTheMemberOfTheRow) {
-    for (const json& row : fixture("members.json")["rows"]) {
+    const json all = fixture("members.json");  // outlives the loop
+    for (const json& row : all["rows"]) {
         const std::string file = row["file"];
         const std::optional<std::string> member = memberOfArchive(file);
         EXPECT_EQ(member ? json(*member) : json(), row["member"]) << file;

@@ -103,7 +103,8 @@ private:
 // Each query is a test of its own.
 const bool kRegistered = [] {
     int number = 0;
-    for (const json& query : fixture()["queries"]) {
+    const json all = fixture();  // outlives the loop
+    for (const json& query : all["queries"]) {
         std::string name = std::to_string(++number) + "_";
         for (const char c : query["text"].get<std::string>())
             name += std::isalnum(static_cast<unsigned char>(c)) != 0 ? c : '_';

@@ -22,14 +22,16 @@ const json& fixture() {
 }
 
 TEST(TextsFixture, aLineIsShortenedAsInTheRows) {
-    for (const json& row : fixture()["lines"]) {
+    const json all = fixture();  // outlives the loop
+    for (const json& row : all["lines"]) {
         const std::string text = row["text"];
         EXPECT_EQ(fitLine(cleanText(text), {row["size"], row["bold"]}, row["width"]), row["line"]) << text;
     }
 }
 
 TEST(TextsFixture, aNameIsBrokenIntoTheLinesOfTheRows) {
-    for (const json& row : fixture()["names"]) {
+    const json all = fixture();  // outlives the loop
+    for (const json& row : all["names"]) {
         const std::string given = row["given"];
         const std::string surname = row["surname"];
         const FittedName name =
@@ -40,8 +42,9 @@ TEST(TextsFixture, aNameIsBrokenIntoTheLinesOfTheRows) {
 }
 
 TEST(TextsFixture, aTextRunsAsItsFirstLetterDoes) {
-    for (const std::string text : fixture()["fromTheRight"]) EXPECT_TRUE(runsRightToLeft(text)) << text;
-    for (const std::string text : fixture()["fromTheLeft"]) EXPECT_FALSE(runsRightToLeft(text)) << text;
+    const json all = fixture();  // outlives the loop
+    for (const std::string text : all["fromTheRight"]) EXPECT_TRUE(runsRightToLeft(text)) << text;
+    for (const std::string text : all["fromTheLeft"]) EXPECT_FALSE(runsRightToLeft(text)) << text;
 }
 
 }  // namespace
