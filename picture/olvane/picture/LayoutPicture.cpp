@@ -194,21 +194,24 @@ private:
         return unions;
     }
 
-    // Full siblings whose other parent is not known: those who hang from the known parent alone join the one
-    // who has the box of the unknown parent as well.
+    // Full siblings whose other parent is not known are one family, although the layout hangs the focus from both and the
+    // others from the known parent alone. All join the one with the box of the unknown parent, or without it the first.
     void mergeSiblings() {
-        std::map<std::pair<kin::UnionPlace, Index>, std::size_t> withUnknown;
-        for (std::size_t f = 0; f < families_.size(); ++f) {
-            const Index parent = knownParent(families_[f]);
-            if (families_[f].known != kNoUnion && families_[f].parents.size() == 2 && parent != kNone) {
-                withUnknown.emplace(std::pair(families_[f].known, parent), f);
+        std::map<std::pair<kin::UnionPlace, Index>, std::size_t> together;
+        for (const std::size_t parents : {2U, 1U}) {
+            for (std::size_t f = 0; f < families_.size(); ++f) {
+                const PictureFamily& family = families_[f];
+                if (family.known == kNoUnion || family.parents.size() != parents) continue;
+                const Index parent = parents == 2 ? knownParent(family) : family.parents[0];
+                if (parent != kNone) together.emplace(std::pair(family.known, parent), f);
             }
         }
-        for (PictureFamily& family : families_) {
+        for (std::size_t f = 0; f < families_.size(); ++f) {
+            PictureFamily& family = families_[f];
             if (family.known == kNoUnion || family.parents.size() != 1) continue;
-            const auto found = withUnknown.find({family.known, family.parents[0]});
-            if (found == withUnknown.end()) continue;
-            std::vector<FamilyChild>& children = families_[found->second].children;
+            const std::size_t first = together.at({family.known, family.parents[0]});
+            if (first == f) continue;
+            std::vector<FamilyChild>& children = families_[first].children;
             children.insert(children.end(), family.children.begin(), family.children.end());
             family.children.clear();
         }

@@ -96,6 +96,25 @@ TEST_F(LayoutPicture, fullSiblingsOfAnUnknownMotherAreOneFamily) {
     EXPECT_EQ(picture.families[0].number, 5u);
 }
 
+TEST_F(LayoutPicture, fullSiblingsStayOneFamilyWhereUnknownParentsAreLeftOut) {
+    const auto focus = addBox(1, 0, 110);
+    const auto father = addBox(2, 0, 0);
+    const auto sister = addBox(3, 80, 110);
+    const auto half = addBox(4, 160, 110);
+    addFamily(father, addUnknownMother(focus, 80, 0), {focus});
+    addFamily(father, TypedLayout::kNone, {sister, half});
+    addPersons(5);
+    addUnion(1, kin::kNobody, 5, kin::UnionState::unknown, {{0, kBirth}, {2, kBirth}});
+    addUnion(1, 4, 6, kMarried, {{3, kBirth}});
+    const Picture picture = paint(false);
+    ASSERT_EQ(picture.families.size(), 2u);
+    EXPECT_THAT(picture.children(picture.families[0]), ElementsAre(0, 2));
+    EXPECT_EQ(picture.parents(picture.families[0]).size(), 1u);
+    EXPECT_EQ(picture.families[0].number, 5u);
+    EXPECT_THAT(picture.children(picture.families[1]), ElementsAre(3));
+    EXPECT_EQ(picture.families[1].number, 6u);
+}
+
 TEST_F(LayoutPicture, siblingsOfAnotherMotherAreAFamilyOfTheirOwn) {
     const auto focus = addBox(1, 0, 110);
     const auto father = addBox(2, 0, 0);
