@@ -12,11 +12,11 @@
 #include <algorithm>
 #include <map>
 #include <numeric>
-#include <random>
 #include <string>
 #include <vector>
 
 #include "AnyKin.h"
+#include "Chooser.h"
 #include "PlainCharts.h"
 #include "PlainKinship.h"
 
@@ -32,16 +32,6 @@ namespace {
 constexpr int kFamilies = 150;
 const std::vector<View> kRowViews{View::near, View::ancestors, View::descendants, View::hourglass,
                                   View::relatives};
-
-// The same numbers from every standard library.
-class Chooser {
-public:
-    explicit Chooser(unsigned seed) : random_(seed) {}
-    int operator()(int count) const { return static_cast<int>(random_() % static_cast<unsigned>(count)); }
-
-private:
-    mutable std::mt19937 random_;
-};
 
 AnyKin familyOf(unsigned seed) {
     const Chooser choose(seed);

@@ -6,7 +6,6 @@
 
 #include <gtest/gtest.h>
 
-#include <random>
 #include <regex>
 #include <string>
 #include <vector>
@@ -16,6 +15,7 @@
 #include <olvane/picture/TextMetrics.h>
 
 #include "AnyKin.h"
+#include "Chooser.h"
 
 namespace olvane::draw {
 namespace {
@@ -109,16 +109,6 @@ kin::PersonLabel labelOf(std::int64_t id) {
     if (id % 6 == 0) label.details = {"Osborne House, Isle of Wight", "Queen of the United Kingdom"};
     return label;
 }
-
-// The same numbers from every standard library.
-class Chooser {
-public:
-    explicit Chooser(unsigned seed) : random_(seed) {}
-    int operator()(int count) const { return static_cast<int>(random_() % static_cast<unsigned>(count)); }
-
-private:
-    mutable std::mt19937 random_;
-};
 
 DrawingContent contentOf(const Chooser& choose, charts::View view) {
     const int persons = 2 + choose(40);

@@ -19,6 +19,7 @@
 #include <olvane/source/GedcomKin.h>
 
 #include "GedcomText.h"
+#include "RealFiles.h"
 
 namespace olvane::gedcom::test {
 namespace {
@@ -152,14 +153,9 @@ void expectSameFamily(const olvane::Family& table, const olvane::Family& again) 
 }
 
 TEST(FamilyGedcom, givesEveryRealFileBack) {
-    const char* const folder = std::getenv("OLVANE_GEDCOM_DIR");
-    if (folder == nullptr || *folder == '\0')
-        GTEST_SKIP() << "OLVANE_GEDCOM_DIR names no folder of GEDCOM files";
-    std::vector<std::filesystem::path> files;
-    for (const auto& entry : std::filesystem::recursive_directory_iterator(folder)) {
-        if (entry.path().extension() == ".ged") files.push_back(entry.path());
-    }
-    std::sort(files.begin(), files.end());
+    const std::filesystem::path folder = realGedcomFolder();
+    if (folder.empty()) GTEST_SKIP() << "OLVANE_GEDCOM_DIR names no folder of GEDCOM files";
+    const std::vector<std::filesystem::path> files = gedcomFilesBelow(folder);
     ASSERT_FALSE(files.empty());
     for (const std::filesystem::path& path : files) {
         SCOPED_TRACE(path.string());
