@@ -37,6 +37,7 @@ struct Arrays {
     std::vector<OlvaneLine> lines;
     std::vector<OlvaneMark> marks;
     std::vector<OlvaneArc> arcs;
+    std::vector<OlvaneFoldedBranch> folded;
 };
 
 // Asks the source. What it raises becomes an exception of C++, thrown outside of the handler.
@@ -157,6 +158,15 @@ charts::ViewRequest requestOf(OlvanePictureOptions* options) {
     return request;
 }
 
+std::vector<charts::Fold> foldsOf(OlvanePictureOptions* options) {
+    std::vector<charts::Fold> folds;
+    for (NSUInteger i = 0; i < [options foldedCount]; ++i) {
+        const OlvaneFold& fold = [options folded][i];
+        folds.push_back({fold.personId, choice<picture::Branch>(fold.branch)});
+    }
+    return folds;
+}
+
 OlvaneBox boxOf(const picture::Box& box) {
     return {box.id,
             box.x,
@@ -192,6 +202,10 @@ std::unique_ptr<Arrays> arraysOf(picture::Picture made) {
             {static_cast<int32_t>(mark.kind), mark.number, {mark.boxes[0], mark.boxes[1], mark.boxes[2]}});
     }
     for (const picture::Arc& arc : made.arcs) arrays->arcs.push_back({arc.from, arc.to, arc.ring, arc.line});
+    for (const picture::FoldedBranch& folded : made.folded) {
+        arrays->folded.push_back({folded.box, folded.count, static_cast<int32_t>(folded.branch),
+                                  static_cast<int32_t>(folded.side)});
+    }
     arrays->picture = std::move(made);
     return arrays;
 }
@@ -246,9 +260,11 @@ NSError* errorOf(const olvane::CheckedOutcome& outcome) {
 // The arrays of a picture, or null with the outcome. No exception of C++ passes.
 std::unique_ptr<Arrays> made(Source source, int64_t focus, OlvanePictureOptions* options,
                              olvane::CheckedOutcome& outcome) {
-    const charts::ViewRequest request = requestOf(options);
+    charts::ViewRequest request = requestOf(options);
     const int64_t other = options.other;
     try {
+        const std::vector<charts::Fold> folds = foldsOf(options);
+        request.chart.folded = folds;
         std::shared_ptr<FoundationSource> asked;
         if (source) asked = std::make_shared<FoundationSource>(source);
         charts::CheckedPicture result = charts::checkedPicture(asked, focus, request, other);
@@ -332,6 +348,13 @@ const Arrays& arraysIn(const void* held) {
 }
 - (NSUInteger)arcCount {
     return arraysIn(_picture).arcs.size();
+}
+
+- (const OlvaneFoldedBranch*)foldedBranches {
+    return arraysIn(_picture).folded.data();
+}
+- (NSUInteger)foldedBranchCount {
+    return arraysIn(_picture).folded.size();
 }
 
 - (int32_t)focus {

@@ -3,6 +3,8 @@
 
 #import <olvane/foundation/OlvanePicture.h>
 
+#include <string.h>
+
 @implementation OlvanePictureOptions
 
 @synthesize view = _view;
@@ -47,6 +49,7 @@
 - (id)init {
     self = [super init];
     if (self) {
+        _folded = [[NSMutableData alloc] init];
         _boxWidth = 55;
         _boxHeight = 80;
         _gapX = 25;
@@ -63,6 +66,38 @@
         _niecesNephews = _grandchildren = _greatGrandparents = _spousesOfChildren = YES;
     }
     return self;
+}
+
+- (void)dealloc {
+    [_folded release];
+    [super dealloc];
+}
+
+- (const OlvaneFold*)folded {
+    return (const OlvaneFold*)[_folded bytes];
+}
+
+- (NSUInteger)foldedCount {
+    return [_folded length] / sizeof(OlvaneFold);
+}
+
+- (void)foldBranch:(int)branch ofPerson:(int64_t)personId {
+    OlvaneFold fold;
+    memset(&fold, 0, sizeof fold);
+    fold.personId = personId;
+    fold.branch = branch;
+    [self unfoldBranch:branch ofPerson:personId];
+    [_folded appendBytes:&fold length:sizeof fold];
+}
+
+- (void)unfoldBranch:(int)branch ofPerson:(int64_t)personId {
+    NSUInteger i;
+    for (i = 0; i < [self foldedCount]; ++i) {
+        const OlvaneFold fold = [self folded][i];
+        if (fold.personId != personId || fold.branch != branch) continue;
+        [_folded replaceBytesInRange:NSMakeRange(i * sizeof fold, sizeof fold) withBytes:NULL length:0];
+        return;
+    }
 }
 
 @end

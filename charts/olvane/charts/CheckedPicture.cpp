@@ -29,6 +29,9 @@ void checkChoices(const ChartRequest& chart) {
     require(isUpTo(chart.fanOf, FanOf::descendants), "fanOf is neither ancestors nor descendants");
     require(isUpTo(chart.ways, WayChoice::both), "ways is none of blood, marriage and both");
     require(isUpTo(chart.language, kin::Language::spanish), "language is none of those that are known");
+    for (const Fold& fold : chart.folded) {
+        require(isUpTo(fold.branch, picture::Branch::beside), "branch is none of up, down and beside");
+    }
 }
 
 void checkNumbers(const ChartRequest& chart) {

@@ -127,6 +127,42 @@ private:
     NSAutoreleasePool* pool_ = nil;
 };
 
+TEST_F(FoundationPicture, leavesFoldedBranchesOutAndCountsThem) {
+    const CaseFile input = family(kThreeGenerations);
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewHourglass];
+    [options foldBranch:OlvaneBranchDown ofPerson:5];
+    [options foldBranch:OlvaneBranchUp ofPerson:17];
+    [options unfoldBranch:OlvaneBranchDown ofPerson:5];
+    ASSERT_EQ(1U, [options foldedCount]);
+    EXPECT_EQ(17, [options folded][0].personId);
+    OlvanePicture* picture = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                          focus:17
+                                                        options:options
+                                                          error:NULL];
+    ASSERT_TRUE(picture != nil);
+    const charts::Fold fold{17, olvane::picture::Branch::up};
+    charts::ViewRequest request;
+    request.chart.view = charts::View::hourglass;
+    request.chart.folded = {&fold, 1};
+    const auto expected = charts::pictureOfHost(std::make_shared<support::CaseManager>(input), 17, request);
+    EXPECT_EQ(olvane::picture::pictureJson(expected), [[picture json] UTF8String]);
+    // His father, mother and one grandparent on each side of the father.
+    ASSERT_EQ(1U, [picture foldedBranchCount]);
+    const OlvaneFoldedBranch& folded = [picture foldedBranches][0];
+    EXPECT_EQ([picture focus], folded.box);
+    EXPECT_EQ(4, folded.count);
+    EXPECT_EQ(OlvaneBranchUp, folded.branch);
+    EXPECT_EQ(0, folded.side);
+}
+
+TEST_F(FoundationPicture, refusesABranchThatIsNone) {
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewHourglass];
+    [options foldBranch:3 ofPerson:17];
+    NSError* error = errorOf(hostOf<CaseFoundationHost>(family(kThreeGenerations)), options);
+    EXPECT_EQ(OlvaneErrorInvalidArgument, [error code]);
+    EXPECT_NE(descriptionOf(error).find("branch"), std::string::npos) << descriptionOf(error);
+}
+
 TEST_F(FoundationPicture, isThatOfAHostInCxxInEveryView) {
     const CaseFile input = family(kThreeGenerations);
     for (int view = OlvaneViewFamily; view <= OlvaneViewEverybody; ++view) {

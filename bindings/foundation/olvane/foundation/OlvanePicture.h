@@ -27,6 +27,18 @@ enum {
     OlvaneViewEverybody = 9
 };
 
+// A branch of a person: everybody to whom only it leads.
+enum {
+    OlvaneBranchUp = 0,     // ancestors
+    OlvaneBranchDown = 1,   // descendants
+    OlvaneBranchBeside = 2  // partners and, of the focus and its ancestors, siblings with theirs
+};
+
+typedef struct OlvaneFold {
+    int64_t personId;
+    int branch;
+} OlvaneFold;
+
 // What to make a picture of. What a view has no use for is ignored, but must be in its range.
 //
 // Units: points; degrees. Generations count from the focus, and 0 is all of them.
@@ -39,6 +51,7 @@ enum {
     BOOL _spouses, _siblings, _compact, _mirrored, _allParts, _unknownParents;
     BOOL _auntsUncles, _cousins, _familySiblings, _siblingSpouses, _niecesNephews, _grandchildren;
     BOOL _greatGrandparents, _spousesOfChildren;
+    NSMutableData* _folded;
 }
 
 // Everything else at its usual value; a plain init is for the family view.
@@ -85,6 +98,13 @@ enum {
 @property(nonatomic, assign) BOOL grandchildren;
 @property(nonatomic, assign) BOOL greatGrandparents;
 @property(nonatomic, assign) BOOL spousesOfChildren;
+
+// Near, ancestors, descendants, hourglass, relatives: branches that are left out, in the order in which they were last
+// folded. The array lives until the next fold or unfold, and no longer than the options.
+- (void)foldBranch:(int)branch ofPerson:(int64_t)personId;
+- (void)unfoldBranch:(int)branch ofPerson:(int64_t)personId;
+- (const OlvaneFold*)folded;
+- (NSUInteger)foldedCount;
 
 @end
 
@@ -138,6 +158,14 @@ typedef struct OlvaneMark {
     int32_t boxes[3];  // OlvaneNoPlace where there are fewer
 } OlvaneMark;
 
+// A branch that is left out: count persons would have boxes with it, on that side of the box.
+typedef struct OlvaneFoldedBranch {
+    int32_t box;
+    int32_t count;
+    int32_t branch;
+    int32_t side;  // 0 top, 1 right, 2 bottom, 3 left
+} OlvaneFoldedBranch;
+
 // A box of a round chart, beside the box: a piece of a ring, in degrees clockwise from the top. Ring 0 is the middle.
 typedef struct OlvaneArc {
     double from;
@@ -176,6 +204,9 @@ typedef struct OlvaneArc {
 - (NSUInteger)markCount;
 - (const OlvaneArc*)arcs;  // one for each box of a round chart
 - (NSUInteger)arcCount;
+
+- (const OlvaneFoldedBranch*)foldedBranches;
+- (NSUInteger)foldedBranchCount;
 
 - (int32_t)focus;  // the place of its box
 - (int32_t)other;  // the other person's box in a picture of kinship, or OlvaneNoPlace
