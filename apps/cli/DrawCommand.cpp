@@ -61,9 +61,11 @@ draw::DrawingOptions drawingOptions(const DrawOptions& options, const draw::Draw
     draw::DrawingOptions drawing;
     if (!options.paper.onPaper() && options.paper.scale > 0) drawing.scale = options.paper.scale;
     drawing.theme = draw::themeOfName(options.theme);
+    drawing.language = options.request.chart.language;
     drawing.headline = !options.title.empty();
-    drawing.title =
-        drawing.headline ? options.title : draw::titleOf(charts::nameOf(options.request.view()), content);
+    drawing.title = drawing.headline
+                        ? options.title
+                        : draw::titleOf(charts::nameOf(options.request.view()), content, drawing.language);
     return drawing;
 }
 

@@ -215,7 +215,9 @@ void addLanguage(CLI::App& command, kin::Language& language) {
     }();
     command
         .add_option("--language", language,
-                    "The language of a kinship's words and of remarks; English when not given")
+                    "The language of a kinship's words, of remarks and of what a picture says beside its "
+                    "data; English when "
+                    "not given")
         ->transform(choice(kNames))
         ->type_name("en|de|es")
         ->group(kKinshipGroup);
@@ -294,9 +296,9 @@ void refuseIdle(const CLI::App& command, const char* option, std::span<const Vie
 void refuseIdleOptions(const CLI::App& command, View view) {
     constexpr View kOfNearRelatives[] = {View::family, View::near};
     for (const OptionUse& use : optionUses()) {
-        const bool isOfRemarks =
-            command.get_name() == "check" && std::string_view(use.option) == "--language";
-        if (!isOfRemarks) refuseIdle(command, use.option, use.views, view);
+        const bool isOfWords = (command.get_name() == "check" || command.get_name() == "draw") &&
+                               std::string_view(use.option) == "--language";
+        if (!isOfWords) refuseIdle(command, use.option, use.views, view);
     }
     for (const FamilySwitch& option : kFamilySwitches) {
         refuseIdle(command, option.name, kOfNearRelatives, view);

@@ -95,10 +95,12 @@ PictureRequest requestOnPaper(kin::Place focus, Boxes boxes, double aspect = 0) 
 draw::DrawingOptions drawingOf(const PictureRequest& request, const draw::DrawingContent& content, int theme,
                                const char* title) {
     draw::DrawingOptions options;
+    options.language = request.view.chart.language;
     options.theme = &themeOf(theme);
     options.headline = *title != '\0';
-    options.title =
-        options.headline ? title : draw::titleOf(charts::nameOf(request.view.chart.view), content);
+    options.title = options.headline
+                        ? title
+                        : draw::titleOf(charts::nameOf(request.view.chart.view), content, options.language);
     return options;
 }
 

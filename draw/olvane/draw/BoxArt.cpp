@@ -13,6 +13,7 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/TextFit.h>
 
@@ -297,8 +298,8 @@ void appendSilhouette(std::string& svg, const BoxFrame& box, kin::Sex sex, const
         colours.silhouette, "\"/>\n");
 }
 
-std::string counted(int count, const char* one, const char* many) {
-    return joined(whole(count), " ", count == 1 ? one : many);
+std::string counted(int count, Phrase one, Phrase many, kin::Language language) {
+    return phraseWith(count == 1 ? one : many, language, {joined(whole(count))});
 }
 
 std::string hiddenSentence(const BoxFrame& frame, bool isLiving) {
@@ -306,13 +307,17 @@ std::string hiddenSentence(const BoxFrame& frame, bool isLiving) {
     const auto add = [&list](const std::string& part) { put(list, (list.empty() ? "" : ", "), part); };
     const picture::Box& box = *frame.box;
     if (frame.countsHidden && !isLiving) {
-        if (box.hiddenParents > 0) add(counted(box.hiddenParents, "parent", "parents"));
-        if (box.hiddenPartners > 0) add(counted(box.hiddenPartners, "spouse", "spouses"));
-        if (box.hiddenChildren > 0) add(counted(box.hiddenChildren, "child", "children"));
+        if (box.hiddenParents > 0)
+            add(counted(box.hiddenParents, Phrase::oneParent, Phrase::parents, frame.language));
+        if (box.hiddenPartners > 0)
+            add(counted(box.hiddenPartners, Phrase::oneSpouse, Phrase::spouses, frame.language));
+        if (box.hiddenChildren > 0)
+            add(counted(box.hiddenChildren, Phrase::oneChild, Phrase::children, frame.language));
     }
-    if (!list.empty()) return "Not shown: " + list;
-    return frame.countsHidden && !isLiving ? "Has relatives who stand elsewhere in this picture"
-                                           : "Has relatives who are not shown";
+    if (!list.empty()) return phraseWith(Phrase::notShown, frame.language, {list});
+    const bool isElsewhere = frame.countsHidden && !isLiving;
+    return std::string(
+        wordsOf(isElsewhere ? Phrase::hiddenElsewhere : Phrase::hiddenAnywhere, frame.language));
 }
 
 std::string hiddenMark(const BoxFrame& frame, bool isLiving) {
@@ -321,14 +326,16 @@ std::string hiddenMark(const BoxFrame& frame, bool isLiving) {
 }
 
 std::string repeatSentence(const BoxFrame& box) {
-    return joined("Stands in ", whole(box.repeatCount), " boxes, all marked ", whole(box.repeatNumber));
+    return phraseWith(Phrase::inBoxes, box.language,
+                      {joined(whole(box.repeatCount)), joined(whole(box.repeatNumber))});
 }
 
 constexpr std::string_view kTwoUp = "\xE2\x87\x88";
 
-std::string furtherSentence(const picture::Box& box) {
-    if (box.furtherParents == 1) return "Has further parents, who are not shown";
-    return joined("Has further parents in ", whole(box.furtherParents), " families, who are not shown");
+std::string furtherSentence(const BoxFrame& frame) {
+    const int families = frame.box->furtherParents;
+    if (families == 1) return std::string(wordsOf(Phrase::furtherParents, frame.language));
+    return phraseWith(Phrase::furtherFamilies, frame.language, {joined(whole(families))});
 }
 
 void appendBadgeAt(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
@@ -366,7 +373,7 @@ std::vector<Badge> badgesOf(const BoxFrame& box, bool isLiving) {
     };
     if (box.repeatNumber > 0) addHollow("=" + std::to_string(box.repeatNumber), repeatSentence(box));
     if (box.box->furtherParents > 0 && !isLiving) {
-        addHollow(std::string(kTwoUp), furtherSentence(*box.box));
+        addHollow(std::string(kTwoUp), furtherSentence(box));
     }
     return badges;
 }
@@ -443,18 +450,18 @@ void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& th
 }
 
 std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
-    std::string title = kin::fullName(label);
+    std::string title = fullNameIn(label, box.language);
     if (!label.living && !label.birth.empty()) put(title, ", * ", label.birth);
     if (!label.living && !label.death.empty()) put(title, ", \xE2\x80\xA0 ", label.death);
     if (!label.living) {
         for (const std::string& detail : label.details) put(title, ", ", detail);
     }
-    if (box.isFocus) title += " (focus of this picture)";
+    if (box.isFocus) title += wordsOf(Phrase::focus, box.language);
     if (!box.caption.empty()) put(title, ". ", box.caption);
-    if (box.isCommonAncestor) title += ". Common ancestor";
+    if (box.isCommonAncestor) put(title, ". ", wordsOf(Phrase::commonAncestor, box.language));
     if (box.repeatNumber > 0) put(title, ". ", repeatSentence(box));
     if (box.hasHidden()) put(title, ". ", hiddenSentence(box, label.living));
-    if (box.box->furtherParents > 0 && !label.living) put(title, ". ", furtherSentence(*box.box));
+    if (box.box->furtherParents > 0 && !label.living) put(title, ". ", furtherSentence(box));
     for (const BoxMark& mark : box.marks) put(title, ". ", mark.title);
     return title;
 }
@@ -465,14 +472,14 @@ void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
 }
 
 // What is left of a label when it must not be shown.
-kin::PersonLabel shownLabel(const kin::PersonLabel& label) {
+kin::PersonLabel shownLabel(const kin::PersonLabel& label, kin::Language language) {
     if (!label.living) {
         kin::PersonLabel shown = label;
         if (shown.given.empty() && shown.surname.empty()) shown.given = "?";
         return shown;
     }
     kin::PersonLabel shown;
-    shown.given = "Living";
+    shown.given = wordsOf(Phrase::living, language);
     shown.living = true;
     return shown;
 }
@@ -503,7 +510,7 @@ void appendBoxDefinitions(std::string& svg) {
 
 void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLabel& label,
                      const DrawingTheme& theme) {
-    const kin::PersonLabel shown = shownLabel(label);
+    const kin::PersonLabel shown = shownLabel(label, box.language);
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
     if (!isForPaper(box)) appendSilhouette(svg, box, shown.sex, theme);
@@ -518,9 +525,10 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
 void appendUnknownParentBox(std::string& svg, const BoxFrame& box, const std::string& childName,
                             const DrawingTheme& theme) {
     const bool isFather = box.box->sex == kin::Sex::male;
-    const char* invitation = isFather ? "add father" : "add mother";
+    const std::string_view invitation =
+        wordsOf(isFather ? Phrase::addFather : Phrase::addMother, box.language);
     const kin::Sex sex = isFather ? kin::Sex::male : kin::Sex::female;
-    openBox(svg, box, std::string(invitation) + " of " + childName);
+    openBox(svg, box, phraseWith(Phrase::ofChild, box.language, {invitation, childName}));
     put(svg, "<rect width=\"", number(box.width), "\" height=\"", number(box.height), "\" rx=\"",
         number(cornerOf(sex)), "\" fill=\"", theme.page, "\" stroke=\"", theme.unknownParent,
         "\" stroke-width=\"1.4\" stroke-dasharray=\"5 4\"/>\n");

@@ -39,6 +39,7 @@ struct BoxFrame {
     int repeatCount = 0;
     bool countsHidden = false;  // the box's numbers of hidden relatives are known
     std::span<const BoxMark> marks;
+    kin::Language language = kin::Language::english;
     double leastName = 0;       // DrawingOptions::leastNameSize
     TextSizes* text = nullptr;  // takes the sizes of what is written
 

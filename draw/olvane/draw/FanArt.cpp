@@ -13,6 +13,7 @@
 #include <vector>
 
 #include <olvane/draw/BoxArtInternal.h>
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
@@ -77,7 +78,7 @@ public:
         listLines();
         const std::string legend = legendText();
         openPage(svg_, options_);
-        const auto marks = boxMarksOf(fan_);
+        const auto marks = boxMarksOf(fan_, options_.language);
         for (std::size_t i = 0; i < fan_.boxes.size(); ++i) appendCell(i, marks[i]);
         if (!fan_.lines.empty()) appendLinks();
         svg_.svg += legend;
@@ -218,21 +219,21 @@ private:
         return years;
     }
 
-    static std::string titleOf(const kin::PersonLabel& label, bool isFocus,
-                               const std::vector<BoxMark>& marks) {
-        std::string title = kin::fullName(label);
+    std::string titleOf(const kin::PersonLabel& label, bool isFocus,
+                        const std::vector<BoxMark>& marks) const {
+        std::string title = fullNameIn(label, options_.language);
         const std::string years = yearsOf(label);
         if (!years.empty()) put(title, ", ", years);
-        if (isFocus) title += " (focus of this picture)";
+        if (isFocus) title += wordsOf(Phrase::focus, options_.language);
         for (const BoxMark& mark : marks) put(title, ". ", mark.title);
         return title;
     }
 
     // Names as two lines, years with the signs of marks as the third.
-    static std::vector<TextLine> textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) {
+    std::vector<TextLine> textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) const {
         std::vector<TextLine> lines;
         if (label.living) {
-            lines.push_back({"Living", true});
+            lines.push_back({std::string(wordsOf(Phrase::living, options_.language)), true});
         } else {
             const std::string& first = label.surnameFirst ? label.surname : label.given;
             const std::string& second = label.surnameFirst ? label.given : label.surname;
@@ -362,12 +363,14 @@ private:
     std::string legendText() {
         if (lines_.empty()) return std::string();
         svg_.text.add(kLegendSize);
-        std::string legend = "<g>\n<title>Legend</title>\n";
+        std::string legend;
+        put(legend, "<g>\n<title>", Escaped{wordsOf(Phrase::legend, options_.language)}, "</title>\n");
         const int top = svg_.height - kMargin + 12;
         double widest = 0;
         for (std::size_t i = 0; i < lines_.size(); ++i) {
             const auto box = static_cast<std::size_t>(lines_[i]);
-            const std::string name = cleanText(kin::fullName(readableLabel(content_, fan_.boxes[box].id)));
+            const std::string name =
+                cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language));
             const std::string text = fitLine(name, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
             const int y = top + kLegendPitch * static_cast<int>(i);

@@ -10,6 +10,7 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/MarriageLabels.h>
 #include <olvane/picture/TextFit.h>
@@ -201,10 +202,11 @@ std::string_view dashesOf(LineStyle style) {
     return kDashes[static_cast<std::size_t>(style)];
 }
 
-std::string_view meaningOf(LineStyle style) {
-    constexpr auto kMeanings = std::to_array<std::string_view>(
-        {"", "divorced", "not married", "adopted child", "foster child", "step child", "sealed child"});
-    return kMeanings[static_cast<std::size_t>(style)];
+std::string_view meaningOf(LineStyle style, kin::Language language) {
+    constexpr auto kMeanings = std::to_array<Phrase>({Phrase::divorced, Phrase::unmarried, Phrase::adopted,
+                                                      Phrase::foster, Phrase::step, Phrase::sealing});
+    if (style == LineStyle::plain) return {};
+    return wordsOf(kMeanings[static_cast<std::size_t>(style) - 1], language);
 }
 
 LineStylesUsed appendLines(SvgPicture& svg, const DrawingContent& content, const DrawingOptions& options,

@@ -20,7 +20,7 @@ using LineStylesUsed = std::array<bool, kLineStyles>;
 
 // The dashes of a style as a stroke-dasharray, and what it means; empty for the plain one.
 std::string_view dashesOf(LineStyle style);
-std::string_view meaningOf(LineStyle style);
+std::string_view meaningOf(LineStyle style, kin::Language language);
 
 // From points of the layout to px of the picture.
 struct Frame {

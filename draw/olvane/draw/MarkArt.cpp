@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cstddef>
 
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 
 namespace olvane::draw {
@@ -27,7 +28,8 @@ constexpr const char* kBoth = "\xE2\x86\x94";
 
 class MarkList {
 public:
-    explicit MarkList(const picture::Picture& picture) : marks_(picture.boxes.size()) {
+    MarkList(const picture::Picture& picture, kin::Language language)
+        : language_(language), marks_(picture.boxes.size()) {
         for (const Mark& mark : picture.marks) {
             if (mark.kind == MarkKind::parentsElsewhere) addParents(mark);
             if (mark.kind == MarkKind::partnersElsewhere) addPartners(mark);
@@ -48,29 +50,30 @@ private:
         if (std::none_of(marks.begin(), marks.end(), isThere)) marks.push_back({text, title, place});
     }
 
+    std::string marked(Phrase phrase, const char* sign, const Mark& mark) const {
+        return phraseWith(phrase, language_, {joined(sign, whole(mark.number))});
+    }
+
     void addParents(const Mark& mark) {
-        add(mark.boxes[0], kUp, mark, joined("Child of whoever is marked ", kDown, whole(mark.number)),
-            Side::top);
+        add(mark.boxes[0], kUp, mark, marked(Phrase::childOfMarked, kDown, mark), Side::top);
         for (const Index parent : {mark.boxes[1], mark.boxes[2]}) {
-            add(parent, kDown, mark, joined("Parent of who is marked ", kUp, whole(mark.number)),
-                Side::bottom);
+            add(parent, kDown, mark, marked(Phrase::parentOfMarked, kUp, mark), Side::bottom);
         }
     }
 
     void addPartners(const Mark& mark) {
         for (const Index partner : {mark.boxes[0], mark.boxes[1]}) {
-            add(partner, kBoth, mark,
-                joined("Partner of who is marked ", kBoth, whole(mark.number), " as well"), Side::bottom);
+            add(partner, kBoth, mark, marked(Phrase::partnerOfMarked, kBoth, mark), Side::bottom);
         }
     }
 
     void addFolded(const picture::FoldedBranch& folded) {
         const std::string count = joined(whole(folded.count));
-        const std::string_view noun = folded.branch == picture::Branch::up     ? "ancestors"
-                                      : folded.branch == picture::Branch::down ? "descendants"
-                                                                               : "partners and siblings";
+        const Phrase phrase = folded.branch == picture::Branch::up     ? Phrase::foldedAncestors
+                              : folded.branch == picture::Branch::down ? Phrase::foldedDescendants
+                                                                       : Phrase::foldedBeside;
         marks_[static_cast<std::size_t>(folded.box)].push_back(
-            {"+" + count, joined("Folded ", noun, ": ", count), folded.side, true});
+            {"+" + count, phraseWith(phrase, language_, {count}), folded.side, true});
     }
 
     static void shorten(std::vector<BoxMark>& marks) {
@@ -92,13 +95,14 @@ private:
         }
     }
 
+    kin::Language language_;
     std::vector<std::vector<BoxMark>> marks_;
 };
 
 }  // namespace
 
-std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture) {
-    return MarkList(picture).take();
+std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language) {
+    return MarkList(picture, language).take();
 }
 
 }  // namespace olvane::draw

@@ -20,6 +20,6 @@ struct BoxMark {
 
 // The signs of every box for what is expressed without a line, in the order of the marks: at most three stand at one
 // edge, and a last one says how many more there are. Then those of its folded branches.
-std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture);
+std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language);
 
 }  // namespace olvane::draw

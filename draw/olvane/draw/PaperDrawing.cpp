@@ -64,7 +64,7 @@ PaperDrawing drawOnPaper(const SheetRequest& request, const PaperSubject& subjec
     PaperDrawing drawn;
     drawn.title = best->options.title;
     const SvgPicture picture = drawSvg(best->content, best->options);
-    drawn.drawing = drawSheets(picture, best->request, drawn.title);
+    drawn.drawing = drawSheets(picture, best->request, drawn.title, best->options.language);
     drawn.scale = drawn.drawing.plan.scale / kMillimetresOfPx;
     drawn.points.smallestName = picture.text.smallestName * kPointsOfPx * drawn.scale;
     drawn.points.smallest = picture.text.smallest * kPointsOfPx * drawn.scale;

@@ -9,6 +9,7 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/TextMetrics.h>
 
@@ -142,10 +143,10 @@ std::optional<PictureArea> freePlaceOfMap(const SheetSubject& subject, const She
 }
 
 void appendSheetMap(std::string& svg, const SheetSubject& subject, const SheetPlan& plan,
-                    const PictureArea& place, double pxOfMm) {
+                    const PictureArea& place, double pxOfMm, kin::Language language) {
     const PictureArea all = coveredBy(plan);
     const double scale = place.width / all.width;
-    svg += "<g><title>Map of the sheets</title>\n";
+    svg += "<g><title>" + escaped(wordsOf(Phrase::mapOfSheets, language)) + "</title>\n";
     svg += rectangle(inPx(place, pxOfMm), "fill=\"#ffffff\" stroke=\"#444444\" stroke-width=\"0.8\"");
     appendDots(svg, subject, all, scale, place, pxOfMm);
     const double letters = std::clamp(place.width / std::max(plan.columns, plan.rows) / 2, 1.6, 6.0) * pxOfMm;

@@ -7,6 +7,7 @@
 #include <string>
 
 #include <olvane/draw/SheetPlan.h>
+#include <olvane/kin/Language.h>
 
 namespace olvane::draw {
 
@@ -22,6 +23,6 @@ std::optional<PictureArea> freePlaceOfMap(const SheetSubject& subject, const She
 
 // Draws it, in units of pxOfMm px a millimetre.
 void appendSheetMap(std::string& svg, const SheetSubject& subject, const SheetPlan& plan,
-                    const PictureArea& place, double pxOfMm);
+                    const PictureArea& place, double pxOfMm, kin::Language language);
 
 }  // namespace olvane::draw

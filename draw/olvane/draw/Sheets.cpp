@@ -11,6 +11,7 @@
 #include <cstddef>
 #include <optional>
 
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SheetMapInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/TextFit.h>
@@ -66,10 +67,12 @@ std::string elementsWithin(const SvgPicture& picture, const PictureArea& window)
 // One sheet with what stands on it, in px.
 class SheetArtist {
 public:
-    SheetArtist(const SvgPicture& picture, const SheetPlan& plan, const std::string& title)
+    SheetArtist(const SvgPicture& picture, const SheetPlan& plan, const std::string& title,
+                kin::Language language)
         : picture_(picture),
           plan_(plan),
           title_(title),
+          language_(language),
           width_(plan.paper.width * kPxOfMm),
           height_(plan.paper.height * kPxOfMm),
           margin_(plan.margin * kPxOfMm),
@@ -156,11 +159,11 @@ private:
 
     void appendFoot(std::string& svg, std::size_t number) const {
         const SheetWindow& sheet = plan_.sheets[number];
-        const std::string place = "sheet " + std::to_string(number + 1) + " of " +
-                                  std::to_string(plan_.sheets.size()) + ": row " +
-                                  std::to_string(sheet.row + 1) + " of " + std::to_string(plan_.rows) +
-                                  ", column " + std::to_string(sheet.column + 1) + " of " +
-                                  std::to_string(plan_.columnsOfRow[static_cast<std::size_t>(sheet.row)]);
+        const std::string place = phraseWith(
+            Phrase::sheet, language_,
+            {std::to_string(number + 1), std::to_string(plan_.sheets.size()), std::to_string(sheet.row + 1),
+             std::to_string(plan_.rows), std::to_string(sheet.column + 1),
+             std::to_string(plan_.columnsOfRow[static_cast<std::size_t>(sheet.row)])});
         const Font font{kFootSize, false};
         const double room = width_ - 2 * margin_ - textWidth(place, font) - 3 * kFootSize;
         const std::string y = px(height_ - margin_ + kTick + kFootSize);
@@ -203,9 +206,10 @@ private:
         std::string numbers;
         for (std::size_t i = 0; i < plan_.sheets.size(); ++i) {
             if (!liesAt(side, sheet, plan_.sheets[i])) continue;
-            numbers += (numbers.empty() ? "to sheet " : ", ") + std::to_string(i + 1);
+            numbers += (numbers.empty() ? "" : ", ") + std::to_string(i + 1);
         }
         if (numbers.empty()) return;
+        numbers = escaped(phraseWith(Phrase::toSheet, language_, {numbers}));
         const bool upright = side == Side::left || side == Side::right;
         const bool far = side == Side::right || side == Side::bottom;
         const double away = kTick + kFootSize;
@@ -253,6 +257,7 @@ private:
     const SvgPicture& picture_;
     const SheetPlan& plan_;
     const std::string& title_;
+    kin::Language language_;
     double width_;
     double height_;
     double margin_;
@@ -271,7 +276,8 @@ SheetSubject subjectOf(const SvgPicture& picture) {
     return subject;
 }
 
-SheetDrawing drawSheets(const SvgPicture& picture, const SheetRequest& request, const std::string& title) {
+SheetDrawing drawSheets(const SvgPicture& picture, const SheetRequest& request, const std::string& title,
+                        kin::Language language) {
     const SheetSubject subject = subjectOf(picture);
     SheetDrawing drawing;
     drawing.plan = planSheets(subject, request);
@@ -284,9 +290,9 @@ SheetDrawing drawSheets(const SvgPicture& picture, const SheetRequest& request, 
             drawing.plan = planSheets(subject, lower);
             place = mapAboveOf(drawing.plan);
         }
-        appendSheetMap(map, subject, drawing.plan, *place, kPxOfMm);
+        appendSheetMap(map, subject, drawing.plan, *place, kPxOfMm, language);
     }
-    const SheetArtist artist(picture, drawing.plan, title);
+    const SheetArtist artist(picture, drawing.plan, title, language);
     for (std::size_t i = 0; i < drawing.plan.sheets.size(); ++i) {
         drawing.sheets.push_back(artist.draw(i, i == 0 ? map : std::string()));
         drawing.sheets.back().text = picture.text;

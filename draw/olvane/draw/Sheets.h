@@ -31,6 +31,7 @@ struct SheetDrawing {
 //        written in them.
 // Holds: a sheet holds those boxes and strokes alone that it shows.
 // Fails: as planSheets.
-SheetDrawing drawSheets(const SvgPicture& picture, const SheetRequest& request, const std::string& title);
+SheetDrawing drawSheets(const SvgPicture& picture, const SheetRequest& request, const std::string& title,
+                        kin::Language language = kin::Language::english);
 
 }  // namespace olvane::draw

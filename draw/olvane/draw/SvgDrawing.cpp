@@ -12,6 +12,7 @@
 #include <vector>
 
 #include <olvane/draw/BoxArtInternal.h>
+#include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/FanArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
@@ -149,9 +150,10 @@ private:
         numberRepeats();
         findCommonAncestors();
         if (picture.boxes.empty()) appendNobody();
-        const auto marks = boxMarksOf(picture);
+        const auto marks = boxMarksOf(picture, options_.language);
         for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
             BoxFrame frame = frameOf(picture.boxes[i]);
+            frame.language = options_.language;
             frame.isFocus = picture.focus == static_cast<picture::Index>(i);
             addKinship(frame, static_cast<picture::Index>(i));
             frame.marks = marks[i];
@@ -199,7 +201,8 @@ private:
 
     void appendNobody() {
         put(picture_.svg, "<text x=\"", whole(kMargin), "\" y=\"", whole(picture_.height / 2),
-            "\" font-size=\"12\" fill=\"", theme().quietText, "\">Nobody to show</text>\n");
+            "\" font-size=\"12\" fill=\"", theme().quietText, "\">",
+            Escaped{wordsOf(Phrase::nobody, options_.language)}, "</text>\n");
     }
 
     BoxFrame frameOf(const picture::Box& box) const {
@@ -230,10 +233,11 @@ private:
     }
 
     std::string nameOfChild(const picture::Box& unknown) const {
-        if (unknown.childOf == picture::kNone) return kin::fullName(kin::PersonLabel());
+        if (unknown.childOf == picture::kNone) return fullNameIn(kin::PersonLabel(), options_.language);
         const picture::Box& child = content_.picture.boxes[static_cast<std::size_t>(unknown.childOf)];
-        return kin::fullName(child.kind == picture::BoxKind::person ? readableLabel(content_, child.id)
-                                                                    : kin::PersonLabel());
+        return fullNameIn(
+            child.kind == picture::BoxKind::person ? readableLabel(content_, child.id) : kin::PersonLabel(),
+            options_.language);
     }
 
     // What a line of a kind looks like, and what it means.
@@ -253,7 +257,8 @@ private:
         for (std::size_t i = 1; i < kLineStyles; ++i) {
             const auto style = static_cast<LineStyle>(i);
             if (styles[i])
-                rows.push_back({theme().line, kLegendLine, dashesOf(style), std::string(meaningOf(style))});
+                rows.push_back({theme().line, kLegendLine, dashesOf(style),
+                                std::string(meaningOf(style, options_.language))});
         }
         return rows;
     }
@@ -263,7 +268,8 @@ private:
         const std::vector<LegendRow> rows = legendRows(styles);
         if (rows.empty()) return std::string();
         picture_.text.add(kLegendSize);
-        std::string legend = "<g>\n<title>Legend</title>\n";
+        std::string legend;
+        put(legend, "<g>\n<title>", Escaped{wordsOf(Phrase::legend, options_.language)}, "</title>\n");
         double width = kLegendWidth;
         int number = 0;
         for (const LegendRow& row : rows) {
@@ -326,14 +332,12 @@ void closePage(SvgPicture& picture) {
     picture.svg += "</g>\n</svg>\n";
 }
 
-std::string titleOf(std::string_view view, const DrawingContent& content) {
-    std::string title(view);
-    if (!title.empty() && title[0] >= 'a' && title[0] <= 'z')
-        title[0] = static_cast<char>(title[0] - 'a' + 'A');
+std::string titleOf(std::string_view view, const DrawingContent& content, kin::Language language) {
+    const std::string title = viewTitle(view, language);
     const picture::Index focus = content.picture.focus;
     if (focus == picture::kNone) return title;
     const std::int64_t id = content.picture.boxes[static_cast<std::size_t>(focus)].id;
-    return title + " of " + kin::fullName(content.labelOf(id));
+    return phraseWith(Phrase::viewOf, language, {title, fullNameIn(content.labelOf(id), language)});
 }
 
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options) {

@@ -12,6 +12,7 @@
 
 #include <olvane/draw/DrawingTheme.h>
 #include <olvane/draw/PictureArea.h>
+#include <olvane/kin/Language.h>
 #include <olvane/kin/PersonLabel.h>
 #include <olvane/picture/Picture.h>
 
@@ -42,6 +43,8 @@ struct DrawingOptions {
     double leastNameSize = 0;
     // The size of the picture, by the size that it has at 96 px an inch.
     double scale = 1;
+    // Of everything that the picture says beside its data: marks, legend, titles of boxes.
+    kin::Language language = kin::Language::english;
 };
 
 // An element of a picture, a box or the lines of a family: where it is seen, and which bytes draw it.
@@ -82,7 +85,8 @@ struct SvgPicture {
 };
 
 // What a picture is called that nobody gave a title: "Family of Ada Berg" for the view "family".
-std::string titleOf(std::string_view view, const DrawingContent& content);
+std::string titleOf(std::string_view view, const DrawingContent& content,
+                    kin::Language language = kin::Language::english);
 
 // Draws a picture as SVG: lines below, boxes with names above, marks at their edges, a legend where lines of a
 // special kind are used. A round chart is drawn as rings of cells.

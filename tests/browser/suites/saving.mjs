@@ -70,11 +70,13 @@ describe("saving", kTwoAtOnce, () => {
                 { colorScheme: "dark" },
                 ["--view", "descendants", "--down", "2", "--theme", "dark"],
             ],
+            ["", { locale: "de-DE" }, ["--language", "de"]],
+            ["&view=fan&up=3", { locale: "es-ES" }, ["--view", "fan", "--up", "3", "--language", "es"]],
         ];
         for (const [address, settings, extra] of pictures) {
             const visit = await visitDarwins("#person=I1" + address, settings);
             const { bytes } = await save(visit, "#save-svg");
-            const unknown = /ancestors|descendants/.test(address) ? [] : ["--unknown-parents"];
+            const unknown = /ancestors|descendants|fan/.test(address) ? [] : ["--unknown-parents"];
             const drawn = execFileSync(command, ["draw", sample, "--focus", "I1", "-o", "-", ...unknown, ...extra]);
             assert.equal(bytes.toString("utf8"), drawn.toString("utf8"), address);
             await visit.end();
