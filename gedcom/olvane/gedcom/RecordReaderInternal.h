@@ -17,6 +17,9 @@
 
 namespace olvane::gedcom {
 
+// Of a PEDI, in whatever case.
+Pedigree pedigreeOf(std::string_view value);
+
 // Fills the tables from the lines of a file, in one pass and without a tree of lines. What the tables have no place for
 // goes to details, if there is one.
 //
@@ -74,47 +77,56 @@ private:
         std::size_t count = 0;
     };
 
+    // RecordReader.cpp
     void readLine(const GedcomLine& line);
+    void readFactLine(const GedcomLine& line, std::uint64_t tag);
+    void readDetailLine(const GedcomLine& line, std::uint64_t tag);
     void beginRecord(const GedcomLine& line);
     void endRecord();
     void checkBeginning(const GedcomLine& line);
     void checkEnd(const GedcomLine& line, std::uint64_t tag);
-    void beginPerson(const GedcomLine& line);
-    void beginFamily(const GedcomLine& line);
     XrefTable::Entry* claimXref(const GedcomLine& line);
-
-    void readPersonFact(const GedcomLine& line, std::uint64_t tag);
-    bool passOverIfNot(const GedcomLine& line);
-    void readPersonDetail(const GedcomLine& line, std::uint64_t tag);
-    void readFamilyFact(const GedcomLine& line, std::uint64_t tag);
-    void readFamilyDetail(const GedcomLine& line, std::uint64_t tag);
-    void readChildTie(Pedigree tie);
-
-    void beginName(const GedcomLine& line);
-    void readNamePiece(const GedcomLine& line, std::uint64_t tag);
-    void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator);
-    std::string_view keptPiece(const PieceDraft& piece);
-    void addFurtherName(const GedcomLine& line, std::string_view type);
-    void addFurtherNames(std::string_view given);
-    std::string_view givenNameOfPerson() const;
-    void endName();
-
-    void beginFact(const GedcomLine& line, std::uint64_t tag);
-    void readFactDetail(const GedcomLine& line, std::uint64_t tag);
-    Slice& factsInHand();
-    void beginDetails(const GedcomLine& line, std::uint64_t tag);
-    void keepDetail(const GedcomLine& line, std::uint64_t tag);
-
-    void readDate(const GedcomLine& line, GedcomDate& date);
-    void readDatePhrase(const GedcomLine& line);
-    void addPartner(const GedcomLine& line, PartnerDraft& draft);
-    void endPerson();
-    void endFamily();
-    void settlePartners();
-    void refusePartner(LineNumber line);
     XrefPlace readPointer(const GedcomLine& line);
     std::string_view pointedXref(const GedcomLine& line);
 
+    // PersonRecords.cpp
+    void beginPerson(const GedcomLine& line);
+    void readPersonFact(const GedcomLine& line, std::uint64_t tag);
+    bool passOverIfNot(const GedcomLine& line);
+    void readPersonDetail(const GedcomLine& line, std::uint64_t tag);
+    void endPerson();
+    std::string_view givenNameOfPerson() const;
+
+    // FamilyRecords.cpp
+    void beginFamily(const GedcomLine& line);
+    void readFamilyFact(const GedcomLine& line, std::uint64_t tag);
+    void readFamilyDetail(const GedcomLine& line, std::uint64_t tag);
+    void readChildTie(Pedigree tie);
+    void addPartner(const GedcomLine& line, PartnerDraft& draft);
+    void refusePartner(LineNumber line);
+    void endFamily();
+    void settlePartners();
+
+    // RecordNames.cpp
+    void beginName(const GedcomLine& line);
+    void readNamePiece(const GedcomLine& line, std::uint64_t tag);
+    void addFurtherName(const GedcomLine& line, std::string_view type);
+    void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator);
+    std::string_view keptPiece(const PieceDraft& piece);
+    void endName();
+    void addFurtherNames(std::string_view given);
+
+    // RecordFacts.cpp
+    void beginFact(const GedcomLine& line, std::uint64_t tag);
+    void readFactDetail(const GedcomLine& line, std::uint64_t tag);
+    Slice& factsInHand();
+    void readDate(const GedcomLine& line, GedcomDate& date);
+    void readDatePhrase(const GedcomLine& line);
+    void beginDetails(const GedcomLine& line, std::uint64_t tag);
+    void keepDetail(const GedcomLine& line, std::uint64_t tag);
+
+    // Before 7.0, the value N negates the event.
+    static bool didNotHappen(const GedcomLine& line) { return trimmed(line.value) == "N"; }
     std::string_view keptValue(const GedcomLine& line) {
         return interner_.keep(scanner_.wholeValue(line), line.number);
     }
