@@ -18,9 +18,9 @@ async function start(): Promise<void> {
         const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
         OlvaneTree.engine = () => Promise.resolve(engine);
         const app = new App(root, engine);
-        if (family?.hasMap) await app.openMap(family, embeddedMap());
-        else if (family) app.openEmbedded(family);
-        else await app.openKept();
+        if (family?.hasMap) await app.opening.openMap(family, embeddedMap());
+        else if (family) app.opening.openEmbedded(family);
+        else await app.opening.openKept();
     } catch (error) {
         const reason = typeof DecompressionStream === "undefined" ? errors.tooNew : errors.engine;
         const detail = error instanceof Error ? error.message : String(error);
