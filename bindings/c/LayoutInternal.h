@@ -26,10 +26,6 @@ struct olvane_layout {
 
 namespace olvane::c {
 
-// The options of a C host as the engine takes them.
-LayoutOptions layoutOptionsOf(const olvane_options& options);
-
-bool areInRange(const olvane_options& options);
 bool isComplete(const olvane_host& host);
 
 // The callbacks as a data source; the host outlives it.

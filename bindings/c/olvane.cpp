@@ -8,7 +8,6 @@
 
 #include <olvane.h>
 
-#include <cmath>
 #include <cstdint>
 #include <limits>
 #include <memory>
@@ -20,6 +19,7 @@
 
 #include "FamilyInternal.h"
 #include "LayoutInternal.h"
+#include "ViewOptions.h"
 
 // The opaque answers are what the engine takes, so nothing is copied twice. An append that found no memory is
 // remembered: a callback that does not look at its status must not hand in a shorter list unnoticed.
@@ -36,15 +36,15 @@ struct olvane_date {
 namespace {
 
 using olvane::TypedLayout;
+using olvane::c::areInRange;
+using olvane::c::defaultOptions;
+using olvane::c::layoutOptionsOf;
 
 constexpr int kThrownCode = -1;
 
 bool isPersonId(std::int64_t id) {
     return id >= 1 && id <= std::numeric_limits<std::int32_t>::max();
 }
-
-constexpr int kDefaultGenerations = 5;
-constexpr int kDefaultFlagDepth = 4;  // as the family view's own
 
 // These travel through the engine only and never leave this file.
 struct HostFailure {
@@ -184,62 +184,9 @@ private:
 
 thread_local bool RunningLayout::isRunning_ = false;
 
-olvane_options defaultOptions() {
-    const TreeSize size = olvane::familyTreeSize();
-    olvane_options options;
-    options.struct_size = sizeof(olvane_options);
-    options.sizes = {size.nodeWidth,   size.nodeHeight,     size.horzPadding,
-                     size.vertPadding, size.spouseLineStep, size.lineInset};
-    options.shown = OLVANE_SHOW_ALL;
-    options.generations = kDefaultGenerations;
-    options.flag_depth = kDefaultFlagDepth;
-    return options;
-}
-
 bool isComplete(const olvane_host& host) {
     return host.struct_size == sizeof(olvane_host) && host.father_of && host.mother_of && host.spouses_of &&
            host.children_of && host.is_preferred_spouse && host.is_dead && host.date_of && host.sex_of;
-}
-
-bool areFinite(const olvane_sizes& sizes) {
-    for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding,
-                             sizes.spouse_line_step, sizes.line_inset}) {
-        if (!std::isfinite(size)) return false;
-    }
-    return true;
-}
-
-bool areInRange(const olvane_options& options) {
-    return options.struct_size == sizeof(olvane_options) && areFinite(options.sizes) &&
-           (options.shown & ~OLVANE_SHOW_ALL) == 0 && options.generations >= 1 &&
-           options.generations <= OLVANE_MOST_GENERATIONS && options.flag_depth >= 0;
-}
-
-TreeSize treeSizeOf(const olvane_sizes& sizes) {
-    TreeSize size;
-    size.nodeWidth = sizes.node_width;
-    size.nodeHeight = sizes.node_height;
-    size.horzPadding = sizes.horz_padding;
-    size.vertPadding = sizes.vert_padding;
-    size.spouseLineStep = sizes.spouse_line_step;
-    size.lineInset = sizes.line_inset;
-    return size;
-}
-
-olvane::LayoutOptions layoutOptionsOf(const olvane_options& options) {
-    olvane::LayoutOptions result;
-    result.sizes = treeSizeOf(options.sizes);
-    result.auntsUncles = (options.shown & OLVANE_SHOW_AUNTS_UNCLES) != 0;
-    result.cousins = (options.shown & OLVANE_SHOW_COUSINS) != 0;
-    result.siblings = (options.shown & OLVANE_SHOW_SIBLINGS) != 0;
-    result.siblingSpouses = (options.shown & OLVANE_SHOW_SIBLING_SPOUSES) != 0;
-    result.niecesNephews = (options.shown & OLVANE_SHOW_NIECES_NEPHEWS) != 0;
-    result.grandchildren = (options.shown & OLVANE_SHOW_GRANDCHILDREN) != 0;
-    result.greatGrandparents = (options.shown & OLVANE_SHOW_GREAT_GRANDPARENTS) != 0;
-    result.spousesOfChildren = (options.shown & OLVANE_SHOW_SPOUSES_OF_CHILDREN) != 0;
-    result.generations = options.generations;
-    result.flagDepth = options.flag_depth;
-    return result;
 }
 
 // What both views ask for. Exactly one of host and source is there.
@@ -342,14 +289,6 @@ olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olva
 
 }  // namespace
 
-olvane::LayoutOptions olvane::c::layoutOptionsOf(const olvane_options& options) {
-    return ::layoutOptionsOf(options);
-}
-
-bool olvane::c::areInRange(const olvane_options& options) {
-    return ::areInRange(options);
-}
-
 bool olvane::c::isComplete(const olvane_host& host) {
     return ::isComplete(host);
 }
@@ -449,12 +388,6 @@ olvane_status olvane_date_set(olvane_date* date, const char* text) {
         date->lacksMemory = true;
         return OLVANE_OUT_OF_MEMORY;
     }
-    return OLVANE_OK;
-}
-
-olvane_status olvane_options_default(olvane_options* options) {
-    if (!options) return OLVANE_INVALID_ARGUMENT;
-    *options = defaultOptions();
     return OLVANE_OK;
 }
 

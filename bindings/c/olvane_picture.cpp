@@ -19,6 +19,7 @@
 #include "FamilyInternal.h"
 #include "FileInternal.h"
 #include "LayoutInternal.h"
+#include "ViewOptions.h"
 
 #include <olvane/charts/Views.h>
 #include <olvane/picture/HiddenPersons.h>
@@ -154,78 +155,21 @@ const Entry* dataOrNull(const std::vector<Entry>& entries) {
 
 constexpr std::int64_t kGreatestId = std::numeric_limits<std::int32_t>::max();
 
-// Whether a number is one of an enumeration that counts from 0.
-bool isOneOf(std::int32_t number, std::int32_t count) {
-    return number >= 0 && number < count;
-}
-
-bool areInRange(const olvane_picture_options& options) {
-    const olvane_sizes& sizes = options.layout.sizes;
-    for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding}) {
-        if (!(size >= 0)) return false;
+// The request, with the places of an earlier picture where that was laid out alike.
+struct Request : olvane::c::AskedView {
+    explicit Request(const olvane_picture_options& options) : AskedView(options) {
+        const olvane_picture* earlier = options.earlier;
+        if (earlier && earlier->direction == options.direction &&
+            earlier->mirrored == request.chart.mirrored && earlier->source.view == "everybody")
+            request.chart.earlier = &earlier->source;
     }
-    if (!options.folds && options.fold_count > 0) return false;
-    for (std::size_t i = 0; i < options.fold_count; ++i) {
-        if (!isOneOf(options.folds[i].branch, 3)) return false;
-    }
-    return options.struct_size == sizeof(olvane_picture_options) && isOneOf(options.view, 10) &&
-           options.up >= 0 && options.down >= 0 && isOneOf(options.direction, 4) &&
-           isOneOf(options.fan_of, 2) && options.fan_angle >= 90 && options.fan_angle <= 360 &&
-           isOneOf(options.ways, 3) && options.most_ways >= 0 && isOneOf(options.language, 3) &&
-           options.marks >= -1 && isOneOf(options.effort, 101) &&
-           isOneOf(options.year, olvane::c::kLastYear + 1) && olvane::c::areInRange(options.layout);
-}
-
-charts::ViewRequest viewOf(const olvane_picture_options& options) {
-    charts::ViewRequest request;
-    charts::ChartRequest& chart = request.chart;
-    chart.view = static_cast<charts::View>(options.view);
-    chart.up = options.up;
-    chart.down = options.down;
-    chart.direction = static_cast<charts::Direction>(options.direction);
-    chart.spouses = options.spouses != 0;
-    chart.siblings = options.siblings != 0;
-    chart.compact = options.compact != 0;
-    chart.mirrored = options.mirrored != 0;
-    chart.fanOf = static_cast<charts::FanOf>(options.fan_of);
-    chart.fanAngle = options.fan_angle;
-    chart.ways = static_cast<charts::WayChoice>(options.ways);
-    chart.mostWays = options.most_ways;
-    chart.language = static_cast<olvane::kin::Language>(options.language);
-    chart.marks = options.marks;
-    chart.effort = options.effort;
-    chart.onePart = options.all_parts == 0;
-    chart.layout = olvane::c::layoutOptionsOf(options.layout);
-    chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
-                   options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
-    const olvane_picture* earlier = options.earlier;
-    if (earlier && earlier->direction == options.direction && earlier->mirrored == chart.mirrored &&
-        earlier->source.view == "everybody")
-        chart.earlier = &earlier->source;
-    request.unknownParents = options.unknown_parents != 0;
-    return request;
-}
+};
 
 void fillAsked(picture::Picture from, const olvane_picture_options& options, olvane_picture& to) {
     fill(std::move(from), to);
     to.direction = options.direction;
     to.mirrored = options.mirrored != 0;
 }
-// A request, and the folds that it refers to.
-struct Request {
-    explicit Request(const olvane_picture_options& options) : view(viewOf(options)) {
-        for (std::size_t i = 0; i < options.fold_count; ++i) {
-            folds.push_back({options.folds[i].person, static_cast<picture::Branch>(options.folds[i].branch)});
-        }
-        view.chart.folded = folds;
-    }
-    Request(const Request&) = delete;
-    Request& operator=(const Request&) = delete;
-
-    std::vector<charts::Fold> folds;
-    charts::ViewRequest view;
-};
-
 olvane_picture_options chosenOptions(const olvane_picture_options* options) {
     olvane_picture_options chosen;
     if (options) return *options;
@@ -252,14 +196,14 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
         if (!file.has(person)) throw std::out_of_range("no person of the file");
         return file.graph().placeOf(person);
     };
-    Request request(options);
-    charts::ChartRequest& chart = request.view.chart;
+    Request asked(options);
+    charts::ChartRequest& chart = asked.request.chart;
     chart.focus = placeOf(focus);
     if (chart.view == charts::View::kinship) chart.to = placeOf(options.other);
     olvane::gedcom::GedcomDataSource people(file.data);
     const auto source =
         std::make_shared<olvane::gedcom::LimitedDataSource>(people, olvane::c::kMostRelatives);
-    picture::Picture made = charts::pictureOf(source, file.graph(), request.view);
+    picture::Picture made = charts::pictureOf(source, file.graph(), asked.request);
     const std::vector<bool> hidden =
         options.hide_living != 0 ? file.living(options.year) : std::vector<bool>();
     picture::hidePersons(hidden, made);
@@ -269,28 +213,15 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
 
 }  // namespace
 
-olvane_status olvane_picture_options_default(int32_t view, olvane_picture_options* options) {
-    if (!options || !isOneOf(view, 10)) return OLVANE_INVALID_ARGUMENT;
-    *options = {};
-    options->struct_size = sizeof(olvane_picture_options);
-    options->view = view;
-    options->spouses = 1;
-    options->fan_angle = 360;
-    options->ways = 2;
-    options->most_ways = 8;
-    options->effort = 1;
-    options->unknown_parents = 1;
-    return olvane_options_default(&options->layout);
-}
-
 olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focus,
                                        const olvane_picture_options* options, olvane_picture** picture) {
     if (!picture) return OLVANE_INVALID_ARGUMENT;
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
-    if (!family || !areInRange(chosen) || chosen.hide_living != 0) return OLVANE_INVALID_ARGUMENT;
+    if (!family || !olvane::c::areInRange(chosen) || chosen.hide_living != 0) return OLVANE_INVALID_ARGUMENT;
     const auto work = [&](olvane_picture& made) {
-        fillAsked(charts::pictureOf(family->table, focus, Request(chosen).view, chosen.other), chosen, made);
+        fillAsked(charts::pictureOf(family->table, focus, Request(chosen).request, chosen.other), chosen,
+                  made);
     };
     return make(work, picture);
 }
@@ -300,7 +231,7 @@ olvane_status olvane_picture_of_file(const olvane_file* file, int64_t focus,
     if (!picture) return OLVANE_INVALID_ARGUMENT;
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
-    if (!file || !areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
+    if (!file || !olvane::c::areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
     return make([&](olvane_picture& made) { fillFromFile(*file, focus, chosen, made); }, picture);
 }
 
@@ -309,13 +240,13 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
     if (!picture) return OLVANE_INVALID_ARGUMENT;
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
-    if (!host || !olvane::c::isComplete(*host) || !areInRange(chosen) || chosen.hide_living != 0) {
+    if (!host || !olvane::c::isComplete(*host) || !olvane::c::areInRange(chosen) || chosen.hide_living != 0) {
         return OLVANE_INVALID_ARGUMENT;
     }
     const auto work = [&](olvane_picture& made) {
         if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
         fillAsked(
-            charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).view, chosen.other),
+            charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).request, chosen.other),
             chosen, made);
     };
     olvane_status status = OLVANE_NESTED_CALL;

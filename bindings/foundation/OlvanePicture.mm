@@ -5,6 +5,7 @@
 
 #import <olvane/foundation/OlvanePicture.h>
 
+#import "PictureOptionsInternal.h"
 #import "Raised.h"
 #import "Texts.h"
 
@@ -17,6 +18,8 @@
 
 #include <olvane/charts/CheckedPicture.h>
 #include <olvane/picture/PictureJson.h>
+
+#include "ViewOptions.h"
 
 NSString* const OlvaneErrorDomain = @"olvane";
 NSString* const OlvaneErrorOperationKey = @"OlvaneErrorOperation";
@@ -112,61 +115,6 @@ private:
     Source source_;
 };
 
-// A number of no enumeration stays one: it is refused when the picture is made.
-template <class Choice>
-Choice choice(int number) {
-    return static_cast<Choice>(number >= 0 && number < 255 ? number : 255);
-}
-
-olvane::LayoutOptions layoutOptionsOf(OlvanePictureOptions* options) {
-    olvane::LayoutOptions layout;
-    layout.auntsUncles = options.auntsUncles;
-    layout.cousins = options.cousins;
-    layout.siblings = options.familySiblings;
-    layout.siblingSpouses = options.siblingSpouses;
-    layout.niecesNephews = options.niecesNephews;
-    layout.grandchildren = options.grandchildren;
-    layout.greatGrandparents = options.greatGrandparents;
-    layout.spousesOfChildren = options.spousesOfChildren;
-    layout.generations = options.generations;
-    layout.flagDepth = options.flagDepth;
-    return layout;
-}
-
-charts::ViewRequest requestOf(OlvanePictureOptions* options) {
-    charts::ViewRequest request;
-    charts::ChartRequest& chart = request.chart;
-    chart.view = choice<charts::View>(options.view);
-    chart.up = options.up;
-    chart.down = options.down;
-    chart.direction = choice<charts::Direction>(options.direction);
-    chart.sizes = {options.boxWidth, options.boxHeight, options.gapX, options.gapY};
-    chart.layout = layoutOptionsOf(options);
-    chart.spouses = options.spouses;
-    chart.siblings = options.siblings;
-    chart.compact = options.compact;
-    chart.mirrored = options.mirrored;
-    chart.fanOf = choice<charts::FanOf>(options.fanOf);
-    chart.fanAngle = options.fanAngle;
-    chart.ways = choice<charts::WayChoice>(options.ways);
-    chart.mostWays = options.mostWays;
-    chart.language = choice<olvane::kin::Language>(options.language);
-    chart.marks = options.marks;
-    chart.effort = options.effort;
-    chart.onePart = !options.allParts;
-    request.unknownParents = options.unknownParents;
-    return request;
-}
-
-std::vector<charts::Fold> foldsOf(OlvanePictureOptions* options) {
-    std::vector<charts::Fold> folds;
-    for (NSUInteger i = 0; i < [options foldedCount]; ++i) {
-        const OlvaneFold& fold = [options folded][i];
-        folds.push_back({fold.personId, choice<picture::Branch>(fold.branch)});
-    }
-    return folds;
-}
-
 OlvaneBox boxOf(const picture::Box& box) {
     return {box.id,
             box.x,
@@ -260,14 +208,12 @@ NSError* errorOf(const olvane::CheckedOutcome& outcome) {
 // The arrays of a picture, or null with the outcome. No exception of C++ passes.
 std::unique_ptr<Arrays> made(Source source, int64_t focus, OlvanePictureOptions* options,
                              olvane::CheckedOutcome& outcome) {
-    charts::ViewRequest request = requestOf(options);
-    const int64_t other = options.other;
+    const olvane_picture_options& asked = *[options options];
     try {
-        const std::vector<charts::Fold> folds = foldsOf(options);
-        request.chart.folded = folds;
-        std::shared_ptr<FoundationSource> asked;
-        if (source) asked = std::make_shared<FoundationSource>(source);
-        charts::CheckedPicture result = charts::checkedPicture(asked, focus, request, other);
+        const olvane::c::AskedView view(asked);
+        std::shared_ptr<FoundationSource> host;
+        if (source) host = std::make_shared<FoundationSource>(source);
+        charts::CheckedPicture result = charts::checkedPicture(host, focus, view.request, asked.other);
         outcome = result;
         if (result.isOk()) return arraysOf(std::move(result.picture));
     } catch (...) {

@@ -1,44 +1,84 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
+// Each property is a field of the options of the C interface, which has their usual values and says what they mean to the
+// libraries.
+
 #import <olvane/foundation/OlvanePicture.h>
 
+#import "PictureOptionsInternal.h"
+
+#include <stddef.h>
+#include <stdlib.h>
 #include <string.h>
+
+#define OLVANE_FIELD(type, getter, setter, field) \
+    -(type)getter {                               \
+        return (type)_options->field;             \
+    }                                             \
+    -(void)setter : (type)value {                 \
+        _options->field = value;                  \
+    }
+
+#define OLVANE_SWITCH(getter, setter, field)      \
+    -(BOOL)getter {                               \
+        return _options->field != 0 ? YES : NO;   \
+    }                                             \
+    -(void)setter : (BOOL)value {                 \
+        _options->field = value ? 1 : 0;          \
+    }
+
+#define OLVANE_SHOWN(getter, setter, bit)                               \
+    -(BOOL)getter {                                                     \
+        return (_options->layout.shown & (bit)) != 0 ? YES : NO;        \
+    }                                                                   \
+    -(void)setter : (BOOL)value {                                       \
+        if (value)                                                      \
+            _options->layout.shown |= (bit);                            \
+        else                                                            \
+            _options->layout.shown &= ~(bit);                           \
+    }
+
+_Static_assert(sizeof(OlvaneFold) == sizeof(olvane_fold) &&
+                   offsetof(OlvaneFold, branch) == offsetof(olvane_fold, branch),
+               "folds are handed over as they lie");
 
 @implementation OlvanePictureOptions
 
-@synthesize view = _view;
-@synthesize up = _up;
-@synthesize down = _down;
-@synthesize direction = _direction;
-@synthesize boxWidth = _boxWidth;
-@synthesize boxHeight = _boxHeight;
-@synthesize gapX = _gapX;
-@synthesize gapY = _gapY;
-@synthesize spouses = _spouses;
-@synthesize siblings = _siblings;
-@synthesize compact = _compact;
-@synthesize mirrored = _mirrored;
-@synthesize fanOf = _fanOf;
-@synthesize fanAngle = _fanAngle;
-@synthesize other = _other;
-@synthesize ways = _ways;
-@synthesize mostWays = _mostWays;
-@synthesize language = _language;
-@synthesize marks = _marks;
-@synthesize effort = _effort;
-@synthesize allParts = _allParts;
-@synthesize generations = _generations;
-@synthesize flagDepth = _flagDepth;
-@synthesize unknownParents = _unknownParents;
-@synthesize auntsUncles = _auntsUncles;
-@synthesize cousins = _cousins;
-@synthesize familySiblings = _familySiblings;
-@synthesize siblingSpouses = _siblingSpouses;
-@synthesize niecesNephews = _niecesNephews;
-@synthesize grandchildren = _grandchildren;
-@synthesize greatGrandparents = _greatGrandparents;
-@synthesize spousesOfChildren = _spousesOfChildren;
+// clang-format off
+OLVANE_FIELD(int, view, setView, view)
+OLVANE_FIELD(int, up, setUp, up)
+OLVANE_FIELD(int, down, setDown, down)
+OLVANE_FIELD(int, direction, setDirection, direction)
+OLVANE_FIELD(float, boxWidth, setBoxWidth, layout.sizes.node_width)
+OLVANE_FIELD(float, boxHeight, setBoxHeight, layout.sizes.node_height)
+OLVANE_FIELD(float, gapX, setGapX, layout.sizes.horz_padding)
+OLVANE_FIELD(float, gapY, setGapY, layout.sizes.vert_padding)
+OLVANE_SWITCH(spouses, setSpouses, spouses)
+OLVANE_SWITCH(siblings, setSiblings, siblings)
+OLVANE_SWITCH(compact, setCompact, compact)
+OLVANE_SWITCH(mirrored, setMirrored, mirrored)
+OLVANE_FIELD(int, fanOf, setFanOf, fan_of)
+OLVANE_FIELD(double, fanAngle, setFanAngle, fan_angle)
+OLVANE_FIELD(int64_t, other, setOther, other)
+OLVANE_FIELD(int, ways, setWays, ways)
+OLVANE_FIELD(int, mostWays, setMostWays, most_ways)
+OLVANE_FIELD(int, language, setLanguage, language)
+OLVANE_FIELD(int, marks, setMarks, marks)
+OLVANE_FIELD(int, effort, setEffort, effort)
+OLVANE_SWITCH(allParts, setAllParts, all_parts)
+OLVANE_FIELD(int, generations, setGenerations, layout.generations)
+OLVANE_FIELD(int, flagDepth, setFlagDepth, layout.flag_depth)
+OLVANE_SWITCH(unknownParents, setUnknownParents, unknown_parents)
+OLVANE_SHOWN(auntsUncles, setAuntsUncles, OLVANE_SHOW_AUNTS_UNCLES)
+OLVANE_SHOWN(cousins, setCousins, OLVANE_SHOW_COUSINS)
+OLVANE_SHOWN(familySiblings, setFamilySiblings, OLVANE_SHOW_SIBLINGS)
+OLVANE_SHOWN(siblingSpouses, setSiblingSpouses, OLVANE_SHOW_SIBLING_SPOUSES)
+OLVANE_SHOWN(niecesNephews, setNiecesNephews, OLVANE_SHOW_NIECES_NEPHEWS)
+OLVANE_SHOWN(grandchildren, setGrandchildren, OLVANE_SHOW_GRANDCHILDREN)
+OLVANE_SHOWN(greatGrandparents, setGreatGrandparents, OLVANE_SHOW_GREAT_GRANDPARENTS)
+OLVANE_SHOWN(spousesOfChildren, setSpousesOfChildren, OLVANE_SHOW_SPOUSES_OF_CHILDREN)
+// clang-format on
 
 + (OlvanePictureOptions*)optionsForView:(int)view {
     OlvanePictureOptions* options = [[[self alloc] init] autorelease];
@@ -48,28 +88,20 @@
 
 - (id)init {
     self = [super init];
-    if (self) {
-        _folded = [[NSMutableData alloc] init];
-        _boxWidth = 55;
-        _boxHeight = 80;
-        _gapX = 25;
-        _gapY = 30;
-        _spouses = YES;
-        _fanAngle = 360;
-        _ways = 2;
-        _mostWays = 8;
-        _effort = 1;
-        _generations = 5;
-        _flagDepth = 4;
-        _unknownParents = YES;
-        _auntsUncles = _cousins = _familySiblings = _siblingSpouses = YES;
-        _niecesNephews = _grandchildren = _greatGrandparents = _spousesOfChildren = YES;
+    if (!self) return nil;
+    _folded = [[NSMutableData alloc] init];
+    _options = malloc(sizeof *_options);
+    if (!_options) {
+        [self release];
+        return nil;
     }
+    olvane_picture_options_default(OLVANE_PICTURE_FAMILY, _options);
     return self;
 }
 
 - (void)dealloc {
     [_folded release];
+    free(_options);
     [super dealloc];
 }
 
@@ -98,6 +130,12 @@
         [_folded replaceBytesInRange:NSMakeRange(i * sizeof fold, sizeof fold) withBytes:NULL length:0];
         return;
     }
+}
+
+- (const struct olvane_picture_options*)options {
+    _options->folds = (const olvane_fold*)[_folded bytes];
+    _options->fold_count = [self foldedCount];
+    return _options;
 }
 
 @end

@@ -39,18 +39,13 @@ typedef struct OlvaneFold {
     int branch;
 } OlvaneFold;
 
+struct olvane_picture_options;  // of the C interface, whose header is not needed
+
 // What to make a picture of. What a view has no use for is ignored, but must be in its range.
 //
 // Units: points; degrees. Generations count from the focus, and 0 is all of them.
 @interface OlvanePictureOptions : NSObject {
-    int _view, _up, _down, _direction, _fanOf, _ways, _mostWays, _language, _marks, _effort;
-    int _generations, _flagDepth;
-    int64_t _other;
-    double _fanAngle;
-    float _boxWidth, _boxHeight, _gapX, _gapY;
-    BOOL _spouses, _siblings, _compact, _mirrored, _allParts, _unknownParents;
-    BOOL _auntsUncles, _cousins, _familySiblings, _siblingSpouses, _niecesNephews, _grandchildren;
-    BOOL _greatGrandparents, _spousesOfChildren;
+    struct olvane_picture_options* _options;
     NSMutableData* _folded;
 }
 

@@ -1,0 +1,39 @@
+// SPDX-FileCopyrightText: The Olvane developers
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <vector>
+
+#include <olvane_picture.h>
+
+#include <olvane/boundary/TypedLayout.h>
+#include <olvane/charts/Views.h>
+
+namespace olvane::c {
+
+olvane_options defaultOptions();
+
+// The options of a host as the engine takes them.
+LayoutOptions layoutOptionsOf(const olvane_options& options);
+
+bool areInRange(const olvane_options& options);
+bool areInRange(const olvane_picture_options& options);
+
+// Whether a number is one of an enumeration that counts from 0.
+constexpr bool isOneOf(std::int32_t number, std::int32_t count) {
+    return number >= 0 && number < count;
+}
+
+// The request that the options of a picture ask for, but for focus, other and earlier picture, and the folds that it refers to.
+// A number of no enumeration stays one, so that whoever checks the request refuses it.
+struct AskedView {
+    explicit AskedView(const olvane_picture_options& options);
+    AskedView(const AskedView&) = delete;
+    AskedView& operator=(const AskedView&) = delete;
+
+    std::vector<charts::Fold> folds;
+    charts::ViewRequest request;
+};
+
+}  // namespace olvane::c
