@@ -3,7 +3,7 @@
 
 // Kinship in a real file, beside a plain second implementation. The file is history/royal92.ged below the folder that
 // OLVANE_GEDCOM_DIR names. With OLVANE_LONG_TESTS set, the coefficients of all pairs and the ways of 10,000 are
-// compared, which takes minutes; otherwise those of one person in 61, and of 100 pairs.
+// compared, which takes a minute; otherwise those of one person in 61, and of 100 pairs.
 
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/kin/Kinship.h>

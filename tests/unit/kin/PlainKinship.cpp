@@ -71,24 +71,18 @@ Kinship::Kinship(const KinGraph& graph)
             add(fresh(graph.partners(u)[0]), fresh(graph.partners(u)[1]), bondOf(kindIn(graph, u, person)));
         }
     }
+    children_.resize(parents_.size());
+    for (Place person = 0; person < graph.personCount(); ++person) {
+        for (const Parent& parent : parentsOf(person)) {
+            children_[static_cast<std::size_t>(parent.person)].push_back(
+                {person, parent.bond, parent.family});
+        }
+    }
     for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
         const auto [one, other] = graph.partners(u);
         if (one == kNobody || other == kNobody || one == other) continue;
         partners_[static_cast<std::size_t>(one)].insert(other);
         partners_[static_cast<std::size_t>(other)].insert(one);
-    }
-}
-
-void Kinship::addChains(Chain& chain, bool byBlood, std::vector<Chain>& chains) const {
-    chains.push_back(chain);
-    for (const Parent& parent : parentsOf(chain.back().person)) {
-        if (byBlood && parent.bond != Bond::blood) continue;
-        const bool isOn = std::any_of(chain.begin(), chain.end(),
-                                      [&parent](const Parent& each) { return each.person == parent.person; });
-        if (isOn) continue;
-        chain.push_back(parent);
-        addChains(chain, byBlood, chains);
-        chain.pop_back();
     }
 }
 
@@ -104,62 +98,98 @@ bool Kinship::isListedFirst(Place one, Place other) const {
     return rank(one) < rank(other);
 }
 
-std::vector<KinWay> Kinship::ways(Place a, Place b, bool byBlood) const {
-    std::vector<Chain> fromA;
-    std::vector<Chain> fromB;
-    Chain chain{{a, Bond::blood, -1}};
-    addChains(chain, byBlood, fromA);
-    chain = {{b, Bond::blood, -1}};
-    addChains(chain, byBlood, fromB);
-    std::map<Place, std::vector<const Chain*>> byTop;
-    for (const Chain& each : fromB) byTop[each.back().person].push_back(&each);
-    std::vector<KinWay> ways;
-    std::vector<bool> isOnUp(parents_.size(), false);
-    const auto mark = [&isOnUp](const Chain& up, bool value) {
-        for (const Parent& each : up) isOnUp[static_cast<std::size_t>(each.person)] = value;
-    };
-    for (const Chain& up : fromA) {
-        if (a == b) break;
-        mark(up, true);
-        for (const Chain* down : byTop[up.back().person]) {
-            const bool meetsBelow = std::any_of(
-                down->rbegin() + 1, down->rend(),
-                [&isOnUp](const Parent& each) { return isOnUp[static_cast<std::size_t>(each.person)]; });
-            if (meetsBelow) continue;
-            std::set<Place> seen;
-            for (const Parent& each : up) seen.insert(each.person);
-            for (const Parent& each : *down) seen.insert(each.person);
-            KinWay way;
-            way.up = static_cast<int>(up.size()) - 1;
-            way.down = static_cast<int>(down->size()) - 1;
-            for (const Parent& each : up) way.bond = std::max(way.bond, each.bond);
-            for (const Parent& each : *down) way.bond = std::max(way.bond, each.bond);
-            if (!byBlood && way.bond == Bond::blood) continue;
-            for (const Parent& each : up) way.persons.push_back(each.person);
-            for (auto each = down->rbegin() + 1; each != down->rend(); ++each)
-                way.persons.push_back(each->person);
-            way.ancestors = {up.back().person};
-            bool isSecond = false;
-            if (way.up > 0 && way.down > 0 && up.back().family >= 0 &&
-                up.back().family == down->back().family) {
-                Place partner = kNobody;
-                for (const Parent& each : parentsOf(up[up.size() - 2].person)) {
-                    if (each.family == up.back().family && each.person != up.back().person)
-                        partner = each.person;
-                }
-                isSecond = isListedFirst(partner, up.back().person) && seen.count(partner) == 0;
-                if (seen.count(partner) == 0) way.ancestors.push_back(partner);
-            }
-            if (!isSecond) ways.push_back(way);
-        }
-        mark(up, false);
+// One way, if it is no second reading of another: of a couple at the top, the partner who is listed first has it.
+void Kinship::addWay(const Chain& up, const Chain& down, bool byBlood, std::vector<KinWay>& ways) const {
+    KinWay way;
+    way.up = static_cast<int>(up.size()) - 1;
+    way.down = static_cast<int>(down.size()) - 1;
+    for (const Chain* chain : {&up, &down}) {
+        for (const Parent& each : *chain) way.bond = std::max(way.bond, each.bond);
     }
+    if (!byBlood && way.bond == Bond::blood) return;
+    for (const Parent& each : up) way.persons.push_back(each.person);
+    for (auto each = down.begin() + 1; each < down.end(); ++each) way.persons.push_back(each->person);
+    way.ancestors = {up.back().person};
+    const int family = up.back().family;
+    if (way.up > 0 && way.down > 0 && family >= 0 && family == down.front().family) {
+        Place partner = kNobody;
+        for (const Parent& each : parentsOf(up[up.size() - 2].person)) {
+            if (each.family == family && each.person != up.back().person) partner = each.person;
+        }
+        if (std::count(way.persons.begin(), way.persons.end(), partner) == 0) {
+            if (isListedFirst(partner, up.back().person)) return;
+            way.ancestors.push_back(partner);
+        }
+    }
+    ways.push_back(std::move(way));
+}
+
+// Every chain from its last person down to b in which nobody occurs who is met already.
+void Kinship::addWaysDown(Chain& down, const Chain& up, Place b, bool byBlood, Persons& met,
+                          const Persons& leadsToB, std::vector<KinWay>& ways) const {
+    const Place last = down.back().person;
+    if (last == b) return addWay(up, down, byBlood, ways);
+    for (const Child& child : children_[static_cast<std::size_t>(last)]) {
+        const auto place = static_cast<std::size_t>(child.person);
+        if (met[place] || !leadsToB[place] || (byBlood && child.bond != Bond::blood)) continue;
+        met[place] = true;
+        // How the parent was reached is written at the parent, as in a chain that runs up.
+        const Parent before = down.back();
+        down.back() = {last, child.bond, child.family};
+        down.push_back({child.person, Bond::blood, -1});
+        addWaysDown(down, up, b, byBlood, met, leadsToB, ways);
+        down.pop_back();
+        down.back() = before;
+        met[place] = false;
+    }
+}
+
+Kinship::Persons Kinship::withAncestors(Place person, bool byBlood) const {
+    Persons found(parents_.size(), false);
+    std::vector<Place> open{person};
+    while (!open.empty()) {
+        const Place next = open.back();
+        open.pop_back();
+        if (found[static_cast<std::size_t>(next)]) continue;
+        found[static_cast<std::size_t>(next)] = true;
+        for (const Parent& parent : parentsOf(next)) {
+            if (!byBlood || parent.bond == Bond::blood) open.push_back(parent.person);
+        }
+    }
+    return found;
+}
+
+// From the last person of a chain that runs up, all ways down, and then those over each parent who is not met yet.
+void Kinship::addWaysUp(Chain& up, Place b, bool byBlood, Persons& met, const Persons& leadsToB,
+                        std::vector<KinWay>& ways) const {
+    const Place last = up.back().person;
+    met[static_cast<std::size_t>(last)] = true;
+    if (leadsToB[static_cast<std::size_t>(last)]) {
+        Chain down{{last, Bond::blood, -1}};
+        addWaysDown(down, up, b, byBlood, met, leadsToB, ways);
+    }
+    for (const Parent& parent : parentsOf(last)) {
+        if (met[static_cast<std::size_t>(parent.person)] || (byBlood && parent.bond != Bond::blood)) continue;
+        up.push_back(parent);
+        addWaysUp(up, b, byBlood, met, leadsToB, ways);
+        up.pop_back();
+    }
+    met[static_cast<std::size_t>(last)] = false;
+}
+
+std::vector<KinWay> Kinship::ways(Place a, Place b, bool byBlood) const {
+    std::vector<KinWay> ways;
+    if (a == b) return ways;
+    Persons met(parents_.size(), false);
+    Chain up{{a, Bond::blood, -1}};
+    addWaysUp(up, b, byBlood, met, withAncestors(b, byBlood), ways);
     std::sort(ways.begin(), ways.end(), [this](const KinWay& one, const KinWay& other) {
         if (one.length() != other.length()) return one.length() < other.length();
-        std::vector<std::int64_t> ids[2];
-        for (const Place person : one.persons) ids[0].push_back(graph_.id(person));
-        for (const Place person : other.persons) ids[1].push_back(graph_.id(person));
-        return ids[0] != ids[1] ? ids[0] < ids[1] : one.up < other.up;
+        for (std::size_t i = 0; i < one.persons.size(); ++i) {
+            if (one.persons[i] != other.persons[i])
+                return graph_.id(one.persons[i]) < graph_.id(other.persons[i]);
+        }
+        return one.up < other.up;
     });
     return ways;
 }

@@ -10,7 +10,8 @@
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Kinship.h>
 
-// A second kinship, slow and plain: every chain of parents is written down, every pair of chains is tried.
+// A second kinship, slow and plain: every chain of parents is written down, and from its top every chain of children that
+// ends at the other person.
 namespace plain {
 
 using olvane::kin::Bond;
@@ -24,6 +25,9 @@ struct Parent {
     // Parents of one family share a number, by which they are a couple.
     int family;
 };
+
+// The same link, seen from the parent.
+typedef Parent Child;
 
 class Kinship {
 public:
@@ -49,13 +53,21 @@ private:
     using Chain =
         std::vector<Parent>;  // from a person to an ancestor, with the bond by which each was reached
 
-    void addChains(Chain& chain, bool byBlood, std::vector<Chain>& chains) const;
+    using Persons = std::vector<bool>;  // by place
+
+    void addWay(const Chain& up, const Chain& down, bool byBlood, std::vector<KinWay>& ways) const;
+    void addWaysDown(Chain& down, const Chain& up, Place b, bool byBlood, Persons& met,
+                     const Persons& leadsToB, std::vector<KinWay>& ways) const;
+    Persons withAncestors(Place person, bool byBlood) const;
+    void addWaysUp(Chain& up, Place b, bool byBlood, Persons& met, const Persons& leadsToB,
+                   std::vector<KinWay>& ways) const;
     bool isListedFirst(Place one, Place other) const;
     bool linked(Place one, Place other) const;
     bool isMore(const std::vector<Place>& path) const;
 
     const KinGraph& graph_;
     std::vector<std::vector<Parent>> parents_;
+    std::vector<std::vector<Child>> children_;
     std::vector<bool> oneParentTwice_;  // one person in both slots gives both genes
     std::vector<std::set<Place>> partners_;
 };
