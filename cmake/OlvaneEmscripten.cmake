@@ -24,6 +24,11 @@ function(olvane_build_small)
   foreach(target IN LISTS OLVANE_SMALL_TARGETS)
     target_compile_options(${target} PRIVATE -Oz -finline-functions)
   endforeach()
+  # Of the families, what answers the engine's questions: a tenth of a layout's time.
+  foreach(source IN ITEMS Family FamilyDataSource FamilyStorage)
+    set_source_files_properties(${PROJECT_SOURCE_DIR}/family/olvane/kin/${source}.cpp
+      TARGET_DIRECTORY olvane_family PROPERTIES COMPILE_OPTIONS "-O2")
+  endforeach()
   # Of the pictures, what only a picture with years of marriages runs through.
   set_source_files_properties(${PROJECT_SOURCE_DIR}/picture/olvane/picture/MarriageLabels.cpp
     TARGET_DIRECTORY olvane_picture PROPERTIES COMPILE_OPTIONS "-Oz;-finline-functions")
