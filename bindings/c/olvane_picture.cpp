@@ -23,6 +23,7 @@
 
 #include <olvane/charts/Views.h>
 #include <olvane/picture/HiddenPersons.h>
+#include <olvane/picture/Judge.h>
 #include <olvane/picture/LayoutPicture.h>
 #include <olvane/picture/PictureJson.h>
 #include <olvane/source/GedcomDataSource.h>
@@ -211,6 +212,35 @@ void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_pict
     for (olvane_picture_box& box : to.boxes) box.living = picture::isHidden(hidden, box.id) ? 1 : 0;
 }
 
+olvane_judgement judgementOf(const picture::Judgement& found) {
+    const auto number = [](std::size_t count) { return static_cast<std::int64_t>(count); };
+    return {sizeof(olvane_judgement),
+            number(found.boxes),
+            number(found.persons),
+            number(found.families),
+            number(found.overlaps),
+            number(found.hits),
+            number(found.crossings),
+            number(found.tracks),
+            number(found.touches),
+            number(found.unjoined),
+            found.untold ? number(*found.untold) : -1,
+            number(found.couples),
+            number(found.sideBySide),
+            number(found.repeats),
+            number(found.unmarked),
+            number(found.slanted),
+            number(found.samePersonMarks),
+            number(found.parentsElsewhereMarks),
+            number(found.partnersElsewhereMarks),
+            found.width,
+            found.height,
+            found.areaPerPerson,
+            found.aspect,
+            found.medianLineLength,
+            found.longLineLength};
+}
+
 }  // namespace
 
 olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focus,
@@ -339,5 +369,20 @@ olvane_status olvane_picture_json(const olvane_picture* picture, const char** te
     }
     *text = picture->json.c_str();
     if (length) *length = picture->json.size();
+    return OLVANE_OK;
+}
+
+olvane_status olvane_picture_judge(const olvane_picture* picture, const olvane_family* family,
+                                   olvane_judgement* judgement) {
+    if (!picture || !judgement || judgement->struct_size != sizeof(olvane_judgement)) {
+        return OLVANE_INVALID_ARGUMENT;
+    }
+    try {
+        olvane::kin::KinGraph known;
+        if (family) known = olvane::kinGraphOf(family->table);
+        *judgement = judgementOf(picture::judge(picture->source, family ? &known : nullptr));
+    } catch (...) {
+        return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
+    }
     return OLVANE_OK;
 }

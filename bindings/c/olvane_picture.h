@@ -272,6 +272,43 @@ OLVANE_C_API olvane_status olvane_picture_read(const olvane_picture* picture, ol
 OLVANE_C_API olvane_status olvane_picture_json(const olvane_picture* picture, const char** text,
                                                size_t* length);
 
+/* What is counted in a picture, and what it measures; docs/judge.md defines each count. Widths and heights are in points, areas
+   in boxes of mean size for each person, line lengths in mean box widths. */
+typedef struct olvane_judgement {
+    size_t struct_size; /* sizeof(olvane_judgement), set by the caller */
+    int64_t boxes;
+    int64_t persons; /* with one box or more */
+    int64_t families;
+    int64_t overlaps;  /* pairs of boxes */
+    int64_t hits;      /* pairs of a family and somebody else's box that a line runs through */
+    int64_t crossings; /* pairs of families, and so are tracks and touches */
+    int64_t tracks;
+    int64_t touches;
+    int64_t unjoined; /* members whom their family's lines do not reach */
+    int64_t untold;   /* known relations that nothing expresses; -1 where no family was given */
+    int64_t couples;
+    int64_t side_by_side;
+    int64_t repeats;  /* persons with more than one box */
+    int64_t unmarked; /* those of them of whom a box has no mark */
+    int64_t slanted;
+    int64_t same_person_marks;
+    int64_t parents_elsewhere_marks;
+    int64_t partners_elsewhere_marks;
+    double width;
+    double height;
+    double area_per_person;
+    double aspect; /* width to height; 0 for a picture without height */
+    double median_line_length;
+    double long_line_length; /* the 95th percentile */
+} olvane_judgement;
+
+/*
+ * Counts everything that can be counted in one picture. family says who is related to whom, by the same ids, for untold; it
+ * may be null. OLVANE_INVALID_ARGUMENT for a struct_size of no version.
+ */
+OLVANE_C_API olvane_status olvane_picture_judge(const olvane_picture* picture, const olvane_family* family,
+                                                olvane_judgement* judgement);
+
 #ifdef __cplusplus
 }
 #endif

@@ -31,6 +31,7 @@ from olvane._errors import HostError, LayoutError, Status
 from olvane._family import ChildKind, Family, FamilyError, FamilyRow, FamilyState, NameKind, Person
 from olvane._file import DrawView, File, FileError, Remark, draw
 from olvane._host import Host
+from olvane._judge import Judgement, judge
 from olvane._kinship import Kinship, KinWay, MarriageWay, kin
 from olvane._layout import MOST_RELATIVES, family_layout, layout, layout_text, version
 from olvane._options import Options, Shown, Sizes, View
@@ -62,6 +63,7 @@ __all__ = [
     "FoldedBranch",
     "Host",
     "HostError",
+    "Judgement",
     "Kinship",
     "KinWay",
     "Layout",
@@ -92,6 +94,7 @@ __all__ = [
     "WayKind",
     "draw",
     "family_layout",
+    "judge",
     "kin",
     "layout",
     "layout_text",

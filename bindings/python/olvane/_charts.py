@@ -168,7 +168,7 @@ def _read(make: Callable[[Any], int], focus: int, view: DrawView) -> Picture:
     if status != Status.OK:
         reason = _native_picture.failure_of(made) or _message(status)
         raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
-    return _native_picture.picture_of(made, view, kept if view == "everybody" else None)
+    return _native_picture.picture_of(made, view, kept)
 
 
 def _view_name(view: View | DrawView) -> DrawView:

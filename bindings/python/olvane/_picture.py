@@ -170,7 +170,7 @@ class Picture:
     rings: tuple[float, ...] = ()
     middle: tuple[float, float] | None = None
     folded: tuple[FoldedBranch, ...] = ()
-    # Of everybody: what the library keeps of it, for a later picture's places.
+    # What the library keeps of it, for a later picture's places and for olvane.judge.
     _kept: object = field(default=None, repr=False, compare=False)
 
     def svg(self, label: Callable[[int], str] = str) -> Svg:

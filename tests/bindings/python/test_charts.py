@@ -260,6 +260,48 @@ class Views(unittest.TestCase):
             self.assertIn("6", shown, view)
 
 
+class Judgements(unittest.TestCase):
+    def test_areThoseOfTheCommand(self) -> None:
+        file = olvane.File(SAMPLE)
+        for view in VIEWS:
+            with self.subTest(view=view):
+                picture = olvane.picture(file, 40, view, to=52)
+                found = olvane.judge(picture, file)
+                to = ["--to=52"] if view == "kinship" else []
+                drawn = subprocess.run(
+                    [COMMAND, "layout", str(SAMPLE), "--focus=40", "--format=json", f"--view={view}", *to],
+                    check=True,
+                    capture_output=True,
+                ).stdout
+                arguments = [COMMAND, "judge", "-", "--format=json", f"--family={SAMPLE}"]
+                judged = json.loads(subprocess.run(arguments, input=drawn, capture_output=True).stdout)["pictures"][0]
+                self.assertEqual(judged["trouble"], found.trouble)
+                counted = {camel_case(name): getattr(found, name) for name in found.__slots__}
+                if picture.middle is not None:  # what is printed of a cell is its ring, not the box around it
+                    for measure in ("width", "height", "areaPerPerson", "aspect"):
+                        counted[measure] = judged["counts"][measure]
+                self.assertEqual([], differences(judged["counts"], counted))
+
+    def test_knowWhatAPictureDoesNotExpressWhereAFamilySaysSo(self) -> None:
+        parents = [{"id": 1, "father": 2, "mother": 3}, {"id": 2}, {"id": 3}]
+        picture = olvane.picture(olvane.Family(parents), 1, "ancestors")
+        self.assertIsNone(olvane.judge(picture).untold)
+        self.assertEqual(0, olvane.judge(picture, olvane.Family(parents)).untold)
+        more = [{"id": 1, "father": 2, "mother": 3}, {"id": 2, "father": 3}, {"id": 3}]
+        self.assertEqual(1, olvane.judge(picture, olvane.Family(more)).untold)
+        self.assertTrue(olvane.judge(picture, olvane.Family(more)).trouble)
+
+    def test_ofACopyAreRefused(self) -> None:
+        picture = olvane.picture(AWKWARD, 6, "near")
+        with self.assertRaisesRegex(ValueError, "not a copy of it"):
+            olvane.judge(copy.deepcopy(picture))
+
+
+def camel_case(name: str) -> str:
+    first, *others = name.split("_")
+    return first + "".join(other.capitalize() for other in others)
+
+
 class Drawings(unittest.TestCase):
     def test_areThoseOfTheCommand(self) -> None:
         for view in VIEWS:

@@ -14,6 +14,7 @@
 #include <olvane_picture.h>
 
 #include <olvane/charts/Views.h>
+#include <olvane/picture/Judge.h>
 #include <olvane/picture/PictureJson.h>
 #include <support/FamilyText.h>
 #include <unit/bindings-c/CallbackHost.h>
@@ -76,6 +77,73 @@ TEST(CViews, ofATableAreThoseOfTheLibrary) {
                   olvane::picture::pictureJson(olvane::charts::pictureOf(family->table, 7, request, 5)))
             << view;
     }
+}
+
+olvane_judgement judgementOf(const PicturePointer& picture, const olvane_family* known) {
+    olvane_judgement judgement = {};
+    judgement.struct_size = sizeof judgement;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_judge(picture.get(), known, &judgement));
+    return judgement;
+}
+
+// Six persons in two families of two couples, and nothing wrong with the picture until more is known than it shows.
+TEST(CViews, areJudged) {
+    const auto family = table();
+    const olvane_picture_options options = optionsFor(OLVANE_PICTURE_RELATIVES);
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer picture(made);
+    const olvane_judgement alone = judgementOf(picture, nullptr);
+    EXPECT_EQ(6, alone.boxes);
+    EXPECT_EQ(6, alone.persons);
+    EXPECT_EQ(2, alone.families);
+    EXPECT_EQ(2, alone.couples);
+    EXPECT_EQ(2, alone.side_by_side);
+    EXPECT_EQ(0, alone.overlaps + alone.hits + alone.crossings + alone.tracks + alone.touches +
+                     alone.unjoined + alone.repeats + alone.slanted);
+    EXPECT_EQ(-1, alone.untold);
+    EXPECT_EQ(0, judgementOf(picture, family.get()).untold);
+    const std::int64_t four[] = {4};
+    const std::int64_t five[] = {5};
+    family->table.setSpouses(5, four, 4);
+    family->table.setSpouses(4, five, 5);
+    EXPECT_EQ(1, judgementOf(picture, family.get()).untold)
+        << "5 and 4 are partners in no family of the picture";
+}
+
+TEST(CViews, haveTheMeasuresThatTheLibraryHas) {
+    const auto family = table();
+    for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
+        olvane_picture_options options = optionsFor(view);
+        options.other = 5;
+        olvane_picture* made = nullptr;
+        ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made)) << view;
+        const PicturePointer picture(made);
+        olvane::charts::ViewRequest request;
+        request.chart.view = static_cast<olvane::charts::View>(view);
+        const auto expected = olvane::picture::judge(olvane::charts::pictureOf(family->table, 7, request, 5));
+        const olvane_judgement judgement = judgementOf(picture, nullptr);
+        EXPECT_EQ(static_cast<std::int64_t>(expected.boxes), judgement.boxes) << view;
+        EXPECT_EQ(static_cast<std::int64_t>(expected.sideBySide), judgement.side_by_side) << view;
+        EXPECT_EQ(static_cast<std::int64_t>(expected.partnersElsewhereMarks),
+                  judgement.partners_elsewhere_marks)
+            << view;
+        EXPECT_EQ(expected.width, judgement.width) << view;
+        EXPECT_EQ(expected.aspect, judgement.aspect) << view;
+        EXPECT_EQ(expected.longLineLength, judgement.long_line_length) << view;
+    }
+}
+
+TEST(CViews, refuseToBeJudgedIntoAStructOfAnotherVersion) {
+    const auto family = table();
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, nullptr, &made));
+    const PicturePointer picture(made);
+    olvane_judgement judgement = {};
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_judge(picture.get(), nullptr, &judgement));
+    judgement.struct_size = sizeof judgement;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_judge(nullptr, nullptr, &judgement));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_judge(picture.get(), nullptr, nullptr));
 }
 
 TEST(CViews, ofEverybodyKeepsThePlacesOfAnEarlierOne) {
