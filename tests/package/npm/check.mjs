@@ -6,14 +6,14 @@
 //
 //     node check.mjs --packages DIR [--quick] [--work DIR]
 //
-// DIR holds olvane-VERSION.tgz and olvane-tree-VERSION.tgz. --quick takes Node and one bundler alone.
+// DIR holds olvane-VERSION.tgz and olvane-tree-VERSION.tgz. --quick takes the system's Node and one bundler alone.
 
 import assert from "node:assert/strict";
 import { execFileSync, spawn } from "node:child_process";
 import { cpSync, existsSync, mkdirSync, mkdtempSync, readdirSync, readFileSync, rmSync, writeFileSync } from "node:fs";
 import { createServer } from "node:http";
 import { createRequire } from "node:module";
-import { tmpdir } from "node:os";
+import { arch, platform, tmpdir } from "node:os";
 import { extname, join, resolve } from "node:path";
 import { parseArgs } from "node:util";
 
@@ -26,6 +26,8 @@ const archives = readdirSync(values.packages)
     .filter((name) => name.endsWith(".tgz"))
     .map((name) => resolve(values.packages, name));
 
+// Programs of Node that npm itself has, beside the one that runs this.
+const kNodes = values.quick ? [] : [18, 20];
 const kTools = values.quick
     ? ["esbuild@0.28", "playwright-core@1.58"]
     : [
@@ -38,6 +40,7 @@ const kTools = values.quick
           "webpack-cli@6",
           "rollup@4",
           "@rollup/plugin-node-resolve@16",
+          ...kNodes.map((version) => `node${version}@npm:node-${platform()}-${arch()}@${version}`),
           "publint@0.3",
           "@arethetypeswrong/cli@0.18",
       ];
@@ -104,25 +107,31 @@ async function titleOf(url) {
     }
 }
 
+// The packages in one program of Node, which is of that version where one is stated.
+function nodeRoads(name, node, version) {
+    const prints = (file, program) => {
+        write(file, program);
+        if (version) assert.match(run(node, ["--version"]), new RegExp(`^v${version}\\.`));
+        return run(node, [file]).trim();
+    };
+    const required = (from) =>
+        `const { loadOlvane } = require("${from}");\n(async () => { ${kUse} console.log(boxes); })();`;
+    return {
+        [`${name}, import`]: () =>
+            prints("node.mjs", `import { loadOlvane } from "olvane";\n${kUse}\nconsole.log(boxes);`),
+        [`${name}, import of the inline one`]: () =>
+            prints("inline.mjs", `import { loadOlvane } from "olvane/inline";\n${kUse}\nconsole.log(boxes);`),
+        [`${name}, require`]: () => prints("node.cjs", required("olvane")),
+        [`${name}, require of the inline one`]: () => prints("inline.cjs", required("olvane/inline")),
+    };
+}
+
 const kRoads = {
-    "node, import"() {
-        write("node.mjs", `import { loadOlvane } from "olvane";\n${kUse}\nconsole.log(boxes);`);
-        return run("node", ["node.mjs"]).trim();
-    },
-    "node, require"() {
-        write(
-            "node.cjs",
-            `const { loadOlvane } = require("olvane");\n(async () => { ${kUse} console.log(boxes); })();`,
-        );
-        return run("node", ["node.cjs"]).trim();
-    },
-    "node, require of the inline one"() {
-        write(
-            "inline.cjs",
-            `const { loadOlvane } = require("olvane/inline");\n(async () => { ${kUse} console.log(boxes); })();`,
-        );
-        return run("node", ["inline.cjs"]).trim();
-    },
+    ...nodeRoads("node", "node"),
+    ...Object.assign(
+        {},
+        ...kNodes.map((version) => nodeRoads(`node ${version}`, bin(`../node${version}/bin/node`), version)),
+    ),
     async esbuild() {
         write("esbuild/main.js", kMain("olvane/inline"));
         run(bin("esbuild"), [
@@ -232,11 +241,14 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
                       "--stats",
                       "errors-warnings",
                   ]);
-                  assert.doesNotMatch(
-                      said
-                          .replace(/WARNING in (asset|entrypoint) size limit[\s\S]*/g, "")
-                          .replace(/WARNING in webpack performance[\s\S]*/g, ""),
-                      /WARNING/,
+                  // The size of the module is what it is; webpack has a hint for all that is larger than 244 KiB.
+                  const warnings = said.match(/WARNING in .*/g) ?? [];
+                  assert.deepEqual(
+                      warnings.filter(
+                          (warning) =>
+                              !/WARNING in (asset size limit|entrypoint size limit|webpack performance)/.test(warning),
+                      ),
+                      [],
                   );
                   write("webpack/index.html", kPage('<script src="out/main.js"></script>'));
                   return titleOf(`${address}/webpack/index.html`);
