@@ -210,6 +210,31 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
         }
         return "3";
     },
+    async "a page of a spreadsheet, in twenty lines"() {
+        const example = (name) =>
+            readFileSync(new URL(`../../../examples/javascript/${name}`, import.meta.url), "utf8");
+        const files = { html: example("csv_tree.html"), mjs: example("csv_tree.mjs") };
+        const lines = Object.values(files).join("\n").split("\n");
+        const written = lines.filter((line) => line.trim() && !/^(\/\/|<!--)/.test(line.trim()));
+        assert.ok(written.length <= 20, `${written.length} lines`);
+        for (const [ending, text] of Object.entries(files)) write(`strict/csv_tree.${ending}`, text);
+        write("strict/persons.csv", example("persons.csv"));
+        write("strict/olvane-tree.mjs", readFileSync(join(work, "node_modules/olvane-tree/olvane-tree.mjs"), "utf8"));
+        const page = await browser.newPage();
+        try {
+            await page.goto(`${address}/strict/csv_tree.html`);
+            await page.waitForFunction(() => document.querySelector("olvane-tree").state?.focus, undefined, {
+                timeout: 20_000,
+            });
+            const svg = await page.evaluate(() => document.querySelector("olvane-tree").saveSvg());
+            for (const name of ["Henry", "Anne", "Elizabeth", "Edmund", "Margaret", "Robin"])
+                assert.ok(svg.includes(name), `${name} is not drawn`);
+            assert.ok(svg.includes("1850"), "the years are not drawn");
+        } finally {
+            await page.close();
+        }
+        return "3";
+    },
     ...(values.quick
         ? {}
         : {
