@@ -14,9 +14,8 @@ namespace bench {
 inline void keepFreedMemory() {
 #if defined(__GLIBC__)
     constexpr int kMoreThanAnyLayout = 1 << 30;  // bytes
-    constexpr int kMostThatGlibcTakes = 32 << 20;
     mallopt(M_TRIM_THRESHOLD, kMoreThanAnyLayout);
-    mallopt(M_MMAP_THRESHOLD, kMostThatGlibcTakes);
+    mallopt(M_MMAP_MAX, 0);  // a threshold would not do: glibc takes none above 32 MB
 #endif
 }
 
