@@ -16,6 +16,7 @@
 #include <olvane/boundary/TypedLayout.h>
 
 #include <LayoutInternal.h>
+#include <ViewOptions.h>
 
 #include "HostImports.h"
 
