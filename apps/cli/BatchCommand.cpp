@@ -251,7 +251,7 @@ int runBatch(const BatchOptions& options) {
         progress.show(barOf(done, focuses.total()));
     }
     if (interrupted != 0) return kInterrupted;
-    return unknown == 0 ? 0 : 1;
+    return unknown == 0 ? statusOfReading(data) : 1;
 }
 
 }  // namespace olvane::cli

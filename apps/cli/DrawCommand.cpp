@@ -211,7 +211,7 @@ int runDraw(const DrawOptions& options) {
     } else {
         writeSheets(options, form, drawn.sheets, rules);
     }
-    return 0;
+    return statusOfReading(data);
 }
 
 }  // namespace olvane::cli

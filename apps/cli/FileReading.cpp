@@ -1,10 +1,12 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Reading with a person in front: what is wrong in a file goes to stderr, and the rest is used.
+// Reading with a person in front: what is wrong in a file goes to stderr, and the rest is used. A text whose encoding is in
+// doubt ends the command with a status of its own, since a program that calls it reads no messages.
 
 #include <cli/FileReading.h>
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <filesystem>
@@ -75,9 +77,29 @@ gedcom::GedcomData read(const InputOptions& input, gedcom::ReadOptions options =
     }
 }
 
+// The encoding of the file is in doubt: the one that its header names cannot be right, or is not known.
+bool isAboutEncoding(const gedcom::Diagnostic& diagnostic) {
+    return diagnostic.severity == gedcom::Severity::error &&
+           (diagnostic.kind == gedcom::DiagnosticKind::encodingMismatch ||
+            diagnostic.kind == gedcom::DiagnosticKind::encodingUnknown);
+}
+
+// What to type, below the diagnostic, which says the same in the words of every program.
+void suggestEncoding(const gedcom::GedcomData& data) {
+    for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) {
+        if (!isAboutEncoding(diagnostic)) continue;
+        std::string name = "NAME";
+        for (const gedcom::DiagnosticPhrase& phrase : diagnostic.done) {
+            if (phrase.sentence == gedcom::DiagnosticSentence::looksLike) name = phrase.arguments.front();
+        }
+        printMessage(data.file() + ": try --encoding " + name);
+    }
+}
+
 gedcom::GedcomData readAndReport(const InputOptions& input, const gedcom::ReadOptions& options = {}) {
     gedcom::GedcomData data = read(input, options);
     report(data);
+    suggestEncoding(data);
     return data;
 }
 
@@ -93,6 +115,11 @@ gedcom::GedcomData readFileWithFacts(const InputOptions& input) {
 
 gedcom::GedcomData readFileWithDetails(const InputOptions& input) {
     return readAndReport(input, {.details = true});
+}
+
+int statusOfReading(const gedcom::GedcomData& data) {
+    const auto& diagnostics = data.diagnostics();
+    return std::any_of(diagnostics.begin(), diagnostics.end(), isAboutEncoding) ? 1 : 0;
 }
 
 gedcom::GedcomData readFileQuietly(const InputOptions& input) {

@@ -26,6 +26,10 @@ gedcom::GedcomData readFileWithFacts(const InputOptions& input);
 // As readFileWithFacts, and keeps notes, sources, media and the other details too.
 gedcom::GedcomData readFileWithDetails(const InputOptions& input);
 
+// The exit status of a command that has done its work with the data, unless it has one of its own: 1 where the file names an
+// encoding that is not known or does not explain the text, so that letters may be wrong; else 0.
+int statusOfReading(const gedcom::GedcomData& data);
+
 // As readFile, with the diagnostics in the data and none on stderr: ten thousand of a kind, then their number.
 gedcom::GedcomData readFileQuietly(const InputOptions& input);
 

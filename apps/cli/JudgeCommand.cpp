@@ -37,18 +37,22 @@ std::string textOf(const std::vector<JudgedPicture>& pictures, ListFormat format
 
 int runJudge(const JudgeOptions& options) {
     std::optional<kin::KinGraph> known;
-    if (!options.family.file.empty()) known = gedcom::kinGraphOf(readFile(options.family));
+    int status = 0;
+    if (!options.family.file.empty()) {
+        const gedcom::GedcomData data = readFile(options.family);
+        known = gedcom::kinGraphOf(data);
+        status = statusOfReading(data);
+    }
     std::vector<JudgedPicture> pictures;
-    bool anyTrouble = false;
     for (const std::string& file : options.files) {
         const picture::Picture picture = readPicture(file);
         JudgedPicture judged{inputName(file), picture.view, {}, {}};
         judged.counts = picture::judge(picture, known ? &*known : nullptr, &judged.findings);
-        anyTrouble = anyTrouble || hasTrouble(judged.counts);
+        if (hasTrouble(judged.counts)) status = 1;
         pictures.push_back(std::move(judged));
     }
     writeReport(textOf(pictures, options.format));
-    return anyTrouble ? 1 : 0;
+    return status;
 }
 
 }  // namespace olvane::cli

@@ -87,7 +87,7 @@ int runKin(const KinOptions& options) {
     } else {
         writeReport(KinshipReport(data, graph, languageFor(options.language)).text(kinship));
     }
-    return kinship.isRelated() ? 0 : 1;
+    return kinship.isRelated() ? statusOfReading(data) : 1;
 }
 
 }  // namespace olvane::cli

@@ -44,7 +44,7 @@ int runLayout(const LayoutOptions& options) {
     } else {
         writeReport([&](const picture::TextSink& write) { writeLayout(data, focus, options, write); });
     }
-    return 0;
+    return statusOfReading(data);
 }
 
 }  // namespace olvane::cli

@@ -124,8 +124,10 @@ std::vector<PagePhoto> photosOf(const std::string& text, const gedcom::GedcomDat
     return std::move(photos.photos);
 }
 
-PageFamily familyOf(const PageOptions& options) {
+// status becomes that of the reading.
+PageFamily familyOf(const PageOptions& options, int& status) {
     const gedcom::GedcomData data = readFileWithDetails(options.input);
+    status = statusOfReading(data);
     gedcom::WriteOptions hiding;
     hiding.hidden = hiddenPersons(data, options.hiding);
     hiding.notes = hiding.sources = options.notes;
@@ -162,15 +164,16 @@ int runPage(const PageOptions& options) {
     }
     const OutputRules rules{InputFiles({options.input.file}), {".html", ".htm"}};
     checkOutput(options.output, rules);
+    int status = 0;
     if (options.input.file.empty()) {
         writeOutput(options.output, pageTemplate(), rules);
     } else {
-        const std::string page = pageWith(pageTemplate(), familyOf(options));
+        const std::string page = pageWith(pageTemplate(), familyOf(options, status));
         if (page.size() > kLargePage)
             printMessage(options.output + ": the page has " + std::to_string(page.size() >> 20) + " MiB");
         writeOutput(options.output, page, rules);
     }
-    return 0;
+    return status;
 }
 
 }  // namespace olvane::cli

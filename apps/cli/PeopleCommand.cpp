@@ -43,7 +43,7 @@ int runPeople(const PeopleOptions& options) {
     const gedcom::GedcomData data = needsFacts ? readFileWithFacts(options.input) : readFile(options.input);
     const auto persons = words.empty() ? everybody(data) : gedcom::PersonFinder(data).find(words);
     writeReport([&](const picture::TextSink& write) { writePeople(data, persons, options.format, write); });
-    if (!persons.empty()) return 0;
+    if (!persons.empty()) return statusOfReading(data);
     printMessage(
         options.input.file + ": " +
         (words.empty() ? std::string("no person in this file") : "no person is called '" + words + "'"));

@@ -64,8 +64,12 @@ def records_of(text):
     return records
 
 
-def run(command, *words, **more):
-    return subprocess.run([command, *words], capture_output=True, timeout=120, check=True, **more).stdout
+def run(command, *words):
+    """What it prints; status 1 is that of a file whose encoding is in doubt."""
+    result = subprocess.run([command, *words], capture_output=True, timeout=120)
+    if result.returncode not in (0, 1):
+        raise SystemExit(f"olvane {' '.join(words)} ended with {result.returncode}: {result.stderr[-500:]!r}")
+    return result.stdout
 
 
 def unpacked_pdf(data):
@@ -148,7 +152,7 @@ class Outputs:
                 "dates,places,occupation,marriage",
                 *self.hiding,
             ]
-            if subprocess.run(words, capture_output=True, timeout=120).returncode == 0:
+            if subprocess.run(words, capture_output=True, timeout=120).returncode in (0, 1):
                 data = picture.read_bytes()
                 self.texts[ending + " " + name] = (
                     unpacked_pdf(data) if ending == ".pdf" else data.decode("utf-8", "replace")
