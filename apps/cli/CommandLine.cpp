@@ -43,7 +43,7 @@ void addEncoding(CLI::App& command, InputOptions& input) {
         .add_option(
             "--encoding", input.encoding,
             "The encoding of the file, such as UTF-8, ANSEL, windows-1250, ISO-8859-2 or KOI8-R; as the file "
-            "says and its text allows when not given")
+            "says and its text allows when not given. Where that is in doubt the status is 1")
         ->check([](const std::string& name) {
             return gedcom::encodingLabelled(name).empty() ? unknownEncoding(name) : std::string();
         })
@@ -183,7 +183,7 @@ private:
     }
 
     void addDraw() {
-        draw_ = app_.add_subcommand("draw", "Draw a person's family or pedigree");
+        draw_ = app_.add_subcommand("draw", "Draw a picture of a person's family, in any view");
         addFile(*draw_, drawOptions_.input);
         addFocus(*draw_, drawOptions_.focus);
         draw_
@@ -216,8 +216,9 @@ private:
     }
 
     void addBatch() {
-        batch_ = app_.add_subcommand("batch",
-                                     "Print many layouts: id, a tab and the result text on a line for each");
+        batch_ = app_.add_subcommand(
+            "batch",
+            "Print many layouts: id, a tab and the result text, or a picture as JSON, on a line for each");
         addFile(*batch_, batchOptions_.input);
         batch_
             ->add_option("--focus-from", batchOptions_.focusFrom,

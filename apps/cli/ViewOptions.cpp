@@ -97,6 +97,12 @@ const std::vector<OptionUse>& optionUses() {
     return kUses;
 }
 
+// A switch that sets what is on when not given to off. (The library's own flags of that sort show "{false}" in the help.)
+CLI::Option* addSwitchOff(CLI::App& command, const std::string& name, bool& isOn, const std::string& help) {
+    return command.add_flag_callback(
+        name, [&isOn] { isOn = false; }, help);
+}
+
 bool isGiven(const CLI::App& command, const char* option) {
     return command.get_option_no_throw(option) != nullptr && command.count(option) > 0;
 }
@@ -151,7 +157,7 @@ void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
         ->group(group);
     command.add_flag("--siblings", chart.siblings, "Show siblings of the focus and of its ancestors")
         ->group(group);
-    command.add_flag("!--no-spouses", chart.spouses, "Leave out spouses of descendants")->group(group);
+    addSwitchOff(command, "--no-spouses", chart.spouses, "Leave out spouses of descendants")->group(group);
     static const std::map<std::string, charts::FanOf> kFansOf = {{"ancestors", charts::FanOf::ancestors},
                                                                  {"descendants", charts::FanOf::descendants}};
     command
@@ -247,14 +253,14 @@ void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
         ->check(wholeNumber(0, 10))
         ->type_name("N")
         ->group(group);
-    command
-        .add_flag("!--all-parts", chart.onePart, "Show those as well who are not connected with the focus")
+    addSwitchOff(command, "--all-parts", chart.onePart,
+                 "Show those as well who are not connected with the focus")
         ->group(group);
 }
 
 void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
     for (const FamilySwitch& option : kFamilySwitches) {
-        command.add_flag("!" + std::string(option.name), request.chart.layout.*option.shown, option.help)
+        addSwitchOff(command, option.name, request.chart.layout.*option.shown, option.help)
             ->group("Family and near");
     }
 }

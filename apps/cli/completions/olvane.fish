@@ -5,7 +5,7 @@
 
 complete -c olvane -n __fish_use_subcommand -f -a people -d 'List persons'
 complete -c olvane -n __fish_use_subcommand -f -a layout -d 'Print where everybody stands'
-complete -c olvane -n __fish_use_subcommand -f -a draw -d 'Draw a family or pedigree'
+complete -c olvane -n __fish_use_subcommand -f -a draw -d 'Draw a picture of a family, in any view'
 complete -c olvane -n __fish_use_subcommand -f -a batch -d 'Print many layouts'
 complete -c olvane -n __fish_use_subcommand -f -a check -d 'List what is wrong or odd'
 complete -c olvane -n __fish_use_subcommand -f -a kin -d 'Say how two persons are related'
