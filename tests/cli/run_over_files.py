@@ -108,6 +108,9 @@ def faults(command, data, name, number):
             except subprocess.TimeoutExpired:
                 found.append(f"{asked}: no end after {TIME_LIMIT} s")
                 continue
+            # A sanitizer ends a command with status 1, which means something else elsewhere.
+            if b"Sanitizer" in result.stderr or b": runtime error: " in result.stderr:
+                found.append(f"{asked}: {result.stderr[:2000].decode(errors='replace')}")
             if result.returncode not in (0, 1, 2):
                 found.append(f"{asked}: status {result.returncode}: {result.stderr[-500:]!r}")
             if (
