@@ -12,7 +12,7 @@
 
 namespace olvane::picture {
 
-// Texts are clean, as cleanText makes them; runs of spaces count as one.
+// Texts are clean, as cleanText makes them. Where a text is broken into lines, runs of spaces count as one.
 
 // Lines of a text that was fitted into a width.
 struct FittedText {
@@ -25,7 +25,7 @@ struct FittedText {
 // for a line is broken between two grapheme clusters; what does not go in is replaced by an ellipsis.
 FittedText fitText(std::string_view text, const Font& font, double maxWidth, std::size_t maxLines);
 
-// One line with an ellipsis where it was too long; empty if not even that has room.
+// One line, with its spaces as they are, and with an ellipsis where it was too long; empty if not even that has room.
 std::string fitLine(std::string_view text, const Font& font, double maxWidth);
 
 // The room for a name, in px: lines of a size need that size and the gap. There is always room for one line, and for

@@ -115,6 +115,10 @@ TEST(TextFit, spacesCountOnce) {
     EXPECT_THAT(fitText("  Anna   Maria ", kFont, 200, 2).lines, ElementsAre("Anna Maria"));
 }
 
+TEST(TextFit, oneLineKeepsItsSpaces) {
+    EXPECT_EQ(fitLine("* 1850  \u2020 1900", kFont, 200), "* 1850  \u2020 1900");
+}
+
 TEST(TextFit, veryLongTextIsReadNoFurtherThanItsLines) {
     const FittedText fitted = fitText(std::string(200000, 'a') + "\u0301", kFont, 60, 3);
     EXPECT_EQ(fitted.lines.size(), 3u);
