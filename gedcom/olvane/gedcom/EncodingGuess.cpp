@@ -22,7 +22,7 @@ struct HighByteCensus {
     std::size_t bytes = 0;
     std::size_t inWords = 0;           // in runs of three and more
     std::size_t words = 0;             // such runs
-    std::size_t capitalThenSmall = 0;  // runs whose first byte is C0 to DF, the others E0 to FF
+    std::size_t capitalThenSmall = 0;  // runs whose first byte is C0 to DF, the others DC to FF
     std::size_t smallThenCapital = 0;  // the other way round
     std::size_t evenWords = 0;         // runs of an even length
     std::size_t signsInWords = 0;      // bytes that are signs in windows-1252, close to a letter
@@ -41,9 +41,10 @@ private:
         }
         return true;
     }
+    // With the accented vowels of Greek, which stand at DC to DF.
     static bool allLower(std::string_view text) {
         for (const char c : text) {
-            if (static_cast<unsigned char>(c) < 0xE0) return false;
+            if (static_cast<unsigned char>(c) < 0xDC) return false;
         }
         return true;
     }
@@ -56,7 +57,8 @@ private:
         if (allLower(run.substr(0, 1)) && allUpper(run.substr(1))) ++smallThenCapital;
     }
 
-    // Polish and other letters of windows-1250: within a word, or before one that goes on in small letters.
+    // Letters of windows-1250, Polish ones first: within a word, or before one that goes on in small letters. "Petrović" ends
+    // in what is an ae there, and "Ştefan" begins with an ordinal sign.
     void addSign(unsigned char sign, unsigned char before, unsigned char behind) {
         switch (sign) {
             case 0xA3:
@@ -70,6 +72,13 @@ private:
                 return;
             case 0xBF:
                 if (isAsciiLetter(before)) ++signsInWords;
+                return;
+            case 0xBA:
+            case 0xAA:
+                if (behind >= 'a' && behind <= 'z') ++signsInWords;
+                return;
+            case 0xE6:
+                if (before == 'i' && !isAsciiLetter(behind)) ++signsInWords;
                 return;
             default:
                 return;
@@ -113,6 +122,17 @@ const KnownEncoding* alphabetOf(const HighByteCensus& census) {
     return findEncoding(greek ? "windows-1253" : "windows-1251");
 }
 
+// Words of bytes above ASCII alone, which no text in windows-1252 has.
+bool isFarFromLatin(const HighByteCensus& census) {
+    return census.words >= 2 && census.inWords * 2 > census.bytes;
+}
+
+// Hungarian: the long umlauts are the tildes and circumflexes of windows-1252, which Portuguese and Estonian, or French and
+// Welsh, have the one without the other.
+bool looksHungarian(const HighByteCensus& census) {
+    return census.all[0xF5] >= 1 && census.all[0xFB] >= 1 && census.all[0xE3] + census.all[0xE7] == 0;
+}
+
 // Czech: r with caron is the o with stroke of windows-1252, e with caron the i with grave, which no other language
 // has both.
 bool looksCzech(const HighByteCensus& census) {
@@ -125,20 +145,21 @@ bool looksCzech(const HighByteCensus& census) {
 
 const KnownEncoding* likelyEncoding(std::string_view bytes) {
     const HighByteCensus census = takeCensus(bytes);
-    if (census.words >= 2 && census.inWords * 2 > census.bytes) return alphabetOf(census);
+    if (isFarFromLatin(census)) return alphabetOf(census);
     const bool central = census.signsInWords >= 2 && census.signsInWords * 20 > census.bytes;
-    return central || looksCzech(census) ? findEncoding("windows-1250") : nullptr;
+    return central || looksCzech(census) || looksHungarian(census) ? findEncoding("windows-1250") : nullptr;
+}
+
+bool looksWestern(std::string_view bytes) {
+    return likelyEncoding(bytes) == nullptr && !isFarFromLatin(takeCensus(bytes));
 }
 
 DiagnosticPhrase encodingSuggestion(std::string_view bytes) {
     if (const KnownEncoding* likely = likelyEncoding(bytes)) {
         return DiagnosticPhrase{DiagnosticSentence::looksLike, {std::string(likely->name)}};
     }
-    const HighByteCensus census = takeCensus(bytes);
-    if (census.words >= 2 && census.inWords * 2 > census.bytes) {
-        return DiagnosticSentence::chooseFarEncoding;
-    }
-    return DiagnosticSentence::chooseNearEncoding;
+    return isFarFromLatin(takeCensus(bytes)) ? DiagnosticSentence::chooseFarEncoding
+                                             : DiagnosticSentence::chooseNearEncoding;
 }
 
 }  // namespace olvane::gedcom

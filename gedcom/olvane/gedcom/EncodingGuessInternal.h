@@ -17,6 +17,10 @@ namespace olvane::gedcom {
 // Holds: no guess is made of fewer than two words.
 const KnownEncoding* likelyEncoding(std::string_view bytes);
 
+// Whether text may be Western European, in windows-1252: it looks like no other encoding, nor like one of which no guess can be
+// made, as the Chinese ones and words in capitals alone.
+bool looksWestern(std::string_view bytes);
+
 // What to try for text in an encoding that is not certain: "it looks like windows-1251", or a choice.
 DiagnosticPhrase encodingSuggestion(std::string_view bytes);
 

@@ -96,7 +96,8 @@ bool isAnsel(std::string_view bytes, bool claimed) {
 // What the bytes beyond ASCII allow, for a file that is neither UTF-16 nor marked as UTF-8.
 const KnownEncoding* encodingByBytes(std::string_view bytes, const KnownEncoding* claimed,
                                      const Utf8Census& census) {
-    if (census.characters > 0 && census.faults == 0) return &kUtf8;
+    constexpr std::size_t kCharactersPerFault = 8;
+    if (census.characters > census.faults * kCharactersPerFault) return &kUtf8;
     if (claimed == &kUtf8 && census.characters >= census.faults) return &kUtf8;
     if (claimed != nullptr && (hasPage(claimed) || claimed->sort == EncodingSort::multiByte)) return claimed;
     if (claimed != nullptr && claimed != &kAnsel) return &kWindowsLatin;
@@ -153,9 +154,7 @@ private:
     }
 
     // Only windows-1252 is looked at for what else it may be: it is what programs claim by default.
-    bool explains(const KnownEncoding& used) const {
-        return &used != &kWindowsLatin || likelyEncoding(bytes_) == nullptr;
-    }
+    bool explains(const KnownEncoding& used) const { return &used != &kWindowsLatin || looksWestern(bytes_); }
 
     void add(DiagnosticKind kind, Severity severity, DiagnosticSentence what, const DiagnosticPhrase& done) {
         diagnostics_.add(kind, severity, claims_.charactersLine, what, done, claims_.characters);

@@ -55,6 +55,14 @@ std::size_t cutCharacterLength(std::string_view rest) {
     return utf8CharacterLength(joined) == announced ? announced + gap : 0;
 }
 
+// Length of half a surrogate pair written as if it were a character, which some programs do; 0 if none is in front. It is no
+// character, and can be met in no other encoding by chance.
+std::size_t surrogateLength(std::string_view rest) {
+    const bool isOne = rest.size() >= 3 && rest[0] == '\xED' && static_cast<unsigned char>(rest[1]) >= 0xA0 &&
+                       isContinuation(rest[1]) && isContinuation(rest[2]);
+    return isOne ? 3 : 0;
+}
+
 }  // namespace
 
 std::size_t utf8CharacterLength(std::string_view text) {
@@ -93,6 +101,7 @@ Utf8Census takeUtf8Census(std::string_view bytes) {
         if (bytes.empty()) return census;
         std::size_t length = utf8CharacterLength(bytes);
         if (length == 0) length = cutCharacterLength(bytes);
+        if (length == 0) length = surrogateLength(bytes);
         if (length == 0) {
             ++census.faults;
             length = 1;

@@ -12,7 +12,7 @@ namespace olvane::gedcom {
 
 // How bytes look as UTF-8.
 struct Utf8Census {
-    std::size_t characters = 0;  // well-formed ones outside ASCII
+    std::size_t characters = 0;  // well-formed ones outside ASCII, and halves of surrogate pairs
     std::size_t faults = 0;      // places that are none
 };
 

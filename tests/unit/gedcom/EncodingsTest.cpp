@@ -358,6 +358,35 @@ TEST(Encodings, textThatAnsiDoesNotExplainIsAnErrorWithASuggestion) {
                          "ANSI"),
               hint + "windows-1250: choose that encoding");
     EXPECT_EQ(mismatchOf("Ji\xF8\xED /N\xECmec/", "ANSI"), hint + "windows-1250: choose that encoding");
+    // "Μαρία /Νικολάου/": accented vowels within words.
+    EXPECT_EQ(mismatchOf("\xCC\xE1\xF1\xDF\xE1 /\xCD\xE9\xEA\xEF\xEB\xDC\xEF\xF5/", "ANSI"),
+              hint + "windows-1253: choose that encoding");
+    // "Győző /Fűzfa/", "Ivić /Perić/", "Muşat /Duşa/"
+    for (const char* names : {"Gy\xF5z\xF5 /F\xFBzfa/", "Ivi\xE6 /Peri\xE6/",
+                              "Mu\xBA"
+                              "at /Du\xBA"
+                              "a/"}) {
+        EXPECT_EQ(mismatchOf(names, "ANSI"), hint + "windows-1250: choose that encoding") << names;
+    }
+}
+
+// "ИВАНОВ /ПЁТР/" in capitals, of which nobody can say whether it is not KOI8-R; "王小 /李明/" in GBK.
+TEST(Encodings, textThatNoGuessIsMadeOfIsAnErrorAllTheSame) {
+    const std::string hint = "read as windows-1252; choose an encoding, such as windows-1251,";
+    for (const char* names :
+         {"\xC8\xC2\xC0\xCD\xCE\xC2 /\xCF\xC5\xD2\xD0/", "\xCD\xF5\xD0\xA1 /\xC0\xEE\xC3\xF7/"}) {
+        EXPECT_EQ(mismatchOf(names, "ANSI").substr(0, hint.size()), hint) << names;
+    }
+}
+
+TEST(Encodings, utf8WithAFewBadBytesIsUtf8WhateverTheHeaderSays) {
+    const std::string name = "J\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC\xC3\xBC";
+    expectReading(person(name + " \xFC B", "ANSI"), "Jüüüüüüüüü ü B", "UTF-8", "5");
+    expectReading(person("J\xC3\xBC \xFC B", "ANSI"), "JÃ¼ ü B", "windows-1252");
+}
+
+TEST(Encodings, halfASurrogatePairAloneIsUtf8) {
+    expectReading(person("A\xED\xA0\x88 B", "UTF-8"), "A\xEF\xBF\xBD B", "UTF-8");
 }
 
 TEST(Encodings, westernTextUnderAnsiIsNoError) {

@@ -189,9 +189,11 @@ constexpr std::array<Sentence, kDiagnosticSentences> kSentences{{
      {"it looks like {}: choose that encoding", "er sieht nach {} aus: wählen Sie diese Zeichenkodierung",
       "parece {}: elija esa codificación"}},
     {"chooseFarEncoding",
-     {"choose an encoding, such as GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 or windows-1256",
-      "wählen Sie eine Zeichenkodierung, etwa GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 oder windows-1256",
-      "elija una codificación, como GBK, BIG5, Shift_JIS, EUC-KR, TIS-620 o windows-1256"}},
+     {"choose an encoding, such as windows-1251, windows-1253, windows-1256, GBK, BIG5, Shift_JIS or EUC-KR",
+      "wählen Sie eine Zeichenkodierung, etwa windows-1251, windows-1253, windows-1256, GBK, BIG5, Shift_JIS "
+      "oder EUC-KR",
+      "elija una codificación, como windows-1251, windows-1253, windows-1256, GBK, BIG5, Shift_JIS o "
+      "EUC-KR"}},
     {"chooseNearEncoding",
      {"if letters are wrong, choose an encoding, such as windows-1250, windows-1251, IBM850 or macintosh",
       "sind Buchstaben falsch, wählen Sie eine Zeichenkodierung, etwa windows-1250, windows-1251, IBM850 "
