@@ -29,7 +29,7 @@ private:
 // Swedish, Norwegian, Danish or Finnish; 0 for anything else.
 int monthNamed(const DateWord& word);
 
-// Whether the word is a weekday's name in one of these languages.
+// Whether the word is a weekday's name or abbreviation in one of these languages. MAR is also March.
 bool isWeekday(const DateWord& word);
 
 // An era at the end of a year.

@@ -76,7 +76,7 @@ private:
     void findWord() {
         while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
         CharacterSort last = CharacterSort::space;  // of the last letter or digit
-        bool isClose = false;                       // it stands here but for one separator
+        bool isClose = false;  // it stands here but for one separator, or one behind a point
         for (wordLength_ = 0; wordLength_ < rest_.size(); ++wordLength_) {
             const CharacterSort sort = kSorts[static_cast<unsigned char>(rest_[wordLength_])];
             if (sort == CharacterSort::space) return;
@@ -85,7 +85,8 @@ private:
                 last = sort;
                 isClose = true;
             } else {
-                isClose = isClose && sort == CharacterSort::separator && !isSeparator(rest_[wordLength_ - 1]);
+                isClose = isClose && sort == CharacterSort::separator &&
+                          (!isSeparator(rest_[wordLength_ - 1]) || rest_[wordLength_ - 1] == '.');
             }
         }
     }
@@ -302,13 +303,12 @@ std::optional<NumberGroups> readGroups(std::string_view word) {
 }
 
 // Points are set where the day comes first. Strokes are set in both orders, so the day comes first only where the other
-// order is impossible; else the year alone is certain.
+// order is impossible; else, and where no order is possible, the year alone is certain. A 0 is written for what is not known.
 bool readDayMonthYear(const NumberGroups& groups, ReadDate& result) {
     const auto [first, second, year] = groups.values;
     const bool secondIsMonth = second >= 1 && second <= 12;
     const bool either = groups.separator != '.' && first <= 12 && first != second;
-    if (year == 0 || first < 1 || first > 31 || second < 1 || second > 31 || (first > 12 && !secondIsMonth))
-        return false;
+    if (year == 0 || first > 31 || second > 31) return false;
     result.yearAlone = !secondIsMonth || either;
     result.date = result.yearAlone ? CalendarDate{year, 0, 0} : CalendarDate{year, second, first};
     if (!result.yearAlone) dropImpossibleDay(result);
@@ -411,8 +411,19 @@ void takeDayAndMonth(Words& words, ReadDate& result) {
     if (!day) takeDayBehindMonth(words, result);
 }
 
+// "mar. 24 mai 1819" is a Tuesday.
+bool standsBeforeDayAndMonth(Words words, Calendar calendar) {
+    words.skip();
+    ReadDate numeric;
+    if (takeNumericDate(words, numeric)) return true;
+    if (!takeDay(words)) return false;
+    skipParticle(words);
+    return takeMonth(words, calendar) != 0;
+}
+
 // What may stand before a day: a weekday, with or without an article; AD before a year.
-void skipWordsAhead(Words& words) {
+void skipWordsAhead(Words& words, Calendar calendar) {
+    if (monthOf(calendar, words.peek()) != 0 && !standsBeforeDayAndMonth(words, calendar)) return;
     if (isWeekday(DateWord(words.peek()))) {
         words.skip();
         words.skipIf({"DEN", "LE", "EL", "IL", "THE"});
@@ -432,8 +443,7 @@ std::optional<ReadDate> takeDate(Words& words) {
         words.skip();
         return result;
     }
-    if (plain && isWordLetter(words.front()) && monthOf(result.calendar, words.peek()) == 0)
-        skipWordsAhead(words);
+    if (plain && isWordLetter(words.front())) skipWordsAhead(words, result.calendar);
     if (plain && takeNumericDate(words, result)) {
         return takeEra(words, result) ? std::optional(result) : std::nullopt;
     }
