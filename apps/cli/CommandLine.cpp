@@ -8,6 +8,7 @@
 
 #include <exception>
 #include <map>
+#include <memory>
 #include <new>
 
 #include <CLI/CLI.hpp>
@@ -15,6 +16,7 @@
 #include <olvane/gedcom/GedcomEncodings.h>
 
 #include <cli/Commands.h>
+#include <cli/HelpFormat.h>
 #include <cli/InputFiles.h>
 #include <cli/Messages.h>
 #include <cli/OptionChecks.h>
@@ -93,7 +95,7 @@ public:
     CommandLine() {
         app_.set_version_flag("--version", "olvane " OLVANE_VERSION);
         app_.require_subcommand(1);
-        app_.get_formatter()->column_width(34);
+        app_.formatter(std::make_shared<HelpFormat>());
         addPeople();
         addLayout();
         addDraw();
