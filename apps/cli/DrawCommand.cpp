@@ -9,6 +9,7 @@
 #include <iomanip>
 #include <sstream>
 
+#include <olvane/charts/LaterSide.h>
 #include <olvane/gedcom/HiddenNames.h>
 #include <olvane/source/GedcomLabels.h>
 
@@ -88,6 +89,7 @@ draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions
     content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };
     content.familyLabelOf = [labels](std::uint32_t number) { return labels.ofFamily(number); };
     content.countsHidden = true;
+    content.laterSide = charts::laterSideOf(request.chart);
     return content;
 }
 

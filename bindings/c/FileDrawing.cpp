@@ -13,6 +13,7 @@
 #include <vector>
 
 #include <olvane/charts/BoxForm.h>
+#include <olvane/charts/LaterSide.h>
 #include <olvane/charts/Views.h>
 #include <olvane/draw/SvgDrawing.h>
 #include <olvane/gedcom/GedcomReader.h>
@@ -153,7 +154,9 @@ std::string drawnFromFile(const olvane_file& file, std::int64_t focus, const olv
     const std::vector<bool> hidden = hiddenIn(file, options);
     const gedcom::GedcomLabels labels(file.data, shown, hiddenTexts(file.data, hidden));
     draw::DrawingContent content;
-    content.picture = charts::pictureOf(source, file.graph(), requestOf(options, file.graph(), focus));
+    const charts::ViewRequest request = requestOf(options, file.graph(), focus);
+    content.picture = charts::pictureOf(source, file.graph(), request);
+    content.laterSide = charts::laterSideOf(request.chart);
     picture::hidePersons(hidden, content.picture);
     content.labelOf = [&labels](std::int64_t id) { return labels.ofPerson(id); };
     content.familyLabelOf = [&labels](std::uint32_t number) { return labels.ofFamily(number); };
@@ -165,8 +168,9 @@ std::string drawnFromTable(const Family& table, std::int64_t focus, const olvane
     if (options.hide_living != 0) refuseOption("hide_living", "1", "0 where a table is drawn");
     const kin::KinGraph graph = kinGraphOf(table);
     draw::DrawingContent content;
-    content.picture =
-        charts::pictureOf(std::make_shared<FamilyDataSource>(table), graph, requestOf(options, graph, focus));
+    const charts::ViewRequest request = requestOf(options, graph, focus);
+    content.picture = charts::pictureOf(std::make_shared<FamilyDataSource>(table), graph, request);
+    content.laterSide = charts::laterSideOf(request.chart);
     content.labelOf = [&table](std::int64_t id) { return kin::labelOf(table, id); };
     return svgOf(std::move(content), options);
 }

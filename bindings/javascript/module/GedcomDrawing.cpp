@@ -13,6 +13,7 @@
 #include <utility>
 
 #include <olvane/charts/BoxForm.h>
+#include <olvane/charts/LaterSide.h>
 #include <olvane/charts/Views.h>
 #include <olvane/draw/Paper.h>
 #include <olvane/draw/PaperDrawing.h>
@@ -50,6 +51,7 @@ draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, un
     content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };
     content.familyLabelOf = [labels](std::uint32_t number) { return labels.ofFamily(number); };
     content.countsHidden = true;
+    content.laterSide = charts::laterSideOf(request.view.chart);
     return content;
 }
 

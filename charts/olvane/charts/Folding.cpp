@@ -9,6 +9,7 @@
 #include <cstddef>
 #include <stdexcept>
 
+#include <olvane/charts/LaterSide.h>
 #include <olvane/charts/SelectionInternal.h>
 
 namespace olvane::charts {
@@ -53,16 +54,26 @@ std::array<std::int32_t, 3> branchSizes(const kin::KinGraph& graph, const ChartR
     return sizes;
 }
 
-// Later generations stand where the direction says, and earlier ones opposite.
+Side opposite(Side side) {
+    switch (side) {
+        case Side::top:
+            return Side::bottom;
+        case Side::right:
+            return Side::left;
+        case Side::bottom:
+            return Side::top;
+        case Side::left:
+            return Side::right;
+    }
+    return side;
+}
+
 Side sideOf(Branch branch, const ChartRequest& request) {
-    const Direction direction = request.direction;
-    const bool sideways = direction == Direction::left || direction == Direction::right;
-    if (branch == Branch::beside)
-        return sideways ? Side::bottom : request.mirrored ? Side::left : Side::right;
-    const bool forward = direction == Direction::down || direction == Direction::right;
-    const bool atEnd = (branch == Branch::down) == forward;
-    if (sideways) return atEnd != request.mirrored ? Side::right : Side::left;
-    return atEnd ? Side::bottom : Side::top;
+    const Side later = laterSideOf(request);
+    if (branch == Branch::down) return later;
+    if (branch == Branch::up) return opposite(later);
+    const bool sideways = later == Side::left || later == Side::right;
+    return sideways ? Side::bottom : request.mirrored ? Side::left : Side::right;
 }
 
 void addFolded(picture::Picture& picture, const kin::KinGraph& graph, const ChartRequest& request) {

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// An arrow up stands at a child whose parents are elsewhere, an arrow down at those parents, an arrow to both
-// sides at partners, each with the number of its mark.
+// An arrow to earlier generations stands at a child whose parents are elsewhere, one to later generations at those
+// parents, and an arrow to both sides at partners, each with the number of its mark.
 
 #include <olvane/draw/MarkArtInternal.h>
 
@@ -23,13 +23,61 @@ using picture::Side;
 
 constexpr std::size_t kMostMarks = 3;
 constexpr const char* kUp = "\xE2\x86\x91";
+constexpr const char* kRight = "\xE2\x86\x92";
 constexpr const char* kDown = "\xE2\x86\x93";
-constexpr const char* kBoth = "\xE2\x86\x94";
+constexpr const char* kLeft = "\xE2\x86\x90";
+constexpr const char* kBothSides = "\xE2\x86\x94";
+constexpr const char* kUpAndDown = "\xE2\x86\x95";
+
+const char* arrowTo(Side side) {
+    switch (side) {
+        case Side::top:
+            return kUp;
+        case Side::right:
+            return kRight;
+        case Side::bottom:
+            return kDown;
+        case Side::left:
+            return kLeft;
+    }
+    return kDown;
+}
+
+Side opposite(Side side) {
+    switch (side) {
+        case Side::top:
+            return Side::bottom;
+        case Side::right:
+            return Side::left;
+        case Side::bottom:
+            return Side::top;
+        case Side::left:
+            return Side::right;
+    }
+    return Side::top;
+}
+
+// The arrows of a picture, and the edges where they stand: where text lies beside the silhouette, as in a chart that runs
+// sideways, the sides of a box have no room for them.
+struct Signs {
+    explicit Signs(Side laterSide)
+        : toChildren(arrowTo(laterSide)),
+          toParents(arrowTo(opposite(laterSide))),
+          toPartners(laterSide == Side::left || laterSide == Side::right ? kUpAndDown : kBothSides),
+          children(laterSide == Side::top ? Side::top : Side::bottom),
+          parents(opposite(children)) {}
+
+    const char* toChildren;
+    const char* toParents;
+    const char* toPartners;
+    Side children;
+    Side parents;
+};
 
 class MarkList {
 public:
-    MarkList(const picture::Picture& picture, kin::Language language)
-        : language_(language), marks_(picture.boxes.size()) {
+    MarkList(const picture::Picture& picture, kin::Language language, Side laterSide)
+        : language_(language), signs_(laterSide), marks_(picture.boxes.size()) {
         for (const Mark& mark : picture.marks) {
             if (mark.kind == MarkKind::parentsElsewhere) addParents(mark);
             if (mark.kind == MarkKind::partnersElsewhere) addPartners(mark);
@@ -55,15 +103,18 @@ private:
     }
 
     void addParents(const Mark& mark) {
-        add(mark.boxes[0], kUp, mark, marked(Phrase::childOfMarked, kDown, mark), Side::top);
+        add(mark.boxes[0], signs_.toParents, mark, marked(Phrase::childOfMarked, signs_.toChildren, mark),
+            signs_.parents);
         for (const Index parent : {mark.boxes[1], mark.boxes[2]}) {
-            add(parent, kDown, mark, marked(Phrase::parentOfMarked, kUp, mark), Side::bottom);
+            add(parent, signs_.toChildren, mark, marked(Phrase::parentOfMarked, signs_.toParents, mark),
+                signs_.children);
         }
     }
 
     void addPartners(const Mark& mark) {
         for (const Index partner : {mark.boxes[0], mark.boxes[1]}) {
-            add(partner, kBoth, mark, marked(Phrase::partnerOfMarked, kBoth, mark), Side::bottom);
+            add(partner, signs_.toPartners, mark, marked(Phrase::partnerOfMarked, signs_.toPartners, mark),
+                signs_.children);
         }
     }
 
@@ -96,13 +147,15 @@ private:
     }
 
     kin::Language language_;
+    Signs signs_;
     std::vector<std::vector<BoxMark>> marks_;
 };
 
 }  // namespace
 
-std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language) {
-    return MarkList(picture, language).take();
+std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language,
+                                             Side laterSide) {
+    return MarkList(picture, language, laterSide).take();
 }
 
 }  // namespace olvane::draw

@@ -19,7 +19,9 @@ struct BoxMark {
 };
 
 // The signs of every box for what is expressed without a line, in the order of the marks: at most three stand at one
-// edge, and a last one says how many more there are. Then those of its folded branches.
-std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language);
+// edge, and a last one says how many more there are. Then those of its folded branches. Arrows lead to children on
+// laterSide, and away from it to parents.
+std::vector<std::vector<BoxMark>> boxMarksOf(const picture::Picture& picture, kin::Language language,
+                                             picture::Side laterSide = picture::Side::bottom);
 
 }  // namespace olvane::draw

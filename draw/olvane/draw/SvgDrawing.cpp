@@ -150,7 +150,7 @@ private:
         numberRepeats();
         findCommonAncestors();
         if (picture.boxes.empty()) appendNobody();
-        const auto marks = boxMarksOf(picture, options_.language);
+        const auto marks = boxMarksOf(picture, options_.language, content_.laterSide);
         for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
             BoxFrame frame = frameOf(picture.boxes[i]);
             frame.language = options_.language;

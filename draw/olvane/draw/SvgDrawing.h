@@ -30,6 +30,8 @@ struct DrawingContent {
     std::function<std::string(std::uint32_t family)> familyLabelOf;
     // Whether the picture's numbers of hidden relatives are known; else the boxes' flags are all there is.
     bool countsHidden = false;
+    // Where children stand, seen from their parents; the signs of what is expressed without a line point there.
+    picture::Side laterSide = picture::Side::bottom;
 };
 
 struct DrawingOptions {

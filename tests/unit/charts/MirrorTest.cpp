@@ -7,6 +7,7 @@
 
 #include <AnyKin.h>
 
+#include <algorithm>
 #include <cmath>
 #include <memory>
 #include <optional>
@@ -14,6 +15,7 @@
 #include <string>
 #include <vector>
 
+#include <olvane/charts/LaterSide.h>
 #include <olvane/charts/Views.h>
 #include <olvane/picture/Judge.h>
 #include <olvane/picture/Mirror.h>
@@ -61,6 +63,39 @@ Picture pictureOf(const Family& family, View view, bool mirrored, Direction dire
     request.chart.direction = direction;
     request.chart.effort = 0;
     return pictureOf(family, 5, request, 5);
+}
+
+TEST(LaterSide, isWhereTheChildStandsInEveryView) {
+    Family family;
+    family.addPerson({.id = 1, .sex = kin::Sex::male});
+    family.addPerson({.id = 2, .sex = kin::Sex::female});
+    family.addPerson({.id = 3, .father = 1, .mother = 2});
+    family.addFamily({.number = 1, .partner0 = 1, .partner1 = 2}, std::vector<FamilyChild>{{3}});
+    for (const View view : kViews) {
+        if (view == View::fan) continue;
+        for (int direction = 0; direction < 4; ++direction) {
+            for (const bool mirrored : {false, true}) {
+                ViewRequest request;
+                request.chart.view = view;
+                request.chart.direction = static_cast<Direction>(direction);
+                request.chart.mirrored = mirrored;
+                const std::int64_t focus = view == View::descendants ? 1 : 3;
+                const Picture picture = pictureOf(family, focus, request, 1);
+                const auto boxOf = [&picture](std::int64_t id) {
+                    return *std::find_if(picture.boxes.begin(), picture.boxes.end(),
+                                         [id](const picture::Box& box) { return box.id == id; });
+                };
+                const picture::Box parent = boxOf(1);
+                const picture::Box child = boxOf(3);
+                const bool isSideways = view == View::pedigree || (view != View::family && direction >= 2);
+                const picture::Side side =
+                    isSideways ? (child.x > parent.x ? picture::Side::right : picture::Side::left)
+                               : (child.y > parent.y ? picture::Side::bottom : picture::Side::top);
+                EXPECT_EQ(laterSideOf(request.chart), side)
+                    << nameOf(view) << " " << direction << (mirrored ? " mirrored" : "");
+            }
+        }
+    }
 }
 
 TEST(Mirror, exchangesRightAndLeftWithinTheSameBounds) {

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include <olvane/charts/Charts.h>
+#include <olvane/charts/LaterSide.h>
 #include <olvane/draw/SvgDrawing.h>
 #include <olvane/picture/TextMetrics.h>
 
@@ -131,6 +132,7 @@ DrawingContent contentOf(const Chooser& choose, charts::View view) {
         if (choose(4) == 0) box.furtherParents = 1;
     }
     content.countsHidden = true;
+    content.laterSide = charts::laterSideOf(request);
     content.labelOf = labelOf;
     return content;
 }

@@ -357,6 +357,42 @@ TEST_F(Picture, whatIsElsewhereHasANumberAtBothEnds) {
               2u);
 }
 
+// Of a child and of its parent, and of two partners, in a chart whose children stand on that side.
+struct Arrows {
+    picture::Side laterSide;
+    const char* toParents;
+    const char* toChildren;
+    const char* toPartners;
+};
+
+TEST_F(Picture, arrowsOfMarksLeadToWhereTheGenerationsStand) {
+    content_.picture.marks.push_back({{4, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
+    content_.picture.marks.push_back({{0, 3, picture::kNone}, 8, picture::MarkKind::partnersElsewhere});
+    const std::vector<Arrows> sides{
+        {picture::Side::bottom, "\xE2\x86\x91", "\xE2\x86\x93", "\xE2\x86\x94"},
+        {picture::Side::top, "\xE2\x86\x93", "\xE2\x86\x91", "\xE2\x86\x94"},
+        {picture::Side::right, "\xE2\x86\x90", "\xE2\x86\x92", "\xE2\x86\x95"},
+        {picture::Side::left, "\xE2\x86\x92", "\xE2\x86\x90", "\xE2\x86\x95"},
+    };
+    for (const Arrows& arrows : sides) {
+        content_.laterSide = arrows.laterSide;
+        SvgPicture drawn = drawSvg(content_, DrawingOptions());
+        const auto boxText = [&drawn](std::size_t box) {
+            return drawn.svg.substr(drawn.boxes[box].start, drawn.boxes[box].length);
+        };
+        const auto sign = [](const char* arrow, const char* number) {
+            return std::string(">") + arrow + number + "</text>";
+        };
+        EXPECT_THAT(boxText(4), HasSubstr(sign(arrows.toParents, "7")));
+        EXPECT_THAT(boxText(2), HasSubstr(sign(arrows.toChildren, "7")));
+        EXPECT_THAT(boxText(0), HasSubstr(sign(arrows.toPartners, "8")));
+        EXPECT_THAT(boxText(3), HasSubstr(sign(arrows.toPartners, "8")));
+        // The mark for children stands on the edge from which lines to children run.
+        const bool isOnTop = boxText(2).find("y=\"-") < boxText(2).find(sign(arrows.toChildren, "7"));
+        EXPECT_EQ(isOnTop, arrows.laterSide == picture::Side::top);
+    }
+}
+
 // Two children of one couple are elsewhere: the mark at their parent stands once.
 TEST_F(Picture, aMarkOfSeveralChildrenStandsOnceAtTheirParent) {
     for (const picture::Index child : {3, 4}) {
