@@ -4,6 +4,7 @@
 // Values of a family, checked one by one before the module sees them; what is refused says where it stands.
 
 import { FamilyError } from "./errors.mjs";
+import { described } from "./values.mjs";
 
 function placeOf(table, row, id) {
     if (row !== null) return `${table} row ${row}`;
@@ -16,10 +17,6 @@ export function refuse(table, row, id, field, reason) {
     throw new FamilyError(message, { table, row, id, field });
 }
 
-function shown(value) {
-    return typeof value === "string" ? JSON.stringify(value) : String(value);
-}
-
 /** A whole number that the module can take; 0 for null and undefined. */
 export function idNumber(table, value, field, { row = null, id = null }) {
     if (value === null || value === undefined) return 0;
@@ -27,7 +24,7 @@ export function idNumber(table, value, field, { row = null, id = null }) {
     const isLarge = typeof value === "bigint" || Number.isInteger(value);
     if (isLarge && value >= 1 && value <= 2147483647) return Number(value);
     const kind = isLarge ? "a whole number of 1 to 2147483647" : "a whole number";
-    return refuse(table, row, id, field, `${shown(value)} is not ${kind}`);
+    return refuse(table, row, id, field, `${described(value)} is not ${kind}`);
 }
 
 /** A choice as its number, or by its name among names, where its first letter will do for a sex. */
@@ -37,7 +34,7 @@ export function chosenNumber(table, value, field, names, { row = null, id = null
     const name = typeof value === "string" ? value.trim().toLowerCase() : null;
     const place = names.findIndex((known) => known === name || (field === "sex" && known[0] === name));
     if (place >= 0) return place;
-    return refuse(table, row, id, field, `${shown(value)} is none of ${names.join(", ")}`);
+    return refuse(table, row, id, field, `${described(value)} is none of ${names.join(", ")}`);
 }
 
 /** A text; empty for null and undefined, and what String makes of a number. */
@@ -52,5 +49,5 @@ export function storedText(table, value, field, { row = null, id = null }) {
 function textOf(table, value, field, { row, id }) {
     if (typeof value === "number" || typeof value === "bigint") return String(value);
     if (value instanceof Date) return value.toISOString().slice(0, 10);
-    return refuse(table, row, id, field, `${shown(value)} is not a text`);
+    return refuse(table, row, id, field, `${described(value)} is not a text`);
 }

@@ -5,7 +5,7 @@
 // through the module, so a question keeps what the host threw and reports a failure; the layout throws it on.
 
 import { OutOfMemory } from "./errors.mjs";
-import { PERSON_NOT_FOUND } from "./values.mjs";
+import { PERSON_NOT_FOUND, described } from "./values.mjs";
 
 const utf8 = { decoder: new TextDecoder(), encoder: new TextEncoder() };
 
@@ -25,9 +25,8 @@ const MOST_RELATIVES = 1000000;
 
 function wholeId(id) {
     if (Number.isInteger(id) && id >= 1 && id <= GREATEST_ID) return id;
-    const shown = typeof id === "string" ? JSON.stringify(id) : String(id);
     const Kind = typeof id === "number" ? RangeError : TypeError;
-    throw new Kind(`a host answered ${shown} where an id is a whole number of 1 to ${GREATEST_ID}`);
+    throw new Kind(`a host answered ${described(id)} where an id is a whole number of 1 to ${GREATEST_ID}`);
 }
 
 function parentId(answer) {
@@ -37,7 +36,7 @@ function parentId(answer) {
 
 function sexNumber(answer) {
     if (Number.isInteger(answer)) return answer === 0 ? 0 : 1;
-    throw new TypeError(`a host answered ${String(answer)} where a sex is a whole number`);
+    throw new TypeError(`a host answered ${described(answer)} where a sex is a whole number`);
 }
 
 // Any answer is true or not, but what only promises one.
@@ -49,7 +48,7 @@ function truthNumber(answer) {
 function dateText(answer) {
     if (typeof answer === "string") return answer;
     if (answer === null || answer === undefined) return "";
-    throw new TypeError(`a host answered ${String(answer)} where a date is a string`);
+    throw new TypeError(`a host answered ${described(answer)} where a date is a string`);
 }
 
 export class Instance {
@@ -171,8 +170,7 @@ export class Instance {
 
     #appendAll(list, ids) {
         if (typeof ids?.[Symbol.iterator] !== "function") {
-            const shown = typeof ids?.then === "function" ? "a promise" : String(ids);
-            throw new TypeError(`a host answered ${shown} where a list of ids is due at once`);
+            throw new TypeError(`a host answered ${described(ids)} where a list of ids is due at once`);
         }
         let left = MOST_RELATIVES;
         for (const id of ids) {

@@ -7,7 +7,7 @@ import { HostError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
 import { readPicture, usePictureOptions } from "./picture.mjs";
 import { pictureNumbers } from "./pictureOptions.mjs";
-import { STATUSES, recordsFrom } from "./values.mjs";
+import { STATUSES, described, recordsFrom } from "./values.mjs";
 
 // The answer is read before anything is thrown, since it must be freed; of one that is whole, what is wanted alone.
 function readAnswer(instance, answer, wanted) {
@@ -52,7 +52,9 @@ export function runLayout(instance, host, focus, options, ask, wanted = undefine
     if (status === "ok") return result;
     const message = instance.text(instance.exports.status_text(number));
     const { text, records } = result;
-    if (status !== "hostFailed" || thrown === null) throw new LayoutError(status, message, text, records);
+    if (status !== "hostFailed" || thrown === null) {
+        throw new LayoutError(status, `layout of person ${described(focus)}: ${message}`, text, records);
+    }
     const [cause, question] = thrown;
     throw new HostError(status, `${question}: ${reasonOf(cause)}`, text, records, { cause });
 }
@@ -71,7 +73,8 @@ export function runPicture(instance, host, focus, options) {
     const number = statusOf(result, thrown);
     const status = STATUSES[number] === "ok" ? "tooLarge" : STATUSES[number];
     if (status !== "hostFailed" || thrown === null) {
-        throw new LayoutError(status, result.why || instance.text(exports.status_text(number)), "", []);
+        const why = result.why || instance.text(exports.status_text(number));
+        throw new LayoutError(status, `picture of person ${described(focus)}: ${why}`, "", []);
     }
     const [cause, question] = thrown;
     throw new HostError(status, `${question}: ${reasonOf(cause)}`, "", [], { cause });

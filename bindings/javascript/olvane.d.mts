@@ -22,10 +22,10 @@
 export const PERSON_NOT_FOUND: number;
 
 /**
- * What a host answers. Ids are the host's own, whole numbers of 1 and more for real persons; only their low 32
- * bits count. The methods are asked many times for the same person, since no answer is kept, and must agree with
- * themselves within one layout. A method may throw: the layout then ends with HostError. So does an answer of
- * another type, such as a promise: every answer is due at once.
+ * What a host answers. Ids are the host's own, whole numbers of 1 to 2147483647; any other number ends the layout with
+ * HostError. So does an answer of another type, such as a promise, since every answer is due at once, and so does a
+ * method that throws. The methods are asked many times for the same person, since no answer is kept, and must agree
+ * with themselves within one layout.
  */
 export interface Host {
     fatherOf(person: number): number | null | undefined;

@@ -4,7 +4,7 @@
 // What a caller asks for, checked before the module hears of it. A wrong type is a TypeError and a number out of
 // its range a RangeError; either names the option and what it takes.
 
-import { Shown } from "./values.mjs";
+import { Shown, described } from "./values.mjs";
 
 const VIEWS = { family: 0, pedigree: 1 };
 
@@ -24,10 +24,6 @@ const WHOLE_NUMBERS = {
 };
 
 const OPTIONS = ["view", "sizes", ...Object.keys(WHOLE_NUMBERS)];
-
-function described(value) {
-    return typeof value === "string" ? JSON.stringify(value) : String(value);
-}
 
 function checkObject(name, value) {
     if (typeof value === "object" && value !== null) return;

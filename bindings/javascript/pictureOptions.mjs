@@ -4,7 +4,7 @@
 // What a caller asks of a picture, checked before the module hears of it, as options.mjs does for layouts.
 
 import { BRANCHES } from "./picture.mjs";
-import { DIRECTIONS, FACTS, PICTURE_VIEWS, Shown } from "./values.mjs";
+import { DIRECTIONS, FACTS, PICTURE_VIEWS, Shown, described } from "./values.mjs";
 
 const FANS = ["ancestors", "descendants"];
 const WAYS = ["blood", "marriage", "both"];
@@ -49,23 +49,19 @@ const OPTIONS = {
     folded: { folds: true, usual: [] },
 };
 
-function quoted(value) {
-    return typeof value === "string" ? JSON.stringify(value) : String(value);
-}
-
 function wordNumber(name, value, words) {
     const number = words.indexOf(value);
     if (number >= 0) return number;
-    throw new TypeError(`${name} is ${quoted(value)}, and takes one of ${words.join(", ")}`);
+    throw new TypeError(`${name} is ${described(value)}, and takes one of ${words.join(", ")}`);
 }
 
 function flagNumber(name, value) {
     if (typeof value === "boolean") return value ? 1 : 0;
-    throw new TypeError(`${name} is ${quoted(value)}, and takes true or false`);
+    throw new TypeError(`${name} is ${described(value)}, and takes true or false`);
 }
 
 function plainNumber(name, value, { least, most, size }) {
-    if (typeof value !== "number") throw new TypeError(`${name} is ${quoted(value)}, and takes a number`);
+    if (typeof value !== "number") throw new TypeError(`${name} is ${described(value)}, and takes a number`);
     if (size) {
         if (Number.isFinite(Math.fround(value)) && value >= 0) return value;
         throw new RangeError(`${name} is ${value}, and takes a finite number of 0 or more`);
@@ -115,7 +111,7 @@ export function paperNumbers({ paper = "A4", rows = 1, columns = 1, scale = 0, .
     if (unknown !== undefined) throw new TypeError(`there is no option ${unknown}, but paper, rows, columns, scale`);
     for (const [name, value] of Object.entries({ rows, columns })) plainNumber(name, value, { least: 1, most: 100 });
     if (scale !== 0 && !(scale >= 0.01 && scale <= 100)) {
-        throw new RangeError(`scale is ${quoted(scale)}, and takes 0 or a number of 0.01 to 100`);
+        throw new RangeError(`scale is ${described(scale)}, and takes 0 or a number of 0.01 to 100`);
     }
     return { paper: String(paper), rows, columns, scale };
 }
@@ -123,7 +119,7 @@ export function paperNumbers({ paper = "A4", rows = 1, columns = 1, scale = 0, .
 /** All options as numbers, in the order of set_picture_options. */
 export function pictureNumbers(options) {
     if (typeof options !== "object" || options === null) {
-        throw new TypeError(`options is ${quoted(options)}, and takes an object`);
+        throw new TypeError(`options is ${described(options)}, and takes an object`);
     }
     for (const name of Object.keys(options)) {
         if (!Object.hasOwn(OPTIONS, name)) {

@@ -5,6 +5,13 @@
 
 export const PERSON_NOT_FOUND = Infinity;
 
+/** A value as errors state it, so that nobody takes "4" and 4n for 4. */
+export function described(value) {
+    if (typeof value === "string") return JSON.stringify(value);
+    if (typeof value === "bigint") return `${value}n`;
+    return typeof value?.then === "function" ? "a promise" : String(value);
+}
+
 export const Shown = Object.freeze({
     auntsUncles: 0x01,
     cousins: 0x02,

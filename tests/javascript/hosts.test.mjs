@@ -145,7 +145,10 @@ test("an answered id that is not 1 to 2147483647 is refused by its value", () =>
         [2 ** 32 + 4, "RangeError", "4294967300"],
         [2 ** 53 + 2, "RangeError", "9007199254740994"],
         ["2", "TypeError", '"2"'],
-        [2n, "TypeError", "2"],
+        [2n, "TypeError", "2n"],
+        [10n ** 40n, "TypeError", `1${"0".repeat(40)}n`],
+        [2n ** 64n + 4n, "TypeError", "18446744073709551620n"],
+        [Promise.resolve(2), "TypeError", "a promise"],
     ];
     for (const [id, name, shown] of refusals) {
         for (const answers of [{ childrenOf: () => [id] }, { spousesOf: () => [id] }, { fatherOf: () => id }]) {
@@ -166,6 +169,7 @@ test("a focus that is nobody is refused", () => {
         assert.throws(() => olvane.layout(new TableHost(henry), focus), {
             name: "LayoutError",
             status: "invalidPerson",
+            message: `layout of person ${focus}: The id of the focus is not that of a person: ids are 1 to 2147483647.`,
         });
     }
 });
@@ -242,10 +246,10 @@ test("options of another type are refused by their names", () => {
     refused("pedigree", 'options is "pedigree", and takes an object');
     refused({ view: "fan" }, 'there is no view "fan", but "family" and "pedigree"');
     refused({ view: null }, 'there is no view null, but "family" and "pedigree"');
-    refused({ view: 1n }, 'there is no view 1, but "family" and "pedigree"');
+    refused({ view: 1n }, 'there is no view 1n, but "family" and "pedigree"');
     refused({ shown: "x" }, 'shown is "x", and takes a number');
     refused({ shown: null }, "shown is null, and takes a number");
-    refused({ generations: 5n }, "generations is 5, and takes a number");
+    refused({ generations: 5n }, "generations is 5n, and takes a number");
     refused({ sizes: null }, "sizes is null, and takes an object");
     refused({ sizes: { nodeWidth: "55" } }, 'sizes.nodeWidth is "55", and takes a number');
     refused({ sizes: { width: 55 } }, `there is no size width, but ${Object.keys(SIZES).join(", ")}`);
@@ -302,7 +306,7 @@ test("what finds no room in the module's memory is no failure of the host", asyn
         assert.throws(() => full.layout(hostOf(changes), 1), {
             name: "LayoutError",
             status: "outOfMemory",
-            message: "There is not enough memory.",
+            message: "layout of person 1: There is not enough memory.",
         });
         assert.equal(full.layoutText(new TableHost(henry), 1), plain, "the next request is unaffected");
     }

@@ -11,9 +11,9 @@ from typing import Protocol
 class Host(Protocol):
     """The eight questions of a layout. Any object with these methods will do; none need derive from this class.
 
-    Ids are the host's own, 1 and more for real persons; only their low 32 bits count. The methods are asked many times
-    for the same person, since no answer is kept, and must agree with themselves within one layout. A method may raise:
-    the layout then ends with :class:`HostError`. So does an answer of another type, such as an awaitable.
+    Ids are the host's own, 1 to 2147483647; any other number ends the layout with :class:`HostError`. So does an answer of
+    another type, such as an awaitable, and so does a method that raises. The methods are asked many times for the same
+    person, since no answer is kept, and must agree with themselves within one layout.
     """
 
     def father_of(self, person: int) -> int | None:
