@@ -9,7 +9,7 @@ import { Instance } from "./instance.mjs";
 import { runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
-import { drawingNumbers, factBits, paperNumbers, pictureNumbers } from "./pictureOptions.mjs";
+import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { searchWith } from "./search.mjs";
@@ -245,10 +245,14 @@ export class GedcomFile {
     svg(focus, options = {}, drawing = {}) {
         const { exports } = this.#instance;
         const file = this.#opened();
-        const { theme, boxes, facts, title } = drawingNumbers(drawing);
+        const { part, ...whole } = drawing;
+        const { theme, boxes, facts, title } = drawingNumbers(whole);
+        const places = partText(part);
         this.#setPictureOptions(focus, options);
         const pointer = this.#instance.withText(title, (text) =>
-            exports.gedcom_svg(file, focus, theme, boxes, facts, text),
+            this.#instance.withText(places, (shown) =>
+                exports.gedcom_svg(file, focus, theme, boxes, facts, text, shown),
+            ),
         );
         if (pointer === 0) this.#refuse();
         return this.#instance.text(pointer);

@@ -247,6 +247,8 @@ export interface DrawingOptions {
     readonly show?: Iterable<ShownFact> | undefined;
     /** Stands above the picture. Empty for none: the picture is then called after its view and focus. */
     readonly title?: string | undefined;
+    /** Of `svg` alone: boxes by their index; the drawing ends around them. All of the picture if not given. */
+    readonly part?: Iterable<number> | undefined;
 }
 
 /** Paper to draw on. */

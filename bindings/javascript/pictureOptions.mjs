@@ -105,6 +105,11 @@ export function drawingNumbers({ theme = "light", boxes = "usual", show = [], ti
     };
 }
 
+/** Boxes by their index, as the module reads them; empty for all of the picture. */
+export function partText(part = []) {
+    return [...part].map((index) => plainNumber("part", index, { least: 0, most: MOST })).join(" ");
+}
+
 /** A paper and its sheets, with the command's meaning. */
 export function paperNumbers({ paper = "A4", rows = 1, columns = 1, scale = 0, ...rest }) {
     const unknown = Object.keys(rest)[0];

@@ -5,12 +5,15 @@
 // its boxes and lines say.
 
 #include <array>
+#include <charconv>
 #include <cmath>
 #include <cstddef>
 #include <exception>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/LaterSide.h>
@@ -106,6 +109,20 @@ draw::DrawingOptions drawingOf(const PictureRequest& request, const draw::Drawin
     return options;
 }
 
+// "3 4 7"
+std::vector<picture::Index> placesIn(std::string_view text) {
+    std::vector<picture::Index> places;
+    while (!text.empty()) {
+        picture::Index place = 0;
+        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), place);
+        if (error != std::errc()) throw std::invalid_argument("a part that is no list of boxes");
+        places.push_back(place);
+        text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+        if (!text.empty()) text.remove_prefix(1);
+    }
+    return places;
+}
+
 // Lengths and sizes are in thousandths, as JavaScript divides them.
 std::string sheetsJson(const draw::PaperDrawing& drawn) {
     const draw::SheetPlan& plan = drawn.drawing.plan;
@@ -147,14 +164,21 @@ const char* refusal() {
 
 using namespace olvane;
 
-// With the picture's options, sizes apart; boxes is one of Boxes. Null for a picture that is refused; last_text then says why.
+// With the picture's options, sizes apart; boxes is one of Boxes. Where part names boxes
+// by their places, "3 4 7", the picture ends around them.
+// Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_svg")
 const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
-                      const char* title) {
+                      const char* title, const char* part) {
     try {
         const js::PictureRequest request = js::requestInOnePiece(focus - 1, static_cast<js::Boxes>(boxes));
         const draw::DrawingContent content = js::contentOf(*file, request, facts);
-        js::lastText = draw::drawSvg(content, js::drawingOf(request, content, theme, title)).svg;
+        const draw::DrawingOptions options = js::drawingOf(request, content, theme, title);
+        draw::SvgPicture picture = draw::drawSvg(content, options);
+        const std::vector<picture::Index> shown = js::placesIn(part);
+        if (!shown.empty())
+            picture = draw::partOf(picture, draw::areaAround(content.picture, shown), options.title);
+        js::lastText = std::move(picture.svg);
         return js::lastText.c_str();
     } catch (...) {
         return js::refusal();

@@ -99,6 +99,8 @@ private:
         }
         const int headline = options_.headline ? kHeadlineHeight : 0;
         frame_ = {left, top, kMargin, kMargin + headline};
+        svg_.originX = frame_.x(0);
+        svg_.originY = frame_.y(0);
         svg_.width = static_cast<int>(std::ceil(std::min(1e9, (right - left) * Frame::kScale))) + 2 * kMargin;
         svg_.height = static_cast<int>(std::ceil(std::min(1e9, (bottom - top) * Frame::kScale))) +
                       2 * kMargin + headline;

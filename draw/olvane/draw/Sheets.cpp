@@ -12,6 +12,7 @@
 #include <optional>
 
 #include <olvane/draw/DrawingWordsInternal.h>
+#include <olvane/draw/PicturePartInternal.h>
 #include <olvane/draw/SheetMapInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/TextFit.h>
@@ -31,38 +32,8 @@ constexpr double kPxOfMm = 96 / 25.4;
 constexpr double kTick = 4 * kPxOfMm;
 constexpr double kTriangle = 2 * kPxOfMm;
 constexpr double kFootSize = 10;
-constexpr double kStrokeRoom = 8;  // px; more than any stroke is wide
-constexpr double kMapAbove = 4;    // millimetres between a map and the picture below it
+constexpr double kMapAbove = 4;  // millimetres between a map and the picture below it
 constexpr const char* kGrey = "#666666";
-
-bool shows(const PictureArea& window, const PictureArea& area) {
-    return area.x <= window.x + window.width && area.x + area.width >= window.x &&
-           area.y <= window.y + window.height && area.y + area.height >= window.y;
-}
-
-// With the halves of its width beside it.
-PictureArea inked(const PictureArea& stroke) {
-    return {stroke.x - kStrokeRoom, stroke.y - kStrokeRoom, stroke.width + 2 * kStrokeRoom,
-            stroke.height + 2 * kStrokeRoom};
-}
-
-// The elements of a picture, without its prologue, so that another one can hold it, and without the strokes
-// and boxes that the window does not show.
-std::string elementsWithin(const SvgPicture& picture, const PictureArea& window) {
-    std::size_t done = picture.svg.find("<svg");
-    std::string elements;
-    const auto leaveOut = [&](const PictureBox& piece) {
-        elements.append(picture.svg, done, piece.start - done);
-        done = piece.start + piece.length;
-    };
-    for (const PictureBox& stroke : picture.strokes) {
-        if (!shows(window, inked(stroke.area))) leaveOut(stroke);
-    }
-    for (const PictureBox& box : picture.boxes) {
-        if (!shows(window, box.area)) leaveOut(box);
-    }
-    return elements.append(picture.svg, done);
-}
 
 // One sheet with what stands on it, in px.
 class SheetArtist {

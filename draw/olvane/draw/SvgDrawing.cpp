@@ -105,6 +105,8 @@ public:
         const Bounds bounds = boundsOf(content_.picture);
         const int headline = options_.headline ? kHeadlineHeight : 0;
         frame_ = {bounds.left, bounds.top, kMargin, kMargin + headline};
+        picture_.originX = frame_.x(0);
+        picture_.originY = frame_.y(0);
         picture_.width = wholePx((bounds.right - bounds.left) * Frame::kScale) + 2 * kMargin;
         picture_.height = wholePx((bounds.bottom - bounds.top) * Frame::kScale) + 2 * kMargin + headline;
 

@@ -6,6 +6,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <functional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -83,6 +84,8 @@ struct SvgPicture {
     std::vector<PictureBox> strokes;
     std::vector<PictureArea> lines;  // every stroke of a line; those have no width or no height
     PictureArea legend;              // of no size where there is none
+    double originX = 0;              // where the point (0, 0) of the layout lies
+    double originY = 0;
     TextSizes text;
 };
 
@@ -96,5 +99,17 @@ std::string titleOf(std::string_view view, const DrawingContent& content,
 // Holds: the same content gives the same bytes. Texts stay texts; they are measured and fit into their boxes.
 //        Nothing in a label or title becomes markup. A picture without boxes is a page that says so.
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options);
+
+// Where some boxes of a picture stand, by their places in it, with half a gap around them; in points.
+//
+// Fails: std::out_of_range for a place of no box.
+PictureArea areaAround(const picture::Picture& picture, std::span<const picture::Index> boxes);
+
+// A part of a picture: the same elements, without the boxes and strokes that lie outside of it.
+//
+// Units: the part is in points of the layout, like the boxes of a picture::Picture, and is cut to the picture's edges.
+// Holds: the picture was drawn with the scale 1.
+// Fails: std::invalid_argument for a part that shows nothing of the picture, or is not finite.
+SvgPicture partOf(const SvgPicture& picture, const PictureArea& part, const std::string& title);
 
 }  // namespace olvane::draw

@@ -69,8 +69,19 @@ describe("accessible", kTwoAtOnce, () => {
 
     test("with text of twice the size nothing is cut off or lies outside the window", async () => {
         const visit = await visitDarwins("#person=I1", { viewport: { width: 1280, height: 900 } });
+        const sizes = () =>
+            visit.page.evaluate(() =>
+                [".bar h1", "#search", "#side-panel h2", "#side-panel dt", "#legend summary", "#view-family span"].map(
+                    (part) => parseFloat(getComputedStyle(one(part)).fontSize),
+                ),
+            );
+        const usual = await sizes();
         await visit.page.evaluate(() => (document.documentElement.style.fontSize = "200%"));
         await visit.still();
+        assert.deepEqual(
+            await sizes(),
+            usual.map((size) => 2 * size),
+        );
         const outside = await visit.page.evaluate(() =>
             [...all(".bar button, .bar input, .zoom button, #side-panel h2")]
                 .filter((part) => part.offsetParent !== null)

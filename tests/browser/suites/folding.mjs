@@ -147,6 +147,31 @@ describe("folding", kTwoAtOnce, () => {
         }
     });
 
+    test("in another language the words of a kinship change with all else, and the picture stays", async () => {
+        const visit = await visitDarwins("#person=I1&view=kinship&to=I12");
+        const captions = () => visit.page.locator("#tree .caption text").allTextContents();
+        assert.deepEqual((await captions()).sort(), ["father", "son"]);
+        const before = await visit.placing();
+        await visit.click("#options-button");
+        await visit.page.selectOption("#language", "de");
+        await visit.still();
+        assert.deepEqual((await captions()).sort(), ["Sohn", "Vater"]);
+        assert.equal(await visit.page.locator(".corner .ways li").first().innerText(), "Vater");
+        assert.deepEqual(await visit.placing(), before);
+        await visit.end();
+    });
+
+    test("on a phone the picture of a kinship is not hidden by the panel that led to it", async () => {
+        const visit = await visitDarwins("#person=I1", kPhone);
+        await visit.page.tap('#tree [data-xref="I12"] .frame');
+        await visit.page.tap("#side-panel .handle");
+        await visit.page.tap("#how-related");
+        await visit.still();
+        assert.match(await visit.hash(), /view=kinship/);
+        assert.equal(await visit.page.locator("#side-panel.drawn").count(), 0);
+        await visit.end();
+    });
+
     test("every way between two persons is listed in words, each a link to the picture of them", async () => {
         const visit = await visitDarwins("#person=I1");
         await visit.handle("I2").click();

@@ -114,6 +114,83 @@ describe("saving", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("what is in sight is saved alone, as SVG and as PNG", async () => {
+        const visit = await visitDarwins("#person=I1");
+        await visit.click("#home");
+        for (let i = 0; i < 4; ++i) await visit.click("#zoom-in");
+        // A box is in sight when a piece of it lies within the window.
+        const seen = await visit.page.evaluate(() => {
+            const window = one("#tree").getBoundingClientRect();
+            const isSeen = (frame) => {
+                const { left, right, top, bottom } = frame.getBoundingClientRect();
+                return right > window.left && left < window.right && bottom > window.top && top < window.bottom;
+            };
+            const frames = [...all("#tree .boxes > g[data-xref] .frame")].filter(isSeen);
+            return frames.map((frame) => frame.getAttribute("aria-label").split(",")[0]);
+        });
+        const whole = await parsed(visit, (await save(visit, "#save-svg")).bytes.toString("utf8"));
+        await visit.click("#file-button");
+        await visit.click("#save-in-sight");
+        await visit.page.keyboard.press("Escape");
+        const part = await parsed(visit, (await save(visit, "#save-svg")).bytes.toString("utf8"));
+        assert.equal(part.error, null);
+        assert.ok(seen.length > 1, seen.join());
+        for (const name of seen)
+            assert.ok(
+                part.boxes.some((title) => title.startsWith(name)),
+                `${name}: ${part.boxes}`,
+            );
+        assert.ok(part.boxes.length < whole.boxes.length / 4, `${part.boxes.length} of ${whole.boxes.length}`);
+        assert.ok(
+            part.size.every((side, i) => side < whole.size[i]),
+            `${part.size} of ${whole.size}`,
+        );
+        const { bytes } = await save(visit, "#save-png");
+        assert.deepEqual(
+            [bytes.readUInt32BE(16), bytes.readUInt32BE(20)],
+            part.size.map((side) => 2 * side),
+        );
+        await visit.end();
+    });
+
+    test("sheets have a scale as the command has it, and are saved as PNG of so many pixels an inch", async () => {
+        const visit = await visitDarwins("#person=I1&view=descendants&down=1");
+        const { page } = visit;
+        const message = () => page.evaluate(() => one("#sheet-message").textContent);
+        await visit.click("#file-button");
+        await visit.click("#print-sheets");
+        assert.match(await page.getAttribute("#sheet-scale", "placeholder"), /^as large as fits: 0\.\d/);
+        const scale = async (value) => {
+            await page.fill("#sheet-scale", value);
+            await page.press("#sheet-scale", "Tab");
+        };
+        await scale("0.02");
+        assert.match(await message(), /^1 sheet, .*Too small to read/);
+        await scale("1");
+        const sheets = Number(/^(\d+) sheets/.exec(await message())[1]);
+        assert.ok(sheets > 1, await message());
+        assert.ok(!/Too small/.test(await message()));
+        assert.ok(await page.isDisabled("#sheet-rows"));
+        await page.selectOption("#sheet-dpi", "96");
+        const downloads = [];
+        page.on("download", (download) => downloads.push(download));
+        await page.click("#sheets-png");
+        for (let tries = 0; downloads.length < sheets && tries < 100; ++tries) await page.waitForTimeout(50);
+        assert.deepEqual(
+            downloads.map((one) => one.suggestedFilename()),
+            Array.from({ length: sheets }, (_, i) => `darwin-wedgwood - Charles Robert Darwin-${i + 1}.png`),
+        );
+        const bytes = readFileSync(await downloads[0].path());
+        // A4 at 96 pixels an inch, upright or across.
+        assert.deepEqual([bytes.readUInt32BE(16), bytes.readUInt32BE(20)].sort(), [1122, 793]);
+        await scale("100");
+        assert.match(await message(), /more than 1,000 sheets/);
+        assert.ok(await page.isDisabled("#print-now"));
+        await scale("");
+        assert.match(await message(), /^1 sheet, /);
+        await visit.end();
+    });
+
     test("the whole picture is printed on one sheet, in the colours of paper", async () => {
         const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
         const { page } = visit;

@@ -430,15 +430,20 @@ export class OlvaneTree extends HTMLElement {
         this.panel.draw(false);
     }
 
-    /** The whole picture as the text of an SVG file, in the colours of the viewer; null before any. */
-    saveSvg(): string | null {
-        return this.drawing(this.dataset["theme"] === "dark" ? "dark" : "light");
+    /** The whole picture, or what of it is in sight, as the text of an SVG file in the viewer's colours; null before any. */
+    saveSvg(inSight = false): string | null {
+        return this.drawing(this.dataset["theme"] === "dark" ? "dark" : "light", inSight);
     }
 
-    /** The whole picture as the text of an SVG file; null before any. */
-    drawing(theme: DrawingTheme): string | null {
+    /** The whole picture, or what of it is in sight, as the text of an SVG file; null before any. Throws LayoutError. */
+    drawing(theme: DrawingTheme, inSight = false): string | null {
         const { opened, shownState } = this;
-        return opened && shownState && this.picture ? opened.svg(shownState, theme, this.reader) : null;
+        if (!opened || !shownState || !this.picture) return null;
+        return opened.svg(shownState, theme, this.reader, inSight ? this.boxesInSight() : undefined);
+    }
+
+    private boxesInSight(): number[] {
+        return this.picture?.boxesWithin(this.scene.camera.shown).map(({ index }) => index) ?? [];
     }
 
     /** The whole picture on sheets of paper, in its colours; null before any. */
@@ -471,6 +476,17 @@ export class OlvaneTree extends HTMLElement {
         this.messages = messagesFor(language);
         this.ui = uiMessagesFor(language);
         this.rebuildUi();
+        this.showWays();
+    }
+
+    // Kinship is put into words with the picture, so another language needs another one.
+    private showWays(): void {
+        const { opened, shownState, sight } = this;
+        if (opened && shownState && this.picture?.kinship) {
+            this.picture = null;
+            this.show({});
+            this.sight = sight;
+        }
         this.corner.showWays(this.picture?.kinship?.ways ?? []);
     }
 
@@ -489,7 +505,10 @@ export class OlvaneTree extends HTMLElement {
                 this.focusOn(person);
                 this.takeKeys();
             },
-            relate: (person) => void this.show({ view: "kinship", to: person }, null, true),
+            relate: (person) => {
+                this.show({ view: "kinship", to: person }, null, true);
+                this.panel.draw(false);
+            },
             waysAddressOf: (person) =>
                 addressOf({ ...this.shownState!, view: "kinship", to: person }, this.opened!.persons),
             nextBox: (person) => this.nextBox(person),

@@ -134,17 +134,24 @@ export const uiGerman: UiMessages = {
         purposes: {
             grandparents: "Großeltern und alle darunter auf A4",
             ancestors: "Alle Vorfahren auf A3",
-            descendants: "Alle Nachfahren auf zwei A3",
+            descendants: "Alle Nachkommen auf zwei A3",
             everybody: "Alle als Poster A0",
         },
         letter: "Letter (US-Brief)",
         rows: "Reihen von Blättern",
         columns: "Spalten von Blättern",
+        scale: "Maßstab, auf so vielen Blättern wie nötig",
+        scaleFits: "so groß es passt",
+        dpi: "Pixel je Zoll eines PNG",
+        savePng: "Als PNG sichern",
+        tooSmall: "Zu klein zum Lesen: größeres Papier, mehr Blätter oder ein größerer Maßstab helfen.",
+        tooMany: "Das sind mehr als 1000 Blätter. Größeres Papier oder ein kleinerer Maßstab hilft.",
         names: (sheets, points) =>
             `${sheets} ${sheets === 1 ? "Blatt" : "Blätter"}, Namen mit mindestens ${points} Punkt.`,
         cut: (boxes) =>
             boxes === 1 ? "1 Kasten steht auf keinem Blatt ganz." : `${boxes} Kästen stehen auf keinem Blatt ganz.`,
     },
+    inSight: "Nur sichern, was zu sehen ist",
     saved: (name) => `Gesichert als ${name}.`,
     savedSmaller: (name, percent) =>
         `Gesichert als ${name}, in ${percent} % der Größe: größer zeichnen Browser nicht. SVG hat keine Grenze.`,

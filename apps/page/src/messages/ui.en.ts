@@ -139,10 +139,17 @@ export const uiEnglish: UiMessages = {
         letter: "Letter",
         rows: "Rows of sheets",
         columns: "Columns of sheets",
+        scale: "Scale, on as many sheets as it takes",
+        scaleFits: "as large as fits",
+        dpi: "Pixels an inch of a PNG",
+        savePng: "Save as PNG",
+        tooSmall: "Too small to read: take larger paper, more sheets or a larger scale.",
+        tooMany: "That takes more than 1,000 sheets. Take larger paper or a smaller scale.",
         names: (sheets, points) =>
             `${sheets} ${sheets === 1 ? "sheet" : "sheets"}, names of at least ${points} points.`,
         cut: (boxes) => (boxes === 1 ? "1 box is on no sheet whole." : `${boxes} boxes are on no sheet whole.`),
     },
+    inSight: "Save only what is in sight",
     saved: (name) => `Saved as ${name}.`,
     savedSmaller: (name, percent) =>
         `Saved as ${name}, at ${percent} % of its size: browsers draw no larger one. SVG has no such limit.`,

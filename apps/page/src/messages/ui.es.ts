@@ -144,6 +144,12 @@ export const uiSpanish: UiMessages = {
         letter: "Carta",
         rows: "Filas de hojas",
         columns: "Columnas de hojas",
+        scale: "Escala, en tantas hojas como hagan falta",
+        scaleFits: "lo mayor que quepa",
+        dpi: "Píxeles por pulgada de un PNG",
+        savePng: "Guardar como PNG",
+        tooSmall: "Demasiado pequeño para leer: elija un papel mayor, más hojas o una escala mayor.",
+        tooMany: "Hacen falta más de 1000 hojas. Elija un papel mayor o una escala menor.",
         names: (sheets, points) =>
             `${sheets} ${sheets === 1 ? "hoja" : "hojas"}, nombres de al menos ${points} puntos.`,
         cut: (boxes) =>
@@ -151,6 +157,7 @@ export const uiSpanish: UiMessages = {
                 ? "1 recuadro no está entero en ninguna hoja."
                 : `${boxes} recuadros no están enteros en ninguna hoja.`,
     },
+    inSight: "Guardar solo lo que se ve",
     saved: (name) => `Guardado como ${name}.`,
     savedSmaller: (name, percent) =>
         `Guardado como ${name}, al ${percent} % de su tamaño: los navegadores no dibujan nada mayor. SVG no tiene ese límite.`,

@@ -118,9 +118,17 @@ export interface UiMessages {
         readonly letter: string;
         readonly rows: string;
         readonly columns: string;
+        readonly scale: string;
+        readonly scaleFits: string;
+        readonly dpi: string;
+        readonly savePng: string;
+        readonly tooSmall: string;
+        readonly tooMany: string;
         readonly names: (sheets: number, points: string) => string;
         readonly cut: (boxes: number) => string;
     };
+    /** A switch: files have the part of the picture that is in sight, and no more. */
+    readonly inSight: string;
     readonly saved: (name: string) => string;
     readonly savedSmaller: (name: string, percent: number) => string;
     readonly pictureFailed: string;

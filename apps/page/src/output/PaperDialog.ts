@@ -3,7 +3,7 @@
 
 // Asks for the paper to print on, one sheet or several that make a poster, and shows how the picture lies on them.
 
-import type { PaperOptions, PaperSheets } from "olvane";
+import { LayoutError, type PaperOptions, type PaperSheets } from "olvane";
 import { iconButton } from "../base/controls";
 import { html, onClick } from "../base/dom";
 import type { UiMessages } from "../messages/ui";
@@ -12,6 +12,10 @@ import { svgBlob } from "./saving";
 
 const kPapers = ["A4", "A3", "A2", "A1", "A0", "letter"] as const;
 const kMostOneWay = 10; // sheets
+const kMostShown = 100; // sheets of a preview
+const kReadableName = 4; // points
+const kResolutions = [96, 150, 192, 300, 600] as const; // pixels an inch
+const kUsualResolution = 192;
 
 /** What is often printed: a view, and the paper for it. */
 const kPurposes = {
@@ -28,20 +32,25 @@ export class PaperDialog {
     private readonly paper = html("select", { id: "paper" });
     private readonly rows = html("select", { id: "sheet-rows" });
     private readonly columns = html("select", { id: "sheet-columns" });
+    private readonly scale = html("input", { id: "sheet-scale", type: "number", min: 0.01, max: 100, step: "any" });
+    private readonly dpi = html("select", { id: "sheet-dpi" });
     private readonly preview = html("div", { class: "sheet-preview", "aria-hidden": "true" });
     private readonly message = html("p", { id: "sheet-message", role: "status" });
     private readonly print = html("button", { id: "print-now", type: "button", class: "plain" });
+    private readonly png = html("button", { id: "sheets-png", type: "button", class: "plain" });
     private addresses: string[] = [];
     private shown: PaperSheets | null = null;
 
-    // sheetsOf gives what is shown on that paper, or null before any family is open; look shows another view.
+    // sheetsOf gives what is shown on that paper, or null before any family is open; look shows another view, and
+    // save hands the sheets to the browser's downloads as PNG of so many pixels an inch.
     constructor(
         private readonly ui: UiMessages,
         private readonly sheetsOf: (paper: PaperOptions) => PaperSheets | null,
         private readonly look: (wanted: Partial<ViewState>) => void,
+        private readonly save: (sheets: PaperSheets, dpi: number) => Promise<void>,
     ) {
         const close = iconButton("print-dialog-close", "close", ui.close, () => this.element.close());
-        const choice = (label: string, select: HTMLSelectElement) =>
+        const choice = (label: string, select: HTMLElement) =>
             html("label", { class: "row" }, html("span", {}, label), select);
         this.element = html(
             "dialog",
@@ -51,25 +60,37 @@ export class PaperDialog {
             choice(ui.paper.paper, this.paper),
             choice(ui.paper.rows, this.rows),
             choice(ui.paper.columns, this.columns),
+            choice(ui.paper.scale, this.scale),
             this.preview,
             this.message,
-            this.print,
+            choice(ui.paper.dpi, this.dpi),
+            html("div", { class: "dialog-foot" }, this.print, this.png),
         );
+        this.fillChoices();
+        for (const input of [this.paper, this.rows, this.columns, this.scale])
+            input.addEventListener("change", () => this.show());
+        this.purpose.addEventListener("change", () => this.choosePurpose());
+        this.print.textContent = ui.paper.print;
+        this.png.textContent = ui.paper.savePng;
+        onClick(this.print, () => window.print());
+        onClick(this.png, () => void this.savePng());
+        this.element.addEventListener("close", () => this.empty());
+    }
+
+    private fillChoices(): void {
+        const { ui } = this;
         this.purpose.append(html("option", { value: "" }, ui.paper.shown));
         for (const value of Object.keys(kPurposes) as Purpose[])
             this.purpose.append(html("option", { value }, ui.paper.purposes[value]));
-        this.purpose.addEventListener("change", () => this.choosePurpose());
         for (const value of kPapers) {
             this.paper.append(html("option", { value }, value === "letter" ? ui.paper.letter : value));
         }
         for (const select of [this.rows, this.columns]) {
             for (let i = 1; i <= kMostOneWay; ++i) select.append(html("option", { value: i }, String(i)));
         }
-        for (const select of [this.paper, this.rows, this.columns])
-            select.addEventListener("change", () => this.show());
-        this.print.textContent = ui.paper.print;
-        onClick(this.print, () => window.print());
-        this.element.addEventListener("close", () => this.empty());
+        for (const value of kResolutions) this.dpi.append(html("option", { value }, String(value)));
+        this.dpi.value = String(kUsualResolution);
+        this.scale.placeholder = ui.paper.scaleFits;
     }
 
     /** What is to be printed while the dialog is open; null else. */
@@ -89,32 +110,45 @@ export class PaperDialog {
         this.paper.value = chosen.paper;
         this.rows.value = String(chosen.rows);
         this.columns.value = String(chosen.columns);
+        this.scale.value = "";
         this.look(chosen.shows);
         this.show();
     }
 
+    // A scale takes as many sheets as it needs, whatever rows and columns say.
     private show(): void {
         this.empty();
+        const scale = this.scale.validity.valid ? Number(this.scale.value) : 0;
+        this.rows.disabled = this.columns.disabled = scale > 0;
         try {
             this.shown = this.sheetsOf({
                 paper: this.paper.value,
                 rows: Number(this.rows.value),
                 columns: Number(this.columns.value),
+                scale,
             });
-        } catch {
-            this.message.textContent = this.ui.pictureFailed;
+        } catch (error) {
+            const isTooLarge = error instanceof LayoutError && error.status === "tooLarge";
+            this.message.textContent = isTooLarge ? this.ui.paper.tooMany : this.ui.pictureFailed;
         }
-        this.print.disabled = this.shown === null;
+        this.print.disabled = this.png.disabled = this.shown === null;
         if (this.shown) this.showSheets(this.shown);
     }
 
-    private showSheets({ width, height, smallestName, cutBoxes, sheets }: PaperSheets): void {
+    private async savePng(): Promise<void> {
+        if (!this.shown) return;
+        this.png.disabled = true;
+        await this.save(this.shown, Number(this.dpi.value));
+        this.png.disabled = false;
+    }
+
+    private showSheets({ width, height, scale, smallestName, cutBoxes, sheets }: PaperSheets): void {
         const columns = Math.max(...sheets.map(({ column }) => column)) + 1;
         const rows = Math.max(...sheets.map(({ row }) => row)) + 1;
         // As wide as the dialog, or as high as a third of the window.
         this.preview.style.gridTemplateColumns = `repeat(${columns}, minmax(0, 1fr))`;
         this.preview.style.maxWidth = `calc(38vh * ${(columns * width) / (rows * height)})`;
-        for (const { row, column, svg } of sheets) {
+        for (const { row, column, svg } of sheets.slice(0, kMostShown)) {
             const address = URL.createObjectURL(svgBlob(svg));
             this.addresses.push(address);
             const image = html("img", { src: address, alt: "" });
@@ -125,7 +159,10 @@ export class PaperDialog {
         const { paper, language } = this.ui;
         const points = smallestName.toLocaleString(language, { maximumFractionDigits: 1 });
         const cut = cutBoxes > 0 ? " " + paper.cut(cutBoxes) : "";
-        this.message.textContent = paper.names(sheets.length, points) + cut;
+        const small = smallestName > 0 && smallestName < kReadableName ? " " + paper.tooSmall : "";
+        this.message.textContent = paper.names(sheets.length, points) + small + cut;
+        const fitting = scale.toLocaleString(language, { maximumFractionDigits: 2 });
+        this.scale.placeholder = `${paper.scaleFits}: ${fitting}`;
     }
 
     private empty(): void {

@@ -9,14 +9,17 @@ import type { Notices } from "../ui/Notices";
 import type { ViewState } from "../view/ViewState";
 import { PaperDialog } from "./PaperDialog";
 import { PrintSheet } from "./printing";
-import { pngOf, saveFile, svgBlob } from "./saving";
+import { drawingElement, pngOf, saveFile, type Size, svgBlob } from "./saving";
+
+const kSharpness = 2; // pixels for a px of the drawing
+const kInch = 25.4; // millimetres
 
 export interface Subject {
     // Of a file, without its ending.
     readonly name: string;
     readonly title: string;
-    // The text of an SVG file.
-    drawing(theme: DrawingTheme): string;
+    // The text of an SVG file, of the whole picture or of what is in sight.
+    drawing(theme: DrawingTheme, inSight?: boolean): string;
     // On paper, in the colours of paper.
     sheets(paper: PaperOptions): PaperSheets | null;
     // Shows another view in its place.
@@ -46,6 +49,7 @@ export class PictureOutput {
             ui,
             (paper) => this.subject()?.sheets(paper) ?? null,
             (wanted) => this.subject()?.look(wanted),
+            (sheets, dpi) => this.saveSheets(ui, sheets, dpi),
         );
         return this.paper.element;
     }
@@ -54,22 +58,52 @@ export class PictureOutput {
         if (this.subject()) this.paper?.open();
     }
 
-    saveSvg(ui: UiMessages): void {
+    saveSvg(ui: UiMessages, inSight: boolean): void {
         const subject = this.subject();
         if (!subject) return;
         const name = subject.name + ".svg";
-        saveFile(name, svgBlob(subject.drawing(screenTheme())));
-        this.notices.show(ui.saved(name));
+        void this.attempt(ui, () => {
+            saveFile(name, svgBlob(subject.drawing(screenTheme(), inSight)));
+            this.notices.show(ui.saved(name));
+        });
     }
 
-    async savePng(ui: UiMessages): Promise<void> {
+    async savePng(ui: UiMessages, inSight: boolean): Promise<void> {
         const subject = this.subject();
         if (!subject) return;
-        const name = subject.name + ".png";
+        await this.attempt(ui, async () => {
+            const drawing = subject.drawing(screenTheme(), inSight);
+            const { width, height } = drawingElement(drawing);
+            await this.saveAsPng(ui, subject.name + ".png", drawing, {
+                width: width * kSharpness,
+                height: height * kSharpness,
+            });
+        });
+    }
+
+    // Several are numbered, as the command numbers its files.
+    private async saveSheets(ui: UiMessages, { width, height, sheets }: PaperSheets, dpi: number): Promise<void> {
+        const subject = this.subject();
+        if (!subject) return;
+        const digits = String(sheets.length).length;
+        const pixels = { width: (width / kInch) * dpi, height: (height / kInch) * dpi };
+        await this.attempt(ui, async () => {
+            for (const [i, { svg }] of sheets.entries()) {
+                const number = sheets.length > 1 ? "-" + String(i + 1).padStart(digits, "0") : "";
+                await this.saveAsPng(ui, `${subject.name}${number}.png`, svg, pixels);
+            }
+        });
+    }
+
+    private async saveAsPng(ui: UiMessages, name: string, drawing: string, size: Size): Promise<void> {
+        const { blob, part } = await pngOf(drawing, size);
+        saveFile(name, blob);
+        this.notices.show(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
+    }
+
+    private async attempt(ui: UiMessages, save: () => void | Promise<void>): Promise<void> {
         try {
-            const { blob, part } = await pngOf(subject.drawing(screenTheme()));
-            saveFile(name, blob);
-            this.notices.show(part < 1 ? ui.savedSmaller(name, Math.round(part * 100)) : ui.saved(name));
+            await save();
         } catch {
             this.notices.fail(ui.pictureFailed, []);
         }

@@ -5,7 +5,6 @@
 
 import { html } from "../base/dom";
 
-const kSharpness = 2; // pixels for a px of the drawing
 const kMostSide = 12000; // px; beyond it some browsers hand out an empty canvas
 const kMostPixels = 100e6;
 
@@ -45,25 +44,30 @@ export function drawingElement(drawing: string): { svg: SVGSVGElement; width: nu
     return { svg, width, height };
 }
 
+export interface Size {
+    readonly width: number;
+    readonly height: number;
+}
+
 export interface Pixels {
     readonly blob: Blob;
-    // 1 for the full sharpness, less where that would be more than a browser can draw.
+    // 1 for all pixels that were asked for, less where that would be more than a browser can draw.
     readonly part: number;
 }
 
-export async function pngOf(drawing: string): Promise<Pixels> {
-    const { width, height } = drawingElement(drawing);
-    const most = Math.min(kSharpness, kMostSide / Math.max(width, height), Math.sqrt(kMostPixels / (width * height)));
+/** size is in pixels. */
+export async function pngOf(drawing: string, { width, height }: Size): Promise<Pixels> {
+    const part = Math.min(1, kMostSide / Math.max(width, height), Math.sqrt(kMostPixels / (width * height)));
     const canvas = html("canvas", {
-        width: Math.max(1, Math.floor(width * most)),
-        height: Math.max(1, Math.floor(height * most)),
+        width: Math.max(1, Math.floor(width * part)),
+        height: Math.max(1, Math.floor(height * part)),
     });
     const pen = canvas.getContext("2d");
     if (!pen) throw new Error("no canvas");
     pen.drawImage(await imageOf(svgBlob(drawing)), 0, 0, canvas.width, canvas.height);
     const blob = await new Promise<Blob | null>((done) => canvas.toBlob(done, "image/png"));
     if (!blob) throw new Error("no picture");
-    return { blob, part: Math.min(1, most / kSharpness) };
+    return { blob, part };
 }
 
 async function imageOf(blob: Blob): Promise<HTMLImageElement> {

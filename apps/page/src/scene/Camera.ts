@@ -66,6 +66,13 @@ export class Camera {
         return (this.surface as unknown as { __zoom: ZoomTransform }).__zoom;
     }
 
+    /** What of the picture is in the window, in its points. */
+    get shown(): Rectangle {
+        const { k, x, y } = this.placing;
+        const { width, height } = this.size;
+        return { left: -x / k, top: -y / k, right: (width - x) / k, bottom: (height - y) / k };
+    }
+
     // Asked for in every frame, so it is measured only when it has changed.
     get size(): { width: number; height: number } {
         return (this.measured ??= {

@@ -48,8 +48,8 @@ export class App {
             setKinshipInBoxes: (shown) => this.panels.setKinshipInBoxes(shown),
             togglePanel: () => this.panels.toggleSide(),
 
-            saveSvg: () => this.panels.output.saveSvg(this.page.ui),
-            savePng: () => void this.panels.output.savePng(this.page.ui),
+            saveSvg: (inSight) => this.panels.output.saveSvg(this.page.ui, inSight),
+            savePng: (inSight) => void this.panels.output.savePng(this.page.ui, inSight),
             choosePaper: () => this.panels.output.choosePaper(),
             print: () => window.print(),
         };

@@ -28,10 +28,11 @@ export interface ChromeActions extends ViewActions {
     back(): void;
     forward(): void;
     openFile(): void;
-    saveSvg(): void;
+    // The whole picture, or what of it is in sight.
+    saveSvg(inSight: boolean): void;
     copyLink(): void;
     setKept(isKept: boolean): void;
-    savePng(): void;
+    savePng(inSight: boolean): void;
     print(): void;
     choosePaper(): void;
     togglePanel(): void;
@@ -354,12 +355,14 @@ export class Chrome {
             });
             return button;
         };
+        const inSight = checkbox("save-in-sight", () => {});
         return html(
             "div",
             { id: "file-panel", class: "sheet", role: "region", "aria-label": ui.file },
             item("copy-link", ui.copyLink, () => actions.copyLink()),
-            item("save-svg", ui.saveSvg, () => actions.saveSvg()),
-            item("save-png", ui.savePng, () => actions.savePng()),
+            item("save-svg", ui.saveSvg, () => actions.saveSvg(inSight.checked)),
+            item("save-png", ui.savePng, () => actions.savePng(inSight.checked)),
+            switchRow(inSight, ui.inSight),
             item("print", ui.print, () => actions.print()),
             item("print-sheets", ui.paper.title, () => actions.choosePaper()),
             item("open-file", ui.openFile, () => actions.openFile()),

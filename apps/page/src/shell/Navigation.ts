@@ -13,7 +13,7 @@ import { linkOf } from "../view/SharedLink";
 import { addressOf, readAddress, sameState, unknownPersonIn, type ViewState } from "../view/ViewState";
 import { isMapAddress, mapComplaint } from "./MapHost";
 import type { Page } from "./Page";
-import type { Panels } from "./Panels";
+import { kFirstHint, type Panels } from "./Panels";
 
 export class Navigation {
     private isArriving = false; // the next picture is one that the history leads to
@@ -34,9 +34,13 @@ export class Navigation {
         const { tree, notices, firstHint, journey } = this.page;
         const on = <Name extends keyof OlvaneTreeEvents>(name: Name, act: (event: OlvaneTreeEvents[Name]) => void) =>
             tree.addEventListener(name, (event) => act(event as OlvaneTreeEvents[Name]));
-        on("select", () => firstHint.hide());
+        const wasUsed = (): void => {
+            firstHint.hide();
+            notices.clear(kFirstHint);
+        };
+        on("select", wasUsed);
         on("focuschange", ({ detail }) => {
-            if (detail.byUser) firstHint.hide();
+            if (detail.byUser) wasUsed();
             if (!this.isArriving) journey.add(addressOf(detail.state, tree.family!.persons));
             this.panels.showState();
         });

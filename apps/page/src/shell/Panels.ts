@@ -21,6 +21,7 @@ import { kThemeChoices, Theme, type ThemeChoice } from "./theme";
 import { Welcome } from "./Welcome";
 
 const kNarrow = "(max-width: 720px)"; // as in styles/shell.css
+export const kFirstHint = "first hint"; // the subject of a notice
 const kSoonChecked = 6000; // persons
 const kCheckDelay = 1500; // ms
 
@@ -216,7 +217,7 @@ export class Panels {
     /** Where a notice would lie over the picture, the hint has a row of its own. */
     showFirstHint(): void {
         const { notices, firstHint, ui } = this.page;
-        if (!matchMedia(kNarrow).matches) return notices.show(ui.firstHint);
+        if (!matchMedia(kNarrow).matches) return notices.show(ui.firstHint, kFirstHint);
         firstHint.show(ui);
         this.arrange();
     }
@@ -229,7 +230,7 @@ export class Panels {
         return {
             title: shownTitle,
             name: fileNameOf(fileName.replace(/\.[^.]*$/, ""), tree.nameOf(focus)),
-            drawing: (theme) => tree.drawing(theme) ?? "",
+            drawing: (theme, inSight) => tree.drawing(theme, inSight) ?? "",
             sheets: (paper) => tree.sheets(paper),
             look: (wanted) => void tree.show(wanted, null, true),
         };

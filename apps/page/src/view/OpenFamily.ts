@@ -5,6 +5,7 @@
 
 import type {
     BranchSize,
+    DrawingOptions,
     DrawingTheme,
     GedcomFamily as Family,
     GedcomFile,
@@ -57,8 +58,9 @@ export class OpenFamily {
     }
 
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
-    svg(state: ViewState, theme: DrawingTheme, reader: Reader): string {
-        return this.file.svg(state.focus, keeping(optionsOf(state, reader)), { theme, show: state.show });
+    // part names boxes by their index, around which the drawing ends.
+    svg(state: ViewState, theme: DrawingTheme, reader: Reader, part?: DrawingOptions["part"]): string {
+        return this.file.svg(state.focus, keeping(optionsOf(state, reader)), { theme, show: state.show, part });
     }
 
     sheets(state: ViewState, paper: PaperOptions, reader: Reader): PaperSheets {
