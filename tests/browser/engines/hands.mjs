@@ -26,6 +26,11 @@ export class Mouse extends Walk {
         return this.click(`#tree [data-xref="${xref}"] .frame`, 2);
     }
 
+    /** Sets a switch. */
+    check(selector) {
+        return this.act(selector);
+    }
+
     async search(text) {
         await this.act("#search");
         await this.type(text);
@@ -78,6 +83,11 @@ export class Keyboard extends Walk {
     async open(xref, keys) {
         await this.select(xref, keys);
         await this.press("Enter");
+    }
+
+    async check(selector) {
+        await this.tabTo(selector);
+        await this.press(" ");
     }
 
     async search(text) {

@@ -12,7 +12,7 @@ import { pathToFileURL } from "node:url";
 import { gzipSync } from "node:zlib";
 import { detailedFamily, gedcom } from "../support/families.mjs";
 import { kHands, Mouse } from "./hands.mjs";
-import { kDetailTasks, kHandless, kRemarkTasks, kTasks } from "./tasks.mjs";
+import { kDetailTasks, kHandless, kMediaTasks, kRemarkTasks, kTasks } from "./tasks.mjs";
 import { kEngines } from "./windows.mjs";
 
 const only = optionOf("--only");
@@ -63,6 +63,7 @@ const kFamilies = [
     [darwins, kTasks],
     [roses, kDetailTasks],
     [odd, kRemarkTasks],
+    [odd, kMediaTasks],
 ];
 
 // Another address each time, so that nothing of the task before is left.

@@ -4,9 +4,27 @@
 // What is to be done, in the words of whoever does it, with whatever hand. What a task returns is the same in every engine.
 
 import assert from "node:assert/strict";
-import { lineOf } from "../support/families.mjs";
+import { archiveOf } from "../support/archive.mjs";
+import { gedcom, lineOf } from "../support/families.mjs";
 
 const kLarge = lineOf(20_000);
+const kPixel = "iVBORw0KGgoAAAANSUhEUgAAAAEAAAABCAYAAAAfFcSJAAAADUlEQVR42mNk+M9QDwADhgGAWjR9awAAAABJRU5ErkJggg==";
+const kArchive = archiveOf([
+    [
+        "gedcom.ged",
+        Buffer.from(
+            gedcom(
+                "0 @I1@ INDI",
+                "1 NAME Ada /Frame/",
+                "1 OBJE",
+                "2 FILE portrait.png",
+                "3 FORM png",
+                "2 TITL Her portrait",
+            ),
+        ),
+    ],
+    ["portrait.png", Buffer.from(kPixel, "base64")],
+]).toString("base64");
 
 async function fatherOfFocus(walk) {
     const xref = await walk.window.evaluate(() => {
@@ -31,7 +49,7 @@ function seeing(view) {
 }
 
 // What the page hands to the browser's downloads: its name, and its text or its kind.
-async function saved(walk, button) {
+async function saved(walk, button, choice) {
     await walk.window.evaluate(() => {
         window.saved = null;
         HTMLAnchorElement.prototype.click = function () {
@@ -45,6 +63,7 @@ async function saved(walk, button) {
         };
     });
     await walk.act("#file-button");
+    if (choice) await walk.check(choice);
     await walk.act(button);
     await walk.until(() => window.saved !== null);
     return walk.window.evaluate(() => window.saved.split("\n")[0]);
@@ -129,6 +148,13 @@ export const kTasks = {
         await walk.until(() => all(".sheet-preview img").length > 1);
         return walk.text("#sheet-message");
     },
+    "exchange right and left": async (walk) => {
+        await walk.act("#views-button");
+        await walk.check("#mirrored");
+        await walk.until(() => location.hash.includes("mirror=yes"));
+        return walk.picture();
+    },
+    "save as SVG what is in sight": (walk) => saved(walk, "#save-svg", "#save-in-sight"),
     "save the picture as SVG": (walk) => saved(walk, "#save-svg"),
     "save the picture as PNG": (walk) => saved(walk, "#save-png"),
     "copy a link to what is seen": async (walk) => {
@@ -166,6 +192,27 @@ export const kDetailTasks = {
         await walk.act("#side-panel .sources summary");
         await walk.until(() => one("#side-panel .sources").open);
         return walk.text("#side-panel section.facts");
+    },
+};
+
+// Of an archive with photographs.
+export const kMediaTasks = {
+    "look at a photograph, and close it": async (walk) => {
+        await walk.window.evaluate((archive) => {
+            const transfer = new DataTransfer();
+            transfer.items.add(new File([Uint8Array.from(atob(archive), (one) => one.charCodeAt(0))], "frame.gdz"));
+            document.body.dispatchEvent(
+                new DragEvent("drop", { dataTransfer: transfer, bubbles: true, cancelable: true }),
+            );
+        }, kArchive);
+        await walk.until(() => one("#side-panel .photograph img")?.complete === true);
+        await drawPanel(walk);
+        await walk.act("#side-panel .photograph");
+        await walk.until(() => one(".enlarged")?.open === true);
+        const title = await walk.text(".enlarged p");
+        await walk.act(".enlarged button");
+        await walk.until(() => !one(".enlarged")?.open);
+        return title;
     },
 };
 

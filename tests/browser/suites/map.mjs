@@ -144,6 +144,36 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         await again.end();
     });
 
+    test("the map is mirrored by the switch, and whoever was in the middle stays there", async () => {
+        const visit = await visitEmpty();
+        await visit.choose("darwin.ged", sample("darwin-wedgwood.ged"));
+        await visit.untilFamily();
+        await visit.click("#views-button");
+        await visit.page.click("#choose-map");
+        await visit.page.waitForSelector("#map canvas", { state: "visible" });
+        await visit.page.focus("#map canvas");
+        await visit.page.keyboard.press("Home");
+        await visit.page.waitForFunction(() => /number=/.test(location.hash));
+        await visit.page.waitForTimeout(400);
+        const placeIn = (hash) => /map=([-\d.]+),([-\d.]+),.*number=(\d+)/.exec(hash).slice(1).map(Number);
+        const [x, y, number] = placeIn(await visit.hash());
+        const name = await visit.page.textContent("#map-card h2");
+        await visit.page.check("#mirrored"); // the list of views stays open
+
+        await visit.page.waitForFunction(() => location.hash.includes("mirror=yes"));
+        const turned = placeIn(await visit.hash());
+        assert.ok(Math.abs(turned[0] + x) < 2 && Math.abs(turned[1] - y) < 2, `${turned}, ${[x, y]}`);
+        assert.equal(turned[2], number);
+        assert.equal(await visit.page.textContent("#map-card h2"), name);
+        await photograph(visit, "map-mirrored");
+        // The way back leads to the map as it was.
+        await visit.page.keyboard.press("Escape");
+        await visit.page.click("#back");
+        await visit.page.waitForFunction(() => !location.hash.includes("mirror=yes"));
+        assert.equal(await visit.page.isChecked("#mirrored"), false);
+        await visit.end();
+    });
+
     test("browser and command make the same bytes of one family", async () => {
         const { text } = darwins();
         const { loadOlvane } = await import(`${process.env.OLVANE_SOURCES}/bindings/javascript/olvane.mjs`);

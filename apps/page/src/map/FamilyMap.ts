@@ -4,6 +4,7 @@
 // Everybody on a map: names, kin and places of persons, who are numbered from 0 in the order of rows and places.
 
 import { kChildMask, type MapArrays, type MapError, readMap } from "./mapBytes";
+import { mirroredMap } from "./mirroredMap";
 
 const kSurnameLast = 16; // of the flags
 const kSexes = ["male", "female", "other"] as const;
@@ -40,9 +41,9 @@ export class FamilyMap {
     private readonly asChild: UnionLists;
     private readonly decoder = new TextDecoder();
 
-    /** Throws MapError; see there. */
-    constructor(bytes: Uint8Array<ArrayBuffer>) {
-        const arrays = readMap(bytes);
+    /** Of bytes, which then are of no other use, or of arrays. Throws MapError; see there. */
+    constructor(source: Uint8Array<ArrayBuffer> | MapArrays) {
+        const arrays = source instanceof Uint8Array ? readMap(source) : source;
         this.arrays = arrays;
         this.count = arrays.x.length;
         this.personOf = new Uint32Array(this.count + 1);
@@ -59,6 +60,11 @@ export class FamilyMap {
                 for (let i = childStarts[u]!; i < childStarts[u + 1]!; ++i) add(children[i]! & kChildMask, u);
         });
         this.area = this.measured();
+    }
+
+    /** With right and left exchanged, and persons numbered anew. */
+    mirrored(): FamilyMap {
+        return new FamilyMap(mirroredMap(this.arrays));
     }
 
     /** Of somebody by their place in the data, from 1; kNobody for a number that is not there. */

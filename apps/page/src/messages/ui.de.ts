@@ -140,14 +140,13 @@ export const uiGerman: UiMessages = {
         letter: "Letter (US-Brief)",
         rows: "Reihen von Blättern",
         columns: "Spalten von Blättern",
-        scale: "Maßstab, auf so vielen Blättern wie nötig",
-        scaleFits: "so groß es passt",
+        scale: "Maßstab, statt Reihen und Spalten",
         dpi: "Pixel je Zoll eines PNG",
         savePng: "Als PNG sichern",
         tooSmall: "Zu klein zum Lesen: größeres Papier, mehr Blätter oder ein größerer Maßstab helfen.",
         tooMany: "Das sind mehr als 1000 Blätter. Größeres Papier oder ein kleinerer Maßstab hilft.",
-        names: (sheets, points) =>
-            `${sheets} ${sheets === 1 ? "Blatt" : "Blätter"}, Namen mit mindestens ${points} Punkt.`,
+        names: (sheets, points, scale) =>
+            `${sheets} ${sheets === 1 ? "Blatt" : "Blätter"}, Namen mit mindestens ${points} Punkt, Maßstab ${scale}.`,
         cut: (boxes) =>
             boxes === 1 ? "1 Kasten steht auf keinem Blatt ganz." : `${boxes} Kästen stehen auf keinem Blatt ganz.`,
     },

@@ -139,14 +139,13 @@ export const uiEnglish: UiMessages = {
         letter: "Letter",
         rows: "Rows of sheets",
         columns: "Columns of sheets",
-        scale: "Scale, on as many sheets as it takes",
-        scaleFits: "as large as fits",
+        scale: "Scale, in place of rows and columns",
         dpi: "Pixels an inch of a PNG",
         savePng: "Save as PNG",
         tooSmall: "Too small to read: take larger paper, more sheets or a larger scale.",
         tooMany: "That takes more than 1,000 sheets. Take larger paper or a smaller scale.",
-        names: (sheets, points) =>
-            `${sheets} ${sheets === 1 ? "sheet" : "sheets"}, names of at least ${points} points.`,
+        names: (sheets, points, scale) =>
+            `${sheets} ${sheets === 1 ? "sheet" : "sheets"}, names of at least ${points} points, scale ${scale}.`,
         cut: (boxes) => (boxes === 1 ? "1 box is on no sheet whole." : `${boxes} boxes are on no sheet whole.`),
     },
     inSight: "Save only what is in sight",

@@ -144,14 +144,13 @@ export const uiSpanish: UiMessages = {
         letter: "Carta",
         rows: "Filas de hojas",
         columns: "Columnas de hojas",
-        scale: "Escala, en tantas hojas como hagan falta",
-        scaleFits: "lo mayor que quepa",
+        scale: "Escala, en lugar de filas y columnas",
         dpi: "Píxeles por pulgada de un PNG",
         savePng: "Guardar como PNG",
         tooSmall: "Demasiado pequeño para leer: elija un papel mayor, más hojas o una escala mayor.",
         tooMany: "Hacen falta más de 1000 hojas. Elija un papel mayor o una escala menor.",
-        names: (sheets, points) =>
-            `${sheets} ${sheets === 1 ? "hoja" : "hojas"}, nombres de al menos ${points} puntos.`,
+        names: (sheets, points, scale) =>
+            `${sheets} ${sheets === 1 ? "hoja" : "hojas"}, nombres de al menos ${points} puntos, escala ${scale}.`,
         cut: (boxes) =>
             boxes === 1
                 ? "1 recuadro no está entero en ninguna hoja."

@@ -119,12 +119,11 @@ export interface UiMessages {
         readonly rows: string;
         readonly columns: string;
         readonly scale: string;
-        readonly scaleFits: string;
         readonly dpi: string;
         readonly savePng: string;
         readonly tooSmall: string;
         readonly tooMany: string;
-        readonly names: (sheets: number, points: string) => string;
+        readonly names: (sheets: number, points: string, scale: string) => string;
         readonly cut: (boxes: number) => string;
     };
     /** A switch: files have the part of the picture that is in sight, and no more. */

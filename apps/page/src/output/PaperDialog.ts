@@ -90,7 +90,6 @@ export class PaperDialog {
         }
         for (const value of kResolutions) this.dpi.append(html("option", { value }, String(value)));
         this.dpi.value = String(kUsualResolution);
-        this.scale.placeholder = ui.paper.scaleFits;
     }
 
     /** What is to be printed while the dialog is open; null else. */
@@ -159,10 +158,9 @@ export class PaperDialog {
         const { paper, language } = this.ui;
         const points = smallestName.toLocaleString(language, { maximumFractionDigits: 1 });
         const cut = cutBoxes > 0 ? " " + paper.cut(cutBoxes) : "";
+        const size = scale.toLocaleString(language, { maximumFractionDigits: 2 });
         const small = smallestName > 0 && smallestName < kReadableName ? " " + paper.tooSmall : "";
-        this.message.textContent = paper.names(sheets.length, points) + small + cut;
-        const fitting = scale.toLocaleString(language, { maximumFractionDigits: 2 });
-        this.scale.placeholder = `${paper.scaleFits}: ${fitting}`;
+        this.message.textContent = paper.names(sheets.length, points, size) + small + cut;
     }
 
     private empty(): void {

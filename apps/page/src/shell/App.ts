@@ -39,6 +39,7 @@ export class App {
 
             setView: (view) => this.navigation.setView(view),
             setMap: () => this.navigation.setMap(),
+            setMirrored: (isMirrored) => this.navigation.setMirrored(isMirrored),
             back: () => this.page.journey.back(),
             forward: () => this.page.journey.forward(),
             copyLink: () => void this.navigation.copyLink(),

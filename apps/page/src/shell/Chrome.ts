@@ -201,8 +201,8 @@ export class Chrome {
     }
 
     // While the map is shown, no view of the tree is.
-    showMap(shown: boolean): void {
-        this.views.showMap(shown);
+    showMap(shown: boolean, isMirrored: boolean): void {
+        this.views.showMap(shown, isMirrored);
         if (shown)
             for (const view of ["family", "pedigree"] as const)
                 this.buttons[view].setAttribute("aria-pressed", "false");

@@ -34,6 +34,7 @@ export class MapHost {
     private search: MapSearch | null = null;
     private view: MapView | null = null;
     private home = 0;
+    private isTurned = false; // right and left are exchanged
     private timer = 0;
 
     constructor(private readonly page: MapPage) {}
@@ -53,7 +54,7 @@ export class MapHost {
     get address(): string {
         const { view } = this;
         if (!view) return "";
-        return `#map=${view.place}${view.number ? "&number=" + view.number : ""}`;
+        return `#map=${view.place}${view.number ? "&number=" + view.number : ""}${this.isTurned ? "&mirror=yes" : ""}`;
     }
 
     get number(): number {
@@ -62,11 +63,31 @@ export class MapHost {
 
     /** home is the number of the person whom the key Home leads to. Throws MapError. */
     take(bytes: Uint8Array<ArrayBuffer>, home: number): void {
-        this.map = new FamilyMap(bytes);
         this.home = home;
-        this.search = new MapSearch(this.map);
+        this.isTurned = false;
+        this.use(new FamilyMap(bytes));
+    }
+
+    private use(map: FamilyMap): void {
+        this.map = map;
+        this.search = new MapSearch(map);
         this.view = null;
         this.prepareSearch(this.search);
+    }
+
+    get isMirrored(): boolean {
+        return this.isTurned;
+    }
+
+    /** Exchanges right and left; what is in the middle of the window stays there. */
+    setMirrored(ui: UiMessages, isMirrored: boolean): void {
+        const { view, map, isTurned } = this;
+        if (!map || isMirrored === isTurned) return;
+        const place = view?.place.replace(/^-?/, (sign) => (sign ? "" : "-")) ?? "";
+        const number = this.number;
+        this.isTurned = isMirrored;
+        this.use(map.mirrored());
+        if (this.isShown) this.makeView(ui).restore(place, number);
     }
 
     forget(): void {
@@ -85,6 +106,7 @@ export class MapHost {
         if (!this.map) return;
         const parts = new URLSearchParams(address.replace(/^#/, ""));
         this.element.hidden = false;
+        this.setMirrored(ui, parts.get("mirror") === "yes");
         this.makeView(ui).restore(parts.get("map") ?? "", Number(parts.get("number")) || this.number);
     }
 

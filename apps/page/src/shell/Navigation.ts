@@ -118,7 +118,8 @@ export class Navigation {
         const { tree, maps, journey } = this.page;
         if (maps.isShown) return;
         if (!maps.isReady) return void this.layOutMap(address);
-        this.showMap(address || maps.address || `#map=&number=${tree.state?.focus ?? 0}`);
+        const turned = tree.state?.mirrored ? "&mirror=yes" : "";
+        this.showMap(address || maps.address || `#map=&number=${tree.state?.focus ?? 0}${turned}`);
         maps.takeKeys();
         journey.add(maps.address);
         this.panels.showState();
@@ -129,6 +130,16 @@ export class Navigation {
         maps.reveal(ui);
         this.panels.arrange();
         maps.show(ui, address);
+        this.panels.showState();
+    }
+
+    /** Exchanges right and left, of the map or of the tree. */
+    setMirrored(isMirrored: boolean): void {
+        const { maps, switches, journey, ui } = this.page;
+        if (!maps.isShown) return switches.setMirrored(isMirrored);
+        maps.setMirrored(ui, isMirrored);
+        journey.add(maps.address);
+        this.panels.showState();
     }
 
     private hideMap(): void {

@@ -181,7 +181,7 @@ export class Panels {
         const { isShown } = maps;
         const state = tree.state ?? (isShown ? kUsualState : null);
         if (state) this.chrome.showState(state, journey.canGoBack, journey.canGoForward);
-        this.chrome.showMap(isShown);
+        this.chrome.showMap(isShown, maps.isMirrored);
     }
 
     toggleSide(): void {

@@ -27,6 +27,8 @@ export interface ViewActions {
     setView(view: ViewName): void;
     /** Shows everybody as a map. */
     setMap(): void;
+    /** Exchanges right and left of what is shown. */
+    setMirrored(isMirrored: boolean): void;
 }
 
 export class ViewChooser {
@@ -61,7 +63,7 @@ export class ViewChooser {
         this.directionRow = html("label", { class: "row" }, html("span", {}, ui.direction), this.direction);
         this.compact = checkbox("compact", (checked) => switches.setCompact(checked));
         this.compactRow = switchRow(this.compact, ui.compact);
-        this.mirrored = checkbox("mirrored", (checked) => switches.setMirrored(checked));
+        this.mirrored = checkbox("mirrored", (checked) => actions.setMirrored(checked));
         for (const which of ["up", "down"] as const)
             this.depths.set(which, new Depth(which, ui, (n) => switches.setDepth(which, n)));
         this.popover = new Popover(
@@ -93,7 +95,8 @@ export class ViewChooser {
         this.compact.checked = compact;
     }
 
-    showMap(shown: boolean): void {
+    showMap(shown: boolean, isMirrored: boolean): void {
+        if (shown) this.mirrored.checked = isMirrored;
         this.map.setAttribute("aria-pressed", String(shown));
         if (shown) for (const button of this.buttons.values()) button.setAttribute("aria-pressed", "false");
     }
