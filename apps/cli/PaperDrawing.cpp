@@ -6,6 +6,8 @@
 #include <cstddef>
 #include <cstdio>
 
+#include <olvane/charts/BoxForm.h>
+
 #include <cli/UsageError.h>
 
 namespace olvane::cli {
@@ -13,13 +15,12 @@ namespace olvane::cli {
 draw::PaperDrawing drawOnPaper(const PaperOptions& paper, const LayoutRequest& request,
                                const ContentOf& contentOf, const DrawingOptionsOf& optionsOf) {
     draw::PaperSubject subject;
-    subject.folded = request.view() == View::everybody;
+    subject.folded = charts::foldsForPaper(request.view());
     subject.optionsOf = optionsOf;
     subject.contentOf = [&](double aspect) {
         if (aspect <= 0) return contentOf(request);
         LayoutRequest folded = request;
-        folded.chart.aspect = aspect;
-        folded.chart.compact = true;
+        charts::foldForPaper(folded.chart, aspect);
         return contentOf(folded);
     };
     try {

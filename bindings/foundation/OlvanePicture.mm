@@ -35,6 +35,8 @@ typedef id<OlvaneViewerManagerWrapProtocol> Source;
 // What an OlvanePicture holds.
 struct Arrays {
     picture::Picture picture;
+    charts::Direction direction = charts::Direction::down;
+    bool mirrored = false;
     std::vector<OlvaneBox> boxes;
     std::vector<OlvaneFamily> families;
     std::vector<OlvaneLine> lines;
@@ -137,8 +139,10 @@ OlvaneLine lineOf(const picture::Line& line) {
             line.child, line.firstBridge, line.bridgeCount};
 }
 
-std::unique_ptr<Arrays> arraysOf(picture::Picture made) {
+std::unique_ptr<Arrays> arraysOf(picture::Picture made, const charts::ChartRequest& chart) {
     auto arrays = std::make_unique<Arrays>();
+    arrays->direction = chart.direction;
+    arrays->mirrored = chart.mirrored;
     for (const picture::Box& box : made.boxes) arrays->boxes.push_back(boxOf(box));
     for (const picture::Family& family : made.families) {
         arrays->families.push_back(
@@ -205,17 +209,26 @@ NSError* errorOf(const olvane::CheckedOutcome& outcome) {
     return [NSError errorWithDomain:OlvaneErrorDomain code:codeOf(outcome.status) userInfo:info];
 }
 
-// The arrays of a picture, or null with the outcome. No exception of C++ passes.
+// Whether a chart can keep the places of an earlier picture.
+bool isLike(const Arrays& earlier, const charts::ChartRequest& chart) {
+    return earlier.direction == chart.direction && earlier.mirrored == chart.mirrored &&
+           earlier.picture.view == "everybody";
+}
+
+// The arrays of a picture, or null with the outcome. No exception of C++ passes. earlier: of the picture whose places are
+// kept, or null.
 std::unique_ptr<Arrays> made(Source source, int64_t focus, OlvanePictureOptions* options,
-                             olvane::CheckedOutcome& outcome) {
+                             const Arrays* earlier, olvane::CheckedOutcome& outcome) {
     const olvane_picture_options& asked = *[options options];
     try {
-        const olvane::c::AskedView view(asked);
+        olvane::c::AskedView view(asked);
+        charts::ChartRequest& chart = view.request.chart;
+        if (earlier && isLike(*earlier, chart)) chart.earlier = &earlier->picture;
         std::shared_ptr<FoundationSource> host;
         if (source) host = std::make_shared<FoundationSource>(source);
         charts::CheckedPicture result = charts::checkedPicture(host, focus, view.request, asked.other);
         outcome = result;
-        if (result.isOk()) return arraysOf(std::move(result.picture));
+        if (result.isOk()) return arraysOf(std::move(result.picture), chart);
     } catch (...) {
         outcome.status = olvane::CheckedStatus::outOfMemory;  // nothing else can fail here
     }
@@ -238,7 +251,9 @@ const Arrays& arraysIn(const void* held) {
                                 error:(NSError**)error {
     olvane::CheckedOutcome outcome;
     OlvanePictureOptions* chosen = options ? options : [OlvanePictureOptions optionsForView:OlvaneViewFamily];
-    std::unique_ptr<Arrays> arrays = made(source, personId, chosen, outcome);
+    OlvanePicture* earlier = [[chosen.earlier retain] autorelease];  // the source may set another one
+    std::unique_ptr<Arrays> arrays =
+        made(source, personId, chosen, earlier ? static_cast<const Arrays*>(earlier->_picture) : nullptr, outcome);
     if (!arrays) {
         if (error) *error = errorOf(outcome);
         return nil;

@@ -45,6 +45,8 @@ _Static_assert(sizeof(OlvaneFold) == sizeof(olvane_fold) &&
 
 @implementation OlvanePictureOptions
 
+@synthesize earlier = _earlier;
+
 // clang-format off
 OLVANE_FIELD(int, view, setView, view)
 OLVANE_FIELD(int, up, setUp, up)
@@ -100,6 +102,7 @@ OLVANE_SHOWN(spousesOfChildren, setSpousesOfChildren, OLVANE_SHOW_SPOUSES_OF_CHI
 }
 
 - (void)dealloc {
+    [_earlier release];
     [_folded release];
     free(_options);
     [super dealloc];

@@ -198,7 +198,10 @@ export interface PictureOptions {
     mirrored?: boolean | undefined;
     /** Near, ancestors, descendants, hourglass, relatives: branches that are left out; none. */
     folded?: Iterable<Fold> | undefined;
-    /** Everybody: width by height of the paper that wide generations are folded for; 0 for no paper. */
+    /**
+     * Everybody, near, ancestors, descendants, hourglass, relatives: width by height of the paper that wide generations
+     * are folded for; 0 for no paper.
+     */
     aspect?: number | undefined;
     /**
      * Everybody: keep the places of the last picture of everybody that was made with this option of this file, or of

@@ -88,10 +88,7 @@ PictureRequest requestInOnePiece(kin::Place focus, Boxes boxes) {
 PictureRequest requestOnPaper(kin::Place focus, Boxes boxes, double aspect = 0) {
     PictureRequest request = requestOf(focus);
     charts::ChartRequest& chart = request.view.chart;
-    if (aspect > 0) {
-        chart.aspect = aspect;
-        chart.compact = true;
-    }
+    if (aspect > 0) charts::foldForPaper(chart, aspect);
     charts::setBoxForm(chart, formOf(boxes, charts::usualBoxFormOnPaper(chart.view, chart.direction)));
     return request;
 }
@@ -202,7 +199,7 @@ const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int 
         draw::PaperSubject subject;
         const auto form = static_cast<js::Boxes>(boxes);
         const js::PictureRequest request = js::requestOnPaper(focus - 1, form);
-        subject.folded = request.view.chart.view == charts::View::everybody;
+        subject.folded = charts::foldsForPaper(request.view.chart.view);
         subject.contentOf = [&](double aspect) {
             return js::contentOf(*file, js::requestOnPaper(focus - 1, form, aspect), facts);
         };

@@ -5,6 +5,8 @@
 
 #include <algorithm>
 
+#include <olvane/charts/Folding.h>
+
 namespace olvane::charts {
 
 namespace {
@@ -53,6 +55,15 @@ void setBoxForm(ChartRequest& request, BoxForm form) {
     } else if (form == BoxForm::wide) {
         request.sizes.gapY = kGapOfWideRows;
     }
+}
+
+bool foldsForPaper(View view) {
+    return view == View::everybody || canFold(view);
+}
+
+void foldForPaper(ChartRequest& request, double aspect) {
+    request.aspect = aspect;
+    if (request.view == View::everybody) request.compact = true;
 }
 
 void flagBeyondGenerations(ChartRequest& request) {

@@ -26,6 +26,13 @@ OLVANE_API TreeSize treeSizeOf(BoxForm form);
 // Sets all sizes of a request for boxes of a form; its view and its aspect are set before.
 OLVANE_API void setBoxForm(ChartRequest& request, BoxForm form);
 
+// Whether wide generations of a view are folded for the paper that it is for: in every view of rows but the engine's own
+// and that of kinship.
+OLVANE_API bool foldsForPaper(View view);
+
+// Sets a request for paper of so many times its height in width. The lines of everybody lie closer together on it.
+OLVANE_API void foldForPaper(ChartRequest& request, double aspect);
+
 // Lets a pedigree of any number of columns flag those who have ancestors beyond the last one.
 OLVANE_API void flagBeyondGenerations(ChartRequest& request);
 

@@ -5,6 +5,7 @@
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/FanInternal.h>
+#include <olvane/charts/FoldedTreeInternal.h>
 #include <olvane/charts/FoldingInternal.h>
 #include <olvane/charts/SelectionInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
@@ -67,6 +68,12 @@ picture::Picture everybodyPicture(const kin::KinGraph& graph, const ChartRequest
     return everybodyChart(graph, options);
 }
 
+picture::Picture rowChart(const kin::KinGraph& graph, const ChartRequest& request) {
+    const Selection selection = selectPersons(graph, request);
+    return request.aspect > 0 ? treeChartOnPaper(graph, request, selection)
+                              : treeChart(graph, request, selection);
+}
+
 picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartRequest& request) {
     switch (request.view) {
         case View::near:
@@ -74,7 +81,7 @@ picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartReque
         case View::descendants:
         case View::hourglass:
         case View::relatives:
-            return treeChart(graph, request, selectPersons(graph, request));
+            return rowChart(graph, request);
         case View::fan:
             return fanChart(graph, request);
         case View::everybody:

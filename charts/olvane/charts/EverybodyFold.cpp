@@ -44,6 +44,45 @@ std::int32_t unionAbove(const Rows& rows, std::int32_t chain) {
     return strands.empty() ? -1 : rows.strands[at(strands[0])].unionPlace;
 }
 
+// The chains of one row in their order, dealt out to the rows that it is folded into.
+class FoldedRow {
+public:
+    FoldedRow(const Rows& rows, const std::vector<std::int32_t>& nodes) : rows_(rows) {
+        for (const std::int32_t node : nodes) {
+            if (!rows.isPass(node)) chains_.push_back(node);
+        }
+    }
+
+    // visit(chain, place): place is 0 to count - 1. The children of a union stay together unless they are wider than
+    // the limit and may be split.
+    template <class Visit>
+    void deal(int count, const FoldSizes& sizes, double limit, const Visit& visit) const {
+        int turn = count - 1;
+        for (std::size_t first = 0, end = 0; first < chains_.size(); first = end) {
+            double width = 0;
+            end = first;
+            do {
+                width += sizes.width[at(chains_[end])];
+            } while (++end < chains_.size() && areSiblings(chains_[first], chains_[end]));
+            const bool isSplit = sizes.splitSiblings && width > limit;
+            turn = (turn + 1) % count;
+            for (std::size_t i = first; i < end; ++i) {
+                if (isSplit && i > first) turn = (turn + 1) % count;
+                visit(chains_[i], turn);
+            }
+        }
+    }
+
+private:
+    bool areSiblings(std::int32_t one, std::int32_t other) const {
+        const std::int32_t above = unionAbove(rows_, one);
+        return above >= 0 && above == unionAbove(rows_, other);
+    }
+
+    const Rows& rows_;
+    std::vector<std::int32_t> chains_;
+};
+
 }  // namespace
 
 std::vector<std::int32_t> foldRows(const Rows& rows, const RowOrder& order, const FoldSizes& sizes) {
@@ -56,15 +95,9 @@ std::vector<std::int32_t> foldRows(const Rows& rows, const RowOrder& order, cons
     std::int32_t first = 0;
     for (std::int32_t row = 0; row < rows.rowCount; ++row) {
         const int count = rowsFor(widths[at(row)], limit);
-        std::int32_t before = -1;
-        int turn = count - 1;
-        for (const std::int32_t node : order.nodes[at(row)]) {
-            if (rows.isPass(node)) continue;
-            const std::int32_t above = unionAbove(rows, node);
-            if (above < 0 || above != before) turn = (turn + 1) % count;
-            before = above;
-            folded[at(node)] = first + turn;
-        }
+        FoldedRow(rows, order.nodes[at(row)])
+            .deal(count, sizes, limit,
+                  [&](std::int32_t chain, int place) { folded[at(chain)] = first + place; });
         first += count;
     }
     return folded;

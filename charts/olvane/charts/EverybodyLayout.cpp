@@ -257,6 +257,7 @@ private:
         FoldSizes sizes;
         sizes.aspect = options_.foldAspect;
         for (const double width : l_.sizes.width) sizes.width.push_back(width + l_.sizes.gap);
+        sizes.splitSiblings = options_.aspect > 0;
         sizes.rowPitch = 1.15 * (boxes_.mostHeight(l_.part) + boxes_.gapY);
         l_.rows = makeRows(l_.part, l_.chains, foldRows(l_.rows, l_.order, sizes), l_.marked);
         l_.order = walkOrder(l_.rows);

@@ -6,6 +6,7 @@
 #include <olvane/charts/PlanPictureInternal.h>
 
 #include <olvane/charts/Charts.h>
+#include <olvane/charts/HiddenRelativesInternal.h>
 
 #include <algorithm>
 #include <limits>
@@ -15,15 +16,9 @@ namespace olvane::charts {
 
 using picture::LineRole;
 
-namespace {
-
-constexpr std::size_t kMostCompared = 64;  // unions of one person that are compared with one another
-
-}  // namespace
-
 PlanPicture::PlanPicture(const kin::KinGraph& graph, const ChartRequest& request, const PlanSizes& sizes,
-                         const Plan& plan, const GapTracks& gaps)
-    : graph_(graph), request_(request), sizes_(sizes), plan_(plan), gaps_(gaps) {}
+                         const std::vector<bool>& shown, const Plan& plan, const GapTracks& gaps)
+    : graph_(graph), request_(request), sizes_(sizes), shown_(shown), plan_(plan), gaps_(gaps) {}
 
 picture::Picture PlanPicture::make() {
     picture_.view = nameOf(request_.view);
@@ -95,40 +90,7 @@ void PlanPicture::addBoxes() {
         box.y = top_[rowOf(b)];
         box.width = sizes_.width(person);
         box.height = sizes_.height(person);
-        countHidden(person, box);
-    }
-}
-
-// Whoever would be counted over two unions is counted over the first.
-void PlanPicture::countHidden(kin::Place person, picture::Box& box) const {
-    const auto asChild = graph_.unionsAsChild(person);
-    const auto asPartner = graph_.unionsAsPartner(person);
-    const auto isIn = [this](kin::Place one, kin::UnionPlace u) {
-        return graph_.partners(u)[0] == one || graph_.partners(u)[1] == one;
-    };
-    const auto metBefore = [&isIn](kin::Place one, std::span<const kin::UnionPlace> unions, std::size_t end) {
-        for (std::size_t i = 0; i < std::min(end, kMostCompared); ++i) {
-            if (isIn(one, unions[i])) return true;
-        }
-        return false;
-    };
-    for (std::size_t i = 0; i < asChild.size(); ++i) {
-        const auto& two = graph_.partners(asChild[i]);
-        for (std::size_t slot = 0; slot < 2; ++slot) {
-            if (two[slot] == kin::kNobody || isShown(two[slot]) || (slot == 1 && two[0] == two[1])) continue;
-            if (!metBefore(two[slot], asChild, i)) ++box.hiddenParents;
-        }
-    }
-    for (std::size_t i = 0; i < asPartner.size(); ++i) {
-        const kin::Place other = graph_.otherPartner(asPartner[i], person);
-        if (other != kin::kNobody && !isShown(other) && !metBefore(other, asPartner, i)) ++box.hiddenPartners;
-        for (const kin::Place child : graph_.children(asPartner[i])) {
-            if (isShown(child)) continue;
-            const auto parents = graph_.unionsAsChild(child);
-            const auto first = std::find_if(parents.begin(), parents.end(),
-                                            [&](kin::UnionPlace u) { return isIn(person, u); });
-            if (*first == asPartner[i]) ++box.hiddenChildren;
-        }
+        countHiddenRelatives(graph_, person, shown_, box);
     }
 }
 

@@ -15,7 +15,7 @@ namespace olvane::charts {
 class PlanPicture {
 public:
     PlanPicture(const kin::KinGraph& graph, const ChartRequest& request, const PlanSizes& sizes,
-                const Plan& plan, const GapTracks& gaps);
+                const std::vector<bool>& shown, const Plan& plan, const GapTracks& gaps);
 
     picture::Picture make();
 
@@ -30,7 +30,6 @@ private:
     void measureRows();
     void reserve();
     void addBoxes();
-    void countHidden(kin::Place person, picture::Box& box) const;
     void addFamilies();
     void addFamily(Index family);
     double addPartnersLine(const PlannedFamily& family, std::size_t row);
@@ -46,13 +45,11 @@ private:
     std::size_t rowOf(Index box) const {
         return at(plan_.households[at(plan_.householdOf[at(box)])].row - gaps_.firstRow());
     }
-    bool isShown(kin::Place person) const {
-        return person != kin::kNobody && plan_.boxOf[at(person)] != kNone;
-    }
 
     const kin::KinGraph& graph_;
     const ChartRequest& request_;
     const PlanSizes& sizes_;
+    const std::vector<bool>& shown_;  // by person
     const Plan& plan_;
     const GapTracks& gaps_;
     picture::Picture picture_;

@@ -34,7 +34,7 @@ picture::Picture treeChart(const kin::KinGraph& graph, const ChartRequest& reque
     GapTracks gaps(plan);
     gaps.addShortLinks(static_cast<double>(kReachOfShortLinks * (sizes.usualWidth() + sizes.gapX())));
     gaps.assignTracks();
-    return PlanPicture(graph, request, sizes, plan, gaps).make();
+    return PlanPicture(graph, request, sizes, selection.shown, plan, gaps).make();
 }
 
 }  // namespace olvane::charts

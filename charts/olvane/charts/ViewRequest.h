@@ -99,8 +99,9 @@ struct ChartRequest {
     bool onePart = true;  // everybody: only the part of the family that the focus is in
     // Everybody: an earlier picture of it whose places are kept where a change leaves them; see EverybodyOptions.
     const picture::Picture* earlier = nullptr;
-    double aspect =
-        0;  // everybody: width by height of the paper that wide generations are folded for; 0 for none
+    // Everybody, near, ancestors, descendants, hourglass, relatives: width by height of the paper that wide generations
+    // are folded for; 0 for none.
+    double aspect = 0;
     const ChartProgress* progress =
         nullptr;  // everybody: is called meanwhile, if not null; only during the call
 };

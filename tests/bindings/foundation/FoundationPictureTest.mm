@@ -239,6 +239,38 @@ TEST_F(FoundationPicture, takesOptionsAsProperties) {
     EXPECT_FALSE(has(few, 0, 1));
 }
 
+// As C++ does with the same earlier picture; one in another direction is not looked at.
+TEST_F(FoundationPicture, ofEverybodyKeepsThePlacesOfAnEarlierOne) {
+    const CaseFile input = family("17+42: 5 6; 5+8: 9");
+    const CaseFile later = family("17+42: 7 5 6; 5+8: 9");
+    charts::ViewRequest request;
+    request.chart.view = charts::View::everybody;
+    const auto ofHost = [&request](const CaseFile& of) {
+        return charts::pictureOfHost(std::make_shared<support::CaseManager>(of), 17, request);
+    };
+    const olvane::picture::Picture fromScratch = ofHost(later);
+    const olvane::picture::Picture before = ofHost(input);
+    request.chart.earlier = &before;
+    const std::string kept = olvane::picture::pictureJson(ofHost(later));
+    ASSERT_NE(olvane::picture::pictureJson(fromScratch), kept);
+
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewEverybody];
+    const auto drawn = [&](const CaseFile& of) {
+        return [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(of)
+                                            focus:17
+                                          options:options
+                                            error:NULL];
+    };
+    options.earlier = drawn(input);
+    EXPECT_EQ(kept, [[drawn(later) json] UTF8String]);
+    options.direction = 3;
+    NSString* sideways = [drawn(later) json];
+    options.earlier = nil;
+    EXPECT_TRUE([sideways isEqual:[drawn(later) json]]);
+    options.direction = 0;
+    EXPECT_EQ(olvane::picture::pictureJson(fromScratch), [[drawn(later) json] UTF8String]);
+}
+
 TEST_F(FoundationPicture, namesOperationPersonAndCauseWhereTheHostRaises) {
     NSError* error = errorOf(hostOf<ClosedHost>(family(kThreeGenerations)));
     EXPECT_EQ(OlvaneErrorHostFailed, [error code]);

@@ -39,6 +39,8 @@ typedef struct OlvaneFold {
     int branch;
 } OlvaneFold;
 
+@class OlvanePicture;
+
 struct olvane_picture_options;  // of the C interface, whose header is not needed
 
 // What to make a picture of. What a view has no use for is ignored, but must be in its range.
@@ -47,6 +49,7 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 @interface OlvanePictureOptions : NSObject {
     struct olvane_picture_options* _options;
     NSMutableData* _folded;
+    OlvanePicture* _earlier;
 }
 
 // Everything else at its usual value; a plain init is for the family view.
@@ -77,6 +80,10 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 @property(nonatomic, assign) int marks;      // everybody: how many second links become marks; -1 for all
 @property(nonatomic, assign) int effort;     // everybody: 0 to 100
 @property(nonatomic, assign) BOOL allParts;  // everybody: also those who are not connected with the focus
+// Everybody: an earlier picture of everybody, or nil. Whoever is in both, by id, stays where that picture has them as far
+// as the change allows; it is not looked at if it is of another view or direction, or if less than half of the family is
+// in it.
+@property(nonatomic, retain) OlvanePicture* earlier;
 
 @property(nonatomic, assign) int generations;  // pedigree: 1 to 1000, the focus's own included
 @property(nonatomic, assign) int flagDepth;    // pedigree: generations in which partners raise the flag
