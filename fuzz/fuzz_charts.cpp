@@ -84,6 +84,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         for (BoxSize& one : sizes) one = {static_cast<float>(choose(120)), static_cast<float>(choose(120))};
         request.boxSizes = sizes;
     }
+    if (choose(4) == 3) request.aspect = 0.25 * (1 + choose(12));
     judgeChart(graph, request, usualSizes);
     return 0;
 }

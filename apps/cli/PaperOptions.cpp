@@ -63,8 +63,7 @@ void addPaperOptions(CLI::App& command, PaperOptions& options) {
         .add_option(
             "--fit", options.fit,
             "Draw on paper, as large as one sheet of it allows: A4 to A0, letter, or a width and height "
-            "in millimetres. Wide generations are folded into two or three rows where that makes it larger, but "
-            "in family, pedigree, fan and kinship")
+            "in millimetres. Wide generations are folded into two or three rows where that makes it larger")
         ->check(complaintOfPaper)
         ->type_name("PAPER")
         ->group(group);

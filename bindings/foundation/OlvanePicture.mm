@@ -252,8 +252,8 @@ const Arrays& arraysIn(const void* held) {
     olvane::CheckedOutcome outcome;
     OlvanePictureOptions* chosen = options ? options : [OlvanePictureOptions optionsForView:OlvaneViewFamily];
     OlvanePicture* earlier = [[chosen.earlier retain] autorelease];  // the source may set another one
-    std::unique_ptr<Arrays> arrays =
-        made(source, personId, chosen, earlier ? static_cast<const Arrays*>(earlier->_picture) : nullptr, outcome);
+    std::unique_ptr<Arrays> arrays = made(
+        source, personId, chosen, earlier ? static_cast<const Arrays*>(earlier->_picture) : nullptr, outcome);
     if (!arrays) {
         if (error) *error = errorOf(outcome);
         return nil;

@@ -21,6 +21,8 @@ struct EverybodyOptions {
     // stands apart) become marks instead of lines: those that cross the most. -1 for all of them: then no two lines
     // cross.
     std::int32_t marks = 0;
+    // With all second links marks: those whose lines cross no others stay lines.
+    bool drawFree = false;
     // How long to look for fewer crossings: 0 is quickest, 1 is usual, and each more takes up to twice the time. Steps
     // are counted, not time, so that the result is the same everywhere.
     std::int32_t effort = 1;

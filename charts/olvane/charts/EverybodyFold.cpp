@@ -95,9 +95,9 @@ std::vector<std::int32_t> foldRows(const Rows& rows, const RowOrder& order, cons
     std::int32_t first = 0;
     for (std::int32_t row = 0; row < rows.rowCount; ++row) {
         const int count = rowsFor(widths[at(row)], limit);
-        FoldedRow(rows, order.nodes[at(row)])
-            .deal(count, sizes, limit,
-                  [&](std::int32_t chain, int place) { folded[at(chain)] = first + place; });
+        FoldedRow(rows, order.nodes[at(row)]).deal(count, sizes, limit, [&](std::int32_t chain, int place) {
+            folded[at(chain)] = first + place;
+        });
         first += count;
     }
     return folded;

@@ -15,7 +15,7 @@ namespace olvane::charts {
 struct FoldSizes {
     std::vector<double> width;
     double rowPitch = 110;
-    double aspect = 0.75;  // of the picture, that folding stops at
+    double aspect = 0.75;        // of the picture, that folding stops at
     bool splitSiblings = false;  // the children of one union too, where they alone make a row too wide
 };
 

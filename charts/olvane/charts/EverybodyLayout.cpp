@@ -167,7 +167,10 @@ private:
         l_.rows = makeRows(l_.part, l_.chains, unfolded, l_.marked);
         l_.order = walkOrder(l_.rows);
         fold();
-        if (options_.marks < 0) return;
+        if (options_.marks < 0) {
+            if (options_.drawFree) drawFree();
+            return;
+        }
         report(ChartStep::order);
         const MarkedLinks forced = l_.marked;
         l_.order = findOrder(l_.rows, orderEffort(), starts(),
@@ -182,6 +185,11 @@ private:
         }
         constexpr std::int32_t kManyUnions = 10'000;
         if (options_.marks > 0 && l_.part.unionCount() <= kManyUnions) fromAllMarks(unfolded, forced);
+    }
+
+    void drawFree() {
+        const MarkedLinks forced = marksForWantOfRoom(l_.part, l_.chains, roomForLines());
+        if (drawFreeLinks(l_.part, l_.chains, l_.rows, l_.order, forced, l_.marked) > 0) rebuildRows();
     }
 
     // The other way to as many marks: all second links first, in an order without crossings, and then lines for those

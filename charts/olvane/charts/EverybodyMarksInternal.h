@@ -45,4 +45,9 @@ std::int32_t drawBestLinks(const Component& part, const Chains& chains, const Ro
                            const RowOrder& order, std::int32_t count, const MarkedLinks& forced,
                            MarkedLinks& marked);
 
+// The same for all links whose lines cross none in this order, and also for links from further up, along lines of the same
+// union.
+std::int32_t drawFreeLinks(const Component& part, const Chains& chains, const Rows& rows,
+                           const RowOrder& order, const MarkedLinks& forced, MarkedLinks& marked);
+
 }  // namespace olvane::charts

@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 // The chosen persons become a family of their own, which is laid out as the chart of everybody, whose rows can be
-// folded. All second links are marks, as in the tree: so no two lines cross, and siblings stay in the order of the data.
+// folded: first with siblings in the order of the data, and where that takes more marks than the tree has, with everybody
+// where the fewest lines cross. Neither is taken if lines cross.
 
 #include <olvane/charts/FoldedTreeInternal.h>
 
@@ -15,6 +16,7 @@
 #include <olvane/charts/HiddenRelativesInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/picture/Judge.h>
 
 namespace olvane::charts {
 
@@ -24,6 +26,10 @@ using kin::at;
 
 // Rows that are not folded are easier to read, so folding must gain as much in the size of the text.
 constexpr double kWorthFolding = 1.1;
+// Of so many links, one more may be a mark for it.
+constexpr std::size_t kLinksForOneMark = 20;
+// Only so many are tried with all links as lines, which takes ten times as long.
+constexpr std::size_t kFewPersons = 300;
 
 // The chosen persons with their ids, in the order in which they were found, and the unions that two of them are in.
 class ChosenFamily {
@@ -61,8 +67,7 @@ private:
         if (!both && std::none_of(children.begin(), children.end(), isChosen)) return kNone;
         const kin::UnionPlace copy = builder_.addUnion(one, other, whole_.state(u), whole_.family(u));
         for (std::size_t i = 0; i < children.size(); ++i) {
-            if (isChosen(children[i]))
-                builder_.addChild(copy, placeOf(children[i]), whole_.childKinds(u)[i]);
+            if (isChosen(children[i])) builder_.addChild(copy, placeOf(children[i]), whole_.childKinds(u)[i]);
         }
         return copy;
     }
@@ -105,39 +110,85 @@ double sheetHeight(const picture::Picture& picture, double aspect) {
     return std::max(bottom - top, (right - left) / aspect);
 }
 
-picture::Picture foldedTree(const kin::KinGraph& graph, const ChartRequest& request,
-                            const Selection& selection) {
-    ChosenFamily chosen(graph, selection);
-    std::vector<BoxSize> boxSizes;
-    for (const kin::Place person : selection.persons) {
-        if (!request.boxSizes.empty()) boxSizes.push_back(request.boxSizes[at(person)]);
+// How many relations the picture expresses, by lines or marks.
+std::size_t linksIn(const picture::Picture& picture) {
+    std::size_t links = 0;
+    for (const picture::Family& family : picture.families) {
+        links += family.childCount + (family.parentCount == 2 ? 1U : 0U);
     }
-    EverybodyOptions options;
-    options.focus = chosen.placeOf(request.focus);
-    options.marks = -1;
-    options.onePart = false;
-    options.aspect = request.aspect;
-    options.compact = request.compact;
-    options.direction = request.direction;
-    options.sizes = request.sizes;
-    options.boxSizes = boxSizes;
-    picture::Picture picture = everybodyChart(chosen.graph(), options);
-    picture.view = nameOf(request.view);
-    for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
-        countHiddenRelatives(graph, selection.persons[i], selection.shown, picture.boxes[i]);
-    }
-    return picture;
+    return links;
 }
+
+class FoldedTree {
+public:
+    FoldedTree(const kin::KinGraph& graph, const ChartRequest& request, const Selection& selection)
+        : graph_(graph), selection_(selection), view_(request.view) {
+        ChosenFamily family(graph, selection);
+        chosen_ = family.graph();
+        for (const kin::Place person : selection.persons) {
+            if (!request.boxSizes.empty()) boxSizes_.push_back(request.boxSizes[at(person)]);
+        }
+        options_.focus = family.placeOf(request.focus);
+        options_.onePart = false;
+        options_.aspect = request.aspect;
+        options_.compact = request.compact;
+        options_.direction = request.direction;
+        options_.sizes = request.sizes;
+    }
+
+    // Siblings in the order of the data, and links that would cross others as marks.
+    picture::Picture inOrder() const {
+        const picture::Picture free = made(-1, true);
+        return hasCrossings(free) ? made(-1, false) : free;
+    }
+    // Everybody where the fewest lines cross, and all links as lines.
+    picture::Picture withAllLines() const { return made(0, false); }
+
+    static bool hasCrossings(const picture::Picture& picture) {
+        return picture::judge(picture).crossings > 0;
+    }
+
+private:
+    picture::Picture made(std::int32_t marks, bool drawFree) const {
+        EverybodyOptions options = options_;
+        options.marks = marks;
+        options.drawFree = drawFree;
+        options.boxSizes = boxSizes_;
+        picture::Picture picture = everybodyChart(chosen_, options);
+        picture.view = nameOf(view_);
+        for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
+            countHiddenRelatives(graph_, selection_.persons[i], selection_.shown, picture.boxes[i]);
+        }
+        return picture;
+    }
+
+    const kin::KinGraph& graph_;
+    const Selection& selection_;
+    View view_;
+    kin::KinGraph chosen_;
+    std::vector<BoxSize> boxSizes_;
+    EverybodyOptions options_;
+};
 
 }  // namespace
 
 picture::Picture treeChartOnPaper(const kin::KinGraph& graph, const ChartRequest& request,
                                   const Selection& selection) {
     picture::Picture tree = treeChart(graph, request, selection);
-    picture::Picture folded = foldedTree(graph, request, selection);
-    const bool isWorthIt =
-        sheetHeight(folded, request.aspect) * kWorthFolding <= sheetHeight(tree, request.aspect);
-    return isWorthIt ? folded : tree;
+    const FoldedTree folds(graph, request, selection);
+    const double worth = sheetHeight(tree, request.aspect) / kWorthFolding;
+    const auto isLargerWith = [&](const picture::Picture& folded, std::size_t marks) {
+        return sheetHeight(folded, request.aspect) <= worth && folded.marks.size() <= marks;
+    };
+    const std::size_t most = tree.marks.size() + linksIn(tree) / kLinksForOneMark;
+    picture::Picture inOrder = folds.inOrder();
+    if (isLargerWith(inOrder, tree.marks.size())) return inOrder;
+    if (selection.persons.size() <= kFewPersons) {
+        picture::Picture withLines = folds.withAllLines();
+        if (isLargerWith(withLines, tree.marks.size()) && !FoldedTree::hasCrossings(withLines))
+            return withLines;
+    }
+    return isLargerWith(inOrder, most) ? inOrder : tree;
 }
 
 }  // namespace olvane::charts
