@@ -53,6 +53,7 @@ public:
         l_.chains = weldCouples(l_.part);
         measureChains();
         if (earlier_ == nullptr || !placeAsBefore()) place();
+        makePlacesExact(l_.rows, l_.order, l_.sizes, l_.left);
         report(ChartStep::lines);
         l_.lines = routeGaps(l_.rows, endRanges());
         for (auto ends = endsInTheWay(l_.rows, l_.lines); !ends.empty();

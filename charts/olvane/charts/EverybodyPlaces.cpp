@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <limits>
 
 #include <olvane/kin/Index.h>
 
@@ -188,6 +189,26 @@ private:
 std::vector<double> placeNodes(const Rows& rows, const RowOrder& order, const RowSizes& sizes,
                                double leastWidth, int sweeps) {
     return Placement(rows, order, sizes, leastWidth).run(sweeps);
+}
+
+void makePlacesExact(const Rows& rows, const RowOrder& order, const RowSizes& sizes,
+                     std::vector<double>& left) {
+    constexpr double kStepsOfAPoint = 1024;
+    for (const auto& nodes : order.nodes) {
+        double end = -std::numeric_limits<double>::infinity();
+        double gap = 0;
+        for (const std::int32_t node : nodes) {
+            if (rows.isPass(node)) {
+                gap = 0;  // the pass stands in it
+                continue;
+            }
+            double& place = left[at(node)];
+            place = std::floor(place * kStepsOfAPoint + 0.5) / kStepsOfAPoint;
+            if (place < end + gap) place = std::ceil((end + gap) * kStepsOfAPoint) / kStepsOfAPoint;
+            end = place + sizes.width[at(node)];
+            gap = sizes.gap;
+        }
+    }
 }
 
 }  // namespace olvane::charts

@@ -34,4 +34,9 @@ struct RowSizes {
 std::vector<double> placeNodes(const Rows& rows, const RowOrder& order, const RowSizes& sizes,
                                double leastWidth, int sweeps);
 
+// Puts chains on whole multiples of a 1024th of a point, where sums of places, widths and gaps are exact: so that boxes
+// without a gap between them touch, and do not overlap by what a sum is rounded by.
+void makePlacesExact(const Rows& rows, const RowOrder& order, const RowSizes& sizes,
+                     std::vector<double>& left);
+
 }  // namespace olvane::charts

@@ -332,4 +332,29 @@ TEST(Everybody, keepsLinesApartWhereMoreMeetThanThereIsRoomFor) {
     }
 }
 
+// Boxes of any width that touch: what sums of their places are rounded by is no overlap. The seeds are those of which boxes
+// overlapped by a part of a billionth of a point.
+TEST(Everybody, overlapsNoBoxesWhereNeighboursHaveNoGap) {
+    for (const std::uint64_t seed : {1U, 2U, 3U, 380U, 451U, 1218U}) {
+        const KinGraph graph = olvane::test::denseKin(seed);
+        std::vector<olvane::charts::BoxSize> sizes;
+        std::uint64_t random = seed * 7919 + 1;
+        for (olvane::kin::Place p = 0; p < graph.personCount(); ++p) {
+            random = random * 6364136223846793005U + 1442695040888963407U;
+            sizes.push_back({static_cast<float>(4 + (random >> 33U) % 100),
+                             static_cast<float>(4 + (random >> 40U) % 100)});
+        }
+        EverybodyOptions options;
+        options.onePart = false;
+        options.effort = 0;
+        options.sizes.gapX = 0;
+        options.boxSizes = sizes;
+        const Picture picture = everybodyChart(graph, options);
+        EXPECT_EQ(olvane::picture::judge(picture, &graph).overlaps, 0U) << "seed " << seed;
+        options.earlier = &picture;
+        EXPECT_EQ(olvane::picture::judge(everybodyChart(graph, options), &graph).overlaps, 0U)
+            << "seed " << seed << ", places kept";
+    }
+}
+
 }  // namespace
