@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 import assert from "node:assert/strict";
-import { execFileSync } from "node:child_process";
+import { execFileSync, spawnSync } from "node:child_process";
 import { deflateRawSync } from "node:zlib";
 import { describe, test } from "node:test";
 import {
@@ -169,6 +169,22 @@ describe("opening", kTwoAtOnce, () => {
         await visit.still();
         assert.equal(await visit.focus(), "I2");
         assert.equal(await visit.page.innerText("#side-panel h2"), "Иван");
+        await visit.end();
+    });
+
+    test("every encoding that a file can be read in can be chosen", async () => {
+        const { stderr } = spawnSync(command, ["people", "-", "--encoding", "?"], { encoding: "utf8" });
+        const known = /known are (.*); 'olvane/.exec(stderr)[1].split(", ");
+        assert.ok(known.length > 40, stderr);
+        const visit = await visitEmpty();
+        await visit.drop("darwin-wedgwood.ged", kDarwins);
+        await visit.untilFamily();
+        await visit.click("#file-button");
+        const offered = await visit.page.$$eval("#encoding option", (options) => options.map(({ value }) => value));
+        assert.deepEqual(
+            known.filter((name) => name !== "ASCII" && !offered.includes(name)),
+            [],
+        );
         await visit.end();
     });
 

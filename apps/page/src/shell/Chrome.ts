@@ -43,7 +43,7 @@ export interface ChromeLooks {
     readonly kinshipInBoxes: boolean;
 }
 
-// To choose from where a file's own word on its encoding is wrong.
+// To choose from where a file's own word on its encoding is wrong: all that the reader knows but ASCII, which most of them extend.
 const kEncodings = [
     "UTF-8",
     "ANSEL",
@@ -57,18 +57,44 @@ const kEncodings = [
     "windows-1257",
     "windows-1258",
     "ISO-8859-2",
+    "ISO-8859-3",
+    "ISO-8859-4",
+    "ISO-8859-5",
+    "ISO-8859-6",
+    "ISO-8859-7",
+    "ISO-8859-8",
+    "ISO-8859-10",
+    "ISO-8859-13",
+    "ISO-8859-14",
     "ISO-8859-15",
+    "ISO-8859-16",
     "KOI8-R",
     "KOI8-U",
+    "GBK",
     "GB18030",
     "BIG5",
     "Shift_JIS",
     "EUC-JP",
     "EUC-KR",
     "TIS-620",
-    "IBM437",
-    "IBM850",
     "macintosh",
+    "UTF-16LE",
+    "UTF-16BE",
+    "IBM437",
+    "IBM737",
+    "IBM775",
+    "IBM850",
+    "IBM852",
+    "IBM855",
+    "IBM857",
+    "IBM858",
+    "IBM860",
+    "IBM861",
+    "IBM862",
+    "IBM863",
+    "IBM865",
+    "IBM866",
+    "IBM869",
 ] as const;
 const kMostDiagnostics = 500; // listed until all are asked for
 
