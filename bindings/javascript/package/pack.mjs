@@ -122,7 +122,17 @@ async function packEngine() {
             "./olvane.wasm": "./olvane.wasm",
             "./package.json": "./package.json",
         },
-        files: ["*.mjs", "*.cjs", "*.js", "*.d.mts", "*.d.cts", "inline", "olvane.wasm", "contents.spdx.json"],
+        files: [
+            "*.mjs",
+            "*.cjs",
+            "*.js",
+            "*.d.mts",
+            "*.d.cts",
+            "inline",
+            "olvane.wasm",
+            "contents.spdx.json",
+            "notices.txt",
+        ],
         engines: { node: ">=18" },
     });
 }
@@ -166,7 +176,16 @@ async function packElement() {
             "./custom-elements.json": "./custom-elements.json",
             "./package.json": "./package.json",
         },
-        files: ["*.mjs", "*.cjs", "*.js", "*.d.mts", "*.d.cts", "custom-elements.json", "contents.spdx.json"],
+        files: [
+            "*.mjs",
+            "*.cjs",
+            "*.js",
+            "*.d.mts",
+            "*.d.cts",
+            "custom-elements.json",
+            "contents.spdx.json",
+            "notices.txt",
+        ],
     });
 }
 

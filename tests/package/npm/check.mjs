@@ -127,6 +127,26 @@ function nodeRoads(name, node, version) {
 }
 
 const kRoads = {
+    "licences, and what is inside"() {
+        const others = { olvane: ["boost", "unicode-data", "emscripten-runtime"], "olvane-tree": ["d3-zoom"] };
+        for (const [name, parts] of Object.entries(others)) {
+            const text = (file) => readFileSync(join(work, "node_modules", name, file), "utf8");
+            assert.match(text("LICENSE"), /Permission is hereby granted/);
+            const contents = JSON.parse(text("contents.spdx.json"));
+            assert.equal(contents.spdxVersion, "SPDX-2.3");
+            for (const part of [name, ...parts]) {
+                const entry = contents.packages.find((entry) => entry.name === part);
+                assert.ok(entry?.licenseDeclared, `${part} is not listed in ${name}`);
+            }
+            for (const part of parts)
+                assert.ok(text("notices.txt").includes(`\n${part} `), `${name} has no notice of ${part}`);
+        }
+        assert.match(
+            readFileSync(join(work, "node_modules/olvane-tree/notices.txt"), "utf8"),
+            /Mike Bostock[^]*Permission to use/,
+        );
+        return "3";
+    },
     ...nodeRoads("node", "node"),
     ...Object.assign(
         {},

@@ -17,7 +17,7 @@ def main() -> None:
     assert about["Requires-Python"] == ">=3.11"
     assert "Typing :: Typed" in about.get_all("Classifier", [])
     files = {str(file) for file in importlib.metadata.files("olvane") or []}
-    for needed in ("olvane/py.typed", "olvane/contents.spdx.json"):
+    for needed in ("olvane/py.typed", "olvane/contents.spdx.json", "olvane/notices.txt"):
         assert needed in files, f"{needed} is not among {sorted(files)}"
     licence = [file for file in files if file.endswith("dist-info/LICENSE")]
     assert licence, "there is no licence"
