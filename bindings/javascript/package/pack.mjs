@@ -12,7 +12,7 @@
 import { execFileSync } from "node:child_process";
 import { copyFile, mkdir, readFile, writeFile } from "node:fs/promises";
 import { createRequire } from "node:module";
-import { join } from "node:path";
+import { dirname, join, resolve } from "node:path";
 import { fileURLToPath } from "node:url";
 import { parseArgs } from "node:util";
 import { lettersOf, packedLzma } from "./packing.mjs";
@@ -32,8 +32,10 @@ const kUrlOfFile =
 
 async function bundle(entry, file, { format, define = {}, banner = "", globalName }) {
     await build({
-        entryPoints: [entry],
-        outfile: file,
+        // The bundler writes where each part came from; that depends on no folder of this machine.
+        absWorkingDir: dirname(resolve(entry)),
+        entryPoints: [resolve(entry)],
+        outfile: resolve(file),
         bundle: true,
         format,
         globalName,
