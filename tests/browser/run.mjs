@@ -21,6 +21,7 @@ const kSuites = [
     "sharing",
     "large",
     "spoken",
+    "languages",
     "map",
     "element",
     "speed",

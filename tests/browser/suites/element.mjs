@@ -50,6 +50,42 @@ describe("element", () => {
         await end();
     });
 
+    test("the manifest states what the element has: attributes, members, events, parts and properties", async () => {
+        const source = (path) => readFileSync(join(process.env.OLVANE_SOURCES, "apps/page/src", path), "utf8");
+        const { declarations } = JSON.parse(source("element/custom-elements.json")).modules[0];
+        const { attributes, members, events, cssParts, cssProperties } = declarations[0];
+        const names = (list) => list.map(({ name }) => name).sort();
+        const { page, end } = await open("/example.html");
+        await page.waitForSelector("olvane-tree .box.focus");
+        const found = await page.evaluate((members) => {
+            const Tree = customElements.get("olvane-tree");
+            const tree = document.querySelector("olvane-tree");
+            const isThere = ({ kind, name, readonly, parameters = [] }) => {
+                const own = Object.getOwnPropertyDescriptor(Tree.prototype, name);
+                const needed = parameters.filter(({ optional }) => !optional).length;
+                if (kind === "method") return typeof own?.value === "function" && own.value.length === needed;
+                return Boolean(own?.get) && Boolean(own.set) === !readonly;
+            };
+            return {
+                observed: Tree.observedAttributes,
+                lacking: members.filter((one) => !isThere(one)).map(({ name }) => name),
+                parts: [...tree.shadowRoot.querySelectorAll("[part]")].map((one) => one.getAttribute("part")),
+            };
+        }, members);
+        // The wheel's rule is read when the wheel is turned.
+        assert.deepEqual(names(attributes), [...found.observed, "wheel"].sort());
+        assert.deepEqual(found.lacking, []);
+        assert.deepEqual(names(cssParts), [...new Set(found.parts)].sort());
+        const declared = source("element/OlvaneTree.ts")
+            .split("export interface OlvaneTreeEvents {")[1]
+            .split("\n}")[0];
+        const sent = [...declared.matchAll(/^ {4}(\w+): CustomEvent/gm)].map(([, name]) => name);
+        assert.deepEqual(names(events), [...sent, "error"].sort());
+        const styles = source("styles/viewer.css") + source("styles/colours.css") + source("styles/controls.css");
+        for (const name of names(cssProperties)) assert.ok(styles.includes(`var(${name})`), name);
+        await end();
+    });
+
     test("attributes, methods and events speak of one state", async () => {
         files.set(
             "/one.html",

@@ -150,7 +150,7 @@ export const uiGerman: UiMessages = {
         cut: (boxes) =>
             boxes === 1 ? "1 Kasten steht auf keinem Blatt ganz." : `${boxes} Kästen stehen auf keinem Blatt ganz.`,
     },
-    inSight: "Nur sichern, was zu sehen ist",
+    inSight: "Nur was zu sehen ist",
     saved: (name) => `Gesichert als ${name}.`,
     savedSmaller: (name, percent) =>
         `Gesichert als ${name}, in ${percent} % der Größe: größer zeichnen Browser nicht. SVG hat keine Grenze.`,

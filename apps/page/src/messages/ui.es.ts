@@ -156,7 +156,7 @@ export const uiSpanish: UiMessages = {
                 ? "1 recuadro no está entero en ninguna hoja."
                 : `${boxes} recuadros no están enteros en ninguna hoja.`,
     },
-    inSight: "Guardar solo lo que se ve",
+    inSight: "Solo lo que se ve",
     saved: (name) => `Guardado como ${name}.`,
     savedSmaller: (name, percent) =>
         `Guardado como ${name}, al ${percent} % de su tamaño: los navegadores no dibujan nada mayor. SVG no tiene ese límite.`,
