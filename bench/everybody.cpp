@@ -300,6 +300,7 @@ void measureGrowth(KinGraph graph, int persons) {
 }
 
 void measureMade(int persons) {
+    constexpr int kMostJudged = 100'000;  // the judge takes as long as the layout, and more memory
     const KinGraph graph = bench::madePopulation(persons);
     for (const std::int32_t marks : {0, -1}) {
         EverybodyOptions options;
@@ -310,8 +311,17 @@ void measureMade(int persons) {
         const double ms = msSince(start);
         rusage usage{};
         getrusage(RUSAGE_SELF, &usage);
-        std::printf("%zu persons, marks %d: %.0f ms, at most %ld MB with the family and the picture\n",
+        std::printf("%zu persons, marks %d: %.0f ms, at most %ld MB with the family and the picture",
                     picture.boxes.size(), marks, ms, usage.ru_maxrss / 1024);
+        if (persons <= kMostJudged) {
+            const olvane::picture::Judgement j = olvane::picture::judge(picture, &graph);
+            std::printf(
+                "; %zu crossings, %zu overlaps, %zu hits, %zu tracks, %zu touches, %zu unjoined, %zu untold, "
+                "%.1f areas a person, %zu marks",
+                j.crossings, j.overlaps, j.hits, j.tracks, j.touches, j.unjoined, j.untold.value_or(0),
+                j.areaPerPerson, picture.marks.size());
+        }
+        std::printf("\n");
         std::fflush(stdout);
     }
 }
