@@ -184,27 +184,38 @@ olvane_status olvane_file_remarks(const olvane_file* file, olvane_result** json)
     return answered(json, [&] { *json = new olvane_result{remarksOf(*file)}; });
 }
 
+namespace {
+
+// A drawing is a layout too, which a callback may not ask for while its own is running on this thread.
+template <class Draw>
+olvane_status drawn(olvane_result** svg, const Draw& draw) noexcept {
+    return answered(svg, [&] {
+        bool isNested = true;
+        olvane::c::unlessNested([&isNested] { isNested = false; });
+        if (isNested) throw Refusal{OLVANE_NESTED_CALL, olvane_status_text(OLVANE_NESTED_CALL)};
+        *svg = new olvane_result{draw()};
+    });
+}
+
+}  // namespace
+
 olvane_status olvane_draw_file(const char* path, const char* who, const olvane_draw_options* options,
                                olvane_result** svg) {
     if (!path || !who || !svg) return OLVANE_INVALID_ARGUMENT;
-    return answered(svg, [&] {
-        *svg = new olvane_result{olvane::c::drawnFromPath(path, who, olvane::c::chosenOptions(options))};
-    });
+    return drawn(svg, [&] { return olvane::c::drawnFromPath(path, who, olvane::c::chosenOptions(options)); });
 }
 
 olvane_status olvane_draw(const olvane_file* file, int64_t focus, const olvane_draw_options* options,
                           olvane_result** svg) {
     if (!file || !svg) return OLVANE_INVALID_ARGUMENT;
-    return answered(svg, [&] {
-        *svg = new olvane_result{olvane::c::drawnFromFile(*file, focus, olvane::c::chosenOptions(options))};
-    });
+    return drawn(svg,
+                 [&] { return olvane::c::drawnFromFile(*file, focus, olvane::c::chosenOptions(options)); });
 }
 
 olvane_status olvane_draw_family(const olvane_family* family, int64_t focus,
                                  const olvane_draw_options* options, olvane_result** svg) {
     if (!family || !svg) return OLVANE_INVALID_ARGUMENT;
-    return answered(svg, [&] {
-        *svg = new olvane_result{
-            olvane::c::drawnFromTable(family->table, focus, olvane::c::chosenOptions(options))};
+    return drawn(svg, [&] {
+        return olvane::c::drawnFromTable(family->table, focus, olvane::c::chosenOptions(options));
     });
 }

@@ -191,6 +191,15 @@ olvane_status make(const Work& work, olvane_picture** picture) noexcept {
     }
 }
 
+// The same, unless a layout of a host is running on this thread.
+template <class Work>
+olvane_status makeUnlessNested(const Work& work, olvane_picture** picture) noexcept {
+    olvane_status status = OLVANE_NESTED_CALL;
+    const auto makeIt = [&] { status = make(work, picture); };
+    olvane::c::unlessNested(std::cref(makeIt));  // a copy would allocate, outside of all guards
+    return status;
+}
+
 void fillFromFile(const olvane_file& file, std::int64_t focus, const olvane_picture_options& options,
                   olvane_picture& to) {
     const auto placeOf = [&file](std::int64_t person) {
@@ -253,7 +262,7 @@ olvane_status olvane_picture_of_family(const olvane_family* family, int64_t focu
         fillAsked(charts::pictureOf(family->table, focus, Request(chosen).request, chosen.other), chosen,
                   made);
     };
-    return make(work, picture);
+    return makeUnlessNested(work, picture);
 }
 
 olvane_status olvane_picture_of_file(const olvane_file* file, int64_t focus,
@@ -262,7 +271,7 @@ olvane_status olvane_picture_of_file(const olvane_file* file, int64_t focus,
     *picture = nullptr;
     const olvane_picture_options chosen = chosenOptions(options);
     if (!file || !olvane::c::areInRange(chosen)) return OLVANE_INVALID_ARGUMENT;
-    return make([&](olvane_picture& made) { fillFromFile(*file, focus, chosen, made); }, picture);
+    return makeUnlessNested([&](olvane_picture& made) { fillFromFile(*file, focus, chosen, made); }, picture);
 }
 
 olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
@@ -279,10 +288,7 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
             charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).request, chosen.other),
             chosen, made);
     };
-    olvane_status status = OLVANE_NESTED_CALL;
-    const auto makeIt = [&] { status = make(work, picture); };
-    olvane::c::unlessNested(std::cref(makeIt));  // a copy would allocate, outside of all guards
-    return status;
+    return makeUnlessNested(work, picture);
 }
 
 olvane_status olvane_picture_failure(const olvane_picture* picture, const char** text) {

@@ -6,6 +6,7 @@
 import { FamilyError, LayoutError, OutOfMemory } from "./errors.mjs";
 import { columnsOf } from "./familyColumns.mjs";
 import { chosenNumber, idNumber, refuse, storedText } from "./familyValues.mjs";
+import { refuseNested } from "./layout.mjs";
 import { focusNumber, optionNumbers } from "./options.mjs";
 import { readPicture, usePictureOptions } from "./picture.mjs";
 import { pictureNumbers } from "./pictureOptions.mjs";
@@ -223,6 +224,7 @@ export class Family extends EventTarget {
 
     picture(focus, options = {}) {
         const { exports } = this.#instance;
+        refuseNested(this.#instance, "picture", focus);
         const numbers = pictureNumbers(options);
         usePictureOptions(this.#instance, numbers);
         const answer = exports.family_picture(this.#opened(), focusNumber(focus));
@@ -311,6 +313,7 @@ export class Family extends EventTarget {
         const instance = this.#instance;
         const { exports } = instance;
         const person = focusNumber(focus);
+        refuseNested(instance, "layout", focus);
         const view = instance.useOptions(options, optionNumbers);
         const answer = exports.family_layout(this.#opened(), view, person, withText);
         if (answer === 0) throw new LayoutError("outOfMemory", "There is not enough memory.", "", []);

@@ -6,7 +6,7 @@
 
 import { GedcomError, LayoutError } from "./errors.mjs";
 import { Instance } from "./instance.mjs";
-import { runLayout } from "./layout.mjs";
+import { refuseNested, runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
 import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers } from "./pictureOptions.mjs";
@@ -275,6 +275,7 @@ export class GedcomFile {
 
     #setPictureOptions(focus, options) {
         const { exports } = this.#instance;
+        refuseNested(this.#instance, "picture", focus);
         const numbers = pictureNumbers(options);
         for (const person of [focusNumber(focus), numbers[3] || focus]) {
             if (this.persons[person - 1] !== undefined) continue;

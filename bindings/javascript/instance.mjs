@@ -152,6 +152,11 @@ export class Instance {
         }
     }
 
+    /** Whether a host is being asked, so that whatever else is asked is asked by one of its methods. */
+    get isAsking() {
+        return this.#host !== null;
+    }
+
     #failed(error, failure, operation, ...asked) {
         this.#thrown = [error, `${operation}(${asked.join(", ")})`];
         return failure;

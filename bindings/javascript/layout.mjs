@@ -39,12 +39,20 @@ function reasonOf(error) {
     return error instanceof Error ? `${error.name}: ${error.message}` : String(error);
 }
 
+/** Throws where a method of a host asks for a layout or a picture while that host's own is being made. */
+export function refuseNested(instance, what, focus) {
+    if (!instance.isAsking) return;
+    const why = instance.text(instance.exports.status_text(STATUSES.indexOf("nestedCall")));
+    throw new LayoutError("nestedCall", `${what} of person ${described(focus)}: ${why}`, "", []);
+}
+
 /**
  * ask(view number, focus) runs the layout and gives the module's answer; host may be null where none is asked. wanted is
  * "text" or "records"; both without it, and of a layout that failed.
  */
 export function runLayout(instance, host, focus, options, ask, wanted = undefined) {
     const person = focusNumber(focus);
+    refuseNested(instance, "layout", focus);
     const view = instance.useOptions(options, optionNumbers);
     const { result, thrown } = instance.askingHost(host, () => readAnswer(instance, ask(view, person), wanted));
     const number = statusOf(result, thrown);
@@ -61,8 +69,9 @@ export function runLayout(instance, host, focus, options, ask, wanted = undefine
 
 /** The picture of a view of a host that is asked. */
 export function runPicture(instance, host, focus, options) {
-    usePictureOptions(instance, pictureNumbers(options));
     const person = focusNumber(focus);
+    refuseNested(instance, "picture", focus);
+    usePictureOptions(instance, pictureNumbers(options));
     const { exports } = instance;
     const { result, thrown } = instance.askingHost(host, () => {
         const picture = readPicture(instance, options, exports.host_picture(person));

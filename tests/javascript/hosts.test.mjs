@@ -285,6 +285,31 @@ test("a layout inside a layout is refused, and the outer one goes on", () => {
     assert.equal(inner, "nestedCall");
 });
 
+test("whatever is asked of the module inside a layout or a picture is refused by its person", () => {
+    const table = olvane.family({ persons: [{ id: 1 }] });
+    const file = olvane.readGedcom(new TextEncoder().encode("0 HEAD\n0 @I1@ INDI\n1 SEX M\n0 TRLR\n"));
+    const asks = [
+        ["layout", () => olvane.layout(new TableHost(henry), 1)],
+        ["picture", () => olvane.picture(new TableHost(henry), 1, { view: "near" })],
+        ["layout", () => table.layoutText(1)],
+        ["picture", () => table.picture(1, { view: "near" })],
+        ["layout", () => file.layoutText(1)],
+        ["picture", () => file.picture(1, { view: "near" })],
+        ["picture", () => file.svg(1)],
+    ];
+    for (const [what, ask] of asks) {
+        for (const outer of [olvane.layout, olvane.picture].map((call) => call.bind(olvane))) {
+            const host = hostOf({ sexOf: ask });
+            assert.throws(
+                () => outer(host, 1),
+                ({ cause }) => cause.status === "nestedCall" && cause.message.startsWith(`${what} of person 1: `),
+            );
+        }
+        ask();
+    }
+    file.close();
+});
+
 test("a family of a thousand generations is laid out", () => {
     const table = {};
     for (let id = 1; id <= 1000; ++id) table[id] = [id < 1000 ? id + 1 : 0, 0, [], id > 1 ? [id - 1] : [], 0];

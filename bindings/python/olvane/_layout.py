@@ -244,6 +244,7 @@ class _Request:
 
     def __init__(self, host: Host, focus: int, view: View, options: Options | None) -> None:
         self._answers = _Answers(host)
+        self._asked = focus
         self._focus = _focus_number(focus)
         self._ask = _asking(view)
         self._options = _options_struct(options)
@@ -268,9 +269,12 @@ class _Request:
                 message = self._answers.failure(raised)
                 raise HostError(Status.HOST_FAILED, message, self.text(), self.records()) from raised
             if self._status != Status.OK:
-                raise LayoutError(self._status, _message(self._status), self.text(), self.records())
+                raise LayoutError(self._status, self._reason(), self.text(), self.records())
         finally:
             del raised  # whose frames may hold this one
+
+    def _reason(self) -> str:
+        return f"layout of person {self._asked!r}: {_message(self._status)}"
 
     def text(self) -> str:
         return _text_of(self._layout)
@@ -298,8 +302,12 @@ class _FamilyRequest(_Request):
 
     def raise_failure(self) -> None:
         if self._status != Status.OK:
-            message = f"layout of person {self._asked!r}: {_message(self._status)}"
-            raise LayoutError(self._status, message, self.text(), self.records())
+            raise LayoutError(self._status, self._reason(), self.text(), self.records())
+
+    def _reason(self) -> str:
+        if self._status == Status.INVALID_PERSON:
+            return f"layout of person {self._asked!r}: the family has no person {self._asked!r}"
+        return super()._reason()
 
 
 def _family_laid_out(

@@ -165,6 +165,7 @@ class Refusals(unittest.TestCase):
             with self.assertRaises(olvane.LayoutError) as caught:
                 olvane.layout(olvane.Family(ROWS), focus)
             self.assertEqual(olvane.Status.INVALID_PERSON, caught.exception.status)
+            self.assertEqual(f"layout of person {focus}: the family has no person {focus}", str(caught.exception))
 
 
 class Edits(unittest.TestCase):

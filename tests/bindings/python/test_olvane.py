@@ -215,6 +215,7 @@ class Failures(unittest.TestCase):
                 olvane.layout(Family({}), focus)
             self.assertEqual(olvane.Status.INVALID_PERSON, caught.exception.status)
             self.assertEqual(("", []), (caught.exception.text, caught.exception.records))
+            self.assertTrue(str(caught.exception).startswith(f"layout of person {focus}: "), str(caught.exception))
 
     def test_an_answered_id_that_is_not_1_to_2147483647_is_refused_by_its_value(self) -> None:
         for answer in (0, -9, 1 << 31, (1 << 32) + 5, (1 << 53) + 1, (1 << 64) + 5, 10**40):
@@ -262,13 +263,22 @@ class Failures(unittest.TestCase):
             olvane.layout(Family({}), "17")  # type: ignore[arg-type]
 
     def test_a_layout_within_a_layout_is_refused(self) -> None:
-        host = Family({})
-        setattr(host, "sex_of", lambda person: len(olvane.layout(Family({}), person)))
-        with self.assertRaises(olvane.HostError) as caught:
-            olvane.layout(host, 17)
-        cause = caught.exception.__cause__
-        self.assertIsInstance(cause, olvane.LayoutError)
-        self.assertEqual(olvane.Status.NESTED_CALL, getattr(cause, "status"))
+        table = olvane.Family([{"id": 17}])
+        within: list[Callable[[int], object]] = [
+            lambda person: olvane.layout(Family({}), person),
+            lambda person: olvane.layout_text(table, person),
+            lambda person: olvane.picture(Family({}), person, "near"),
+            lambda person: olvane.picture(table, person, "near"),
+        ]
+        for ask in within:
+            host = Family({})
+            setattr(host, "sex_of", ask)
+            for lay_out in (olvane.layout, olvane.picture):
+                with self.assertRaises(olvane.HostError) as caught:
+                    lay_out(host, 17)
+                cause = caught.exception.__cause__
+                self.assertIsInstance(cause, olvane.LayoutError)
+                self.assertEqual(olvane.Status.NESTED_CALL, getattr(cause, "status"))
 
     def test_what_finds_no_room_in_the_library_is_no_failure_of_the_host(self) -> None:
         full = olvane.Status.OUT_OF_MEMORY

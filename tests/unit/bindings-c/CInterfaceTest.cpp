@@ -16,6 +16,8 @@
 
 #include <gtest/gtest.h>
 
+#include <olvane_picture.h>
+
 #include <olvane/Version.h>
 #include <olvane/boundary/CheckedLayout.h>
 #include <olvane/family/FamilyOptions.h>
@@ -396,6 +398,51 @@ TEST(CNesting, isRefusedAndLeavesTheOuterLayoutAlone) {
     EXPECT_EQ(OLVANE_HOST_FAILED, familyOf(callbacks, 17).status);
     EXPECT_EQ(OLVANE_NESTED_CALL, nested.inner);
     EXPECT_EQ(OLVANE_OK, familyOf(nested.callbacks, 17).status);
+}
+
+// Of a host, of a table and of a file, as a layout, a picture and a drawing, asked by a callback of a layout and of a picture.
+TEST(CNesting, isRefusedWhateverIsAskedFor) {
+    struct Asked {
+        CallbackHost host{family("17")};
+        olvane_host callbacks = host.callbacks();
+        olvane_family* table = nullptr;
+        olvane_file* file = nullptr;
+        std::vector<olvane_status> statuses;
+    } asked;
+    const olvane_person_row row = {17, 0, 0, 0, 0, nullptr, nullptr, nullptr, nullptr};
+    ASSERT_EQ(OLVANE_OK, olvane_family_create(nullptr, &asked.table, nullptr));
+    ASSERT_EQ(OLVANE_OK, olvane_family_add_person(asked.table, &row, nullptr));
+    const std::string gedcom = "0 HEAD\n0 @I1@ INDI\n1 SEX M\n0 TRLR\n";
+    ASSERT_EQ(OLVANE_OK, olvane_file_read(gedcom.data(), gedcom.size(), "x.ged", 0, &asked.file, nullptr));
+    olvane_host callbacks = asked.host.callbacks();
+    callbacks.context = &asked;
+    callbacks.sex_of = [](void* context, std::int64_t, std::int32_t*) {
+        Asked& within = *static_cast<Asked*>(context);
+        olvane_layout* layout = nullptr;
+        olvane_picture* picture = nullptr;
+        olvane_result* svg[2] = {};
+        within.statuses = {olvane_layout_family(&within.callbacks, 17, nullptr, &layout),
+                           olvane_view(within.table, OLVANE_VIEW_FAMILY, 17, nullptr, &layout),
+                           olvane_picture_of_host(&within.callbacks, 17, nullptr, &picture),
+                           olvane_picture_of_family(within.table, 17, nullptr, &picture),
+                           olvane_picture_of_file(within.file, 1, nullptr, &picture),
+                           olvane_draw(within.file, 1, nullptr, &svg[0]),
+                           olvane_draw_family(within.table, 17, nullptr, &svg[1])};
+        for (olvane_result* result : svg) olvane_result_free(result);
+        return 1;
+    };
+    const std::vector<olvane_status> refused(7, OLVANE_NESTED_CALL);
+    EXPECT_EQ(OLVANE_HOST_FAILED, familyOf(callbacks, 17).status);
+    EXPECT_EQ(refused, asked.statuses);
+    asked.statuses.clear();
+    olvane_picture* picture = nullptr;
+    EXPECT_EQ(OLVANE_HOST_FAILED, olvane_picture_of_host(&callbacks, 17, nullptr, &picture));
+    EXPECT_EQ(refused, asked.statuses);
+    olvane_picture_free(picture);
+    EXPECT_EQ(OLVANE_OK, olvane_picture_of_family(asked.table, 17, nullptr, &picture));
+    olvane_picture_free(picture);
+    olvane_family_free(asked.table);
+    olvane_file_free(asked.file);
 }
 
 // A source of the C++ engine that lays out another family by the C library within its questions.
