@@ -67,6 +67,32 @@ describe("accessible", kTwoAtOnce, () => {
         });
     }
 
+    test("from right to left, names, years and dates of the panel begin where all else does", async () => {
+        const visit = await visitDarwins();
+        await visit.page.evaluate(() => (document.documentElement.dir = "rtl"));
+        await visit.still();
+        const gaps = await visit.page.evaluate(() => {
+            const rightOf = (part) => {
+                const range = document.createRange();
+                range.selectNodeContents(part);
+                return range.getBoundingClientRect().right;
+            };
+            const name = rightOf(one("#side-panel h2"));
+            const header = rightOf(one("#side-panel header .years"));
+            const relatives = [...all("#side-panel .relative")].map(
+                (one) => rightOf(one.querySelector(".name")) - rightOf(one.querySelector(".years")),
+            );
+            const dates = [...all("#side-panel dd")].map((one) => {
+                const date = one.querySelector(".date");
+                return date ? one.getBoundingClientRect().right - rightOf(date) : 0;
+            });
+            return [name - header, ...relatives, ...dates];
+        });
+        assert.ok(gaps.length > 5, String(gaps));
+        for (const gap of gaps) assert.ok(Math.abs(gap) < 2, String(gaps));
+        await visit.end();
+    });
+
     test("with text of twice the size nothing is cut off or lies outside the window", async () => {
         const visit = await visitDarwins("#person=I1", { viewport: { width: 1280, height: 900 } });
         const sizes = () =>

@@ -158,7 +158,8 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         const placeIn = (hash) => /map=([-\d.]+),([-\d.]+),.*number=(\d+)/.exec(hash).slice(1).map(Number);
         const [x, y, number] = placeIn(await visit.hash());
         const name = await visit.page.textContent("#map-card h2");
-        await visit.page.check("#mirrored"); // the list of views stays open
+        await visit.click("#views-button");
+        await visit.page.check("#mirrored");
 
         await visit.page.waitForFunction(() => location.hash.includes("mirror=yes"));
         const turned = placeIn(await visit.hash());

@@ -55,7 +55,11 @@ export class ViewChooser {
             icon("map"),
             html("span", {}, ui.map.name),
         );
-        onClick(this.map, () => actions.setMap());
+        // The keys go to the map.
+        onClick(this.map, () => {
+            this.popover.close();
+            actions.setMap();
+        });
         views.append(this.map);
         this.direction = html("select", { id: "direction" });
         for (const name of kDirections) this.direction.append(html("option", { value: name }, ui.directions[name]));
