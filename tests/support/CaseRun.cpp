@@ -169,7 +169,7 @@ TypedRun runTypedCase(const CaseFile& request, const std::function<void(TreeView
         layouter.recordLinesIn(record);
         layouter.layoutForFocusNID();
         if (look) look(layouter);
-        olvane::writeTypedLayout(layouter, glue, record, true, result.layout);
+        olvane::writeTypedLayout(glue, record, true, result.layout);
     });
     result.failed = !completed;
     result.trace = manager->host.trace();

@@ -13,10 +13,12 @@
 #include <olvane/boundary/LayoutPieces.h>
 
 #include <olvane/boundary/DecimalInternal.h>
+#include <olvane/boundary/ResultRecordInternal.h>
 #include <olvane/graph/WholePointInternal.h>
 
 #include <cstddef>
 #include <cstring>
+#include <span>
 #include <string_view>
 
 namespace olvane {
@@ -65,15 +67,15 @@ public:
         end_ = write(end_, flag ? 1 : 0, ':');
     }
 
-    void add(const TreeLineSegment& segment) {
+    // Lines run along the axes, so the second end mostly shares a number with the first.
+    template <class Segment>
+    void add(const Segment& segment) {
         makeRoom();
         char* const x1 = end_;
-        char* const y1 = write(x1, wholePoint(segment.x1), ',');
-        char* const x2 = write(y1, wholePoint(segment.y1), ',');
-        // Lines run along the axes, so the second end mostly shares a number with the first.
-        char* const y2 =
-            segment.x2 == segment.x1 ? repeat(x1, y1, x2) : write(x2, wholePoint(segment.x2), ',');
-        end_ = segment.y2 == segment.y1 ? repeat(y1, x2, y2) : write(y2, wholePoint(segment.y2), ',');
+        char* const y1 = write(x1, whole(segment.x1), ',');
+        char* const x2 = write(y1, whole(segment.y1), ',');
+        char* const y2 = segment.x2 == segment.x1 ? repeat(x1, y1, x2) : write(x2, whole(segment.x2), ',');
+        end_ = segment.y2 == segment.y1 ? repeat(y1, x2, y2) : write(y2, whole(segment.y2), ',');
         end_[-1] = '|';
         length_ = static_cast<std::size_t>(end_ - x1);
     }
@@ -90,6 +92,9 @@ public:
     }
 
 private:
+    static int whole(float value) { return wholePoint(value); }
+    static int whole(int value) { return value; }
+
     // With what a repeated number writes past its end.
     static constexpr std::size_t kLongestSegment = 4 * (kLongestDecimal + 1) + kCopied;
 
@@ -110,17 +115,17 @@ private:
 };
 
 // Each child of a couple leaves the same drop, one behind the other, so the last piece often serves again.
-void addSegments(Piece& piece, const TreeViewPerson& person) {
-    const TreeLineSegment* last = nullptr;
-    for (const TreeLineSegment& segment : person.lineSegments) {
-        const bool isRepeated = last != nullptr && last->firstEnd() == segment.firstEnd() &&
-                                last->secondEnd() == segment.secondEnd();
+template <class Segments>
+void addSegments(Piece& piece, const Segments& segments) {
+    auto last = segments.end();
+    for (auto segment = segments.begin(); segment != segments.end(); last = segment++) {
+        const bool isRepeated = last != segments.end() && last->x1 == segment->x1 &&
+                                last->y1 == segment->y1 && last->x2 == segment->x2 && last->y2 == segment->y2;
         if (isRepeated) {
             piece.repeatSegment();
         } else {
-            piece.add(segment);
+            piece.add(*segment);
         }
-        last = &segment;
     }
 }
 
@@ -139,13 +144,24 @@ void writeRecord(const ViewerGlue& glue, ResultBounds& bounds, std::string& text
     updateBounds(bounds, x, y);
     Piece piece(text);
     piece.addPersonPlaceAndFlag(personText, x, y, person.hasNonDisplayedRelationships);
-    addSegments(piece, person);
+    addSegments(piece, person.lineSegments);
     piece.flush();
     if (glue.numberOfKey(person.personId) < 0) appendSexAndChild(text, glue, person.personId);
     text += ';';
 }
 
 }  // namespace
+
+void appendRecord(const ViewerGlue& glue, int key, const TypedLayout::Box& box,
+                  std::span<const TypedLayout::Line> lines, std::string& text) {
+    ViewerGlue::DecimalBuffer buffer;
+    Piece piece(text);
+    piece.addPersonPlaceAndFlag(glue.textOfKey(key, buffer), box.x, box.y, box.hasHiddenRelatives);
+    addSegments(piece, lines);
+    piece.flush();
+    if (box.id < 0) appendSexAndChild(text, glue, key);
+    text += ';';
+}
 
 TreeViewPerson::Visitor resultWriter(ViewerGlue& glue, ResultBounds& bounds, std::string& text) {
     return [&glue, &bounds, &text](TreeViewPerson& person) { writeRecord(glue, bounds, text, person); };

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A typed layout is filled in the walk that writes the text: each visited person gives a box and the lines that
-// it holds, joined one by one with what the layouter recorded of them.
+// A typed layout is filled in the order of the walk: each visited person gives a box and the lines that it holds, joined one by one with
+// what the layouter recorded of them. The text, where it is asked for, is written from the same numbers.
 
 #include <olvane/boundary/TypedLayout.h>
 
@@ -12,6 +12,7 @@
 #include <string>
 
 #include <olvane/boundary/LayoutPieces.h>
+#include <olvane/boundary/ResultRecordInternal.h>
 #include <olvane/boundary/TypedLayoutWriterInternal.h>
 #include <olvane/family/FamilyOptions.h>
 #include <olvane/family/TreeViewFamilyLayouter.h>
@@ -29,27 +30,40 @@ typedef TypedLayout::Index Index;
 // Fills the boxes and the lines, person by person.
 class BoxWriter {
 public:
-    BoxWriter(const ViewerGlue& glue, const LineRecord& record, TypedLayout& layout)
-        : glue_(glue), record_(record), layout_(layout) {
+    BoxWriter(const ViewerGlue& glue, const LineRecord& record, bool withText, TypedLayout& layout)
+        : glue_(glue), record_(record), withText_(withText), layout_(layout) {
         layout.boxes.reserve(record.visits());
         layout.lines.reserve(record.segments());
     }
 
+    // What fails leaves no line without its box.
+    ~BoxWriter() {
+        const std::size_t lines =
+            layout_.boxes.empty() ? 0 : layout_.boxes.back().firstLine + layout_.boxes.back().lineCount;
+        layout_.lines.resize(lines);
+    }
+    BoxWriter(const BoxWriter&) = delete;
+    BoxWriter& operator=(const BoxWriter&) = delete;
+
     void add(const TreeViewPerson& person) {
         const Index place = static_cast<Index>(layout_.boxes.size());
         TypedLayout::Box box;
+        box.firstLine = static_cast<std::uint32_t>(layout_.lines.size());
         box.id = glue_.numberOfKey(person.personId);
         box.x = wholePoint(person.getNodeCenter().x);
         box.y = wholePoint(person.getNodeCenter().y);
         box.male = person.gender;
         box.hasHiddenRelatives = person.hasNonDisplayedRelationships;
         if (person.walkNumber() != place) box.repeatOf = person.walkNumber();
-        if (box.id < 0) setUnknownParent(person.personId, box);
-        box.firstLine = static_cast<std::uint32_t>(layout_.lines.size());
         addLines(person, place);
         box.lineCount = static_cast<std::uint32_t>(layout_.lines.size()) - box.firstLine;
+        if (withText_) appendRecord(glue_, person.personId, box, layout_.linesOf(box), layout_.text);
+        if (box.id < 0) setUnknownParent(person.personId, box);
+        hasUnknownParents_ = hasUnknownParents_ || box.id < 0;
         layout_.boxes.push_back(box);
     }
+
+    bool hasUnknownParents() const { return hasUnknownParents_; }
 
 private:
     void setUnknownParent(int key, TypedLayout::Box& box) const {
@@ -61,8 +75,9 @@ private:
     void addLines(const TreeViewPerson& person, Index holder) {
         const TreeLineSegment* segment = person.lineSegments.data();
         std::size_t left = person.lineSegments.size();
+        const LineRecord::Entry* const entries = record_.entries().data();
         for (int place = record_.firstEntryOf(person); place != LineRecord::kNone;) {
-            const LineRecord::Entry& entry = record_.entries()[static_cast<std::size_t>(place)];
+            const LineRecord::Entry entry = entries[place];
             if (entry.segments > left) failForCount();
             for (std::uint8_t i = 0; i < entry.segments; ++i) addLine(*segment++, entry, i, holder);
             left -= entry.segments;
@@ -88,7 +103,9 @@ private:
 
     const ViewerGlue& glue_;
     const LineRecord& record_;
+    const bool withText_;
     TypedLayout& layout_;
+    bool hasUnknownParents_ = false;
 };
 
 // A family's children, each once. Only where the walk visits somebody twice may one have been recorded twice.
@@ -173,23 +190,17 @@ void run(Layouter& layouter, ViewerGlue& glue, bool withText, TypedLayout& resul
     LineRecord record;
     layouter.recordLinesIn(record);
     layouter.layoutForFocusNID();
-    writeTypedLayout(layouter, glue, record, withText, result);
+    writeTypedLayout(glue, record, withText, result);
 }
 
 }  // namespace
 
-void writeTypedLayout(SharedTreeViewer::TreeViewLayouter& layouter, ViewerGlue& glue,
-                      const SharedTreeViewer::LineRecord& record, bool withText, TypedLayout& result) {
-    BoxWriter boxes(glue, record, result);
-    ResultBounds bounds;
-    const TreeViewPerson::Visitor writeText =
-        withText ? resultWriter(glue, bounds, result.text) : TreeViewPerson::Visitor();
-    layouter.graphIterator([&](TreeViewPerson& person) {
-        if (withText) writeText(person);
-        boxes.add(person);
-    });
+void writeTypedLayout(const ViewerGlue& glue, const SharedTreeViewer::LineRecord& record, bool withText,
+                      TypedLayout& result) {
+    BoxWriter boxes(glue, record, withText, result);
+    for (std::size_t visit = 0; visit < record.visits(); ++visit) boxes.add(record.visited(visit));
     addFamilies(record, result);
-    linkUnknownParents(result);
+    if (boxes.hasUnknownParents()) linkUnknownParents(result);
 }
 
 void layOut(TypedLayout::View view, std::int64_t focusId,

@@ -23,6 +23,30 @@ void LineRecord::reserve(std::size_t persons) {
     families_.reserve(persons / 2);
 }
 
+inline void LineRecord::addChild(Family& family, int child) {
+    const int place = static_cast<int>(children_.size());
+    children_.push_back({child, kNone});
+    if (family.lastChild == kNone) {
+        family.firstChild = place;
+    } else {
+        children_[static_cast<std::size_t>(family.lastChild)].next = place;
+    }
+    family.lastChild = place;
+}
+
+inline void LineRecord::add(const TreeViewPerson& holder, const Entry& entry) {
+    const int place = static_cast<int>(entries_.size());
+    entries_.push_back(entry);
+    segments_ += entry.segments;
+    Person& person = persons_[static_cast<std::size_t>(holder.walkNumber())];
+    if (person.lastEntry == kNone) {
+        person.firstEntry = place;
+    } else {
+        entries_[static_cast<std::size_t>(person.lastEntry)].next = place;
+    }
+    person.lastEntry = place;
+}
+
 void LineRecord::addMarriage(const TreeViewPerson& holder, const TreeViewPerson& person,
                              const TreeViewPerson& spouse) {
     add(holder, {familyOf(person, &spouse), kNone, kNone, LineRole::marriage, 1});
@@ -55,30 +79,6 @@ int LineRecord::familyOf(const TreeViewPerson& parent, const TreeViewPerson* oth
     families_.push_back({first, second, newest, kNone, kNone});
     newest = static_cast<int>(families_.size()) - 1;
     return newest;
-}
-
-void LineRecord::addChild(Family& family, int child) {
-    const int place = static_cast<int>(children_.size());
-    children_.push_back({child, kNone});
-    if (family.lastChild == kNone) {
-        family.firstChild = place;
-    } else {
-        children_[static_cast<std::size_t>(family.lastChild)].next = place;
-    }
-    family.lastChild = place;
-}
-
-void LineRecord::add(const TreeViewPerson& holder, const Entry& entry) {
-    const int place = static_cast<int>(entries_.size());
-    entries_.push_back(entry);
-    segments_ += entry.segments;
-    Person& person = persons_[static_cast<std::size_t>(holder.walkNumber())];
-    if (person.lastEntry == kNone) {
-        person.firstEntry = place;
-    } else {
-        entries_[static_cast<std::size_t>(person.lastEntry)].next = place;
-    }
-    person.lastEntry = place;
 }
 
 }  // namespace SharedTreeViewer

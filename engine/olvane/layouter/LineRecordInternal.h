@@ -55,7 +55,7 @@ public:
         } else {
             hasRepeatedVisits_ = true;
         }
-        persons_.emplace_back();
+        persons_.emplace_back().visited = &person;
     }
 
     void addMarriage(const TreeViewPerson& holder, const TreeViewPerson& person,
@@ -66,6 +66,8 @@ public:
                        const TreeViewPerson& parent, const TreeViewPerson* other);
 
     std::size_t visits() const { return persons_.size(); }
+    // Whom the walk visits as the nth. Persons are not moved any more once they are numbered.
+    const TreeViewPerson& visited(std::size_t n) const { return *persons_[n].visited; }
     bool hasRepeatedVisits() const { return hasRepeatedVisits_; }
     const std::vector<Entry>& entries() const { return entries_; }
     int firstEntryOf(const TreeViewPerson& person) const { return of(person).firstEntry; }
@@ -77,6 +79,7 @@ public:
 
 private:
     struct Person {
+        const TreeViewPerson* visited = nullptr;
         int firstEntry = kNone;
         int lastEntry = kNone;
         int lastFamily = kNone;  // of those in which this is the parent with the greater number
@@ -89,7 +92,7 @@ private:
     void add(const TreeViewPerson& holder, const Entry& entry);
     void addChild(Family& family, int child);
 
-    std::vector<Person> persons_;  // by number
+    std::vector<Person> persons_;  // by number, and so in the order of the walk
     std::vector<Entry> entries_;
     std::vector<Family> families_;
     std::vector<Child> children_;
