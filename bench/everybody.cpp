@@ -292,9 +292,9 @@ void measureGrowth(KinGraph graph, int persons) {
         if (i != 1 && i != 10 && i % 100 != 0) continue;
         options.earlier = nullptr;
         const auto kept = olvane::picture::judge(picture, &graph);
-        const auto anew = olvane::picture::judge(everybodyChart(graph, options), &graph);
+        const auto again = olvane::picture::judge(everybodyChart(graph, options), &graph);
         std::printf("| %d | %.1f | %zu | %.1f | %zu |\n", i, kept.areaPerPerson, kept.crossings,
-                    anew.areaPerPerson, anew.crossings);
+                    again.areaPerPerson, again.crossings);
         std::fflush(stdout);
     }
 }

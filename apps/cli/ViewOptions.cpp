@@ -112,7 +112,8 @@ void addView(CLI::App& command, LayoutRequest& request) {
         .add_option(
             "--view", request.chart.view,
             "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
-            "the relatives of family, placed anew without overlaps; ancestors, descendants, hourglass (both) "
+            "the relatives of family, placed again without overlaps; ancestors, descendants, hourglass "
+            "(both) "
             "and relatives (the descendants of every ancestor): any number of generations, each person once; "
             "fan: ancestors or descendants in rings; kinship: everybody on the ways to --to; everybody: the "
             "whole connected family")

@@ -3,7 +3,7 @@
 
 // One adapter for each peer. load() returns
 //
-//     input(persons)   a function that gives one layout's input, in the peer's own form; made anew where the peer
+//     input(persons)   a function that gives one layout's input, in the peer's own form; made again where the peer
 //                      writes into it, and never timed
 //     layout(input)    the layout alone, nothing drawn; the timed part
 //     shown(result)    the ids of the persons that it placed, as texts; a person placed twice is listed twice
@@ -153,7 +153,7 @@ async function familyChart() {
 }
 
 // It keeps two lists of what it has placed from call to call, and gets slower with every layout. So the modules that
-// hold them are loaded anew before each layout, not timed, and so run not yet compiled; the others stay warm.
+// hold them are loaded again before each layout, not timed, and so run not yet compiled; the others stay warm.
 async function entitreeFlex() {
   const holdsLists = /entitree-flex.dist.(index|layoutFromMap|drillChildren|drillParents)\.js$/;
   return entitreeFlexWith(() => {

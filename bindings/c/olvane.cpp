@@ -165,7 +165,7 @@ private:
 };
 
 // Counts this thread's layouts: the engine numbers its unknown parents by thread, and a second layout inside the
-// first would start the numbers of both anew.
+// first would start the numbers of both again.
 class RunningLayout {
 public:
     RunningLayout() : isFirst_(!isRunning_) { isRunning_ = true; }

@@ -33,7 +33,7 @@ private:
     id object_;
 };
 
-// The list is asked for its count at each place anew, and the questions about an entry come before the next one,
+// The list is asked for its count at each place again, and the questions about an entry come before the next one,
 // so a list that changes meanwhile is read to its present end. It is held, since a question may make the host let
 // go of it.
 void visitEntries(NSArray* list, const PersonIdVisitor& visit) {

@@ -144,7 +144,7 @@ export class Instance {
         try {
             return { result: run(), thrown: this.#thrown };
         } catch (error) {
-            this.#broken = new Error("the module broke off in a layout; load it anew", { cause: error });
+            this.#broken = new Error("the module broke off in a layout; load it again", { cause: error });
             throw this.#broken;
         } finally {
             this.#host = outer.host;
@@ -162,7 +162,7 @@ export class Instance {
         return failure;
     }
 
-    // A view of the memory, made anew where the memory has grown.
+    // A view of the memory, made again where the memory has grown.
     #memory = new Int32Array();
 
     #store(pointer, number) {

@@ -7,7 +7,7 @@ Usage: trace_lines.py PATH/TO/olvane FILE.ged [--show N]; a name alone is looked
 
 The lines are taken without what they are said to belong to. Two pieces are one line where an end of one lies on the
 other; where they merely cross, the finger goes straight on. What a line touches must be one family of the file, and
-every family of the file with two or more members must be found so. The file is read here anew, line by line.
+every family of the file with two or more members must be found so. The file is read here again, line by line.
 """
 
 import collections

@@ -346,7 +346,7 @@ test("a module that broke off answers no more", async () => {
     const breakOff = () => {
         throw cause;
     };
-    const message = "the module broke off in a layout; load it anew";
+    const message = "the module broke off in a layout; load it again";
     assert.throws(() => runLayout(instance, new TableHost(henry), 1, {}, breakOff), { message, cause });
     assert.throws(() => new Olvane(instance).layout(new TableHost(henry), 1), { message, cause });
 });

@@ -174,7 +174,7 @@ RC_GTEST_PROP(LayoutProperties, everyCoordinateIsFinite, ()) {
 }
 
 // All questions come before the first record, so that whichever fails, nothing is written yet. One of the calls
-// really made is drawn, so every drawn request fails; those without a call are drawn anew.
+// really made is drawn, so every drawn request fails; those without a call are drawn again.
 RC_GTEST_PROP(LayoutProperties, aHostThatFailsAtAnyCallIsNotAskedAgainAndGetsNoText, ()) {
     CaseFile request = drawCase(property::anyRequest(kMostPersons));
     std::vector<std::string> lines = support::runCase(request, false, true);

@@ -22,7 +22,7 @@ public:
     FamilyMaker(std::uint64_t seed, int persons);
 
     CaseFile consistent();                 // everybody agrees with everybody
-    CaseFile contradictory(double share);  // each answer is made up anew with that probability
+    CaseFile contradictory(double share);  // each answer is made up again with that probability
     CaseFile both();                       // a consistent family with a tenth of its answers made up
     CaseFile any();                        // one of the three
 

@@ -19,7 +19,7 @@ struct FoldSizes {
     bool splitSiblings = false;  // the children of one union too, where they alone make a row too wide
 };
 
-// The rows anew, with wide generations in two or three: of the children of one union all in one row, those of the
+// The rows again, with wide generations in two or three: of the children of one union all in one row, those of the
 // next in the next, as they follow one another in the order; children that are split stand in the rows by turns. Everybody
 // stays below their parents.
 std::vector<std::int32_t> foldRows(const Rows& rows, const RowOrder& order, const FoldSizes& sizes);

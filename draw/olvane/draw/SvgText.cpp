@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The two roads by which anything gets into a picture: escaped text and numbers.
+// The two ways by which anything gets into a picture: escaped text and numbers.
 
 #include <olvane/draw/SvgTextInternal.h>
 

@@ -11,7 +11,7 @@
 
 namespace olvane::draw {
 
-// Each way has a colour and dashes of its own, the first ones unbroken lines; beyond the eighth they begin anew.
+// Each way has a colour and dashes of its own, the first ones unbroken lines; beyond the eighth they begin again.
 std::string_view wayColour(const DrawingTheme& theme, std::size_t way);
 std::string_view wayDashes(std::size_t way);
 

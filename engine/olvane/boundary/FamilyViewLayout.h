@@ -17,7 +17,7 @@
 //        far, usually the empty one. Memory that runs out before or after the layout throws std::bad_alloc.
 // Threads: several calls may run at once, each with a data source of its own or one that is safe to share.
 // Nested: an operation of the data source may call this too. The two count unknown parents in one sequence, which the inner
-//         call starts anew, so the outer one's later unknown parents have other ids than without it. Typed layouts
+//         call starts again, so the outer one's later unknown parents have other ids than without it. Typed layouts
 //         (TypedLayout.h) leave the sequence of an outer call alone.
 OLVANE_API std::string FamilyViewLayout(std::string personText,
                                         std::shared_ptr<OlvaneViewerManagerWrapProtocol> manager);

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The road from the layouters to the data source: keys to ids and back, records from lists, and unknown parents
+// The path from the layouters to the data source: keys to ids and back, records from lists, and unknown parents
 // where a parent is not known.
 //
 // Nothing is remembered from one call to the next. A person without a known parent gets a new unknown parent at

@@ -74,7 +74,7 @@ private:
 };
 
 // Whole-number bounds of the records written. A bound of 0 stands for one not yet set, so one that has truly
-// reached 0 is set anew by the next person. Nothing reads them.
+// reached 0 is set again by the next person. Nothing reads them.
 struct ResultBounds {
     int minX = 0;
     int minY = 0;

@@ -67,7 +67,7 @@ public:
 
     // The sum of the distances of all later points from the FIRST point, not from the point before: for three
     // or more points this is not the length of the polyline. (0,0) (10,0) (10,10) gives 10 + 14.142136. Hosts
-    // compare lines by this number, so a corrected sum would rank their lines anew. Kept until the next
+    // compare lines by this number, so a corrected sum would rank their lines again. Kept until the next
     // change.
     float length();
 

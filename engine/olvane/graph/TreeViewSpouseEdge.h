@@ -42,7 +42,7 @@ public:
 
     std::size_t size() const { return childEdges.size(); }
 
-    // A walk over plain pointers. begin and cbegin take the view anew; end and cend give the end of the view
+    // A walk over plain pointers. begin and cbegin take the view again; end and cend give the end of the view
     // as it stands, so begin is asked first and end after it.
     ChildEdgeList::iterator begin();
     ChildEdgeList::iterator end() { return childEdgeList.end(); }

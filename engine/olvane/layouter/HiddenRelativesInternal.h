@@ -7,7 +7,7 @@
 
 namespace SharedTreeViewer {
 
-// The looks for relatives off the picture that both views take word for word. Each asks the data source anew,
+// The looks for relatives off the picture that both views take word for word. Each asks the data source again,
 // and the order of the questions is behaviour: every look at unknown parents uses up negative ids.
 
 // Asks for all the host's spouses of the person, shown or not, at most once for each node.

@@ -8,7 +8,7 @@
 
 namespace SharedTreeViewer {
 
-// The road of one line, drawn piece by piece. Every piece goes to two readers: to the segments of the person
+// The course of one line, drawn piece by piece. Every piece goes to two readers: to the segments of the person
 // who holds it, which reach the host, and to the course that an edge keeps. Pieces are not deduplicated.
 class LineCourse {
 public:

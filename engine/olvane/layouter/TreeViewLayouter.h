@@ -78,7 +78,7 @@ public:
                                                   int count) const;
 
     // --- Growing the graph. Each asks the data source for one person's relatives and enters them there. They
-    // are asked anew at each call, but for the children, which every node keeps. A spouse's gender is the
+    // are asked again at each call, but for the children, which every node keeps. A spouse's gender is the
     // opposite of the person's: the data source is not asked for it.
     void addSpousesToPerson(TreeViewPerson& person);
     void addAllChildrenToPerson(TreeViewPerson& person);

@@ -134,7 +134,7 @@ private:
         person.spouses = answeredList(person, "spouses", host_.spousesForPersonWithID(person.id));
     }
 
-    // Spouses come last: theirs are not asked for, whatever road led to them.
+    // Spouses come last: theirs are not asked for, however they were reached.
     void askForSpouses() {
         if (reach_.everybody) return;
         const std::size_t walked = met_.size();

@@ -18,7 +18,7 @@ struct LayoutPictureOptions {
     bool unknownParents = true;
 };
 
-// The picture of one of the engine's two views. Boxes stand where the engine put them; lines are routed anew
+// The picture of one of the engine's two views. Boxes stand where the engine put them; lines are routed again
 // from the families.
 //
 // With what is known, there is a family for each known one, by the link to the parents who are drawn: children

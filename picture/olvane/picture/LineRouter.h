@@ -20,7 +20,7 @@ struct RouteOptions {
     double trackDistance = 5;
 };
 
-// Draws the lines of all families anew, from the places of the boxes and the members of the families.
+// Draws the lines of all families again, from the places of the boxes and the members of the families.
 //
 // Boxes stand in rows (in columns where the picture runs sideways): what overlaps in y is one row. A couple
 // that stands together has a straight marriage line; where somebody stands between, the line runs over the

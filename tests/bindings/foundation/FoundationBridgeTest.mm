@@ -118,7 +118,7 @@ TEST_F(FoundationBridge, asksTheSameQuestionsAsTheEngine) {
     EXPECT_LT(0, std::count(calls.begin(), calls.end(), "call isPreferredSpouse 4 3"));
 }
 
-TEST_F(FoundationBridge, readsTheCountOfAListAtEachPlaceAnew) {
+TEST_F(FoundationBridge, readsTheCountOfAListAtEachPlaceAgain) {
     EXPECT_EQ(familyOf(family("17+42: 5 6")),
               valuesOf(hostOf<ShrinkingListHost>(family("17+42: 5 6 7")), 17));
 }

@@ -242,13 +242,13 @@ class Views(unittest.TestCase):
         parents = [{"id": person, "father": father, "mother": mother} for person, (father, mother) in rows.items()]
         before = olvane.picture(olvane.Family(parents), 7, "everybody")
         grown = olvane.Family([{"id": 9, "father": 1, "mother": 2}, *parents])
-        anew = olvane.picture(grown, 7, "everybody")
+        again = olvane.picture(grown, 7, "everybody")
         kept = olvane.picture(grown, 7, "everybody", earlier=before)
         column = {box.id: box.x - before.boxes[before.focus].x for box in before.boxes}
         moved = [b.id for b in kept.boxes if b.id in column and b.x - kept.boxes[kept.focus].x != column[b.id]]
         self.assertEqual([5], moved)  # makes room beside its new sibling
-        self.assertNotEqual(anew.boxes, kept.boxes)
-        self.assertEqual(anew.boxes, olvane.picture(grown, 7, "everybody", earlier=copy.deepcopy(before)).boxes)
+        self.assertNotEqual(again.boxes, kept.boxes)
+        self.assertEqual(again.boxes, olvane.picture(grown, 7, "everybody", earlier=copy.deepcopy(before)).boxes)
         self.assertEqual(before, copy.deepcopy(before))
         with self.assertRaisesRegex(TypeError, "takes a Picture"):
             olvane.picture(grown, 7, "everybody", earlier="before")  # type: ignore[arg-type]

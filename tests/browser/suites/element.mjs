@@ -318,8 +318,8 @@ describe("element", () => {
                 .open(new TextEncoder().encode(olvane.family({ persons: grown }).gedcom())),
         );
         await page.waitForTimeout(800);
-        const anew = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
-        assert.ok(anew.length > moved.length, `anew ${anew.join("; ")}`);
+        const again = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
+        assert.ok(again.length > moved.length, `again ${again.join("; ")}`);
         await end();
     });
 

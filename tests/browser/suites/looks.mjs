@@ -139,28 +139,28 @@ describe("looks", kTwoAtOnce, () => {
     test("themes follow the system or the choice, which is remembered", async () => {
         const visit = await visitDarwins("#person=I1", { colorScheme: "dark" });
         const { page } = visit;
-        const wears = (theme) =>
+        const hasColours = (theme) =>
             page.waitForFunction((theme) => document.documentElement.dataset.theme === theme, theme);
         const paper = () =>
             page.evaluate(
                 () => getComputedStyle(one("#tree")).backgroundColor + getComputedStyle(document.body).backgroundColor,
             );
-        await wears("dark");
+        await hasColours("dark");
         await visit.stand("I2");
         await photograph(visit, "dark");
         const dark = await paper();
         await page.emulateMedia({ colorScheme: "light" });
-        await wears("light");
+        await hasColours("light");
         const light = await paper();
         assert.notEqual(light, dark);
         await visit.click("#options-button");
         await page.selectOption("#theme", "contrast");
-        await wears("contrast");
+        await hasColours("contrast");
         await page.keyboard.press("Escape");
         await photograph(visit, "contrast");
         await page.reload();
         await visit.untilFamily();
-        await wears("contrast");
+        await hasColours("contrast");
         await visit.end();
     });
 

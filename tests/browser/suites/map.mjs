@@ -404,7 +404,7 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         await visit.end();
     });
 
-    test("the map wears the dark colours, and keeps still where movement is unwelcome", async () => {
+    test("the map has the dark colours, and keeps still where movement is unwelcome", async () => {
         const visit = await visitMap(darwins().path, { colorScheme: "dark", reducedMotion: "reduce" });
         const corner = await visit.page.evaluate(() => [
             ...document.querySelector("#map canvas").getContext("2d").getImageData(2, 2, 1, 1).data,

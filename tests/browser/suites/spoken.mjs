@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Five tasks as a screen reader speaks them. The texts stand in golden/ to be read by people: each should make sense to
-// somebody who has never seen the picture. Run with OLVANE_RECORD=1 to write them anew, read them, and commit them.
+// somebody who has never seen the picture. Run with OLVANE_RECORD=1 to write them again, read them, and commit them.
 
 import assert from "node:assert/strict";
 import { existsSync, readFileSync, writeFileSync } from "node:fs";

@@ -3,7 +3,7 @@
 
 // The nodes of the plain layout and the walks over them. Slow and plain on purpose: every relative is a
 // separate object behind a shared pointer, so nothing moves when a list grows, and every question walks the
-// lists anew. The order of every walk is what the engine is compared with.
+// lists again. The order of every walk is what the engine is compared with.
 
 #include <support/plain/PlainPerson.h>
 

@@ -275,7 +275,7 @@ TEST(CMemoryOfFiles, thatRunsOutInAQuestionLeavesNothing) {
     }
 }
 
-// Every view of a file that is read anew each time, so that what it keeps is made anew as well.
+// Every view of a file that is read again each time, so that what it keeps is made again as well.
 TEST(CMemoryOfFiles, thatRunsOutInAPictureLeavesNothing) {
     for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
         SCOPED_TRACE(view);

@@ -107,7 +107,7 @@ TEST(Bridge, hostIsAskedWithTheCutId) {
     EXPECT_EQ("sexOfPersonWithID 17", request.newCalls().front());
 }
 
-TEST(Bridge, asksAnewInEveryCallAndKeepsNoPerson) {
+TEST(Bridge, asksAgainInEveryCallAndKeepsNoPerson) {
     Request request(family("17+42: 5"));
     const auto bridge = OlvaneViewerBridge::initWithManagerWrap(request.source);
     const std::string first = bridge.valuesForPersonId(17);

@@ -279,7 +279,7 @@ TEST(NestedLayouts, thatAreTypedLeaveTheOuterOneItsAddNodes) {
 }
 
 // The focus's unknown parents come after the question for children, so they go on where the inner layout ended.
-TEST(NestedLayouts, byTheEntryCallStartTheAddNodesOfTheOuterOneAnew) {
+TEST(NestedLayouts, byTheEntryCallStartTheAddNodesOfTheOuterOneAgain) {
     const auto host =
         std::make_shared<NestingManager>([] { return FamilyViewLayout("5", hostOf("17+42: 5")); });
     const std::string outer = FamilyViewLayout("17", host);

@@ -211,7 +211,7 @@ void setWord(std::string& bytes, std::size_t place, std::uint32_t word) {
     for (std::size_t i = 0; i < 4; ++i) bytes[place + i] = static_cast<char>(word >> (8 * i) & 0xFFU);
 }
 
-// Written down anew from the form's description.
+// Written down again from the form's description.
 void setChecksum(std::string& bytes) {
     std::uint32_t sum = 2166136261U;
     for (std::size_t place = 20; place + 4 <= bytes.size(); place += 4) {

@@ -233,7 +233,7 @@ TEST(Writing, leavesOutANicknameThatNamesSomebodyHidden) {
     EXPECT_EQ(readWithFacts(writeGedcom(data, options)).firstName(2).nickname, "Livia's man");
 }
 
-// Neither for the same record nor, made anew, for another.
+// Neither for the same record nor, made again, for another.
 TEST(Writing, usesNoIdentifierOfSomebodyHidden) {
     const GedcomData data = readWithFacts(
         document("0 @P1@ INDI\n1 NAME Livia /Secret/\n1 FAMC @U1@\n0 @P3@ INDI\n1 NAME Vera /Secret/\n"

@@ -203,7 +203,7 @@ TEST_F(CouplesEdge, sizeIsRightAtOnceAndTheEndIsStaleUntilTheNextBegin) {
     EXPECT_EQ(&secondChild, (*(begin + 1))->child);
 }
 
-TEST_F(CouplesEdge, walkOverAConstantEdgeTakesTheViewAnewToo) {
+TEST_F(CouplesEdge, walkOverAConstantEdgeTakesTheViewAgainToo) {
     TreeViewSpouseEdge edge(&man, &woman);
     edge.addChildEdge(boost::make_shared<TreeViewGenerationEdge>(TreeLine(), &child, &edge));
     const TreeViewSpouseEdge& constant = edge;

@@ -71,7 +71,7 @@ TEST(AddingSpouses, entersASpouseListedTwiceTwice) {
     EXPECT_EQ(1u, population.layouter.shownPersons.size());
 }
 
-TEST(AddingSpouses, asksTheHostAnewEachTime) {
+TEST(AddingSpouses, asksTheHostAgainEachTime) {
     Population population(family("17+42"));
     population.layouter.addSpousesToPerson(population.focus);
     population.layouter.addSpousesToPerson(population.focus);

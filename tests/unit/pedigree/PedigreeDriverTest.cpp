@@ -97,7 +97,7 @@ TEST_F(PedigreeDriver, theFathersWholeLineIsAskedForBeforeTheMothers) {
               data.questions);
 }
 
-TEST_F(PedigreeDriver, recordOfWhoIsShownStartsAnew) {
+TEST_F(PedigreeDriver, recordOfWhoIsShownStartsAgain) {
     layouter.shownPersons[99] = true;
     addWifeWithChildren(7, {8});
     data.parents[0] = {1, 2};

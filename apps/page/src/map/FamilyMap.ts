@@ -62,7 +62,7 @@ export class FamilyMap {
         this.area = this.measured();
     }
 
-    /** With right and left exchanged, and persons numbered anew. */
+    /** With right and left exchanged, and persons numbered again. */
     mirrored(): FamilyMap {
         return new FamilyMap(mirroredMap(this.arrays));
     }

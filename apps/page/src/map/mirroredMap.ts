@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A map with right and left exchanged, in the same form: persons are numbered anew, so that each row and each band still goes
+// A map with right and left exchanged, in the same form: persons are numbered again, so that each row and each band still goes
 // from left to right.
 
 import { kChildMask, kPersonLabel, type Lines, type MapArrays } from "./mapBytes";

@@ -106,7 +106,7 @@ export class Scene {
         if (hadKeys) this.focusActive();
     }
 
-    // Draws the boxes in sight anew in their places, where names, labels or marks have changed.
+    // Draws the boxes in sight again in their places, where names, labels or marks have changed.
     redraw(): void {
         for (const [box, element] of this.elements) repaintBox(element, this.contents.lookOf(box), box);
         this.markBranches();

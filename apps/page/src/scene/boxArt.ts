@@ -111,7 +111,7 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     return box;
 }
 
-// Draws a box anew without letting go of its element, on which the keys may stand.
+// Draws a box again in its element, which may have the keyboard focus.
 export function repaintBox(box: SVGGElement, look: BoxLook, sizes: Box): void {
     const fresh = drawBox(look, sizes);
     const handle = handleOf(box);

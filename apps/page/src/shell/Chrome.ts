@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The bar at the top with its two panels, the buttons that float over the picture, the legend, and the
-// dialogs. All of it is made anew when the language changes.
+// dialogs. All of it is made again when the language changes.
 
 import type { ShownFact } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";

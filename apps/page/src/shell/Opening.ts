@@ -130,7 +130,7 @@ export class Opening {
         this.panels.arrange();
         this.beginAt(address, family, embedded);
         performance.measure("olvane-open", { start });
-        this.panels.wearLooks(address);
+        this.panels.applyLooks(address);
         this.greet(family);
         this.navigation.nameUnknownPerson(address);
         this.page.tree.warmUp();

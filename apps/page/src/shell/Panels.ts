@@ -95,7 +95,7 @@ export class Panels {
     }
 
     /** What a link says of colours, language and zoom holds for this visit; what the reader chose before stays theirs. */
-    wearLooks(address: string): void {
+    applyLooks(address: string): void {
         const { tree, ui } = this.page;
         const looks = looksIn(address, tree.family!.persons);
         if (looks.language && looks.language !== ui.language) this.speak(looks.language);

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Which set of colours the page wears. The sets themselves are in styles/colours.css, under the same names.
+// Which set of colours the page has. The sets themselves are in styles/colours.css, under the same names.
 
 import { recall, remember } from "../base/dom";
 
@@ -14,12 +14,12 @@ const kContrast = "(prefers-contrast: more)";
 export class Theme {
     choice: ThemeChoice;
 
-    // The viewer wears what the page wears.
+    // The viewer has the colours of the page.
     constructor(private readonly viewer: HTMLElement) {
         const known = recall("theme");
         this.choice = kThemeChoices.find((choice) => choice === known) ?? "auto";
-        for (const query of [kDark, kContrast]) matchMedia(query).addEventListener("change", () => this.wear());
-        this.wear();
+        for (const query of [kDark, kContrast]) matchMedia(query).addEventListener("change", () => this.apply());
+        this.apply();
     }
 
     choose(choice: ThemeChoice): void {
@@ -30,10 +30,10 @@ export class Theme {
     /** For this time alone, as a link wants it. */
     show(choice: ThemeChoice): void {
         this.choice = choice;
-        this.wear();
+        this.apply();
     }
 
-    private wear(): void {
+    private apply(): void {
         const theme = this.choice === "auto" ? systemTheme() : this.choice;
         for (const element of [document.documentElement, this.viewer]) element.dataset["theme"] = theme;
     }
