@@ -13,6 +13,7 @@
 #include <numeric>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -53,8 +54,8 @@ private:
             const auto children = static_cast<std::int32_t>(part_.children[u].size());
             couples.push_back({other, children});
         }
-        std::stable_sort(couples.begin(), couples.end(),
-                         [](const Couple& a, const Couple& b) { return a.other < b.other; });
+        kin::mergeSort(couples.begin(), couples.end(),
+                       [](const Couple& a, const Couple& b) { return a.other < b.other; });
         std::size_t kept = 0;
         for (const Couple& couple : couples) {
             if (kept > 0 && couples[kept - 1].other == couple.other) {
@@ -64,8 +65,8 @@ private:
             }
         }
         couples.resize(kept);
-        std::stable_sort(couples.begin(), couples.end(),
-                         [](const Couple& a, const Couple& b) { return a.children > b.children; });
+        kin::mergeSort(couples.begin(), couples.end(),
+                       [](const Couple& a, const Couple& b) { return a.children > b.children; });
     }
 
     void walkFrom(std::int32_t first, std::vector<std::int32_t>& order, std::vector<std::int32_t>& above) {

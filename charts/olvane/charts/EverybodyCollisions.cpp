@@ -8,6 +8,8 @@
 
 #include <algorithm>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::charts {
 
 namespace {
@@ -38,7 +40,7 @@ private:
             for (std::uint32_t e = strand.firstEnd; e < last; ++e)
                 ends_.push_back(static_cast<std::int32_t>(e));
         }
-        std::stable_sort(ends_.begin(), ends_.end(), [this](std::int32_t a, std::int32_t b) {
+        kin::mergeSort(ends_.begin(), ends_.end(), [this](std::int32_t a, std::int32_t b) {
             return lines_.endX[at(a)] < lines_.endX[at(b)];
         });
         for (std::size_t i = 0; i < ends_.size(); ++i) {

@@ -7,6 +7,7 @@
 #include <numeric>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -106,7 +107,7 @@ std::vector<Component> componentsOf(const kin::KinGraph& graph) {
         part.partners.push_back(two);
     }
     for (Component& part : parts) addLists(graph, local, part);
-    std::stable_sort(parts.begin(), parts.end(), [](const Component& a, const Component& b) {
+    kin::mergeSort(parts.begin(), parts.end(), [](const Component& a, const Component& b) {
         return a.persons.size() > b.persons.size();
     });
     return parts;

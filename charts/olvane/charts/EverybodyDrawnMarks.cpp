@@ -8,6 +8,7 @@
 
 #include <olvane/charts/EverybodyReachInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -62,8 +63,8 @@ public:
         std::int32_t done = 0;
         while (done < count && !links.empty()) {
             for (MarkedLink& link : links) link.cost = costOf(link);
-            std::stable_sort(links.begin(), links.end(),
-                             [](const MarkedLink& a, const MarkedLink& b) { return a.cost < b.cost; });
+            kin::mergeSort(links.begin(), links.end(),
+                           [](const MarkedLink& a, const MarkedLink& b) { return a.cost < b.cost; });
             if (links[0].cost > mostCrossings) break;
             std::size_t kept = 0;
             for (std::size_t i = 0; i < links.size(); ++i) {

@@ -15,6 +15,7 @@
 #include <utility>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -109,7 +110,7 @@ private:
             middles_.push_back(middleOf(*box));
         }
         if (2 * known < part_.personCount()) return false;
-        std::sort(middles_.begin(), middles_.end());
+        kin::mergeSort(middles_.begin(), middles_.end());
         const auto end = std::unique(middles_.begin(), middles_.end(),
                                      [](double a, double b) { return b - a <= kSameRow; });
         middles_.erase(end, middles_.end());
@@ -127,7 +128,7 @@ private:
         for (const std::int32_t person : chains_.persons[chain]) {
             if (const picture::Box* box = boxOf(part_, earlier_, person)) rows.push_back(rowOf(*box));
         }
-        std::sort(rows.begin(), rows.end());
+        kin::mergeSort(rows.begin(), rows.end());
         std::size_t most = 0;
         for (std::size_t first = 0, end = 0; first < rows.size(); first = end) {
             while (end < rows.size() && rows[end] == rows[first]) ++end;
@@ -232,7 +233,7 @@ void markAsBefore(const Component& part, const EarlierPicture& earlier, MarkedLi
         if (mark.kind == picture::MarkKind::samePerson) continue;
         marks.push_back({mark.boxes[0], mark.boxes[1], mark.boxes[2]});
     }
-    std::sort(marks.begin(), marks.end());
+    kin::mergeSort(marks.begin(), marks.end());
     const auto had = [&](Index a, Index b, Index c) {
         return a != kNone && std::binary_search(marks.begin(), marks.end(), std::array{a, b, c});
     };
@@ -370,8 +371,8 @@ public:
             order_.nodes[at(rows_.row[at(node)])].push_back(node);
         }
         for (auto& nodes : order_.nodes) {
-            std::stable_sort(nodes.begin(), nodes.end(),
-                             [this](std::int32_t a, std::int32_t b) { return middle(a) < middle(b); });
+            kin::mergeSort(nodes.begin(), nodes.end(),
+                           [this](std::int32_t a, std::int32_t b) { return middle(a) < middle(b); });
         }
         return std::move(order_);
     }

@@ -12,6 +12,7 @@
 #include <olvane/charts/EverybodyLevelsInternal.h>
 #include <olvane/charts/EverybodyMarksInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -390,7 +391,7 @@ private:
             return l_.rows.isBelow(a) == l_.rows.isBelow(b) &&
                    l_.rows.ends[at(a)].sub == l_.rows.ends[at(b)].sub;
         };
-        std::stable_sort(ends.begin(), ends.end(), [&](std::int32_t a, std::int32_t b) {
+        kin::mergeSort(ends.begin(), ends.end(), [&](std::int32_t a, std::int32_t b) {
             if (l_.rows.isBelow(a) != l_.rows.isBelow(b)) return l_.rows.isBelow(a);
             if (l_.rows.ends[at(a)].sub != l_.rows.ends[at(b)].sub)
                 return l_.rows.ends[at(a)].sub < l_.rows.ends[at(b)].sub;

@@ -12,6 +12,7 @@
 #include <queue>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -70,7 +71,7 @@ private:
             }
         }
         const auto room = [this](std::int32_t e) { return ranges_[at(e)].high - ranges_[at(e)].low; };
-        std::stable_sort(order_.begin(), order_.end(), [&](std::int32_t a, std::int32_t b) {
+        kin::mergeSort(order_.begin(), order_.end(), [&](std::int32_t a, std::int32_t b) {
             if (room(a) != room(b)) return room(a) < room(b);
             return ranges_[at(a)].wanted < ranges_[at(b)].wanted;
         });
@@ -179,8 +180,7 @@ private:
             }
             if (bar.low < bar.high) bars_.push_back(bar);
         }
-        std::stable_sort(bars_.begin(), bars_.end(),
-                         [](const Bar& a, const Bar& b) { return a.low < b.low; });
+        kin::mergeSort(bars_.begin(), bars_.end(), [](const Bar& a, const Bar& b) { return a.low < b.low; });
     }
 
     // False where there are too many.
@@ -297,7 +297,7 @@ private:
                 used.push_back(other.track);
                 if (isImportant(pair)) first = std::max(first, other.track + 1);
             }
-            std::sort(used.begin(), used.end());
+            kin::mergeSort(used.begin(), used.end());
             for (const std::int32_t track : used) {
                 if (track == first) ++first;
             }

@@ -7,6 +7,7 @@
 
 #include <olvane/charts/EverybodyReachInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -152,8 +153,8 @@ public:
             if (marked_.child[link] == 0) ++links[at(chains_.chain[at(child)])];
         });
         std::vector<Candidate> candidates = collect(links);
-        std::stable_sort(candidates.begin(), candidates.end(),
-                         [](const Candidate& a, const Candidate& b) { return a.gain > b.gain; });
+        kin::mergeSort(candidates.begin(), candidates.end(),
+                       [](const Candidate& a, const Candidate& b) { return a.gain > b.gain; });
         std::int32_t done = 0;
         for (const Candidate& candidate : candidates) {
             if (done == count) break;

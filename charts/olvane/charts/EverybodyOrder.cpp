@@ -9,6 +9,7 @@
 
 #include <olvane/charts/EverybodyReachInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -93,7 +94,7 @@ private:
         nodeMet_[at(node)] = 1;
         const auto all = rows_.endsAt[node];
         ends_.assign(all.begin(), all.end());
-        std::stable_sort(ends_.begin(), ends_.end(), [this](std::int32_t a, std::int32_t b) {
+        kin::mergeSort(ends_.begin(), ends_.end(), [this](std::int32_t a, std::int32_t b) {
             return rows_.ends[at(a)].sub < rows_.ends[at(b)].sub;
         });
         const auto addStrands = [&](bool above, bool left) {
@@ -426,8 +427,8 @@ void straightenOrder(const Rows& rows, RowOrder& order, int rounds) {
     if (rows.nodeCount() > kMostNodesOfAWalk) straightening.startFromOneEnd();
     const std::vector<double>& x = straightening.run(rounds);
     for (auto& nodes : order.nodes) {
-        std::stable_sort(nodes.begin(), nodes.end(),
-                         [&x](std::int32_t a, std::int32_t b) { return x[at(a)] < x[at(b)]; });
+        kin::mergeSort(nodes.begin(), nodes.end(),
+                       [&x](std::int32_t a, std::int32_t b) { return x[at(a)] < x[at(b)]; });
     }
 }
 

@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -92,7 +93,7 @@ private:
         for (std::size_t i = 0; i < children.size(); ++i) {
             if (marked_.child[firstChild + i] == 0) addBoxEnd(children[i], 0, true);
         }
-        std::stable_sort(boxEnds_.begin(), boxEnds_.end(), [](const BoxEnd& a, const BoxEnd& b) {
+        kin::mergeSort(boxEnds_.begin(), boxEnds_.end(), [](const BoxEnd& a, const BoxEnd& b) {
             return a.gap != b.gap ? a.gap < b.gap : a.isBelow < b.isBelow;
         });
     }

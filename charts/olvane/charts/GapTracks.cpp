@@ -7,6 +7,8 @@
 #include <cmath>
 #include <limits>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::charts {
 
 namespace {
@@ -72,7 +74,7 @@ void GapTracks::gatherSpans() {
     for (std::size_t row = 0; row + 1 < start_.size(); ++row) {
         const auto first = spans_.begin() + static_cast<std::ptrdiff_t>(start_[row]);
         const auto end = spans_.begin() + static_cast<std::ptrdiff_t>(start_[row + 1]);
-        if (!std::is_sorted(first, end, isLeft)) std::stable_sort(first, end, isLeft);
+        if (!std::is_sorted(first, end, isLeft)) kin::mergeSort(first, end, isLeft);
     }
 }
 
@@ -88,7 +90,7 @@ void GapTracks::addShortLinks(double reach) {
         if (family.coupleLine != CoupleLine::over) continue;
         for (const Index box : family.parents) topUsed_[at(box)] |= kOverLine;
     }
-    std::sort(candidates.begin(), candidates.end(), [](const Candidate& a, const Candidate& b) {
+    kin::mergeSort(candidates.begin(), candidates.end(), [](const Candidate& a, const Candidate& b) {
         return a.length != b.length ? a.length < b.length : a.link < b.link;
     });
     for (const Candidate& candidate : candidates) take(candidate);

@@ -11,6 +11,8 @@
 #include <cstdlib>
 #include <utility>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::charts {
 
 namespace {
@@ -254,7 +256,7 @@ void HouseholdBuilder::placeDrops() {
     }
     const auto isLeft = [](const PlannedFamily& a, const PlannedFamily& b) { return a.dropX < b.dropX; };
     if (!std::is_sorted(families_.begin(), families_.end(), isLeft)) {
-        std::stable_sort(families_.begin(), families_.end(), isLeft);
+        kin::mergeSort(families_.begin(), families_.end(), isLeft);
     }
 }
 

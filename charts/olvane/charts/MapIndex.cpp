@@ -16,6 +16,7 @@
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/MapLabelsInternal.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/Picture.h>
 
 namespace olvane::charts {
@@ -74,7 +75,7 @@ private:
             x[i] = quarters(picture_.boxes[i].x);
             y[i] = quarters(picture_.boxes[i].y);
         }
-        std::sort(boxAt_.begin(), boxAt_.end(), [&](std::uint32_t a, std::uint32_t b) {
+        kin::mergeSort(boxAt_.begin(), boxAt_.end(), [&](std::uint32_t a, std::uint32_t b) {
             return std::tuple(y[at(a)], x[at(a)], a) < std::tuple(y[at(b)], x[at(b)], b);
         });
         personOfBox_.resize(count);
@@ -199,7 +200,7 @@ private:
     }
 
     static void sortPieces(std::vector<Piece>& pieces) {
-        std::sort(pieces.begin(), pieces.end(), [](const Piece& a, const Piece& b) {
+        kin::mergeSort(pieces.begin(), pieces.end(), [](const Piece& a, const Piece& b) {
             return std::tuple(a.band, a.x1, a.y1, a.x2, a.y2, a.role) <
                    std::tuple(b.band, b.x1, b.y1, b.x2, b.y2, b.role);
         });
@@ -280,9 +281,10 @@ private:
                 map_.marks.push_back({personOfBox_[at(box)], static_cast<std::uint32_t>(mark.number)});
             }
         }
-        std::sort(map_.marks.begin(), map_.marks.end(), [](const MapIndex::Mark& a, const MapIndex::Mark& b) {
-            return std::tuple(a.person, a.number) < std::tuple(b.person, b.number);
-        });
+        kin::mergeSort(map_.marks.begin(), map_.marks.end(),
+                       [](const MapIndex::Mark& a, const MapIndex::Mark& b) {
+                           return std::tuple(a.person, a.number) < std::tuple(b.person, b.number);
+                       });
     }
 
     const kin::KinGraph& graph_;

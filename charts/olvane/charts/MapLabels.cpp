@@ -10,6 +10,8 @@
 #include <cstddef>
 #include <tuple>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::charts {
 
 namespace {
@@ -79,7 +81,7 @@ private:
 
     // Groups of the same cell and surname become one.
     void merge() {
-        std::sort(groups_.begin(), groups_.end(), [](const Group& a, const Group& b) {
+        kin::mergeSort(groups_.begin(), groups_.end(), [](const Group& a, const Group& b) {
             return std::tuple(a.key(), a.greatest) < std::tuple(b.key(), b.greatest);
         });
         std::size_t last = 0;
@@ -117,7 +119,7 @@ private:
             addCell(begin, end);
             begin = end;
         }
-        std::sort(map_.labels.begin() + first, map_.labels.end(), [](const auto& a, const auto& b) {
+        kin::mergeSort(map_.labels.begin() + first, map_.labels.end(), [](const auto& a, const auto& b) {
             return std::tuple(b.weight, a.y, a.x, a.text) < std::tuple(a.weight, b.y, b.x, b.text);
         });
     }

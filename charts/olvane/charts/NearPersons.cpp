@@ -10,6 +10,7 @@
 #include <string>
 
 #include <olvane/boundary/TypedLayout.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -75,7 +76,7 @@ std::vector<kin::Place> nearPersons(const kin::KinGraph& graph, kin::Place focus
     for (const TypedLayout::Box& box : layout.boxes) {
         if (box.id > 0) persons.push_back(static_cast<kin::Place>(box.id - 1));
     }
-    std::sort(persons.begin(), persons.end());
+    kin::mergeSort(persons.begin(), persons.end());
     persons.erase(std::unique(persons.begin(), persons.end()), persons.end());
     return persons;
 }

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include <olvane/charts/NearPersonsInternal.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::charts {
 
@@ -30,9 +31,9 @@ public:
             if (fold.branch == picture::Branch::beside) beside_.push_back(person);
             if (fold.branch == picture::Branch::down) close(graph.unionsAsPartner(person));
         }
-        std::sort(up_.begin(), up_.end());
-        std::sort(beside_.begin(), beside_.end());
-        std::sort(unions_.begin(), unions_.end());
+        kin::mergeSort(up_.begin(), up_.end());
+        kin::mergeSort(beside_.begin(), beside_.end());
+        kin::mergeSort(unions_.begin(), unions_.end());
     }
 
     // Of the focus and its ancestors, siblings are beside as well; of others they are their parents' descendants.
@@ -40,7 +41,7 @@ public:
         for (const kin::Place person : beside_) {
             if (isLine[at(person)]) close(graph_.unionsAsChild(person));
         }
-        std::sort(unions_.begin(), unions_.end());
+        kin::mergeSort(unions_.begin(), unions_.end());
     }
 
     bool toParents(kin::Place person) const { return has(up_, person); }

@@ -17,6 +17,7 @@
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/Circle.h>
 #include <olvane/picture/TextFit.h>
 
@@ -113,7 +114,7 @@ private:
         for (const Arc& arc : fan_.arcs) {
             if (arc.line != picture::kNone) lines_.push_back(arc.line);
         }
-        std::sort(lines_.begin(), lines_.end());
+        kin::mergeSort(lines_.begin(), lines_.end());
         lines_.erase(std::unique(lines_.begin(), lines_.end()), lines_.end());
     }
 

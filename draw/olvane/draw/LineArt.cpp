@@ -12,6 +12,7 @@
 
 #include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/MarriageLabels.h>
 #include <olvane/picture/TextFit.h>
 
@@ -140,7 +141,7 @@ private:
     void appendJumps(std::string& path, const Line& line) const {
         std::vector<double> places;
         for (const double place : picture_.bridgesOf(line)) places.push_back(frame_.x(place));
-        std::sort(places.begin(), places.end());
+        kin::mergeSort(places.begin(), places.end());
         const Number r = number(kBridge);
         for (std::size_t i = 0, next = 0; i < places.size(); i = next) {
             while (next < places.size() && places[next] - places[i == next ? i : next - 1] <= 2 * kBridge)

@@ -12,6 +12,8 @@
 #include <stdexcept>
 #include <utility>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::draw {
 
 namespace {
@@ -36,7 +38,7 @@ public:
             longFrom_.push_back(interval.from + strip / 2);
             longTo_.push_back(interval.to - strip / 2);
         }
-        for (auto* list : {&from_, &to_, &longFrom_, &longTo_}) std::sort(list->begin(), list->end());
+        for (auto* list : {&from_, &to_, &longFrom_, &longTo_}) kin::mergeSort(list->begin(), list->end());
     }
 
     std::size_t crossed(double cut) const { return inside(from_, to_, cut); }

@@ -15,6 +15,7 @@
 #include <olvane/draw/PicturePartInternal.h>
 #include <olvane/draw/SheetMapInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
@@ -205,7 +206,7 @@ private:
             if (place < 0 || place > (upright ? window.height : window.width)) continue;
             places.push_back(margin_ + onPaper(place));
         }
-        std::sort(places.begin(), places.end());
+        kin::mergeSort(places.begin(), places.end());
         double last = -2 * kTriangle;
         for (const double place : places) {
             if (place - last < kTriangle) continue;

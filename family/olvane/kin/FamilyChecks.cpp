@@ -10,6 +10,7 @@
 
 #include <olvane/boundary/HostText.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::detail {
 
@@ -80,11 +81,11 @@ void findRepeats(std::span<const FamilyId> list, std::vector<std::size_t>& repea
     std::vector<std::pair<FamilyId, std::size_t>> sorted;
     sorted.reserve(list.size());
     for (std::size_t i = 0; i < list.size(); ++i) sorted.emplace_back(list[i], i);
-    std::sort(sorted.begin(), sorted.end());
+    kin::mergeSort(sorted.begin(), sorted.end());
     for (std::size_t i = 1; i < sorted.size(); ++i) {
         if (sorted[i].first == sorted[i - 1].first) repeats.push_back(sorted[i].second);
     }
-    std::sort(repeats.begin(), repeats.end());
+    kin::mergeSort(repeats.begin(), repeats.end());
 }
 
 }  // namespace olvane::detail

@@ -9,6 +9,8 @@
 #include <iterator>
 #include <memory>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane {
 
 using detail::Reference;
@@ -70,7 +72,7 @@ void FamilyEdit::removeFamily(std::uint32_t row) {
 Reference FamilyEdit::withAll(Reference list, std::span<const FamilyId> ids) {
     const std::span<const FamilyId> old = blobs().list(list);
     std::vector<FamilyId> sorted(old.begin(), old.end());
-    std::sort(sorted.begin(), sorted.end());
+    kin::mergeSort(sorted.begin(), sorted.end());
     std::vector<FamilyId> longer(old.begin(), old.end());
     for (const FamilyId id : ids) {
         if (!std::binary_search(sorted.begin(), sorted.end(), id)) longer.push_back(id);

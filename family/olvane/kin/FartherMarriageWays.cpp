@@ -11,6 +11,7 @@
 #include <olvane/kin/Index.h>
 #include <olvane/kin/KinSumsInternal.h>
 #include <olvane/kin/MarriageWaysInternal.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::kin {
 
@@ -117,14 +118,14 @@ private:
         for (auto level = path.rbegin(); level != path.rend(); ++level)
             way.persons.push_back(steps_[at(level->step)].to);
         std::vector<Place> sorted = way.persons;
-        std::sort(sorted.begin(), sorted.end());
+        mergeSort(sorted.begin(), sorted.end());
         if (std::adjacent_find(sorted.begin(), sorted.end()) == sorted.end()) ways.push_back(std::move(way));
     }
 
     void order(std::vector<MarriageWay>& ways, std::size_t limit) const {
         const KinGraph& graph = links_.graph();
         const auto byId = [&graph](Place one, Place other) { return graph.id(one) < graph.id(other); };
-        std::sort(ways.begin(), ways.end(), [&byId](const MarriageWay& one, const MarriageWay& other) {
+        mergeSort(ways.begin(), ways.end(), [&byId](const MarriageWay& one, const MarriageWay& other) {
             return std::lexicographical_compare(one.persons.begin(), one.persons.end(), other.persons.begin(),
                                                 other.persons.end(), byId);
         });

@@ -10,6 +10,8 @@
 #include <array>
 #include <unordered_map>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::kin {
 
 namespace {
@@ -200,7 +202,7 @@ void KinLinks::addNeighbors() {
     }
     neighborStart_.push_back(0);
     for (std::vector<Neighbor>& list : lists) {
-        std::sort(list.begin(), list.end(), [this](const Neighbor& x, const Neighbor& y) {
+        mergeSort(list.begin(), list.end(), [this](const Neighbor& x, const Neighbor& y) {
             return graph_.id(x.person) < graph_.id(y.person);
         });
         for (const Neighbor& each : list) {

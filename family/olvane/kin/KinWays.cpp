@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <limits>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::kin {
 
 namespace {
@@ -243,7 +245,7 @@ bool isHalfWay(const KinLinks& links, const KinWay& way) {
 
 void sortWays(const KinGraph& graph, std::vector<KinWay>& ways, std::size_t limit) {
     const auto byId = [&graph](Place one, Place other) { return graph.id(one) < graph.id(other); };
-    std::stable_sort(ways.begin(), ways.end(), [&byId](const KinWay& one, const KinWay& other) {
+    mergeSort(ways.begin(), ways.end(), [&byId](const KinWay& one, const KinWay& other) {
         if (one.length() != other.length()) return one.length() < other.length();
         // In loops one line of persons can be read in several ways.
         if (one.persons == other.persons) return one.up < other.up;

@@ -12,6 +12,7 @@
 #include <utility>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::kin {
 
@@ -26,7 +27,7 @@ public:
         for (Place person = 0; person < graph_.personCount(); ++person) {
             if (order_[at(person)] == 0) walkFrom(person);
         }
-        std::sort(found_.begin(), found_.end());
+        mergeSort(found_.begin(), found_.end());
         return std::move(found_);
     }
 

@@ -12,6 +12,7 @@
 #include <numeric>
 
 #include <olvane/kin/Folding.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::kin {
 
@@ -202,7 +203,7 @@ void PersonIndex::addWord(std::uint32_t number, FoundIn in, std::uint32_t place)
 void PersonIndex::arrange() {
     std::vector<std::uint32_t> order(words_.size());
     std::iota(order.begin(), order.end(), 0U);
-    std::sort(order.begin(), order.end(),
+    mergeSort(order.begin(), order.end(),
               [this](std::uint32_t one, std::uint32_t other) { return words_[one] < words_[other]; });
     std::vector<std::string> words;
     std::vector<std::vector<Entry>> entries;

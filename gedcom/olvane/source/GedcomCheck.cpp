@@ -10,6 +10,7 @@
 #include <string_view>
 #include <utility>
 
+#include <olvane/kin/MergeSort.h>
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomLives.h>
 
@@ -49,8 +50,8 @@ public:
         for (const Remark& remark : kin::checkData(graph, livesOf(data_, graph))) {
             if (remark.kind != Kind::severalBirthFamilies) report(remark, lineOf(remark));
         }
-        std::stable_sort(findings_.begin(), findings_.end(),
-                         [](const FileRemark& a, const FileRemark& b) { return a.line < b.line; });
+        kin::mergeSort(findings_.begin(), findings_.end(),
+                       [](const FileRemark& a, const FileRemark& b) { return a.line < b.line; });
         return std::move(findings_);
     }
 

@@ -16,6 +16,7 @@
 #include <utility>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 
 namespace olvane::picture {
 
@@ -42,8 +43,8 @@ public:
             if (!v.isMerged && barOf(v) != kNone) places_[next[at(barOf(v))]++] = v.x;
         }
         for (std::size_t b = 0; b + 1 < first_.size(); ++b) {
-            std::sort(places_.begin() + static_cast<std::ptrdiff_t>(first_[b]),
-                      places_.begin() + static_cast<std::ptrdiff_t>(first_[b + 1]));
+            kin::mergeSort(places_.begin() + static_cast<std::ptrdiff_t>(first_[b]),
+                           places_.begin() + static_cast<std::ptrdiff_t>(first_[b + 1]));
         }
     }
 
@@ -71,8 +72,9 @@ class Channel {
 public:
     Channel(const RoutePlan& plan, std::vector<Index> bars, const BarEnds& ups, const BarEnds& downs)
         : plan_(plan), bars_(std::move(bars)), ups_(ups), downs_(downs), neighbours_(bars_.size()) {
-        std::sort(bars_.begin(), bars_.end(),
-                  [this](Index a, Index b) { return std::pair(bar(a).lo, a) < std::pair(bar(b).lo, b); });
+        kin::mergeSort(bars_.begin(), bars_.end(), [this](Index a, Index b) {
+            return std::pair(bar(a).lo, a) < std::pair(bar(b).lo, b);
+        });
         findNeighbours();
     }
 
@@ -177,8 +179,8 @@ private:
             bool moved = false;
             for (const std::uint32_t i : order) moved = moveToBestRank(i, rank) || moved;
             if (!moved) break;
-            std::stable_sort(order.begin(), order.end(),
-                             [&](std::uint32_t a, std::uint32_t b) { return rank[a] < rank[b]; });
+            kin::mergeSort(order.begin(), order.end(),
+                           [&](std::uint32_t a, std::uint32_t b) { return rank[a] < rank[b]; });
         }
         return order;
     }
@@ -189,7 +191,7 @@ private:
             if (n.weight != 0) places.emplace_back(rank[n.bar], n.weight);
         }
         if (places.empty()) return false;
-        std::sort(places.begin(), places.end());
+        kin::mergeSort(places.begin(), places.end());
         int cost = 0;  // above all: neighbours that should be above are violated
         int present = 0;
         for (const auto& [place, weight] : places) cost += std::max(0, -weight);
@@ -227,7 +229,7 @@ private:
                 used.push_back(tracks[n.bar]);
                 if (keepsOrder && n.weight < 0) track = std::max(track, tracks[n.bar] + 1);
             }
-            std::sort(used.begin(), used.end());
+            kin::mergeSort(used.begin(), used.end());
             for (const std::int32_t u : used) {
                 if (u == track) ++track;
             }
@@ -244,7 +246,7 @@ private:
             places.push_back(bar(b).lo - kBarRoom / 2);
             places.push_back(bar(b).hi + kBarRoom / 2);
         }
-        std::sort(places.begin(), places.end());
+        kin::mergeSort(places.begin(), places.end());
         places.erase(std::unique(places.begin(), places.end()), places.end());
         const auto indexOf = [&places](double place) {
             return static_cast<std::size_t>(std::lower_bound(places.begin(), places.end(), place) -

@@ -5,6 +5,8 @@
 
 #include <algorithm>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::picture {
 
 namespace {
@@ -17,7 +19,7 @@ public:
     bool has(std::int64_t id) {
         if (ids_.empty()) {
             for (const Box& box : picture_.boxes) ids_.push_back(box.id);
-            std::sort(ids_.begin(), ids_.end());
+            kin::mergeSort(ids_.begin(), ids_.end());
         }
         return std::binary_search(ids_.begin(), ids_.end(), id);
     }

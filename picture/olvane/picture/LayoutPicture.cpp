@@ -15,6 +15,7 @@
 #include <vector>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/FurtherParents.h>
 
 namespace olvane::picture {
@@ -266,7 +267,7 @@ private:
         const auto key = [this](Index i) {
             return std::tuple(picture_.boxes[at(i)].id, distanceFromFocus(i), i);
         };
-        std::sort(order.begin(), order.end(), [&](Index a, Index b) { return key(a) < key(b); });
+        kin::mergeSort(order.begin(), order.end(), [&](Index a, Index b) { return key(a) < key(b); });
         std::vector<std::span<const Index>> repeated;
         for (std::size_t i = 0, next = 0; i < order.size(); i = next) {
             while (next < order.size() &&
@@ -275,7 +276,7 @@ private:
             if (next - i > 1) repeated.push_back(std::span(order).subspan(i, next - i));
         }
         // Numbers run in the order of the first boxes.
-        std::sort(repeated.begin(), repeated.end(), [](const auto& a, const auto& b) {
+        kin::mergeSort(repeated.begin(), repeated.end(), [](const auto& a, const auto& b) {
             return *std::min_element(a.begin(), a.end()) < *std::min_element(b.begin(), b.end());
         });
         std::int32_t number = 0;
@@ -318,7 +319,7 @@ private:
         }
         const auto countOf = [&shown](std::vector<kin::Place>& persons) {
             std::erase_if(persons, [&](kin::Place p) { return p == kin::kNobody || shown[at(p)]; });
-            std::sort(persons.begin(), persons.end());
+            kin::mergeSort(persons.begin(), persons.end());
             return static_cast<std::int32_t>(std::unique(persons.begin(), persons.end()) - persons.begin());
         };
         box.hiddenParents = countOf(parents);

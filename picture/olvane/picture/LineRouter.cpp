@@ -14,6 +14,7 @@
 #include <utility>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/ChannelTracksInternal.h>
 #include <olvane/picture/RoutePlanInternal.h>
 #include <olvane/picture/RowsInternal.h>
@@ -66,7 +67,7 @@ private:
         }
         std::vector<Index> order(plan_.bars.size());
         std::iota(order.begin(), order.end(), 0);
-        std::sort(order.begin(), order.end(), [this](Index a, Index b) {
+        kin::mergeSort(order.begin(), order.end(), [this](Index a, Index b) {
             return std::pair(plan_.bars[at(a)].channel, a) < std::pair(plan_.bars[at(b)].channel, b);
         });
         for (const Index b : order) {
@@ -279,7 +280,7 @@ private:
         std::vector<std::vector<Index>> lanes(2 * rowCount() + 1);
         std::vector<Index> order(plan_.verticals.size());
         std::iota(order.begin(), order.end(), 0);
-        std::sort(order.begin(), order.end(), [this](Index a, Index b) {
+        kin::mergeSort(order.begin(), order.end(), [this](Index a, Index b) {
             return std::pair(plan_.verticals[at(a)].x, a) < std::pair(plan_.verticals[at(b)].x, b);
         });
         for (const Index v : order) {
@@ -325,7 +326,7 @@ private:
         picture_.bridges.clear();
         std::vector<std::size_t> order(pieces_.size());
         std::iota(order.begin(), order.end(), std::size_t{0});
-        std::stable_sort(order.begin(), order.end(), [this](std::size_t a, std::size_t b) {
+        kin::mergeSort(order.begin(), order.end(), [this](std::size_t a, std::size_t b) {
             return pieces_[a].family < pieces_[b].family;
         });
         for (Family& family : picture_.families) family.lineCount = 0;
@@ -345,7 +346,7 @@ private:
         Line line = piece.line;
         std::tie(line.x1, line.y1) = frame_.turned(piece.line.x1, piece.line.y1);
         std::tie(line.x2, line.y2) = frame_.turned(piece.line.x2, piece.line.y2);
-        std::sort(piece.bridges.begin(), piece.bridges.end());
+        kin::mergeSort(piece.bridges.begin(), piece.bridges.end());
         if (piece.bridges.size() > 0xFFFF) piece.bridges.resize(0xFFFF);
         line.firstBridge = static_cast<std::uint32_t>(picture_.bridges.size());
         line.bridgeCount = static_cast<std::uint16_t>(piece.bridges.size());

@@ -13,6 +13,8 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::picture {
 
 // An upright rectangle, edges included. It may be as thin as a line.
@@ -53,8 +55,9 @@ private:
     std::vector<std::size_t> sortedBy(Key key) const {
         std::vector<std::size_t> order(rects_.size());
         std::iota(order.begin(), order.end(), std::size_t{0});
-        std::sort(order.begin(), order.end(),
-                  [&](std::size_t a, std::size_t b) { return std::pair(key(a), a) < std::pair(key(b), b); });
+        kin::mergeSort(order.begin(), order.end(), [&](std::size_t a, std::size_t b) {
+            return std::pair(key(a), a) < std::pair(key(b), b);
+        });
         return order;
     }
 

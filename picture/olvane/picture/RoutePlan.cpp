@@ -14,6 +14,7 @@
 #include <utility>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/LaneOccupancyInternal.h>
 
 namespace olvane::picture {
@@ -86,8 +87,8 @@ private:
         for (const Mark& mark : picture_.marks) {
             if (mark.kind != MarkKind::samePerson) marks_.push_back(mark);
         }
-        std::sort(marks_.begin(), marks_.end(),
-                  [](const Mark& a, const Mark& b) { return a.boxes[0] < b.boxes[0]; });
+        kin::mergeSort(marks_.begin(), marks_.end(),
+                       [](const Mark& a, const Mark& b) { return a.boxes[0] < b.boxes[0]; });
     }
 
     template <class Test>
@@ -129,7 +130,7 @@ private:
                 stems.push_back({static_cast<Index>(f), child, middleOfParents(picture_.families[f])});
             }
         }
-        std::sort(stems.begin(), stems.end(), [](const Stem& a, const Stem& b) {
+        kin::mergeSort(stems.begin(), stems.end(), [](const Stem& a, const Stem& b) {
             return std::tuple(a.child, a.x, a.family) < std::tuple(b.child, b.x, b.family);
         });
         stems.erase(std::unique(stems.begin(), stems.end(),
@@ -141,7 +142,7 @@ private:
             while (next < stems.size() && stems[next].child == stems[i].child) ++next;
             spreadStems(std::span(stems).subspan(i, next - i));
         }
-        std::sort(stems.begin(), stems.end(), [](const Stem& a, const Stem& b) {
+        kin::mergeSort(stems.begin(), stems.end(), [](const Stem& a, const Stem& b) {
             return std::tuple(a.family, a.x, a.child) < std::tuple(b.family, b.x, b.child);
         });
         firstStem_.assign(picture_.families.size() + 1, 0);
@@ -193,8 +194,8 @@ private:
             return std::tuple(std::abs(rows_.rowOf[at(parents[0])] - rows_.rowOf[at(parents[1])]),
                               std::abs(rows_.centre(parents[0]) - rows_.centre(parents[1])), f);
         };
-        std::sort(families.begin(), families.end(),
-                  [&](Index a, Index b) { return distance(a) < distance(b); });
+        kin::mergeSort(families.begin(), families.end(),
+                       [&](Index a, Index b) { return distance(a) < distance(b); });
     }
 
     // The lines that leave the boxes at both sides of a gap to lead over the row: the nearer the partner, the
@@ -580,8 +581,8 @@ private:
             return std::tuple(std::abs(rows_.rowOf[at(stem.child)] - home), std::abs(stem.x - start),
                               stem.child);
         };
-        std::sort(stems.begin(), stems.end(),
-                  [&](const Stem& a, const Stem& b) { return rowDistance(a) < rowDistance(b); });
+        kin::mergeSort(stems.begin(), stems.end(),
+                       [&](const Stem& a, const Stem& b) { return rowDistance(a) < rowDistance(b); });
         for (const Stem& stem : stems) planStem(net, stem);
     }
 

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <numeric>
 
+#include <olvane/kin/MergeSort.h>
+
 namespace olvane::picture {
 
 namespace {
@@ -13,7 +15,7 @@ namespace {
 constexpr double kRowOverlap = 0.5;  // points; boxes that overlap by less stand in two rows
 
 void addBlocks(Rows& rows, std::vector<Index>& members, Index rowIndex) {
-    std::sort(members.begin(), members.end(), [&rows](Index a, Index b) {
+    kin::mergeSort(members.begin(), members.end(), [&rows](Index a, Index b) {
         return std::pair(rows.rect(a).x1, a) < std::pair(rows.rect(b).x1, b);
     });
     Row row;
@@ -104,7 +106,7 @@ Rows rowsOf(const Picture& picture, const RouteFrame& frame) {
     rows.blockOf.resize(count);
     std::vector<Index> order(count);
     std::iota(order.begin(), order.end(), 0);
-    std::sort(order.begin(), order.end(), [&rows](Index a, Index b) {
+    kin::mergeSort(order.begin(), order.end(), [&rows](Index a, Index b) {
         return std::pair(rows.rect(a).y1, a) < std::pair(rows.rect(b).y1, b);
     });
     std::vector<Index> members;

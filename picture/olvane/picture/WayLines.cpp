@@ -13,6 +13,7 @@
 #include <tuple>
 
 #include <olvane/kin/Index.h>
+#include <olvane/kin/MergeSort.h>
 #include <olvane/picture/PieceGeometryInternal.h>
 
 namespace olvane::picture {
@@ -48,7 +49,7 @@ Part partBetween(const Point& a, const Point& b) {
 
 // Sorted, and what touches on one line made one.
 std::vector<Part> joined(std::vector<Part> parts) {
-    std::sort(parts.begin(), parts.end(), isBefore);
+    kin::mergeSort(parts.begin(), parts.end(), [](const Part& a, const Part& b) { return isBefore(a, b); });
     std::vector<Part> result;
     for (const Part& part : parts) {
         if (!result.empty() && isOnOneLine(result.back(), part) && part.from <= result.back().to + kNear) {
