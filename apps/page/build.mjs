@@ -22,7 +22,8 @@ const { values } = parseArgs({
 if (!values.wasm || !values.out) throw new Error("usage: node build.mjs --wasm OLVANE.WASM --out PAGE.HTML");
 
 const kBinding = process.env.OLVANE_JAVASCRIPT ?? here("../../bindings/javascript");
-const { lettersOf, packedLzma } = await import(`${kBinding}/package/packing.mjs`);
+const { lettersOf, packedLzma, packedModule } = await import(`${kBinding}/package/packing.mjs`);
+const { splitModule } = await import(`${kBinding}/package/moduleStreams.mjs`);
 
 // One script with all that it imports. settings are esbuild's.
 async function bundled(entry, settings) {
@@ -61,7 +62,7 @@ async function writeElement(path, engine) {
     const banner = "// SPDX-FileCopyrightText: The Olvane developers\n// SPDX-License-Identifier: MIT\n";
     const script = await bundled("src/element/package.ts", {
         format: "esm",
-        define: { kPackedModule: JSON.stringify(lettersOf(packedLzma(engine))), kReadingScript },
+        define: { kPackedModule: JSON.stringify(packedModule(engine)), kReadingScript },
     });
     await writeFile(path, banner + script + "\n");
     const packed = gzipSync(script, { level: 9 }).length;
@@ -121,7 +122,7 @@ const [start, script, style] = await Promise.all([
 ]);
 const engine = await readFile(values.wasm);
 // All in one, since what is packed together is packed better.
-const whole = [style, script, engine].map((part) => Buffer.from(part));
+const whole = [style, script, splitModule(engine)].map((part) => Buffer.from(part));
 const parts = {
     policy: policyOf(start, script, style),
     styleSize: whole[0].length,

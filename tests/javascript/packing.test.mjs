@@ -7,8 +7,9 @@ import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { readFileSync } from "node:fs";
 import { test } from "node:test";
-import { lettersOf, packedLzma } from "../../bindings/javascript/package/packing.mjs";
-import { bytesOfLetters, unpackLzma } from "../../bindings/javascript/package/unpack.mjs";
+import { joinModule, splitModule } from "../../bindings/javascript/package/moduleStreams.mjs";
+import { lettersOf, packedLzma, packedModule } from "../../bindings/javascript/package/packing.mjs";
+import { bytesOfLetters, unpackLzma, unpackModule } from "../../bindings/javascript/package/unpack.mjs";
 
 // The same bytes in every run: a generator of numbers as C's standard shows one.
 function madeBytes(count, seed, most = 256) {
@@ -62,4 +63,58 @@ test("a packed file with other parameters of the model is read as well", () => {
         packed.writeBigUInt64LE(BigInt(bytes.length), 5);
         assert.ok(bytes.equals(Buffer.from(unpackLzma(packed))), model);
     }
+});
+
+// A module whose one function has this code.
+function moduleWith(code) {
+    const body = [0, ...code, 0x0b];
+    return Uint8Array.from([
+        ...[0, 0x61, 0x73, 0x6d, 1, 0, 0, 0],
+        ...[1, 4, 1, 0x60, 0, 0],
+        ...[3, 2, 1, 0],
+        ...[5, 3, 1, 0, 1],
+        ...[10, body.length + 2, 1, body.length, ...body],
+        ...[11, 8, 1, 0, 0x41, 0, 0x0b, 2, 7, 7],
+    ]);
+}
+
+test("a module comes out of its streams as it was, whatever its instructions", () => {
+    const bodies = {
+        nothing: [],
+        floats: [0x43, 1, 2, 3, 4, 0x1a, 0x44, 1, 2, 3, 4, 5, 6, 7, 8, 0x1a],
+        longNumbers: [
+            0x41, 0x80, 0x80, 0x80, 0x80, 0x78, 0x1a, 0x42, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0,
+            0x1a,
+        ],
+        access: [0x41, 0, 0x28, 2, 0x84, 1, 0x1a, 0x41, 0, 0x29, 0, 8, 0x1a],
+        branches: [0x02, 0x40, 0x03, 0x40, 0x41, 0, 0x0e, 2, 0, 1, 1, 0x0b, 0x0b],
+        condition: [0x41, 0, 0x04, 0x40, 0x0c, 0, 0x05, 0x01, 0x0b],
+        conversion: [0x43, 0, 0, 0, 0, 0xfc, 0, 0x1a],
+        copy: [0x41, 0, 0x41, 0, 0x41, 0, 0xfc, 10, 0, 0],
+    };
+    for (const [name, code] of Object.entries(bodies)) {
+        const module = moduleWith(code);
+        assert.ok(WebAssembly.validate(module), `${name} is a module`);
+        assert.deepEqual(joinModule(splitModule(module)), module, name);
+    }
+    assert.deepEqual(
+        joinModule(splitModule(moduleWith([0x06, 0x40, 0x19, 0x09, 0, 0x0b]))),
+        moduleWith([0x06, 0x40, 0x19, 0x09, 0, 0x0b]),
+    );
+});
+
+test("an instruction that streams do not know is refused, and so is a size that is written long", () => {
+    assert.throws(() => splitModule(moduleWith([0xfd, 12])), /opcode 253/);
+    const module = [...moduleWith([])];
+    const at = module.length - 8 - 2 - 4;
+    assert.deepEqual(module.slice(at - 2, at + 4), [10, 4, 1, 2, 0, 0x0b]);
+    const long = Uint8Array.from([...module.slice(0, at - 1), 5, 1, 0x82, 0, ...module.slice(at + 2)]);
+    assert.throws(() => splitModule(long), /not written as usual/);
+});
+
+test("our module packs smaller as streams, and comes out as it was", () => {
+    const module = readFileSync(process.env.OLVANE_WASM);
+    const letters = packedModule(module);
+    assert.ok(module.equals(Buffer.from(unpackModule(letters))));
+    assert.ok(letters.length < 0.95 * lettersOf(packedLzma(module)).length, `${letters.length} letters`);
 });

@@ -4,7 +4,7 @@
 // The page's first script: unpacks its style, its code and the engine, which lie in it as letters, and runs the code.
 // The page's policy names the hash of each of them.
 
-import { bytesOfLetters, unpackLzma } from "olvane-unpack";
+import { bytesOfLetters, joinModule, unpackLzma } from "olvane-unpack";
 
 const packed = document.getElementById("olvane-parts")!;
 const whole = unpackLzma(bytesOfLetters(packed.textContent ?? ""));
@@ -17,7 +17,7 @@ style.textContent = textOf(0, styleSize);
 document.head.append(style);
 const script = document.createElement("script");
 script.textContent = textOf(styleSize, engineStart);
-self.olvanePage = { script: script.textContent, engine: whole.slice(engineStart) };
+self.olvanePage = { script: script.textContent, engine: joinModule(whole.subarray(engineStart)) };
 // It runs as it is put in, once: a page that is saved as it stands does not hold it twice.
 document.body.append(script);
 script.remove();

@@ -15,7 +15,7 @@ import { createRequire } from "node:module";
 import { dirname, join, resolve } from "node:path";
 import { fileURLToPath } from "node:url";
 import { parseArgs } from "node:util";
-import { lettersOf, packedLzma } from "./packing.mjs";
+import { packedModule } from "./packing.mjs";
 
 const here = (path) => fileURLToPath(new URL(path, import.meta.url));
 const text = { type: "string" };
@@ -50,7 +50,7 @@ async function bundle(entry, file, { format, define = {}, banner = "", globalNam
     });
 }
 
-const kPackedModule = JSON.stringify(lettersOf(packedLzma(await readFile(values.wasm))));
+const kPackedModule = JSON.stringify(packedModule(await readFile(values.wasm)));
 
 async function writePackage(folder, content) {
     await writeFile(join(folder, "package.json"), JSON.stringify(content, null, 4) + "\n");

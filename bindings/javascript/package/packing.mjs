@@ -4,6 +4,7 @@
 // Packs bytes for a page or a script that holds them as text. unpack.mjs unpacks them.
 
 import { execFileSync } from "node:child_process";
+import { splitModule } from "./moduleStreams.mjs";
 import { LETTERS } from "./unpack.mjs";
 
 /** A file in the format .lzma, whose header has the size of what is packed. */
@@ -12,6 +13,11 @@ export function packedLzma(bytes) {
     const packed = execFileSync("xz", options, { input: bytes, maxBuffer: 1 << 30 });
     packed.writeBigUInt64LE(BigInt(bytes.length), 5);
     return packed;
+}
+
+/** A WebAssembly module as letters, which unpackModule reads. */
+export function packedModule(module) {
+    return lettersOf(packedLzma(splitModule(module)));
 }
 
 /** Bytes as letters that may stand in a script of a page and in a string in double quotes. */

@@ -4,6 +4,10 @@
 // Unpacks what packing.mjs packed: letters to bytes, and bytes to what they were. Browsers unpack gzip themselves, but LZMA
 // makes a module a quarter smaller, and these letters are less than base64's.
 
+import { joinModule } from "./moduleStreams.mjs";
+
+export { joinModule };
+
 // Printable letters of ASCII without those that could end a string or begin a tag.
 export const LETTERS = Array.from({ length: 94 }, (_, i) => String.fromCharCode(33 + i))
     .filter((letter) => !'"<\\'.includes(letter))
@@ -193,4 +197,9 @@ export function unpackLzma(packed) {
         for (const end = Math.min(size, at + length); at < end; ++at) bytes[at] = bytes[at - repeats[0] - 1];
     }
     return bytes;
+}
+
+/** The WebAssembly module that packedModule wrote as letters. */
+export function unpackModule(letters) {
+    return joinModule(unpackLzma(bytesOfLetters(letters)));
 }

@@ -55,9 +55,9 @@ export function fileFor(name, content) {
 /** The module that a page holds. */
 export async function engineIn(page) {
     const unpack = `${process.env.OLVANE_SOURCES}/bindings/javascript/package/unpack.mjs`;
-    const { bytesOfLetters, unpackLzma } = await import(unpack);
+    const { bytesOfLetters, joinModule, unpackLzma } = await import(unpack);
     const [, style, script, letters] = /id="olvane-parts" data-style="(\d+)" data-script="(\d+)">([^<]*)</.exec(page);
-    return unpackLzma(bytesOfLetters(letters)).slice(Number(style) + Number(script));
+    return joinModule(unpackLzma(bytesOfLetters(letters)).subarray(Number(style) + Number(script)));
 }
 
 /** The page without a family. settings are those of a browser context. */

@@ -5,7 +5,7 @@
 // when the first viewer asks for it.
 
 import { loadOlvane, type Olvane } from "olvane";
-import { bytesOfLetters, unpackLzma } from "olvane-unpack";
+import { unpackModule } from "olvane-unpack";
 import { defineOlvaneTree, OlvaneTree } from "./OlvaneTree";
 
 /** Put in by the build: the module, packed and written as letters. */
@@ -15,7 +15,7 @@ let engine: Promise<Olvane> | null = null;
 
 /** The engine that all viewers of the page share. */
 export function sharedEngine(): Promise<Olvane> {
-    engine ??= Promise.resolve(kPackedModule).then((letters) => loadOlvane(unpackLzma(bytesOfLetters(letters))));
+    engine ??= Promise.resolve(kPackedModule).then((letters) => loadOlvane(unpackModule(letters)));
     return engine;
 }
 

@@ -5,6 +5,8 @@
 declare module "olvane-unpack" {
     export function bytesOfLetters(letters: string): Uint8Array<ArrayBuffer>;
     export function unpackLzma(packed: Uint8Array): Uint8Array<ArrayBuffer>;
+    export function joinModule(streams: Uint8Array): Uint8Array<ArrayBuffer>;
+    export function unpackModule(letters: string): Uint8Array<ArrayBuffer>;
 }
 
 interface Window {
