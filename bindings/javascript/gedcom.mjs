@@ -53,6 +53,7 @@ function personFrom(values, index) {
         parentFamilies: parentFamiliesFrom(values[12]),
         coupleFamilies: values[13],
         surnameFirst: values[14] !== 0,
+        shownName: values[15] ?? names[0] ?? "",
     };
 }
 

@@ -566,6 +566,8 @@ export interface Person {
     readonly surname: string;
     /** The file writes the surname first, so it is read first. */
     readonly surnameFirst: boolean;
+    /** The name as far as anybody reads: one of more than 1,000 bytes of UTF-8 is cut between two characters and ends in an ellipsis. */
+    readonly shownName: string;
     /** All the names of the person, the first one included. */
     readonly names: readonly string[];
     readonly sex: Sex;
@@ -918,6 +920,10 @@ export class Olvane {
     readonly texts: Texts;
     /** "MAJOR.MINOR.PATCH". */
     readonly version: string;
+    /** The encodings that readGedcom knows, by the names to show, the usual ones first. */
+    readonly encodings: readonly string[];
+    /** The papers that have a name, for GedcomFile.sheets. */
+    readonly papers: readonly string[];
     /** Takes over a family: none of the rows is looked at again. Throws FamilyError. */
     family(rows?: FamilyRows): Family;
     /** One record for each box, in the order of the walk. Throws LayoutError; TypeError and RangeError as Options say. */

@@ -25,6 +25,14 @@ export class Olvane {
         this.version = instance.text(instance.exports.version());
     }
 
+    get encodings() {
+        return this.#names("encoding_names");
+    }
+
+    get papers() {
+        return this.#names("paper_names");
+    }
+
     family(rows = {}) {
         return new Family(this.#instance, rows);
     }
@@ -61,6 +69,10 @@ export class Olvane {
 
     readGedcomIn(worker, bytes, name = "family.ged", options = {}) {
         return readGedcomIn(worker, this.#instance, bytes, name, options);
+    }
+
+    #names(list) {
+        return this.#instance.text(this.#instance.exports[list]()).split("\n");
     }
 
     #run(host, focus, options, wanted) {

@@ -174,6 +174,15 @@ describe("what the module draws on paper", () => {
         });
     }
 
+    test("has every paper that is offered", async () => {
+        const file = await fileOf(kSample);
+        const { papers } = olvane;
+        assert.deepEqual(papers, ["A4", "A3", "A2", "A1", "A0", "letter"]);
+        const widths = papers.map((paper) => file.sheets(1, {}, {}, { paper }).width);
+        assert.equal(new Set(widths).size, papers.length);
+        file.close();
+    });
+
     test("is refused for no paper, wrong numbers and too many sheets", async () => {
         const file = await fileOf(kSample);
         assert.throws(() => file.sheets(1, {}, {}, { paper: "B9" }), /B9 is no paper/);

@@ -78,6 +78,7 @@ test("persons, families and facts are given as the file has them", () => {
         parentFamilies: [],
         coupleFamilies: [1],
         surnameFirst: false,
+        shownName: 'Johann "Grüber"\\',
     });
     assert.deepEqual(file.persons[2].parentFamilies, [{ family: 1, pedigree: "adopted" }]);
     assert.equal(file.persons[2].sex, "other");
@@ -324,3 +325,33 @@ test("details of a person and a family come with their facts and names", () => {
     assert.throws(() => file.detailsOfPerson(2), GedcomError);
     file.close();
 });
+
+test("a name of any length is shown as far as anybody reads, and whole else", () => {
+    const nameOf = (name) => olvane.readGedcom(bytesOf(`0 HEAD\n0 @I1@ INDI\n1 NAME ${name}\n0 TRLR\n`)).persons[0];
+    const long = nameOf("a".repeat(200_000));
+    assert.equal(long.name.length, 200_000);
+    assert.equal(long.shownName, "a".repeat(999) + "\u2026");
+    // Four bytes each, none of which is cut in two.
+    assert.equal(nameOf("a" + "\u{1f9d9}".repeat(600)).shownName, "a" + "\u{1f9d9}".repeat(248) + "\u2026");
+    assert.equal(nameOf("a".repeat(1000)).shownName, "a".repeat(1000));
+    assert.equal(nameOf("").shownName, "");
+});
+
+test("every encoding that is offered reads a file", () => {
+    const text = bytesOf("0 HEAD\n0 @I1@ INDI\n1 NAME Ada\n0 TRLR\n");
+    const { encodings } = olvane;
+    assert.deepEqual(encodings.slice(0, 3), ["UTF-8", "ANSEL", "windows-1252"]);
+    assert.ok(encodings.includes("KOI8-R") && encodings.includes("IBM850"));
+    // Node knows all that browsers do, but for one.
+    for (const encoding of encodings.filter((name) => name !== "ISO-8859-16")) {
+        const bytes = encoding.startsWith("UTF-16") ? utf16(text, encoding.endsWith("LE")) : text;
+        assert.equal(olvane.readGedcom(bytes, "a.ged", { encoding }).persons[0]?.name, "Ada", encoding);
+    }
+});
+
+function utf16(ascii, isLittle) {
+    return Uint8Array.from(ascii, (byte) => byte).reduce(
+        (wide, byte, i) => (wide.set(isLittle ? [byte, 0] : [0, byte], 2 * i), wide),
+        new Uint8Array(2 * ascii.length),
+    );
+}

@@ -24,6 +24,7 @@ export function person(id: number, name: string, more: Partial<Person> = {}): Pe
         parentFamilies: [],
         coupleFamilies: [],
         surnameFirst: false,
+        shownName: name,
         ...more,
     };
 }

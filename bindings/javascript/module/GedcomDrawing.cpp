@@ -213,6 +213,11 @@ const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int 
     }
 }
 
+// The papers that have a name, each on a line of its own.
+OLVANE_EXPORT("paper_names") const char* paperNames() {
+    return js::textOrRefusal([] { return js::linesOf(draw::paperNames()); });
+}
+
 // Birth, death and further lines of a person's box; facts as for gedcom_svg.
 OLVANE_EXPORT("gedcom_person_label")
 const char* gedcomPersonLabel(const js::OpenFile* file, std::uint32_t id, unsigned facts) {

@@ -12,8 +12,10 @@
 #include <string>
 #include <string_view>
 
+#include <olvane/gedcom/GedcomEncodings.h>
 #include <olvane/gedcom/GedcomMedia.h>
 #include <olvane/gedcom/GedcomReader.h>
+#include <olvane/picture/TextMetrics.h>
 #include <olvane/source/GedcomLabels.h>
 #include <olvane/source/LimitedDataSource.h>
 
@@ -67,6 +69,12 @@ void writeCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> lin
     json.end();
 }
 
+// The name as it is shown, where that is not the whole.
+void writeCutName(JsonText& json, const gedcom::PersonName& name) {
+    const std::string whole = gedcom::displayName(name);
+    if (whole.size() > picture::kMostTextBytes) json.string(picture::cutText(whole));
+}
+
 void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonId id) {
     const gedcom::Person& person = data.person(id);
     json.begin();
@@ -85,6 +93,7 @@ void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonI
     writeParentFamilies(json, data.parentLinks(id));
     writeCoupleFamilies(json, data.coupleLinks(id));
     json.number(gedcom::isSurnameFirst(data.firstName(id)) ? 1 : 0);
+    writeCutName(json, data.firstName(id));
     json.end();
 }
 
@@ -222,6 +231,11 @@ OLVANE_EXPORT("archive_member") const char* archiveMember(const char* file) {
     } catch (const std::exception&) {
         return nullptr;
     }
+}
+
+// The encodings to choose from, each on a line of its own.
+OLVANE_EXPORT("encoding_names") const char* encodingNames() {
+    return js::textOrRefusal([] { return js::linesOf(gedcom::encodingNames()); });
 }
 
 OLVANE_EXPORT("gedcom_close") void gedcomClose(OpenFile* file) {

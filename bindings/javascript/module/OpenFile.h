@@ -5,7 +5,9 @@
 
 #include <exception>
 #include <optional>
+#include <span>
 #include <string>
+#include <string_view>
 #include <utility>
 
 #include <olvane/charts/ViewRequest.h>
@@ -72,6 +74,12 @@ constexpr std::size_t kMostRelatives = 1000000;
 
 // What the last call had to say: a table, facts, or why something was refused.
 extern std::string lastText;
+
+inline std::string linesOf(std::span<const std::string_view> names) {
+    std::string lines;
+    for (const std::string_view name : names) lines.append(lines.empty() ? "" : "\n").append(name);
+    return lines;
+}
 
 // The text that make gives, which lives until the next one; or null with the reason in its place.
 template <class Make>

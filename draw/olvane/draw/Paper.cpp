@@ -3,6 +3,7 @@
 
 #include <olvane/draw/Paper.h>
 
+#include <array>
 #include <charconv>
 
 namespace olvane::draw {
@@ -18,6 +19,12 @@ struct NamedPaper {
 constexpr NamedPaper kPapers[] = {{"A4", 210, 297}, {"A3", 297, 420},  {"A2", 420, 594},
                                   {"A1", 594, 841}, {"A0", 841, 1189}, {"letter", 215.9, 279.4}};
 
+constexpr auto kNames = [] {
+    std::array<std::string_view, std::size(kPapers)> names{};
+    for (std::size_t i = 0; i < names.size(); ++i) names[i] = kPapers[i].name;
+    return names;
+}();
+
 constexpr int kLeastSide = 50;
 constexpr int kMostSide = 20'000;
 
@@ -30,6 +37,10 @@ int sideOf(std::string_view text) {
 }
 
 }  // namespace
+
+std::span<const std::string_view> paperNames() {
+    return kNames;
+}
 
 std::optional<Paper> paperOf(std::string_view text) {
     for (const NamedPaper& paper : kPapers) {

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <optional>
+#include <span>
 #include <string_view>
 
 namespace olvane::draw {
@@ -17,7 +18,10 @@ struct Paper {
     Paper turned() const { return {height, width, mayTurn}; }
 };
 
-// "A4" to "A0", "letter", or a width and a height in millimetres, such as "914x1500"; at least 50 and at most 20,000
+// The papers that have a name: "A4", "A3", "A2", "A1", "A0", "letter".
+std::span<const std::string_view> paperNames();
+
+// One of paperNames(), or a width and a height in millimetres, such as "914x1500"; at least 50 and at most 20,000
 // each. Nothing for any other text.
 std::optional<Paper> paperOf(std::string_view text);
 

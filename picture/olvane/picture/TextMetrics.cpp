@@ -72,15 +72,14 @@ std::string cleanText(std::string_view text) {
 
 std::string cutText(std::string_view text) {
     if (text.size() <= kMostTextBytes) return std::string(text);
+    std::size_t whole = kMostTextBytes;  // bytes of whole characters
+    while (whole > 0 && (static_cast<unsigned char>(text[whole]) & 0xC0u) == 0x80u) --whole;
     // The last cluster of the beginning may go on behind it.
-    const std::string_view beginning = text.substr(0, kMostTextBytes);
+    const std::string_view beginning = text.substr(0, whole);
     std::size_t end = 0;
     for (std::size_t next = 0; next < beginning.size(); next += firstCluster(beginning.substr(next)).size())
         end = next;
-    if (end == 0) {
-        end = kMostTextBytes;
-        while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0u) == 0x80u) --end;
-    }
+    if (end == 0) end = whole;
     return std::string(text.substr(0, end)) + std::string(kEllipsis);
 }
 

@@ -88,6 +88,14 @@ TEST(TextMetrics, syllablesOfHangulAreClustersOfOneEm) {
     EXPECT_DOUBLE_EQ(textWidth("한글", {10, false}), 20);
 }
 
+TEST(TextMetrics, aTextIsCutBetweenCharactersThatAreClustersOfTheirOwn) {
+    // Four bytes each behind one, so that the bound lies within one.
+    std::string name = "a";
+    for (std::size_t i = 0; i < kMostTextBytes; ++i) name += "\xF0\x9F\xA7\x99";
+    const std::string cut = cutText(name);
+    EXPECT_EQ(cut, name.substr(0, 1 + 4 * 248) + "\xE2\x80\xA6");
+}
+
 TEST(TextMetrics, shortTextIsNotCut) {
     EXPECT_EQ(cutText(std::string(kMostTextBytes, 'a')), std::string(kMostTextBytes, 'a'));
 }

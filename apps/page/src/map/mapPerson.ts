@@ -12,6 +12,7 @@ export function mapPerson(map: FamilyMap, person: number): Person {
         id: map.number(person),
         xref: "",
         name,
+        shownName: name,
         given: map.nameLines(person)[0],
         surname: map.surname(person),
         names: name === "" ? [] : [name],

@@ -8,15 +8,7 @@ import type { DateMark, Messages } from "../messages";
 
 /** The name to show, and a word for one who has none. */
 export function nameOf(person: Person, messages: Messages): string {
-    return person.name ? shortened(person.name) : messages.unknownName;
-}
-
-const kMostLetters = 1000; // nobody reads more of a name
-
-/** A text of any length as it is shown: a long one ends in an ellipsis, and no character is cut in two. */
-export function shortened(text: string): string {
-    if (text.length <= kMostLetters) return text;
-    return text.slice(0, kMostLetters).replace(/[\ud800-\udbff]$/, "") + "\u2026";
+    return person.shownName || messages.unknownName;
 }
 
 /** "12 February 1809", "before 1820", "from 1809 to 1811"; the file's own words where the date was not read. */

@@ -10,7 +10,6 @@ import type { UiMessages } from "../messages/ui";
 import type { ViewState } from "../view/ViewState";
 import { svgBlob } from "./saving";
 
-const kPapers = ["A4", "A3", "A2", "A1", "A0", "letter"] as const;
 const kMostOneWay = 10; // sheets
 const kMostShown = 100; // sheets of a preview
 const kReadableName = 4; // points
@@ -45,6 +44,7 @@ export class PaperDialog {
     // save hands the sheets to the browser's downloads as PNG of so many pixels an inch.
     constructor(
         private readonly ui: UiMessages,
+        private readonly papers: readonly string[],
         private readonly sheetsOf: (paper: PaperOptions) => PaperSheets | null,
         private readonly look: (wanted: Partial<ViewState>) => void,
         private readonly save: (sheets: PaperSheets, dpi: number) => Promise<void>,
@@ -82,7 +82,7 @@ export class PaperDialog {
         this.purpose.append(html("option", { value: "" }, ui.paper.shown));
         for (const value of Object.keys(kPurposes) as Purpose[])
             this.purpose.append(html("option", { value }, ui.paper.purposes[value]));
-        for (const value of kPapers) {
+        for (const value of this.papers) {
             this.paper.append(html("option", { value }, value === "letter" ? ui.paper.letter : value));
         }
         for (const select of [this.rows, this.columns]) {

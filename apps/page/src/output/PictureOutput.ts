@@ -43,10 +43,11 @@ export class PictureOutput {
     ) {}
 
     /** Makes what holds words; the dialog is to stand in the document. */
-    rebuild(ui: UiMessages): HTMLDialogElement {
+    rebuild(ui: UiMessages, papers: readonly string[]): HTMLDialogElement {
         this.paper?.element.remove();
         this.paper = new PaperDialog(
             ui,
+            papers,
             (paper) => this.subject()?.sheets(paper) ?? null,
             (wanted) => this.subject()?.look(wanted),
             (sheets, dpi) => this.saveSheets(ui, sheets, dpi),

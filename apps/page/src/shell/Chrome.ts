@@ -41,61 +41,10 @@ export interface ChromeActions extends ViewActions {
 export interface ChromeLooks {
     readonly theme: ThemeChoice;
     readonly kinshipInBoxes: boolean;
+    /** To choose from where a file's own word on its encoding is wrong. */
+    readonly encodings: readonly string[];
 }
 
-// To choose from where a file's own word on its encoding is wrong: all that the reader knows but ASCII, which most of them extend.
-const kEncodings = [
-    "UTF-8",
-    "ANSEL",
-    "windows-1252",
-    "windows-1250",
-    "windows-1251",
-    "windows-1253",
-    "windows-1254",
-    "windows-1255",
-    "windows-1256",
-    "windows-1257",
-    "windows-1258",
-    "ISO-8859-2",
-    "ISO-8859-3",
-    "ISO-8859-4",
-    "ISO-8859-5",
-    "ISO-8859-6",
-    "ISO-8859-7",
-    "ISO-8859-8",
-    "ISO-8859-10",
-    "ISO-8859-13",
-    "ISO-8859-14",
-    "ISO-8859-15",
-    "ISO-8859-16",
-    "KOI8-R",
-    "KOI8-U",
-    "GBK",
-    "GB18030",
-    "BIG5",
-    "Shift_JIS",
-    "EUC-JP",
-    "EUC-KR",
-    "TIS-620",
-    "macintosh",
-    "UTF-16LE",
-    "UTF-16BE",
-    "IBM437",
-    "IBM737",
-    "IBM775",
-    "IBM850",
-    "IBM852",
-    "IBM855",
-    "IBM857",
-    "IBM858",
-    "IBM860",
-    "IBM861",
-    "IBM862",
-    "IBM863",
-    "IBM865",
-    "IBM866",
-    "IBM869",
-] as const;
 const kMostDiagnostics = 500; // listed until all are asked for
 
 export class Chrome {
@@ -151,7 +100,7 @@ export class Chrome {
         this.views = new ViewChooser(ui, actions, pictureSwitches);
         this.unknownParents = checkbox("unknown-parents", (checked) => pictureSwitches.setUnknownParents(checked));
         this.encoding.append(html("option", { value: "" }, ui.encodingAuto));
-        for (const name of kEncodings) this.encoding.append(html("option", { value: name }, name));
+        for (const name of looks.encodings) this.encoding.append(html("option", { value: name }, name));
         this.encoding.addEventListener("change", () => actions.setEncoding(this.encoding.value));
         this.keep = checkbox("keep-file", (checked) => actions.setKept(checked));
         this.keepRow = html(

@@ -57,11 +57,12 @@ export class Panels {
 
     /** Makes everything that holds words. */
     rebuild(): void {
-        const { ui, maps, notices } = this.page;
+        const { ui, maps, notices, files } = this.page;
         document.documentElement.lang = ui.language;
         this.chrome = new Chrome(ui, this.actions, this.page.switches, this.finding, {
             theme: this.theme.choice,
             kinshipInBoxes: this.kinshipInBoxes,
+            encodings: files.engine.encodings,
         });
         this.welcome = new Welcome(
             ui,
@@ -71,7 +72,7 @@ export class Panels {
         notices.setDismissLabel(ui.errors.dismiss);
         this.cover.textContent = ui.welcome.dropNow;
         maps.rebuild(ui);
-        this.paperDialog = this.output.rebuild(ui);
+        this.paperDialog = this.output.rebuild(ui, files.engine.papers);
         this.arrange();
     }
 
