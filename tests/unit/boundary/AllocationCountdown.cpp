@@ -6,14 +6,16 @@
 
 #include <unit/boundary/AllocationCountdown.h>
 
+#include <atomic>
 #include <cstdlib>
 #include <new>
 
 namespace {
 
-std::int64_t made = 0;
-std::int64_t outstanding = 0;
-std::int64_t untilFailure = 0;
+// Counts of several threads are sums; a failure comes to whichever thread is next.
+std::atomic<std::int64_t> made = 0;
+std::atomic<std::int64_t> outstanding = 0;
+std::atomic<std::int64_t> untilFailure = 0;
 
 }  // namespace
 
