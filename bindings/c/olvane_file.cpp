@@ -188,7 +188,7 @@ namespace {
 
 // A drawing is a layout too, which a callback may not ask for while its own is running on this thread.
 template <class Draw>
-olvane_status drawn(olvane_result** svg, const Draw& draw) noexcept {
+olvane_status drawn(olvane_result** svg, const Draw& draw) {
     return answered(svg, [&] {
         bool isNested = true;
         olvane::c::unlessNested([&isNested] { isNested = false; });
