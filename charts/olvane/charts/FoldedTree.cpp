@@ -16,7 +16,6 @@
 #include <olvane/charts/HiddenRelativesInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
 #include <olvane/kin/Index.h>
-#include <olvane/picture/Judge.h>
 
 namespace olvane::charts {
 
@@ -30,6 +29,8 @@ constexpr double kWorthFolding = 1.1;
 constexpr std::size_t kLinksForOneMark = 20;
 // Only so many are tried with all links as lines, which takes ten times as long.
 constexpr std::size_t kFewPersons = 300;
+// Of more, all second links are marks, whether their lines would cross others or not.
+constexpr std::size_t kManyPersons = 20'000;
 
 // The chosen persons with their ids, in the order in which they were found, and the unions that two of them are in.
 class ChosenFamily {
@@ -110,6 +111,42 @@ double sheetHeight(const picture::Picture& picture, double aspect) {
     return std::max(bottom - top, (right - left) / aspect);
 }
 
+// An upright piece of a family's lines.
+struct Upright {
+    double x;
+    double low;
+    double high;
+    std::size_t family;
+};
+
+std::vector<Upright> uprightsIn(const picture::Picture& picture) {
+    std::vector<Upright> uprights;
+    for (std::size_t family = 0; family < picture.families.size(); ++family) {
+        for (const picture::Line& line : picture.linesOf(picture.families[family])) {
+            if (line.x1 != line.x2) continue;
+            uprights.push_back({line.x1, std::min(line.y1, line.y2), std::max(line.y1, line.y2), family});
+        }
+    }
+    std::sort(uprights.begin(), uprights.end(), [](const Upright& a, const Upright& b) { return a.x < b.x; });
+    return uprights;
+}
+
+// Whether lines of two families cross. The judge counts them all, which is more than a page has room for.
+bool hasCrossings(const picture::Picture& picture) {
+    const std::vector<Upright> uprights = uprightsIn(picture);
+    for (std::size_t family = 0; family < picture.families.size(); ++family) {
+        for (const picture::Line& line : picture.linesOf(picture.families[family])) {
+            const double right = std::max(line.x1, line.x2);
+            auto next = std::upper_bound(uprights.begin(), uprights.end(), std::min(line.x1, line.x2),
+                                         [](double x, const Upright& one) { return x < one.x; });
+            for (; next != uprights.end() && next->x < right; ++next) {
+                if (next->family != family && next->low < line.y1 && line.y1 < next->high) return true;
+            }
+        }
+    }
+    return false;
+}
+
 // How many relations the picture expresses, by lines or marks.
 std::size_t linksIn(const picture::Picture& picture) {
     std::size_t links = 0;
@@ -138,15 +175,12 @@ public:
 
     // Siblings in the order of the data, and links that would cross others as marks.
     picture::Picture inOrder() const {
-        const picture::Picture free = made(-1, true);
+        if (selection_.persons.size() > kManyPersons) return made(-1, false);
+        picture::Picture free = made(-1, true);
         return hasCrossings(free) ? made(-1, false) : free;
     }
     // Everybody where the fewest lines cross, and all links as lines.
     picture::Picture withAllLines() const { return made(0, false); }
-
-    static bool hasCrossings(const picture::Picture& picture) {
-        return picture::judge(picture).crossings > 0;
-    }
 
 private:
     picture::Picture made(std::int32_t marks, bool drawFree) const {
@@ -185,8 +219,7 @@ picture::Picture treeChartOnPaper(const kin::KinGraph& graph, const ChartRequest
     if (isLargerWith(inOrder, tree.marks.size())) return inOrder;
     if (selection.persons.size() <= kFewPersons) {
         picture::Picture withLines = folds.withAllLines();
-        if (isLargerWith(withLines, tree.marks.size()) && !FoldedTree::hasCrossings(withLines))
-            return withLines;
+        if (isLargerWith(withLines, tree.marks.size()) && !hasCrossings(withLines)) return withLines;
     }
     return isLargerWith(inOrder, most) ? inOrder : tree;
 }
