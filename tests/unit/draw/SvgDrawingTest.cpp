@@ -514,6 +514,17 @@ protected:
     }
 };
 
+// An arc of a whole turn ends where it begins, and of that nothing would be drawn.
+TEST_F(Fan, aCellAllTheWayRoundIsDrawnInTwoHalves) {
+    content_.picture.boxes.resize(2);
+    content_.picture.arcs.resize(2);
+    content_.picture.arcs[1].from = 0;
+    content_.picture.arcs[1].to = 360;
+    const std::string svg = draw();
+    EXPECT_EQ(countOf(svg, "A190 190 0 0 1 "), 2u);  // in px
+    EXPECT_EQ(countOf(svg, "A80 80 0 0 "), 4u);      // of the middle, and of the cell around it
+}
+
 TEST_F(Fan, eachBoxIsACellWithItsName) {
     const SvgPicture drawn = drawSvg(content_, options_);
     ASSERT_EQ(drawn.boxes.size(), 4u);
