@@ -54,6 +54,15 @@ bool areFolds(const olvane_fold* folds, std::size_t count) {
     return true;
 }
 
+bool areBoxSizes(const olvane_box_size* sizes, std::size_t count) {
+    const auto isSize = [](float size) { return size >= 0 && size <= charts::kLargestSize; };
+    if (!sizes && count > 0) return false;
+    for (std::size_t i = 0; i < count; ++i) {
+        if (!isSize(sizes[i].width) || !isSize(sizes[i].height)) return false;
+    }
+    return true;
+}
+
 // All enumerations of a request have fewer than 255 entries.
 template <class Choice>
 Choice choice(std::int32_t number) {
@@ -99,11 +108,12 @@ bool areInRange(const olvane_options& options) {
 bool areInRange(const olvane_picture_options& options) {
     return options.struct_size == sizeof(olvane_picture_options) && isOneOf(options.view, kViewCount) &&
            areSizesOfCharts(options.layout.sizes) && areFolds(options.folds, options.fold_count) &&
-           options.up >= 0 && options.down >= 0 && isOneOf(options.direction, 4) &&
-           isOneOf(options.fan_of, 2) && options.fan_angle >= 90 && options.fan_angle <= 360 &&
-           isOneOf(options.ways, 3) && options.most_ways >= 0 && isOneOf(options.language, 3) &&
-           options.marks >= -1 && isOneOf(options.effort, 101) && isOneOf(options.year, kLastYear + 1) &&
-           areInRange(options.layout);
+           areBoxSizes(options.box_sizes, options.box_size_count) && options.aspect >= 0 &&
+           std::isfinite(options.aspect) && options.up >= 0 && options.down >= 0 &&
+           isOneOf(options.direction, 4) && isOneOf(options.fan_of, 2) && options.fan_angle >= 90 &&
+           options.fan_angle <= 360 && isOneOf(options.ways, 3) && options.most_ways >= 0 &&
+           isOneOf(options.language, 3) && options.marks >= -1 && isOneOf(options.effort, 101) &&
+           isOneOf(options.year, kLastYear + 1) && areInRange(options.layout);
 }
 
 AskedView::AskedView(const olvane_picture_options& options) {
@@ -132,6 +142,12 @@ AskedView::AskedView(const olvane_picture_options& options) {
         folds.push_back({options.folds[i].person, choice<picture::Branch>(options.folds[i].branch)});
     }
     chart.folded = folds;
+    for (std::size_t i = 0; i < options.box_size_count; ++i) {
+        const olvane_box_size& box = options.box_sizes[i];
+        boxSizes.push_back({box.person, {box.width, box.height}});
+    }
+    chart.sizedBoxes = boxSizes;
+    chart.aspect = options.aspect;
 }
 
 }  // namespace olvane::c

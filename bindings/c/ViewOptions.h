@@ -25,7 +25,7 @@ constexpr bool isOneOf(std::int32_t number, std::int32_t count) {
     return number >= 0 && number < count;
 }
 
-// The request that the options of a picture ask for, but for focus, other and earlier picture, and the folds that it refers to.
+// The request that the options of a picture ask for, but for focus, other and earlier picture, and the folds and sizes that it refers to.
 // A number of no enumeration stays one, so that whoever checks the request refuses it.
 struct AskedView {
     explicit AskedView(const olvane_picture_options& options);
@@ -33,6 +33,7 @@ struct AskedView {
     AskedView& operator=(const AskedView&) = delete;
 
     std::vector<charts::Fold> folds;
+    std::vector<charts::SizedBox> boxSizes;
     charts::ViewRequest request;
 };
 

@@ -204,6 +204,13 @@ typedef struct olvane_fold {
         branch; /* 0 ancestors, 1 descendants, 2 partners and, of the focus and its ancestors, siblings with theirs */
 } olvane_fold;
 
+/* A person whose box has a size of its own, in points, as it stands on paper: not turned when a chart runs sideways. */
+typedef struct olvane_box_size {
+    int64_t person;
+    float width;  /* 0 to a million */
+    float height; /* likewise */
+} olvane_box_size;
+
 /* What a view has no use for is ignored. */
 typedef struct olvane_picture_options {
     size_t struct_size;      /* sizeof(olvane_picture_options); olvane_picture_options_default sets it */
@@ -236,6 +243,14 @@ typedef struct olvane_picture_options {
        stays where that picture has them as far as the change allows; it is not looked at if it is of another view or
        direction, or if less than half of the family is in it. */
     const olvane_picture* earlier;
+    /* Near, ancestors, descendants, hourglass, relatives, kinship, everybody: whose boxes are not of the size that layout
+       has; may be null without any. Whoever is not in the family is passed over, and the last of two sizes for one person
+       counts. They are read during the call only. */
+    const olvane_box_size* box_sizes;
+    size_t box_size_count;
+    /* Everybody, near, ancestors, descendants, hourglass, relatives: width by height of the paper that wide generations
+       are folded for; 0 for none. */
+    double aspect;
 } olvane_picture_options;
 
 /* Everything at its usual value, as said above, for the view. */

@@ -42,6 +42,10 @@
 _Static_assert(sizeof(OlvaneFold) == sizeof(olvane_fold) &&
                    offsetof(OlvaneFold, branch) == offsetof(olvane_fold, branch),
                "folds are handed over as they lie");
+_Static_assert(sizeof(OlvaneBoxSize) == sizeof(olvane_box_size) &&
+                   offsetof(OlvaneBoxSize, width) == offsetof(olvane_box_size, width) &&
+                   offsetof(OlvaneBoxSize, height) == offsetof(olvane_box_size, height),
+               "sizes of boxes are handed over as they lie");
 
 @implementation OlvanePictureOptions
 
@@ -69,6 +73,7 @@ OLVANE_FIELD(int, language, setLanguage, language)
 OLVANE_FIELD(int, marks, setMarks, marks)
 OLVANE_FIELD(int, effort, setEffort, effort)
 OLVANE_SWITCH(allParts, setAllParts, all_parts)
+OLVANE_FIELD(double, aspect, setAspect, aspect)
 OLVANE_FIELD(int, generations, setGenerations, layout.generations)
 OLVANE_FIELD(int, flagDepth, setFlagDepth, layout.flag_depth)
 OLVANE_SWITCH(unknownParents, setUnknownParents, unknown_parents)
@@ -92,6 +97,7 @@ OLVANE_SHOWN(spousesOfChildren, setSpousesOfChildren, OLVANE_SHOW_SPOUSES_OF_CHI
     self = [super init];
     if (!self) return nil;
     _folded = [[NSMutableData alloc] init];
+    _boxSizes = [[NSMutableData alloc] init];
     _options = malloc(sizeof *_options);
     if (!_options) {
         [self release];
@@ -104,6 +110,7 @@ OLVANE_SHOWN(spousesOfChildren, setSpousesOfChildren, OLVANE_SHOW_SPOUSES_OF_CHI
 - (void)dealloc {
     [_earlier release];
     [_folded release];
+    [_boxSizes release];
     free(_options);
     [super dealloc];
 }
@@ -135,9 +142,28 @@ OLVANE_SHOWN(spousesOfChildren, setSpousesOfChildren, OLVANE_SHOW_SPOUSES_OF_CHI
     }
 }
 
+- (void)setBoxWidth:(float)width height:(float)height ofPerson:(int64_t)personId {
+    OlvaneBoxSize size;
+    memset(&size, 0, sizeof size);
+    size.personId = personId;
+    size.width = width;
+    size.height = height;
+    [_boxSizes appendBytes:&size length:sizeof size];
+}
+
+- (const OlvaneBoxSize*)boxSizes {
+    return (const OlvaneBoxSize*)[_boxSizes bytes];
+}
+
+- (NSUInteger)boxSizeCount {
+    return [_boxSizes length] / sizeof(OlvaneBoxSize);
+}
+
 - (const struct olvane_picture_options*)options {
     _options->folds = (const olvane_fold*)[_folded bytes];
     _options->fold_count = [self foldedCount];
+    _options->box_sizes = (const olvane_box_size*)[_boxSizes bytes];
+    _options->box_size_count = [self boxSizeCount];
     return _options;
 }
 

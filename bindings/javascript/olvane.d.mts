@@ -199,6 +199,11 @@ export interface PictureOptions {
     /** Near, ancestors, descendants, hourglass, relatives: branches that are left out; none. */
     folded?: Iterable<Fold> | undefined;
     /**
+     * Near, ancestors, descendants, hourglass, relatives, kinship, everybody: persons whose boxes are not of the usual size;
+     * none. Whoever is not in the family is passed over, and the last of two sizes for one person counts.
+     */
+    boxSizes?: Iterable<BoxSize> | undefined;
+    /**
      * Everybody, near, ancestors, descendants, hourglass, relatives: width by height of the paper that wide generations
      * are folded for; 0 for no paper.
      */
@@ -411,6 +416,13 @@ export type Branch = "up" | "down" | "beside";
 export interface Fold {
     readonly person: number;
     readonly branch: Branch;
+}
+
+/** A person whose box has a size of its own, in points of 0 to 1,000,000, as it stands on paper. */
+export interface BoxSize {
+    readonly person: number;
+    readonly width: number;
+    readonly height: number;
 }
 
 /** How many persons a branch has for itself, and on which side of the box it stands. */

@@ -13,6 +13,7 @@ const LANGUAGES = ["en", "de", "es"];
 const PARENTS = ["birth", "adoptive", "allInOrder"];
 
 const MOST = 2 ** 31 - 1;
+const LARGEST_SIZE = 1_000_000;
 
 /** In the order of set_picture_options. */
 const OPTIONS = {
@@ -47,6 +48,7 @@ const OPTIONS = {
     labelSize: { size: true, usual: 0 },
     mirrored: { flag: true, usual: false },
     folded: { folds: true, usual: [] },
+    boxSizes: { boxes: true, usual: [] },
 };
 
 function wordNumber(name, value, words) {
@@ -79,7 +81,23 @@ function foldNumbers(folds) {
     return [numbers.length / 2, ...numbers];
 }
 
+/** How many boxes have a size of their own, then the person, the width and the height of each. */
+function boxNumbers(boxes) {
+    const length = (value) => {
+        const points = plainNumber("boxSizes", value, { size: true });
+        if (points <= LARGEST_SIZE) return points;
+        throw new RangeError(`boxSizes is ${value}, and takes a number of 0 to ${LARGEST_SIZE}`);
+    };
+    const numbers = [...boxes].flatMap(({ person, width, height }) => [
+        plainNumber("boxSizes", person, { least: 1, most: MOST }),
+        length(width),
+        length(height),
+    ]);
+    return [numbers.length / 3, ...numbers];
+}
+
 function numberOf(name, value, option) {
+    if (option.boxes) return boxNumbers(value);
     if (option.folds) return foldNumbers(value);
     if (option.words) return wordNumber(name, value, option.words);
     return option.flag ? flagNumber(name, value) : plainNumber(name, value, option);

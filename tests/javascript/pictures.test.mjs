@@ -155,6 +155,26 @@ test("persons of a later version of a file keep their places by xref, whatever t
     assert.equal(moved.length, 2);
 });
 
+test("boxes have sizes of their own", () => {
+    const boxSizes = [
+        { person: 1, width: 120, height: 40.5 },
+        { person: 99, width: 7, height: 7 },
+    ];
+    for (const view of ["near", "ancestors", "descendants", "hourglass", "relatives", "everybody"]) {
+        for (const { id, width, height } of file.picture(1, { view, boxSizes }).boxes) {
+            assert.deepEqual([width, height], id === 1 ? [120, 40.5] : [55, 80]);
+        }
+    }
+    for (const size of [
+        { width: -1, height: 4 },
+        { width: 4, height: NaN },
+        { width: 2e6, height: 4 },
+    ]) {
+        assert.throws(() => file.picture(1, { view: "near", boxSizes: [{ person: 1, ...size }] }), RangeError);
+    }
+    assert.throws(() => file.picture(1, { view: "near", boxSizes: [{ person: 1, width: "4", height: 4 }] }), TypeError);
+});
+
 test("branches are counted, left out and counted again", () => {
     const options = { view: "descendants" };
     const sizesOf = (sizes) => sizes.map(({ branch, count, side }) => `${branch} ${count} ${side}`);

@@ -91,12 +91,18 @@ PictureRequest requestOf(kin::Place focus) {
         const auto person = options.next<std::int64_t>();
         asked.folded.push_back({person, options.next<picture::Branch>()});
     }
+    for (int left = options.next<int>(); left > 0; --left) {
+        const auto person = options.next<std::int64_t>();
+        const auto width = static_cast<float>(options.number());
+        asked.boxSizes.push_back({person, {width, static_cast<float>(options.number())}});
+    }
     return asked;
 }
 
 charts::ViewRequest viewOf(const PictureRequest& request) {
     charts::ViewRequest view = request.view;
     view.chart.folded = request.folded;
+    view.chart.sizedBoxes = request.boxSizes;
     return view;
 }
 

@@ -15,11 +15,13 @@ struct PictureRequest {
     charts::ViewRequest view;
     gedcom::ParentChoice parents;
     std::vector<charts::Fold> folded;
+    std::vector<charts::SizedBox> boxSizes;
     bool keepsPlaces = false;  // everybody: of the file's last picture that was asked for so
     double labelSize = 0;      // in points, of a text at the line of a marriage; 0 where none is wanted
 };
 
-// What JavaScript last asked of a picture, for a focus. view has no branches folded: viewOf adds them.
+// What JavaScript last asked of a picture, for a focus. view has no branches folded and no boxes of their own size: viewOf
+// adds them.
 PictureRequest requestOf(kin::Place focus);
 
 // Refers to the request, which must outlive it.

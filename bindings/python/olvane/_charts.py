@@ -6,7 +6,8 @@ from __future__ import annotations
 
 import operator
 import os
-from collections.abc import Callable, Iterable, Sequence
+import sys
+from collections.abc import Callable, Iterable, Mapping, Sequence
 from ctypes import byref, c_void_p
 from typing import Any, Literal, get_args
 
@@ -26,6 +27,7 @@ _WAYS = ("blood", "marriage", "both")
 _LANGUAGES = ("en", "de", "es")
 _GREATEST_COUNT = 2**31 - 1
 _LAST_YEAR = 9999
+_LARGEST_SIZE = 1_000_000  # points
 
 
 def picture(
@@ -55,6 +57,8 @@ def picture(
     earlier: Picture | None = None,
     mirrored: bool = False,
     folded: Iterable[tuple[int | str, Branch]] = (),
+    box_sizes: Mapping[int | str, tuple[float, float]] | None = None,
+    aspect: float = 0,
 ) -> Picture:
     """The picture of any view around a person, as values: boxes, families with their lines, marks and ways.
 
@@ -76,6 +80,9 @@ def picture(
     - mirrored: right and left exchanged; folded: branches that are left out of near, ancestors, descendants, hourglass and
       relatives: a person with "up" (ancestors), "down" (descendants) or "beside" (partners and, of the focus and its
       ancestors, siblings with theirs).
+    - box_sizes: persons of near, ancestors, descendants, hourglass, relatives, kinship and everybody whose boxes have a
+      width and height of their own, in points, as they stand on paper; whoever is not in the family is passed over.
+    - aspect: of these but kinship, width by height of the paper that wide generations are folded for, 0 for none.
 
     Raises HostError and LayoutError as :func:`layout` does, FileError for a file that cannot be read and for a text that
     means nobody or several persons, and TypeError or ValueError for an option that is not allowed.
@@ -101,7 +108,7 @@ def picture(
     chosen.down = _whole("down", down, 0, _GREATEST_COUNT)
     chosen.direction = _choice("direction", direction, _DIRECTIONS)
     chosen.fan_of = _choice("fan_of", fan_of, _FANS)
-    chosen.fan_angle = _angle(fan_angle)
+    chosen.fan_angle = _real("fan_angle", fan_angle, 90, 360)
     chosen.ways = _choice("by", by, _WAYS)
     chosen.most_ways = _whole("most_ways", most_ways, 0, _GREATEST_COUNT)
     chosen.language = _choice("language", language, _LANGUAGES)
@@ -116,6 +123,15 @@ def picture(
     ]
     chosen.folds = (_native_picture.Fold * len(folds))(*folds)
     chosen.fold_count = len(folds)
+    boxes = [
+        _native_picture.BoxSize(
+            _number(source, person), _real("width", width, 0, _LARGEST_SIZE), _real("height", height, 0, _LARGEST_SIZE)
+        )
+        for person, (width, height) in (box_sizes or {}).items()
+    ]
+    chosen.box_sizes = (_native_picture.BoxSize * len(boxes))(*boxes)
+    chosen.box_size_count = len(boxes)
+    chosen.aspect = _real("aspect", aspect, 0, sys.float_info.max)
     if earlier is not None and not isinstance(earlier, Picture):
         raise TypeError(f"earlier is {earlier!r}, and takes a Picture")
     kept = None if earlier is None else earlier._kept
@@ -195,9 +211,9 @@ def _whole(name: str, given: object, least: int, most: int) -> int:
     return whole
 
 
-def _angle(given: float) -> float:
+def _real(name: str, given: object, least: float, most: float) -> float:
     if isinstance(given, bool) or not isinstance(given, int | float):
-        raise TypeError(f"fan_angle is {given!r}, and takes a number")
-    if not 90 <= given <= 360:
-        raise ValueError(f"fan_angle is {given}, and takes a number of 90 to 360")
+        raise TypeError(f"{name} is {given!r}, and takes a number")
+    if not least <= given <= most:
+        raise ValueError(f"{name} is {given}, and takes a number of {least} to {most}")
     return float(given)

@@ -34,6 +34,12 @@ class Fold(ctypes.Structure):
     _fields_ = [("person", c_int64), ("branch", c_int32)]
 
 
+class BoxSize(ctypes.Structure):
+    """olvane_box_size"""
+
+    _fields_ = [("person", c_int64), ("width", c_float), ("height", c_float)]
+
+
 class OptionsStruct(ctypes.Structure):
     """olvane_picture_options"""
 
@@ -63,6 +69,9 @@ class OptionsStruct(ctypes.Structure):
         ("fold_count", c_size_t),
         ("layout", _native.OptionsStruct),
         ("earlier", c_void_p),
+        ("box_sizes", POINTER(BoxSize)),
+        ("box_size_count", c_size_t),
+        ("aspect", c_double),
     ]
 
 

@@ -15,6 +15,7 @@
 #include <cmath>
 #include <stdexcept>
 #include <string>
+#include <vector>
 
 namespace olvane::charts {
 
@@ -38,6 +39,19 @@ void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {
         throw std::invalid_argument("there must be one box size for each person");
     }
+}
+
+// The size of each person's box by place, where some have their own; empty where all are of the usual size.
+std::vector<BoxSize> sizesByPlace(const kin::KinGraph& graph, const ChartRequest& request) {
+    if (request.sizedBoxes.empty()) return {};
+    if (!request.boxSizes.empty()) throw std::invalid_argument("there are sizes both by place and by id");
+    std::vector<BoxSize> sizes(static_cast<std::size_t>(graph.personCount()),
+                               {request.sizes.boxWidth, request.sizes.boxHeight});
+    for (const SizedBox& box : request.sizedBoxes) {
+        const kin::Place person = graph.placeOf(box.person);
+        if (person != kin::kNobody) sizes[static_cast<std::size_t>(person)] = box.size;
+    }
+    return sizes;
 }
 
 EverybodyOptions everybodyOptions(const ChartRequest& request) {
@@ -133,9 +147,12 @@ void checkRequest(const ChartRequest& request) {
     if (!std::isfinite(request.fanAngle)) throw std::invalid_argument("the angle of a fan must be finite");
 }
 
-picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request) {
-    checkPerson(graph, request.focus);
-    checkRequest(request);
+picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& asked) {
+    checkPerson(graph, asked.focus);
+    checkRequest(asked);
+    const std::vector<BoxSize> sizes = sizesByPlace(graph, asked);
+    ChartRequest request = asked;
+    if (!sizes.empty()) request.boxSizes = sizes;
     checkSizes(graph, request);
     picture::Picture picture = chartWithoutCounts(graph, request);
     picture::countFurtherParents(picture, graph);

@@ -22,7 +22,7 @@ OLVANE_API const char* nameOf(View view);
 // Fails: std::out_of_range for a focus (in the kinship view, another person) that the graph does not have;
 //        std::invalid_argument for sizes that are not between 0 and kLargestSize, numbers of generations or ways that
 //        are negative, an angle that is not finite, for boxSizes that are neither empty nor one for each
-//        person, and for the views family and pedigree, which the engine makes.
-OLVANE_API picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& request);
+//        person, or given beside sizedBoxes, and for the views family and pedigree, which the engine makes.
+OLVANE_API picture::Picture chartOf(const kin::KinGraph& graph, const ChartRequest& asked);
 
 }  // namespace olvane::charts

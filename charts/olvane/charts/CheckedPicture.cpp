@@ -44,6 +44,10 @@ void checkNumbers(const ChartRequest& chart) {
     require(chart.effort >= 0 && chart.effort <= 100, "effort is not between 0 and 100");
     require(isSize(sizes.boxWidth) && isSize(sizes.boxHeight) && isSize(sizes.gapX) && isSize(sizes.gapY),
             "a size is not between 0 and a million points");
+    for (const SizedBox& box : chart.sizedBoxes) {
+        require(isSize(box.size.width) && isSize(box.size.height),
+                "the size of a box is not between 0 and a million points");
+    }
     require(chart.aspect >= 0 && std::isfinite(chart.aspect), "aspect is below 0 or not finite");
     require(chart.boxSizes.empty(), "boxSizes are for a graph, not for a host");
 }

@@ -46,6 +46,16 @@ struct ChartSizes {
 struct BoxSize {
     float width = 0;
     float height = 0;
+
+    bool operator==(const BoxSize&) const = default;
+};
+
+// A person, by id, whose box has a size of its own.
+struct SizedBox {
+    std::int64_t person = 0;
+    BoxSize size;
+
+    bool operator==(const SizedBox&) const = default;
 };
 
 // Whom a fan shows around its middle.
@@ -75,6 +85,10 @@ struct ChartRequest {
     Direction direction = Direction::down;
     ChartSizes sizes;
     std::span<const BoxSize> boxSizes;
+    // Near, ancestors, descendants, hourglass, relatives, kinship, everybody: persons whose boxes are not of the usual
+    // size, where boxSizes is empty; read during the call only. Persons who are not in the family are passed over, and
+    // of two sizes for one person the last counts.
+    std::span<const SizedBox> sizedBoxes;
     // Family, pedigree: the engine's own options, but for the sizes; near: which relatives are shown.
     LayoutOptions layout;
     bool spouses = true;    // descendants, hourglass, relatives, fan of descendants

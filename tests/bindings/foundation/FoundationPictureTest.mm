@@ -155,6 +155,37 @@ TEST_F(FoundationPicture, leavesFoldedBranchesOutAndCountsThem) {
     EXPECT_EQ(0, folded.side);
 }
 
+TEST_F(FoundationPicture, hasBoxesOfTheirOwnSizes) {
+    const CaseFile input = family(kThreeGenerations);
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewHourglass];
+    [options setBoxWidth:30 height:20 ofPerson:17];
+    [options setBoxWidth:120 height:40 ofPerson:17];
+    options.aspect = 0.2;
+    ASSERT_EQ(2U, [options boxSizeCount]);
+    EXPECT_EQ(40, [options boxSizes][1].height);
+    OlvanePicture* picture = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                          focus:17
+                                                        options:options
+                                                          error:NULL];
+    ASSERT_TRUE(picture != nil);
+    const charts::SizedBox sized{17, {120, 40}};
+    charts::ViewRequest request;
+    request.chart.view = charts::View::hourglass;
+    request.chart.sizedBoxes = {&sized, 1};
+    request.chart.aspect = 0.2;
+    const auto expected = charts::pictureOfHost(std::make_shared<support::CaseManager>(input), 17, request);
+    EXPECT_EQ(olvane::picture::pictureJson(expected), [[picture json] UTF8String]);
+    EXPECT_EQ(120, expected.boxes.front().width);
+}
+
+TEST_F(FoundationPicture, refusesSizesOfBoxesThatAreNone) {
+    OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewHourglass];
+    [options setBoxWidth:-1 height:40 ofPerson:17];
+    NSError* error = errorOf(hostOf<CaseFoundationHost>(family(kThreeGenerations)), options);
+    EXPECT_EQ(OlvaneErrorInvalidArgument, [error code]);
+    EXPECT_NE(descriptionOf(error).find("size"), std::string::npos) << descriptionOf(error);
+}
+
 TEST_F(FoundationPicture, refusesABranchThatIsNone) {
     OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewHourglass];
     [options foldBranch:3 ofPerson:17];

@@ -230,6 +230,25 @@ class Views(unittest.TestCase):
                 asked = olvane.picture(Asked(family), 6, view, to=2)
                 self.assertEqual(places(expected), places(asked))
 
+    def test_haveBoxesOfTheirOwnSizes(self) -> None:
+        file = olvane.File(SAMPLE)
+        for view in ("near", "ancestors", "descendants", "hourglass", "relatives", "everybody"):
+            with self.subTest(view=view):
+                boxes = olvane.picture(file, 1, view, box_sizes={"I1": (120, 40.5), 2**31 - 1: (7, 7)}).boxes
+                self.assertEqual(
+                    [(120, 40.5) if box.id == 1 else (55, 80) for box in boxes],
+                    [(box.width, box.height) for box in boxes],
+                )
+        for size in ((-1, 40), (40, float("nan")), (2e6, 40)):
+            with self.assertRaises(ValueError):
+                olvane.picture(file, 1, "near", box_sizes={1: size})
+        with self.assertRaises(TypeError):
+            olvane.picture(file, 1, "near", box_sizes={1: ("wide", 40)})  # type: ignore[dict-item]
+        with self.assertRaises(ValueError):
+            olvane.picture(file, 1, "everybody", aspect=-1)
+        wide = olvane.picture(file, 1, "everybody", aspect=0.2)
+        self.assertLess(max(box.x for box in wide.boxes), max(b.x for b in olvane.picture(file, 1, "everybody").boxes))
+
     def test_haveBoxesOfTheSizeThatIsAskedFor(self) -> None:
         options = olvane.Options(sizes=olvane.Sizes(node_width=90, node_height=30, horz_padding=5, vert_padding=60))
         for view in VIEWS:

@@ -3,6 +3,7 @@
 
 // The picture of any view in C: of a table and of callbacks it is that of the library.
 
+#include <limits>
 #include <memory>
 #include <string>
 
@@ -293,6 +294,48 @@ TEST(CViews, foldBranchesAndAreMirrored) {
     EXPECT_EQ(arrays.folded[0].branch, 0);
     EXPECT_GT(arrays.folded[0].count, 1);
     options.folds = nullptr;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
+}
+
+TEST(CViews, haveBoxesOfTheirOwnSizesAndFoldForAPaper) {
+    const auto family = table();
+    const olvane_box_size sizes[] = {{7, 120, 40}, {1, 30, 90}};
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_ANCESTORS);
+    options.box_sizes = sizes;
+    options.box_size_count = 2;
+    options.aspect = 0.1;
+    olvane_picture* made = nullptr;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    const PicturePointer picture(made);
+    olvane::charts::ViewRequest request;
+    const olvane::charts::SizedBox sized[] = {{7, {120, 40}}, {1, {30, 90}}};
+    request.chart.view = olvane::charts::View::ancestors;
+    request.chart.sizedBoxes = sized;
+    request.chart.aspect = 0.1;
+    EXPECT_EQ(jsonOf(picture),
+              olvane::picture::pictureJson(olvane::charts::pictureOf(family->table, 7, request)));
+    olvane_picture_arrays arrays = {};
+    arrays.struct_size = sizeof arrays;
+    ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
+    EXPECT_EQ(arrays.boxes[0].id, 7);
+    EXPECT_EQ(arrays.boxes[0].width, 120);
+    EXPECT_EQ(arrays.boxes[0].height, 40);
+}
+
+TEST(CViews, refuseSizesOfBoxesThatAreNone) {
+    const auto family = table();
+    olvane_picture* made = nullptr;
+    const float none = std::numeric_limits<float>::quiet_NaN();
+    for (const olvane_box_size size : {olvane_box_size{7, -1, 40}, {7, 40, none}, {7, 2e6F, 40}}) {
+        olvane_picture_options options = optionsFor(OLVANE_PICTURE_ANCESTORS);
+        options.box_sizes = &size;
+        options.box_size_count = 1;
+        EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
+        options.box_sizes = nullptr;
+        EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
+    }
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_EVERYBODY);
+    options.aspect = std::numeric_limits<double>::infinity();
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
 }
 

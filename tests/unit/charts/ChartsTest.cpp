@@ -5,6 +5,7 @@
 
 #include <olvane/charts/Charts.h>
 #include <olvane/picture/Judge.h>
+#include <olvane/picture/PictureJson.h>
 
 #include <algorithm>
 #include <limits>
@@ -24,6 +25,7 @@ using olvane::picture::Line;
 using olvane::picture::LineRole;
 using olvane::picture::MarkKind;
 using olvane::picture::Picture;
+using olvane::picture::pictureJson;
 
 namespace {
 
@@ -701,6 +703,27 @@ TEST(Charts, takeAsManyGenerationsAsAnIntCanSay) {
     EXPECT_EQ(chartOf(family.graph(), request).boxes.size(), all);
 }
 
+TEST(Charts, takeSizesOfBoxesByIdAsByPlace) {
+    const KinFamily family{"Adam + Eva: Kain.m Abel.m"};
+    std::vector<BoxSize> sizes(static_cast<std::size_t>(family.graph().personCount()), {55, 80});
+    sizes[static_cast<std::size_t>(family["Kain"])] = {140, 30};
+    const std::int64_t kain = family.graph().id(family["Kain"]);
+    const SizedBox sized[] = {
+        {kain, {1, 1}}, {999, {7, 7}}, {kain, {140, 30}}};  // the last counts, 999 is nobody
+    for (const View view :
+         {View::near, View::descendants, View::hourglass, View::relatives, View::everybody}) {
+        ChartRequest byPlace = requestFor(view, family["Adam"]);
+        byPlace.boxSizes = sizes;
+        ChartRequest byId = requestFor(view, family["Adam"]);
+        byId.sizedBoxes = sized;
+        const Picture chart = chartOf(family.graph(), byId);
+        EXPECT_EQ(pictureJson(chart), pictureJson(chartOf(family.graph(), byPlace)));
+        for (const Box& box : chart.boxes) EXPECT_EQ(box.width, box.id == kain ? 140 : 55);
+        byId.boxSizes = sizes;
+        EXPECT_THROW(chartOf(family.graph(), byId), std::invalid_argument);
+    }
+}
+
 TEST(Charts, refuseSizesThatAreNone) {
     const KinFamily family{"Adam + Eva"};
     ChartRequest request = requestFor(View::descendants, 0);
@@ -711,5 +734,9 @@ TEST(Charts, refuseSizesThatAreNone) {
     request.sizes.boxWidth = 55;
     const std::vector<BoxSize> one(1);
     request.boxSizes = one;
+    EXPECT_THROW(chartOf(family.graph(), request), std::invalid_argument);
+    request.boxSizes = {};
+    const SizedBox narrow[] = {{family.graph().id(0), {-1, 80}}};
+    request.sizedBoxes = narrow;
     EXPECT_THROW(chartOf(family.graph(), request), std::invalid_argument);
 }

@@ -39,6 +39,12 @@ typedef struct OlvaneFold {
     int branch;
 } OlvaneFold;
 
+typedef struct OlvaneBoxSize {
+    int64_t personId;
+    float width;
+    float height;
+} OlvaneBoxSize;
+
 @class OlvanePicture;
 
 struct olvane_picture_options;  // of the C interface, whose header is not needed
@@ -49,6 +55,7 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 @interface OlvanePictureOptions : NSObject {
     struct olvane_picture_options* _options;
     NSMutableData* _folded;
+    NSMutableData* _boxSizes;
     OlvanePicture* _earlier;
 }
 
@@ -107,6 +114,17 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 - (void)unfoldBranch:(int)branch ofPerson:(int64_t)personId;
 - (const OlvaneFold*)folded;
 - (NSUInteger)foldedCount;
+
+// Near, ancestors, descendants, hourglass, relatives, kinship, everybody: whose boxes are not of the usual size, as they stand
+// on paper. Whoever is not in the family is passed over, and the last of two sizes for one person counts. The array
+// lives until the next size, and no longer than the options.
+- (void)setBoxWidth:(float)width height:(float)height ofPerson:(int64_t)personId;
+- (const OlvaneBoxSize*)boxSizes;
+- (NSUInteger)boxSizeCount;
+
+// Everybody, near, ancestors, descendants, hourglass, relatives: width by height of the paper that wide generations are
+// folded for; 0 for none.
+@property(nonatomic, assign) double aspect;
 
 @end
 
