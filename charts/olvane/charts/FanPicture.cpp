@@ -78,24 +78,11 @@ private:
         arc.to = cell.ring == 0 ? 360 : cell.to;
         const double inner = picture_.ringRadii[at(cell.ring)];
         const double outer = picture_.ringRadii[at(cell.ring) + 1];
-        // The corners, and where the outer edge meets an axis.
-        double left = outer, right = -outer, top = outer, bottom = -outer;
-        const auto include = [&](double degrees, double radius) {
-            const Point p = onCircle(degrees, radius);
-            left = std::min(left, p.x);
-            right = std::max(right, p.x);
-            top = std::min(top, p.y);
-            bottom = std::max(bottom, p.y);
-        };
-        for (const double degrees : {arc.from, arc.to}) {
-            include(degrees, inner);
-            include(degrees, outer);
-        }
-        for (double axis = std::ceil(arc.from / 90) * 90; axis <= arc.to; axis += 90) include(axis, outer);
-        box.x = left;
-        box.y = top;
-        box.width = static_cast<float>(right - left);
-        box.height = static_cast<float>(bottom - top);
+        const picture::CircleBounds bounds = picture::boundsOnCircle(arc.from, arc.to, inner, outer);
+        box.x = bounds.left;
+        box.y = bounds.top;
+        box.width = static_cast<float>(bounds.right - bounds.left);
+        box.height = static_cast<float>(bounds.bottom - bounds.top);
     }
 
     void countHidden(kin::Place person, picture::Box& box) const {

@@ -3,6 +3,7 @@
 
 #include <olvane/picture/Circle.h>
 
+#include <algorithm>
 #include <cmath>
 
 namespace olvane::picture {
@@ -34,6 +35,28 @@ double sineOfDegrees(double degrees) {
 
 CirclePoint onCircle(double degrees, double radius) {
     return {radius * sineOfDegrees(degrees), -radius * sineOfDegrees(degrees + 90)};
+}
+
+CircleBounds boundsOnCircle(double from, double to, double innerRadius, double outerRadius) {
+    constexpr double kMostTurns = 4 * 360;
+    if (!(std::abs(from) <= kMostTurns && to >= from && to - from <= 360)) {
+        return {-outerRadius, outerRadius, -outerRadius, outerRadius};
+    }
+    // The corners, and where the outer edge meets an axis.
+    CircleBounds bounds{outerRadius, -outerRadius, outerRadius, -outerRadius};
+    const auto include = [&bounds](double degrees, double radius) {
+        const CirclePoint p = onCircle(degrees, radius);
+        bounds.left = std::min(bounds.left, p.x);
+        bounds.right = std::max(bounds.right, p.x);
+        bounds.top = std::min(bounds.top, p.y);
+        bounds.bottom = std::max(bounds.bottom, p.y);
+    };
+    for (const double degrees : {from, to}) {
+        include(degrees, innerRadius);
+        include(degrees, outerRadius);
+    }
+    for (double axis = std::ceil(from / 90) * 90; axis <= to; axis += 90) include(axis, outerRadius);
+    return bounds;
 }
 
 }  // namespace olvane::picture

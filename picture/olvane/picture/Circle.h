@@ -17,4 +17,15 @@ struct CirclePoint {
 // The point at that angle, clockwise from the top, on a circle around (0, 0); y grows down.
 CirclePoint onCircle(double degrees, double radius);
 
+struct CircleBounds {
+    double left = 0;
+    double right = 0;
+    double top = 0;
+    double bottom = 0;
+};
+
+// Around a piece of a ring, in degrees from `from` clockwise to `to`, which is at most a whole turn more. Else, and for angles
+// of more than four turns, all of the ring.
+CircleBounds boundsOnCircle(double from, double to, double innerRadius, double outerRadius);
+
 }  // namespace olvane::picture

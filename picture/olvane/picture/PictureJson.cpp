@@ -17,20 +17,26 @@ namespace olvane::picture {
 
 namespace {
 
-constexpr double kDecimals = 1000;
-constexpr double kMostThousandths = 9e18;
+// Points in thousandths. A cell in ring 25 may have a hundred-thousandth of a degree, so angles have more decimals.
+constexpr std::int64_t kPartsOfPoint = 1000;
+constexpr std::int64_t kPartsOfDegree = 1'000'000'000'000;
+constexpr double kMostParts = 9e18;
 constexpr std::size_t kPieceBytes = 64 * 1024;
 
-// Rounded to thousandths, without trailing zeros; what is not finite is 0.
-std::string number(double value) {
-    const double thousandths = std::round(value * kDecimals);
-    if (!(std::abs(thousandths) < kMostThousandths)) return "0";
-    const auto whole = static_cast<std::int64_t>(thousandths);
+// Rounded to such parts of one, a power of ten, without trailing zeros; what is not finite is 0.
+std::string numberIn(double value, std::int64_t partsOfOne) {
+    const double parts = std::round(value * static_cast<double>(partsOfOne));
+    if (!(std::abs(parts) < kMostParts)) return "0";
+    const auto whole = static_cast<std::int64_t>(parts);
     const std::int64_t positive = whole < 0 ? -whole : whole;
-    std::string text = (whole < 0 ? "-" : "") + std::to_string(positive / 1000);
-    std::string decimals = std::to_string(positive % 1000 + 1000).substr(1);
+    std::string text = (whole < 0 ? "-" : "") + std::to_string(positive / partsOfOne);
+    std::string decimals = std::to_string(positive % partsOfOne + partsOfOne).substr(1);
     while (!decimals.empty() && decimals.back() == '0') decimals.pop_back();
     return decimals.empty() ? text : text + "." + decimals;
+}
+
+std::string number(double value) {
+    return numberIn(value, kPartsOfPoint);
 }
 
 std::string quoted(std::string_view text) {
@@ -53,6 +59,10 @@ std::string placesJson(std::span<const Index> places) {
 
 std::string field(std::string_view name, double value) {
     return ", \"" + std::string(name) + "\": " + number(value);
+}
+
+std::string angle(std::string_view name, double degrees) {
+    return ", \"" + std::string(name) + "\": " + numberIn(degrees, kPartsOfDegree);
 }
 
 class PictureWriter {
@@ -142,7 +152,7 @@ private:
         std::string json = "{\"id\": " + std::to_string(box.id) + ", \"kind\": " + quoted(nameOf(box.kind));
         if (picture_.isRound()) {
             const Arc& arc = picture_.arcs[i];
-            json += ", \"ring\": " + std::to_string(arc.ring) + field("from", arc.from) + field("to", arc.to);
+            json += ", \"ring\": " + std::to_string(arc.ring) + angle("from", arc.from) + angle("to", arc.to);
             if (arc.line != kNone) json += ", \"line\": " + std::to_string(arc.line);
         } else {
             json += field("x", box.x) + field("y", box.y) + field("width", static_cast<double>(box.width)) +

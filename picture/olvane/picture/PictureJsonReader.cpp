@@ -11,6 +11,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include <olvane/picture/Circle.h>
 #include <olvane/picture/PictureNames.h>
 
 namespace olvane::picture {
@@ -183,6 +184,19 @@ private:
         }
         picture_.middleX = numberAt(json, "middleX");
         picture_.middleY = numberAt(json, "middleY");
+        for (std::size_t i = 0; i < picture_.arcs.size(); ++i) setPlace(picture_.boxes[i], picture_.arcs[i]);
+    }
+
+    // A box of a round chart says where it stands by its ring alone.
+    void setPlace(Box& box, const Arc& arc) const {
+        if (arc.ring < 0 || static_cast<std::size_t>(arc.ring) + 1 >= picture_.ringRadii.size()) return;
+        const auto ring = static_cast<std::size_t>(arc.ring);
+        const CircleBounds bounds =
+            boundsOnCircle(arc.from, arc.to, picture_.ringRadii[ring], picture_.ringRadii[ring + 1]);
+        box.x = picture_.middleX + bounds.left;
+        box.y = picture_.middleY + bounds.top;
+        box.width = static_cast<float>(bounds.right - bounds.left);
+        box.height = static_cast<float>(bounds.bottom - bounds.top);
     }
 
     void readBox(const Json& json) {

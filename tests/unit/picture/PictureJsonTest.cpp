@@ -108,6 +108,8 @@ TEST(PictureJson, aRoundChartHasRingsInsteadOfPlaces) {
     EXPECT_EQ(json["boxes"][0]["ring"], 2);
     EXPECT_EQ(json["boxes"][0]["to"], 22.5);
     EXPECT_FALSE(json["boxes"][0].contains("x"));
+    picture.arcs[0] = {25, 180 - 1e-5, 180 - 3e-9};  // so thin a cell is still one
+    EXPECT_THAT(pictureJson(picture), HasSubstr("\"from\": 179.99999, \"to\": 179.999999997"));
     EXPECT_TRUE(readPictureJson(json.dump()).isRound());
 }
 
@@ -117,6 +119,23 @@ TEST(PictureJson, numbersThatAreNoneAreZero) {
     picture.boxes[0].x = std::numeric_limits<double>::infinity();
     picture.boxes[0].y = std::numeric_limits<double>::quiet_NaN();
     EXPECT_THAT(pictureJson(picture), HasSubstr("\"x\": 0, \"y\": 0"));
+}
+
+TEST(PictureJsonReader, placesBoxesOfARoundChartByTheirRings) {
+    const Picture picture =
+        readPictureJson(R"({"format": 2, "rings": [0, 10, 30], "middleX": 100, "middleY": 50,
+        "boxes": [{"id": 1, "ring": 0, "from": 0, "to": 360}, {"id": 2, "ring": 1, "from": 0, "to": 90},
+                  {"id": 3, "ring": 1, "from": -90, "to": 90}, {"id": 4, "ring": 1, "from": 0, "to": 1e11},
+                  {"id": 5, "ring": 2, "from": 0, "to": 90}]})");
+    const double places[5][4] = {
+        {90, 40, 20, 20}, {100, 20, 30, 30}, {70, 20, 60, 30}, {70, 20, 60, 60}, {0, 0, 0, 0}};
+    for (std::size_t i = 0; i < 5; ++i) {
+        const Box& box = picture.boxes[i];
+        EXPECT_NEAR(box.x, places[i][0], 1e-6) << i;
+        EXPECT_NEAR(box.y, places[i][1], 1e-6) << i;
+        EXPECT_NEAR(static_cast<double>(box.width), places[i][2], 1e-6) << i;
+        EXPECT_NEAR(static_cast<double>(box.height), places[i][3], 1e-6) << i;
+    }
 }
 
 TEST(PictureJsonReader, refusesWhatIsNoPicture) {
