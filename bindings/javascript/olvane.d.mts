@@ -395,11 +395,15 @@ export interface PictureFamily {
     readonly label: PictureLabel | null;
 }
 
-/** Above and below its line a text has its middle at x, to the right it begins there, 0.4 of its size away. */
+/** A place on a marriage line, and where the text of the size that was asked for stands. */
 export interface PictureLabel {
     readonly x: number;
     readonly y: number;
     readonly side: "above" | "below" | "right";
+    /** The middle of the text above and below its line, its beginning to the right. */
+    readonly textX: number;
+    /** Of its baseline. */
+    readonly textY: number;
 }
 
 /** What is expressed without a line; the boxes of one number belong together. */

@@ -36,7 +36,8 @@ function boxAt(n, at, index) {
 
 function labelAt(n, at) {
     const side = LABEL_SIDES[n[at + 2]];
-    return side === undefined || side === "none" ? null : { x: n[at], y: n[at + 1], side };
+    if (side === undefined || side === "none") return null;
+    return { x: n[at], y: n[at + 1], side, textX: n[at + 3], textY: n[at + 4] };
 }
 
 function familyAt(n, at, members, lines, label) {
@@ -122,7 +123,7 @@ export function pictureFrom(view, numbers, texts) {
     place("wayBoxes", wayBoxCount, 1);
     place("pieces", pieceCount, 4);
     place("folded", foldedCount, 4);
-    place("labels", familyCount, 3); // where they were asked for
+    place("labels", familyCount, 5); // where they were asked for
     const list = (name, count, size, make) =>
         Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
     const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
@@ -144,7 +145,7 @@ export function pictureFrom(view, numbers, texts) {
                 ? null
                 : { radii: Array.from(numbers.subarray(starts.rings, starts.rings + ringCount)), middleX, middleY },
         families: list("families", familyCount, 7, (start, index) =>
-            familyAt(numbers, start, members, lines, labelAt(numbers, starts.labels + 3 * index)),
+            familyAt(numbers, start, members, lines, labelAt(numbers, starts.labels + 5 * index)),
         ),
         marks: list("marks", markCount, 5, (start) => markAt(numbers, start)),
         folded: list("folded", foldedCount, 4, (start) => ({

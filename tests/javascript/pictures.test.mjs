@@ -117,6 +117,11 @@ test("a family has a place for the year of its marriage, where one is asked for"
         });
         assert.equal(on.length > 0, marriageOf(family).length > 0);
     }
+    for (const { label } of labelled) {
+        if (label === null) continue;
+        assert.equal(label.side, "above");
+        assert.deepEqual([label.textX, label.textY], [label.x, label.y - 2]);
+    }
     for (const { label } of file.picture(1).families) assert.equal(label, null);
     for (const { label } of file.picture(1, { view: "fan", labelSize: 5 }).families) assert.equal(label, null);
     assert.throws(() => file.picture(1, { labelSize: -1 }), RangeError);

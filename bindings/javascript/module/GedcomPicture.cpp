@@ -38,15 +38,19 @@ using js::OpenFile;
 // With the words of a kinship in last_text, and behind its numbers a place for each family's label where labels are asked for. Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* file, std::int32_t focus) {
     std::vector<picture::LabelPlace> labels;
+    double labelSize = 0;
     const auto make = [&] {
         const js::PictureRequest asked = js::requestOf(focus - 1);
         picture::Picture picture = js::pictureOf(*file, asked);
-        if (asked.labelSize > 0) labels = picture::marriageLabelPlaces(picture, asked.labelSize);
+        labelSize = asked.labelSize;
+        if (labelSize > 0) labels = picture::marriageLabelPlaces(picture, labelSize);
         return picture;
     };
-    return js::pictureAnswer(make, [&labels](std::vector<double>& numbers) {
+    return js::pictureAnswer(make, [&](std::vector<double>& numbers) {
         for (const picture::LabelPlace& label : labels) {
-            numbers.insert(numbers.end(), {label.x, label.y, static_cast<double>(label.side)});
+            const picture::LabelOffset offset = picture::labelOffsetOf(label.side, labelSize);
+            numbers.insert(numbers.end(), {label.x, label.y, static_cast<double>(label.side),
+                                           label.x + offset.x, label.y + offset.y});
         }
     });
 }

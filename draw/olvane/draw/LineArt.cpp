@@ -31,8 +31,6 @@ using picture::LineRole;
 constexpr double kLineWidth = 1.6;
 constexpr double kBridge = 4;  // px, the radius of a jump
 constexpr double kLabelSize = 9.5;
-constexpr double kLabelRise =
-    picture::kLabelHeight * kLabelSize;  // px, of a digit above the line it stands on
 
 LineStyle styleOf(kin::UnionState state) {
     switch (state) {
@@ -159,11 +157,9 @@ private:
         const std::string text = cleanText(cutText(content_.familyLabelOf(family.number)));
         if (text.empty() || place.side == LabelSide::none) return;
         const bool isBeside = place.side == LabelSide::right;
-        constexpr double kLift = picture::kLabelGap * kLabelSize;
-        const double x = frame_.x(place.x) + (isBeside ? kLift : 0);
-        const double y = frame_.y(place.y) + (isBeside                         ? kLabelSize / 3
-                                              : place.side == LabelSide::above ? -kLift
-                                                                               : kLift + kLabelRise);
+        const picture::LabelOffset offset = picture::labelOffsetOf(place.side, kLabelSize);
+        const double x = frame_.x(place.x) + offset.x;
+        const double y = frame_.y(place.y) + offset.y;
         svg_.text.add(kLabelSize);
         put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\"",
             (isBeside ? "" : " text-anchor=\"middle\""), " font-size=\"", number(kLabelSize), "\" fill=\"",

@@ -236,4 +236,19 @@ std::vector<LabelPlace> marriageLabelPlaces(const Picture& picture, double size)
     return LabelPlacing(picture, size).place();
 }
 
+LabelOffset labelOffsetOf(LabelSide side, double size) {
+    const double gap = kLabelGap * size;
+    switch (side) {
+        case LabelSide::above:
+            return {0, -gap};
+        case LabelSide::below:
+            return {0, gap + kLabelHeight * size};
+        case LabelSide::right:
+            return {gap, size / 3};
+        case LabelSide::none:
+            break;
+    }
+    return {};
+}
+
 }  // namespace olvane::picture

@@ -28,6 +28,14 @@ constexpr double kLabelWidth = 2.8;
 constexpr double kLabelHeight = 0.75;
 constexpr double kLabelGap = 0.4;
 
+// From a place to where the text's baseline begins, or above and below a line has its middle; in the unit of size.
+struct LabelOffset {
+    double x = 0;
+    double y = 0;
+};
+
+OLVANE_API LabelOffset labelOffsetOf(LabelSide side, double size);
+
 // A place for each family of the picture: over the middle of its longest level marriage line, or beside an upright one.
 // Where somebody has several marriages, whose lines run side by side, the place is the first at the line where the text
 // covers neither box nor line nor the year of another such marriage; where there is none, the one that covers least.

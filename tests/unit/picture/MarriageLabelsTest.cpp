@@ -188,4 +188,15 @@ TEST(MarriageLabels, coverALineRatherThanAnotherYear) {
     }
 }
 
+// Digits of 10 are 7.5 high and stay 4 away from their line; beside one, their middle is about at its place.
+TEST(MarriageLabels, haveABaselineThatLeavesAGapToTheLine) {
+    using olvane::picture::labelOffsetOf;
+    EXPECT_EQ(labelOffsetOf(LabelSide::above, 10).x, 0);
+    EXPECT_DOUBLE_EQ(labelOffsetOf(LabelSide::above, 10).y, -4);
+    EXPECT_EQ(labelOffsetOf(LabelSide::below, 10).x, 0);
+    EXPECT_DOUBLE_EQ(labelOffsetOf(LabelSide::below, 10).y, 11.5);
+    EXPECT_DOUBLE_EQ(labelOffsetOf(LabelSide::right, 10).x, 4);
+    EXPECT_DOUBLE_EQ(labelOffsetOf(LabelSide::right, 10).y, 10.0 / 3);
+}
+
 }  // namespace

@@ -31,15 +31,9 @@ export function drawFamily({ index, family }: FamilyLines, label: string): SVGGE
 }
 
 // Where the picture has room for it.
-function appendLabel(group: SVGGElement, { x, y, side }: PictureLabel, label: string): void {
-    const gap = 0.4 * kLabelSize;
-    const isBeside = side === "right";
-    const place = {
-        x: x + (isBeside ? gap : 0),
-        y: y + (isBeside ? kLabelSize / 3 : side === "above" ? -gap : gap + 0.75 * kLabelSize),
-    };
-    const kind = isBeside ? "marriage-label upright" : "marriage-label";
-    group.append(svg("text", { class: kind, "font-size": kLabelSize, ...place }, label));
+function appendLabel(group: SVGGElement, { side, textX, textY }: PictureLabel, label: string): void {
+    const kind = side === "right" ? "marriage-label upright" : "marriage-label";
+    group.append(svg("text", { class: kind, "font-size": kLabelSize, x: textX, y: textY }, label));
 }
 
 function pathOf({ x1, y1, x2, y2, bridges }: PictureLine): string {
