@@ -9,7 +9,7 @@ import { Instance } from "./instance.mjs";
 import { refuseNested, runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
-import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers } from "./pictureOptions.mjs";
+import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers, usualBoxesFrom } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { searchWith } from "./search.mjs";
@@ -220,6 +220,10 @@ export class GedcomFile {
         if (answer === 0) this.#refuse();
         const numbers = new Int32Array(exports.memory.buffer, answer >>> 0, 6);
         return BRANCHES.map((branch, i) => ({ branch, count: numbers[2 * i], side: SIDES[numbers[2 * i + 1]] }));
+    }
+
+    usualBoxes(view = "family", direction = "down") {
+        return usualBoxesFrom(this.#instance, view, direction);
     }
 
     takePlacesOf(earlier) {

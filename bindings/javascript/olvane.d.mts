@@ -747,6 +747,8 @@ export class GedcomFile {
      * would hide.
      */
     branches(focus: number, person: number, options?: PictureOptions): readonly BranchSize[];
+    /** The form of a view's boxes where nobody chose. Throws TypeError for another word. */
+    usualBoxes(view?: PictureView, direction?: NonNullable<PictureOptions["direction"]>): "tall" | "wide";
     /**
      * This file is a later version of another, which is open still: its next picture with keepPlaces keeps the places of
      * the other's last one, for all persons who have the same xref in both. False where there is no such picture.

@@ -111,6 +111,12 @@ export function factBits(show) {
     return [...show].reduce((bits, fact) => bits | (1 << wordNumber("show", fact, FACTS)), 0);
 }
 
+/** The form of boxes where nobody chose, by what usual_boxes says. */
+export function usualBoxesFrom({ exports }, view, direction) {
+    const numbers = [wordNumber("view", view, PICTURE_VIEWS), wordNumber("direction", direction, DIRECTIONS)];
+    return BOXES[exports.usual_boxes(...numbers)];
+}
+
 /** What a caller asks of a drawing, as the module's numbers. */
 export function drawingNumbers({ theme = "light", boxes = "usual", show = [], title = "", ...rest }) {
     const unknown = Object.keys(rest)[0];

@@ -127,6 +127,19 @@ test("a family has a place for the year of its marriage, where one is asked for"
     assert.throws(() => file.picture(1, { labelSize: -1 }), RangeError);
 });
 
+test("the usual boxes are wide in the pedigree and where a chart lies sideways", () => {
+    assert.equal(file.usualBoxes(), "tall");
+    for (const direction of ["left", "right", "up", "down"]) {
+        const sideways = direction === "left" || direction === "right" ? "wide" : "tall";
+        for (const view of PICTURE_VIEWS) {
+            const usual = { family: "tall", fan: "tall", pedigree: "wide" }[view] ?? sideways;
+            assert.equal(file.usualBoxes(view, direction), usual, `${view} ${direction}`);
+        }
+    }
+    assert.throws(() => file.usualBoxes("tower"), /takes one of family/);
+    assert.throws(() => file.usualBoxes("near", "north"), /takes one of down/);
+});
+
 test("everybody keeps the places of the picture before, where that is asked for", () => {
     const larger = family
         .replace("1 CHIL @I4@\n", "1 CHIL @I7@\n1 CHIL @I4@\n")

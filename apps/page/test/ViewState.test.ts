@@ -123,25 +123,28 @@ test("facts are named in any order and kept in that of the switches", () => {
 
 test("boxes are higher by a line for each fact that they show, and wider apart for years of marriages", () => {
     assert.equal(factHeight(new Set(["dates", "places", "occupation", "marriage"])), 4 * 14);
-    const plain = optionsOf(usual);
-    const shown = optionsOf({ ...usual, show: new Set(["places", "marriage"]) });
+    const plain = optionsOf(usual, "tall");
+    const shown = optionsOf({ ...usual, show: new Set(["places", "marriage"]) }, "tall");
     assert.equal(shown.height! - plain.height!, 28);
     assert.equal(shown.gapX! - plain.gapX!, 12);
-    assert.equal(optionsOf({ ...usual, photos: true }).height! - plain.height!, 32);
+    assert.equal(optionsOf({ ...usual, photos: true }, "tall").height! - plain.height!, 32);
 });
 
-test("charts that lie sideways and pedigrees have wide boxes", () => {
-    const isWide = (change: Partial<ViewState>) => {
-        const { width, height } = optionsOf({ ...usual, ...change });
+test("boxes have the form that the module names", () => {
+    const isWide = (view: ViewState["view"], boxes: "tall" | "wide") => {
+        const { width, height } = optionsOf({ ...usual, view }, boxes);
         return width! > 3 * height!;
     };
-    assert.ok(isWide({ view: "pedigree" }) && isWide({ view: "descendants", direction: "left" }));
-    assert.ok(!isWide({ view: "descendants" }) && !isWide({ view: "family", direction: "left" }));
+    assert.ok(isWide("pedigree", "wide") && isWide("descendants", "wide"));
+    assert.ok(!isWide("descendants", "tall") && !isWide("family", "tall"));
 });
 
 test("a group of relatives that is switched off is a bit that is not set", () => {
-    assert.equal(optionsOf(usual).shown, 0xff);
-    assert.equal(optionsOf({ ...usual, hidden: new Set(["cousins", "grandchildren"]) }).shown, 0xff & ~0x02 & ~0x20);
+    assert.equal(optionsOf(usual, "tall").shown, 0xff);
+    assert.equal(
+        optionsOf({ ...usual, hidden: new Set(["cousins", "grandchildren"]) }, "tall").shown,
+        0xff & ~0x02 & ~0x20,
+    );
 });
 
 test("several families of parents follow one another, beginning after those by birth", () => {

@@ -161,6 +161,13 @@ const char* refusal() {
 
 using namespace olvane;
 
+// One of Boxes: what they are where nobody chose. view and direction are numbers of the picture's options.
+OLVANE_EXPORT("usual_boxes") int usualBoxes(int view, int direction) {
+    const auto form =
+        charts::usualBoxForm(static_cast<charts::View>(view), static_cast<charts::Direction>(direction));
+    return static_cast<int>(form == charts::BoxForm::tall ? js::Boxes::tall : js::Boxes::wide);
+}
+
 // With the picture's options, sizes apart; boxes is one of Boxes. Where part names boxes
 // by their places, "3 4 7", the picture ends around them.
 // Null for a picture that is refused; last_text then says why.

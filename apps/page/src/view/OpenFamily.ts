@@ -46,7 +46,7 @@ export class OpenFamily {
 
     // Throws LayoutError.
     picture(state: ViewState, reader: Reader): Picture {
-        const options = keeping(optionsOf(state, reader));
+        const options = keeping(this.optionsOf(state, reader));
         const labelSize = state.show.has("marriage") ? kLabelSize : 0;
         const values = this.file.picture(state.focus, { ...options, labelSize });
         return new Picture(state.view, state.direction, state.focus, values, options.mirrored);
@@ -54,17 +54,22 @@ export class OpenFamily {
 
     // What hangs from a person in the picture. Throws LayoutError.
     branches(state: ViewState, person: number, reader: Reader): readonly BranchSize[] {
-        return this.file.branches(state.focus, person, optionsOf(state, reader));
+        return this.file.branches(state.focus, person, this.optionsOf(state, reader));
     }
 
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     // part names boxes by their index, around which the drawing ends.
     svg(state: ViewState, theme: DrawingTheme, reader: Reader, part?: DrawingOptions["part"]): string {
-        return this.file.svg(state.focus, keeping(optionsOf(state, reader)), { theme, show: state.show, part });
+        return this.file.svg(state.focus, keeping(this.optionsOf(state, reader)), { theme, show: state.show, part });
     }
 
     sheets(state: ViewState, paper: PaperOptions, reader: Reader): PaperSheets {
-        return this.file.sheets(state.focus, optionsOf(state, reader), { theme: "print", show: state.show }, paper);
+        return this.file.sheets(
+            state.focus,
+            this.optionsOf(state, reader),
+            { theme: "print", show: state.show },
+            paper,
+        );
     }
 
     // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.
@@ -116,6 +121,10 @@ export class OpenFamily {
     close(): void {
         this.photographs.close();
         this.file.close();
+    }
+
+    private optionsOf(state: ViewState, reader: Reader): PictureOptions {
+        return optionsOf(state, this.file.usualBoxes(state.view, state.direction), reader);
     }
 
     // Two generations up and down and across, with parents worth most: a picture with all its parts.

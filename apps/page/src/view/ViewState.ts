@@ -101,13 +101,16 @@ export interface Reader {
     readonly rightToLeft?: boolean;
 }
 
-/** What to ask of the module for a state. */
-export function optionsOf(state: ViewState, { language = "en", rightToLeft = false }: Reader = {}): PictureOptions {
+/** What to ask of the module for a state; boxes is the form of its view's boxes, which the module knows. */
+export function optionsOf(
+    state: ViewState,
+    boxes: "tall" | "wide",
+    { language = "en", rightToLeft = false }: Reader = {},
+): PictureOptions {
     const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact } = state;
     const { folded, mirrored } = state;
-    const isSideways = hasDirection(view) && (direction === "left" || direction === "right");
     const tall = state.photos ? kTallWithPhoto : kTall;
-    const sizes = view === "pedigree" ? kPedigree : isSideways ? kWide : tall;
+    const sizes = view === "pedigree" ? kPedigree : boxes === "wide" ? kWide : tall;
     return {
         ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact, language },
         shown: shownBits(state),
