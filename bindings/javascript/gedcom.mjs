@@ -148,6 +148,10 @@ export class GedcomFile {
         return this.#answer("gedcom_person_facts", id).map(factFrom);
     }
 
+    parentFamilyOf(id) {
+        return this.#instance.exports.gedcom_parent_family(this.#opened(), this.#person(id));
+    }
+
     factsOfFamily(id) {
         return this.#answer("gedcom_family_facts", id).map(factFrom);
     }

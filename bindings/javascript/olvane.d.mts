@@ -714,6 +714,8 @@ export class GedcomFile {
     /** Everything that the file states of a person, in its order. */
     factsOfPerson(id: number): readonly Fact[];
     factsOfFamily(id: number): readonly Fact[];
+    /** The one of a person's parentFamilies that father and mother come from; 0 for none. RangeError for nobody. */
+    parentFamilyOf(id: number): number;
     /** What drawings with these facts say in the box of a person; GedcomError for nobody. */
     labelOfPerson(id: number, show?: Iterable<ShownFact>): PersonLabel;
     /** What they say at the marriage line of a family; empty for nothing. */

@@ -355,3 +355,21 @@ function utf16(ascii, isLittle) {
         new Uint8Array(2 * ascii.length),
     );
 }
+
+test("the usual family of parents is that by birth, wherever it stands in the record", () => {
+    const links = (...families) =>
+        families.map(([xref, pedigree]) => `1 FAMC @${xref}@\n2 PEDI ${pedigree}\n`).join("");
+    const text =
+        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n" +
+        "0 @I1@ INDI\n1 FAMS @F1@\n1 FAMS @F2@\n" +
+        `0 @I2@ INDI\n${links(["F1", "adopted"], ["F2", "birth"])}` +
+        `0 @I3@ INDI\n${links(["F2", "foster"], ["F1", "adopted"])}` +
+        "0 @F1@ FAM\n1 HUSB @I1@\n1 CHIL @I2@\n1 CHIL @I3@\n" +
+        "0 @F2@ FAM\n1 HUSB @I1@\n1 CHIL @I2@\n1 CHIL @I3@\n0 TRLR\n";
+    const file = olvane.readGedcom(bytesOf(text), "two.ged");
+    assert.deepEqual(
+        [1, 2, 3].map((id) => file.parentFamilyOf(id)),
+        [0, 2, 2],
+    );
+    assert.throws(() => file.parentFamilyOf(4), RangeError);
+});

@@ -147,13 +147,13 @@ test("a group of relatives that is switched off is a bit that is not set", () =>
     );
 });
 
-test("several families of parents follow one another, beginning after those by birth", () => {
+test("several families of parents follow one another, beginning after the usual one", () => {
     const di = persons[3]!;
-    const first = withNextParents(di, usual);
+    const first = withNextParents(di, 2, usual);
     assert.deepEqual(first, { focus: 4, parentsOf: 4, parentFamily: 5 });
-    const second = withNextParents(di, { ...usual, ...first });
+    const second = withNextParents(di, 2, { ...usual, ...first });
     assert.equal(second.parentFamily, 1);
-    assert.equal(withNextParents(di, { ...usual, ...second }).parentFamily, 2);
+    assert.equal(withNextParents(di, 2, { ...usual, ...second }).parentFamily, 2);
 });
 
 test("states are the same when all that they say is", () => {

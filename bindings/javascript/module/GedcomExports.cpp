@@ -197,6 +197,12 @@ OLVANE_EXPORT("gedcom_person_facts") const char* gedcomPersonFacts(const OpenFil
     return js::textOrRefusal([&] { return js::factsText(file->data.factsOfPerson(id)); });
 }
 
+// Whose partners are the person's father and mother; 0 for none and for nobody.
+OLVANE_EXPORT("gedcom_parent_family")
+std::uint32_t gedcomParentFamily(const OpenFile* file, std::uint32_t id) {
+    return file->data.hasPerson(id) ? file->data.person(id).parentFamily : 0;
+}
+
 OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFile* file, std::uint32_t id) {
     return js::textOrRefusal([&] { return js::factsText(file->data.factsOfFamily(id)); });
 }

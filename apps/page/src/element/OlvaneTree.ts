@@ -344,8 +344,10 @@ export class OlvaneTree extends HTMLElement {
 
     // The next of several families of parents, with their child in the middle.
     private showFurtherParents(box: Box): void {
-        const person = this.opened?.person(box.person);
-        if (person && this.shownState) this.show(withNextParents(person, this.shownState), box, true);
+        const { opened, shownState } = this;
+        const person = opened?.person(box.person);
+        if (!opened || !person || !shownState) return;
+        this.show(withNextParents(person, opened.file.parentFamilyOf(person.id), shownState), box, true);
     }
 
     // Folds a branch or unfolds it, in place; the keys stay on the box.

@@ -289,11 +289,10 @@ function foldsIn(text: string, persons: readonly Person[]): Fold[] {
         .filter(({ person, branch }) => person > 0 && kBranches.includes(branch));
 }
 
-/** The state in which the person stands in the middle with the next of several families of parents. */
-export function withNextParents(person: Person, state: ViewState): Partial<ViewState> {
+/** The state in which the person stands in the middle with the next of several families of parents; usual is the file's. */
+export function withNextParents(person: Person, usual: number, state: ViewState): Partial<ViewState> {
     const families = person.parentFamilies.map(({ family }) => family);
-    const byBirth = person.parentFamilies.find(({ pedigree }) => pedigree === "birth" || pedigree === "notGiven");
-    const present = state.parentsOf === person.id ? state.parentFamily : (byBirth?.family ?? families[0] ?? 0);
+    const present = state.parentsOf === person.id ? state.parentFamily : usual;
     const next = families[(families.indexOf(present) + 1) % families.length] ?? 0;
     return { focus: person.id, parentsOf: person.id, parentFamily: next };
 }
