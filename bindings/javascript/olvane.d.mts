@@ -323,6 +323,8 @@ export interface Texts {
     fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
     /** Whether the first letter that has a direction is of a script that runs from right to left. */
     runsRightToLeft(text: string): boolean;
+    /** Of each text the words as searches compare them, small and without accents and apostrophes, with a space between. */
+    foldedWords(texts: Iterable<string>): string[];
 }
 
 /** A place in one of the lists of a picture. */

@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Measures and fits texts as the module's pictures do, so that a screen breaks lines where a file does.
+// Measures and fits texts as the module's pictures do, so that a screen breaks lines where a file does, and folds them
+// as its searches do.
 
 const MOST_REMEMBERED = 20000;
 
@@ -48,6 +49,14 @@ export class Texts {
         return this.#remembered(`d/${text}`, () =>
             this.#instance.withText(text, (pointer) => this.#instance.exports.runs_right_to_left(pointer) !== 0),
         );
+    }
+
+    foldedWords(texts) {
+        const lines = Array.from(texts, (text) => text.replace(/[\n\0]/g, " "));
+        if (lines.length === 0) return [];
+        return this.#instance
+            .withText(lines.join("\n"), (pointer) => this.#answer(this.#instance.exports.folded_words(pointer)))
+            .split("\n");
     }
 
     #answer(pointer) {

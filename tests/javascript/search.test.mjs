@@ -121,3 +121,12 @@ test("a limit is kept, and nothing typed is nobody", () => {
     assert.equal(file.search("").length, 0);
     assert.equal(file.search("\u0000").length, 0);
 });
+
+test("words are folded outside of a search as in it", () => {
+    const { texts } = olvane;
+    const written = ["  Łukasz O’Brien-STRASSE, Straße é", "", "1819", " ,.! ", "two\nlines"];
+    const folded = ["lukasz obrien strasse strasse e", "", "1819", "", "two lines"];
+    assert.deepEqual(texts.foldedWords(written), folded);
+    assert.deepEqual(texts.foldedWords([""]), [""]);
+    assert.deepEqual(texts.foldedWords([]), []);
+});

@@ -1,11 +1,14 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Measuring and fitting of texts, as pictures have it. The module's texts are cut first, as in a picture.
+// Measuring and fitting of texts, as pictures have it; those texts are cut first, as in a picture. And their folding.
 
+#include <cstddef>
 #include <exception>
 #include <string>
+#include <string_view>
 
+#include <olvane/kin/Folding.h>
 #include <olvane/picture/TextFit.h>
 
 #include "OpenFile.h"
@@ -65,6 +68,25 @@ OLVANE_EXPORT("runs_right_to_left") int runsRightToLeft(const char* text) {
     } catch (const std::exception&) {
         return 0;
     }
+}
+
+// Of each line the words that a search compares, with a space between.
+OLVANE_EXPORT("folded_words") const char* foldedWords(const char* text) {
+    return answered([&] {
+        std::string folded;
+        std::string_view rest = text;
+        for (;;) {
+            const std::size_t end = rest.find('\n');
+            const char* between = "";
+            for (const kin::FoldedWord& word : kin::foldedWords(rest.substr(0, end))) {
+                folded.append(between).append(word.folded);
+                between = " ";
+            }
+            if (end == std::string_view::npos) return folded;
+            folded += '\n';
+            rest.remove_prefix(end + 1);
+        }
+    });
 }
 
 OLVANE_EXPORT("font_families") const char* fontFamilies() {

@@ -100,10 +100,10 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         await visit.end();
     });
 
-    test("somebody found by name is flown to", async () => {
+    test("somebody found by name, whatever the accents, is flown to", async () => {
         const visit = await visitMap(darwins().path);
         const before = await visit.hash();
-        await visit.page.fill("#search", "josiah 1730");
+        await visit.page.fill("#search", "JÓSIAH 1730");
         await visit.page.press("#search", "Enter");
         assert.match(await chosen(visit), /Josiah/);
         await visit.page.waitForFunction((old) => location.hash !== old, before);

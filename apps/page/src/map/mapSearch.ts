@@ -2,33 +2,39 @@
 // SPDX-License-Identifier: MIT
 
 // Finds persons of a map by the beginnings of words of their names, in any order, and by years. Each text is folded
-// to small letters without accents once, however many bear it.
+// once, however many bear it.
 
 import type { FamilyMap } from "./FamilyMap";
 
-const kMarks = /\p{M}/gu;
-const kBetweenWords = /[^\p{L}\p{N}]+/u;
+const kAtOnce = 500; // texts
 const kWhole = 2; // how a text fits a word: 1 where it begins one of its own
 
 export class MapSearch {
     private folded: string[] = []; // by text, with a space before each word and behind the last
-    private foldedCount = 0;
 
-    constructor(private readonly map: FamilyMap) {}
+    /** fold gives of each text the words as searches compare them, with a space between. */
+    constructor(
+        private readonly map: FamilyMap,
+        private readonly fold: (texts: readonly string[]) => readonly string[],
+    ) {}
 
     /** Folds for so many ms; whether all is done. A search does what is left. */
     prepare(time = Infinity): boolean {
         const count = this.map.arrays.stringEnds.length;
         const end = performance.now() + time;
-        while (this.foldedCount < count && (this.foldedCount % 500 !== 0 || performance.now() < end))
-            this.folded.push(` ${wordsOf(this.map.text(this.foldedCount++)).join(" ")} `);
-        return this.foldedCount === count;
+        while (this.folded.length < count && performance.now() < end) {
+            const first = this.folded.length;
+            const length = Math.min(kAtOnce, count - first);
+            const texts = Array.from({ length }, (_, i) => this.map.text(first + i));
+            for (const words of this.fold(texts)) this.folded.push(` ${words} `);
+        }
+        return this.folded.length === count;
     }
 
     /** Persons, those with each word whole first; at most so many. */
     find(text: string, limit: number): number[] {
         this.prepare();
-        const words = wordsOf(text);
+        const words = (this.fold([text])[0] ?? "").split(" ").filter((word) => word !== "");
         if (words.length === 0) return [];
         const fits = words.map((word) => this.fitting(word));
         const whole: number[] = [];
@@ -57,9 +63,4 @@ export class MapSearch {
         });
         return { year: Number(word) || 0, texts };
     }
-}
-
-function wordsOf(text: string): string[] {
-    const plain = text.normalize("NFKD").replace(kMarks, "").toLowerCase();
-    return plain.split(kBetweenWords).filter((word) => word !== "");
 }

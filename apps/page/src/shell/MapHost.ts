@@ -3,6 +3,7 @@
 
 // The map of the family that is open: made or unpacked once, shown in the place of the tree, searched without it.
 
+import type { Texts } from "olvane";
 import { html } from "../base/dom";
 import { CutShortError } from "../engine/engine";
 import { FamilyMap } from "../map/FamilyMap";
@@ -37,7 +38,10 @@ export class MapHost {
     private isTurned = false; // right and left are exchanged
     private timer = 0;
 
-    constructor(private readonly page: MapPage) {}
+    constructor(
+        private readonly page: MapPage,
+        private readonly texts: Texts,
+    ) {}
 
     get isShown(): boolean {
         return !this.element.hidden;
@@ -70,7 +74,7 @@ export class MapHost {
 
     private use(map: FamilyMap): void {
         this.map = map;
-        this.search = new MapSearch(map);
+        this.search = new MapSearch(map, (texts) => this.texts.foldedWords(texts));
         this.view = null;
         this.prepareSearch(this.search);
     }

@@ -48,10 +48,13 @@ export class Page {
             (address) => steps.arriveAt(address),
             window.self !== window.top && !new URLSearchParams(location.search).has("history"),
         );
-        this.maps = new MapHost({
-            openPerson: (number) => steps.openPerson(number),
-            mapSettled: (address) => this.journey.replace(address),
-        });
+        this.maps = new MapHost(
+            {
+                openPerson: (number) => steps.openPerson(number),
+                mapSettled: (address) => this.journey.replace(address),
+            },
+            engine.texts,
+        );
     }
 
     /** Of the family that is open, or of the map while there is nothing else. */
