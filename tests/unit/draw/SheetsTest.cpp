@@ -50,6 +50,16 @@ TEST(Sheets, onePictureStandsInTheMiddle) {
     EXPECT_THAT(sheets[0].svg, HasSubstr("viewBox=\"0 -91.6 400 583.2\""));
 }
 
+TEST(Sheets, aLegendTakesRoomOnlyWhereThereIsOne) {
+    SvgPicture picture = pictureOf(400, 400);
+    EXPECT_EQ(subjectOf(picture).others.size(), 1u);
+    picture.legend = {10, 20, 30, 40};
+    const auto others = subjectOf(picture).others;
+    ASSERT_EQ(others.size(), 2u);
+    EXPECT_EQ(others[1].x, 10);
+    EXPECT_EQ(others[1].height, 40);
+}
+
 TEST(Sheets, widePictureTurnsThePaper) {
     const auto sheets = sheetsAt(pictureOf(1000, 400), 0);
     ASSERT_EQ(sheets.size(), 1u);

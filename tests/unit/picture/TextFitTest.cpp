@@ -25,6 +25,17 @@ TEST(TextFit, shortNameStaysOnOneLine) {
     EXPECT_FALSE(fitted.shortened);
 }
 
+TEST(TextFit, textAsWideAsItsRoomIsWhole) {
+    const FittedText fitted = fitText("Anna", kFont, textWidth("Anna", kFont), 1);
+    EXPECT_THAT(fitted.lines, ElementsAre("Anna"));
+    EXPECT_FALSE(fitted.shortened);
+    EXPECT_EQ(fitLine("Anna", kFont, textWidth("Anna", kFont)), "Anna");
+}
+
+TEST(TextFit, piecesOfALongWordFillTheirRoom) {
+    EXPECT_THAT(fitText("mmmm", kFont, 2 * textWidth("m", kFont), 2).lines, ElementsAre("mm", "mm"));
+}
+
 TEST(TextFit, nameBreaksBetweenWords) {
     EXPECT_THAT(fitText("Anna Maria", kFont, 60, 2).lines, ElementsAre("Anna", "Maria"));
 }
