@@ -87,6 +87,40 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("hovering over a person or a line lights up the lines of the families, and no others", async () => {
+        const visit = await visitDarwins("#person=I1");
+        const { page } = visit;
+        const lit = () => page.evaluate(() => all("#tree .family-lines.lit").map((group) => group.dataset.family));
+        const ofSelected = await lit();
+        assert.ok(ofSelected.length >= 2, "those of the focus to begin with: with the parents, and with the wife");
+        await visit.box("I12").hover({ force: true });
+        const ofHer = await lit();
+        assert.ok(ofHer.length > 0);
+        assert.notDeepEqual(ofHer, ofSelected);
+        // In the middle of a line that belongs to another family than any of these.
+        const other = await page.evaluate(
+            (known) => {
+                for (const line of all("#tree .family-lines > .line")) {
+                    const family = line.parentElement.dataset.family;
+                    if (known.includes(family)) continue;
+                    const { x, y } = line
+                        .getPointAtLength(line.getTotalLength() / 2)
+                        .matrixTransform(line.getScreenCTM());
+                    const root = one("#tree").getRootNode();
+                    if (root.elementFromPoint(x, y) === line) return { family, x, y };
+                }
+                return null;
+            },
+            [...ofSelected, ...ofHer],
+        );
+        assert.ok(other, "a line of another family is in sight");
+        await page.mouse.move(other.x, other.y);
+        assert.deepEqual(await lit(), [other.family]);
+        await page.mouse.move(3, 3);
+        assert.deepEqual(await lit(), ofSelected);
+        await visit.end();
+    });
+
     test("boxes glide, and arrive where a picture without a glide has them", async () => {
         const still = await visitDarwins("#person=I12");
         const wanted = await still.places();

@@ -67,6 +67,8 @@ export class Scene {
     private contents!: BoxContents; // given with the picture
     private activeBox: Box | null = null;
     private pointedBox: Box | null = null;
+    // The family whose line is under the pointer, as its lines name it.
+    private pointedFamily: string | null = null;
     private drawn: Rectangle | null = null; // whose boxes and lines have elements
     private isFar = false; // in overview mode
     private glide: Glide | null = null;
@@ -96,6 +98,7 @@ export class Scene {
         this.world.setAttribute("font-family", contents.texts.fontFamilies);
         this.activeBox = picture.focusBox;
         this.pointedBox = null;
+        this.pointedFamily = null;
         this.elements.clear();
         this.boxLayer.replaceChildren();
         this.overviewLayer.replaceChildren();
@@ -197,9 +200,17 @@ export class Scene {
         this.markBranches();
     }
 
+    // Lights up the lines of the family whose line is under the pointer, and nobody else's meanwhile.
+    private pointAtFamily(family: string | null): void {
+        if (this.pointedFamily === family) return;
+        this.pointedFamily = family;
+        this.lightFamilies();
+    }
+
     private lightFamilies(): void {
         const box = this.pointedBox ?? this.activeBox;
-        const lit = new Set(box && this.picture ? this.picture.familiesOf(box).map(({ index }) => String(index)) : []);
+        const own = box && this.picture ? this.picture.familiesOf(box).map(({ index }) => String(index)) : [];
+        const lit = new Set(this.pointedFamily === null ? own : [this.pointedFamily]);
         for (const group of this.lines.children)
             group.classList.toggle("lit", lit.has(group.getAttribute("data-family") ?? ""));
     }
@@ -442,8 +453,13 @@ export class Scene {
             if (event.pointerType === "touch") return;
             const box = this.boxAt(event.target);
             events.pointed(box, box ? (this.elements.get(box) ?? null) : null);
+            const group = (event.target as Element | null)?.closest?.("[data-family]");
+            this.pointAtFamily(group?.getAttribute("data-family") ?? null);
         });
-        surface.addEventListener("pointerleave", () => events.pointed(null, null));
+        surface.addEventListener("pointerleave", () => {
+            events.pointed(null, null);
+            this.pointAtFamily(null);
+        });
         // The browser itself must not scroll the surface to a box that got the keys.
         surface.addEventListener("scroll", () => surface.scrollTo(0, 0));
     }
