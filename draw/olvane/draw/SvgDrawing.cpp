@@ -335,7 +335,7 @@ void closePage(SvgPicture& picture) {
 }
 
 std::string titleOf(std::string_view view, const DrawingContent& content, kin::Language language) {
-    const std::string title = viewTitle(view, language);
+    std::string title = viewTitle(view, language);
     const picture::Index focus = content.picture.focus;
     if (focus == picture::kNone) return title;
     const std::int64_t id = content.picture.boxes[static_cast<std::size_t>(focus)].id;
