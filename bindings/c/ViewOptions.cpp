@@ -55,10 +55,9 @@ bool areFolds(const olvane_fold* folds, std::size_t count) {
 }
 
 bool areBoxSizes(const olvane_box_size* sizes, std::size_t count) {
-    const auto isSize = [](float size) { return size >= 0 && size <= charts::kLargestSize; };
     if (!sizes && count > 0) return false;
     for (std::size_t i = 0; i < count; ++i) {
-        if (!isSize(sizes[i].width) || !isSize(sizes[i].height)) return false;
+        if (!charts::isSize(sizes[i].width) || !charts::isSize(sizes[i].height)) return false;
     }
     return true;
 }

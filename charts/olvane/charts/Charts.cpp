@@ -25,15 +25,10 @@ void checkPerson(const kin::KinGraph& graph, kin::Place person) {
     if (person < 0 || person >= graph.personCount()) throw std::out_of_range("no such person");
 }
 
-bool isLength(float value) {
-    return value >= 0 && value <= kLargestSize;
-}
-
 void checkSizes(const kin::KinGraph& graph, const ChartRequest& request) {
     const ChartSizes& sizes = request.sizes;
-    bool good =
-        isLength(sizes.boxWidth) && isLength(sizes.boxHeight) && isLength(sizes.gapX) && isLength(sizes.gapY);
-    for (const BoxSize& size : request.boxSizes) good = good && isLength(size.width) && isLength(size.height);
+    bool good = isSize(sizes.boxWidth) && isSize(sizes.boxHeight) && isSize(sizes.gapX) && isSize(sizes.gapY);
+    for (const BoxSize& size : request.boxSizes) good = good && isSize(size.width) && isSize(size.height);
     if (!good) throw std::invalid_argument("sizes of boxes and gaps must be between 0 and a million points");
     if (!request.boxSizes.empty() &&
         request.boxSizes.size() != static_cast<std::size_t>(graph.personCount())) {

@@ -14,10 +14,6 @@ void require(bool condition, const char* cause) {
     if (!condition) throw std::invalid_argument(cause);
 }
 
-bool isSize(float size) {
-    return size >= 0 && size <= kLargestSize;
-}
-
 template <class Enumeration>
 bool isUpTo(Enumeration value, Enumeration last) {
     return static_cast<std::uint8_t>(value) <= static_cast<std::uint8_t>(last);

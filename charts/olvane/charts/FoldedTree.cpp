@@ -8,7 +8,6 @@
 #include <olvane/charts/FoldedTreeInternal.h>
 
 #include <algorithm>
-#include <limits>
 #include <vector>
 
 #include <olvane/charts/Charts.h>
@@ -16,6 +15,7 @@
 #include <olvane/charts/HiddenRelativesInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
 #include <olvane/kin/Index.h>
+#include <olvane/picture/Extent.h>
 
 namespace olvane::charts {
 
@@ -89,26 +89,8 @@ private:
 
 // How high a sheet of that aspect is that the picture just fits on.
 double sheetHeight(const picture::Picture& picture, double aspect) {
-    constexpr double kFar = std::numeric_limits<double>::infinity();
-    double left = kFar;
-    double top = kFar;
-    double right = -kFar;
-    double bottom = -kFar;
-    const auto cover = [&](double x, double y) {
-        left = std::min(left, x);
-        right = std::max(right, x);
-        top = std::min(top, y);
-        bottom = std::max(bottom, y);
-    };
-    for (const picture::Box& box : picture.boxes) {
-        cover(box.x, box.y);
-        cover(box.x + double{box.width}, box.y + double{box.height});
-    }
-    for (const picture::Line& line : picture.lines) {
-        cover(line.x1, line.y1);
-        cover(line.x2, line.y2);
-    }
-    return std::max(bottom - top, (right - left) / aspect);
+    const picture::Extent extent = picture::extentOf(picture);
+    return std::max(extent.height(), extent.width() / aspect);
 }
 
 // An upright piece of a family's lines.

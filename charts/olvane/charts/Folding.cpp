@@ -54,20 +54,6 @@ std::array<std::int32_t, 3> branchSizes(const kin::KinGraph& graph, const ChartR
     return sizes;
 }
 
-Side opposite(Side side) {
-    switch (side) {
-        case Side::top:
-            return Side::bottom;
-        case Side::right:
-            return Side::left;
-        case Side::bottom:
-            return Side::top;
-        case Side::left:
-            return Side::right;
-    }
-    return side;
-}
-
 Side sideOf(Branch branch, const ChartRequest& request) {
     const Side later = laterSideOf(request);
     if (branch == Branch::down) return later;

@@ -33,6 +33,10 @@ enum class Direction : std::uint8_t { down, up, left, right };
 // No box and no gap may be larger, in points: so places stay exact in whatever chart.
 constexpr float kLargestSize = 1000000;
 
+constexpr bool isSize(float points) {
+    return points >= 0 && points <= kLargestSize;
+}
+
 // The size of a box and the least gaps around it, in points. gapX lies between neighbours of one generation and
 // gapY between generations, whichever way the chart runs.
 struct ChartSizes {

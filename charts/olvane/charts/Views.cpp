@@ -35,7 +35,7 @@ picture::Picture enginePictureOf(const std::shared_ptr<OlvaneViewerManagerWrapPr
     const LayoutOptions options = layoutOptionsOf(request);
     const TreeSize& sizes = options.sizes;
     for (const float size : {sizes.nodeWidth, sizes.nodeHeight, sizes.horzPadding, sizes.vertPadding}) {
-        if (size >= 0 && size <= kLargestSize) continue;
+        if (isSize(size)) continue;
         throw std::invalid_argument("sizes of boxes and gaps must be between 0 and a million points");
     }
     const TypedLayout layout = request.chart.view == View::family ? familyLayout(focus, source, options)

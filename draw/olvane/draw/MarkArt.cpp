@@ -43,20 +43,6 @@ const char* arrowTo(Side side) {
     return kDown;
 }
 
-Side opposite(Side side) {
-    switch (side) {
-        case Side::top:
-            return Side::bottom;
-        case Side::right:
-            return Side::left;
-        case Side::bottom:
-            return Side::top;
-        case Side::left:
-            return Side::right;
-    }
-    return Side::top;
-}
-
 // The arrows of a picture, and the edges where they stand: where text lies beside the silhouette, as in a chart that runs
 // sideways, the sides of a box have no room for them.
 struct Signs {

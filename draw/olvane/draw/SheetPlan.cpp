@@ -13,6 +13,7 @@
 #include <utility>
 
 #include <olvane/kin/MergeSort.h>
+#include <olvane/picture/Extent.h>
 
 namespace olvane::draw {
 
@@ -275,26 +276,11 @@ bool isBetter(const SheetPlan& one, const SheetPlan& other, bool scaleGiven) {
 SheetSubject subjectOf(const picture::Picture& picture) {
     SheetSubject subject;
     if (picture.boxes.empty()) return subject;
-    double left = picture.boxes.front().x;
-    double top = picture.boxes.front().y;
-    double right = left;
-    double bottom = top;
-    const auto include = [&](double x, double y) {
-        left = std::min(left, x);
-        right = std::max(right, x);
-        top = std::min(top, y);
-        bottom = std::max(bottom, y);
-    };
-    for (const picture::Box& box : picture.boxes) {
-        include(box.x, box.y);
-        include(box.x + double{box.width}, box.y + double{box.height});
-    }
-    for (const picture::Line& line : picture.lines) {
-        include(line.x1, line.y1);
-        include(line.x2, line.y2);
-    }
-    subject.width = right - left;
-    subject.height = bottom - top;
+    const picture::Extent extent = picture::extentOf(picture);
+    const double left = extent.left;
+    const double top = extent.top;
+    subject.width = extent.width();
+    subject.height = extent.height();
     if (picture.isRound()) return subject;
     for (const picture::Box& box : picture.boxes) {
         subject.boxes.push_back({box.x - left, box.y - top, double{box.width}, double{box.height}});

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include <olvane/kin/Index.h>
+#include <olvane/picture/Extent.h>
 
 namespace olvane::picture {
 
@@ -54,25 +55,16 @@ void measureLines(const Picture& picture, double boxWidth, Judgement& judgement)
 void measure(const Picture& picture, Judgement& judgement) {
     countSlanted(picture, judgement);
     if (picture.boxes.empty()) return;
-    Rect bounds = rectOf(picture.boxes[0]);
-    const auto include = [&bounds](const Rect& r) {
-        bounds = {std::min(bounds.x1, r.x1), std::min(bounds.y1, r.y1), std::max(bounds.x2, r.x2),
-                  std::max(bounds.y2, r.y2)};
-    };
     double area = 0;
     double widths = 0;
     for (const Box& box : picture.boxes) {
-        include(rectOf(box));
         area += static_cast<double>(box.width) * static_cast<double>(box.height);
         widths += static_cast<double>(box.width);
     }
-    for (const Line& line : picture.lines) {
-        include({std::min(line.x1, line.x2), std::min(line.y1, line.y2), std::max(line.x1, line.x2),
-                 std::max(line.y1, line.y2)});
-    }
     const auto count = static_cast<double>(picture.boxes.size());
-    judgement.width = bounds.x2 - bounds.x1;
-    judgement.height = bounds.y2 - bounds.y1;
+    const Extent extent = extentOf(picture);
+    judgement.width = extent.width();
+    judgement.height = extent.height();
     if (judgement.height > 0) judgement.aspect = judgement.width / judgement.height;
     if (area > 0 && judgement.persons > 0) {
         judgement.areaPerPerson =

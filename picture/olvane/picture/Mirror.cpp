@@ -5,8 +5,9 @@
 
 #include <algorithm>
 #include <cstddef>
-#include <limits>
 #include <utility>
+
+#include <olvane/picture/Extent.h>
 
 namespace olvane::picture {
 
@@ -14,15 +15,8 @@ namespace {
 
 // The sum of the least and the greatest x: what x is in the mirror when taken from it.
 double mirrorSumOf(const Picture& picture) {
-    double left = std::numeric_limits<double>::infinity();
-    double right = -left;
-    const auto include = [&](double x1, double x2) {
-        left = std::min({left, x1, x2});
-        right = std::max({right, x1, x2});
-    };
-    for (const Box& box : picture.boxes) include(box.x, box.x + static_cast<double>(box.width));
-    for (const Line& line : picture.lines) include(line.x1, line.x2);
-    return left + right;
+    const Extent extent = extentOf(picture);
+    return extent.left + extent.right;
 }
 
 // A level piece still runs from left to right where it did, and has its bridges in that order.

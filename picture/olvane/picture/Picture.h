@@ -103,6 +103,20 @@ enum class Branch : std::uint8_t { up, down, beside };
 
 enum class Side : std::uint8_t { top, right, bottom, left };
 
+constexpr Side opposite(Side side) {
+    switch (side) {
+        case Side::top:
+            return Side::bottom;
+        case Side::right:
+            return Side::left;
+        case Side::bottom:
+            return Side::top;
+        case Side::left:
+            return Side::right;
+    }
+    return side;
+}
+
 // A branch that was asked to be left out: count persons, 1 or more, would have boxes with it. They would stand on that
 // side of the box.
 struct FoldedBranch {

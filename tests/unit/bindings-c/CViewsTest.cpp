@@ -64,14 +64,21 @@ std::unique_ptr<olvane_family> table() {
     return family;
 }
 
+// Null where it fails.
+PicturePointer pictureOfSeven(const std::unique_ptr<olvane_family>& family,
+                              const olvane_picture_options& options) {
+    olvane_picture* made = nullptr;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
+    return PicturePointer(made);
+}
+
 TEST(CViews, ofATableAreThoseOfTheLibrary) {
     const auto family = table();
     for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
         olvane_picture_options options = optionsFor(view);
         options.other = 5;
-        olvane_picture* made = nullptr;
-        ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made)) << view;
-        const PicturePointer picture(made);
+        const PicturePointer picture = pictureOfSeven(family, options);
+        ASSERT_NE(nullptr, picture) << view;
         olvane::charts::ViewRequest request;
         request.chart.view = static_cast<olvane::charts::View>(view);
         EXPECT_EQ(jsonOf(picture),
@@ -91,9 +98,8 @@ olvane_judgement judgementOf(const PicturePointer& picture, const olvane_family*
 TEST(CViews, areJudged) {
     const auto family = table();
     const olvane_picture_options options = optionsFor(OLVANE_PICTURE_RELATIVES);
-    olvane_picture* made = nullptr;
-    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
-    const PicturePointer picture(made);
+    const PicturePointer picture = pictureOfSeven(family, options);
+    ASSERT_NE(nullptr, picture);
     const olvane_judgement alone = judgementOf(picture, nullptr);
     EXPECT_EQ(6, alone.boxes);
     EXPECT_EQ(6, alone.persons);
@@ -117,9 +123,8 @@ TEST(CViews, haveTheMeasuresThatTheLibraryHas) {
     for (std::int32_t view = OLVANE_PICTURE_FAMILY; view <= OLVANE_PICTURE_EVERYBODY; ++view) {
         olvane_picture_options options = optionsFor(view);
         options.other = 5;
-        olvane_picture* made = nullptr;
-        ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made)) << view;
-        const PicturePointer picture(made);
+        const PicturePointer picture = pictureOfSeven(family, options);
+        ASSERT_NE(nullptr, picture) << view;
         olvane::charts::ViewRequest request;
         request.chart.view = static_cast<olvane::charts::View>(view);
         const auto expected = olvane::picture::judge(olvane::charts::pictureOf(family->table, 7, request, 5));
@@ -252,9 +257,8 @@ TEST(CViews, ofKinshipHaveWaysAndWords) {
     const auto family = table();
     olvane_picture_options options = optionsFor(OLVANE_PICTURE_KINSHIP);
     options.other = 5;
-    olvane_picture* made = nullptr;
-    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
-    const PicturePointer picture(made);
+    const PicturePointer picture = pictureOfSeven(family, options);
+    ASSERT_NE(nullptr, picture);
     olvane_picture_arrays arrays = {};
     arrays.struct_size = sizeof arrays;
     ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
@@ -275,9 +279,8 @@ TEST(CViews, foldBranchesAndAreMirrored) {
     options.folds = folds;
     options.fold_count = 1;
     options.mirrored = 1;
-    olvane_picture* made = nullptr;
-    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
-    const PicturePointer picture(made);
+    const PicturePointer picture = pictureOfSeven(family, options);
+    ASSERT_NE(nullptr, picture);
     olvane::charts::ViewRequest request;
     const olvane::charts::Fold fold{7, olvane::picture::Branch::up};
     request.chart.view = olvane::charts::View::ancestors;
@@ -294,6 +297,7 @@ TEST(CViews, foldBranchesAndAreMirrored) {
     EXPECT_EQ(arrays.folded[0].branch, 0);
     EXPECT_GT(arrays.folded[0].count, 1);
     options.folds = nullptr;
+    olvane_picture* made = nullptr;
     EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_of_family(family.get(), 7, &options, &made));
 }
 
@@ -304,9 +308,8 @@ TEST(CViews, haveBoxesOfTheirOwnSizesAndFoldForAPaper) {
     options.box_sizes = sizes;
     options.box_size_count = 2;
     options.aspect = 0.1;
-    olvane_picture* made = nullptr;
-    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
-    const PicturePointer picture(made);
+    const PicturePointer picture = pictureOfSeven(family, options);
+    ASSERT_NE(nullptr, picture);
     olvane::charts::ViewRequest request;
     const olvane::charts::SizedBox sized[] = {{7, {120, 40}}, {1, {30, 90}}};
     request.chart.view = olvane::charts::View::ancestors;
@@ -342,9 +345,8 @@ TEST(CViews, refuseSizesOfBoxesThatAreNone) {
 TEST(CViews, ofARoundChartHaveArcs) {
     const auto family = table();
     const olvane_picture_options options = optionsFor(OLVANE_PICTURE_FAN);
-    olvane_picture* made = nullptr;
-    ASSERT_EQ(OLVANE_OK, olvane_picture_of_family(family.get(), 7, &options, &made));
-    const PicturePointer picture(made);
+    const PicturePointer picture = pictureOfSeven(family, options);
+    ASSERT_NE(nullptr, picture);
     olvane_picture_arrays arrays = {};
     arrays.struct_size = sizeof arrays;
     ASSERT_EQ(OLVANE_OK, olvane_picture_read(picture.get(), &arrays));
