@@ -198,7 +198,7 @@ export class GedcomFile {
                 this.#answer("gedcom_kinship_words", this.#person(focus), list, ids.length, pointer),
             ),
         );
-        return Array.from(ids, (_, i) => ({ text: texts[2 * i], short: texts[2 * i + 1] }));
+        return Array.from(ids, (_, i) => ({ text: texts[3 * i], short: texts[3 * i + 1], shorter: texts[3 * i + 2] }));
     }
 
     layout(focus, options = undefined) {

@@ -319,6 +319,14 @@ export interface Texts {
     width(text: string, size: number, bold?: boolean): number;
     /** One line, with an ellipsis where it was too long. */
     fitLine(text: string, size: number, width: number, bold?: boolean): string;
+    /** In lines as short as the width, broken as names are; whole is false where something had to be cut. */
+    fitLines(
+        text: string,
+        size: number,
+        width: number,
+        lines: number,
+        bold?: boolean,
+    ): { readonly lines: readonly string[]; readonly whole: boolean };
     /** In bold letters of 10 to 13 px, as large as the room allows. */
     fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
     /** Whether the first letter that has a direction is of a script that runs from right to left. */
@@ -651,6 +659,11 @@ export interface KinshipWords {
     readonly text: string;
     /** The nearest way alone, without the side: "uncle", "wife". */
     readonly short: string;
+    /**
+     * The same in fewer letters, each shorter than the one before, for where short has no room: "3rd great-grandmother",
+     * "kin, 5th degree". May be empty.
+     */
+    readonly shorter: readonly string[];
 }
 
 /** How two persons are related. */

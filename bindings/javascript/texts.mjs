@@ -32,6 +32,16 @@ export class Texts {
         );
     }
 
+    fitLines(text, size, width, lines, bold = false) {
+        return this.#remembered(`t/${size}/${bold}/${width}/${lines}/${text}`, () => {
+            const answer = this.#instance.withText(text, (pointer) =>
+                this.#answer(this.#instance.exports.fit_lines(pointer, size, bold ? 1 : 0, width, lines)),
+            );
+            const [whole, ...fitted] = answer.split("\n");
+            return { lines: fitted, whole: whole === "1" };
+        });
+    }
+
     fitName({ given, surname, surnameFirst = false }, { width, height, gap = 3, lines = 4 }) {
         const room = [surnameFirst ? 1 : 0, width, height, gap, lines];
         return this.#remembered(`n/${room.join("/")}/${given}\n${surname}`, () => {

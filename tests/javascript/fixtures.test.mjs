@@ -56,9 +56,11 @@ test("remarks have the words of the rows", () => {
 });
 
 test("texts are shortened, broken and read as in the rows", async () => {
-    const { lines, names, fromTheRight, fromTheLeft } = await rowsOf("texts.json");
+    const { lines, broken, names, fromTheRight, fromTheLeft } = await rowsOf("texts.json");
     for (const { text, size, bold, width, line } of lines)
         assert.equal(olvane.texts.fitLine(text, size, width, bold), line, text);
+    for (const { text, size, bold, width, most, ...fitted } of broken)
+        assert.deepEqual(olvane.texts.fitLines(text, size, width, most, bold), fitted, text);
     for (const { width, height, size, lines: expected, ...name } of names)
         assert.deepEqual(olvane.texts.fitName(name, { width, height }), { size, lines: expected });
     for (const text of fromTheRight) assert.equal(olvane.texts.runsRightToLeft(text), true, text);

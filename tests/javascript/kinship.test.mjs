@@ -38,8 +38,10 @@ test("the words of many persons are those of each, but for how many ways there a
         const whole = darwins.kinship(charles, person).text;
         assert.equal(words[i].text, whole.replaceAll(/; related in \d+ ways/g, ""), `person ${person}`);
         assert.equal(words[i].short === "", whole === "");
+        if (whole === "") assert.deepEqual(words[i].shorter, []);
     });
-    assert.equal(words[emma - 1].short, "wife");
+    assert.deepEqual([words[emma - 1].short, words[emma - 1].shorter], ["wife", []]);
+    assert.ok(words.some(({ shorter }) => shorter.includes("kin, 5th degree")));
     assert.deepEqual(darwins.kinshipWords(charles, []), []);
 });
 

@@ -47,7 +47,8 @@ void writeWays(JsonText& json, const kin::KinGraph& graph, const std::vector<Way
     }
 }
 
-// Two texts for each person, which say nothing of how many ways there are: the whole one and the short one.
+// The texts of each person, which say nothing of how many ways there are: the whole one, the short one, and a list of
+// shorter ones.
 std::string kinshipWordsJson(OpenFile& file, std::uint32_t focus, const std::uint32_t* persons,
                              std::size_t count, Language language) {
     const kin::KinGraph& graph = file.kin();
@@ -58,7 +59,11 @@ std::string kinshipWordsJson(OpenFile& file, std::uint32_t focus, const std::uin
     for (std::size_t i = 0; i < count; ++i) {
         const kin::Kinship kinship = file.kinship().between(placeOf(focus), placeOf(persons[i]), limits);
         json.string(kin::kinshipText(graph, kinship, language));
-        json.string(kin::shortKinshipText(graph, kinship, language));
+        const std::vector<std::string> wordings = kin::kinshipWordings(graph, kinship, language);
+        json.string(wordings.front());
+        json.begin();
+        for (std::size_t shorter = 1; shorter < wordings.size(); ++shorter) json.string(wordings[shorter]);
+        json.end();
     }
     json.end();
     return std::move(json).take();

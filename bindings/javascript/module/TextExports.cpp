@@ -3,6 +3,7 @@
 
 // Measuring and fitting of texts, as pictures have it; those texts are cut first, as in a picture. And their folding.
 
+#include <algorithm>
 #include <cstddef>
 #include <exception>
 #include <string>
@@ -46,6 +47,18 @@ OLVANE_EXPORT("text_width") double textWidth(const char* text, double size, int 
 
 OLVANE_EXPORT("fit_line") const char* fitLine(const char* text, double size, int bold, double width) {
     return answered([&] { return picture::fitLine(readable(text), {size, bold != 0}, width); });
+}
+
+// 1 where nothing is cut, else 0, and the lines, each on a line of its own.
+OLVANE_EXPORT("fit_lines")
+const char* fitLines(const char* text, double size, int bold, double width, int mostLines) {
+    return answered([&] {
+        const picture::FittedText fitted = picture::fitText(readable(text), {size, bold != 0}, width,
+                                                            static_cast<std::size_t>(std::max(mostLines, 0)));
+        std::string answer = fitted.shortened || fitted.wordBroken ? "0" : "1";
+        for (const std::string& line : fitted.lines) answer += "\n" + line;
+        return answer;
+    });
 }
 
 // The size of the letters and the lines, each on a line of its own.

@@ -33,8 +33,9 @@ BloodWords wordsOf(const KinGraph& graph, const KinWay& way) {
     return words;
 }
 
-BloodWords wordsOf(const KinGraph& graph, const KinStep& step) {
+BloodWords wordsOf(const KinGraph& graph, const KinStep& step, Wording wording) {
     BloodWords words;
+    words.wording = wording;
     words.up = step.up;
     words.down = step.down;
     words.half = step.half;
@@ -47,18 +48,20 @@ bool isNear(const KinStep& step) {
     return !step.isCouple && ((step.up == 1 && step.down <= 1) || (step.up == 0 && step.down == 1));
 }
 
-Noun nounOf(const KinGraph& graph, const KinStep& step, const KinshipWords& words) {
+Noun nounOf(const KinGraph& graph, const KinStep& step, const KinshipWords& words, Wording wording) {
     return step.isCouple ? words.spouse(step.state, graph.sex(step.to))
-                         : words.relative(wordsOf(graph, step));
+                         : words.relative(wordsOf(graph, step, wording));
 }
 
 // "wife's sister's husband"; of a far relative rather "wife of a second cousin".
-Noun chain(const KinGraph& graph, const std::vector<KinStep>& steps, const KinshipWords& words) {
+Noun chain(const KinGraph& graph, const std::vector<KinStep>& steps, const KinshipWords& words,
+           Wording wording = Wording::full) {
+    const auto nounAt = [&](std::size_t i) { return nounOf(graph, steps[i], words, wording); };
     if (steps.size() == 2 && !steps[0].isCouple && steps[1].isCouple && !isNear(steps[0])) {
-        return words.spouseOf(nounOf(graph, steps[1], words), nounOf(graph, steps[0], words));
+        return words.spouseOf(nounAt(1), nounAt(0));
     }
-    Noun noun = nounOf(graph, steps[0], words);
-    for (std::size_t i = 1; i < steps.size(); ++i) noun = words.owned(noun, nounOf(graph, steps[i], words));
+    Noun noun = nounAt(0);
+    for (std::size_t i = 1; i < steps.size(); ++i) noun = words.owned(noun, nounAt(i));
     return noun;
 }
 
@@ -148,6 +151,22 @@ std::string shortText(const KinGraph& graph, const MarriageWay& way, Language la
     return wayText(graph, way, language);
 }
 
+// Both are shorter than the full words of most ways, the second one than those of any.
+std::vector<std::string> briefTexts(const KinGraph& graph, const MarriageWay& way,
+                                    const KinshipWords& words) {
+    std::vector<std::string> texts;
+    if (hasOwnWord(graph, way.steps, words)) return texts;
+    if (way.steps.size() <= kMostStepsInWords)
+        texts.push_back(chain(graph, way.steps, words, Wording::brief).plain);
+    texts.push_back(words.brieflyByMarriage(std::to_string(way.links())));
+    return texts;
+}
+
+std::vector<std::string> briefTexts(BloodWords nearest, const KinshipWords& words) {
+    nearest.wording = Wording::brief;
+    return {words.relative(nearest).plain, words.ofDegree(nearest.up + nearest.down)};
+}
+
 }  // namespace
 
 std::string wayText(const KinGraph& graph, const KinWay& way, Language language) {
@@ -184,6 +203,21 @@ std::string shortKinshipText(const KinGraph& graph, const Kinship& kinship, Lang
     if (namesMarriage(graph, kinship, words)) return shortText(graph, kinship.marriage.front(), language);
     const bool isLegal = lengthOf(kinship.legal) < lengthOf(kinship.blood);
     return words.relative(nearestWords(graph, isLegal ? kinship.legal : kinship.blood)).plain;
+}
+
+std::vector<std::string> kinshipWordings(const KinGraph& graph, const Kinship& kinship, Language language) {
+    std::vector<std::string> wordings{shortKinshipText(graph, kinship, language)};
+    if (kinship.a == kinship.b || !kinship.isRelated()) return wordings;
+    const KinshipWords& words = kinshipWords(language);
+    const bool isLegal = lengthOf(kinship.legal) < lengthOf(kinship.blood);
+    const std::vector<std::string> briefs =
+        namesMarriage(graph, kinship, words)
+            ? briefTexts(graph, kinship.marriage.front(), words)
+            : briefTexts(nearestWords(graph, isLegal ? kinship.legal : kinship.blood), words);
+    for (const std::string& brief : briefs) {
+        if (brief != wordings.back()) wordings.push_back(brief);
+    }
+    return wordings;
 }
 
 }  // namespace olvane::kin

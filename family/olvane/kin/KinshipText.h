@@ -4,6 +4,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include <olvane/Export.h>
 #include <olvane/kin/Kinship.h>
@@ -20,6 +21,12 @@ OLVANE_API std::string kinshipText(const KinGraph& graph, const Kinship& kinship
 // The nearest way alone, for where there is little room: without the side, the number of ways and explanations: "uncle",
 // "sister-in-law", "wife".
 OLVANE_API std::string shortKinshipText(const KinGraph& graph, const Kinship& kinship, Language language);
+
+// The short text, and after it others in fewer letters for a room that is too narrow for it: with repeated greats counted
+// and ordinals as numerals ("3rd great-grandmother", "1st cousin 2× removed"), and at last only how far the relation is
+// ("kin, 9th degree", "by marriage (5 links)"). One empty text where there is no way.
+OLVANE_API std::vector<std::string> kinshipWordings(const KinGraph& graph, const Kinship& kinship,
+                                                    Language language);
 
 // What B is to A by this way alone: "great-uncle (mother's side)".
 OLVANE_API std::string wayText(const KinGraph& graph, const KinWay& way, Language language);

@@ -29,6 +29,17 @@ TEST(TextsFixture, aLineIsShortenedAsInTheRows) {
     }
 }
 
+TEST(TextsFixture, aTextIsBrokenIntoTheLinesOfTheRows) {
+    const json all = fixture();  // outlives the loop
+    for (const json& row : all["broken"]) {
+        const std::string text = row["text"];
+        const FittedText fitted =
+            fitText(cleanText(text), {row["size"], row["bold"]}, row["width"], row["most"]);
+        EXPECT_EQ(!fitted.shortened && !fitted.wordBroken, row["whole"]) << text;
+        EXPECT_EQ(json(fitted.lines), row["lines"]) << text;
+    }
+}
+
 TEST(TextsFixture, aNameIsBrokenIntoTheLinesOfTheRows) {
     const json all = fixture();  // outlives the loop
     for (const json& row : all["names"]) {

@@ -46,9 +46,10 @@ export class PictureContents implements BoxContents {
         return this.kinships.of(id).text;
     }
 
-    // As kinshipOf, without the words that say by which side.
-    shortKinshipOf(id: number): string {
-        return this.kinships.of(id).short;
+    // As kinshipOf, without the words that say by which side, and then in fewer and fewer letters.
+    kinshipWordings(id: number): readonly string[] {
+        const { short, shorter } = this.kinships.of(id);
+        return short === "" ? [] : [short, ...shorter];
     }
 
     // Finds out what the persons of the picture are to the focus, for so many ms; true where all is known then.
@@ -132,7 +133,7 @@ export class PictureContents implements BoxContents {
             dates,
             details: says?.details ?? [],
             factHeight: factHeight(show),
-            kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.shortKinshipOf(person.id) : "") : null,
+            kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.kinshipWordings(person.id) : []) : null,
             hidden,
             folded: box.folded.map((branch) => this.branchMark(box, branch)),
             further: box.furtherParents > 0 ? ui.furtherParents : "",

@@ -43,8 +43,9 @@ export interface BoxLook {
     readonly details: readonly string[];
     // Of the box, for what is shown beside names and years.
     readonly factHeight: number;
-    // How the person is related to the focus; empty where it is not known, null where it is not to be shown.
-    readonly kinship: string | null;
+    // How the person is related to the focus, in fewer and fewer letters; empty where it is not known, null where it is
+    // not to be shown.
+    readonly kinship: readonly string[] | null;
     // Relatives without a box: -1 for none, 0 for an unknown number.
     readonly hidden: number;
     // Marks of branches that are left out.
@@ -70,6 +71,7 @@ const kYearsSize = 11;
 const kLinePitch = 14;
 const kKinSize = 10.5;
 const kLeastKinSize = 9.5; // before a word is cut
+const kKinPitch = 11; // between two lines of kinship
 
 // Silhouettes of 44 by 40 px are drawn at this scale.
 const kFigureScale = 0.56;
@@ -155,13 +157,20 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
     const facts = factLines(look, room);
-    const lastFact = look.kinship !== null ? lastLine - kLinePitch : lastLine;
-    const firstFact = lastFact - kLinePitch * Math.max(0, facts.length - 1);
     // What a box is higher than usual, but for facts, is for the photograph.
     const figureHeight = 22 + Math.max(0, nodeHeight - kUsualHeight - look.factHeight);
     const top = 9 + figureHeight;
-    const bottom = facts.length > 0 || look.kinship !== null ? firstFact - kYearsSize - 1 : nodeHeight - 6;
-    const name = look.texts.fitName(look.name, { width: room, height: bottom - top, gap: 1, lines: 3 });
+    const lastFactAbove = (kinLines: number) =>
+        look.kinship === null ? lastLine : lastLine - kLinePitch - kKinPitch * Math.max(0, kinLines - 1);
+    const firstFactAbove = (kinLines: number) => lastFactAbove(kinLines) - kLinePitch * Math.max(0, facts.length - 1);
+    const bottomAbove = (kinLines: number) =>
+        facts.length > 0 || look.kinship !== null ? firstFactAbove(kinLines) - kYearsSize - 1 : nodeHeight - 6;
+    const nameAbove = (kinLines: number) =>
+        look.texts.fitName(look.name, { width: room, height: bottomAbove(kinLines) - top, gap: 1, lines: 3 });
+    const kin = kinLines(look, room, () => haveSameWords(nameAbove(1), nameAbove(2)));
+    const name = nameAbove(kin.lines.length);
+    const firstFact = firstFactAbove(kin.lines.length);
+    const bottom = bottomAbove(kin.lines.length);
     const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
 
@@ -170,23 +179,30 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
         box.append(text("name", middle, firstY + i * pitch, line, look.rightToLeft, name.size)),
     );
     facts.forEach((line, i) => box.append(text("years", middle, firstFact + i * kLinePitch, line)));
-    if (look.kinship) box.append(kinText(look, middle, lastLine, look.kinship, kKinSize, room));
+    kin.lines.forEach((line, i) =>
+        box.append(kinText(middle, lastLine - kKinPitch * (kin.lines.length - 1 - i), line, kin.size)),
+    );
 }
 
 function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, height: nodeHeight }: Extent): void {
     const left = look.photo ? 54 : 40;
     const right = nodeWidth - kInset;
     const room = right - left;
-    const lower = lowerLines(look, room);
-    const nameHeight = nodeHeight - 8 - lower.length * kLinePitch;
-    const name = look.texts.fitName(look.name, {
-        width: room,
-        height: nameHeight,
-        gap: 2,
-        lines: nameHeight < kTwoNameLines ? 1 : 2,
-    });
+    const facts = factLines(look, room);
+    const lowerHeight = (kinLines: number) =>
+        (facts.length + (kinLines > 0 ? 1 : 0)) * kLinePitch + kKinPitch * Math.max(0, kinLines - 1);
+    const nameAbove = (lower: number) => {
+        const height = nodeHeight - 8 - lower;
+        return look.texts.fitName(look.name, { width: room, height, gap: 2, lines: height < kTwoNameLines ? 1 : 2 });
+    };
+    const joined = joinedFacts(look, facts, room);
+    const kin = joined
+        ? { lines: [], size: kKinSize }
+        : kinLines(look, room, () => haveSameWords(nameAbove(lowerHeight(1)), nameAbove(lowerHeight(2))));
+    const lower = lowerHeight(kin.lines.length);
+    const name = nameAbove(lower);
     const pitch = name.size + 2;
-    const height = name.lines.length * pitch + lower.length * kLinePitch;
+    const height = name.lines.length * pitch + lower;
     const firstY = (nodeHeight - height) / 2 + name.size - 1;
     // In the other direction a line begins at the right edge of its room.
     const x = look.rightToLeft ? right : left;
@@ -194,23 +210,41 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const figureHeight = look.photo ? nodeHeight - 12 : 22;
     box.append(figure(look, look.photo ? 28 : 21, (nodeHeight - figureHeight) / 2, figureHeight));
     name.lines.forEach((line, i) => box.append(text("name", x, firstY + i * pitch, line, look.rightToLeft, name.size)));
-    lower.forEach((line, i) => {
-        const y = firstY + name.lines.length * pitch + i * kLinePitch;
-        box.append(
-            line === look.kinship
-                ? kinText(look, left, y, line, kYearsSize, room)
-                : text("years", left, y, look.texts.fitLine(line, kYearsSize, room)),
-        );
-    });
+    const firstFact = firstY + name.lines.length * pitch;
+    (joined ? [joined] : facts).forEach((line, i) => box.append(text("years", left, firstFact + i * kLinePitch, line)));
+    const firstKin = firstFact + facts.length * kLinePitch;
+    kin.lines.forEach((line, i) => box.append(kinText(left, firstKin + i * kKinPitch, line, kin.size)));
     box.classList.add("wide");
 }
 
-// Years and kinship in one line if they fit and nothing else is shown.
-function lowerLines(look: BoxLook, room: number): string[] {
-    const lines = [...factLines(look, room), look.kinship].filter((line): line is string => Boolean(line));
-    const joined = lines.join(" \u00b7 ");
-    const areTwo = look.factHeight === 0 && lines.length === 2;
-    return areTwo && look.texts.width(joined, kYearsSize) <= room ? [joined] : lines;
+// Years and kinship in one line if they fit and nothing else is shown; empty where they do not.
+function joinedFacts({ kinship, factHeight, texts }: BoxLook, facts: readonly string[], room: number): string {
+    if (factHeight > 0 || facts.length !== 1 || !kinship?.[0]) return "";
+    const joined = facts[0] + " \u00b7 " + kinship[0];
+    return texts.width(joined, kYearsSize) <= room ? joined : "";
+}
+
+interface SizedLines {
+    readonly lines: readonly string[];
+    readonly size: number;
+}
+
+// The fullest wording of a kinship that has room: in one line, or in two where the name does not suffer from it.
+function kinLines({ kinship, texts }: BoxLook, room: number, hasRoomForTwo: () => boolean): SizedLines {
+    const wordings = kinship ?? [];
+    const inTwo = (wording: string) => texts.fitLines(wording, kLeastKinSize, room, 2);
+    for (const wording of wordings) {
+        const size = [kKinSize, kLeastKinSize].find((size) => texts.width(wording, size) <= room);
+        if (size) return { lines: [wording], size };
+        if (inTwo(wording).whole && hasRoomForTwo()) return { lines: inTwo(wording).lines, size: kLeastKinSize };
+    }
+    const shortened = wordings.map(inTwo);
+    const lines = (shortened.find(({ whole }) => whole) ?? shortened.at(-1))?.lines ?? [];
+    return { lines, size: kLeastKinSize };
+}
+
+function haveSameWords(a: SizedLines, b: SizedLines): boolean {
+    return a.lines.join(" ") === b.lines.join(" ");
 }
 
 // Years or dates, then the details.
@@ -243,16 +277,8 @@ function figure(look: BoxLook, x: number, y: number, height: number): SVGElement
     });
 }
 
-function kinText(
-    { texts }: BoxLook,
-    x: number,
-    y: number,
-    kinship: string,
-    usualSize: number,
-    room: number,
-): SVGTextElement {
-    const size = texts.width(kinship, usualSize) <= room ? usualSize : kLeastKinSize;
-    return text("kin", x, y, texts.fitLine(kinship, size, room), false, size === usualSize ? undefined : size);
+function kinText(x: number, y: number, line: string, size: number): SVGTextElement {
+    return text("kin", x, y, line, false, size);
 }
 
 function text(

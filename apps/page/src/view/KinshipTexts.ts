@@ -5,7 +5,7 @@
 
 import type { GedcomFile, KinshipWords } from "olvane";
 
-const kNone: KinshipWords = { text: "", short: "" };
+const kNone: KinshipWords = { text: "", short: "", shorter: [] };
 const kAtOnce = 16; // persons asked of between two looks at the clock
 
 export class KinshipTexts {

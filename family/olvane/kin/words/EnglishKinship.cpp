@@ -22,8 +22,9 @@ constexpr Words kSpouse{"husband", "wife", "spouse"};
 constexpr std::array kOrdinals{"first", "second",  "third",  "fourth", "fifth",
                                "sixth", "seventh", "eighth", "ninth",  "tenth"};
 constexpr std::array kTimes{"", "once", "twice"};
-// More greats than this are counted.
+// More greats than this are counted: in full words, and in brief ones.
 constexpr int kGreatsInWords = 3;
+constexpr int kGreatsInBrief = 1;
 
 // 1st, 2nd, 3rd, 4th, 11th, 21st
 std::string numeral(int n) {
@@ -33,16 +34,24 @@ std::string numeral(int n) {
     return std::to_string(n) + (isPlain ? "th" : kEndings[static_cast<std::size_t>(n % 10)]);
 }
 
-std::string greats(int count, const std::string& word) {
-    if (count > kGreatsInWords) return numeral(count) + " great-" + word;
+std::string greats(int count, const std::string& word, Wording wording) {
+    if (count > (wording == Wording::brief ? kGreatsInBrief : kGreatsInWords))
+        return numeral(count) + " great-" + word;
     std::string text;
     for (int i = 0; i < count; ++i) text += "great-";
     return text + word;
 }
 
+// "1st cousin 3× removed"
+std::string briefCousin(int degree, std::size_t removed) {
+    const std::string word = numeral(degree) + " cousin";
+    return removed == 0 ? word : word + " " + std::to_string(removed) + "× removed";
+}
+
 std::string cousin(const BloodWords& way) {
     const int degree = std::min(way.up, way.down) - 1;
     const auto removed = static_cast<std::size_t>(std::abs(way.up - way.down));
+    if (way.wording == Wording::brief) return briefCousin(degree, removed);
     const auto ordinal = static_cast<std::size_t>(degree - 1);
     std::string word =
         (ordinal < kOrdinals.size() ? std::string(kOrdinals[ordinal]) : numeral(degree)) + " cousin";
@@ -55,10 +64,10 @@ std::string wholeWord(const BloodWords& way) {
     if (way.up == 1 && way.down == 0) return kParent[way.sex];
     if (way.up == 0 && way.down == 1) return kChild[way.sex];
     if (way.up == 1 && way.down == 1) return kSibling[way.sex];
-    if (way.down == 0) return greats(way.up - 2, std::string("grand") + kParent[way.sex]);
-    if (way.up == 0) return greats(way.down - 2, std::string("grand") + kChild[way.sex]);
-    if (way.down == 1) return greats(way.up - 2, kParentsSibling[way.sex]);
-    if (way.up == 1) return greats(way.down - 2, kSiblingsChild[way.sex]);
+    if (way.down == 0) return greats(way.up - 2, std::string("grand") + kParent[way.sex], way.wording);
+    if (way.up == 0) return greats(way.down - 2, std::string("grand") + kChild[way.sex], way.wording);
+    if (way.down == 1) return greats(way.up - 2, kParentsSibling[way.sex], way.wording);
+    if (way.up == 1) return greats(way.down - 2, kSiblingsChild[way.sex], way.wording);
     return cousin(way);
 }
 
@@ -132,6 +141,10 @@ public:
     std::string byMarriage(const std::string& links) const override {
         return "related by marriage over " + links + " links";
     }
+    std::string brieflyByMarriage(const std::string& links) const override {
+        return "by marriage (" + links + " links)";
+    }
+    std::string ofDegree(int steps) const override { return "kin, " + numeral(steps) + " degree"; }
 };
 
 }  // namespace

@@ -82,8 +82,10 @@ const Words& spouseWords(UnionState state) {
 
 constexpr std::array kOrdinals{"ersten",   "zweiten", "dritten", "vierten", "fünften",
                                "sechsten", "siebten", "achten",  "neunten"};
-// More of them than this are counted.
+// More of them than this are counted: in full words, and in brief ones.
 constexpr int kUrsInWords = 3;
+constexpr int kUrsInBrief = 2;
+constexpr int kLeastGenerationsForHyphen = 4;
 
 Noun noun(const Word& word) {
     const bool isFeminine = word.gender == Gender::feminine;
@@ -91,9 +93,9 @@ Noun noun(const Word& word) {
             (isFeminine ? "der " : "des ") + word.genitive};
 }
 
-// "Halb" before "Onkel/Tante" is "Halbonkel/Halbtante", and before "4×Urgroßonkel" "4×Halburgroßonkel". The words
-// begin with ASCII letters.
-std::string compound(const std::string& prefix, const std::string& words) {
+// "Halb" before "Onkel/Tante" is "Halbonkel/Halbtante", in brief "Halbonkel/-tante", and before "4×Urgroßonkel"
+// "4×Halburgroßonkel". The words begin with ASCII letters.
+std::string compound(const std::string& prefix, const std::string& words, Wording wording) {
     std::string text;
     std::size_t start = 0;
     while (start <= words.size()) {
@@ -101,47 +103,61 @@ std::string compound(const std::string& prefix, const std::string& words) {
         const std::string part = words.substr(start, end - start);
         const std::size_t times = part.find("×");
         const std::size_t head = times == std::string::npos ? 0 : times + std::string_view("×").size();
-        if (start > 0) text += '/';
-        text += part.substr(0, head) + prefix;
-        text +=
-            static_cast<char>(part[head] >= 'A' && part[head] <= 'Z' ? part[head] - 'A' + 'a' : part[head]);
-        text += part.substr(head + 1);
+        const bool isSecond = start > 0;
         start = end + 1;
+        if (isSecond) text += '/';
+        if (isSecond && part.front() == '-') {
+            text += part;
+            continue;
+        }
+        text += part.substr(0, head) + (isSecond && wording == Wording::brief ? "-" : prefix);
+        const bool isOneWord = text.back() != '-' || isSecond;
+        text += static_cast<char>(isOneWord && part[head] >= 'A' && part[head] <= 'Z' ? part[head] - 'A' + 'a'
+                                                                                      : part[head]);
+        text += part.substr(head + 1);
     }
     return text;
 }
 
-Word compound(const std::string& prefix, const Word& word) {
+Word compound(const std::string& prefix, const Word& word, Wording wording = Wording::full) {
     if (prefix.empty()) return word;
-    return {compound(prefix, word.word), compound(prefix, word.genitive), word.gender};
+    return {compound(prefix, word.word, wording), compound(prefix, word.genitive, wording), word.gender};
 }
 
 // "Ur", "Urur", "Ururur", and then "4×Ur".
-Word ur(int count, const Word& word) {
+Word ur(int count, const Word& word, Wording wording) {
     if (count <= 0) return word;
-    if (count <= kUrsInWords) {
+    if (count <= (wording == Wording::brief ? kUrsInBrief : kUrsInWords)) {
         std::string prefix = "Ur";
         for (int i = 1; i < count; ++i) prefix += "ur";
-        return compound(prefix, word);
+        return compound(prefix, word, wording);
     }
-    Word one = compound("Ur", word);
+    Word one = compound("Ur", word, wording);
     const std::string times = std::to_string(count) + "×";
     return {times + one.word, times + one.genitive, one.gender};
 }
 
-Word great(int generations, const Word& word) {
-    return generations == 0 ? word : ur(generations - 1, compound("Groß", word));
+Word great(int generations, const Word& word, Wording wording) {
+    return generations == 0 ? word : ur(generations - 1, compound("Groß", word, wording), wording);
 }
 
-Word ofDegree(int degree, const Word& word) {
+Word ofDegree(int degree, const Word& word, Wording wording) {
     const auto ordinal = static_cast<std::size_t>(degree - 1);
+    const bool isWord = ordinal < kOrdinals.size() && wording == Wording::full;
     const std::string ending =
-        " " + (ordinal < kOrdinals.size() ? std::string(kOrdinals[ordinal]) : std::to_string(degree) + ".") +
-        " Grades";
+        " " + (isWord ? std::string(kOrdinals[ordinal]) : std::to_string(degree) + ".") + " Grades";
     return {word.word + ending, word.genitive + ending, word.gender};
 }
 
+// In brief with a hyphen before long words, at which a line may end; and what is double is not said.
 std::string manner(const BloodWords& way) {
+    if (way.wording == Wording::brief) {
+        BloodWords full = way;
+        full.wording = Wording::full;
+        full.doubled = false;
+        const bool isFar = std::max(way.up, way.down) >= kLeastGenerationsForHyphen;
+        return manner(full) + (isFar && way.bond != Bond::blood && way.bond != Bond::other ? "-" : "");
+    }
     if (way.bond == Bond::foster) return "Pflege";
     if (way.bond == Bond::adopted) return "Adoptiv";
     if (way.bond == Bond::step) return "Stief";
@@ -154,20 +170,24 @@ std::string manner(const BloodWords& way) {
 Word collateral(const BloodWords& way) {
     const int later = std::abs(way.up - way.down);
     const int degree = std::min(way.up, way.down);
+    const Wording wording = way.wording;
     if (later == 0) {
-        if (degree == 3) return compound(manner(way), compound("Groß", cousin()[way.sex]));
-        return ofDegree(degree - 1, compound(manner(way), cousin()[way.sex]));
+        if (degree == 3) return compound(manner(way), compound("Groß", cousin()[way.sex], wording), wording);
+        return ofDegree(degree - 1, compound(manner(way), cousin()[way.sex], wording), wording);
     }
     const Words& words = way.up > way.down ? parentsSibling() : siblingsChild();
-    Word word = compound(manner(way), great(later - 1, words[way.sex]));
-    return degree == 1 ? word : ofDegree(degree, word);
+    Word word = compound(manner(way), great(later - 1, words[way.sex], wording), wording);
+    return degree == 1 ? word : ofDegree(degree, word, wording);
 }
 
 Word relativeWord(const BloodWords& way) {
-    if (way.up == 1 && way.down == 1) return compound(manner(way), sibling()[way.sex]);
+    if (way.up == 1 && way.down == 1) return compound(manner(way), sibling()[way.sex], way.wording);
     if (way.up > 0 && way.down > 0) return collateral(way);
-    if (way.down == 0) return compound(manner(way), great(way.up - 1, parent()[way.sex]));
-    return compound(manner(way), way.down == 1 ? child()[way.sex] : ur(way.down - 2, grandchild()[way.sex]));
+    if (way.down == 0)
+        return compound(manner(way), great(way.up - 1, parent()[way.sex], way.wording), way.wording);
+    return compound(manner(way),
+                    way.down == 1 ? child()[way.sex] : ur(way.down - 2, grandchild()[way.sex], way.wording),
+                    way.wording);
 }
 
 class German : public KinshipWords {
@@ -213,6 +233,12 @@ public:
     }
     std::string byMarriage(const std::string& links) const override {
         return "verschwägert über " + links + " Verbindungen";
+    }
+    std::string brieflyByMarriage(const std::string& links) const override {
+        return "verschwägert (" + links + " Schritte)";
+    }
+    std::string ofDegree(int steps) const override {
+        return "verwandt im " + std::to_string(steps) + ". Grad";
     }
 };
 

@@ -22,6 +22,9 @@ struct Noun {
 // By which parent a way begins. none: downwards, or by both at once.
 enum class KinSide : std::uint8_t { none, father, mother };
 
+// brief is for narrow rooms: repeated greats are counted, and ordinals are numerals.
+enum class Wording : std::uint8_t { full, brief };
+
 // A way by blood, adoption or fostering in all that words depend on.
 struct BloodWords {
     int up = 0;
@@ -31,6 +34,7 @@ struct BloodWords {
     Bond bond = Bond::blood;
     KinSide side = KinSide::none;
     Sex sex = Sex::unknown;
+    Wording wording = Wording::full;
 };
 
 enum class InLaw : std::uint8_t { parent, child, sibling, stepparent, stepchild, stepsibling };
@@ -55,6 +59,10 @@ public:
     virtual std::string inWays(const std::string& relation, const std::string& count) const = 0;
     // "related by marriage over 7 links"
     virtual std::string byMarriage(const std::string& links) const = 0;
+    // The same in a few letters: "by marriage (7 links)"
+    virtual std::string brieflyByMarriage(const std::string& links) const = 0;
+    // "kin, 9th degree": by how many steps up and down, as laws of inheritance count
+    virtual std::string ofDegree(int steps) const = 0;
 };
 
 const KinshipWords& englishKinship();

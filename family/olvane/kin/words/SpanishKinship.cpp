@@ -38,18 +38,19 @@ constexpr std::array kGrandchildren{"niet", "bisniet", "tataraniet"};
 constexpr std::array kOrdinals{"primer", "segund", "tercer", "cuart", "quint",
                                "sext",   "séptim", "octav",  "noven", "décim"};
 
-std::string ordinal(int n, Sex sex) {
+std::string ordinal(int n, Sex sex, Wording wording) {
     const auto place = static_cast<std::size_t>(n - 1);
-    if (place < kOrdinals.size()) return std::string(kOrdinals[place]) + kEnding[sex];
+    if (place < kOrdinals.size() && wording == Wording::full)
+        return std::string(kOrdinals[place]) + kEnding[sex];
     return std::to_string(n) + (sex == Sex::female ? ".ª" : ".º");
 }
 
 // generations: 2 for a grandparent or grandchild. Beyond the three that have a name they are counted: the parent of a
 // "tatarabuelo" is the "cuarto abuelo".
-std::string grand(const std::array<const char*, 3>& roots, int generations, Sex sex) {
+std::string grand(const std::array<const char*, 3>& roots, int generations, Sex sex, Wording wording) {
     const auto place = static_cast<std::size_t>(generations - 2);
     if (place < roots.size()) return std::string(roots[place]) + kEnding[sex];
-    return ordinal(generations - 1, sex) + " " + roots[0] + kEnding[sex];
+    return ordinal(generations - 1, sex, wording) + " " + roots[0] + kEnding[sex];
 }
 
 // The common ancestors' children are siblings, of the first degree; their children "primos hermanos", and so on.
@@ -57,14 +58,14 @@ std::string collateral(const BloodWords& way) {
     const int later = std::abs(way.up - way.down);
     const int degree = std::min(way.up, way.down);
     if (later == 0) {
-        const std::string kind =
-            degree == 2 ? std::string("herman") + kEnding[way.sex] : ordinal(degree - 1, way.sex);
+        const std::string kind = degree == 2 ? std::string("herman") + kEnding[way.sex]
+                                             : ordinal(degree - 1, way.sex, way.wording);
         return std::string(kCousin[way.sex]) + " " + kind;
     }
     const bool isOlder = way.up > way.down;
     std::string word = (isOlder ? kParentsSibling : kSiblingsChild)[way.sex];
-    if (later > 1) word += " " + grand(isOlder ? kGrandparents : kGrandchildren, later, way.sex);
-    return degree == 1 ? word : word + " " + ordinal(degree, way.sex);
+    if (later > 1) word += " " + grand(isOlder ? kGrandparents : kGrandchildren, later, way.sex, way.wording);
+    return degree == 1 ? word : word + " " + ordinal(degree, way.sex, way.wording);
 }
 
 std::string wholeWord(const BloodWords& way) {
@@ -72,8 +73,8 @@ std::string wholeWord(const BloodWords& way) {
     if (way.up == 1 && way.down == 0) return (isStep ? kStepparent : kParent)[way.sex];
     if (way.up == 0 && way.down == 1) return (isStep ? kStepchild : kChild)[way.sex];
     if (way.up == 1 && way.down == 1) return (isStep ? kStepsibling : kSibling)[way.sex];
-    if (way.down == 0) return grand(kGrandparents, way.up, way.sex);
-    if (way.up == 0) return grand(kGrandchildren, way.down, way.sex);
+    if (way.down == 0) return grand(kGrandparents, way.up, way.sex, way.wording);
+    if (way.up == 0) return grand(kGrandchildren, way.down, way.sex, way.wording);
     return collateral(way);
 }
 
@@ -139,6 +140,12 @@ public:
     }
     std::string byMarriage(const std::string& links) const override {
         return "pariente por matrimonio a través de " + links + " vínculos";
+    }
+    std::string brieflyByMarriage(const std::string& links) const override {
+        return "por matrimonio (" + links + " vínculos)";
+    }
+    std::string ofDegree(int steps) const override {
+        return "pariente en " + ordinal(steps, Sex::male, Wording::brief) + " grado";
     }
 };
 
