@@ -473,7 +473,23 @@ export interface PictureKinship {
     readonly focusIs: string;
     /** What the other person is to the focus. */
     readonly otherIs: string;
+    /** Places for both texts, each at its box. */
+    readonly plates: readonly KinshipPlate[];
     readonly ways: readonly PictureWay[];
+}
+
+/**
+ * A plate with what the one person is to the other, for bold letters of 10.5 points and lines of 13: where it covers neither a
+ * box, with counts on top and marks below it, nor the other plate. (x, y) is its upper-left corner, in points.
+ */
+export interface KinshipPlate {
+    readonly box: PictureIndex;
+    readonly x: number;
+    readonly y: number;
+    readonly width: number;
+    readonly height: number;
+    /** The whole text. */
+    readonly lines: readonly string[];
 }
 
 export interface PictureWay {

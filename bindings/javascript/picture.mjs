@@ -128,7 +128,7 @@ export function pictureFrom(view, numbers, texts) {
         Array.from({ length: count }, (_, index) => make(starts[name] + index * size, index));
     const bridges = Array.from(numbers.subarray(starts.bridges, starts.bridges + bridgeCount));
     const members = list("members", memberCount, 2, (start) => ({ box: numbers[start], kind: numbers[start + 1] }));
-    const [focusIs, otherIs, ...words] = other < 0 ? [] : texts();
+    const [focusIs, otherIs, plates, ...words] = other < 0 ? [] : texts();
     const lines = list("lines", lineCount, 8, (start) => lineAt(numbers, start, bridges));
     return {
         view,
@@ -161,6 +161,14 @@ export function pictureFrom(view, numbers, texts) {
                       other,
                       focusIs,
                       otherIs,
+                      plates: plates.map(([box, x, y, width, height, lines]) => ({
+                          box,
+                          x: x / 100,
+                          y: y / 100,
+                          width: width / 100,
+                          height: height / 100,
+                          lines,
+                      })),
                       ways: list("ways", wayCount, 6, (start, i) => wayAt(numbers, start, words[i], starts)),
                   },
     };

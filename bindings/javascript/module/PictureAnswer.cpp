@@ -5,12 +5,16 @@
 
 #include "PictureAnswer.h"
 
+#include <cmath>
 #include <cstddef>
 #include <exception>
 #include <initializer_list>
 #include <memory>
 #include <stdexcept>
 #include <utility>
+#include <vector>
+
+#include <olvane/picture/KinshipPlates.h>
 
 #include "JsonText.h"
 #include "OpenFile.h"
@@ -67,6 +71,54 @@ void appendWay(std::vector<double>& numbers, const picture::Way& way) {
                      static_cast<double>(way.pieceCount), static_cast<double>(way.kind)});
 }
 
+// Letters and marks as screens have them that show one px for each point.
+picture::PlateStyle screenPlates() {
+    picture::PlateStyle style;
+    style.letters = 10.5;
+    style.pitch = 13;
+    style.inset = 8;
+    style.frame = 6;
+    style.onBorder = 2;
+    style.marks = 14;
+    style.frames = 8;
+    return style;
+}
+
+bool hasHidden(const picture::Box& box) {
+    return box.hasFlag ? box.flag : box.hiddenParents + box.hiddenPartners + box.hiddenChildren > 0;
+}
+
+// Counts of hidden relatives stand on top of boxes, and all marks below.
+std::vector<picture::MarkedEdges> edgesOf(const picture::Picture& picture) {
+    std::vector<picture::MarkedEdges> edges(picture.boxes.size());
+    for (std::size_t i = 0; i < edges.size(); ++i) edges[i].top = hasHidden(picture.boxes[i]);
+    for (const picture::Mark& mark : picture.marks) {
+        for (const picture::Index box : mark.boxes) {
+            if (box != picture::kNone) edges[static_cast<std::size_t>(box)].bottom = true;
+        }
+    }
+    return edges;
+}
+
+// Of each plate its box, its place in hundredths of a point, and its lines.
+void writePlates(JsonText& json, const picture::Picture& picture) {
+    json.begin();
+    if (picture.other != picture::kNone) {
+        for (const picture::KinshipPlate& plate :
+             picture::kinshipPlates(picture, screenPlates(), edgesOf(picture))) {
+            json.begin();
+            json.number(plate.box);
+            for (const double value : {plate.x, plate.y, plate.width, plate.height})
+                json.number(std::llround(100 * value));
+            json.begin();
+            for (const std::string& line : plate.lines) json.string(line);
+            json.end();
+            json.end();
+        }
+    }
+    json.end();
+}
+
 }  // namespace
 
 std::string textsOf(const picture::Picture& picture) {
@@ -74,6 +126,7 @@ std::string textsOf(const picture::Picture& picture) {
     json.begin();
     json.string(picture.focusIs);
     json.string(picture.otherIs);
+    writePlates(json, picture);
     for (const picture::Way& way : picture.ways) json.string(way.words);
     json.end();
     return std::move(json).take();

@@ -145,7 +145,7 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     appendTexts(svg, box, shown, badges, theme);
     appendBadges(svg, box, badges, theme);
     appendMarks(svg, box, theme);
-    appendCaption(svg, box, theme);
+    appendPlate(svg, box, theme);
     svg += "</g>\n";
 }
 

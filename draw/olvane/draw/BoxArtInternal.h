@@ -8,14 +8,10 @@
 
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgDrawing.h>
+#include <olvane/picture/KinshipPlates.h>
 
 namespace olvane::draw {
 
-// How far a caption reaches beyond its box, at most: three lines, and marks between them and the box.
-constexpr double kCaptionReach = 58;
-
-// What a caption is wider than its box, at most.
-constexpr double kCaptionOver = 40;
 // How far a mark at the edge of a box reaches out of it.
 constexpr double kMarkOutside = 12;
 
@@ -29,11 +25,10 @@ struct BoxFrame {
     double width = 0;
     double height = 0;
     bool isFocus = false;
-    bool isOther = false;           // whom a kinship is about beside the focus
-    bool isCommonAncestor = false;  // at the top of a way
-    std::string caption;            // what the one of a kinship is to the other; at the lower or upper edge
-    bool captionOnTop = false;
-    double captionRoom = kCaptionReach;  // beyond that edge, to the next box with its marks
+    bool isOther = false;                          // whom a kinship is about beside the focus
+    bool isCommonAncestor = false;                 // at the top of a way
+    std::string caption;                           // what the one of a kinship is to the other
+    const picture::KinshipPlate* plate = nullptr;  // of the caption; in points
     // A person with several boxes has a number, the same in each; 0 for everybody else.
     int repeatNumber = 0;
     int repeatCount = 0;
@@ -46,6 +41,9 @@ struct BoxFrame {
     int hiddenCount() const { return box->hiddenParents + box->hiddenPartners + box->hiddenChildren; }
     bool hasHidden() const { return box->hasFlag ? box->flag : hiddenCount() > 0; }
 };
+
+// How plates of a kinship are drawn, in points.
+picture::PlateStyle plateStyle();
 
 // What is said of a person, each text cut to what can be read.
 kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id);

@@ -10,17 +10,14 @@
 #include <utility>
 
 #include <olvane/draw/DrawingWordsInternal.h>
+#include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 
 namespace olvane::draw {
 
 namespace {
 
-using picture::cleanText;
-using picture::cutText;
-using picture::Font;
 using picture::Side;
-using picture::textWidth;
 
 // All in px.
 constexpr double kWideBadgeInset = 2;  // at the foot of a wide box
@@ -28,7 +25,7 @@ constexpr double kCaptionSize = 10.5;
 constexpr double kCaptionPitch = 13;
 constexpr double kCaptionFrame = 5;   // above and below its lines together
 constexpr double kCaptionInside = 1;  // by which a caption reaches into the border of its box
-constexpr std::size_t kMostCaptionLines = 3;
+constexpr double kFrameReach = 7;     // of the frames around ends and common ancestors
 
 constexpr std::string_view kTwoUp = "\xE2\x87\x88";
 
@@ -78,14 +75,6 @@ void appendMarks(std::string& svg, const BoxFrame& box, Side place, const Drawin
         x += badge.width() + kBadgeInset / 2;
         appendBadgeAt(svg, y, badge, theme);
     }
-}
-
-// From the edge of a box to its caption, which touches the border, or the marks that stand at this edge.
-double captionGapOf(const BoxFrame& box) {
-    const Side place = box.captionOnTop ? Side::top : Side::bottom;
-    const bool hasMarks = std::any_of(box.marks.begin(), box.marks.end(),
-                                      [place](const BoxMark& mark) { return mark.place == place; });
-    return hasMarks ? kMarkOutside + 1 : -kCaptionInside;
 }
 
 }  // namespace
@@ -162,26 +151,33 @@ void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& them
     }
 }
 
-void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
-    if (box.caption.empty()) return;
-    const Font font{kCaptionSize, true};
-    const double lines = (box.captionRoom - captionGapOf(box) - kCaptionFrame) / kCaptionPitch;
-    const auto most = static_cast<std::size_t>(std::clamp<double>(lines, 1, kMostCaptionLines));
-    const picture::FittedText text =
-        picture::fitText(cleanText(cutText(box.caption)), font, box.width + kCaptionOver - 2 * kInset, most);
-    double width = 0;
-    for (const std::string& line : text.lines) width = std::max(width, textWidth(line, font));
-    width += 2 * kInset;
-    const double height = static_cast<double>(text.lines.size()) * kCaptionPitch + kCaptionFrame;
-    const double x = (box.width - width) / 2;
-    const double y = box.captionOnTop ? -captionGapOf(box) - height : box.height + captionGapOf(box);
+picture::PlateStyle plateStyle() {
+    constexpr double kScale = Frame::kScale;
+    picture::PlateStyle style;
+    style.letters = kCaptionSize / kScale;
+    style.pitch = kCaptionPitch / kScale;
+    style.inset = kInset / kScale;
+    style.frame = kCaptionFrame / kScale;
+    style.onBorder = kCaptionInside / kScale;
+    style.marks = (kMarkOutside + 1) / kScale;
+    style.frames = kFrameReach / kScale;
+    return style;
+}
+
+void appendPlate(std::string& svg, const BoxFrame& box, const DrawingTheme& theme) {
+    if (box.plate == nullptr) return;
+    constexpr double kScale = Frame::kScale;
+    const double x = (box.plate->x - box.box->x) * kScale;
+    const double y = (box.plate->y - box.box->y) * kScale;
+    const double width = box.plate->width * kScale;
     put(svg, "<rect x=\"", number(x), "\" y=\"", number(y), "\" width=\"", number(width), "\" height=\"",
-        number(height), "\" rx=\"6\" fill=\"", theme.focus, "\"/>\n");
+        number(box.plate->height * kScale), "\" rx=\"6\" fill=\"", theme.focus, "\"/>\n");
     double baseline = y + kCaptionPitch - 1.5;
-    for (const std::string& line : text.lines) {
-        appendTextLine(svg, box.width / 2, baseline, line, {kMiddle, {kCaptionSize, true}, theme.page});
+    for (const std::string& line : box.plate->lines) {
+        appendTextLine(svg, x + width / 2, baseline, line, {kMiddle, {kCaptionSize, true}, theme.page});
         baseline += kCaptionPitch;
     }
+    if (box.text != nullptr) box.text->add(kCaptionSize);
 }
 
 }  // namespace olvane::draw

@@ -78,7 +78,7 @@ void appendBadges(std::string& svg, const BoxFrame& box, const std::vector<Badge
 // The marks at the four edges.
 void appendMarks(std::string& svg, const BoxFrame& box, const DrawingTheme& theme);
 
-// What the person is to the other one of a kinship, on a plate outside the box. Nothing without a caption.
-void appendCaption(std::string& svg, const BoxFrame& box, const DrawingTheme& theme);
+// What the person is to the other one of a kinship, on a plate outside the box. Nothing without one.
+void appendPlate(std::string& svg, const BoxFrame& box, const DrawingTheme& theme);
 
 }  // namespace olvane::draw

@@ -55,18 +55,8 @@ struct Bounds {
     }
 };
 
-// Whether an upright line leaves the box downwards.
-bool hasLineBelow(const picture::Picture& picture, const picture::Box& box) {
-    const double lower = box.y + static_cast<double>(box.height);
-    const double right = box.x + static_cast<double>(box.width);
-    return std::any_of(picture.lines.begin(), picture.lines.end(), [&](const picture::Line& line) {
-        return line.x1 == line.x2 && line.x1 >= box.x && line.x1 <= right &&
-               std::min(line.y1, line.y2) == lower;
-    });
-}
-
-// Of boxes, lines and captions; of an empty picture, the room that its sentence needs.
-Bounds boundsOf(const picture::Picture& picture) {
+// Of boxes, lines and plates; of an empty picture, the room that its sentence needs.
+Bounds boundsOf(const picture::Picture& picture, const std::vector<picture::KinshipPlate>& plates) {
     if (picture.boxes.empty()) return {0, 0, 55, 80};
     const picture::Box& first = picture.boxes.front();
     Bounds bounds{first.x, first.y, first.x, first.y};
@@ -78,15 +68,9 @@ Bounds boundsOf(const picture::Picture& picture) {
         bounds.include(line.x1, line.y1);
         bounds.include(line.x2, line.y2);
     }
-    for (const picture::Index end : {picture.focus, picture.other}) {
-        if (picture.other == picture::kNone || end == picture::kNone) continue;
-        const picture::Box& box = picture.boxes[static_cast<std::size_t>(end)];
-        constexpr double kReach = kCaptionReach / Frame::kScale;
-        if (hasLineBelow(picture, box)) {
-            bounds.include(box.x, box.y - kReach);
-        } else {
-            bounds.include(box.x, box.y + static_cast<double>(box.height) + kReach);
-        }
+    for (const picture::KinshipPlate& plate : plates) {
+        bounds.include(plate.x, plate.y);
+        bounds.include(plate.right(), plate.bottom());
     }
     return bounds;
 }
@@ -102,7 +86,8 @@ public:
         : content_(content), options_(options) {}
 
     SvgPicture compose() {
-        const Bounds bounds = boundsOf(content_.picture);
+        placePlates();
+        const Bounds bounds = boundsOf(content_.picture, plates_);
         const int headline = options_.headline ? kHeadlineHeight : 0;
         frame_ = {bounds.left, bounds.top, kMargin, kMargin + headline};
         picture_.originX = frame_.x(0);
@@ -165,7 +150,7 @@ private:
         }
     }
 
-    // Of the ends of a kinship what they are to one another, on the edge that no line meets; and who is on top.
+    // Of the ends of a kinship what they are to one another; and who is on top.
     void addKinship(BoxFrame& frame, picture::Index place) const {
         const picture::Picture& picture = content_.picture;
         if (picture.other == picture::kNone) return;
@@ -176,22 +161,23 @@ private:
         } else if (frame.isFocus) {
             frame.caption = picture.focusIs;
         }
-        frame.captionOnTop = !frame.caption.empty() && hasLineBelow(picture, *frame.box);
-        if (!frame.caption.empty()) frame.captionRoom = captionRoomOf(*frame.box, frame.captionOnTop);
+        for (const picture::KinshipPlate& plate : plates_) {
+            if (plate.box == place) frame.plate = &plate;
+        }
     }
 
-    // To the marks of the next box above or below.
-    double captionRoomOf(const picture::Box& box, bool above) const {
-        constexpr double kBeside = kCaptionOver / 2 / Frame::kScale;
-        const auto right = [](const picture::Box& of) { return of.x + static_cast<double>(of.width); };
-        const auto foot = [](const picture::Box& of) { return of.y + static_cast<double>(of.height); };
-        double room = kCaptionReach;
-        for (const picture::Box& other : content_.picture.boxes) {
-            if (right(other) < box.x - kBeside || other.x > right(box) + kBeside) continue;
-            const double distance = above ? box.y - foot(other) : other.y - foot(box);
-            if (distance >= 0) room = std::min(room, distance * Frame::kScale - kMarkOutside);
+    void placePlates() {
+        if (content_.picture.other == picture::kNone) return;
+        std::vector<picture::MarkedEdges> marked;
+        for (const std::vector<BoxMark>& marks :
+             boxMarksOf(content_.picture, options_.language, content_.laterSide)) {
+            const auto isAt = [&marks](picture::Side side) {
+                return std::any_of(marks.begin(), marks.end(),
+                                   [side](const BoxMark& mark) { return mark.place == side; });
+            };
+            marked.push_back({isAt(picture::Side::top), isAt(picture::Side::bottom)});
         }
-        return room;
+        plates_ = picture::kinshipPlates(content_.picture, plateStyle(), marked);
     }
 
     void findCommonAncestors() {
@@ -302,6 +288,7 @@ private:
     SvgPicture picture_;
     std::unordered_map<std::int64_t, Repeats> repeats_;
     std::set<picture::Index> commonAncestors_;
+    std::vector<picture::KinshipPlate> plates_;
 };
 
 void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {

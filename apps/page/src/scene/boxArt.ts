@@ -5,7 +5,7 @@
 // left and lines beside it. Sex is shown by corners and silhouette as well as by colour. Colours come from the
 // page's themes.
 
-import type { BranchSize, NameParts, Sex, Texts } from "olvane";
+import type { BranchSize, KinshipPlate, NameParts, Sex, Texts } from "olvane";
 import { svg } from "../base/dom";
 import type { Box } from "../view/Picture";
 import { appendArc, lineClass } from "./arcArt";
@@ -52,8 +52,6 @@ export interface BoxLook {
     readonly folded: readonly BranchMark[];
     // What the mark of further parents says; empty without one.
     readonly further: string;
-    // What the one of a kinship is to the other, at both ends.
-    readonly caption: string;
     readonly kinshipPlace: Box["kinshipPlace"];
     // Numbers of the marks that lead to other boxes.
     readonly marks: readonly number[];
@@ -108,7 +106,7 @@ export function drawBox(look: BoxLook, sizes: Box): SVGGElement {
     if (look.hidden >= 0 && look.folded.length === 0) appendBadge(box, look, sizes);
     if (look.repeated) appendDuplicateMark(box);
     if (look.further) appendFurtherMark(box, look.further);
-    if (look.caption) appendCaption(box, look, sizes);
+    if (sizes.plate) box.append(drawPlate(sizes.plate, sizes));
     if (look.marks.length > 0) appendMarks(box, look, sizes);
     return box;
 }
@@ -367,22 +365,12 @@ function appendFurtherMark(box: SVGGElement, title: string): void {
     box.append(mark);
 }
 
-// Below the box, touching it or its marks.
-function appendCaption(box: SVGGElement, { caption, marks, texts }: BoxLook, { width, height }: Extent): void {
-    const room = width + 36;
-    const { lines } = texts.fitName({ given: caption, surname: "" }, { width: room - 16, height: 48, lines: 3 });
-    const wide = Math.min(room, Math.max(...lines.map((line) => texts.width(line, kKinSize, true))) + 16);
-    const top = marks.length > 0 ? height - kMarkInside + kMarkHeight + 1 : height - 2;
-    const plate = svg("g", { class: "caption", transform: `translate(${(width - wide) / 2} ${top})` });
-    plate.append(svg("rect", { width: wide, height: lines.length * 13 + 6, rx: 6 }));
+// What the one of a kinship is to the other, at a place outside the box that the module found.
+function drawPlate({ x, y, width, height, lines }: KinshipPlate, box: Box): SVGElement {
+    const plate = svg("g", { class: "caption", transform: `translate(${x - box.x} ${y - box.y})` });
+    plate.append(svg("rect", { width, height, rx: 6 }));
     lines.forEach((line, i) =>
-        plate.append(
-            svg(
-                "text",
-                { x: wide / 2, y: 13 + 13 * i, "aria-hidden": "true" },
-                texts.fitLine(line, kKinSize, room - 12, true),
-            ),
-        ),
+        plate.append(svg("text", { x: width / 2, y: 13 + 13 * i, "aria-hidden": "true" }, line)),
     );
-    box.append(plate);
+    return plate;
 }

@@ -5,7 +5,15 @@
 // box to box must know. Units are points, which the page draws as CSS pixels when not zoomed; (x, y) is an
 // upper-left corner.
 
-import type { FoldedBranch, PictureBox, PictureFamily, PictureMark, Picture as PictureValues, Sex } from "olvane";
+import type {
+    FoldedBranch,
+    KinshipPlate,
+    PictureBox,
+    PictureFamily,
+    PictureMark,
+    Picture as PictureValues,
+    Sex,
+} from "olvane";
 import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
 import type { ChartDirection, ViewName } from "../base/views";
 
@@ -32,6 +40,8 @@ export interface Box {
     readonly furtherParents: number;
     // In a picture of kinship: what the person at one end is to the one at the other; else empty.
     readonly caption: string;
+    // Of the caption; null without one.
+    readonly plate: KinshipPlate | null;
     // In a picture of kinship: at the end beside the focus, or at the top of a way.
     readonly kinshipPlace: "other" | "ancestor" | null;
     // Branches of the person that are left out.
@@ -89,7 +99,8 @@ export class Picture {
         const drawn = this.families.filter(({ family }) => family.lines.length > 0);
         this.boxGrid = new SpatialGrid(this.boxes.map(areaOf));
         this.lineGrid = new SpatialGrid(this.families.map(({ area }) => area));
-        this.bounds = boundsOf([...this.boxes.map(areaOf), ...drawn.map(({ area }) => area)]);
+        const plates = (values.kinship?.plates ?? []).map(areaOf);
+        this.bounds = boundsOf([...this.boxes.map(areaOf), ...plates, ...drawn.map(({ area }) => area)]);
         this.focusBox = this.boxes[values.focus] ?? this.byPerson.get(focus)?.[0] ?? this.boxes[0]!;
     }
 
@@ -142,6 +153,7 @@ export class Picture {
             ...{ index, key, person, child, sex, x, y, width, height, flag, hidden, furtherParents, arc },
             marks: marks.get(index) ?? [],
             caption: !kinship ? "" : index === kinship.other ? kinship.otherIs : index === focus ? kinship.focusIs : "",
+            plate: kinship?.plates.find((plate) => plate.box === index) ?? null,
             kinshipPlace: placeInKinship(index, kinship),
             folded: folded.filter((branch) => branch.box === index),
         };
@@ -204,7 +216,7 @@ function markNumbers(marks: readonly PictureMark[]): ReadonlyMap<number, number[
     return numbers;
 }
 
-function areaOf(box: Box): Rectangle {
+function areaOf(box: Pick<Box, "x" | "y" | "width" | "height">): Rectangle {
     return { left: box.x, top: box.y, right: box.x + box.width, bottom: box.y + box.height };
 }
 

@@ -78,8 +78,11 @@ export const kUsualState: ViewState = {
 // Boxes wide enough for most names, and rows far enough apart for the lines between them to be distinguished from
 // another.
 const kTall = { width: 118, height: 104, gapX: 22, gapY: 42 };
-const kTallWithPhoto = { ...kTall, height: kTall.height + 32 };
+const kPhotoHeight = 32; // that it adds to a tall box
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
+// Room for the lines of ways between rows, and for what the ends of a kinship are to one another.
+const kTallInKinship = { ...kTall, gapY: 58 };
+const kWideInKinship = { ...kWide, gapX: 44 };
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
 const kFactPitch = 14;
@@ -109,8 +112,10 @@ export function optionsOf(
 ): PictureOptions {
     const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact } = state;
     const { folded, mirrored } = state;
-    const tall = state.photos ? kTallWithPhoto : kTall;
-    const sizes = view === "pedigree" ? kPedigree : boxes === "wide" ? kWide : tall;
+    const usual = view === "kinship" ? kTallInKinship : kTall;
+    const tall = state.photos ? { ...usual, height: usual.height + kPhotoHeight } : usual;
+    const wide = view === "kinship" ? kWideInKinship : kWide;
+    const sizes = view === "pedigree" ? kPedigree : boxes === "wide" ? wide : tall;
     return {
         ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact, language },
         shown: shownBits(state),
