@@ -228,6 +228,33 @@ describe("options", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("no word of a kinship to twelve generations is cut or leaves its box, in any language", async () => {
+        for (const language of ["en", "de", "es"]) {
+            for (const direction of ["down", "left"]) {
+                const visit = await visitFamily(
+                    twelveGenerations(),
+                    {},
+                    {},
+                    `#person=I1&view=relatives&up=12&down=1&direction=${direction}&language=${language}`,
+                );
+                await visit.fit();
+                const words = await visit.page.evaluate(() =>
+                    all("#tree .kin").map((text) => {
+                        const own = text.getBoundingClientRect();
+                        const frame = text.parentElement.querySelector(".frame").getBoundingClientRect();
+                        return { text: text.textContent, leaves: own.left < frame.left || own.right > frame.right };
+                    }),
+                );
+                assert.ok(words.length > 30, `${words.length} words`);
+                assert.deepEqual(
+                    words.filter(({ text, leaves }) => leaves || text.includes("\u2026")),
+                    [],
+                );
+                await visit.end();
+            }
+        }
+    });
+
     test("kinship stands in the boxes, or not", async () => {
         const visit = await visitDarwins();
         assert.ok((await visit.page.locator("#tree .kin").count()) > 10);
@@ -243,4 +270,23 @@ describe("options", kTwoAtOnce, () => {
 async function allPersons(visit) {
     await visit.fit();
     return visit.shown();
+}
+
+// A line of couples; each generation has a son who leads on and a daughter who is married.
+function twelveGenerations() {
+    const lines = [];
+    for (let i = 0; i < 13; ++i) {
+        const [son, wife, sister, husband] = [1, 2, 3, 4].map((place) => `@I${4 * i + place}@`);
+        const [own, parents, hers] = [`@F${2 * i}@`, `@F${2 * i + 2}@`, `@F${2 * i + 1}@`];
+        lines.push(`0 ${son} INDI`, `1 NAME Alexander Maximilian ${i} /Hohenlohe-Langenburg/`, "1 SEX M");
+        lines.push(`1 BIRT`, `2 DATE ${2000 - 30 * i}`, `1 FAMS ${own}`, `1 FAMC ${parents}`);
+        lines.push(`0 ${wife} INDI`, `1 NAME Wilhelmine ${i} /Berg/`, "1 SEX F", `1 FAMS ${own}`);
+        lines.push(`0 ${sister} INDI`, `1 NAME Ida ${i} /Hohenlohe-Langenburg/`, "1 SEX F");
+        lines.push(`1 FAMC ${parents}`, `1 FAMS ${hers}`);
+        lines.push(`0 ${husband} INDI`, `1 NAME Otto ${i} /Holm/`, "1 SEX M", `1 FAMS ${hers}`);
+        lines.push(`0 ${hers} FAM`, `1 HUSB ${husband}`, `1 WIFE ${sister}`);
+        lines.push(`0 ${own} FAM`, `1 HUSB ${son}`, `1 WIFE ${wife}`);
+        if (i > 0) lines.push(`1 CHIL @I${4 * i - 3}@`, `1 CHIL @I${4 * i - 1}@`);
+    }
+    return gedcom(...lines, "0 @F26@ FAM", "1 CHIL @I49@", "1 CHIL @I51@");
 }

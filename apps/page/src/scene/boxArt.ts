@@ -155,20 +155,20 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
     const facts = factLines(look, room);
+    const kin = kinLines(look, room, () => true);
+    const kinHeight = look.kinship === null ? 0 : kLinePitch + kKinPitch * Math.max(0, kin.lines.length - 1);
+    const firstFact = lastLine - kinHeight - kLinePitch * Math.max(0, facts.length - 1);
+    const bottom = facts.length > 0 || look.kinship !== null ? firstFact - kYearsSize - 1 : nodeHeight - 6;
     // What a box is higher than usual, but for facts, is for the photograph.
-    const figureHeight = 22 + Math.max(0, nodeHeight - kUsualHeight - look.factHeight);
+    const fullHeight = 22 + Math.max(0, nodeHeight - kUsualHeight - look.factHeight);
+    const nameBelow = (figureHeight: number) =>
+        look.texts.fitName(look.name, { width: room, height: bottom - 9 - figureHeight, gap: 1, lines: 3 });
+    // A second line of kinship takes its room from the figure where the name would lose words.
+    const smallHeight = fullHeight - kKinPitch;
+    const isCrowded = kin.lines.length > 1 && !haveSameWords(nameBelow(fullHeight), nameBelow(smallHeight));
+    const figureHeight = isCrowded ? smallHeight : fullHeight;
+    const name = nameBelow(figureHeight);
     const top = 9 + figureHeight;
-    const lastFactAbove = (kinLines: number) =>
-        look.kinship === null ? lastLine : lastLine - kLinePitch - kKinPitch * Math.max(0, kinLines - 1);
-    const firstFactAbove = (kinLines: number) => lastFactAbove(kinLines) - kLinePitch * Math.max(0, facts.length - 1);
-    const bottomAbove = (kinLines: number) =>
-        facts.length > 0 || look.kinship !== null ? firstFactAbove(kinLines) - kYearsSize - 1 : nodeHeight - 6;
-    const nameAbove = (kinLines: number) =>
-        look.texts.fitName(look.name, { width: room, height: bottomAbove(kinLines) - top, gap: 1, lines: 3 });
-    const kin = kinLines(look, room, () => haveSameWords(nameAbove(1), nameAbove(2)));
-    const name = nameAbove(kin.lines.length);
-    const firstFact = firstFactAbove(kin.lines.length);
-    const bottom = bottomAbove(kin.lines.length);
     const pitch = name.size + (name.lines.length > 2 ? 1 : 2);
     const firstY = top + (bottom - top - name.lines.length * pitch) / 2 + name.size - 1;
 
@@ -227,11 +227,12 @@ interface SizedLines {
     readonly size: number;
 }
 
-// The fullest wording of a kinship that has room: in one line, or in two where the name does not suffer from it.
+// The fullest wording of a kinship that has room: in one line, or in two where the name does not suffer from it. The last
+// wording, which names no relation, stands only where no other one goes into two lines.
 function kinLines({ kinship, texts }: BoxLook, room: number, hasRoomForTwo: () => boolean): SizedLines {
     const wordings = kinship ?? [];
     const inTwo = (wording: string) => texts.fitLines(wording, kLeastKinSize, room, 2);
-    for (const wording of wordings) {
+    for (const wording of wordings.length > 1 ? wordings.slice(0, -1) : wordings) {
         const size = [kKinSize, kLeastKinSize].find((size) => texts.width(wording, size) <= room);
         if (size) return { lines: [wording], size };
         if (inTwo(wording).whole && hasRoomForTwo()) return { lines: inTwo(wording).lines, size: kLeastKinSize };
@@ -241,8 +242,10 @@ function kinLines({ kinship, texts }: BoxLook, room: number, hasRoomForTwo: () =
     return { lines, size: kLeastKinSize };
 }
 
+// However they are broken into lines.
 function haveSameWords(a: SizedLines, b: SizedLines): boolean {
-    return a.lines.join(" ") === b.lines.join(" ");
+    const letters = ({ lines }: SizedLines) => lines.join("").replaceAll(" ", "");
+    return letters(a) === letters(b);
 }
 
 // Years or dates, then the details.
