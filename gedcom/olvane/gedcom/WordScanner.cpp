@@ -38,7 +38,7 @@ bool WordScanner::skipIf(std::initializer_list<std::string_view> choices) {
 void WordScanner::findWord() {
     while (!rest_.empty() && isSpace(rest_.front())) rest_.remove_prefix(1);
     CharacterSort last = CharacterSort::space;  // of the last letter or digit
-    bool isClose = false;  // it stands here but for one separator, or one behind a point
+    bool isClose = false;                       // it stands here but for one separator, or one behind a point
     for (wordLength_ = 0; wordLength_ < rest_.size(); ++wordLength_) {
         const CharacterSort sort = kSorts[static_cast<unsigned char>(rest_[wordLength_])];
         if (sort == CharacterSort::space) return;
