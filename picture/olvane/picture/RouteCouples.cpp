@@ -95,8 +95,7 @@ bool RoutePlanner::planNeighbours(FamilyNet& net, Index a, Index b) {
 }
 
 // hasDrop: in the middle of the space, at half of the height; else above that, where it nests.
-std::optional<BoxSide> RoutePlanner::freeSide(Index f, Index box, bool toTheRight,
-                                                         bool hasDrop) const {
+std::optional<BoxSide> RoutePlanner::freeSide(Index f, Index box, bool toTheRight, bool hasDrop) const {
     const std::size_t r = rows_.row(box);
     BoxSide side;
     side.gap = rows_.block(box) + (toTheRight ? 1 : 0);
@@ -136,7 +135,8 @@ void RoutePlanner::takeSide(Index f, std::size_t r, const BoxSide& side, bool ha
 }
 
 // From the bar above down to the side, and on to a bar below where the family has children.
-void RoutePlanner::addSideVerticals(FamilyNet& net, Index barAbove, const BoxSide& side, std::size_t r, bool hasDrop) {
+void RoutePlanner::addSideVerticals(FamilyNet& net, Index barAbove, const BoxSide& side, std::size_t r,
+                                    bool hasDrop) {
     addVertical({net.family, kNone, LineRole::marriage, side.x, onBar(barAbove),
                  atRow(static_cast<Index>(r), side.y)});
     if (!hasDrop) return;
