@@ -93,7 +93,7 @@ private:
         for (std::int32_t person = 0; person < l_.part.personCount(); ++person) {
             widths.push_back(boxes_.width(l_.part, person));
         }
-        const KeptRows kept = rowsAsBefore(l_.part, l_.chains, *earlier_, widths);
+        const EarlierRows kept = rowsAsBefore(l_.part, l_.chains, *earlier_, widths);
         if (kept.rowOfChain.empty()) return false;
         l_.marked = marksForWantOfRoom(l_.part, l_.chains, roomForLines());
         if (options_.marks < 0) {

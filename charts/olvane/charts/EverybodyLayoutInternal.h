@@ -7,7 +7,7 @@
 #include <vector>
 
 #include <olvane/charts/Everybody.h>
-#include <olvane/charts/EverybodyKeptInternal.h>
+#include <olvane/charts/EverybodyEarlierInternal.h>
 #include <olvane/charts/EverybodyLinesInternal.h>
 #include <olvane/charts/EverybodyPlacesInternal.h>
 

@@ -67,6 +67,28 @@ void shuffle(RowOrder& order, std::uint32_t number) {
 constexpr std::int32_t kMostNodesToShuffle = 100;
 constexpr std::uint32_t kShuffles = 16;
 
+// The best order so far; fewer than 0 crossings before the first one.
+struct BestOrder {
+    RowOrder order;
+    std::int64_t crossings = -1;
+
+    void offer(RowOrder other, std::int64_t itsCrossings) {
+        if (crossings >= 0 && itsCrossings >= crossings) return;
+        order = std::move(other);
+        crossings = itsCrossings;
+    }
+};
+
+void tryRandomOrders(const Rows& rows, const RowOrder& walk, std::int64_t effort, BestOrder& best) {
+    for (std::uint32_t number = 1; number <= kShuffles && best.crossings > 0; ++number) {
+        RowOrder order = walk;
+        shuffle(order, number);
+        reduceCrossings(rows, order, effort);
+        const std::int64_t crossings = countCrossings(rows, order);
+        best.offer(std::move(order), crossings);
+    }
+}
+
 }  // namespace
 
 RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts, const ShareDone& done) {
@@ -76,30 +98,20 @@ RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts, const Shar
     const std::int64_t most = std::clamp<std::int64_t>(kStepsOfRounds / (rows.nodeCount() + 1), 60, 1500);
     RowOrder walk = walkOrder(rows);
     if (isForest(rows)) return walk;
-    RowOrder best;
-    std::int64_t fewest = -1;
-    for (int i = 0; i < starts && i < static_cast<int>(kShares.size()) && fewest != 0; ++i) {
+    BestOrder best;
+    for (int i = 0; i < starts && i < static_cast<int>(kShares.size()) && best.crossings != 0; ++i) {
         RowOrder order = walk;
         const int share = kShares[at(i)];
         if (share > 0) straightenOrder(rows, order, static_cast<int>(most / share));
         const auto doneOfAll = [&](double ofStart) { done((i + ofStart) / starts); };
         reduceCrossings(rows, order, effort / starts, done ? ShareDone(doneOfAll) : ShareDone());
         const std::int64_t crossings = starts > 1 ? countCrossings(rows, order) : 0;
-        if (fewest >= 0 && crossings >= fewest) continue;
-        fewest = crossings;
-        best = std::move(order);
+        best.offer(std::move(order), crossings);
     }
-    const bool shuffles = starts > 1 && rows.nodeCount() <= kMostNodesToShuffle;
-    for (std::uint32_t number = 1; shuffles && number <= kShuffles && fewest > 0; ++number) {
-        RowOrder order = walk;
-        shuffle(order, number);
-        reduceCrossings(rows, order, effort / starts);
-        const std::int64_t crossings = countCrossings(rows, order);
-        if (crossings >= fewest) continue;
-        fewest = crossings;
-        best = std::move(order);
+    if (starts > 1 && rows.nodeCount() <= kMostNodesToShuffle) {
+        tryRandomOrders(rows, walk, effort / starts, best);
     }
-    return best;
+    return std::move(best.order);
 }
 
 }  // namespace olvane::charts
