@@ -1,51 +1,23 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Each option knows the views that it changes; what would change nothing is refused, since it was meant to.
+// The options of views, with their help: what each does, and what it is when not given.
 
 #include <cli/ViewOptions.h>
 
-#include <algorithm>
 #include <map>
-#include <span>
-#include <vector>
 
 #include <CLI/CLI.hpp>
 
+#include <cli/FamilySwitches.h>
 #include <cli/OptionChecks.h>
-#include <cli/UsageError.h>
 
 namespace olvane::cli {
 
 namespace {
 
-constexpr int kMostPedigreeGenerations = 12;
 constexpr const char* kDepthGroup = "Views to any depth";
 constexpr const char* kKinshipGroup = "Kinship view";
-
-struct FamilySwitch {
-    const char* name;
-    bool olvane::LayoutOptions::*shown;
-    const char* pageName;  // in an address of a page
-    const char* help;
-};
-
-constexpr FamilySwitch kFamilySwitches[] = {
-    {"--no-aunts-uncles", &olvane::LayoutOptions::auntsUncles, "auntsUncles",
-     "Leave out siblings of the parents, and so cousins too"},
-    {"--no-cousins", &olvane::LayoutOptions::cousins, "cousins",
-     "Leave out children of the parents' siblings"},
-    {"--no-siblings", &olvane::LayoutOptions::siblings, "siblings", "Leave out siblings and half siblings"},
-    {"--no-sibling-spouses", &olvane::LayoutOptions::siblingSpouses, "siblingSpouses",
-     "Leave out spouses of the siblings"},
-    {"--no-nieces-nephews", &olvane::LayoutOptions::niecesNephews, "niecesNephews",
-     "Leave out children of the siblings"},
-    {"--no-grandchildren", &olvane::LayoutOptions::grandchildren, "grandchildren", "Leave out grandchildren"},
-    {"--no-great-grandparents", &olvane::LayoutOptions::greatGrandparents, "greatGrandparents",
-     "Leave out great-grandparents"},
-    {"--no-spouses-of-children", &olvane::LayoutOptions::spousesOfChildren, "spousesOfChildren",
-     "Leave out spouses of the children"},
-};
 
 const std::map<std::string, View>& views() {
     static const std::map<std::string, View> kViews = {
@@ -63,48 +35,10 @@ const std::map<std::string, View>& views() {
     return kViews;
 }
 
-// An option, and the views that it changes.
-struct OptionUse {
-    const char* option;
-    std::vector<View> views;
-};
-
-const std::vector<OptionUse>& optionUses() {
-    static const std::vector<View> kDirected = {View::near,      View::ancestors, View::descendants,
-                                                View::hourglass, View::relatives, View::kinship,
-                                                View::everybody};
-    static const std::vector<OptionUse> kUses = {
-        {"--generations",
-         {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--up", {View::ancestors, View::hourglass, View::relatives, View::fan}},
-        {"--down", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--direction", kDirected},
-        {"--compact",
-         {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives, View::kinship}},
-        {"--fold", {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives}},
-        {"--siblings", {View::ancestors, View::hourglass}},
-        {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--to", {View::kinship}},
-        {"--by", {View::kinship}},
-        {"--ways", {View::kinship}},
-        {"--language", {View::kinship}},
-        {"--marks", {View::everybody}},
-        {"--effort", {View::everybody}},
-        {"--all-parts", {View::everybody}},
-        {"--of", {View::fan}},
-        {"--angle", {View::fan}},
-    };
-    return kUses;
-}
-
 // A switch that sets what is on when not given to off. (The library's own flags of that sort show "{false}" in the help.)
 CLI::Option* addSwitchOff(CLI::App& command, const std::string& name, bool& isOn, const std::string& help) {
     return command.add_flag_callback(
         name, [&isOn] { isOn = false; }, help);
-}
-
-bool isGiven(const CLI::App& command, const char* option) {
-    return command.get_option_no_throw(option) != nullptr && command.count(option) > 0;
 }
 
 void addView(CLI::App& command, LayoutRequest& request) {
@@ -288,47 +222,6 @@ void addBoxes(CLI::App& command, LayoutRequest& request, const std::string& defa
         ->type_name("tall|wide");
 }
 
-void refuseIdle(const CLI::App& command, const char* option, std::span<const View> views, View view) {
-    if (!isGiven(command, option) || std::find(views.begin(), views.end(), view) != views.end()) return;
-    std::string text =
-        std::string(option) + " changes nothing in the view " + charts::nameOf(view) + ", but in";
-    const char* separator = " ";
-    for (const View other : views) {
-        text.append(separator).append(charts::nameOf(other));
-        separator = ", ";
-    }
-    throw UsageError(text);
-}
-
-void refuseIdleOptions(const CLI::App& command, View view) {
-    constexpr View kOfNearRelatives[] = {View::family, View::near};
-    for (const OptionUse& use : optionUses()) {
-        const bool isOfWords = (command.get_name() == "check" || command.get_name() == "draw") &&
-                               std::string_view(use.option) == "--language";
-        if (!isOfWords) refuseIdle(command, use.option, use.views, view);
-    }
-    for (const FamilySwitch& option : kFamilySwitches) {
-        refuseIdle(command, option.name, kOfNearRelatives, view);
-    }
-}
-
-// Counted with the focus's own in --generations, and from the focus on in a chart.
-void applyGenerations(const CLI::App& command, LayoutRequest& request) {
-    if (!isGiven(command, "--generations")) return;
-    if (request.view() == View::pedigree) {
-        if (request.chart.layout.generations >= 1 &&
-            request.chart.layout.generations <= kMostPedigreeGenerations)
-            return;
-        throw UsageError("--generations: a pedigree has 1 to " + std::to_string(kMostPedigreeGenerations) +
-                         " generations");
-    }
-    if (request.chart.layout.generations == 1)
-        throw UsageError("--generations: 1 would be the focus alone; 2 and more, or 0 for all");
-    const int others = std::max(request.chart.layout.generations - 1, 0);
-    if (!isGiven(command, "--up")) request.chart.up = others;
-    if (!isGiven(command, "--down")) request.chart.down = others;
-}
-
 }  // namespace
 
 void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string& boxDefaults) {
@@ -350,44 +243,6 @@ void addPageViewOptions(CLI::App& command, LayoutRequest& request) {
     addReach(command, request.chart);
     addOtherPerson(command, request);
     addFamilySwitches(command, request);
-}
-
-std::vector<std::string> pageViewOptionNames() {
-    std::vector<std::string> names{"--view", "--generations", "--up", "--down", "--direction", "--to"};
-    for (const FamilySwitch& option : kFamilySwitches) names.emplace_back(option.name);
-    return names;
-}
-
-std::string pageAddressOf(const CLI::App& command, const LayoutRequest& request) {
-    static const std::map<charts::Direction, const char*> kNames = {{charts::Direction::down, "down"},
-                                                                    {charts::Direction::up, "up"},
-                                                                    {charts::Direction::left, "left"},
-                                                                    {charts::Direction::right, "right"}};
-    const charts::ChartRequest& chart = request.chart;
-    const bool hasGenerations = isGiven(command, "--generations");
-    const bool isPedigree = request.view() == View::pedigree;
-    std::string address = std::string("view=") + charts::nameOf(request.view());
-    const auto add = [&address](const std::string& part) { address += "&" + part; };
-    if (isPedigree && hasGenerations) add("generations=" + std::to_string(chart.layout.generations));
-    if (isGiven(command, "--up") || (hasGenerations && !isPedigree)) add("up=" + std::to_string(chart.up));
-    if (isGiven(command, "--down") || (hasGenerations && !isPedigree)) {
-        add("down=" + std::to_string(chart.down));
-    }
-    if (isGiven(command, "--direction")) add(std::string("direction=") + kNames.at(chart.direction));
-    std::string hidden;
-    for (const FamilySwitch& option : kFamilySwitches) {
-        if (chart.layout.*option.shown) continue;
-        hidden += (hidden.empty() ? "" : ",") + std::string(option.pageName);
-    }
-    if (!hidden.empty()) add("hide=" + hidden);
-    return address;
-}
-
-void completeViewOptions(const CLI::App& command, LayoutRequest& request) {
-    refuseIdleOptions(command, request.view());
-    applyGenerations(command, request);
-    if (request.view() == View::kinship && request.to.empty())
-        throw UsageError("the view kinship needs --to");
 }
 
 }  // namespace olvane::cli
