@@ -8,7 +8,7 @@
 
 #include <algorithm>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

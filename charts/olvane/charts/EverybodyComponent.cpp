@@ -6,8 +6,8 @@
 #include <algorithm>
 #include <numeric>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -7,8 +7,8 @@
 #include <limits>
 
 #include <olvane/charts/EverybodyReachInternal.h>
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -9,7 +9,7 @@
 #include <map>
 #include <utility>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

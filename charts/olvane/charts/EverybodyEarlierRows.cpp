@@ -10,8 +10,8 @@
 #include <limits>
 #include <map>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

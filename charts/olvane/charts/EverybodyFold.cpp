@@ -5,7 +5,7 @@
 
 #include <algorithm>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -6,7 +6,7 @@
 
 #include <olvane/charts/PartLayouterInternal.h>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -10,7 +10,7 @@
 #include <algorithm>
 #include <limits>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -11,8 +11,8 @@
 #include <array>
 #include <queue>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -10,7 +10,7 @@
 #include <utility>
 
 #include <olvane/charts/EverybodyReachInternal.h>
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -13,7 +13,7 @@
 #include <cmath>
 #include <limits>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

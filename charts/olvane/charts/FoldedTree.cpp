@@ -14,7 +14,7 @@
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/HiddenRelativesInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 #include <olvane/picture/Extent.h>
 
 namespace olvane::charts {

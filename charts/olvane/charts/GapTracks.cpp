@@ -7,7 +7,7 @@
 #include <cmath>
 #include <limits>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

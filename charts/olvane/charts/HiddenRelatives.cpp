@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <span>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -16,7 +16,7 @@
 
 #include <olvane/charts/Everybody.h>
 #include <olvane/charts/MapLabelsInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/Picture.h>
 
 namespace olvane::charts {

@@ -10,7 +10,7 @@
 #include <cstddef>
 #include <tuple>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -10,7 +10,7 @@
 #include <string>
 
 #include <olvane/boundary/TypedLayout.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

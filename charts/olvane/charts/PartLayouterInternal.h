@@ -10,7 +10,7 @@
 
 #include <olvane/charts/EverybodyLayoutInternal.h>
 #include <olvane/charts/EverybodyMarksInternal.h>
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -9,8 +9,8 @@
 #include <vector>
 
 #include <olvane/charts/ViewRequest.h>
-#include <olvane/kin/Index.h>
 #include <olvane/kin/KinGraph.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::charts {
 

@@ -11,7 +11,7 @@
 #include <vector>
 
 #include <olvane/charts/NearPersonsInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::charts {
 

@@ -17,7 +17,7 @@
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/Circle.h>
 #include <olvane/picture/TextFit.h>
 

@@ -12,7 +12,7 @@
 
 #include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/MarriageLabels.h>
 #include <olvane/picture/TextFit.h>
 

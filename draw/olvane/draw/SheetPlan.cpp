@@ -12,7 +12,7 @@
 #include <stdexcept>
 #include <utility>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/Extent.h>
 
 namespace olvane::draw {

@@ -15,7 +15,7 @@
 #include <olvane/draw/PicturePartInternal.h>
 #include <olvane/draw/SheetMapInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {

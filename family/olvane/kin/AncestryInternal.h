@@ -8,8 +8,8 @@
 #include <span>
 #include <vector>
 
-#include <olvane/kin/Index.h>
 #include <olvane/kin/KinLinksInternal.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::kin {
 

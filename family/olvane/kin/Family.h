@@ -11,9 +11,9 @@
 #include <vector>
 
 #include <olvane/Export.h>
-#include <olvane/kin/FamilyColumns.h>
 #include <olvane/kin/FamilyError.h>
 #include <olvane/kin/KinGraph.h>
+#include <olvane/kin/detail/FamilyColumns.h>
 
 namespace olvane {
 

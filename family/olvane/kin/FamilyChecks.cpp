@@ -10,7 +10,7 @@
 
 #include <olvane/boundary/HostText.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::detail {
 

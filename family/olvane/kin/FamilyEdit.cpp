@@ -9,7 +9,7 @@
 #include <iterator>
 #include <memory>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane {
 

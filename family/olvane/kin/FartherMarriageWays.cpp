@@ -8,10 +8,10 @@
 #include <limits>
 #include <unordered_map>
 
-#include <olvane/kin/Index.h>
 #include <olvane/kin/KinSumsInternal.h>
 #include <olvane/kin/MarriageWaysInternal.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::kin {
 

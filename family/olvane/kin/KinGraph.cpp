@@ -11,7 +11,7 @@
 #include <string>
 #include <utility>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::kin {
 

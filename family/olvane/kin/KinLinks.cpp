@@ -10,7 +10,7 @@
 #include <array>
 #include <unordered_map>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::kin {
 

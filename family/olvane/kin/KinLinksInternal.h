@@ -8,9 +8,9 @@
 #include <span>
 #include <vector>
 
-#include <olvane/kin/Index.h>
 #include <olvane/kin/KinGraph.h>
 #include <olvane/kin/Kinship.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::kin {
 

@@ -8,7 +8,7 @@
 #include <vector>
 
 #include <olvane/kin/AncestryInternal.h>
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::kin {
 

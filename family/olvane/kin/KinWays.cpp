@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <limits>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::kin {
 

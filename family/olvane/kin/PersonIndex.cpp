@@ -12,7 +12,7 @@
 #include <numeric>
 
 #include <olvane/kin/Folding.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::kin {
 

@@ -10,7 +10,7 @@
 #include <string_view>
 #include <utility>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomLives.h>
 

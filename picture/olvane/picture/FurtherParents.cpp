@@ -5,7 +5,7 @@
 
 #include <algorithm>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::picture {
 

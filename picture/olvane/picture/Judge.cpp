@@ -11,7 +11,7 @@
 #include <cmath>
 #include <unordered_map>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 #include <olvane/picture/PictureJudgeInternal.h>
 
 namespace olvane::picture {

@@ -10,7 +10,7 @@
 #include <cmath>
 #include <map>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::picture {
 

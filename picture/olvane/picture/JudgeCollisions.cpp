@@ -9,7 +9,7 @@
 
 #include <algorithm>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 #include <olvane/picture/RectSweepInternal.h>
 
 namespace olvane::picture {

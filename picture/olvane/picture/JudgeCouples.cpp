@@ -9,7 +9,7 @@
 #include <algorithm>
 #include <cmath>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::picture {
 

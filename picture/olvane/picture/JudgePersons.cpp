@@ -10,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::picture {
 

@@ -10,7 +10,7 @@
 #include <cmath>
 #include <vector>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 #include <olvane/picture/Extent.h>
 
 namespace olvane::picture {

@@ -9,7 +9,7 @@
 #include <limits>
 #include <map>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 
 namespace olvane::picture {
 

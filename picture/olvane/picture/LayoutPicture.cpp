@@ -14,8 +14,8 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/FurtherParents.h>
 
 namespace olvane::picture {

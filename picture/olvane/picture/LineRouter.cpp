@@ -13,8 +13,8 @@
 #include <tuple>
 #include <utility>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/ChannelTracksInternal.h>
 #include <olvane/picture/RoutePlanInternal.h>
 #include <olvane/picture/RowsInternal.h>

@@ -13,7 +13,7 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::picture {
 

@@ -11,7 +11,7 @@
 #include <tuple>
 #include <utility>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::picture {
 

@@ -8,7 +8,7 @@
 #include <span>
 #include <vector>
 
-#include <olvane/kin/Index.h>
+#include <olvane/kin/shared/Index.h>
 #include <olvane/picture/LaneOccupancyInternal.h>
 #include <olvane/picture/RoutePlanInternal.h>
 

@@ -10,7 +10,7 @@
 #include <tuple>
 #include <utility>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::picture {
 

@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <numeric>
 
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::picture {
 

@@ -12,8 +12,8 @@
 #include <cstdlib>
 #include <tuple>
 
-#include <olvane/kin/Index.h>
-#include <olvane/kin/MergeSort.h>
+#include <olvane/kin/shared/Index.h>
+#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/PieceGeometryInternal.h>
 
 namespace olvane::picture {
