@@ -9,8 +9,8 @@
 #include <olvane/charts/FoldingInternal.h>
 #include <olvane/charts/SelectionInternal.h>
 #include <olvane/charts/TreeChartInternal.h>
-#include <olvane/picture/FurtherParents.h>
-#include <olvane/picture/Mirror.h>
+#include <olvane/picture/shared/FurtherParents.h>
+#include <olvane/picture/shared/Mirror.h>
 
 #include <cmath>
 #include <stdexcept>

@@ -10,7 +10,7 @@
 #include <utility>
 
 #include <olvane/charts/Charts.h>
-#include <olvane/picture/Circle.h>
+#include <olvane/picture/shared/Circle.h>
 
 namespace olvane::charts {
 

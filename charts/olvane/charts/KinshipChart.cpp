@@ -7,7 +7,7 @@
 
 #include <olvane/kin/Kinship.h>
 #include <olvane/kin/KinshipText.h>
-#include <olvane/picture/WayLines.h>
+#include <olvane/picture/shared/WayLines.h>
 
 namespace olvane::charts {
 

@@ -9,7 +9,7 @@
 #include <olvane/kin/FamilyAround.h>
 #include <olvane/kin/FamilyDataSource.h>
 #include <olvane/picture/LayoutPicture.h>
-#include <olvane/picture/Mirror.h>
+#include <olvane/picture/shared/Mirror.h>
 
 namespace olvane::charts {
 

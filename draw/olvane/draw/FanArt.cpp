@@ -18,8 +18,8 @@
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/kin/shared/MergeSort.h>
-#include <olvane/picture/Circle.h>
 #include <olvane/picture/TextFit.h>
+#include <olvane/picture/shared/Circle.h>
 
 namespace olvane::draw {
 

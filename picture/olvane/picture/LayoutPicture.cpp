@@ -16,7 +16,7 @@
 
 #include <olvane/kin/shared/Index.h>
 #include <olvane/kin/shared/MergeSort.h>
-#include <olvane/picture/FurtherParents.h>
+#include <olvane/picture/shared/FurtherParents.h>
 
 namespace olvane::picture {
 

@@ -11,8 +11,8 @@
 
 #include <nlohmann/json.hpp>
 
-#include <olvane/picture/Circle.h>
 #include <olvane/picture/PictureNames.h>
+#include <olvane/picture/shared/Circle.h>
 
 namespace olvane::picture {
 

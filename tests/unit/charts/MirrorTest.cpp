@@ -18,7 +18,7 @@
 #include <olvane/charts/LaterSide.h>
 #include <olvane/charts/Views.h>
 #include <olvane/picture/Judge.h>
-#include <olvane/picture/Mirror.h>
+#include <olvane/picture/shared/Mirror.h>
 
 namespace olvane::charts {
 namespace {

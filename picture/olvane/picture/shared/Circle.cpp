@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/picture/Circle.h>
+#include <olvane/picture/shared/Circle.h>
 
 #include <algorithm>
 #include <cmath>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/picture/FurtherParents.h>
+#include <olvane/picture/shared/FurtherParents.h>
 
 #include <algorithm>
 

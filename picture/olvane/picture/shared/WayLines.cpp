@@ -5,7 +5,7 @@
 // a piece that touches the other. All steps of a way become one set of pieces, in which what lies on one line is
 // joined, so that dashes are drawn once wherever the way comes and goes by the same line.
 
-#include <olvane/picture/WayLines.h>
+#include <olvane/picture/shared/WayLines.h>
 
 #include <algorithm>
 #include <cmath>

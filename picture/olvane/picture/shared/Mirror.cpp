@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/picture/Mirror.h>
+#include <olvane/picture/shared/Mirror.h>
 
 #include <algorithm>
 #include <cstddef>
