@@ -7,7 +7,7 @@
 #include <vector>
 
 #include <olvane/draw/Paper.h>
-#include <olvane/draw/PictureArea.h>
+#include <olvane/draw/detail/PictureArea.h>
 #include <olvane/picture/Picture.h>
 
 namespace olvane::draw {

@@ -12,7 +12,7 @@
 #include <vector>
 
 #include <olvane/draw/DrawingTheme.h>
-#include <olvane/draw/PictureArea.h>
+#include <olvane/draw/detail/PictureArea.h>
 #include <olvane/kin/Language.h>
 #include <olvane/kin/PersonLabel.h>
 #include <olvane/picture/Picture.h>
