@@ -5,8 +5,8 @@
 #include <string>
 #include <string_view>
 
-#include <olvane/gedcom/DiagnosticSentence.h>
 #include <olvane/gedcom/EncodingTableInternal.h>
+#include <olvane/gedcom/detail/DiagnosticSentence.h>
 
 namespace olvane::gedcom {
 

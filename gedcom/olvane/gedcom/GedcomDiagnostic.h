@@ -8,7 +8,7 @@
 #include <string_view>
 #include <vector>
 
-#include <olvane/gedcom/DiagnosticSentence.h>
+#include <olvane/gedcom/detail/DiagnosticSentence.h>
 
 namespace olvane::gedcom {
 
