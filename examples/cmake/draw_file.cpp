@@ -8,13 +8,9 @@
 #include <iostream>
 #include <memory>
 
-#include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Views.h>
 #include <olvane/draw/SvgDrawing.h>
-#include <olvane/gedcom/GedcomReader.h>
-#include <olvane/source/GedcomDataSource.h>
-#include <olvane/source/GedcomKin.h>
-#include <olvane/source/GedcomLabels.h>
+#include <olvane/source/GedcomSource.h>
 
 int main(int argc, char** argv) {
     if (argc != 3) {

@@ -8,6 +8,7 @@
 
 #include <olvane/Export.h>
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
+#include <olvane/charts/BoxForm.h>  // IWYU pragma: export
 #include <olvane/charts/Charts.h>
 #include <olvane/kin/Family.h>
 

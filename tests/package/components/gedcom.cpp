@@ -7,8 +7,7 @@
 #include <memory>
 
 #include <olvane/boundary/FamilyViewLayout.h>
-#include <olvane/gedcom/GedcomReader.h>
-#include <olvane/source/GedcomDataSource.h>
+#include <olvane/source/GedcomSource.h>
 
 int main() {
     const auto data = olvane::gedcom::readGedcomBytes(
