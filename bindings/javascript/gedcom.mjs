@@ -1,8 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A GEDCOM file that the module has read. Persons and families come over once, as one JSON text of arrays; facts
-// when they are asked for.
+// A GEDCOM file that the module has read. Persons and families come over once, as rows; facts when they are asked for.
 
 import { GedcomError, LayoutError } from "./errors.mjs";
 import { Instance } from "./instance.mjs";
@@ -12,61 +11,14 @@ import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
 import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers, usualBoxesFrom } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
+import { appendPart, MARKS, partsOf } from "./rows.mjs";
 import { searchWith } from "./search.mjs";
 import { Texts } from "./texts.mjs";
-
-const SEXES = ["male", "female", "other"];
-const MARKS = ["exact", "about", "before", "after", "between"];
-const PEDIGREES = ["notGiven", "birth", "adopted", "foster", "sealing", "other", "step"];
 
 function dateFrom(values) {
     if (values === 0) return null;
     const [written, year, month, day, mark, lastYear, shown, period] = values;
     return { written, year, month, day, mark: MARKS[mark], lastYear, shown, period: period !== 0 };
-}
-
-function parentFamiliesFrom(values) {
-    const families = [];
-    for (let i = 0; i < values.length; i += 2) {
-        families.push({ family: values[i], pedigree: PEDIGREES[values[i + 1]] });
-    }
-    return families;
-}
-
-function personFrom(values, index) {
-    const [xref, names, given, surname, sex, dead, birth, death, father, mother, spouses, children] = values;
-    return {
-        id: index + 1,
-        xref,
-        name: names[0] ?? "",
-        given,
-        surname,
-        names,
-        sex: SEXES[sex],
-        dead: dead !== 0,
-        birth: dateFrom(birth),
-        death: dateFrom(death),
-        father,
-        mother,
-        spouses,
-        children,
-        parentFamilies: parentFamiliesFrom(values[12]),
-        coupleFamilies: values[13],
-        surnameFirst: values[14] !== 0,
-        shownName: values[15] ?? names[0] ?? "",
-    };
-}
-
-function familyFrom([husband, wife, children, married, divorced, marriage], index) {
-    return {
-        id: index + 1,
-        husband,
-        wife,
-        children,
-        married: married !== 0,
-        divorced: divorced !== 0,
-        marriage: dateFrom(marriage),
-    };
 }
 
 function factFrom([tag, value, date, place]) {
@@ -123,23 +75,27 @@ function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes,
 // Closes what nobody holds any more and nobody closed.
 const unclosed = new FinalizationRegistry(({ instance, file }) => instance.exports.gedcom_close(file));
 
+function tablesOf(instance, file) {
+    const tables = { persons: [], families: [] };
+    for (const part of partsOf(instance, file)) appendPart(tables, part);
+    return tables;
+}
+
 export class GedcomFile {
     #instance;
     #file;
     #token = {};
 
-    constructor(instance, file, name, table = undefined) {
+    constructor(instance, file, name, { persons, families } = tablesOf(instance, file)) {
         this.#instance = instance;
         this.#file = file;
         this.name = name;
         this.texts = new Texts(instance);
-        const [encoding, version, persons, families, diagnostics] = table
-            ? JSON.parse(table)
-            : this.#answer("gedcom_table");
+        const [encoding, version, diagnostics] = this.#answer("gedcom_head");
         this.encoding = encoding;
         this.version = version;
-        this.persons = persons.map(personFrom);
-        this.families = families.map(familyFrom);
+        this.persons = persons;
+        this.families = families;
         this.diagnostics = diagnostics.map(diagnosticFrom);
         unclosed.register(this, { instance, file }, this.#token);
     }
@@ -350,6 +306,7 @@ export function readGedcom(instance, bytes, name, { encoding = "" } = {}) {
 }
 
 export function readGedcomIn(worker, { module }, bytes, name, { encoding = "", onProgress, signal } = {}) {
+    const tables = { persons: [], families: [] };
     return new Promise((done, failed) => {
         const fail = (error) => {
             worker.terminate();
@@ -357,11 +314,12 @@ export function readGedcomIn(worker, { module }, bytes, name, { encoding = "", o
         };
         signal?.addEventListener("abort", () => fail(signal.reason), { once: true });
         worker.onerror = (event) => fail(new Error(event.message || "the worker could not be started"));
-        worker.onmessage = async ({ data: { part, file, table, memory, refused, message } }) => {
+        worker.onmessage = async ({ data: { part, rows, file, memory, refused, message } }) => {
             if (part !== undefined) return onProgress?.(part);
             if (message !== undefined) return fail(refused ? new GedcomError(message) : new Error(message));
+            if (rows !== undefined) return appendPart(tables, rows);
             try {
-                done(new GedcomFile(await Instance.withMemory(module, memory), file, name, table));
+                done(new GedcomFile(await Instance.withMemory(module, memory), file, name, tables));
             } catch (error) {
                 fail(error);
             }

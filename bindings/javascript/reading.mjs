@@ -5,6 +5,7 @@
 
 import { GedcomError } from "./errors.mjs";
 import { Instance } from "./instance.mjs";
+import { partsOf } from "./rows.mjs";
 
 /** The module's pointer to the open file. Throws GedcomError. */
 export function openFile(instance, bytes, name, encoding) {
@@ -30,11 +31,12 @@ export function serveReading(scope) {
             const instance = await Instance.of(module);
             instance.onProgress = (part) => scope.postMessage({ part });
             const file = openFile(instance, bytes, name, encoding);
-            const pointer = instance.exports.gedcom_table(file);
-            if (pointer === 0) throw new GedcomError(instance.text(instance.exports.last_text()));
-            const table = instance.text(pointer);
+            // The page makes persons of each part while the next is written.
+            for (const rows of partsOf(instance, file))
+                scope.postMessage({ rows }, [rows.numbers.buffer, rows.texts.buffer]);
+            instance.exports.gedcom_prepare(file);
             const memory = instance.memoryCopy();
-            scope.postMessage({ file, table, memory }, [memory.buffer]);
+            scope.postMessage({ file, memory }, [memory.buffer]);
             setTimeout(() => scope.close(), AFTERLIFE);
         } catch (error) {
             scope.postMessage({ refused: error instanceof GedcomError, message: String(error.message) });

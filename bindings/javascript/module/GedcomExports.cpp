@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A GEDCOM file in the module's memory: opened from bytes, written as JSON in the order that Gedcom.mjs reads, laid
-// out, closed. What is written once per person is kept short; facts are written when somebody asks for them.
+// A GEDCOM file in the module's memory: opened from bytes, laid out, closed. Its persons and families are handed over by
+// GedcomRows.cpp; facts are written as JSON, in the order that gedcom.mjs reads, when somebody asks for them.
 
 #include <cstddef>
 #include <exception>
@@ -15,7 +15,6 @@
 #include <olvane/gedcom/GedcomEncodings.h>
 #include <olvane/gedcom/GedcomMedia.h>
 #include <olvane/gedcom/GedcomReader.h>
-#include <olvane/picture/TextMetrics.h>
 #include <olvane/source/GedcomLabels.h>
 #include <olvane/source/LimitedDataSource.h>
 
@@ -38,81 +37,6 @@ std::string lastText;
 
 namespace {
 
-template <class Ids>
-void writeIds(JsonText& json, const Ids& ids) {
-    json.begin();
-    for (const auto id : ids) json.number(id);
-    json.end();
-}
-
-void writeNames(JsonText& json, std::span<const gedcom::PersonName> names) {
-    json.begin();
-    for (const gedcom::PersonName& name : names) json.string(gedcom::displayName(name));
-    json.end();
-}
-
-void writeParentFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
-    json.begin();
-    for (const gedcom::FamilyLink& link : links) {
-        if (link.family == 0) continue;
-        json.number(link.family);
-        json.number(static_cast<int>(link.pedigree));
-    }
-    json.end();
-}
-
-void writeCoupleFamilies(JsonText& json, std::span<const gedcom::FamilyLink> links) {
-    json.begin();
-    for (const gedcom::FamilyLink& link : links) {
-        if (link.family != 0) json.number(link.family);
-    }
-    json.end();
-}
-
-// The name as it is shown, where that is not the whole.
-void writeCutName(JsonText& json, const gedcom::PersonName& name) {
-    const std::string whole = gedcom::displayName(name);
-    if (whole.size() > picture::kMostTextBytes) json.string(picture::cutText(whole));
-}
-
-void writePerson(JsonText& json, const gedcom::GedcomData& data, gedcom::PersonId id) {
-    const gedcom::Person& person = data.person(id);
-    json.begin();
-    json.string(person.xref);
-    writeNames(json, data.names(id));
-    json.string(data.firstName(id).given);
-    json.string(data.firstName(id).surname);
-    json.number(static_cast<int>(person.sex));
-    json.number(person.dead ? 1 : 0);
-    appendDate(json, person.birth);
-    appendDate(json, person.death);
-    json.number(person.father);
-    json.number(person.mother);
-    writeIds(json, data.spouses(id));
-    writeIds(json, data.children(id));
-    writeParentFamilies(json, data.parentLinks(id));
-    writeCoupleFamilies(json, data.coupleLinks(id));
-    json.number(gedcom::isSurnameFirst(data.firstName(id)) ? 1 : 0);
-    writeCutName(json, data.firstName(id));
-    json.end();
-}
-
-void writeFamily(JsonText& json, const gedcom::GedcomData& data, gedcom::FamilyId id) {
-    const gedcom::Family& family = data.family(id);
-    json.begin();
-    json.number(family.husband);
-    json.number(family.wife);
-    json.begin();
-    for (const gedcom::ChildLink& link : data.childLinks(id)) {
-        if (link.child != 0) json.number(link.child);
-    }
-    json.end();
-    json.number(family.married ? 1 : 0);
-    json.number(family.divorced ? 1 : 0);
-    appendDate(json, family.marriage);
-    json.end();
-}
-
 void write(JsonText& json, const gedcom::DiagnosticPhrase& phrase) {
     json.begin();
     json.string(gedcom::sentenceName(phrase.sentence));
@@ -133,17 +57,12 @@ void write(JsonText& json, const gedcom::Diagnostic& diagnostic) {
     json.end();
 }
 
-std::string tableOf(const gedcom::GedcomData& data) {
+// What is said of the file as a whole.
+std::string headOf(const gedcom::GedcomData& data) {
     JsonText json;
     json.begin();
     json.string(data.encoding());
     json.string(data.version());
-    json.begin();
-    for (gedcom::PersonId id = 1; id <= data.personCount(); ++id) writePerson(json, data, id);
-    json.end();
-    json.begin();
-    for (gedcom::FamilyId id = 1; id <= data.familyCount(); ++id) writeFamily(json, data, id);
-    json.end();
     json.begin();
     for (const gedcom::Diagnostic& diagnostic : data.diagnostics()) write(json, diagnostic);
     json.end();
@@ -189,8 +108,8 @@ OpenFile* gedcomOpen(const char* bytes, std::size_t length, const char* name, co
 }
 
 // Texts live until the next call that gives one; null where there is none, and last_text says why.
-OLVANE_EXPORT("gedcom_table") const char* gedcomTable(const OpenFile* file) {
-    return js::textOrRefusal([&] { return js::tableOf(file->data); });
+OLVANE_EXPORT("gedcom_head") const char* gedcomHead(const OpenFile* file) {
+    return js::textOrRefusal([&] { return js::headOf(file->data); });
 }
 
 OLVANE_EXPORT("gedcom_person_facts") const char* gedcomPersonFacts(const OpenFile* file, std::uint32_t id) {

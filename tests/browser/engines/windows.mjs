@@ -9,6 +9,7 @@ import { existsSync } from "node:fs";
 import { constants, inflateSync } from "node:zlib";
 import puppeteer from "puppeteer-core";
 
+const kPatience = 60_000; // ms, for one answer of a driver
 const kSize = { width: 1280, height: 800 };
 const kElement = "element-6066-11e4-a52e-4f735466cecf";
 const kChromium = process.env.OLVANE_CHROMIUM ?? "/usr/bin/chromium";
@@ -46,6 +47,7 @@ class PuppeteerWindow {
         const window = new PuppeteerWindow();
         window.name = name;
         window.browser = await puppeteer.launch({ headless: true, defaultViewport: kSize, ...settings });
+        window.process = window.browser.process();
         window.page = await window.browser.newPage();
         await window.page.setViewport(kSize);
         return window;
@@ -98,7 +100,7 @@ class WebDriverWindow {
         const window = new WebDriverWindow();
         window.name = name;
         const port = 4500 + Math.floor(Math.random() * 400);
-        window.driver = spawn(kWebKitDriver, [`--port=${port}`], { stdio: "ignore" });
+        window.process = spawn(kWebKitDriver, [`--port=${port}`], { stdio: "ignore" });
         window.base = `http://127.0.0.1:${port}`;
         await window.untilListening();
         const binary = kMiniBrowsers.find((path) => existsSync(path));
@@ -124,7 +126,8 @@ class WebDriverWindow {
     }
 
     async send(method, path, body) {
-        const response = await fetch(this.base + path, { method, body: body && JSON.stringify(body) });
+        const signal = AbortSignal.timeout(kPatience);
+        const response = await fetch(this.base + path, { method, body: body && JSON.stringify(body), signal });
         const { value } = await response.json();
         if (value?.error) throw new Error(`${value.error}: ${value.message}`);
         return value;
@@ -190,7 +193,7 @@ class WebDriverWindow {
 
     async close() {
         await this.send("DELETE", "").catch(() => {});
-        this.driver.kill();
+        this.process.kill();
     }
 }
 
