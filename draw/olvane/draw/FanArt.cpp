@@ -14,6 +14,7 @@
 
 #include <olvane/draw/BoxArtInternal.h>
 #include <olvane/draw/DrawingWordsInternal.h>
+#include <olvane/draw/FanTextsInternal.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
@@ -39,10 +40,8 @@ constexpr int kHeadlineHeight = 40;
 constexpr double kPad = 4;
 constexpr double kBorder = 1;
 constexpr double kFocusBorder = 4;
-constexpr double kLargestName = 13;
-constexpr double kLeastName = 6;
-constexpr double kLeastAcross = 44;   // less room than this across a cell, and the name follows the radius
-constexpr double kYearsShare = 0.85;  // of the size of names
+constexpr double kLeastAcross = 44;      // less room than this across a cell, and the name follows the radius
+constexpr double kUsualTextHeight = 39;  // of two lines of a name and one of years
 constexpr int kLegendPitch = 22;
 constexpr double kLegendSize = 11.5;
 
@@ -63,11 +62,6 @@ std::size_t coloursInTurn(std::size_t lines) {
 bool isDark(std::string_view colour) {
     return colour.size() == 7 && colour[1] < '8';
 }
-
-struct TextLine {
-    std::string text;
-    bool bold = false;
-};
 
 class FanDrawer {
 public:
@@ -232,39 +226,76 @@ private:
         return title;
     }
 
-    // Names as two lines, years with the signs of marks as the third.
-    std::vector<TextLine> textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) const {
-        std::vector<TextLine> lines;
+    // The facts are years, and behind them the signs of marks.
+    FanText textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) const {
+        FanText text;
         if (label.living) {
-            lines.push_back({std::string(wordsOf(Phrase::living, options_.language)), true});
+            text.given = wordsOf(Phrase::living, options_.language);
         } else {
-            const std::string& first = label.surnameFirst ? label.surname : label.given;
-            const std::string& second = label.surnameFirst ? label.given : label.surname;
-            if (!first.empty()) lines.push_back({cleanText(first), true});
-            if (!second.empty()) lines.push_back({cleanText(second), true});
-            if (lines.empty()) lines.push_back({"?", true});
+            text.given = cleanText(label.given);
+            text.surname = cleanText(label.surname);
+            text.surnameFirst = label.surnameFirst;
+            if (text.given.empty() && text.surname.empty()) text.given = "?";
+            if (!label.birth.empty()) text.facts.push_back("* " + cleanText(label.birth));
+            if (!label.death.empty()) text.facts.push_back("\xE2\x80\xA0 " + cleanText(label.death));
         }
-        std::string facts = yearsOf(label);
-        for (const BoxMark& mark : marks) put(facts, (facts.empty() ? "" : " "), mark.text);
-        if (!facts.empty()) lines.push_back({facts, false});
-        return lines;
+        std::string signs;
+        for (const BoxMark& mark : marks) put(signs, (signs.empty() ? "" : " "), mark.text);
+        if (!signs.empty()) text.facts.push_back(signs);
+        return text;
     }
 
-    void appendTexts(std::size_t i, const std::vector<TextLine>& lines) {
-        if (fan_.arcs[i].ring == 0) return appendMiddle(i, lines);
+    // Across the cell where it is broader than deep, else along the radius; the other way where less is lost so.
+    void appendTexts(std::size_t i, const FanText& text) {
+        if (fan_.arcs[i].ring == 0) return appendMiddle(fitFanText(text, roomInMiddle(i)));
         const double depth = outerOf(i) - innerOf(i) - 2 * kPad;
-        const double middle = (innerOf(i) + outerOf(i)) / 2;
-        double widest = 0;
-        for (const TextLine& line : lines) {
-            widest = std::max(widest, textWidth(line.text, {kLargestName, line.bold}));
+        const bool isBroad = roomAcross(i, middleOf(i), kUsualTextHeight) >= depth;
+        FanTextLines lines = fitFanText(text, isBroad ? roomOfAcross(i) : roomOfAlong(i));
+        bool isAcross = isBroad;
+        const bool hasChoice = isBroad || roomAcross(i, middleOf(i), kUsualTextHeight) >= kLeastAcross;
+        if (hasChoice && (lines.lines.empty() || lines.loss == picture::NameLoss::letters)) {
+            FanTextLines others = fitFanText(text, isBroad ? roomOfAlong(i) : roomOfAcross(i));
+            if (!others.lines.empty() && (lines.lines.empty() || others.loss < lines.loss)) {
+                lines = std::move(others);
+                isAcross = !isBroad;
+            }
         }
-        const double room = roomAcross(i, middle, kLargestName * static_cast<double>(lines.size()));
-        const bool across = room >= kLeastAcross && (room >= widest || room >= depth);
-        if (across) {
-            appendAcross(i, lines, depth);
+        if (isAcross) {
+            appendAcross(i, lines);
         } else {
-            appendAlong(i, lines, depth);
+            appendAlong(i, lines);
         }
+    }
+
+    double middleOf(std::size_t i) const { return (innerOf(i) + outerOf(i)) / 2; }
+    double angleOf(std::size_t i) const { return (fan_.arcs[i].from + fan_.arcs[i].to) / 2; }
+    bool isBelow(std::size_t i) const { return picture::sineOfDegrees(angleOf(i) + 90) < -1e-9; }
+
+    FanTextRoom roomInMiddle(std::size_t i) const {
+        const double r = outerOf(i) - kPad;
+        return {2 * r, [r](double offset, double height) {
+                    const double reach = std::abs(offset) + height / 2;
+                    return reach < r ? 2 * std::sqrt(r * r - reach * reach) : 0;
+                }};
+    }
+
+    FanTextRoom roomOfAcross(std::size_t i) const {
+        return {outerOf(i) - innerOf(i) - 2 * kPad, [this, i](double offset, double height) {
+                    return roomAcross(i, middleOf(i) + (isBelow(i) ? offset : -offset), height);
+                }};
+    }
+
+    // As high as the cell is broad at its inner end.
+    FanTextRoom roomOfAlong(std::size_t i) const {
+        const double half = std::min(89.0, (fan_.arcs[i].to - fan_.arcs[i].from) / 2);
+        const double inner = innerOf(i) + kPad;
+        const double breadth = 2 * inner * picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
+        const double outer = outerOf(i) - kPad;
+        return {breadth - 2, [this, i, inner, outer](double offset, double height) {
+                    const double reach = std::abs(offset) + height / 2;
+                    const double end = reach < outer ? std::sqrt(outer * outer - reach * reach) : 0;
+                    return std::max(0.0, 2 * std::min(middleOf(i) - inner, end - middleOf(i)));
+                }};
     }
 
     // The width of a line of text of that height at that radius.
@@ -282,82 +313,46 @@ private:
         return std::max(0.0, room);
     }
 
-    void appendMiddle(std::size_t i, const std::vector<TextLine>& lines) {
-        const double r = outerOf(i) - kPad;
-        const double size = kLargestName;
-        const double pitch = size + 3;
-        double y = -pitch * (static_cast<double>(lines.size()) - 1) / 2;
-        for (const TextLine& line : lines) {
-            const double reach = std::abs(y) + size / 2;
-            const double room = reach < r ? 2 * std::sqrt(r * r - reach * reach) : 0;
-            const double used = line.bold ? size : size * kYearsShare;
-            appendLine(fitLine(line.text, {used, line.bold}, room), line.bold, used, middleX_, middleY_ + y,
-                       0, "middle");
-            y += pitch;
-        }
+    void appendMiddle(const FanTextLines& text) {
+        for (const FanTextLine& line : text.lines) appendLine(line, middleX_, middleY_ + line.offset, 0);
     }
 
     // One below the other as it is read; in the lower half of the circle that is from the inside out.
-    void appendAcross(std::size_t i, const std::vector<TextLine>& lines, double depth) {
-        const double angle = (fan_.arcs[i].from + fan_.arcs[i].to) / 2;
-        const bool below = picture::sineOfDegrees(angle + 90) < -1e-9;
-        const auto count = static_cast<double>(lines.size());
-        const double size = std::clamp(depth / count - 3, kLeastName, kLargestName);
-        const double pitch = size + 3;
-        const double middle = (innerOf(i) + outerOf(i)) / 2 - 2;
-        double offset = -pitch * (count - 1) / 2;
-        for (const TextLine& line : lines) {
-            const double r = below ? middle + offset : middle - offset;
-            const double used = line.bold ? size : size * kYearsShare;
+    void appendAcross(std::size_t i, const FanTextLines& text) {
+        const double angle = angleOf(i);
+        for (const FanTextLine& line : text.lines) {
+            const double r = middleOf(i) + (isBelow(i) ? line.offset : -line.offset);
             const picture::CirclePoint p = picture::onCircle(angle, r);
-            appendLine(fitLine(line.text, {used, line.bold}, roomAcross(i, r, used)), line.bold, used,
-                       middleX_ + p.x, middleY_ + p.y, below ? angle + 180 : angle, "middle");
-            offset += pitch;
+            appendLine(line, middleX_ + p.x, middleY_ + p.y, isBelow(i) ? angle + 180 : angle);
         }
     }
 
-    // Along the radius, read from the left: names in one line, years behind them or below.
-    void appendAlong(std::size_t i, const std::vector<TextLine>& lines, double depth) {
-        const Arc& arc = fan_.arcs[i];
-        const double angle = (arc.from + arc.to) / 2;
+    // Along the radius, read from the left.
+    void appendAlong(std::size_t i, const FanTextLines& text) {
+        const double angle = angleOf(i);
         const bool onTheRight = picture::sineOfDegrees(angle) >= -1e-9;
-        const double half = std::min(89.0, (arc.to - arc.from) / 2);
-        const double breadth =
-            2 * (innerOf(i) + kPad) * picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
-        std::string names;
-        std::string facts;
-        for (const TextLine& line : lines) {
-            std::string& text = line.bold ? names : facts;
-            put(text, (text.empty() ? "" : " "), line.text);
+        const picture::CirclePoint p = picture::onCircle(angle, middleOf(i));
+        for (const FanTextLine& line : text.lines) {
+            const picture::CirclePoint side = picture::onCircle(angle + (onTheRight ? 90 : -90), line.offset);
+            appendLine(line, middleX_ + p.x + side.x, middleY_ + p.y + side.y,
+                       onTheRight ? angle - 90 : angle + 90);
         }
-        const bool twoLines = !facts.empty() && breadth >= 2 * (kLeastName + 3);
-        const double size = std::min(kLargestName, (twoLines ? breadth / 2 : breadth) - 2);
-        if (size < kLeastName) return;
-        const auto append = [&](const std::string& text, bool bold, double used, double shift) {
-            const picture::CirclePoint p = picture::onCircle(angle, (innerOf(i) + outerOf(i)) / 2);
-            const picture::CirclePoint side = picture::onCircle(angle + (onTheRight ? 90 : -90), shift);
-            appendLine(fitLine(text, {used, bold}, depth), bold, used, middleX_ + p.x + side.x,
-                       middleY_ + p.y + side.y, onTheRight ? angle - 90 : angle + 90, "middle");
-        };
-        append(names, true, size, twoLines ? -size * 0.6 : 0);
-        if (twoLines) append(facts, false, size * kYearsShare, size * 0.6);
     }
 
-    void appendLine(const std::string& text, bool bold, double size, double x, double y, double turn,
-                    const char* anchor) {
-        if (text.empty()) return;
-        if (bold) {
-            svg_.text.addName(size);
+    void appendLine(const FanTextLine& line, double x, double y, double turn) {
+        if (line.text.empty()) return;
+        if (line.isName) {
+            svg_.text.addName(line.size);
         } else {
-            svg_.text.add(size);
+            svg_.text.add(line.size);
         }
-        put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\" dy=\"", number(size * 0.36),
-            "\" text-anchor=\"", anchor, "\"");
+        put(svg_.svg, "<text x=\"", number(x), "\" y=\"", number(y), "\" dy=\"", number(line.size * 0.36),
+            "\" text-anchor=\"middle\"");
         if (turn != 0)
             put(svg_.svg, " transform=\"rotate(", number(turn), " ", number(x), " ", number(y), ")\"");
-        put(svg_.svg, (bold ? " font-weight=\"bold\"" : ""), " font-size=\"", number(size), "\" fill=\"",
-            theme().text, "\"", (runsRightToLeft(text) ? " direction=\"rtl\"" : ""), ">", Escaped{text},
-            "</text>\n");
+        put(svg_.svg, (line.isName ? " font-weight=\"bold\"" : ""), " font-size=\"", number(line.size),
+            "\" fill=\"", theme().text, "\"", (runsRightToLeft(line.text) ? " direction=\"rtl\"" : ""), ">",
+            Escaped{line.text}, "</text>\n");
     }
 
     void appendLinks() { appendLines(svg_, content_, options_, frame_); }

@@ -6,7 +6,6 @@
 #include <olvane/picture/TextFit.h>
 
 #include <algorithm>
-#include <array>
 #include <optional>
 
 #include <olvane/picture/TextPropertiesInternal.h>
@@ -17,10 +16,11 @@ namespace {
 
 constexpr int kSizes = 4;
 
-std::array<double, kSizes> sizesOf(const NameRoom& room) {
-    std::array<double, kSizes> sizes{};
+std::vector<double> sizesOf(const NameRoom& room) {
+    if (room.largest == room.smallest) return {room.largest};
+    std::vector<double> sizes;
     for (int i = 0; i < kSizes; ++i) {
-        sizes[static_cast<std::size_t>(i)] = room.largest - (room.largest - room.smallest) * i / (kSizes - 1);
+        sizes.push_back(room.largest - (room.largest - room.smallest) * i / (kSizes - 1));
     }
     return sizes;
 }
@@ -81,11 +81,18 @@ public:
         const FittedText together =
             fitText(both + " " + std::string(surnameFirst_ ? given : surname), font, room_.width, most);
         if (isCut(together)) return std::nullopt;
-        return FittedName{together.lines, size};
+        return FittedName{together.lines, size, NameLoss::nothing};
     }
 
     // As much as goes in; the surname keeps up to half of the lines.
     FittedName cut(std::string_view given, std::string_view surname) const {
+        FittedName name = cutLines(given, surname);
+        name.loss = NameLoss::letters;
+        return name;
+    }
+
+private:
+    FittedName cutLines(std::string_view given, std::string_view surname) const {
         const double size = room_.smallest;
         const Font font{size, true};
         const std::size_t most = linesOf(size);
@@ -98,7 +105,6 @@ public:
                              : joined(shownGiven, shownSurname, size);
     }
 
-private:
     std::size_t linesOf(double size) const {
         const double lines = std::min(room_.height / (size + room_.gap), 1000.0);
         return std::clamp<std::size_t>(static_cast<std::size_t>(std::max(lines, 1.0)), 1,
@@ -108,7 +114,7 @@ private:
     static bool isCut(const FittedText& fitted) { return fitted.shortened || fitted.wordBroken; }
 
     static FittedName joined(const FittedText& first, const FittedText& second, double size) {
-        FittedName name{first.lines, size};
+        FittedName name{first.lines, size, NameLoss::nothing};
         name.lines.insert(name.lines.end(), second.lines.begin(), second.lines.end());
         return name;
     }
@@ -116,7 +122,7 @@ private:
     FittedName cutToOneLine(std::string_view given, std::string_view surname, const Font& font) const {
         const std::string first(surnameFirst_ ? surname : given);
         const std::string second(surnameFirst_ ? given : surname);
-        return {fitText(first + " " + second, font, room_.width, 1).lines, font.size};
+        return {fitText(first + " " + second, font, room_.width, 1).lines, font.size, NameLoss::letters};
     }
 
     bool surnameFirst_;
@@ -128,12 +134,16 @@ private:
 FittedName fitName(std::string_view given, std::string_view surname, bool surnameFirst,
                    const NameRoom& room) {
     const NameFitter fitter(surnameFirst, room);
-    for (const double size : sizesOf(room)) {
+    const std::vector<double> sizes = sizesOf(room);
+    for (const double size : sizes) {
         if (auto name = fitter.whole(given, surname, size)) return *name;
     }
     const std::string initials = withInitials(given);
-    for (const double size : sizesOf(room)) {
-        if (auto name = fitter.whole(initials, surname, size)) return *name;
+    for (const double size : sizes) {
+        auto name = fitter.whole(initials, surname, size);
+        if (!name) continue;
+        name->loss = NameLoss::givenNames;
+        return *name;
     }
     return fitter.cut(initials, surname);
 }

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -40,9 +41,13 @@ struct NameRoom {
     double smallest = 10;
 };
 
+// What a name lost so that it went in: nothing, given names after the first but for their initials, or letters.
+enum class NameLoss : std::uint8_t { nothing, givenNames, letters };
+
 struct FittedName {
     std::vector<std::string> lines;
     double size = 0;  // px, of every line
+    NameLoss loss = NameLoss::nothing;
 };
 
 // Fits a name in bold letters of the largest of a few sizes in which no word is broken, with the surname on a line of

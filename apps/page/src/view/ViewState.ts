@@ -82,7 +82,7 @@ const kPhotoHeight = 32; // that it adds to a tall box
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
 // Room for the lines of ways between rows, and for what the ends of a kinship are to one another.
 const kTallInKinship = { ...kTall, gapY: 58 };
-const kWideInKinship = { ...kWide, gapX: 44 };
+const kWideInKinship = { ...kWide, gapX: 56 };
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
 const kFactPitch = 14;
