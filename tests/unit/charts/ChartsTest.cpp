@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <olvane/charts/Charts.h>
@@ -532,6 +533,38 @@ TEST(AwkwardFamilies, anAdoptedChildHasBothItsParentFamilies) {
     EXPECT_EQ(drawn.picture.boxes.size(), 5U);
     EXPECT_EQ(drawn.faults(), 0U);
     EXPECT_TRUE(drawn.picture.marks.empty());
+}
+
+// The x of every stem at the top of a box, from left to right.
+std::vector<double> stemsOver(const Picture& picture, const Box& box) {
+    std::vector<double> stems;
+    for (const Line& line : picture.lines) {
+        if (line.role != LineRole::stem || std::max(line.y1, line.y2) != box.y) continue;
+        if (line.x1 > box.x && line.x1 < box.x + box.width) stems.push_back(line.x1);
+    }
+    std::sort(stems.begin(), stems.end());
+    return stems;
+}
+
+// Two families of parents stand side by side over their child, as parts of one tree; a third would have no place for its
+// line, so that it is a tree of its own with a mark.
+TEST(AwkwardFamilies, twoFamiliesOfParentsHaveALineAndAThirdHasAMark) {
+    const char* const birth = "Vater + Mutter: Kind.m";
+    const char* const adopted = "Wahlvater + Wahlmutter: Kind(adopted)";
+    const KinFamily two{birth, adopted};
+    const KinFamily three{birth, adopted, "Pfleger + Pflegerin: Kind(foster)"};
+    const Drawn ofTwo(two, requestFor(View::ancestors, two["Kind"]));
+    const Drawn ofThree(three, requestFor(View::ancestors, three["Kind"]));
+    for (const Drawn* drawn : {&ofTwo, &ofThree}) {
+        const Box& child = (*drawn)["Kind"];
+        const double middle = child.x + child.width / 2;
+        EXPECT_THAT(stemsOver(drawn->picture, child), testing::ElementsAre(middle - 6, middle + 6));
+        const Box& last = (*drawn)["Wahlmutter"];
+        EXPECT_EQ(middle, ((*drawn)["Vater"].x + last.x + last.width) / 2);
+        EXPECT_EQ(drawn->faults(), 0U);
+    }
+    EXPECT_EQ(ofTwo.marksOf(MarkKind::parentsElsewhere), 0U);
+    EXPECT_EQ(ofThree.marksOf(MarkKind::parentsElsewhere), 1U);
 }
 
 // In every view and every direction: each person once, nothing that misleads, every relation drawn or marked.
