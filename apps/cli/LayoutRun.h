@@ -11,6 +11,7 @@
 #include <olvane/boundary/OlvaneViewerManagerWrapProtocol.h>
 #include <olvane/charts/BoxForm.h>
 #include <olvane/charts/Charts.h>
+#include <olvane/charts/Views.h>
 #include <olvane/gedcom/GedcomData.h>
 #include <olvane/source/ParentChoice.h>
 
@@ -22,15 +23,16 @@ using charts::View;
 using charts::BoxForm;
 
 // What to lay out. chart says which view and what it shows; focus and sizes are filled in by PictureRun.
-struct LayoutRequest {
-    charts::ChartRequest chart{};
+struct LayoutRequest : charts::ViewRequest {
     BoxForm boxes = BoxForm::tall;
     std::string to;  // of the kinship view, as the user names the person; checked by PictureRun
     std::vector<std::string> folds;  // "I5:down", "I5"; checked by PictureRun
     gedcom::ParentChoice parents{};
-    bool unknownParents = false;  // a picture of a view of the engine has boxes for parents who are not known
 
-    LayoutRequest() { chart.view = View::family; }
+    LayoutRequest() {
+        chart.view = View::family;
+        unknownParents = false;
+    }
     View view() const { return chart.view; }
 };
 

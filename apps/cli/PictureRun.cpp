@@ -40,7 +40,7 @@ std::vector<charts::Fold> foldsOf(const gedcom::GedcomData& data, const std::str
 
 PictureRun::PictureRun(const gedcom::GedcomData& data, const LayoutRequest& request, std::vector<bool> hidden)
     : data_(data),
-      view_{request.chart, request.unknownParents},
+      view_(request),
       hidden_(std::move(hidden)),
       hiddenNames_(data, hidden_),
       parents_(request.parents),

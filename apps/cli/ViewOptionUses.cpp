@@ -1,14 +1,14 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What was given of the options of views. Each knows the views that it changes; what would change nothing is refused, since
-// it was meant to.
+// What was given of the options of views. The table of options has the views that each changes; what would change nothing is
+// refused, since it was meant to.
 
 #include <cli/ViewOptions.h>
 
 #include <algorithm>
-#include <map>
-#include <span>
+#include <cstddef>
+#include <string_view>
 #include <vector>
 
 #include <CLI/CLI.hpp>
@@ -16,6 +16,7 @@
 #include <cli/CommonOptions.h>
 #include <cli/FamilySwitches.h>
 #include <cli/UsageError.h>
+#include <olvane/charts/ViewOption.h>
 
 namespace olvane::cli {
 
@@ -23,46 +24,44 @@ namespace {
 
 constexpr int kMostPedigreeGenerations = 12;
 
-// An option, and the views that it changes.
-struct OptionUse {
-    const char* option;
-    std::vector<View> views;
+// How the command calls an option of the table; what it takes and which views it changes is said there.
+struct OptionName {
+    const char* name;
+    std::string_view option;
 };
 
-const std::vector<OptionUse>& optionUses() {
-    static const std::vector<View> kDirected = {View::near,      View::ancestors, View::descendants,
-                                                View::hourglass, View::relatives, View::kinship,
-                                                View::everybody};
-    static const std::vector<OptionUse> kUses = {
-        {"--generations",
-         {View::pedigree, View::ancestors, View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--up", {View::ancestors, View::hourglass, View::relatives, View::fan}},
-        {"--down", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--direction", kDirected},
-        {"--compact",
-         {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives, View::kinship}},
-        {"--fold", {View::near, View::ancestors, View::descendants, View::hourglass, View::relatives}},
-        {"--siblings", {View::ancestors, View::hourglass}},
-        {"--no-spouses", {View::descendants, View::hourglass, View::relatives, View::fan}},
-        {"--to", {View::kinship}},
-        {"--by", {View::kinship}},
-        {"--ways", {View::kinship}},
-        {"--language", {View::kinship}},
-        {"--marks", {View::everybody}},
-        {"--effort", {View::everybody}},
-        {"--all-parts", {View::everybody}},
-        {"--of", {View::fan}},
-        {"--angle", {View::fan}},
-    };
-    return kUses;
+constexpr OptionName kOptionNames[] = {
+    {"--up", "up"},
+    {"--down", "down"},
+    {"--direction", "direction"},
+    {"--compact", "compact"},
+    {"--siblings", "siblings"},
+    {"--no-spouses", "spouses"},
+    {"--to", "to"},
+    {"--by", "ways"},
+    {"--ways", "mostWays"},
+    {"--language", "language"},
+    {"--marks", "marks"},
+    {"--effort", "effort"},
+    {"--all-parts", "allParts"},
+    {"--of", "fan"},
+    {"--angle", "angle"},
+};
+
+// Of them all but the pedigree count generations by --up and --down.
+charts::ViewSet viewsOfGenerations() {
+    return charts::viewOption("generations").views | charts::viewOption("up").views |
+           charts::viewOption("down").views;
 }
 
-void refuseIdle(const CLI::App& command, const char* option, std::span<const View> views, View view) {
-    if (!isGiven(command, option) || std::find(views.begin(), views.end(), view) != views.end()) return;
+void refuseIdle(const CLI::App& command, const char* option, charts::ViewSet views, View view) {
+    if (!isGiven(command, option) || (views & charts::setOf(view)) != 0) return;
     std::string text =
         std::string(option) + " changes nothing in the view " + charts::nameOf(view) + ", but in";
     const char* separator = " ";
-    for (const View other : views) {
+    for (std::size_t i = 0; i < charts::viewOption("view").form.words.size(); ++i) {
+        const auto other = static_cast<View>(i);
+        if ((views & charts::setOf(other)) == 0) continue;
         text.append(separator).append(charts::nameOf(other));
         separator = ", ";
     }
@@ -70,14 +69,15 @@ void refuseIdle(const CLI::App& command, const char* option, std::span<const Vie
 }
 
 void refuseIdleOptions(const CLI::App& command, View view) {
-    constexpr View kOfNearRelatives[] = {View::family, View::near};
-    for (const OptionUse& use : optionUses()) {
-        const bool isOfWords = (command.get_name() == "check" || command.get_name() == "draw") &&
-                               std::string_view(use.option) == "--language";
-        if (!isOfWords) refuseIdle(command, use.option, use.views, view);
+    const bool hasWords = command.get_name() == "check" || command.get_name() == "draw";
+    refuseIdle(command, "--generations", viewsOfGenerations(), view);
+    refuseIdle(command, "--fold", charts::viewsOfFolds(), view);
+    for (const OptionName& use : kOptionNames) {
+        if (hasWords && use.option == "language") continue;
+        refuseIdle(command, use.name, charts::viewOption(use.option).views, view);
     }
     for (const FamilySwitch& option : kFamilySwitches) {
-        refuseIdle(command, option.name, kOfNearRelatives, view);
+        refuseIdle(command, option.name, charts::viewOption("shown").views, view);
     }
 }
 
@@ -107,10 +107,6 @@ std::vector<std::string> pageViewOptionNames() {
 }
 
 std::string pageAddressOf(const CLI::App& command, const LayoutRequest& request) {
-    static const std::map<charts::Direction, const char*> kNames = {{charts::Direction::down, "down"},
-                                                                    {charts::Direction::up, "up"},
-                                                                    {charts::Direction::left, "left"},
-                                                                    {charts::Direction::right, "right"}};
     const charts::ChartRequest& chart = request.chart;
     const bool hasGenerations = isGiven(command, "--generations");
     const bool isPedigree = request.view() == View::pedigree;
@@ -121,11 +117,13 @@ std::string pageAddressOf(const CLI::App& command, const LayoutRequest& request)
     if (isGiven(command, "--down") || (hasGenerations && !isPedigree)) {
         add("down=" + std::to_string(chart.down));
     }
-    if (isGiven(command, "--direction")) add(std::string("direction=") + kNames.at(chart.direction));
+    const auto directions = charts::viewOption("direction").form.words;
+    if (isGiven(command, "--direction"))
+        add("direction=" + std::string(directions[static_cast<std::size_t>(chart.direction)]));
     std::string hidden;
-    for (const FamilySwitch& option : kFamilySwitches) {
-        if (chart.layout.*option.shown) continue;
-        hidden += (hidden.empty() ? "" : ",") + std::string(option.pageName);
+    for (const charts::RelativeGroup& group : charts::relativeGroups()) {
+        if (chart.layout.*group.shown) continue;
+        hidden += (hidden.empty() ? "" : ",") + std::string(group.name);
     }
     if (!hidden.empty()) add("hide=" + hidden);
     return address;

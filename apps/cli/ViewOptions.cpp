@@ -1,16 +1,22 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The options of views, with their help: what each does, and what it is when not given.
+// The options of views under the command's own names, with their help. What each takes is in the table of options.
 
 #include <cli/ViewOptions.h>
 
+#include <algorithm>
+#include <functional>
 #include <map>
+#include <span>
+#include <string_view>
+#include <vector>
 
 #include <CLI/CLI.hpp>
 
 #include <cli/FamilySwitches.h>
 #include <cli/OptionChecks.h>
+#include <olvane/charts/ViewOption.h>
 
 namespace olvane::cli {
 
@@ -19,39 +25,57 @@ namespace {
 constexpr const char* kDepthGroup = "Views to any depth";
 constexpr const char* kKinshipGroup = "Kinship view";
 
-const std::map<std::string, View>& views() {
-    static const std::map<std::string, View> kViews = {
-        {"family", View::family},
-        {"pedigree", View::pedigree},
-        {"near", View::near},
-        {"ancestors", View::ancestors},
-        {"descendants", View::descendants},
-        {"hourglass", View::hourglass},
-        {"relatives", View::relatives},
-        {"fan", View::fan},
-        {"kinship", View::kinship},
-        {"everybody", View::everybody},
-    };
-    return kViews;
-}
-
 // A switch that sets what is on when not given to off. (The library's own flags of that sort show "{false}" in the help.)
 CLI::Option* addSwitchOff(CLI::App& command, const std::string& name, bool& isOn, const std::string& help) {
     return command.add_flag_callback(
         name, [&isOn] { isOn = false; }, help);
 }
 
+std::string joined(std::span<const std::string_view> words) {
+    std::string text;
+    for (const std::string_view word : words) text.append(text.empty() ? "" : "|").append(word);
+    return text;
+}
+
+CLI::Option* addWord(CLI::App& command, const char* name, const charts::ViewOption& option,
+                     charts::ViewRequest& request, const std::string& help) {
+    const auto words = option.form.words;
+    const auto set = [&option, &request, words](const std::string& given) {
+        const auto found = std::find(words.begin(), words.end(), given);
+        option.set(request, static_cast<double>(found - words.begin()));
+    };
+    return command.add_option_function<std::string>(name, set, help)
+        ->check(word({words.begin(), words.end()}))
+        ->type_name(joined(words));
+}
+
+// An option of the table under the command's own name. A switch changes what is usual.
+CLI::Option* addOption(CLI::App& command, const char* name, std::string_view option,
+                       charts::ViewRequest& request, const std::string& help) {
+    const charts::ViewOption& known = charts::viewOption(option);
+    const charts::OptionForm& form = known.form;
+    const auto set = [&known, &request](double value) { known.set(request, value); };
+    if (form.kind == charts::OptionKind::word) return addWord(command, name, known, request, help);
+    if (form.kind == charts::OptionKind::flag) {
+        const auto change = [set, &form] { set(1 - form.usual); };
+        return command.add_flag_callback(name, change, help);
+    }
+    if (form.kind == charts::OptionKind::number)
+        return command.add_option_function<double>(name, set, help)->check(number(form.least, form.most));
+    const std::function<void(const int&)> setWhole = set;
+    return command.add_option_function<int>(name, setWhole, help)
+        ->check(wholeNumber(static_cast<int>(form.least), static_cast<int>(form.most)))
+        ->type_name("N");
+}
+
 void addView(CLI::App& command, LayoutRequest& request) {
-    command
-        .add_option(
-            "--view", request.chart.view,
-            "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
-            "the relatives of family, placed again without overlaps; ancestors, descendants, hourglass "
-            "(both) "
-            "and relatives (the descendants of every ancestor): any number of generations, each person once; "
-            "fan: ancestors or descendants in rings; kinship: everybody on the ways to --to; everybody: the "
-            "whole connected family")
-        ->transform(choice(views()))
+    addOption(
+        command, "--view", "view", request,
+        "family: relatives above, beside and below (default); pedigree: ancestors, lying sideways; near: "
+        "the relatives of family, placed again without overlaps; ancestors, descendants, hourglass (both) "
+        "and relatives (the descendants of every ancestor): any number of generations, each person once; "
+        "fan: ancestors or descendants in rings; kinship: everybody on the ways to --to; everybody: the "
+        "whole connected family")
         ->type_name("VIEW");
     command
         .add_option("--generations", request.chart.layout.generations,
@@ -62,48 +86,30 @@ void addView(CLI::App& command, LayoutRequest& request) {
         ->type_name("N");
 }
 
-void addReach(CLI::App& command, charts::ChartRequest& chart) {
-    static const std::map<std::string, charts::Direction> kDirections = {{"down", charts::Direction::down},
-                                                                         {"up", charts::Direction::up},
-                                                                         {"left", charts::Direction::left},
-                                                                         {"right", charts::Direction::right}};
+void addReach(CLI::App& command, LayoutRequest& request) {
     const std::string group = kDepthGroup;
-    command.add_option("--up", chart.up, "Generations above the focus; 0, the default, is all")
-        ->check(wholeNumber(0))
-        ->type_name("N")
+    addOption(command, "--up", "up", request, "Generations above the focus; 0, the default, is all")
         ->group(group);
-    command.add_option("--down", chart.down, "Generations below the focus; 0, the default, is all")
-        ->check(wholeNumber(0))
-        ->type_name("N")
+    addOption(command, "--down", "down", request, "Generations below the focus; 0, the default, is all")
         ->group(group);
-    command
-        .add_option("--direction", chart.direction,
-                    "Where later generations stand: down (default), up, left or right of earlier ones")
-        ->transform(choice(kDirections))
-        ->type_name("down|up|left|right")
+    addOption(command, "--direction", "direction", request,
+              "Where later generations stand: down (default), up, left or right of earlier ones")
         ->group(group);
 }
 
-void addChartOptions(CLI::App& command, charts::ChartRequest& chart) {
+void addChartOptions(CLI::App& command, LayoutRequest& request) {
     const std::string group = kDepthGroup;
-    command
-        .add_flag("--compact", chart.compact,
-                  "Pack a tree tighter: parents need not stand over the middle of their children")
+    addOption(command, "--compact", "compact", request,
+              "Pack a tree tighter: parents need not stand over the middle of their children")
         ->group(group);
-    command.add_flag("--siblings", chart.siblings, "Show siblings of the focus and of its ancestors")
+    addOption(command, "--siblings", "siblings", request, "Show siblings of the focus and of its ancestors")
         ->group(group);
-    addSwitchOff(command, "--no-spouses", chart.spouses, "Leave out spouses of descendants")->group(group);
-    static const std::map<std::string, charts::FanOf> kFansOf = {{"ancestors", charts::FanOf::ancestors},
-                                                                 {"descendants", charts::FanOf::descendants}};
-    command
-        .add_option("--of", chart.fanOf, "Whom a fan shows in its rings: ancestors (default) or descendants")
-        ->transform(choice(kFansOf))
-        ->type_name("ancestors|descendants")
+    addOption(command, "--no-spouses", "spouses", request, "Leave out spouses of descendants")->group(group);
+    addOption(command, "--of", "fan", request,
+              "Whom a fan shows in its rings: ancestors (default) or descendants")
         ->group(group);
-    command
-        .add_option("--angle", chart.fanAngle,
-                    "How far a fan reaches around its middle: 90 to 360 (default) degrees")
-        ->check(number(90.0, 360.0))
+    addOption(command, "--angle", "angle", request,
+              "How far a fan reaches around its middle: 90 to 360 (default) degrees")
         ->type_name("DEGREES")
         ->group(group);
 }
@@ -118,8 +124,8 @@ void addFolds(CLI::App& command, LayoutRequest& request) {
         ->delimiter(',')
         ->type_name("WHO[:up|down|beside],...")
         ->group(kDepthGroup);
-    command.add_flag("--mirror", request.chart.mirrored,
-                     "Exchange right and left in the picture, for those who read from right to left");
+    addOption(command, "--mirror", "mirrored", request,
+              "Exchange right and left in the picture, for those who read from right to left");
 }
 
 void addOtherPerson(CLI::App& command, LayoutRequest& request) {
@@ -129,45 +135,24 @@ void addOtherPerson(CLI::App& command, LayoutRequest& request) {
 }
 
 void addKinshipOptions(CLI::App& command, LayoutRequest& request) {
-    static const std::map<std::string, charts::WayChoice> kChoices = {
-        {"blood", charts::WayChoice::blood},
-        {"marriage", charts::WayChoice::marriage},
-        {"both", charts::WayChoice::both}};
     const std::string group = kKinshipGroup;
-    command
-        .add_option("--by", request.chart.ways,
-                    "Which ways are shown: by blood, by marriage or both (default)")
-        ->transform(choice(kChoices))
-        ->type_name("blood|marriage|both")
+    addOption(command, "--by", "ways", request,
+              "Which ways are shown: by blood, by marriage or both (default)")
         ->group(group);
-    command
-        .add_option("--ways", request.chart.mostWays,
-                    "The most ways shown, the nearest first; default 8, 0 for all")
-        ->check(wholeNumber(0))
-        ->type_name("N")
+    addOption(command, "--ways", "mostWays", request,
+              "The most ways shown, the nearest first; default 8, 0 for all")
+        ->group(group);
+    addOption(
+        command, "--language", "language", request,
+        "The language of a kinship's words, of remarks and of what a picture says beside its data; English "
+        "when not given")
         ->group(group);
 }
 
-void addLanguage(CLI::App& command, kin::Language& language) {
-    static const std::map<std::string, kin::Language> kNames = [] {
-        std::map<std::string, kin::Language> names;
-        for (const kin::Language one : kin::kLanguages) names.emplace(kin::languageCode(one), one);
-        return names;
-    }();
-    command
-        .add_option("--language", language,
-                    "The language of a kinship's words, of remarks and of what a picture says beside its "
-                    "data; English when "
-                    "not given")
-        ->transform(choice(kNames))
-        ->type_name("en|de|es")
-        ->group(kKinshipGroup);
-}
-
-void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
+void addEverybodyOptions(CLI::App& command, LayoutRequest& request) {
     const std::string group = "View of everybody";
     command
-        .add_option("--marks", chart.marks,
+        .add_option("--marks", request.chart.marks,
                     "How many second links to parents may become marks, for fewer crossings; default 0, all "
                     "for all of "
                     "them")
@@ -182,21 +167,17 @@ void addEverybodyOptions(CLI::App& command, charts::ChartRequest& chart) {
             ""))
         ->type_name("N|all")
         ->group(group);
-    command
-        .add_option("--effort", chart.effort,
-                    "0 is quickest; each step more takes up to twice the time; default 1")
-        ->check(wholeNumber(0, 10))
-        ->type_name("N")
+    addOption(command, "--effort", "effort", request,
+              "0 is quickest; each step more takes up to twice the time; default 1")
         ->group(group);
-    addSwitchOff(command, "--all-parts", chart.onePart,
-                 "Show those as well who are not connected with the focus")
+    addOption(command, "--all-parts", "allParts", request,
+              "Show those as well who are not connected with the focus")
         ->group(group);
 }
 
 void addFamilySwitches(CLI::App& command, LayoutRequest& request) {
     for (const FamilySwitch& option : kFamilySwitches) {
-        addSwitchOff(command, option.name, request.chart.layout.*option.shown, option.help)
-            ->group("Family and near");
+        addSwitchOff(command, option.name, shownBy(option, request), option.help)->group("Family and near");
     }
 }
 
@@ -228,19 +209,18 @@ void addViewOptions(CLI::App& command, LayoutRequest& request, const std::string
     addView(command, request);
     addParents(command, request);
     addBoxes(command, request, boxDefaults);
-    addReach(command, request.chart);
-    addChartOptions(command, request.chart);
+    addReach(command, request);
+    addChartOptions(command, request);
     addFolds(command, request);
     addOtherPerson(command, request);
     addKinshipOptions(command, request);
-    addLanguage(command, request.chart.language);
-    addEverybodyOptions(command, request.chart);
+    addEverybodyOptions(command, request);
     addFamilySwitches(command, request);
 }
 
 void addPageViewOptions(CLI::App& command, LayoutRequest& request) {
     addView(command, request);
-    addReach(command, request.chart);
+    addReach(command, request);
     addOtherPerson(command, request);
     addFamilySwitches(command, request);
 }

@@ -8,17 +8,17 @@
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
+#include <iterator>
+#include <string_view>
+#include <type_traits>
+
+#include <olvane/charts/ViewOption.h>
 
 #include "FileInternal.h"
 
 namespace olvane::c {
 
 namespace {
-
-constexpr int kDefaultGenerations = 5;
-constexpr int kDefaultFlagDepth = 4;  // as the family view's own
-
-constexpr std::int32_t kViewCount = 10;
 
 bool areFinite(const olvane_sizes& sizes) {
     for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding,
@@ -39,17 +39,10 @@ TreeSize treeSizeOf(const olvane_sizes& sizes) {
     return size;
 }
 
-bool areSizesOfCharts(const olvane_sizes& sizes) {
-    for (const float size : {sizes.node_width, sizes.node_height, sizes.horz_padding, sizes.vert_padding}) {
-        if (!(size >= 0)) return false;
-    }
-    return true;
-}
-
 bool areFolds(const olvane_fold* folds, std::size_t count) {
     if (!folds && count > 0) return false;
     for (std::size_t i = 0; i < count; ++i) {
-        if (!isOneOf(folds[i].branch, 3)) return false;
+        if (!isOneOf(folds[i].branch, static_cast<std::int32_t>(charts::branchNames().size()))) return false;
     }
     return true;
 }
@@ -62,10 +55,64 @@ bool areBoxSizes(const olvane_box_size* sizes, std::size_t count) {
     return true;
 }
 
-// All enumerations of a request have fewer than 255 entries.
-template <class Choice>
-Choice choice(std::int32_t number) {
-    return static_cast<Choice>(isOneOf(number, 255) ? number : 255);
+template <auto... path>
+double read(const olvane_picture_options& options) {
+    return static_cast<double>((options.*....*path));
+}
+
+template <auto... path>
+void write(olvane_picture_options& options, double value) {
+    auto& field = (options.*....*path);
+    field = static_cast<std::remove_reference_t<decltype(field)>>(value);
+}
+
+// An option of a request, as the struct has it. The names of fields never change, whatever the option's own is.
+struct Field {
+    std::string_view option;
+    const char* name;
+    double (*read)(const olvane_picture_options& options);
+    void (*write)(olvane_picture_options& options, double value);
+};
+
+template <auto... path>
+constexpr Field fieldOf(std::string_view option, const char* name) {
+    return {option, name, read<path...>, write<path...>};
+}
+
+using Options = olvane_picture_options;
+constexpr auto kLayout = &Options::layout;
+constexpr auto kSizes = &olvane_options::sizes;
+
+constexpr Field kFields[] = {
+    fieldOf<&Options::view>("view", "view"),
+    fieldOf<&Options::up>("up", "up"),
+    fieldOf<&Options::down>("down", "down"),
+    fieldOf<&Options::direction>("direction", "direction"),
+    fieldOf<&Options::spouses>("spouses", "spouses"),
+    fieldOf<&Options::siblings>("siblings", "siblings"),
+    fieldOf<&Options::compact>("compact", "compact"),
+    fieldOf<&Options::fan_of>("fan", "fan_of"),
+    fieldOf<&Options::fan_angle>("angle", "fan_angle"),
+    fieldOf<&Options::ways>("ways", "ways"),
+    fieldOf<&Options::most_ways>("mostWays", "most_ways"),
+    fieldOf<&Options::language>("language", "language"),
+    fieldOf<&Options::marks>("marks", "marks"),
+    fieldOf<&Options::effort>("effort", "effort"),
+    fieldOf<&Options::all_parts>("allParts", "all_parts"),
+    fieldOf<&Options::unknown_parents>("unknownParents", "unknown_parents"),
+    fieldOf<&Options::mirrored>("mirrored", "mirrored"),
+    fieldOf<kLayout, &olvane_options::shown>("shown", "layout.shown"),
+    fieldOf<kLayout, &olvane_options::generations>("generations", "layout.generations"),
+    fieldOf<kLayout, kSizes, &olvane_sizes::node_width>("width", "layout.sizes.node_width"),
+    fieldOf<kLayout, kSizes, &olvane_sizes::node_height>("height", "layout.sizes.node_height"),
+    fieldOf<kLayout, kSizes, &olvane_sizes::horz_padding>("gapX", "layout.sizes.horz_padding"),
+    fieldOf<kLayout, kSizes, &olvane_sizes::vert_padding>("gapY", "layout.sizes.vert_padding"),
+    fieldOf<&Options::aspect>("aspect", "aspect"),
+};
+
+// In C whatever is not 0 is yes.
+bool isTaken(const charts::OptionForm& option, double value) {
+    return option.kind == charts::OptionKind::flag || charts::takes(option, value);
 }
 
 }  // namespace
@@ -77,22 +124,15 @@ olvane_options defaultOptions() {
     options.sizes = {size.nodeWidth,   size.nodeHeight,     size.horzPadding,
                      size.vertPadding, size.spouseLineStep, size.lineInset};
     options.shown = OLVANE_SHOW_ALL;
-    options.generations = kDefaultGenerations;
-    options.flag_depth = kDefaultFlagDepth;
+    options.generations = LayoutOptions().generations;
+    options.flag_depth = LayoutOptions().flagDepth;
     return options;
 }
 
 LayoutOptions layoutOptionsOf(const olvane_options& options) {
     LayoutOptions result;
     result.sizes = treeSizeOf(options.sizes);
-    result.auntsUncles = (options.shown & OLVANE_SHOW_AUNTS_UNCLES) != 0;
-    result.cousins = (options.shown & OLVANE_SHOW_COUSINS) != 0;
-    result.siblings = (options.shown & OLVANE_SHOW_SIBLINGS) != 0;
-    result.siblingSpouses = (options.shown & OLVANE_SHOW_SIBLING_SPOUSES) != 0;
-    result.niecesNephews = (options.shown & OLVANE_SHOW_NIECES_NEPHEWS) != 0;
-    result.grandchildren = (options.shown & OLVANE_SHOW_GRANDCHILDREN) != 0;
-    result.greatGrandparents = (options.shown & OLVANE_SHOW_GREAT_GRANDPARENTS) != 0;
-    result.spousesOfChildren = (options.shown & OLVANE_SHOW_SPOUSES_OF_CHILDREN) != 0;
+    charts::setShown(result, options.shown);
     result.generations = options.generations;
     result.flagDepth = options.flag_depth;
     return result;
@@ -104,41 +144,53 @@ bool areInRange(const olvane_options& options) {
            options.generations <= OLVANE_MOST_GENERATIONS && options.flag_depth >= 0;
 }
 
-bool areInRange(const olvane_picture_options& options) {
-    return options.struct_size == sizeof(olvane_picture_options) && isOneOf(options.view, kViewCount) &&
-           areSizesOfCharts(options.layout.sizes) && areFolds(options.folds, options.fold_count) &&
-           areBoxSizes(options.box_sizes, options.box_size_count) && options.aspect >= 0 &&
-           std::isfinite(options.aspect) && options.up >= 0 && options.down >= 0 &&
-           isOneOf(options.direction, 4) && isOneOf(options.fan_of, 2) && options.fan_angle >= 90 &&
-           options.fan_angle <= 360 && isOneOf(options.ways, 3) && options.most_ways >= 0 &&
-           isOneOf(options.language, 3) && options.marks >= -1 && isOneOf(options.effort, 101) &&
-           isOneOf(options.year, kLastYear + 1) && areInRange(options.layout);
+const char* refusedOption(const olvane_picture_options& options) {
+    if (options.struct_size != sizeof(olvane_picture_options)) return "struct_size";
+    for (const Field& field : kFields) {
+        if (!isTaken(charts::viewOption(field.option).form, field.read(options))) return field.name;
+    }
+    if (!areFolds(options.folds, options.fold_count)) return "folds";
+    if (!areBoxSizes(options.box_sizes, options.box_size_count)) return "box_sizes";
+    if (!isOneOf(options.year, kLastYear + 1)) return "year";
+    return areInRange(options.layout) ? nullptr : "layout";
+}
+
+void setDefaults(olvane_picture_options& options) {
+    options = {};
+    options.struct_size = sizeof(olvane_picture_options);
+    options.layout = defaultOptions();
+    for (const Field& field : kFields) field.write(options, charts::viewOption(field.option).form.usual);
+}
+
+std::size_t optionCount() {
+    return std::size(kFields);
+}
+
+void describeOption(std::size_t index, olvane_picture_option& option) {
+    const Field& field = kFields[index];
+    const charts::ViewOption& known = charts::viewOption(field.option);
+    option.name = field.name;
+    option.kind = static_cast<std::int32_t>(known.form.kind);
+    option.least = known.form.least;
+    option.most = known.form.most;
+    option.usual = known.form.usual;
+    option.views = known.views;
+}
+
+const char* wordOfOption(std::size_t index, std::size_t word) {
+    if (index >= std::size(kFields)) return nullptr;
+    const auto words = charts::viewOption(kFields[index].option).form.words;
+    return word < words.size() ? words[word].data() : nullptr;  // a literal, so a zero byte ends it
 }
 
 AskedView::AskedView(const olvane_picture_options& options) {
     charts::ChartRequest& chart = request.chart;
-    chart.view = choice<charts::View>(options.view);
-    chart.up = options.up;
-    chart.down = options.down;
-    chart.direction = choice<charts::Direction>(options.direction);
-    chart.spouses = options.spouses != 0;
-    chart.siblings = options.siblings != 0;
-    chart.compact = options.compact != 0;
-    chart.mirrored = options.mirrored != 0;
-    chart.fanOf = choice<charts::FanOf>(options.fan_of);
-    chart.fanAngle = options.fan_angle;
-    chart.ways = choice<charts::WayChoice>(options.ways);
-    chart.mostWays = options.most_ways;
-    chart.language = choice<kin::Language>(options.language);
-    chart.marks = options.marks;
-    chart.effort = options.effort;
-    chart.onePart = options.all_parts == 0;
     chart.layout = layoutOptionsOf(options.layout);
-    chart.sizes = {options.layout.sizes.node_width, options.layout.sizes.node_height,
-                   options.layout.sizes.horz_padding, options.layout.sizes.vert_padding};
-    request.unknownParents = options.unknown_parents != 0;
+    for (const Field& field : kFields) charts::viewOption(field.option).set(request, field.read(options));
     for (std::size_t i = 0; i < options.fold_count; ++i) {
-        folds.push_back({options.folds[i].person, choice<picture::Branch>(options.folds[i].branch)});
+        const olvane_fold& fold = options.folds[i];
+        folds.push_back(
+            {fold.person, static_cast<picture::Branch>(isOneOf(fold.branch, 255) ? fold.branch : 255)});
     }
     chart.folded = folds;
     for (std::size_t i = 0; i < options.box_size_count; ++i) {
@@ -146,7 +198,6 @@ AskedView::AskedView(const olvane_picture_options& options) {
         boxSizes.push_back({box.person, {box.width, box.height}});
     }
     chart.sizedBoxes = boxSizes;
-    chart.aspect = options.aspect;
 }
 
 }  // namespace olvane::c
@@ -158,15 +209,30 @@ olvane_status olvane_options_default(olvane_options* options) {
 }
 
 olvane_status olvane_picture_options_default(int32_t view, olvane_picture_options* options) {
-    if (!options || !olvane::c::isOneOf(view, olvane::c::kViewCount)) return OLVANE_INVALID_ARGUMENT;
-    *options = {};
-    options->struct_size = sizeof(olvane_picture_options);
+    const bool isView = olvane::charts::takes(olvane::charts::viewOption("view").form, view);
+    if (!options || !isView) return OLVANE_INVALID_ARGUMENT;
+    olvane::c::setDefaults(*options);
     options->view = view;
-    options->spouses = 1;
-    options->fan_angle = 360;
-    options->ways = 2;
-    options->most_ways = 8;
-    options->effort = 1;
-    options->unknown_parents = 1;
-    return olvane_options_default(&options->layout);
+    return OLVANE_OK;
+}
+
+olvane_status olvane_picture_options_check(const olvane_picture_options* options, const char** refused) {
+    if (!options || !refused) return OLVANE_INVALID_ARGUMENT;
+    *refused = olvane::c::refusedOption(*options);
+    return *refused ? OLVANE_INVALID_ARGUMENT : OLVANE_OK;
+}
+
+size_t olvane_picture_option_count(void) {
+    return olvane::c::optionCount();
+}
+
+olvane_status olvane_picture_option_at(size_t index, olvane_picture_option* option) {
+    if (!option || option->struct_size != sizeof(olvane_picture_option) || index >= olvane::c::optionCount())
+        return OLVANE_INVALID_ARGUMENT;
+    olvane::c::describeOption(index, *option);
+    return OLVANE_OK;
+}
+
+const char* olvane_picture_option_word(size_t index, size_t word) {
+    return olvane::c::wordOfOption(index, word);
 }

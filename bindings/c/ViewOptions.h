@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <cstddef>
+#include <cstdint>
 #include <vector>
 
 #include <olvane_picture.h>
@@ -18,7 +20,21 @@ olvane_options defaultOptions();
 LayoutOptions layoutOptionsOf(const olvane_options& options);
 
 bool areInRange(const olvane_options& options);
-bool areInRange(const olvane_picture_options& options);
+
+// The name of the first field that is out of its range; null where all are in theirs.
+const char* refusedOption(const olvane_picture_options& options);
+
+inline bool areInRange(const olvane_picture_options& options) {
+    return refusedOption(options) == nullptr;
+}
+
+// Everything at its usual value.
+void setDefaults(olvane_picture_options& options);
+
+// The fields that are options of a request, in the order of a list, with what the table of options says of each.
+std::size_t optionCount();
+void describeOption(std::size_t index, olvane_picture_option& option);
+const char* wordOfOption(std::size_t index, std::size_t word);
 
 // Whether a number is one of an enumeration that counts from 0.
 constexpr bool isOneOf(std::int32_t number, std::int32_t count) {

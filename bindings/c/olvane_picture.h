@@ -256,6 +256,36 @@ typedef struct olvane_picture_options {
 /* Everything at its usual value, as said above, for the view. */
 OLVANE_C_API olvane_status olvane_picture_options_default(int32_t view, olvane_picture_options* options);
 
+/* OLVANE_INVALID_ARGUMENT where a field is out of its range, and then *refused is the name of the first such field, as
+   "fan_angle" or "layout.generations"; else *refused is null. The name is never released. */
+OLVANE_C_API olvane_status olvane_picture_options_check(const olvane_picture_options* options,
+                                                        const char** refused);
+
+typedef enum olvane_option_kind {
+    OLVANE_OPTION_WORD = 0, /* the number of one of its words */
+    OLVANE_OPTION_FLAG = 1, /* 0 for no, anything else for yes */
+    OLVANE_OPTION_WHOLE = 2,
+    OLVANE_OPTION_NUMBER = 3
+} olvane_option_kind;
+
+/* What a field of olvane_picture_options takes, for programs that offer the options to a user. */
+typedef struct olvane_picture_option {
+    size_t struct_size; /* sizeof(olvane_picture_option), set by the caller */
+    const char* name;   /* of the field; never released */
+    int32_t kind;       /* olvane_option_kind */
+    uint32_t views;     /* that it changes: a bit for each olvane_picture_view, the first the lowest */
+    double least;
+    double most;
+    double usual;
+} olvane_picture_option;
+
+/* Options count from 0. OLVANE_INVALID_ARGUMENT beyond the last one, and for a struct_size of no version. */
+OLVANE_C_API size_t olvane_picture_option_count(void);
+OLVANE_C_API olvane_status olvane_picture_option_at(size_t index, olvane_picture_option* option);
+
+/* The word of that number, of an option that takes words; null where there is none. It is never released. */
+OLVANE_C_API const char* olvane_picture_option_word(size_t index, size_t word);
+
 /*
  * The picture of a view, of a table or of a host that is asked as far as the view reaches. options may be null for the
  * family view. *picture is set by every call: to null after OLVANE_INVALID_ARGUMENT and OLVANE_NESTED_CALL, and perhaps

@@ -225,7 +225,7 @@ export class Family extends EventTarget {
     picture(focus, options = {}) {
         const { exports } = this.#instance;
         refuseNested(this.#instance, "picture", focus);
-        const numbers = pictureNumbers(options);
+        const numbers = pictureNumbers(this.#instance, options);
         usePictureOptions(this.#instance, numbers);
         const answer = exports.family_picture(this.#opened(), focusNumber(focus));
         const picture = readPicture(this.#instance, options, answer);

@@ -8,7 +8,15 @@ import { Instance } from "./instance.mjs";
 import { refuseNested, runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
 import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
-import { drawingNumbers, factBits, paperNumbers, partText, pictureNumbers, usualBoxesFrom } from "./pictureOptions.mjs";
+import {
+    drawingNumbers,
+    factBits,
+    paperNumbers,
+    partText,
+    pictureNumbers,
+    laterSideFrom,
+    usualBoxesFrom,
+} from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
 import { appendPart, MARKS, partsOf } from "./rows.mjs";
@@ -108,6 +116,14 @@ export class GedcomFile {
         return this.#instance.exports.gedcom_parent_family(this.#opened(), this.#person(id));
     }
 
+    siblingsOf(id) {
+        return this.#answer("gedcom_siblings", this.#person(id));
+    }
+
+    get bestFocus() {
+        return this.#instance.exports.gedcom_best_focus(this.#opened()) >>> 0;
+    }
+
     factsOfFamily(id) {
         return this.#answer("gedcom_family_facts", id).map(factFrom);
     }
@@ -186,6 +202,10 @@ export class GedcomFile {
         return usualBoxesFrom(this.#instance, view, direction);
     }
 
+    laterSide(view = "family", direction = "down", mirrored = false) {
+        return SIDES[laterSideFrom(this.#instance, view, direction, mirrored)];
+    }
+
     takePlacesOf(earlier) {
         return this.#instance.exports.gedcom_take_places(this.#opened(), earlier.#opened()) !== 0;
     }
@@ -241,8 +261,8 @@ export class GedcomFile {
     #setPictureOptions(focus, options) {
         const { exports } = this.#instance;
         refuseNested(this.#instance, "picture", focus);
-        const numbers = pictureNumbers(options);
-        for (const person of [focusNumber(focus), numbers[3] || focus]) {
+        const numbers = pictureNumbers(this.#instance, options);
+        for (const person of [focusNumber(focus), options.to || focus]) {
             if (this.persons[person - 1] !== undefined) continue;
             throw new LayoutError("invalidPerson", `${this.name}: there is no person ${person}`, "", []);
         }

@@ -71,7 +71,7 @@ export function runLayout(instance, host, focus, options, ask, wanted = undefine
 export function runPicture(instance, host, focus, options) {
     const person = focusNumber(focus);
     refuseNested(instance, "picture", focus);
-    usePictureOptions(instance, pictureNumbers(options));
+    usePictureOptions(instance, pictureNumbers(instance, options));
     const { exports } = instance;
     const { result, thrown } = instance.askingHost(host, () => {
         const picture = readPicture(instance, options, exports.host_picture(person));

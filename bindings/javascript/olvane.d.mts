@@ -157,6 +157,21 @@ export const DIRECTIONS: readonly ["down", "up", "left", "right"];
  * What to draw. What is undefined is as if it were not given; a name that is none of these and a value of another
  * type are a TypeError, a number out of its range is a RangeError. A view ignores options that it has no use for.
  */
+/** What an option of a picture takes, for programs that offer the options to a user. */
+export interface PictureOptionInfo {
+    readonly name: keyof PictureOptions;
+    readonly kind: "word" | "flag" | "whole" | "number" | "person" | "list";
+    /** Of numbers: the least and the greatest. */
+    readonly least: number;
+    readonly most: number;
+    /** What it is where nobody said otherwise. */
+    readonly usual: string | boolean | number | readonly [];
+    /** All that it takes, of kind word; else empty. */
+    readonly words: readonly string[];
+    /** The views that it changes; the others ignore it. */
+    readonly views: readonly PictureView[];
+}
+
 export interface PictureOptions {
     /** family if not given. */
     view?: PictureView | undefined;
@@ -747,6 +762,13 @@ export class GedcomFile {
     factsOfFamily(id: number): readonly Fact[];
     /** The one of a person's parentFamilies that father and mother come from; 0 for none. RangeError for nobody. */
     parentFamilyOf(id: number): number;
+    /**
+     * Everybody with whom a person has one of the first parents in common, each once: the father's children, then those that
+     * only the mother has. RangeError for nobody.
+     */
+    siblingsOf(id: number): readonly number[];
+    /** Whom to show first where nobody said: the person with the most relatives near; 0 in a file of nobody. */
+    readonly bestFocus: number;
     /** What drawings with these facts say in the box of a person; GedcomError for nobody. */
     labelOfPerson(id: number, show?: Iterable<ShownFact>): PersonLabel;
     /** What they say at the marriage line of a family; empty for nothing. */
@@ -782,6 +804,15 @@ export class GedcomFile {
     branches(focus: number, person: number, options?: PictureOptions): readonly BranchSize[];
     /** The form of a view's boxes where nobody chose. Throws TypeError for another word. */
     usualBoxes(view?: PictureView, direction?: NonNullable<PictureOptions["direction"]>): "tall" | "wide";
+    /**
+     * On which side of its parents' box a child stands in the picture of a view: below in most. Throws TypeError for
+     * another word.
+     */
+    laterSide(
+        view?: PictureView,
+        direction?: NonNullable<PictureOptions["direction"]>,
+        mirrored?: boolean,
+    ): "top" | "right" | "bottom" | "left";
     /**
      * This file is a later version of another, which is open still: its next picture with keepPlaces keeps the places of
      * the other's last one, for all persons who have the same xref in both. False where there is no such picture.
@@ -973,6 +1004,8 @@ export class Olvane {
     readonly version: string;
     /** The encodings that readGedcom knows, by the names to show, the usual ones first. */
     readonly encodings: readonly string[];
+    /** All options of a picture: their names, what they take, and which views they change. */
+    readonly pictureOptions: readonly PictureOptionInfo[];
     /** The papers that have a name, for GedcomFile.sheets. */
     readonly papers: readonly string[];
     /** Takes over a family: none of the rows is looked at again. Throws FamilyError. */

@@ -8,6 +8,7 @@ import { readGedcom, readGedcomIn } from "./gedcom.mjs";
 import { diagnosticWords } from "./remarks.mjs";
 import { Instance } from "./instance.mjs";
 import { runLayout, runPicture } from "./layout.mjs";
+import { pictureOptionsFrom } from "./pictureOptions.mjs";
 import { Texts } from "./texts.mjs";
 
 export { FamilyError, GedcomError, HostError, LayoutError } from "./errors.mjs";
@@ -31,6 +32,10 @@ export class Olvane {
 
     get papers() {
         return this.#names("paper_names");
+    }
+
+    get pictureOptions() {
+        return pictureOptionsFrom(this.#instance);
     }
 
     family(rows = {}) {

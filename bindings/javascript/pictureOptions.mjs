@@ -1,55 +1,41 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What a caller asks of a picture, checked before the module hears of it, as options.mjs does for layouts.
+// What a caller asks of a picture, checked before the module makes it, as options.mjs does for layouts. The module's table
+// says which options there are and what they take.
 
 import { BRANCHES } from "./picture.mjs";
-import { DIRECTIONS, FACTS, PICTURE_VIEWS, Shown, described } from "./values.mjs";
-
-const FANS = ["ancestors", "descendants"];
-const WAYS = ["blood", "marriage", "both"];
-
-const LANGUAGES = ["en", "de", "es"];
-const PARENTS = ["birth", "adoptive", "allInOrder"];
+import { DIRECTIONS, FACTS, PICTURE_VIEWS, described } from "./values.mjs";
 
 const MOST = 2 ** 31 - 1;
-const LARGEST_SIZE = 1_000_000;
 
-/** In the order of set_picture_options. */
-const OPTIONS = {
-    view: { words: PICTURE_VIEWS, usual: "family" },
-    shown: { least: 0, most: Shown.all, usual: Shown.all },
-    generations: { least: 1, most: 1000, usual: 5 },
-    to: { least: 0, most: MOST, usual: 0 },
-    up: { least: 0, most: MOST, usual: 0 },
-    down: { least: 0, most: MOST, usual: 0 },
-    direction: { words: DIRECTIONS, usual: "down" },
-    spouses: { flag: true, usual: true },
-    siblings: { flag: true, usual: false },
-    compact: { flag: true, usual: false },
-    fan: { words: FANS, usual: "ancestors" },
-    angle: { least: 90, most: 360, usual: 360 },
-    ways: { words: WAYS, usual: "both" },
-    mostWays: { least: 0, most: MOST, usual: 8 },
-    language: { words: LANGUAGES, usual: "en" },
-    marks: { least: -1, most: MOST, usual: 0 },
-    effort: { least: 0, most: 100, usual: 1 },
-    allParts: { flag: true, usual: false },
-    unknownParents: { flag: true, usual: true },
-    parents: { words: PARENTS, usual: "birth" },
-    parentsOf: { least: 0, most: MOST, usual: 0 },
-    parentFamily: { least: 0, most: MOST, usual: 0 },
-    width: { size: true, usual: 55 },
-    height: { size: true, usual: 80 },
-    gapX: { size: true, usual: 25 },
-    gapY: { size: true, usual: 30 },
-    aspect: { size: true, usual: 0 },
-    keepPlaces: { flag: true, usual: false },
-    labelSize: { size: true, usual: 0 },
-    mirrored: { flag: true, usual: false },
-    folded: { folds: true, usual: [] },
-    boxSizes: { boxes: true, usual: [] },
-};
+/** What an option takes, by the numbers that the module has for it. */
+const KINDS = ["word", "flag", "whole", "number", "person", "list"];
+
+const tables = new WeakMap();
+
+/** The module's own table of options, asked for once. */
+function tableOf(instance) {
+    let table = tables.get(instance);
+    if (!table) {
+        const rows = JSON.parse(instance.text(instance.exports.picture_option_table()));
+        table = rows.map(([name, kind, least, most, usual, words, views]) => ({
+            ...{ name, kind: KINDS[kind], least, most, usual, words },
+            views: PICTURE_VIEWS.filter((_, i) => ((views >> i) & 1) === 1),
+        }));
+        tables.set(instance, table);
+    }
+    return table;
+}
+
+/** The table for who offers options to a user; usual is what the option takes, as least and most are numbers. */
+export function pictureOptionsFrom(instance) {
+    return tableOf(instance).map(({ usual, ...option }) => {
+        if (option.kind === "list") return { ...option, usual: [] };
+        if (option.kind === "word") return { ...option, usual: option.words[usual] };
+        return { ...option, usual: option.kind === "flag" ? usual !== 0 : usual };
+    });
+}
 
 function wordNumber(name, value, words) {
     const number = words.indexOf(value);
@@ -62,14 +48,13 @@ function flagNumber(name, value) {
     throw new TypeError(`${name} is ${described(value)}, and takes true or false`);
 }
 
-function plainNumber(name, value, { least, most, size }) {
+function plainNumber(name, value, { kind = "whole", least, most }) {
     if (typeof value !== "number") throw new TypeError(`${name} is ${described(value)}, and takes a number`);
-    if (size) {
-        if (Number.isFinite(Math.fround(value)) && value >= 0) return value;
-        throw new RangeError(`${name} is ${value}, and takes a finite number of 0 or more`);
-    }
-    if (Number.isInteger(value) && value >= least && value <= most) return value;
-    throw new RangeError(`${name} is ${value}, and takes a whole number of ${least} to ${most}`);
+    const isWhole = kind !== "number";
+    if ((!isWhole || Number.isInteger(value)) && value >= least && value <= most) return value;
+    throw new RangeError(
+        `${name} is ${value}, and takes a ${isWhole ? "whole number" : "number"} of ${least} to ${most}`,
+    );
 }
 
 /** How many folds there are, then the person and the branch of each. */
@@ -82,12 +67,8 @@ function foldNumbers(folds) {
 }
 
 /** How many boxes have a size of their own, then the person, the width and the height of each. */
-function boxNumbers(boxes) {
-    const length = (value) => {
-        const points = plainNumber("boxSizes", value, { size: true });
-        if (points <= LARGEST_SIZE) return points;
-        throw new RangeError(`boxSizes is ${value}, and takes a number of 0 to ${LARGEST_SIZE}`);
-    };
+function boxNumbers(boxes, size) {
+    const length = (value) => plainNumber("boxSizes", value, size);
     const numbers = [...boxes].flatMap(({ person, width, height }) => [
         plainNumber("boxSizes", person, { least: 1, most: MOST }),
         length(width),
@@ -96,11 +77,10 @@ function boxNumbers(boxes) {
     return [numbers.length / 3, ...numbers];
 }
 
-function numberOf(name, value, option) {
-    if (option.boxes) return boxNumbers(value);
-    if (option.folds) return foldNumbers(value);
-    if (option.words) return wordNumber(name, value, option.words);
-    return option.flag ? flagNumber(name, value) : plainNumber(name, value, option);
+function numberOf(option, value) {
+    const { name, kind, words } = option;
+    if (kind === "word") return wordNumber(name, value, words);
+    return kind === "flag" ? flagNumber(name, value) : plainNumber(name, value, option);
 }
 
 const THEMES = ["light", "dark", "print"];
@@ -115,6 +95,12 @@ export function factBits(show) {
 export function usualBoxesFrom({ exports }, view, direction) {
     const numbers = [wordNumber("view", view, PICTURE_VIEWS), wordNumber("direction", direction, DIRECTIONS)];
     return BOXES[exports.usual_boxes(...numbers)];
+}
+
+/** The number of the side on which children stand in a picture. */
+export function laterSideFrom({ exports }, view, direction, mirrored) {
+    const numbers = [wordNumber("view", view, PICTURE_VIEWS), wordNumber("direction", direction, DIRECTIONS)];
+    return exports.later_side(...numbers, flagNumber("mirrored", mirrored));
 }
 
 /** What a caller asks of a drawing, as the module's numbers. */
@@ -145,15 +131,23 @@ export function paperNumbers({ paper = "A4", rows = 1, columns = 1, scale = 0, .
     return { paper: String(paper), rows, columns, scale };
 }
 
-/** All options as numbers, in the order of set_picture_options. */
-export function pictureNumbers(options) {
+/** All options as numbers: in the order of the table, then the two lists. */
+export function pictureNumbers(instance, options) {
     if (typeof options !== "object" || options === null) {
         throw new TypeError(`options is ${described(options)}, and takes an object`);
     }
+    const table = tableOf(instance);
+    const names = table.map(({ name }) => name);
     for (const name of Object.keys(options)) {
-        if (!Object.hasOwn(OPTIONS, name)) {
-            throw new TypeError(`there is no option ${name}, but ${Object.keys(OPTIONS).join(", ")}`);
-        }
+        if (!names.includes(name)) throw new TypeError(`there is no option ${name}, but ${names.join(", ")}`);
     }
-    return Object.entries(OPTIONS).flatMap(([name, option]) => numberOf(name, options[name] ?? option.usual, option));
+    const { folded, boxSizes } = options;
+    const numbers = table
+        .filter(({ kind }) => kind !== "list")
+        .map((option) => {
+            const value = options[option.name];
+            return value === undefined || value === null ? option.usual : numberOf(option, value);
+        });
+    const width = table.find(({ name }) => name === "width");
+    return [...numbers, ...foldNumbers(folded ?? []), ...boxNumbers(boxSizes ?? [], width)];
 }

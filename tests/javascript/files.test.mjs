@@ -373,3 +373,21 @@ test("the usual family of parents is that by birth, wherever it stands in the re
     );
     assert.throws(() => file.parentFamilyOf(4), RangeError);
 });
+
+test("siblings have a first parent in common, and the focus to begin with has the most relatives near", () => {
+    const person = (n, links) => `0 @I${n}@ INDI\n1 NAME N${n} /A/\n${links}`;
+    const text =
+        "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n" +
+        person(1, "1 FAMS @F1@\n1 FAMS @F2@\n") +
+        person(2, "1 FAMS @F1@\n") +
+        person(3, "1 FAMC @F1@\n") +
+        person(4, "1 FAMC @F2@\n") +
+        person(5, "1 FAMC @F1@\n") +
+        "0 @F1@ FAM\n1 HUSB @I1@\n1 WIFE @I2@\n1 CHIL @I3@\n1 CHIL @I5@\n" +
+        "0 @F2@ FAM\n1 HUSB @I1@\n1 CHIL @I4@\n0 TRLR\n";
+    const file = olvane.readGedcom(bytesOf(text), "five.ged");
+    assert.deepEqual(file.siblingsOf(3), [5, 4]);
+    assert.deepEqual(file.siblingsOf(1), []);
+    assert.throws(() => file.siblingsOf(6), RangeError);
+    assert.equal(file.bestFocus, 3);
+});

@@ -81,4 +81,16 @@ test("views, directions, facts and relatives have the names and numbers of the r
     assert.deepEqual(DIRECTIONS, directions);
     assert.deepEqual(FACTS, facts);
     assert.deepEqual(Shown, { ...relatives, all: 255 });
+    const viewsOf = (option) => olvane.pictureOptions.find(({ name }) => name === option).views;
+    for (const option of ["up", "down", "direction", "compact"])
+        assert.deepEqual(
+            viewsOf(option),
+            views.filter(({ command }) => command.includes(option)).map(({ name }) => name),
+            option,
+        );
+    assert.deepEqual(
+        olvane.pictureOptions.find(({ name }) => name === "view").words,
+        views.map(({ name }) => name),
+    );
+    assert.deepEqual(olvane.pictureOptions.find(({ name }) => name === "direction").words, directions);
 });

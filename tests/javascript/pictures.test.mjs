@@ -137,6 +137,11 @@ test("the usual boxes are wide in the pedigree and where a chart lies sideways",
         }
     }
     assert.throws(() => file.usualBoxes("tower"), /takes one of family/);
+    assert.equal(file.laterSide(), "bottom");
+    assert.equal(file.laterSide("pedigree", "up"), "left");
+    assert.equal(file.laterSide("pedigree", "down", true), "right");
+    assert.equal(file.laterSide("ancestors", "up"), "top");
+    assert.throws(() => file.laterSide("near", "down", 1), /mirrored is 1, and takes true or false/);
     assert.throws(() => file.usualBoxes("near", "north"), /takes one of down/);
 });
 

@@ -4,6 +4,7 @@
 // The way through a family in a history that behaves as a browser's: entries with a state and an address, of which those
 // ahead are dropped when one is pushed.
 
+import "./viewOptions";
 import assert from "node:assert/strict";
 import { beforeEach, test } from "node:test";
 import { Journey } from "../src/shell/Journey";

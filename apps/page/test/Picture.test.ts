@@ -23,7 +23,7 @@ const marks = [
     { kind: "samePerson", boxes: [0, 3], number: 1 },
     { kind: "parentsElsewhere", boxes: [2, 0], number: 2 },
 ] as never;
-const picture = new Picture("everybody", "down", 1, values(boxes, { families: [couple], marks, focus: 0 }));
+const picture = new Picture("everybody", "bottom", 1, values(boxes, { families: [couple], marks, focus: 0 }));
 
 test("each box of a person has a key of its own, by which the next picture finds it again", () => {
     assert.deepEqual(
@@ -66,7 +66,7 @@ test("a box knows its families and the numbers of its marks", () => {
 
 test("a parent who is not known is named by sex and child", () => {
     const unknown = box(1, 0, 0, -120, { kind: "unknownParent", sex: "male", childOf: 0 });
-    const small = new Picture("family", "down", 1, values([box(0, 1, 0, 0), unknown]));
+    const small = new Picture("family", "bottom", 1, values([box(0, 1, 0, 0), unknown]));
     assert.equal(small.boxes[1]!.key, "male parent of 1");
     assert.equal(small.boxes[1]!.child, 1);
 });

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
+import "./viewOptions";
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import { linkOf, looksIn, type SharedLooks } from "../src/view/SharedLink";

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
+import "./viewOptions";
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import {
@@ -74,7 +75,10 @@ test("what a view has no use for is not in its address", () => {
     const full = { ...usual, up: 9, down: 9, direction: "up", compact: true } as const;
     assert.equal(addressOf({ ...full, view: "family" }, persons), "#person=I1");
     assert.equal(addressOf({ ...full, view: "fan" }, persons), "#person=I1&view=fan&up=9");
-    assert.equal(addressOf({ ...full, view: "everybody" }, persons), "#person=I1&view=everybody&direction=up");
+    assert.equal(
+        addressOf({ ...full, view: "everybody" }, persons),
+        "#person=I1&view=everybody&direction=up&compact=yes",
+    );
     assert.equal(
         addressOf({ ...full, view: "descendants" }, persons),
         "#person=I1&view=descendants&down=9&direction=up&compact=yes",

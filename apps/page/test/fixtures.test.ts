@@ -3,6 +3,7 @@
 
 // The rows that the command and the libraries are tried with as well.
 
+import "./viewOptions";
 import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
 import { join } from "node:path";

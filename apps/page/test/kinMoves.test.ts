@@ -38,7 +38,7 @@ function leads(picture: Picture, from: number, direction: Direction): number | u
 }
 
 test("up leads to a parent and down to a child, and along a row to the neighbour", () => {
-    const picture = new Picture("family", "down", 1, values(boxes));
+    const picture = new Picture("family", "bottom", 1, values(boxes));
     assert.equal(leads(picture, 1, "up"), 2);
     assert.equal(leads(picture, 1, "down"), 6);
     assert.equal(leads(picture, 1, "left"), 5);
@@ -48,31 +48,31 @@ test("up leads to a parent and down to a child, and along a row to the neighbour
 
 test("a relative counts before a box that lies nearer", () => {
     const nearer = [...boxes, box(6, 7, 205, 60)];
-    assert.equal(leads(new Picture("family", "down", 1, values(nearer)), 1, "up"), 2);
+    assert.equal(leads(new Picture("family", "bottom", 1, values(nearer)), 1, "up"), 2);
 });
 
 test("nothing beyond the last row", () => {
-    const picture = new Picture("family", "down", 1, values(boxes));
+    const picture = new Picture("family", "bottom", 1, values(boxes));
     assert.equal(leads(picture, 6, "down"), undefined);
     assert.equal(leads(picture, 5, "left"), undefined);
 });
 
 test("a chart that lies otherwise is walked as it lies", () => {
     const turned = boxes.map(({ index, id, x, y }) => box(index, id, x, 240 - y));
-    const upwards = new Picture("descendants", "up", 1, values(turned));
+    const upwards = new Picture("descendants", "top", 1, values(turned));
     assert.equal(leads(upwards, 1, "down"), 2);
     assert.equal(leads(upwards, 1, "up"), 6);
     const sideways = boxes.map(({ index, id, x, y }) => box(index, id, 240 - y, x));
-    const pedigree = new Picture("pedigree", "down", 1, values(sideways));
+    const pedigree = new Picture("pedigree", "left", 1, values(sideways));
     assert.equal(leads(pedigree, 1, "right"), 2);
     assert.equal(leads(pedigree, 1, "left"), 6);
     const mirrored = boxes.map(({ index, id, x, y }) => box(index, id, y, x));
-    assert.equal(leads(new Picture("pedigree", "down", 1, values(mirrored), true), 1, "left"), 2);
+    assert.equal(leads(new Picture("pedigree", "right", 1, values(mirrored)), 1, "left"), 2);
 });
 
 test("a parent who is not known is reached, and left again", () => {
     const unknown = box(6, 0, 340, 0, { kind: "unknownParent", sex: "female", childOf: 3 });
-    const picture = new Picture("family", "down", 1, values([...boxes, unknown]));
+    const picture = new Picture("family", "bottom", 1, values([...boxes, unknown]));
     const up = boxTowards(picture.boxesOf(4)[0]!, "up", picture, family)!;
     assert.equal(up.key, "female parent of 4");
     assert.equal(boxTowards(up, "down", picture, family)?.person, 4);

@@ -5,10 +5,12 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <exception>
 #include <utility>
 #include <vector>
 
 #include <olvane/kin/KinshipText.h>
+#include <olvane/kin/NearRelatives.h>
 
 #include "JsonText.h"
 #include "OpenFile.h"
@@ -97,6 +99,26 @@ const char* gedcomKinshipWords(OpenFile* file, std::uint32_t focus, const std::u
                                std::size_t count, const char* language) {
     return js::textOrRefusal(
         [&] { return js::kinshipWordsJson(*file, focus, persons, count, js::languageOf(language)); });
+}
+
+OLVANE_EXPORT("gedcom_siblings") const char* gedcomSiblings(OpenFile* file, std::uint32_t person) {
+    return js::textOrRefusal([&] {
+        js::JsonText json;
+        js::writePersons(json, kin::siblingsOf(file->kin(), js::placeOf(person)));
+        return std::move(json).take();
+    });
+}
+
+// The number of the person to begin with; 0 in a file of nobody, and where there is no memory to find out.
+OLVANE_EXPORT("gedcom_best_focus") std::uint32_t gedcomBestFocus(OpenFile* file) {
+    try {
+        const auto isNamed = [&](kin::Place person) {
+            return !gedcom::displayName(file->data.firstName(static_cast<std::uint32_t>(person) + 1)).empty();
+        };
+        return static_cast<std::uint32_t>(kin::bestFocus(file->kin(), isNamed) + 1);
+    } catch (const std::exception&) {
+        return 0;
+    }
 }
 
 OLVANE_EXPORT("gedcom_kinship")

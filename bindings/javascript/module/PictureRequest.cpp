@@ -1,98 +1,102 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Options of a picture come in as a run of numbers.
+// Options of a picture come in as a run of numbers, in the order of the table that goes out.
 
 #include "PictureRequest.h"
 
+#include <array>
 #include <cstddef>
+#include <limits>
 #include <memory>
 #include <new>
 #include <optional>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include <olvane/charts/BoxForm.h>
+#include <olvane/charts/LaterSide.h>
+#include <olvane/charts/ViewOption.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/LimitedDataSource.h>
+
+#include "JsonText.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
 
 namespace olvane::js {
 namespace {
 
-// As pictureOptions.mjs writes them, which has checked their ranges.
+// As pictureOptions.mjs writes them, which has checked them by the table.
 std::vector<double> pictureOptions;
+
+// An option of a picture of a file, beside those of every picture.
+struct FileOption {
+    charts::OptionForm form;
+    void (*set)(PictureRequest& request, double value);
+};
+
+constexpr auto kListKind = static_cast<charts::OptionKind>(5);  // of the table that goes out
+constexpr double kMostWhole = std::numeric_limits<std::int32_t>::max();
+constexpr std::array<std::string_view, 3> kParentOrders = {"birth", "adoptive", "allInOrder"};
+
+constexpr FileOption kFileOptions[] = {
+    {{"parents", charts::OptionKind::word, 0, kParentOrders.size() - 1, 0, kParentOrders},
+     [](PictureRequest& request, double value) {
+         request.parents.order = static_cast<gedcom::ParentOrder>(static_cast<int>(value));
+     }},
+    {{"parentsOf", charts::OptionKind::person, 0, kMostWhole, 0, {}},
+     [](PictureRequest& request, double value) {
+         request.parents.child = static_cast<gedcom::PersonId>(value);
+     }},
+    {{"parentFamily", charts::OptionKind::whole, 0, kMostWhole, 0, {}},
+     [](PictureRequest& request, double value) {
+         request.parents.family = static_cast<gedcom::FamilyId>(value);
+     }},
+    {{"keepPlaces"}, [](PictureRequest& request, double value) { request.keepsPlaces = value != 0; }},
+    {{"labelSize", charts::OptionKind::number, 0, charts::kLargestSize, 0, {}},
+     [](PictureRequest& request, double value) { request.labelSize = value; }},
+};
 
 class OptionReader {
 public:
-    template <class Value>
-    Value next() {
-        return static_cast<Value>(static_cast<int>(pictureOptions.at(place_++)));
-    }
-    bool flag() { return next<int>() != 0; }
     double number() { return pictureOptions.at(place_++); }
+    int whole() { return static_cast<int>(number()); }
 
 private:
     std::size_t place_ = 0;
 };
 
-void setShown(LayoutOptions& layout, unsigned bits) {
-    layout.auntsUncles = (bits & 0x01u) != 0;
-    layout.cousins = (bits & 0x02u) != 0;
-    layout.siblings = (bits & 0x04u) != 0;
-    layout.siblingSpouses = (bits & 0x08u) != 0;
-    layout.niecesNephews = (bits & 0x10u) != 0;
-    layout.grandchildren = (bits & 0x20u) != 0;
-    layout.greatGrandparents = (bits & 0x40u) != 0;
-    layout.spousesOfChildren = (bits & 0x80u) != 0;
+void appendOption(const charts::OptionForm& form, charts::ViewSet views, JsonText& json) {
+    json.begin();
+    json.string(form.name);
+    for (const double number : {static_cast<double>(form.kind), form.least, form.most, form.usual})
+        json.number(static_cast<long long>(number));
+    json.begin();
+    for (const std::string_view word : form.words) json.string(word);
+    json.end();
+    json.number(views);
+    json.end();
 }
 
 }  // namespace
 
 PictureRequest requestOf(kin::Place focus) {
     PictureRequest asked;
-    charts::ViewRequest& request = asked.view;
-    charts::ChartRequest& chart = request.chart;
+    charts::ChartRequest& chart = asked.view.chart;
     OptionReader options;
     chart.focus = focus;
-    chart.view = options.next<charts::View>();
-    setShown(chart.layout, options.next<unsigned>());
-    chart.layout.generations = options.next<int>();
+    for (const charts::ViewOption& option : charts::viewOptions()) option.set(asked.view, options.number());
+    for (const FileOption& option : kFileOptions) option.set(asked, options.number());
     charts::flagBeyondGenerations(chart);
-    chart.to = options.next<kin::Place>() - 1;
-    chart.up = options.next<int>();
-    chart.down = options.next<int>();
-    chart.direction = options.next<charts::Direction>();
-    chart.spouses = options.flag();
-    chart.siblings = options.flag();
-    chart.compact = options.flag();
-    chart.fanOf = options.next<charts::FanOf>();
-    chart.fanAngle = options.next<int>();
-    chart.ways = options.next<charts::WayChoice>();
-    chart.mostWays = options.next<int>();
-    chart.language = options.next<kin::Language>();
-    chart.marks = options.next<int>();
-    chart.effort = options.next<int>();
-    chart.onePart = !options.flag();
-    request.unknownParents = options.flag();
-    asked.parents.order = options.next<gedcom::ParentOrder>();
-    asked.parents.child = options.next<gedcom::PersonId>();
-    asked.parents.family = options.next<gedcom::FamilyId>();
-    chart.sizes.boxWidth = static_cast<float>(options.number());
-    chart.sizes.boxHeight = static_cast<float>(options.number());
-    chart.sizes.gapX = static_cast<float>(options.number());
-    chart.sizes.gapY = static_cast<float>(options.number());
-    chart.aspect = options.number();
-    asked.keepsPlaces = options.flag() && chart.view == charts::View::everybody;
-    asked.labelSize = options.number();
-    chart.mirrored = options.flag();
-    for (int left = options.next<int>(); left > 0; --left) {
-        const auto person = options.next<std::int64_t>();
-        asked.folded.push_back({person, options.next<picture::Branch>()});
+    asked.keepsPlaces = asked.keepsPlaces && chart.view == charts::View::everybody;
+    for (int left = options.whole(); left > 0; --left) {
+        const std::int64_t person = options.whole();
+        asked.folded.push_back({person, static_cast<picture::Branch>(options.whole())});
     }
-    for (int left = options.next<int>(); left > 0; --left) {
-        const auto person = options.next<std::int64_t>();
+    for (int left = options.whole(); left > 0; --left) {
+        const std::int64_t person = options.whole();
         const auto width = static_cast<float>(options.number());
         asked.boxSizes.push_back({person, {width, static_cast<float>(options.number())}});
     }
@@ -139,6 +143,32 @@ OLVANE_EXPORT("gedcom_take_places") int gedcomTakePlaces(OpenFile* file, const O
     } catch (const std::bad_alloc&) {
         return 0;
     }
+}
+
+// Of each option its name, its kind, the least, the greatest and the usual number, its words, and the views that it changes
+// as bits: those of every picture, those of a file, then the lists.
+OLVANE_EXPORT("picture_option_table") const char* pictureOptionTable() {
+    return textOrRefusal([] {
+        JsonText json;
+        json.begin();
+        for (const charts::ViewOption& option : charts::viewOptions())
+            appendOption(option.form, option.views, json);
+        for (const FileOption& option : kFileOptions)
+            appendOption(option.form, charts::viewOption("view").views, json);
+        appendOption({"folded", kListKind}, charts::viewsOfFolds(), json);
+        appendOption({"boxSizes", kListKind}, charts::viewsOfBoxSizes(), json);
+        json.end();
+        return std::move(json).take();
+    });
+}
+
+// Where children stand in the picture of a view, seen from their parents, as a picture's numbers have sides.
+OLVANE_EXPORT("later_side") int laterSide(int view, int direction, int mirrored) {
+    charts::ChartRequest request;
+    request.view = static_cast<charts::View>(view);
+    request.direction = static_cast<charts::Direction>(direction);
+    request.mirrored = mirrored != 0;
+    return static_cast<int>(charts::laterSideOf(request));
 }
 
 // Room for so many numbers, which JavaScript fills before it asks for a picture.

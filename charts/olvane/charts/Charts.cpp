@@ -106,32 +106,6 @@ picture::Picture chartWithoutCounts(const kin::KinGraph& graph, const ChartReque
 
 }  // namespace
 
-const char* nameOf(View view) {
-    switch (view) {
-        case View::family:
-            return "family";
-        case View::pedigree:
-            return "pedigree";
-        case View::near:
-            return "near";
-        case View::ancestors:
-            return "ancestors";
-        case View::descendants:
-            return "descendants";
-        case View::hourglass:
-            return "hourglass";
-        case View::relatives:
-            return "relatives";
-        case View::fan:
-            return "fan";
-        case View::kinship:
-            return "kinship";
-        case View::everybody:
-            return "everybody";
-    }
-    return "";
-}
-
 void checkRequest(const ChartRequest& request) {
     if (request.up < 0 || request.down < 0 || request.mostWays < 0) {
         throw std::invalid_argument("numbers of generations and of ways must not be negative");

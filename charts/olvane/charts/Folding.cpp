@@ -11,6 +11,7 @@
 
 #include <olvane/charts/LaterSide.h>
 #include <olvane/charts/SelectionInternal.h>
+#include <olvane/charts/ViewOption.h>
 
 namespace olvane::charts {
 
@@ -37,8 +38,7 @@ std::int32_t sizeOf(const kin::KinGraph& graph, const ChartRequest& request, con
 }  // namespace
 
 bool canFold(View view) {
-    return view == View::near || view == View::ancestors || view == View::descendants ||
-           view == View::hourglass || view == View::relatives;
+    return (viewsOfFolds() & setOf(view)) != 0;
 }
 
 std::array<std::int32_t, 3> branchSizes(const kin::KinGraph& graph, const ChartRequest& request,

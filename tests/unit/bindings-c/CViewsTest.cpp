@@ -3,9 +3,11 @@
 
 // The picture of any view in C: of a table and of callbacks it is that of the library.
 
+#include <algorithm>
 #include <limits>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include <malloc.h>
 
@@ -374,6 +376,63 @@ TEST(CViews, refuseWhatIsOutOfRangeAndWhoIsNotThere) {
     const char* why = nullptr;
     EXPECT_EQ(OLVANE_OK, olvane_picture_failure(empty.get(), &why));
     EXPECT_STREQ(why, "The focus, or the other person, is not there.");
+}
+
+olvane_picture_option optionAt(std::size_t index) {
+    olvane_picture_option option = {};
+    option.struct_size = sizeof option;
+    EXPECT_EQ(OLVANE_OK, olvane_picture_option_at(index, &option));
+    return option;
+}
+
+TEST(CViews, nameTheFieldThatIsOutOfRange) {
+    const char* refused = nullptr;
+    olvane_picture_options options = optionsFor(OLVANE_PICTURE_FAN);
+    EXPECT_EQ(OLVANE_OK, olvane_picture_options_check(&options, &refused));
+    EXPECT_EQ(nullptr, refused);
+    options.effort = 101;
+    options.fan_angle = 89;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_check(&options, &refused));
+    EXPECT_STREQ("fan_angle", refused);
+    options.fan_angle = 90.5;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_check(&options, &refused));
+    EXPECT_STREQ("effort", refused);
+    options = optionsFor(OLVANE_PICTURE_FAN);
+    options.layout.generations = 0;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_check(&options, &refused));
+    EXPECT_STREQ("layout.generations", refused);
+    options = optionsFor(OLVANE_PICTURE_FAN);
+    options.year = -1;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_check(&options, &refused));
+    EXPECT_STREQ("year", refused);
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_options_check(nullptr, &refused));
+}
+
+// The defaults are what the table says, and the check refuses what is just beyond its bounds.
+TEST(CViews, listWhatEachFieldTakes) {
+    std::vector<std::string> names;
+    for (std::size_t i = 0; i < olvane_picture_option_count(); ++i) {
+        const olvane_picture_option option = optionAt(i);
+        names.emplace_back(option.name);
+        EXPECT_LE(option.least, option.usual) << option.name;
+        EXPECT_LE(option.usual, option.most) << option.name;
+        EXPECT_NE(0U, option.views) << option.name;
+        const auto words = static_cast<std::size_t>(option.kind == OLVANE_OPTION_WORD ? option.most + 1 : 0);
+        for (std::size_t word = 0; word < words; ++word)
+            EXPECT_NE(nullptr, olvane_picture_option_word(i, word)) << option.name;
+        EXPECT_EQ(nullptr, olvane_picture_option_word(i, words)) << option.name;
+    }
+    for (const char* name : {"view", "up", "fan_of", "most_ways", "layout.shown", "aspect"})
+        EXPECT_EQ(1, std::count(names.begin(), names.end(), name)) << name;
+    olvane_picture_option direction = optionAt(3);
+    EXPECT_STREQ("direction", direction.name);
+    EXPECT_STREQ("left", olvane_picture_option_word(3, 2));
+    EXPECT_EQ(0U, direction.views & (1U << OLVANE_PICTURE_FAMILY));
+    EXPECT_NE(0U, direction.views & (1U << OLVANE_PICTURE_NEAR));
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_option_at(names.size(), &direction));
+    direction.struct_size = 1;
+    EXPECT_EQ(OLVANE_INVALID_ARGUMENT, olvane_picture_option_at(0, &direction));
+    EXPECT_EQ(nullptr, olvane_picture_option_word(names.size(), 0));
 }
 
 int refuse(void*, std::int64_t, olvane_person_list*) {

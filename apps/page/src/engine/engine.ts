@@ -4,6 +4,7 @@
 // The engine that lies in this page, and the family that may lie beside it.
 
 import { type Diagnostic, loadOlvane, type Olvane } from "olvane";
+import { learnOptions } from "../base/views";
 import { bytesOfBase64, gunzip } from "./archive";
 import { Photographs } from "./photographs";
 
@@ -25,8 +26,10 @@ export interface EmbeddedFamily {
     readonly hasMap: boolean;
 }
 
-export function startEngine(): Promise<Olvane> {
-    return loadOlvane(self.olvanePage.engine);
+export async function startEngine(): Promise<Olvane> {
+    const engine = await loadOlvane(self.olvanePage.engine);
+    learnOptions(engine.pictureOptions);
+    return engine;
 }
 
 export async function embeddedFamily(): Promise<EmbeddedFamily | null> {

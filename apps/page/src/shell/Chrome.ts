@@ -6,7 +6,7 @@
 
 import type { ShownFact } from "olvane";
 import { type UiMessages, uiLanguages } from "../messages/ui";
-import { hasGroups, kRelativeNames, kShownFacts, type RelativeName } from "../base/views";
+import { hasGroups, hasUnknownParents, kRelativeNames, kShownFacts, type RelativeName } from "../base/views";
 import { kLeastGenerations, kMostGenerations, type ViewState } from "../view/ViewState";
 import { checkbox, iconButton, switchRow } from "../base/controls";
 import { html, onClick } from "../base/dom";
@@ -157,7 +157,7 @@ export class Chrome {
         this.unknownParents.checked = state.unknownParents;
         for (const [fact, input] of this.facts) input.checked = state.show.has(fact);
         this.photos.checked = state.photos;
-        this.unknownParents.disabled = state.view !== "family" && state.view !== "pedigree";
+        this.unknownParents.disabled = !hasUnknownParents(state.view);
         for (const [name, input] of this.switches) input.checked = !state.hidden.has(name);
         // Cousins are children of aunts and uncles, and so on: no switch without the one that it hangs from. The
         // pedigree has none of them, and the family view has its generations by the switches.

@@ -6,7 +6,7 @@
 
 import { quoted } from "../base/quoted";
 import type { ViewName } from "../base/views";
-import type { OlvaneTreeEvents } from "../element/OlvaneTree";
+import type { OlvaneTreeEvents } from "../element/treeTypes";
 import { mapInWorker } from "../engine/mapWorker";
 import { copyText } from "../output/saving";
 import { linkOf } from "../view/SharedLink";

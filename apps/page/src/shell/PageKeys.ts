@@ -4,7 +4,7 @@
 // Keys that are pressed outside of the viewer, and those inside it that lead out of it.
 
 import type { OuterKey } from "../ui/pictureKeys";
-import type { OlvaneTreeEvents } from "../element/OlvaneTree";
+import type { OlvaneTreeEvents } from "../element/treeTypes";
 import type { Navigation } from "./Navigation";
 import type { Page } from "./Page";
 import type { Panels } from "./Panels";

@@ -100,7 +100,9 @@ export class SidePanel {
             this.facts(known),
             this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
             this.couples(person, family),
-            this.people(this.ui.panel.siblings, family.siblingsOf(person), (id) => this.link(family.person(id))),
+            this.people(this.ui.panel.siblings, family.file.siblingsOf(person.id), (id) =>
+                this.link(family.person(id)),
+            ),
             this.further(known),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));

@@ -49,7 +49,8 @@ export class OpenFamily {
         const options = keeping(this.optionsOf(state, reader));
         const labelSize = state.show.has("marriage") ? kLabelSize : 0;
         const values = this.file.picture(state.focus, { ...options, labelSize });
-        return new Picture(state.view, state.direction, state.focus, values, options.mirrored);
+        const laterSide = this.file.laterSide(state.view, state.direction, options.mirrored);
+        return new Picture(state.view, laterSide, state.focus, values);
     }
 
     // What hangs from a person in the picture. Throws LayoutError.
@@ -92,15 +93,9 @@ export class OpenFamily {
         return null;
     }
 
-    // The focus stands first among all who could be one: whoever has the most relatives near.
+    // Whom to begin with where nobody said.
     bestFocus(): number {
-        let best = 1;
-        let most = -1;
-        for (const person of this.persons) {
-            const near = this.nearness(person);
-            if (near > most) [best, most] = [person.id, near];
-        }
-        return best;
+        return this.file.bestFocus || 1;
     }
 
     // Asked for again and again with one focus, whose answers are kept.
@@ -110,14 +105,6 @@ export class OpenFamily {
         return (this.kinships = new KinshipTexts(this.file, focus, language));
     }
 
-    siblingsOf(person: Person): number[] {
-        const siblings = new Set<number>();
-        for (const parent of [person.father, person.mother]) {
-            for (const child of this.person(parent)?.children ?? []) if (child !== person.id) siblings.add(child);
-        }
-        return [...siblings];
-    }
-
     close(): void {
         this.photographs.close();
         this.file.close();
@@ -125,26 +112,5 @@ export class OpenFamily {
 
     private optionsOf(state: ViewState, reader: Reader): PictureOptions {
         return optionsOf(state, this.file.usualBoxes(state.view, state.direction), reader);
-    }
-
-    // Two generations up and down and across, with parents worth most: a picture with all its parts.
-    private nearness(person: Person): number {
-        const parents = [person.father, person.mother]
-            .map((id) => this.person(id))
-            .filter((parent) => parent !== undefined);
-        const grandparents = parents.reduce((n, parent) => n + (parent.father ? 1 : 0) + (parent.mother ? 1 : 0), 0);
-        const siblings = Math.min(6, parents[0]?.children.length ?? 0);
-        const children = Math.min(6, person.children.length);
-        const grandchildren = person.children.some((child) => (this.person(child)?.children.length ?? 0) > 0) ? 2 : 0;
-        const named = person.name === "" ? -10 : 0;
-        return (
-            named +
-            3 * parents.length +
-            2 * grandparents +
-            siblings +
-            children +
-            grandchildren +
-            Math.min(2, person.spouses.length)
-        );
     }
 }

@@ -7,6 +7,7 @@
 
 import type {
     FoldedBranch,
+    GedcomFile,
     KinshipPlate,
     PictureBox,
     PictureFamily,
@@ -15,7 +16,7 @@ import type {
     Sex,
 } from "olvane";
 import { type Rectangle, SpatialGrid } from "../base/SpatialGrid";
-import type { ChartDirection, ViewName } from "../base/views";
+import type { ViewName } from "../base/views";
 
 export interface Box {
     readonly index: number;
@@ -49,6 +50,8 @@ export interface Box {
     // Its piece of a ring, in a round chart.
     readonly arc: BoxArc | null;
 }
+
+export type LaterSide = ReturnType<GedcomFile["laterSide"]>;
 
 /** A piece of a ring: angles in degrees clockwise from the top, radii and middle in points. */
 export interface BoxArc {
@@ -85,10 +88,10 @@ export class Picture {
     // values has at least one box.
     constructor(
         readonly view: ViewName,
-        readonly direction: ChartDirection,
+        // Where children stand, seen from their parents.
+        readonly laterSide: LaterSide,
         readonly focus: number,
         values: PictureValues,
-        readonly mirrored = false,
     ) {
         const numbers = markNumbers(values.marks);
         const lines = [...new Set(values.arcs.map((arc) => arc.line))].filter((line) => line !== null);

@@ -5,7 +5,7 @@
 // there is none, to the box that lies most nearly that way.
 
 import type { OpenFamily } from "./OpenFamily";
-import type { Box, Picture } from "./Picture";
+import type { Box, LaterSide, Picture } from "./Picture";
 
 export type Direction = "up" | "down" | "left" | "right";
 
@@ -18,16 +18,15 @@ export function boxTowards(from: Box, direction: Direction, picture: Picture, fa
     return nearest(from, direction, kin) ?? nearest(from, direction, inLine(from, direction, others, picture));
 }
 
-// Where parents lie, seen from their children: above in most charts, at the right in a pedigree.
-function waysOf({ view, direction, mirrored }: Picture): readonly [toParents: Direction, toChildren: Direction] {
-    if (view !== "pedigree" && direction === "up") return ["down", "up"];
-    if (view !== "pedigree" && direction === "down") return ["up", "down"];
-    const atRight = (view === "pedigree" || direction === "left") !== mirrored;
-    return atRight ? ["right", "left"] : ["left", "right"];
-}
+const kWays = {
+    bottom: ["up", "down"],
+    top: ["down", "up"],
+    left: ["right", "left"],
+    right: ["left", "right"],
+} as const satisfies Record<LaterSide, readonly [toParents: Direction, toChildren: Direction]>;
 
 function kinBoxes(from: Box, direction: Direction, picture: Picture, family: OpenFamily): Box[] {
-    const [toParents, toChildren] = waysOf(picture);
+    const [toParents, toChildren] = kWays[picture.laterSide];
     if (from.child && direction === toChildren) return [...picture.boxesOf(from.child)];
     const person = family.person(from.person);
     if (!person) return [];
@@ -41,7 +40,7 @@ function kinBoxes(from: Box, direction: Direction, picture: Picture, family: Ope
 // Along a generation only the generation itself counts; from one to another also what lies not quite straight
 // ahead.
 function inLine(from: Box, direction: Direction, boxes: readonly Box[], picture: Picture): Box[] {
-    const alongGeneration = !waysOf(picture).includes(direction);
+    const alongGeneration = !kWays[picture.laterSide].some((way) => way === direction);
     const slope = alongGeneration ? 0.2 : 1.8;
     return boxes.filter((box) => distanceAside(from, box, direction) <= distanceAhead(from, box, direction) * slope);
 }
