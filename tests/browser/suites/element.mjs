@@ -76,9 +76,7 @@ describe("element", () => {
         assert.deepEqual(names(attributes), [...found.observed, "wheel"].sort());
         assert.deepEqual(found.lacking, []);
         assert.deepEqual(names(cssParts), [...new Set(found.parts)].sort());
-        const declared = source("element/OlvaneTree.ts")
-            .split("export interface OlvaneTreeEvents {")[1]
-            .split("\n}")[0];
+        const declared = source("element/treeTypes.ts").split("export interface OlvaneTreeEvents {")[1].split("\n}")[0];
         const sent = [...declared.matchAll(/^ {4}(\w+): CustomEvent/gm)].map(([, name]) => name);
         assert.deepEqual(names(events), [...sent, "error"].sort());
         const styles = source("styles/viewer.css") + source("styles/colours.css") + source("styles/controls.css");

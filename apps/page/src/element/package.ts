@@ -6,6 +6,7 @@
 
 import { loadOlvane, type Olvane } from "olvane";
 import { unpackModule } from "olvane-unpack";
+import { learnOptions } from "../base/views";
 import { defineOlvaneTree, OlvaneTree } from "./OlvaneTree";
 
 /** Put in by the build: the module, packed and written as letters. */
@@ -15,12 +16,18 @@ let engine: Promise<Olvane> | null = null;
 
 /** The engine that all viewers of the page share. */
 export function sharedEngine(): Promise<Olvane> {
-    engine ??= Promise.resolve(kPackedModule).then((letters) => loadOlvane(unpackModule(letters)));
+    engine ??= started();
     return engine;
+}
+
+async function started(): Promise<Olvane> {
+    const loaded = await loadOlvane(unpackModule(await Promise.resolve(kPackedModule)));
+    learnOptions(loaded.pictureOptions);
+    return loaded;
 }
 
 OlvaneTree.engine = sharedEngine;
 defineOlvaneTree();
 
 export { OlvaneTree };
-export type { OlvaneTreeEvents } from "./OlvaneTree";
+export type { OlvaneTreeEvents } from "./treeTypes";
