@@ -7,38 +7,21 @@
 //
 // Holds: the focus's box, and the box that the keys stand on, always have their elements.
 
-import type { Branch, PictureFamily, Texts } from "olvane";
+import type { PictureFamily, Texts } from "olvane";
 import { prefersStillness, setAttributes, svg } from "../base/dom";
-import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle, touches } from "../base/SpatialGrid";
-import { arcPath } from "./arcArt";
+import type { Box, FamilyLines, Picture } from "../view/Picture";
 import { type BoxLook, type BranchMark, drawBox, drawBranch, handleOf, repaintBox } from "./boxArt";
-import { Camera, eased, kReadable, type Placing, type Point } from "./Camera";
-import { drawFamily } from "./familyLines";
-import { drawWays } from "./wayLines";
+import { Camera, kReadable, type Placing } from "./Camera";
+import { Glide, kGlideTime, leaveGhosts } from "./Glide";
+import { LineLayer } from "./LineLayer";
+import { overviewPaths } from "./overviewPaths";
+import { clipped, middleOf, unionOf } from "./sceneAreas";
+import { listenToSurface, type SceneEvents } from "./sceneInput";
 
-const kDoubleTap = 400; // ms
 const kMostReadable = 420; // boxes in sight
 const kMostPointed = 3000; // boxes of a picture in which branches are counted at each box under the pointer
-const kGlideTime = 520; // ms
-const kFadeTime = 200; // ms, as in styles/viewer.css
-const kLineWidth = 1.6; // points
 const kRoomAround = 0.4; // of the window, drawn on each side of it
-
-export interface SceneEvents {
-    // A box was clicked or tapped twice.
-    opened(box: Box): void;
-    // A box was clicked or tapped once.
-    selected(box: Box): void;
-    // The keys stand on another box.
-    active(box: Box): void;
-    // The mark of further parents was clicked or tapped.
-    furtherParents(box: Box): void;
-    // The mark of a branch was clicked or tapped.
-    folded(box: Box, branch: Branch): void;
-    pointed(box: Box | null, element: SVGGElement | null): void;
-    moved(placing: Placing): void;
-}
 
 // How the boxes of a picture are to be drawn.
 export interface BoxContents {
@@ -50,15 +33,10 @@ export interface BoxContents {
     labelOf(family: PictureFamily): string;
 }
 
-interface Glide {
-    readonly start: number; // of performance.now()
-    readonly from: ReadonlyMap<string, Point>;
-}
-
 export class Scene {
     readonly camera: Camera;
     private readonly world = svg("g", { class: "world" });
-    private lines = svg("g", { class: "lines", "aria-hidden": "true" });
+    private readonly lines = new LineLayer();
     private readonly overviewLayer = svg("g", { class: "far", "aria-hidden": "true" });
     private readonly ghosts = svg("g", { class: "ghosts", "aria-hidden": "true" });
     private readonly boxLayer = svg("g", { class: "boxes" });
@@ -67,8 +45,6 @@ export class Scene {
     private contents!: BoxContents; // given with the picture
     private activeBox: Box | null = null;
     private pointedBox: Box | null = null;
-    // The family whose line is under the pointer, as its lines name it.
-    private pointedFamily: string | null = null;
     private drawn: Rectangle | null = null; // whose boxes and lines have elements
     private isFar = false; // in overview mode
     private glide: Glide | null = null;
@@ -78,10 +54,10 @@ export class Scene {
         readonly surface: SVGSVGElement,
         private readonly events: SceneEvents,
     ) {
-        this.world.append(this.overviewLayer, this.lines, this.ghosts, this.boxLayer);
+        this.world.append(this.overviewLayer, this.lines.element, this.ghosts, this.boxLayer);
         surface.append(this.world);
         this.camera = new Camera(surface, (placing) => this.cameraMoved(placing));
-        this.listen();
+        listenToSurface(surface, this, events);
     }
 
     // Draws another picture. Boxes of the same persons glide from where they stood, while the anchor, a box
@@ -98,7 +74,7 @@ export class Scene {
         this.world.setAttribute("font-family", contents.texts.fontFamilies);
         this.activeBox = picture.focusBox;
         this.pointedBox = null;
-        this.pointedFamily = null;
+        this.lines.pointAt(null);
         this.elements.clear();
         this.boxLayer.replaceChildren();
         this.overviewLayer.replaceChildren();
@@ -143,7 +119,8 @@ export class Scene {
         this.picture = null;
         this.activeBox = null;
         this.elements.clear();
-        for (const group of [this.lines, this.boxLayer, this.overviewLayer, this.ghosts]) group.replaceChildren();
+        this.lines.clear();
+        for (const group of [this.boxLayer, this.overviewLayer, this.ghosts]) group.replaceChildren();
     }
 
     fit(): void {
@@ -200,19 +177,13 @@ export class Scene {
         this.markBranches();
     }
 
-    // Lights up the lines of the family whose line is under the pointer, and nobody else's meanwhile.
-    private pointAtFamily(family: string | null): void {
-        if (this.pointedFamily === family) return;
-        this.pointedFamily = family;
-        this.lightFamilies();
+    pointAtFamily(family: string | null): void {
+        this.lines.pointAt(family);
     }
 
     private lightFamilies(): void {
         const box = this.pointedBox ?? this.activeBox;
-        const own = box && this.picture ? this.picture.familiesOf(box).map(({ index }) => String(index)) : [];
-        const lit = new Set(this.pointedFamily === null ? own : [this.pointedFamily]);
-        for (const group of this.lines.children)
-            group.classList.toggle("lit", lit.has(group.getAttribute("data-family") ?? ""));
+        this.lines.lightFamilies(box && this.picture ? this.picture.familiesOf(box) : []);
     }
 
     private begin(picture: Picture): void {
@@ -225,9 +196,8 @@ export class Scene {
         const { k, x, y } = this.camera.placing;
         // With the same focus the box that was acted on keeps its place, else it hands it to the new one.
         const heir = (before.focus === picture.focus && picture.boxOfKey(held.key)) || picture.focusBox;
-        const oldCentre = middleOf(before.areaOf(held));
-        const newCentre = middleOf(picture.areaOf(heir));
-        const shift = { x: newCentre.x - oldCentre.x, y: newCentre.y - oldCentre.y };
+        const glide = new Glide(before, held, picture, heir, performance.now());
+        const { shift } = glide;
         const start = { k, x: x - shift.x * k, y: y - shift.y * k };
         const target = this.comfortable(picture, heir, start, before.view !== picture.view);
         if (prefersStillness()) {
@@ -237,16 +207,10 @@ export class Scene {
             return;
         }
 
-        const from = new Map<string, Point>();
-        for (const box of before.boxes) from.set(box.key, { x: box.x + shift.x, y: box.y + shift.y });
-        from.set(heir.key, {
-            x: oldCentre.x + shift.x - heir.width / 2,
-            y: oldCentre.y + shift.y - heir.height / 2,
-        });
-        this.glide = { start: performance.now(), from };
+        this.glide = glide;
         // Whoever was found far away is not travelled to: the way would show, and draw, all that lies between.
         const wasInSight = touches(before.areaOf(held), this.camera.window());
-        if (wasInSight) this.leaveGhosts(picture, shift, oldElements);
+        if (wasInSight) leaveGhosts(this.ghosts, picture, shift, oldElements);
         else this.ghosts.replaceChildren();
         this.camera.place(wasInSight ? start : target);
         this.update(this.camera.window(target));
@@ -267,37 +231,15 @@ export class Scene {
         return this.camera.includingWhole(picture.bounds, near);
     }
 
-    private leaveGhosts(picture: Picture, shift: Point, oldElements: Map<Box, SVGGElement>): void {
-        const gone: SVGGElement[] = [];
-        for (const [box, element] of oldElements) {
-            if (picture.boxOfKey(box.key)) continue;
-            for (const name of ["data-person-id", "data-xref", "data-box"]) element.removeAttribute(name);
-            for (const name of ["role", "tabindex", "aria-label", "aria-current"])
-                handleOf(element).removeAttribute(name);
-            element.setAttribute("transform", `translate(${box.x + shift.x} ${box.y + shift.y})`);
-            gone.push(element);
-        }
-        this.ghosts.replaceChildren(...gone);
-        setTimeout(() => gone.forEach((element) => element.remove()), kFadeTime);
-    }
-
     private fadeNewcomers(before: Picture): void {
         for (const [box, element] of this.elements) if (!before.boxOfKey(box.key)) element.classList.add("late");
-        const lines = svg("g", {
-            class: "lines later",
-            "aria-hidden": "true",
-            "stroke-width": this.lines.getAttribute("stroke-width"),
-        });
-        lines.append(...this.lines.childNodes);
-        this.lines.replaceWith(lines);
-        this.lines = lines;
+        this.lines.fadeIn();
     }
 
     private step = (now: number): void => {
         if (!this.glide || !this.picture) return;
-        const part = Math.min(1, Math.max(0, now - this.glide.start) / kGlideTime);
-        for (const [box, element] of this.elements) this.put(box, element, eased(part));
-        if (part < 1) {
+        for (const [box, element] of this.elements) this.put(box, element, now);
+        if (this.glide.partAt(now) < 1) {
             this.frame = requestAnimationFrame(this.step);
             return;
         }
@@ -308,10 +250,9 @@ export class Scene {
         this.markBranches();
     };
 
-    private put(box: Box, element: SVGGElement, part: number): void {
-        const from = this.glide?.from.get(box.key) ?? box;
-        const x = from.x + (box.x - from.x) * part;
-        const y = from.y + (box.y - from.y) * part;
+    // Where the box is at that time of performance.now().
+    private put(box: Box, element: SVGGElement, now: number): void {
+        const { x, y } = this.glide?.placeOf(box, now) ?? box;
         element.setAttribute("transform", `translate(${x.toFixed(1)} ${y.toFixed(1)})`);
     }
 
@@ -355,17 +296,14 @@ export class Scene {
 
     private drawLines(picture: Picture): void {
         const families = this.isFar ? picture.families : picture.familiesWithin(this.drawn!);
-        const near = (lines: FamilyLines) => drawFamily(lines, this.contents.labelOf(lines.family));
-        this.lines.replaceChildren(...(this.isFar ? [farLines(families)] : families.map(near)));
-        this.lines.append(...drawWays(picture.kinship?.ways ?? []));
+        const label = this.isFar ? null : ({ family }: FamilyLines) => this.contents.labelOf(family);
+        this.lines.draw(families, picture.kinship?.ways ?? [], label);
         this.thickenLines();
         this.lightFamilies();
     }
 
-    // Lines stay to be seen when the picture is a long way off.
     private thickenLines(): void {
-        const width = String(Math.max(kLineWidth, Math.round(7 / this.camera.placing.k) / 10));
-        if (this.lines.getAttribute("stroke-width") !== width) this.lines.setAttribute("stroke-width", width);
+        this.lines.thicken(this.camera.placing.k);
     }
 
     private drawOverview(picture: Picture): void {
@@ -401,7 +339,7 @@ export class Scene {
         element.setAttribute("data-box", String(box.index));
         if (box === this.activeBox) handleOf(element).setAttribute("tabindex", "0");
         this.elements.set(box, element);
-        this.put(box, element, this.glide ? 0 : 1);
+        this.put(box, element, -Infinity);
         return element;
     }
 
@@ -420,101 +358,13 @@ export class Scene {
         return element && handleOf(element);
     }
 
-    private listen(): void {
-        const { surface, events } = this;
-        let lastClicked: Box | null = null;
-        let lastTime = 0;
-        surface.addEventListener("click", (event) => {
-            const box = this.boxAt(event.target);
-            if (!box) return;
-            if ((event.target as Element).closest(".further")) return events.furtherParents(box);
-            const branch = (event.target as Element).closest(".fold")?.getAttribute("data-branch");
-            if (branch) return events.folded(box, branch as Branch);
-            // The second of two quick clicks opens what the first one selected.
-            // Browsers count clicks of a mouse, but not all of them those of a finger.
-            const isQuick = event.detail > 1 || event.timeStamp - lastTime < kDoubleTap;
-            const isSecond = isQuick && box === lastClicked;
-            lastClicked = isSecond ? null : box;
-            lastTime = event.timeStamp;
-            if (isSecond) return events.opened(box);
-            if (box.person && box !== this.activeBox) this.activate(box, false);
-            events.selected(box);
-        });
-        // A box that is pressed gets the keys, but the picture must hold still until it is known whether that is a
-        // click or the beginning of a drag.
-        let pressed = false;
-        surface.addEventListener("pointerdown", () => (pressed = true), { capture: true });
-        for (const end of ["pointerup", "pointercancel"]) addEventListener(end, () => (pressed = false), true);
-        surface.addEventListener("focusin", (event) => {
-            const box = this.boxAt(event.target);
-            if (box && box !== this.activeBox && !pressed) this.activate(box);
-        });
-        surface.addEventListener("pointerover", (event) => {
-            if (event.pointerType === "touch") return;
-            const box = this.boxAt(event.target);
-            events.pointed(box, box ? (this.elements.get(box) ?? null) : null);
-            const group = (event.target as Element | null)?.closest?.("[data-family]");
-            this.pointAtFamily(group?.getAttribute("data-family") ?? null);
-        });
-        surface.addEventListener("pointerleave", () => {
-            events.pointed(null, null);
-            this.pointAtFamily(null);
-        });
-        // The browser itself must not scroll the surface to a box that got the keys.
-        surface.addEventListener("scroll", () => surface.scrollTo(0, 0));
-    }
-
     // What has the keys in the tree of elements that the surface stands in.
     private get keyHolder(): Element | null {
         return (this.surface.getRootNode() as Document | ShadowRoot).activeElement ?? null;
     }
 
-    private boxAt(target: EventTarget | null): Box | null {
+    boxAt(target: EventTarget | null): Box | null {
         const index = (target as Element | null)?.closest?.("[data-box]")?.getAttribute("data-box");
         return index ? (this.picture?.boxes[Number(index)] ?? null) : null;
     }
-}
-
-// All boxes of a picture, with nothing in them: a path for each sex.
-export function overviewPaths(picture: Picture): SVGPathElement[] {
-    const paths = new Map<string, string[]>();
-    for (const box of picture.boxes) {
-        const { person, sex, x, y, width, height } = box;
-        const kind = person ? sex : "missing";
-        const list = paths.get(kind) ?? [];
-        list.push(box.arc ? arcPath(box.arc, { x: 0, y: 0 }) : `M${x} ${y}h${width}v${height}h${-width}z`);
-        paths.set(kind, list);
-    }
-    return [...paths].map(([kind, list]) => svg("path", { class: kind, d: list.join("") }));
-}
-
-// From afar all lines are one path.
-function farLines(families: readonly FamilyLines[]): SVGPathElement {
-    const d = families
-        .flatMap(({ family }) => family.lines.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`))
-        .join("");
-    return svg("path", { class: "line", d });
-}
-
-function middleOf(area: Rectangle): Point {
-    return { x: (area.left + area.right) / 2, y: (area.top + area.bottom) / 2 };
-}
-
-function unionOf(a: Rectangle, b: Rectangle): Rectangle {
-    return {
-        left: Math.min(a.left, b.left),
-        top: Math.min(a.top, b.top),
-        right: Math.max(a.right, b.right),
-        bottom: Math.max(a.bottom, b.bottom),
-    };
-}
-
-// Nothing stands outside of the picture's bounds, so a window that only reaches beyond them needs nothing
-// new.
-function clipped(window: Rectangle, drawn: Rectangle, bounds: Rectangle): Rectangle {
-    const left = Math.max(window.left, bounds.left);
-    const top = Math.max(window.top, bounds.top);
-    const right = Math.min(window.right, bounds.right);
-    const bottom = Math.min(window.bottom, bounds.bottom);
-    return left > right || top > bottom ? drawn : { left, top, right, bottom };
 }

@@ -5,7 +5,7 @@
 // Shown only while there is a rest. The keys have other ways, so it is for the mouse alone.
 
 import type { Camera } from "../scene/Camera";
-import { overviewPaths } from "../scene/Scene";
+import { overviewPaths } from "../scene/overviewPaths";
 import type { Picture } from "../view/Picture";
 import { encloses, grown, type Rectangle } from "../base/SpatialGrid";
 import { html, setAttributes, svg } from "../base/dom";
