@@ -4,30 +4,26 @@
 
 from __future__ import annotations
 
-import operator
 import os
-import sys
-from collections.abc import Callable, Iterable, Mapping, Sequence
+from collections.abc import Callable, Iterable, Mapping
 from ctypes import byref, c_void_p
 from typing import Any, Literal, get_args
 
 from olvane import _picture_native as _native_picture
+from olvane._answers import Answers, message_of, watching_for_strays
 from olvane._errors import HostError, LayoutError, Status
 from olvane._family import Family
 from olvane._file import DrawView, File
 from olvane._host import Host
-from olvane._layout import _Answers, _focus_number, _message, _options_struct, _watching_for_strays
+from olvane._layout import _focus_number, _options_struct
 from olvane._options import Options, View
 from olvane._picture import BRANCHES, Branch, Picture
+from olvane._picture_options import choice, option_value, real, whole
+from olvane._picture_options import options as options_of_c
+from olvane._picture_structs import BoxSize, Fold, OptionsStruct
 
 _VIEWS: tuple[DrawView, ...] = get_args(DrawView)
-_DIRECTIONS = ("down", "up", "left", "right")
-_FANS = ("ancestors", "descendants")
-_WAYS = ("blood", "marriage", "both")
-_LANGUAGES = ("en", "de", "es")
-_GREATEST_COUNT = 2**31 - 1
 _LAST_YEAR = 9999
-_LARGEST_SIZE = 1_000_000  # points
 
 
 def picture(
@@ -90,48 +86,45 @@ def picture(
     if isinstance(source, str | bytes | os.PathLike):
         source = File(source)
     name = _view_name(view)
-    chosen = _native_picture.OptionsStruct()
+    chosen = OptionsStruct()
     _native_picture.options_default(_VIEWS.index(name), byref(chosen))
     if options is not None:
         chosen.layout = _options_struct(options)
-    for flag, value in (
+    for field, value in (
         ("unknown_parents", unknown_parents),
+        ("up", up),
+        ("down", down),
+        ("direction", direction),
         ("spouses", spouses),
         ("siblings", siblings),
         ("compact", compact),
+        ("fan_of", fan_of),
+        ("fan_angle", fan_angle),
+        ("most_ways", most_ways),
+        ("language", language),
+        ("effort", effort),
         ("all_parts", all_parts),
-        ("hide_living", hide_living),
         ("mirrored", mirrored),
+        ("aspect", aspect),
     ):
-        setattr(chosen, flag, 1 if value else 0)
-    chosen.up = _whole("up", up, 0, _GREATEST_COUNT)
-    chosen.down = _whole("down", down, 0, _GREATEST_COUNT)
-    chosen.direction = _choice("direction", direction, _DIRECTIONS)
-    chosen.fan_of = _choice("fan_of", fan_of, _FANS)
-    chosen.fan_angle = _real("fan_angle", fan_angle, 90, 360)
-    chosen.ways = _choice("by", by, _WAYS)
-    chosen.most_ways = _whole("most_ways", most_ways, 0, _GREATEST_COUNT)
-    chosen.language = _choice("language", language, _LANGUAGES)
-    chosen.marks = -1 if marks == "all" else _whole("marks", marks, 0, _GREATEST_COUNT)
-    chosen.effort = _whole("effort", effort, 0, 100)
-    chosen.year = _whole("year", year, 0, _LAST_YEAR)
+        setattr(chosen, field, option_value(field, value))
+    chosen.ways = option_value("ways", by, "by")
+    chosen.marks = -1 if marks == "all" else whole("marks", marks, 0, int(options_of_c()["marks"].most))
+    chosen.hide_living = 1 if hide_living else 0
+    chosen.year = whole("year", year, 0, _LAST_YEAR)
     if hide_living and not isinstance(source, File):
         raise ValueError("hide_living is of a file: a host and a Family say nothing of the years of a life")
     chosen.other = _number(source, to)
-    folds = [
-        _native_picture.Fold(_number(source, person), _choice("folded", branch, BRANCHES)) for person, branch in folded
-    ]
-    chosen.folds = (_native_picture.Fold * len(folds))(*folds)
+    folds = [Fold(_number(source, person), choice("folded", branch, BRANCHES)) for person, branch in folded]
+    chosen.folds = (Fold * len(folds))(*folds)
     chosen.fold_count = len(folds)
+    largest = options_of_c()["layout.sizes.node_width"].most
     boxes = [
-        _native_picture.BoxSize(
-            _number(source, person), _real("width", width, 0, _LARGEST_SIZE), _real("height", height, 0, _LARGEST_SIZE)
-        )
+        BoxSize(_number(source, person), real("width", width, 0, largest), real("height", height, 0, largest))
         for person, (width, height) in (box_sizes or {}).items()
     ]
-    chosen.box_sizes = (_native_picture.BoxSize * len(boxes))(*boxes)
+    chosen.box_sizes = (BoxSize * len(boxes))(*boxes)
     chosen.box_size_count = len(boxes)
-    chosen.aspect = _real("aspect", aspect, 0, sys.float_info.max)
     if earlier is not None and not isinstance(earlier, Picture):
         raise TypeError(f"earlier is {earlier!r}, and takes a Picture")
     kept = None if earlier is None else earlier._kept
@@ -148,16 +141,16 @@ def _number(source: Host | Family | File, person: int | str) -> int:
     return _focus_number(person)
 
 
-def _made(source: Host | Family | File, focus: int, view: DrawView, chosen: _native_picture.OptionsStruct) -> Picture:
+def _made(source: Host | Family | File, focus: int, view: DrawView, chosen: OptionsStruct) -> Picture:
     if isinstance(source, File | Family):
         call = _native_picture.of_file if isinstance(source, File) else _native_picture.of_family
         pointer = source._pointer
         return _read(lambda made: int(call(pointer, focus, byref(chosen), made)), focus, view)
-    answers = _Answers(source)
+    answers = Answers(source)
     callbacks = answers.callbacks()
 
     def ask(made: Any) -> int:
-        with _watching_for_strays(answers):
+        with watching_for_strays(answers):
             status: int = _native_picture.of_host(byref(callbacks), focus, byref(chosen), made)
         _raise_kept(answers, status)
         return status
@@ -165,7 +158,7 @@ def _made(source: Host | Family | File, focus: int, view: DrawView, chosen: _nat
     return _read(ask, focus, view)
 
 
-def _raise_kept(answers: _Answers, status: int) -> None:
+def _raise_kept(answers: Answers, status: int) -> None:
     """Raises what the host raised, as it is or as the cause of a HostError."""
     raised = answers.take_raised()
     try:
@@ -182,7 +175,7 @@ def _read(make: Callable[[Any], int], focus: int, view: DrawView) -> Picture:
     kept = _native_picture.KeptPicture(made)
     status = make(byref(made))
     if status != Status.OK:
-        reason = _native_picture.failure_of(made) or _message(status)
+        reason = _native_picture.failure_of(made) or message_of(status)
         raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
     return _native_picture.picture_of(made, view, kept)
 
@@ -193,27 +186,3 @@ def _view_name(view: View | DrawView) -> DrawView:
         if name == known:
             return known
     raise TypeError(f"view is {view!r}, and takes a View or one of {', '.join(_VIEWS)}")
-
-
-def _choice(name: str, given: str, allowed: Sequence[str]) -> int:
-    if given not in allowed:
-        raise ValueError(f"{name} is {given!r}, and takes one of {', '.join(allowed)}")
-    return allowed.index(given)
-
-
-def _whole(name: str, given: object, least: int, most: int) -> int:
-    try:
-        whole = operator.index(given)  # type: ignore[arg-type]
-    except TypeError:
-        raise TypeError(f"{name} is {given!r}, and takes a whole number") from None
-    if not least <= whole <= most:
-        raise ValueError(f"{name} is {whole}, and takes a whole number of {least} to {most}")
-    return whole
-
-
-def _real(name: str, given: object, least: float, most: float) -> float:
-    if isinstance(given, bool) or not isinstance(given, int | float):
-        raise TypeError(f"{name} is {given!r}, and takes a number")
-    if not least <= given <= most:
-        raise ValueError(f"{name} is {given}, and takes a number of {least} to {most}")
-    return float(given)

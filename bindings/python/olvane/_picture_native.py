@@ -5,7 +5,7 @@
 from __future__ import annotations
 
 import ctypes
-from ctypes import POINTER, byref, c_char_p, c_double, c_float, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
+from ctypes import POINTER, byref, c_char_p, c_int, c_int32, c_int64, c_size_t, c_void_p
 from typing import Any
 
 from olvane import _native
@@ -26,167 +26,10 @@ from olvane._picture import (
     PictureWay,
     WayKind,
 )
-
-
-class Fold(ctypes.Structure):
-    """olvane_fold"""
-
-    _fields_ = [("person", c_int64), ("branch", c_int32)]
-
-
-class BoxSize(ctypes.Structure):
-    """olvane_box_size"""
-
-    _fields_ = [("person", c_int64), ("width", c_float), ("height", c_float)]
-
-
-class OptionsStruct(ctypes.Structure):
-    """olvane_picture_options"""
-
-    _fields_ = [
-        ("struct_size", c_size_t),
-        ("view", c_int32),
-        ("up", c_int32),
-        ("down", c_int32),
-        ("direction", c_int32),
-        ("spouses", c_int32),
-        ("siblings", c_int32),
-        ("compact", c_int32),
-        ("fan_of", c_int32),
-        ("fan_angle", c_double),
-        ("other", c_int64),
-        ("ways", c_int32),
-        ("most_ways", c_int32),
-        ("language", c_int32),
-        ("marks", c_int32),
-        ("effort", c_int32),
-        ("all_parts", c_int32),
-        ("unknown_parents", c_int32),
-        ("hide_living", c_int32),
-        ("year", c_int32),
-        ("mirrored", c_int32),
-        ("folds", POINTER(Fold)),
-        ("fold_count", c_size_t),
-        ("layout", _native.OptionsStruct),
-        ("earlier", c_void_p),
-        ("box_sizes", POINTER(BoxSize)),
-        ("box_size_count", c_size_t),
-        ("aspect", c_double),
-    ]
-
+from olvane._picture_structs import ArraysStruct, OptionsStruct
 
 _NO_PLACE = -1
 _UNKNOWN_PARENT = 1
-
-
-class _Box(ctypes.Structure):
-    _fields_ = [
-        ("id", c_int64),
-        ("x", c_double),
-        ("y", c_double),
-        ("width", c_float),
-        ("height", c_float),
-        ("kind", c_int32),
-        ("sex", c_int32),
-        ("child_of", c_int32),
-        ("repeat", c_int32),
-        ("flag", c_int32),
-        ("hidden_parents", c_int32),
-        ("hidden_partners", c_int32),
-        ("hidden_children", c_int32),
-        ("further_parents", c_int32),
-        ("living", c_int32),
-    ]
-
-
-class _Family(ctypes.Structure):
-    _fields_ = [
-        ("first_member", c_uint32),
-        ("parent_count", c_uint32),
-        ("child_count", c_uint32),
-        ("first_line", c_uint32),
-        ("line_count", c_uint32),
-        ("number", c_uint32),
-        ("state", c_int32),
-    ]
-
-
-class _Line(ctypes.Structure):
-    _fields_ = [
-        ("x1", c_double),
-        ("y1", c_double),
-        ("x2", c_double),
-        ("y2", c_double),
-        ("role", c_int32),
-        ("child", c_int32),
-        ("first_bridge", c_uint32),
-        ("bridge_count", c_uint32),
-    ]
-
-
-class _Mark(ctypes.Structure):
-    _fields_ = [("kind", c_int32), ("number", c_int32), ("boxes", c_int32 * 3)]
-
-
-class _Arc(ctypes.Structure):
-    _fields_ = [("start", c_double), ("end", c_double), ("ring", c_int32), ("line", c_int32)]
-
-
-class _Way(ctypes.Structure):
-    _fields_ = [
-        ("first_box", c_uint32),
-        ("box_count", c_uint32),
-        ("ancestor_count", c_uint32),
-        ("first_piece", c_uint32),
-        ("piece_count", c_uint32),
-        ("kind", c_int32),
-        ("words", c_char_p),
-    ]
-
-
-class _Piece(ctypes.Structure):
-    _fields_ = [("x1", c_double), ("y1", c_double), ("x2", c_double), ("y2", c_double)]
-
-
-class _Folded(ctypes.Structure):
-    _fields_ = [("box", c_int32), ("count", c_int32), ("branch", c_int32), ("side", c_int32)]
-
-
-class _Arrays(ctypes.Structure):
-    _fields_ = [
-        ("struct_size", c_size_t),
-        ("boxes", POINTER(_Box)),
-        ("box_count", c_size_t),
-        ("families", POINTER(_Family)),
-        ("family_count", c_size_t),
-        ("members", POINTER(c_int32)),
-        ("child_kinds", POINTER(c_int32)),
-        ("member_count", c_size_t),
-        ("lines", POINTER(_Line)),
-        ("line_count", c_size_t),
-        ("bridges", POINTER(c_double)),
-        ("bridge_count", c_size_t),
-        ("marks", POINTER(_Mark)),
-        ("mark_count", c_size_t),
-        ("focus", c_int32),
-        ("other", c_int32),
-        ("arcs", POINTER(_Arc)),
-        ("arc_count", c_size_t),
-        ("ring_radii", POINTER(c_double)),
-        ("ring_radius_count", c_size_t),
-        ("middle_x", c_double),
-        ("middle_y", c_double),
-        ("ways", POINTER(_Way)),
-        ("way_count", c_size_t),
-        ("way_boxes", POINTER(c_int32)),
-        ("way_box_count", c_size_t),
-        ("way_pieces", POINTER(_Piece)),
-        ("way_piece_count", c_size_t),
-        ("focus_is", c_char_p),
-        ("other_is", c_char_p),
-        ("folded", POINTER(_Folded)),
-        ("folded_count", c_size_t),
-    ]
 
 
 def _place(number: int) -> int | None:
@@ -218,7 +61,7 @@ def _nothing() -> None:
 
 def picture_of(made: c_void_p, view: str, kept: KeptPicture | None = None) -> Picture:
     """All of a picture that the library holds."""
-    arrays = _Arrays(struct_size=ctypes.sizeof(_Arrays))
+    arrays = ArraysStruct(struct_size=ctypes.sizeof(ArraysStruct))
     status = _read(made, byref(arrays))
     if status != Status.OK:
         raise LayoutError(Status(status), f"the picture cannot be read: {Status(status).name}", "", [])
@@ -327,5 +170,5 @@ of_family = _declared("olvane_picture_of_family", c_int, c_void_p, c_int64, _CHO
 of_file = _declared("olvane_picture_of_file", c_int, c_void_p, c_int64, _CHOICES, POINTER(c_void_p))
 of_host = _declared("olvane_picture_of_host", c_int, POINTER(_native.HostStruct), c_int64, _CHOICES, POINTER(c_void_p))
 free = _declared("olvane_picture_free", None, c_void_p)
-_read = _declared("olvane_picture_read", c_int, c_void_p, POINTER(_Arrays))
+_read = _declared("olvane_picture_read", c_int, c_void_p, POINTER(ArraysStruct))
 _failure = _declared("olvane_picture_failure", c_int, c_void_p, POINTER(c_char_p))

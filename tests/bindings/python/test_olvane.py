@@ -24,7 +24,7 @@ from unittest import mock
 
 import olvane
 from case_host import CaseHost, cases_in
-from olvane import _layout, _native
+from olvane import _answers, _layout, _native
 
 
 class Family:
@@ -335,7 +335,7 @@ class Questions(unittest.TestCase):
 
     def test_answers_come_to_the_engine_as_they_were_said(self) -> None:
         host = Family({5: (17, 42)})
-        callbacks = _layout._Answers(host).callbacks()
+        callbacks = _answers.Answers(host).callbacks()
 
         def number(ask: Callable[..., int], *arguments: int) -> int:
             slot = ctypes.c_int(77)
@@ -362,7 +362,7 @@ class Questions(unittest.TestCase):
 
     def test_dates_come_to_the_engine_and_are_asked_for_by_their_kind(self) -> None:
         host = Family({})
-        callbacks = _layout._Answers(host).callbacks()
+        callbacks = _answers.Answers(host).callbacks()
         setattr(host, "date_of", lambda person, is_birth: f"born {person}" if is_birth is True else "一八五〇年")
         with mock.patch.object(_native.library, "olvane_date_set", return_value=0) as date_set:
             callbacks.date_of(None, 17, 1, None)
@@ -400,7 +400,7 @@ class Signals(unittest.TestCase):
         left = [calls]
 
         def trace(frame, event, _argument):  # type: ignore[no-untyped-def]
-            if event == "call" and frame.f_code.co_name == step and frame.f_globals is vars(_layout):
+            if event == "call" and frame.f_code.co_name == step and frame.f_globals is vars(_answers):
                 left[0] -= 1
                 if left[0] == 0:
                     sys.settrace(None)
@@ -445,7 +445,7 @@ class Signals(unittest.TestCase):
         asked: list[int] = []
         host = Family({})
         setattr(host, "is_dead", asked.append)
-        answers = _layout._Answers(host)
+        answers = _answers.Answers(host)
         answers.keep(Interrupted())
         self.assertNotEqual(0, answers.callbacks().is_dead(None, 17, ctypes.pointer(ctypes.c_int())))
         self.assertEqual([], asked)
