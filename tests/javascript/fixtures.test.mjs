@@ -72,6 +72,17 @@ test("a medium stands for the member of the row", async () => {
         assert.equal(olvane.archiveMember(name), member, name);
 });
 
+test("what an option does not take is stated with its name and bounds", async () => {
+    const host = { fatherOf: () => null };
+    for (const { javascript, states } of (await rowsOf("refusals.json")).rows)
+        assert.throws(
+            () => olvane.picture(host, 1, javascript),
+            ({ message }) =>
+                Object.keys(javascript).every((name) => message.startsWith(`${name} is `)) &&
+                states.every((text) => message.includes(text)),
+        );
+});
+
 test("views, directions, facts and relatives have the names and numbers of the rows", async () => {
     const { views, directions, facts, relatives } = await rowsOf("views.json");
     assert.deepEqual(

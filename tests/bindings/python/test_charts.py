@@ -20,6 +20,7 @@ SAMPLE = pathlib.Path(os.environ["OLVANE_SAMPLE"])
 VIEWS: tuple[olvane.DrawView, ...] = get_args(olvane.DrawView)
 
 # A man with two wives, an adopted child and an unmarried couple, the last of them born in 1990.
+FIXTURES = pathlib.Path(__file__).parents[2] / "fixtures"
 AWKWARD = b"""0 HEAD
 1 GEDC
 2 VERS 5.5.1
@@ -444,6 +445,15 @@ class Wrong(unittest.TestCase):
         for options, message in cases:
             with self.assertRaisesRegex((TypeError, ValueError), message):
                 olvane.picture(AWKWARD, 1, **options)
+
+    def test_whatIsRefusedIsStatedWithItsNameAndBounds(self) -> None:
+        rows = json.loads((FIXTURES / "refusals.json").read_text(encoding="utf-8"))["rows"]
+        for row in rows:
+            (name,) = row["python"]
+            with self.assertRaisesRegex((TypeError, ValueError), f"^{name} is ") as caught:
+                olvane.picture(AWKWARD, 1, **row["python"])
+            for text in row["states"]:
+                self.assertIn(text, str(caught.exception))
 
     def test_personsWhoAreNotThereAreSaid(self) -> None:
         sources: tuple[olvane.File | olvane.Family, ...] = (olvane.File(AWKWARD), olvane.File(AWKWARD).family())

@@ -71,6 +71,26 @@ TEST(ViewsFixture, aViewTakesTheOptionsOfItsRowAndNoOthers) {
     }
 }
 
+// As JavaScript and Python state it.
+TEST(RefusalsFixture, whatAnOptionDoesNotTakeIsStatedWithItsNameAndBounds) {
+    const json all = fixture("refusals.json");  // outlives the loop
+    for (const json& row : all["rows"]) {
+        const std::vector<std::string> arguments = row["command"];
+        CLI::App command;
+        LayoutRequest request;
+        addViewOptions(command, request, "");
+        try {
+            parse(command, arguments);
+            ADD_FAILURE() << row;
+        } catch (const CLI::Error& error) {
+            const std::string message = error.what();
+            EXPECT_NE(message.find(arguments[0]), std::string::npos) << message;
+            for (const std::string text : row["states"])
+                EXPECT_NE(message.find(text), std::string::npos) << message;
+        }
+    }
+}
+
 TEST(AddressesFixture, aPageGetsTheAddressOfTheRow) {
     const json all = fixture("addresses.json");  // outlives the loop
     for (const json& row : all["rows"]) {
