@@ -80,6 +80,72 @@ describe("looks", kTwoAtOnce, () => {
                 return [styleOf("#tree .name").fill === color, styleOf("#tree").backgroundColor === backgroundColor];
             });
             assert.ok(text && paper, "the picture is drawn in them, too");
+            await page.keyboard.press("Escape");
+            await page.click("#views-button");
+            assert.notEqual(await fill("#choose-family"), await fill("#choose-fan"));
+            await visit.end();
+        }
+    });
+
+    // The colour at a place of a canvas, and what the system's colour of that name is.
+    const systemColour = (page, name) =>
+        page.evaluate((name) => {
+            const probe = document.createElement("div");
+            probe.style.cssText = `forced-color-adjust: none; color: ${name}`;
+            document.body.append(probe);
+            return getComputedStyle(probe).color;
+        }, name);
+
+    test("a fan and the map are drawn in the system's own colours, dark or light", async () => {
+        for (const colorScheme of ["light", "dark"]) {
+            const visit = await visitDarwins("#person=I1&view=fan", { forcedColors: "active", colorScheme });
+            const { page } = visit;
+            const [canvas, text] = [await systemColour(page, "Canvas"), await systemColour(page, "CanvasText")];
+            const cell = await page.evaluate(() => {
+                const cells = all("#tree .box[class*=descent-]");
+                const styles = cells.map((one) => [one.querySelector(".frame"), one.querySelector("text")]);
+                return [
+                    ...new Set(
+                        styles.map(([frame, text]) => [frame, text].map((one) => getComputedStyle(one).fill).join()),
+                    ),
+                ];
+            });
+            assert.deepEqual(cell, [`${canvas},${text}`]);
+            await page.click("#views-button");
+            await page.click("#choose-map");
+            await page.waitForSelector("#map canvas");
+            const corner = await page.evaluate(async () => {
+                await new Promise((next) => requestAnimationFrame(() => requestAnimationFrame(next)));
+                const { data } = one("#map canvas").getContext("2d").getImageData(2, 2, 1, 1);
+                return `rgb(${data[0]}, ${data[1]}, ${data[2]})`;
+            });
+            assert.equal(corner, canvas);
+            await visit.end();
+        }
+    });
+
+    test("the selected box is marked, however it was selected, in a fan above the cells beside it", async () => {
+        for (const [view, father] of [
+            ["family", "I12"],
+            ["fan", "I12"],
+        ]) {
+            const visit = await visitDarwins(`#person=I1&view=${view}`);
+            const ringOf = (xref) =>
+                visit.page.evaluate((xref) => {
+                    const box = one(`#tree [data-xref="${xref}"]`);
+                    const ring = box.querySelector(".ring");
+                    const isAbove = box.querySelector(".frame").compareDocumentPosition(ring) === 4;
+                    return [getComputedStyle(ring).stroke, isAbove];
+                }, xref);
+            assert.equal((await ringOf(father))[0], "none");
+            const { x, y } = await visit.middleOf(father);
+            await visit.page.mouse.click(x, y);
+            await visit.still();
+            const [stroke, isAbove] = await ringOf(father);
+            assert.notEqual(stroke, "none");
+            assert.equal(isAbove, view === "fan");
+            assert.equal(await visit.focus(), "I1");
+            await photograph(visit, `selected-${view}`);
             await visit.end();
         }
     });

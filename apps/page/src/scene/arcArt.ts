@@ -41,7 +41,6 @@ export function lineClass(arc: BoxArc): string {
 
 export function appendArc(group: SVGGElement, look: BoxLook, box: Box, arc: BoxArc): void {
     group.append(
-        svg("path", { class: "ring", d: arcPath(arc, box) }),
         svg("path", {
             class: "frame",
             d: arcPath(arc, box),
@@ -50,6 +49,8 @@ export function appendArc(group: SVGGElement, look: BoxLook, box: Box, arc: BoxA
             "aria-label": look.label,
             "aria-current": look.isFocus && "true",
         }),
+        // Upon the frame: half of it would lie under the cells beside it.
+        svg("path", { class: "ring", d: arcPath(arc, box) }),
     );
     appendText(group, look, box, arc);
 }
