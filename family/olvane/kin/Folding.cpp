@@ -62,6 +62,24 @@ bool isAsciiWordLetter(char32_t code) {
            code == '\'' || code == '`';
 }
 
+// How many letters and digits of ASCII the text begins with.
+std::size_t plainLettersOf(std::string_view text) {
+    std::size_t count = 0;
+    while (count < text.size() && isAsciiWordLetter(static_cast<unsigned char>(text[count])) &&
+           text[count] != '\'' && text[count] != '`')
+        ++count;
+    return count;
+}
+
+// Most letters of most files: all at once.
+void appendPlain(std::string_view letters, std::string& out) {
+    const std::size_t start = out.size();
+    out += letters;
+    for (std::size_t i = start; i < out.size(); ++i) {
+        if (out[i] >= 'A' && out[i] <= 'Z') out[i] = static_cast<char>(out[i] - 'A' + 'a');
+    }
+}
+
 bool isWordLetter(char32_t code) {
     return code < 0x80 ? isAsciiWordLetter(code) : !isIn(code, kBetweenWords, kBetweenWordsCount);
 }
@@ -92,21 +110,32 @@ std::string foldedForSearch(std::string_view text) {
     return out;
 }
 
-std::vector<FoldedWord> foldedWords(std::string_view text) {
-    std::vector<FoldedWord> words;
+void visitFoldedWords(std::string_view text,
+                      const std::function<void(std::string_view written, std::string_view folded)>& use) {
     std::size_t start = 0;
     std::string folded;
     for (std::size_t at = 0; at <= text.size();) {
+        if (const std::size_t count = plainLettersOf(text.substr(at)); count > 0) {
+            appendPlain(text.substr(at, count), folded);
+            at += count;
+        }
         const Letter letter = at < text.size() ? firstLetter(text.substr(at)) : Letter{' ', 1};
         if (isWordLetter(letter.code)) {
             appendFolded(text.substr(at, letter.bytes), letter.code, folded);
         } else {
-            if (!folded.empty()) words.push_back({text.substr(start, at - start), folded});
+            if (!folded.empty()) use(text.substr(start, at - start), folded);
             folded.clear();
             start = at + letter.bytes;
         }
         at += letter.bytes;
     }
+}
+
+std::vector<FoldedWord> foldedWords(std::string_view text) {
+    std::vector<FoldedWord> words;
+    visitFoldedWords(text, [&words](std::string_view written, std::string_view folded) {
+        words.push_back({written, std::string(folded)});
+    });
     return words;
 }
 

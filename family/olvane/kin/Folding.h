@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <functional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -22,7 +23,12 @@ struct FoldedWord {
 // Bytes that are no UTF-8 are kept as they are. The same bytes on every machine.
 OLVANE_API std::string foldedForSearch(std::string_view text);
 
-// The words of a text: runs of letters and digits. An apostrophe is part of a word.
+// Calls use with each word of a text, in their order: runs of letters and digits. An apostrophe is part of a word.
+// Lifetime: written refers to text; folded lives as long as the call.
+OLVANE_API void visitFoldedWords(
+    std::string_view text, const std::function<void(std::string_view written, std::string_view folded)>& use);
+
+// The same words as a list.
 // Lifetime: written refers to text.
 OLVANE_API std::vector<FoldedWord> foldedWords(std::string_view text);
 

@@ -1,18 +1,18 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// All words of all records, folded and sorted, with the persons behind each. A search looks at every different word
-// once; real files have few, since names come again and again.
+// All words of all records, folded, with the persons behind each. A search looks at every different word once; real files
+// have few, since names come again and again. Words stand as they came, so that persons can be added a few at a time.
 
 #include <olvane/kin/PersonIndex.h>
 
 #include <algorithm>
 #include <array>
 #include <charconv>
-#include <numeric>
+#include <optional>
+#include <stdexcept>
 
 #include <olvane/kin/Folding.h>
-#include <olvane/kin/shared/MergeSort.h>
 
 namespace olvane::kin {
 
@@ -47,36 +47,70 @@ std::string_view trimmed(std::string_view text) {
     return text;
 }
 
-// One letter wrong, missing, too many, or exchanged with its neighbor. Letters beyond ASCII have several bytes; a
-// wrong one may differ in all of them.
-bool isSimilar(std::string_view one, std::string_view other) {
-    while (!one.empty() && !other.empty() && one.front() == other.front()) {
-        one.remove_prefix(1);
-        other.remove_prefix(1);
-    }
-    while (!one.empty() && !other.empty() && one.back() == other.back()) {
-        one.remove_suffix(1);
-        other.remove_suffix(1);
-    }
-    const auto isOneLetter = [](std::string_view text) {
-        const auto starts = std::count_if(text.begin(), text.end(), [](char c) {
-            return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
-        });
-        return starts <= 1;
-    };
-    if (isOneLetter(one) && isOneLetter(other)) return true;
-    return one.size() == 2 && other.size() == 2 && one[0] == other[1] && one[1] == other[0];
+constexpr std::size_t kMostLetterBytes = 4;
+
+bool beginsLetter(char c) {
+    return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
 }
 
-Fit fitOf(std::string_view word, std::string_view term, bool findsSimilar, bool& fits) {
-    const std::size_t at = word.find(term);
-    fits = at == 0 || (at != std::string_view::npos && term.size() >= kShortestWithin && !isNumber(term));
-    if (fits) return at > 0 ? Fit::within : word.size() == term.size() ? Fit::whole : Fit::begins;
-    if (!findsSimilar || term.size() < kShortestSimilar || isNumber(term)) return Fit::similar;
-    const std::size_t difference = std::max(word.size(), term.size()) - std::min(word.size(), term.size());
-    fits = difference <= 3 && isSimilar(word, term);
-    return Fit::similar;
+// Whether the text is whole letters from there on.
+bool isBetweenLetters(std::string_view text, std::size_t at) {
+    return at >= text.size() || beginsLetter(text[at]);
 }
+
+bool isAtMostOneLetter(std::string_view text) {
+    return std::count_if(text.begin(), text.end(), beginsLetter) <= 1;
+}
+
+// Whether the texts are two letters that have changed places.
+bool areExchanged(std::string_view one, std::string_view other) {
+    if (one.size() != other.size()) return false;
+    std::size_t first = 1;
+    while (first < one.size() && !beginsLetter(one[first])) ++first;
+    return isAtMostOneLetter(one.substr(first)) && other.ends_with(one.substr(0, first)) &&
+           other.starts_with(one.substr(first));
+}
+
+// One letter wrong, missing, too many, or exchanged with its neighbor. Letters beyond ASCII have several bytes; only
+// whole ones are alike.
+bool isSimilar(std::string_view one, std::string_view other) {
+    const std::size_t shorter = std::min(one.size(), other.size());
+    std::size_t front = 0;
+    while (front < shorter && one[front] == other[front]) ++front;
+    while (front > 0 && !(isBetweenLetters(one, front) && isBetweenLetters(other, front))) --front;
+    std::size_t back = 0;
+    while (back < shorter - front && one[one.size() - 1 - back] == other[other.size() - 1 - back]) ++back;
+    while (back > 0 && !beginsLetter(one[one.size() - back])) --back;
+    one = one.substr(front, one.size() - front - back);
+    other = other.substr(front, other.size() - front - back);
+    return (isAtMostOneLetter(one) && isAtMostOneLetter(other)) || areExchanged(one, other);
+}
+
+bool canBeWithin(std::string_view term) {
+    return term.size() >= kShortestWithin && !isNumber(term);
+}
+
+bool canBeSimilar(std::string_view term) {
+    return term.size() >= kShortestSimilar && !isNumber(term);
+}
+
+// Looks for words with one slip in them. Of three letters and more a slip leaves the first as it was, or the last.
+class SlipFinder {
+public:
+    explicit SlipFinder(std::string_view term)
+        : term_(term), isLong_(std::count_if(term.begin(), term.end(), beginsLetter) >= 3) {}
+
+    bool fits(std::string_view word) const {
+        const std::size_t longer = std::max(word.size(), term_.size());
+        if (longer - std::min(word.size(), term_.size()) > kMostLetterBytes) return false;
+        if (isLong_ && word.front() != term_.front() && word.back() != term_.back()) return false;
+        return isSimilar(word, term_);
+    }
+
+private:
+    std::string_view term_;
+    bool isLong_;
+};
 
 // The first and the last of all numbers of three and four digits, in both forms of a date; 0 where there is none.
 struct YearRange {
@@ -109,16 +143,16 @@ YearRange yearsOf(const SearchText& date) {
 // behind it.
 template <class Use>
 void forEachWord(std::string_view text, const Use& use) {
-    for (const FoldedWord& word : foldedWords(text)) {
-        use(word.folded, word.written);
-        for (const char* const apostrophe : {"'", "\u2019"}) {
-            const std::size_t at = word.written.find(apostrophe);
+    visitFoldedWords(text, [&use](std::string_view written, std::string_view folded) {
+        use(folded, written);
+        for (const std::string_view apostrophe : {"'", "\u2019"}) {
+            const std::size_t at = written.find(apostrophe);
             if (at == std::string_view::npos) continue;
-            const std::string_view written = word.written.substr(at + std::string_view(apostrophe).size());
-            const std::string behind = foldedForSearch(written);
-            if (!behind.empty()) use(behind, written);
+            const std::string_view rest = written.substr(at + apostrophe.size());
+            const std::string behind = foldedForSearch(rest);
+            if (!behind.empty()) use(behind, rest);
         }
-    }
+    });
 }
 
 }  // namespace
@@ -146,81 +180,54 @@ bool SearchHit::isByName() const {
 PersonIndex::PersonIndex(const Family& family) : PersonIndex(FamilySearchTexts(family)) {}
 
 PersonIndex::PersonIndex(const SearchTexts& texts) {
-    const std::size_t count = texts.personCount();
-    ids_.reserve(count);
-    for (std::uint32_t place = 0; place < count; ++place) {
-        ids_.push_back(texts.id(place));
-        texts.visit(place, [this, place](const SearchText& text) { add(text, place); });
-    }
-    arrange();
+    add(texts);
 }
 
-void PersonIndex::add(const SearchText& text, std::uint32_t place) {
-    if (text.isDate) return addYears(text, place);
-    if (text.in == FoundIn::identifier) {
-        if (!text.text.empty()) placeOfXref_.emplace(foldedForSearch(text.text), place);
-        return;
+bool PersonIndex::add(const SearchTexts& texts, std::size_t most) {
+    const std::size_t all = texts.personCount();
+    if (all > kMostPersons) throw std::length_error("too many persons for an index");
+    for (; added_ < all && most > 0; --most, ++added_) {
+        const auto place = static_cast<std::uint32_t>(added_);
+        if (ids_.size() == added_) ids_.push_back(texts.id(place));
+        texts.visit(place, [this, place](const SearchText& text) { addText(text, place); });
     }
-    for (const std::uint32_t number : wordsOf(text.text)) addWord(number, text.in, place);
+    return added_ >= all;
+}
+
+void PersonIndex::addText(const SearchText& text, std::uint32_t place) {
+    if (text.isDate) return addYears(text, place);
+    if (text.in != FoundIn::identifier) {
+        forEachWord(text.text,
+                    [&](std::string_view word, std::string_view) { addWord(word, text.in, place); });
+    } else if (!text.text.empty()) {
+        // The first of several persons of one xref.
+        const std::uint32_t number = xrefs_.numberOf(foldedForSearch(text.text));
+        if (number >= placeOfXref_.size()) placeOfXref_.resize(number + 1U, place);
+    }
 }
 
 void PersonIndex::addYears(const SearchText& date, std::uint32_t place) {
     const YearRange years = yearsOf(date);
     if (years.first == 0) return;
     years_.push_back({place, date.in, years.first, years.last});
-    addWord(numberOf(std::to_string(years.first)), date.in, place);
-    if (years.last != years.first) addWord(numberOf(std::to_string(years.last)), date.in, place);
+    addWord(std::to_string(years.first), date.in, place);
+    if (years.last != years.first) addWord(std::to_string(years.last), date.in, place);
 }
 
-const std::vector<std::uint32_t>& PersonIndex::wordsOf(std::string_view text) {
-    const auto [found, isNew] = wordsOfTexts_.try_emplace(std::string(text));
-    std::vector<std::uint32_t>& numbers = found->second;
-    if (isNew) {
-        forEachWord(text,
-                    [&](const std::string& word, std::string_view) { numbers.push_back(numberOf(word)); });
-    }
-    return numbers;
-}
-
-std::uint32_t PersonIndex::numberOf(const std::string& word) {
-    const auto [found, isNew] = wordNumbers_.emplace(word, static_cast<std::uint32_t>(words_.size()));
-    if (isNew) {
-        words_.push_back(word);
-        entries_.emplace_back();
-    }
-    return found->second;
-}
-
-void PersonIndex::addWord(std::uint32_t number, FoundIn in, std::uint32_t place) {
+// A person is added at once, so an entry of theirs is a word's last.
+void PersonIndex::addWord(std::string_view word, FoundIn in, std::uint32_t place) {
+    const std::uint32_t number = words_.numberOf(word);
+    if (number >= entries_.size()) entries_.resize(number + 1U);
     std::vector<Entry>& entries = entries_[number];
-    if (!entries.empty() && entries.back().person == place) {
-        entries.back().in = std::min(entries.back().in, in);
-    } else {
-        entries.push_back({place, in});
+    if (entries.empty() || entries.back().person() != place) {
+        entries.emplace_back(place, in);
+    } else if (in < entries.back().in()) {
+        entries.back() = Entry(place, in);
     }
-}
-
-void PersonIndex::arrange() {
-    std::vector<std::uint32_t> order(words_.size());
-    std::iota(order.begin(), order.end(), 0U);
-    mergeSort(order.begin(), order.end(),
-              [this](std::uint32_t one, std::uint32_t other) { return words_[one] < words_[other]; });
-    std::vector<std::string> words;
-    std::vector<std::vector<Entry>> entries;
-    words.reserve(order.size());
-    entries.reserve(order.size());
-    for (const std::uint32_t number : order) {
-        words.push_back(std::move(words_[number]));
-        entries.push_back(std::move(entries_[number]));
-    }
-    words_ = std::move(words);
-    entries_ = std::move(entries);
-    wordNumbers_ = {};
-    wordsOfTexts_ = {};
 }
 
 // "1819-1825" and "1819–1825" are one term.
-std::vector<PersonIndex::Term> PersonIndex::termsOf(std::string_view text) const {
+std::vector<PersonIndex::Term> PersonIndex::termsOf(std::string_view text) {
     std::vector<Term> terms;
     for (const FoldedWord& word : foldedWords(text)) {
         const bool isYear = isNumber(word.folded) && word.folded.size() <= 4;
@@ -239,35 +246,82 @@ std::vector<PersonIndex::Term> PersonIndex::termsOf(std::string_view text) const
                 continue;
             }
         }
+        dropRepeated(terms);
+        if (terms.size() == kMostTerms) return terms;
         const int year = isYear ? yearOf(word.folded) : 0;
-        const auto isSame = [&word](const Term& term) { return term.word == word.folded; };
-        if (std::none_of(terms.begin(), terms.end(), isSame)) terms.push_back({word.folded, year, year});
-        if (terms.size() == kMostTerms) break;
+        terms.push_back({word.folded, year, year});
     }
+    dropRepeated(terms);
     return terms;
 }
 
-// Answers whether anybody was found.
-bool PersonIndex::findTerm(const Term& term, bool findsSimilar, BestOfPersons& best) const {
+// The last one, where an earlier one is the same: it is complete only when the next one begins.
+void PersonIndex::dropRepeated(std::vector<Term>& terms) {
+    if (terms.empty()) return;
+    const auto isSame = [&terms](const Term& term) { return term.word == terms.back().word; };
+    if (std::any_of(terms.begin(), terms.end() - 1, isSame)) terms.pop_back();
+}
+
+// Of words that fit as well and stand in the same place, the first by the alphabet is the reason; a year before all words.
+bool PersonIndex::isBetter(const Best& one, const Best& other) const {
+    if (one.cost != other.cost) return one.cost < other.cost;
+    return one.word != other.word && other.word != kYear && words_[one.word] < words_[other.word];
+}
+
+bool PersonIndex::offerWord(std::uint32_t word, Fit fit, BestOfPersons& best) const {
+    if (word >= entries_.size()) return false;  // memory ran out behind its text
+    const std::vector<Entry>& entries = entries_[word];
+    for (const Entry entry : entries) {
+        const Best offered{costOf(fit, entry.in()), word};
+        if (isBetter(offered, best[entry.person()])) best[entry.person()] = offered;
+    }
+    return !entries.empty();
+}
+
+bool PersonIndex::findYears(const Term& term, BestOfPersons& best) const {
     bool found = false;
-    const auto offer = [&best, &found](std::uint32_t person, Fit fit, FoundIn in, std::uint32_t word) {
-        const std::uint16_t cost = costOf(fit, in);
-        if (cost < best[person].cost) best[person] = {cost, word};
+    for (const Years& years : years_) {
+        if (years.first > term.lastYear || years.last < term.firstYear) continue;
+        const Best offered{costOf(Fit::whole, years.in), kYear};
+        if (isBetter(offered, best[years.person])) best[years.person] = offered;
         found = true;
+    }
+    return found;
+}
+
+// Whole, from the beginning, or from the middle.
+bool PersonIndex::findPart(std::string_view part, BestOfPersons& best) const {
+    bool found = false;
+    const auto use = [&](std::uint32_t word) {
+        const std::string_view text = words_[word];
+        const Fit fit = !text.starts_with(part)      ? Fit::within
+                        : text.size() == part.size() ? Fit::whole
+                                                     : Fit::begins;
+        found |= offerWord(word, fit, best);
     };
-    if (term.firstYear != 0) {
-        for (const Years& years : years_) {
-            if (years.first <= term.lastYear && years.last >= term.firstYear)
-                offer(years.person, Fit::whole, years.in, static_cast<std::uint32_t>(words_.size()));
-        }
-        if (term.lastYear != term.firstYear) return found;
+    if (canBeWithin(part)) {
+        words_.visitHolding(part, use);
+    } else {
+        words_.visitBeginning(part, use);
     }
-    for (std::uint32_t word = 0; word < words_.size(); ++word) {
-        bool fits = false;
-        const Fit fit = fitOf(words_[word], term.word, findsSimilar, fits);
-        if (!fits) continue;
-        for (const Entry& entry : entries_[word]) offer(entry.person, fit, entry.in, word);
+    return found;
+}
+
+bool PersonIndex::findSlips(std::string_view term, BestOfPersons& best) const {
+    const SlipFinder slips(term);
+    bool found = false;
+    for (std::uint32_t word = 0; word < entries_.size(); ++word) {
+        if (slips.fits(words_[word])) found |= offerWord(word, Fit::similar, best);
     }
+    return found;
+}
+
+// Answers whether anybody was found, as all these do.
+bool PersonIndex::findTerm(const Term& term, bool findsSimilar, BestOfPersons& best) const {
+    bool found = term.firstYear != 0 && findYears(term, best);
+    if (term.firstYear != term.lastYear) return found;
+    found |= findPart(term.word, best);
+    if (findsSimilar && canBeSimilar(term.word)) found |= findSlips(term.word, best);
     return found;
 }
 
@@ -298,8 +352,9 @@ std::vector<SearchHit> PersonIndex::findTerms(const std::vector<Term>& terms, bo
             const Best& each = best[term][person];
             const auto fit = static_cast<Fit>(each.cost / kCostOfFit);
             hits[i].fit = std::max(hits[i].fit, fit);
-            hits[i].reasons.push_back({static_cast<FoundIn>(each.cost % kCostOfFit), fit,
-                                       each.word < words_.size() ? words_[each.word] : terms[term].word});
+            hits[i].reasons.push_back(
+                {static_cast<FoundIn>(each.cost % kCostOfFit), fit,
+                 std::string(each.word != kYear ? words_[each.word] : terms[term].word)});
         }
     }
     return hits;
@@ -308,8 +363,8 @@ std::vector<SearchHit> PersonIndex::findTerms(const std::vector<Term>& terms, bo
 std::uint32_t PersonIndex::findIdentifier(std::string_view text) const {
     std::string_view xref = trimmed(text);
     if (xref.size() > 2 && xref.front() == '@' && xref.back() == '@') xref = xref.substr(1, xref.size() - 2);
-    const auto found = placeOfXref_.find(foldedForSearch(xref));
-    if (found != placeOfXref_.end()) return found->second;
+    const std::uint32_t known = xrefs_.find(foldedForSearch(xref));
+    if (known < placeOfXref_.size()) return placeOfXref_[known];
     if (!isNumber(xref) || xref.size() > 10) return kNobodyHere;
     std::int64_t number = 0;
     std::from_chars(xref.data(), xref.data() + xref.size(), number);
@@ -328,7 +383,9 @@ std::vector<SearchHit> PersonIndex::find(std::string_view text, std::size_t limi
     const std::vector<Term> terms = termsOf(text);
     if (terms.empty()) return hits;
     std::vector<SearchHit> byWords = findTerms(terms, false, limit);
-    if (byWords.empty() && hits.empty()) byWords = findTerms(terms, true, limit);
+    const auto mayBeSimilar = [](const Term& term) { return canBeSimilar(term.word); };
+    if (byWords.empty() && hits.empty() && std::any_of(terms.begin(), terms.end(), mayBeSimilar))
+        byWords = findTerms(terms, true, limit);
     for (SearchHit& hit : byWords) {
         if (hits.size() < limit && hit.place != byIdentifier) hits.push_back(std::move(hit));
     }
@@ -340,7 +397,7 @@ namespace {
 // The word of a text, as it is written, that a reason has found; empty where it is another text.
 std::string_view foundWord(const SearchText& text, const SearchReason& reason) {
     std::string_view found;
-    forEachWord(text.text, [&](const std::string& word, std::string_view written) {
+    forEachWord(text.text, [&](std::string_view word, std::string_view written) {
         if (found.empty() && word == reason.word) found = written;
     });
     return found;

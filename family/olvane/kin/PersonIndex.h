@@ -8,12 +8,12 @@
 #include <limits>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
 #include <olvane/Export.h>
 #include <olvane/kin/Family.h>
 #include <olvane/kin/SearchTexts.h>
+#include <olvane/kin/detail/TextNumbers.h>
 
 namespace olvane::kin {
 
@@ -44,27 +44,42 @@ struct SearchHit {
 // Finds persons by what a user types.
 //
 // A text is words in any order. A person is found if each word is found in the record: as a word, as the beginning of
-// one, from its middle (three letters and more), or, where nobody is found so, with one letter wrong, missing, too
-// many or exchanged with its neighbor (four letters and more; never digits). Case, accents and apostrophes do not
-// count. "1819-1825" is any year of birth or death from the first to the last; "@I17@", "I17" and "17" are also the
+// one, from its middle (three letters and more; fewer of those beyond ASCII), or, where nobody is found so, with one
+// letter wrong, missing, too many or exchanged with its neighbor (four letters and more; never digits). Case, accents
+// and apostrophes do not count. "1819-1825" is any year of birth or death from the first to the last; "@I17@", "I17" and "17" are also the
 // person of that xref or number, who comes first.
 //
 // Order: how well the words fit, and where; then the order of the persons. The same on every machine.
 // Time: grows with the number of different words, and with how often those that fit occur.
-// Threads: any number may search at a time.
+// Threads: any number may search at a time, while nobody adds.
 // Lifetime: keeps nothing of the texts.
+// Fails: std::length_error for more than 2^28 persons; std::bad_alloc. add may be called again then.
 class OLVANE_API PersonIndex {
 public:
+    static constexpr std::size_t kEverybody = std::numeric_limits<std::size_t>::max();
+
+    // Of nobody yet.
+    PersonIndex() = default;
     explicit PersonIndex(const SearchTexts& texts);
     explicit PersonIndex(const Family& family);
 
-    std::vector<SearchHit> find(std::string_view text,
-                                std::size_t limit = std::numeric_limits<std::size_t>::max()) const;
+    // Adds the next persons, at most so many, for a program that has other things to do in between. True where all of
+    // the texts are in; until then a search finds those who are. texts are the same each time.
+    bool add(const SearchTexts& texts, std::size_t most = kEverybody);
+
+    std::vector<SearchHit> find(std::string_view text, std::size_t limit = kEverybody) const;
 
 private:
-    struct Entry {
-        std::uint32_t person;  // counted from 0 in the order of the texts
-        FoundIn in;
+    // A person, counted from 0 in the order of the texts, and where in the record a word stands.
+    class Entry {
+    public:
+        Entry(std::uint32_t person, FoundIn in)
+            : packed_(person << kInBits | static_cast<std::uint32_t>(in)) {}
+        std::uint32_t person() const { return packed_ >> kInBits; }
+        FoundIn in() const { return static_cast<FoundIn>(packed_ & ((1U << kInBits) - 1)); }
+
+    private:
+        std::uint32_t packed_;
     };
     struct Years {
         std::uint32_t person;
@@ -81,14 +96,20 @@ private:
     using BestOfPersons = std::vector<Best>;
 
     static constexpr std::uint16_t kNone = 0xFFFF;
+    static constexpr std::uint32_t kYear = 0xFFFFFFFF;  // in the place of a word
+    static constexpr unsigned kInBits = 4;
+    static constexpr std::uint32_t kMostPersons = 1U << (32 - kInBits);
 
-    void add(const SearchText& text, std::uint32_t place);
+    void addText(const SearchText& text, std::uint32_t place);
     void addYears(const SearchText& date, std::uint32_t place);
-    void addWord(std::uint32_t number, FoundIn in, std::uint32_t place);
-    std::uint32_t numberOf(const std::string& word);
-    const std::vector<std::uint32_t>& wordsOf(std::string_view text);
-    void arrange();
-    std::vector<Term> termsOf(std::string_view text) const;
+    void addWord(std::string_view word, FoundIn in, std::uint32_t place);
+    static std::vector<Term> termsOf(std::string_view text);
+    static void dropRepeated(std::vector<Term>& terms);
+    bool isBetter(const Best& one, const Best& other) const;
+    bool offerWord(std::uint32_t word, Fit fit, BestOfPersons& best) const;
+    bool findYears(const Term& term, BestOfPersons& best) const;
+    bool findPart(std::string_view part, BestOfPersons& best) const;
+    bool findSlips(std::string_view term, BestOfPersons& best) const;
     bool findTerm(const Term& term, bool findsSimilar, BestOfPersons& best) const;
     std::vector<SearchHit> findTerms(const std::vector<Term>& terms, bool findsSimilar,
                                      std::size_t limit) const;
@@ -97,13 +118,12 @@ private:
 
     static constexpr std::uint32_t kNobodyHere = 0xFFFFFFFF;
 
+    std::size_t added_ = 0;  // persons, each with all texts; where memory ran out, ids_ has one more
     std::vector<std::int64_t> ids_;
-    std::unordered_map<std::string, std::uint32_t> placeOfXref_;
-    // Emptied once the words are in order. Names and places come again and again, so each is cut into words once.
-    std::unordered_map<std::string, std::uint32_t> wordNumbers_;
-    std::unordered_map<std::string, std::vector<std::uint32_t>> wordsOfTexts_;
-    std::vector<std::string> words_;           // sorted
-    std::vector<std::vector<Entry>> entries_;  // of each word
+    TextNumbers xrefs_;
+    std::vector<std::uint32_t> placeOfXref_;  // of each of them; where memory ran out, of all but one
+    TextNumbers words_;
+    std::vector<std::vector<Entry>> entries_;  // of each word; where memory ran out, of all but one
     std::vector<Years> years_;
 };
 
