@@ -777,9 +777,14 @@ export class GedcomFile {
      * Whom a text may mean, the best first. The words of the text stand in the record in any order: whole, as a beginning or,
      * from three letters on, from the middle; where nobody is found so, with one letter wrong, missing, too many or
      * exchanged. Case, accents and apostrophes do not count. "1819-1825" is any year of birth or death in it. The first search
-     * makes an index.
+     * makes an index, or what prepareSearch has left of it.
      */
     search(text: string, limit?: number): SearchHit[];
+    /**
+     * Makes the index of searches for about so many milliseconds, or all of it. True once it is complete: a program that
+     * asks whenever it has nothing else to do has no slow first search. Throws GedcomError where memory runs out.
+     */
+    prepareSearch(milliseconds?: number): boolean;
     /** Notes, sources, media and links beside facts and names. Throws GedcomError for nobody. */
     detailsOfPerson(id: number): PersonDetails;
     detailsOfFamily(id: number): FamilyDetails;

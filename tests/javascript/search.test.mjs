@@ -122,6 +122,27 @@ test("a limit is kept, and nothing typed is nobody", () => {
     assert.equal(file.search("\u0000").length, 0);
 });
 
+test("an index is made a little at a time, and a search does what is left of it", () => {
+    const persons = Array.from({ length: 120 }, (_, i) => `0 @I${i + 1}@ INDI\n1 NAME Emma${i} /Darwin/\n`);
+    const bytes = new TextEncoder().encode(`0 HEAD\n1 GEDC\n2 VERS 7.0\n${persons.join("")}0 TRLR\n`);
+    const slowly = olvane.readGedcom(bytes);
+    assert.equal(slowly.prepareSearch(0), false);
+    assert.equal(slowly.prepareSearch(0), false);
+    assert.equal(slowly.prepareSearch(0), true);
+    assert.equal(slowly.prepareSearch(0), true);
+    const begun = olvane.readGedcom(bytes);
+    assert.equal(begun.prepareSearch(0), false);
+    const whole = olvane.readGedcom(bytes);
+    assert.equal(whole.prepareSearch(), true);
+    for (const text of ["darwin", "emma119", "mma11", "emmma7", "I120", "nobody"]) {
+        const expected = olvane.readGedcom(bytes).search(text);
+        for (const file of [slowly, begun, whole]) assert.deepEqual(file.search(text), expected, text);
+    }
+    assert.equal(begun.search("darwin").length, 120);
+    whole.close();
+    assert.throws(() => whole.prepareSearch(), /closed/);
+});
+
 test("words are folded outside of a search as in it", () => {
     const { texts } = olvane;
     const written = ["  Łukasz O’Brien-STRASSE, Straße é", "", "1819", " ,.! ", "two\nlines"];

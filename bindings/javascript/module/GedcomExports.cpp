@@ -126,7 +126,17 @@ OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFil
     return js::textOrRefusal([&] { return js::factsText(file->data.factsOfFamily(id)); });
 }
 
-// The first search makes the index.
+// Adds so many persons more to the index: 1 where all are in it, 0 where some are to come, -1 for want of memory.
+OLVANE_EXPORT("gedcom_prepare_search") int gedcomPrepareSearch(OpenFile* file, std::size_t persons) {
+    try {
+        return file->personIndex.add(file->searchTexts, persons) ? 1 : 0;
+    } catch (const std::exception& error) {
+        js::lastText = error.what();
+        return -1;
+    }
+}
+
+// Adds all who are not in the index yet.
 OLVANE_EXPORT("gedcom_search") const char* gedcomSearch(OpenFile* file, const char* text, std::size_t limit) {
     return js::textOrRefusal([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
 }

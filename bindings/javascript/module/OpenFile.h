@@ -53,9 +53,10 @@ struct OpenFile {
         return *kinshipFinder;
     }
 
+    // Of everybody.
     const kin::PersonIndex& index() {
-        if (!personIndex) personIndex.emplace(searchTexts);
-        return *personIndex;
+        personIndex.add(searchTexts);
+        return personIndex;
     }
 
     gedcom::GedcomData data;
@@ -65,7 +66,7 @@ struct OpenFile {
     std::optional<kin::KinGraph> chosenGraph;
     gedcom::ParentChoice chosenParents;
     std::optional<kin::KinshipFinder> kinshipFinder;
-    std::optional<kin::PersonIndex> personIndex;
+    kin::PersonIndex personIndex;  // of those who were added so far
     std::optional<KeptChart> everybody;
 };
 
