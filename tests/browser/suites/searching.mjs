@@ -6,11 +6,21 @@ import { describe, test } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
 import { gedcom } from "../support/families.mjs";
 
+const kIndexed = 3000; // ms, in which a small family has long been indexed
+
 async function found(visit) {
     return visit.page.$$eval("#search-list [role=option] bdi.name", (names) => names.map((name) => name.textContent));
 }
 
 describe("searching", kTwoAtOnce, () => {
+    test("the index is made before anybody types", async () => {
+        const visit = await visitDarwins();
+        await visit.page.waitForTimeout(kIndexed);
+        // One call adds 50 persons of 142.
+        assert.ok(await visit.page.evaluate(() => document.querySelector("olvane-tree").family.file.prepareSearch(0)));
+        await visit.end();
+    });
+
     test("words in any order find a person, and Enter leads there", async () => {
         const visit = await visitDarwins();
         await visit.page.keyboard.press("/");

@@ -12,6 +12,22 @@ import { gzipSync } from "node:zlib";
 
 const kPatience = 8;
 
+// A name, one letter of it wrong, words reversed, from the middle, a place, years, an xref, a letter, nobody, and on.
+const kTyped = [
+    ...["george", "victorai", "hanover victoria", "anove", "windsor castle", "1819", "1819-1825", "I17", "a", "zzzqqq"],
+    ...[
+        "george 18",
+        "mary of teck",
+        "saxe coburg",
+        "edward albert",
+        "berlin 1850",
+        "countess",
+        "I2969",
+        "b",
+        "qqqq xx",
+    ],
+];
+
 // The time that scripts take in the main thread for a click on a box, until the picture is drawn; ms.
 async function refocusTime(visit, xref) {
     const session = await visit.context.newCDPSession(visit.page);
@@ -107,15 +123,26 @@ describe("speed", () => {
         await visit.goTo("Victoria Hanover");
         assert.match(await visit.page.innerText("#side-panel h2"), /Victoria/);
         await photograph(visit, "royal");
-        const search = await visit.page.evaluate(() => {
+        const times = await visit.page.evaluate(async (texts) => {
             const input = one("#search");
-            input.value = "george 18";
-            const start = performance.now();
-            input.dispatchEvent(new Event("input"));
-            return performance.now() - start;
-        });
-        context.diagnostic(`royal92.ged: a search takes ${search.toFixed(1)} ms`);
-        assert.ok(search < 20 * kPatience, `${search} ms`);
+            const times = [];
+            for (const text of texts) {
+                input.value = text;
+                const start = performance.now();
+                input.dispatchEvent(new Event("input"));
+                times.push(performance.now() - start);
+                await new Promise((drawn) => requestAnimationFrame(() => setTimeout(drawn)));
+            }
+            return times;
+        }, kTyped);
+        const [first, ...others] = times;
+        others.sort((one, other) => one - other);
+        const median = others[others.length >> 1];
+        context.diagnostic(
+            `royal92.ged: a letter typed into the search takes ${first.toFixed(1)} ms the first time, then ` +
+                `${median.toFixed(1)} ms, ${others.at(-1).toFixed(1)} at most, with all rows of the list`,
+        );
+        assert.ok(median < 5 * kPatience, `${median} ms`);
         await visit.end();
     });
 

@@ -9,11 +9,29 @@ import type { MapHost } from "./MapHost";
 import type { SearchSource } from "./SearchBox";
 import type { Found } from "./searchReasons";
 
+// An index is made for some ms at a time, which no frame is late for, once the first picture has come to rest.
+const kPrepareDelay = 400;
+const kPrepareTime = 8;
+const kPreparePause = 8;
+
 export class Finding implements SearchSource {
+    private timer = 0;
+
     constructor(
         private readonly tree: OlvaneTree,
         private readonly maps: MapHost,
     ) {}
+
+    /** Makes the index of the open family beside everything else, so that nobody's first letter waits for it. */
+    prepare(): void {
+        const { family } = this.tree;
+        const prepare = (): void => {
+            if (family !== this.tree.family || !family || family.file.prepareSearch(kPrepareTime)) return;
+            this.timer = window.setTimeout(prepare, kPreparePause);
+        };
+        clearTimeout(this.timer);
+        this.timer = window.setTimeout(prepare, kPrepareDelay);
+    }
 
     find(text: string, limit: number): readonly Found[] {
         const { family } = this.tree;

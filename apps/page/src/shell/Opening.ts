@@ -134,6 +134,7 @@ export class Opening {
         this.greet(family);
         this.navigation.nameUnknownPerson(address);
         this.page.tree.warmUp();
+        this.panels.finding.prepare();
         if (isMapAddress(address)) this.navigation.setMap(address);
         if (!embedded) this.warnOfErrors(opened.file);
     }

@@ -35,7 +35,7 @@ export class Panels {
     private kinshipInBoxes = recall("kinship") !== "no";
     private remarkTimer = 0;
     private readonly theme: Theme;
-    private readonly finding: Finding;
+    readonly finding: Finding;
     private readonly cover = html("div", { class: "cover", hidden: true });
     private readonly input: HTMLInputElement;
 

@@ -104,12 +104,13 @@ export class SearchBox {
     }
 
     private select(index: number): void {
+        this.mark(index);
+        this.list.children[index]?.scrollIntoView({ block: "nearest" });
+    }
+
+    private mark(index: number): void {
         this.current = index;
-        [...this.list.children].forEach((option, i) => {
-            const isCurrent = i === index;
-            option.setAttribute("aria-selected", String(isCurrent));
-            if (isCurrent) option.scrollIntoView({ block: "nearest" });
-        });
+        [...this.list.children].forEach((option, i) => option.setAttribute("aria-selected", String(i === index)));
         if (index >= 0 && this.found.length > 0) this.input.setAttribute("aria-activedescendant", "found-" + index);
         else this.input.removeAttribute("aria-activedescendant");
     }
@@ -121,13 +122,15 @@ export class SearchBox {
         this.found = found.slice(0, kMostFound);
         const areMore = found.length > kMostFound;
         const { search } = this.messages;
+        // To the first one, while the browser need not lay the new list out for that.
+        this.list.scrollTop = 0;
         this.list.replaceChildren(...this.found.map((found, i) => this.option(found, i)));
         if (this.found.length === 0) this.list.append(this.remark(search.none));
         if (areMore) this.list.append(this.remark(search.first(kMostFound)));
         this.list.hidden = false;
         this.input.setAttribute("aria-expanded", "true");
         this.status.textContent = areMore ? search.first(kMostFound) : this.counted(this.found.length);
-        this.select(this.found.length > 0 ? 0 : -1);
+        this.mark(this.found.length > 0 ? 0 : -1);
     }
 
     private counted(count: number): string {
