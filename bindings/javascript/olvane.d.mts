@@ -321,6 +321,8 @@ export interface NameRoom {
     readonly height: number;
     readonly gap?: number | undefined;
     readonly lines?: number | undefined;
+    /** To which letters shrink before anything is cut; 10 where none is given. */
+    readonly smallest?: number | undefined;
 }
 
 /**
@@ -342,7 +344,7 @@ export interface Texts {
         lines: number,
         bold?: boolean,
     ): { readonly lines: readonly string[]; readonly whole: boolean };
-    /** In bold letters of 10 to 13 px, as large as the room allows. */
+    /** In bold letters of at most 13 px, as large as the room allows. */
     fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
     /** Whether the first letter that has a direction is of a script that runs from right to left. */
     runsRightToLeft(text: string): boolean;

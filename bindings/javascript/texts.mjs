@@ -42,8 +42,8 @@ export class Texts {
         });
     }
 
-    fitName({ given, surname, surnameFirst = false }, { width, height, gap = 3, lines = 4 }) {
-        const room = [surnameFirst ? 1 : 0, width, height, gap, lines];
+    fitName({ given, surname, surnameFirst = false }, { width, height, gap = 3, lines = 4, smallest = 10 }) {
+        const room = [surnameFirst ? 1 : 0, width, height, gap, lines, smallest];
         return this.#remembered(`n/${room.join("/")}/${given}\n${surname}`, () => {
             const answer = this.#instance.withText(given, (first) =>
                 this.#instance.withText(surname, (second) =>
@@ -51,7 +51,7 @@ export class Texts {
                 ),
             );
             const [size, ...fitted] = answer.split("\n");
-            return { size: Number(size), lines: fitted };
+            return { size: Number(size) / 100, lines: fitted };
         });
     }
 

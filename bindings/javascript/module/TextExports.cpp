@@ -4,6 +4,7 @@
 // Measuring and fitting of texts, as pictures have it; those texts are cut first, as in a picture. And their folding.
 
 #include <algorithm>
+#include <cmath>
 #include <cstddef>
 #include <exception>
 #include <string>
@@ -61,15 +62,16 @@ const char* fitLines(const char* text, double size, int bold, double width, int 
     });
 }
 
-// The size of the letters and the lines, each on a line of its own.
+// The size of the letters in hundredths of a px, and the lines, each on a line of its own.
 OLVANE_EXPORT("fit_name")
 const char* fitName(const char* given, const char* surname, int surnameFirst, double width, double height,
-                    double gap, int mostLines) {
+                    double gap, int mostLines, double smallest) {
     return answered([&] {
-        const picture::NameRoom room{width, height, gap, static_cast<std::size_t>(mostLines)};
+        picture::NameRoom room{width, height, gap, static_cast<std::size_t>(mostLines)};
+        room.smallest = smallest;
         const picture::FittedName name =
             picture::fitName(readable(given), readable(surname), surnameFirst != 0, room);
-        std::string answer = std::to_string(static_cast<int>(name.size));
+        std::string answer = std::to_string(static_cast<int>(std::lround(100 * name.size)));
         for (const std::string& line : name.lines) answer += "\n" + line;
         return answer;
     });

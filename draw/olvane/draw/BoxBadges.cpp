@@ -27,8 +27,6 @@ constexpr double kCaptionFrame = 5;   // above and below its lines together
 constexpr double kCaptionInside = 1;  // by which a caption reaches into the border of its box
 constexpr double kFrameReach = 7;     // of the frames around ends and common ancestors
 
-constexpr std::string_view kTwoUp = "\xE2\x87\x88";
-
 std::string counted(int count, Phrase one, Phrase many, kin::Language language) {
     return phraseWith(count == 1 ? one : many, language, {joined(whole(count))});
 }
@@ -36,17 +34,6 @@ std::string counted(int count, Phrase one, Phrase many, kin::Language language) 
 std::string hiddenMark(const BoxFrame& frame, bool isLiving) {
     const int count = frame.countsHidden && !isLiving ? frame.hiddenCount() : 0;
     return count > 0 ? "+" + std::to_string(count) : "+";
-}
-
-void appendBadgeAt(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
-    const std::string_view fill = badge.hollow ? theme.page : theme.badge;
-    const std::string_view ink = badge.hollow ? theme.text : theme.badgeText;
-    put(svg, "<g><title>", Escaped{badge.title}, "</title>\n<rect x=\"", number(badge.x), "\" y=\"",
-        number(y), "\" width=\"", number(badge.width()), "\" height=\"", number(kBadgeHeight),
-        "\" rx=\"7.5\" fill=\"", fill, "\" stroke=\"", theme.badge, "\"/>\n");
-    appendTextLine(svg, badge.x + badge.width() / 2, y + kBadgeHeight - 4, badge.text,
-                   {kMiddle, {kBadgeSize, true}, ink});
-    svg += "</g>\n";
 }
 
 // Where a row of badges so wide begins: mostly outside of the upper or lower edge, half outside at the sides. In a wide box
@@ -73,11 +60,22 @@ void appendMarks(std::string& svg, const BoxFrame& box, Side place, const Drawin
     for (Badge& badge : badges) {
         badge.x = x;
         x += badge.width() + kBadgeInset / 2;
-        appendBadgeAt(svg, y, badge, theme);
+        appendBadge(svg, y, badge, theme);
     }
 }
 
 }  // namespace
+
+void appendBadge(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme) {
+    const std::string_view fill = badge.hollow ? theme.page : theme.badge;
+    const std::string_view ink = badge.hollow ? theme.text : theme.badgeText;
+    put(svg, "<g><title>", Escaped{badge.title}, "</title>\n<rect x=\"", number(badge.x), "\" y=\"",
+        number(y), "\" width=\"", number(badge.width()), "\" height=\"", number(kBadgeHeight),
+        "\" rx=\"7.5\" fill=\"", fill, "\" stroke=\"", theme.badge, "\"/>\n");
+    appendTextLine(svg, badge.x + badge.width() / 2, y + kBadgeHeight - 4, badge.text,
+                   {kMiddle, {kBadgeSize, true}, ink});
+    svg += "</g>\n";
+}
 
 double badgeTopOf(const BoxFrame& box) {
     return isWide(box) ? box.height - kBadgeHeight - kWideBadgeInset : kBadgeInset;
@@ -141,7 +139,7 @@ std::vector<Badge> badgesOf(const BoxFrame& box, bool isLiving) {
 
 void appendBadges(std::string& svg, const BoxFrame& box, const std::vector<Badge>& badges,
                   const DrawingTheme& theme) {
-    for (const Badge& badge : badges) appendBadgeAt(svg, badgeTopOf(box), badge, theme);
+    for (const Badge& badge : badges) appendBadge(svg, badgeTopOf(box), badge, theme);
     if (box.text != nullptr && !badges.empty()) box.text->add(kBadgeSize);
 }
 

@@ -72,6 +72,12 @@ void appendTexts(std::string& svg, const BoxFrame& box, const kin::PersonLabel& 
 void appendInvitation(std::string& svg, const BoxFrame& box, std::string_view invitation,
                       const DrawingTheme& theme);
 
+// One badge, of which y is the upper edge.
+void appendBadge(std::string& svg, double y, const Badge& badge, const DrawingTheme& theme);
+
+// The sign of a person with further parents.
+constexpr std::string_view kTwoUp = "\xE2\x87\x88";
+
 void appendBadges(std::string& svg, const BoxFrame& box, const std::vector<Badge>& badges,
                   const DrawingTheme& theme);
 

@@ -44,6 +44,11 @@ enum class Phrase : std::uint8_t {
     foldedAncestors,
     foldedDescendants,
     foldedBeside,
+    meansHidden,
+    meansSamePerson,
+    meansElsewhere,
+    meansFurtherParents,
+    meansFolded,
     divorced,
     unmarried,
     adopted,
@@ -54,7 +59,7 @@ enum class Phrase : std::uint8_t {
     sheet,
     toSheet,
 };
-inline constexpr std::size_t kPhrases = 37;
+inline constexpr std::size_t kPhrases = 42;
 
 // A phrase without arguments, or with its {} as they are.
 std::string_view wordsOf(Phrase phrase, kin::Language language);

@@ -71,9 +71,12 @@ public:
     SvgPicture draw() {
         placeFrame();
         listLines();
+        const auto marks = boxMarksOf(fan_, options_.language);
+        for (const std::vector<BoxMark>& ofBox : marks) {
+            if (sign_.empty() && !ofBox.empty()) sign_ = ofBox.front().text;
+        }
         const std::string legend = legendText();
         openPage(svg_, options_);
-        const auto marks = boxMarksOf(fan_, options_.language);
         for (std::size_t i = 0; i < fan_.boxes.size(); ++i) appendCell(i, marks[i]);
         if (!fan_.lines.empty()) appendLinks();
         svg_.svg += legend;
@@ -357,30 +360,37 @@ private:
 
     void appendLinks() { appendLines(svg_, content_, options_, frame_); }
 
-    // Whose line each colour is.
+    // Whose line each colour is, and what the signs in cells mean.
     std::string legendText() {
-        if (lines_.empty()) return std::string();
+        if (lines_.empty() && sign_.empty()) return std::string();
         svg_.text.add(kLegendSize);
         std::string legend;
         put(legend, "<g>\n<title>", Escaped{wordsOf(Phrase::legend, options_.language)}, "</title>\n");
         const int top = svg_.height - kMargin + 12;
         double widest = 0;
-        for (std::size_t i = 0; i < lines_.size(); ++i) {
-            const auto box = static_cast<std::size_t>(lines_[i]);
-            const std::string name =
-                cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language));
-            const std::string text = fitLine(name, {kLegendSize, false}, 300);
+        int y = top;
+        const auto addText = [&](std::string_view content) {
+            const std::string text = fitLine(content, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
-            const int y = top + kLegendPitch * static_cast<int>(i);
-            put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
-                "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line,
-                "\"/>\n<text x=\"", whole(kMargin + 38), "\" y=\"", whole(y + 11), "\" font-size=\"",
+            put(legend, "<text x=\"", whole(kMargin + 38), "\" y=\"", whole(y + 11), "\" font-size=\"",
                 number(kLegendSize), "\" fill=\"", theme().quietText, "\">", Escaped{text}, "</text>\n");
+            y += kLegendPitch;
+        };
+        for (const Index line : lines_) {
+            const auto box = static_cast<std::size_t>(line);
+            put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
+                "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line, "\"/>\n");
+            addText(cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language)));
         }
-        const double height = static_cast<double>(lines_.size()) * kLegendPitch;
-        svg_.height += static_cast<int>(height) + 12;
+        if (!sign_.empty()) {
+            put(legend, "<text x=\"", whole(kMargin + 14), "\" y=\"", whole(y + 11),
+                "\" text-anchor=\"middle\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().text,
+                "\">", Escaped{sign_}, "</text>\n");
+            addText(wordsOf(Phrase::meansElsewhere, options_.language));
+        }
+        svg_.height += y - top + 12;
         svg_.width = std::max(svg_.width, static_cast<int>(widest) + 38 + 2 * kMargin);
-        svg_.legend = {kMargin, static_cast<double>(top), widest + 38, height};
+        svg_.legend = {kMargin, static_cast<double>(top), widest + 38, static_cast<double>(y - top)};
         return legend + "</g>\n";
     }
 
@@ -392,6 +402,7 @@ private:
     double middleX_ = 0;
     double middleY_ = 0;
     std::vector<Index> lines_;
+    std::string sign_;  // of a mark, for the legend
 };
 
 }  // namespace

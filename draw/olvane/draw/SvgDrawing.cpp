@@ -7,11 +7,13 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 #include <set>
 #include <unordered_map>
 #include <vector>
 
 #include <olvane/draw/BoxArtInternal.h>
+#include <olvane/draw/BoxPartsInternal.h>
 #include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/FanArtInternal.h>
 #include <olvane/draw/LineArtInternal.h>
@@ -40,6 +42,9 @@ constexpr double kLegendWidth = 170;
 constexpr int kLegendStroke = 44;
 constexpr double kLegendSize = 11.5;
 constexpr double kLegendLine = 1.6;
+constexpr int kWidePicture = 3000;
+constexpr int kLegendPlaces = 64;        // tried at the lower edge of a wide picture
+constexpr double kLegendClearance = 20;  // to boxes, their frames and marks, and to lines
 
 struct Bounds {
     double left = 0;
@@ -86,6 +91,9 @@ public:
         : content_(content), options_(options) {}
 
     SvgPicture compose() {
+        marks_ = boxMarksOf(content_.picture, options_.language, content_.laterSide);
+        numberRepeats();
+        findCommonAncestors();
         placePlates();
         const Bounds bounds = boundsOf(content_.picture, plates_);
         const int headline = options_.headline ? kHeadlineHeight : 0;
@@ -134,16 +142,13 @@ private:
 
     void appendBoxes() {
         const picture::Picture& picture = content_.picture;
-        numberRepeats();
-        findCommonAncestors();
         if (picture.boxes.empty()) appendNobody();
-        const auto marks = boxMarksOf(picture, options_.language, content_.laterSide);
         for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
             BoxFrame frame = frameOf(picture.boxes[i]);
             frame.language = options_.language;
             frame.isFocus = picture.focus == static_cast<picture::Index>(i);
             addKinship(frame, static_cast<picture::Index>(i));
-            frame.marks = marks[i];
+            frame.marks = marks_[i];
             frame.leastName = options_.leastNameSize;
             frame.text = &picture_.text;
             appendBox(frame);
@@ -169,8 +174,7 @@ private:
     void placePlates() {
         if (content_.picture.other == picture::kNone) return;
         std::vector<picture::MarkedEdges> marked;
-        for (const std::vector<BoxMark>& marks :
-             boxMarksOf(content_.picture, options_.language, content_.laterSide)) {
+        for (const std::vector<BoxMark>& marks : marks_) {
             const auto isAt = [&marks](picture::Side side) {
                 return std::any_of(marks.begin(), marks.end(),
                                    [side](const BoxMark& mark) { return mark.place == side; });
@@ -234,50 +238,154 @@ private:
         double width = kLegendLine;
         std::string_view dashes;
         std::string text;
+        std::string sign;  // of a badge, instead of a line
+        bool hollow = false;
     };
+
+    void addSigns(std::vector<LegendRow>& rows) const {
+        const auto add = [&](std::string_view sign, bool hollow, Phrase meaning) {
+            LegendRow row;
+            row.text = wordsOf(meaning, options_.language);
+            row.sign = sign;
+            row.hollow = hollow;
+            rows.push_back(std::move(row));
+        };
+        const picture::Picture& picture = content_.picture;
+        bool hasHidden = false, hasFurther = false;
+        std::string elsewhere, folded;
+        for (std::size_t i = 0; i < picture.boxes.size(); ++i) {
+            const picture::Box& box = picture.boxes[i];
+            if (box.kind != picture::BoxKind::person) continue;
+            bool isFolded = false;
+            for (const BoxMark& mark : marks_[i]) {
+                isFolded = isFolded || mark.isFolded;
+                std::string& sign = mark.isFolded ? folded : elsewhere;
+                if (sign.empty()) sign = mark.text;
+            }
+            hasHidden = hasHidden || (!isFolded && frameOf(box).hasHidden());
+            hasFurther = hasFurther || (box.furtherParents > 0 && !content_.labelOf(box.id).living);
+        }
+        if (hasHidden) add("+", false, Phrase::meansHidden);
+        if (!repeats_.empty()) add("=", true, Phrase::meansSamePerson);
+        if (!elsewhere.empty()) add(elsewhere, true, Phrase::meansElsewhere);
+        if (hasFurther) add(kTwoUp, true, Phrase::meansFurtherParents);
+        if (!folded.empty()) add(folded, false, Phrase::meansFolded);
+    }
 
     std::vector<LegendRow> legendRows(const LineStylesUsed& styles) const {
         std::vector<LegendRow> rows;
         const std::vector<picture::Way>& ways = content_.picture.ways;
         for (std::size_t i = 0; i < ways.size(); ++i) {
-            rows.push_back({wayColour(theme(), i), kWayWidth, wayDashes(i), ways[i].words});
+            rows.push_back({wayColour(theme(), i), kWayWidth, wayDashes(i), ways[i].words, {}, false});
         }
         for (std::size_t i = 1; i < kLineStyles; ++i) {
             const auto style = static_cast<LineStyle>(i);
             if (styles[i])
-                rows.push_back({theme().line, kLegendLine, dashesOf(style),
-                                std::string(meaningOf(style, options_.language))});
+                rows.push_back({theme().line,
+                                kLegendLine,
+                                dashesOf(style),
+                                std::string(meaningOf(style, options_.language)),
+                                {},
+                                false});
         }
+        addSigns(rows);
         return rows;
     }
 
-    // Below the picture, as wide as it needs; lists only what is there.
+    // Lists only what is there: in a lower corner of the picture where that is free, else below it.
     std::string legendFor(const LineStylesUsed& styles) {
         const std::vector<LegendRow> rows = legendRows(styles);
         if (rows.empty()) return std::string();
         picture_.text.add(kLegendSize);
+        double width = kLegendWidth;
+        for (const LegendRow& row : rows) {
+            const double text = textWidth(cleanText(cutText(row.text)), {kLegendSize});
+            width = std::max(width, kLegendStroke + 10 + text);
+        }
+        placeLegend(wholePx(width), kLegendPitch * static_cast<int>(rows.size()));
         std::string legend;
         put(legend, "<g>\n<title>", Escaped{wordsOf(Phrase::legend, options_.language)}, "</title>\n");
-        double width = kLegendWidth;
         int number = 0;
-        for (const LegendRow& row : rows) {
-            appendLegendRow(legend, number++, row);
-            width =
-                std::max(width, kLegendStroke + 10 + textWidth(cleanText(cutText(row.text)), {kLegendSize}));
-        }
-        picture_.height += number * kLegendPitch + kLegendGap;
-        picture_.width = std::max(picture_.width, wholePx(width) + 2 * kMargin);
-        const double height = number * kLegendPitch;
-        picture_.legend = {kMargin, picture_.height - kMargin - height, width, height};
+        for (const LegendRow& row : rows) appendLegendRow(legend, number++, row);
         return legend + "</g>\n";
     }
 
+    void placeLegend(int width, int height) {
+        int y = picture_.height - kMargin - height;
+        std::optional<int> x = freePlaceOf(width, height, y);
+        if (!x) {
+            x = kMargin;
+            y = picture_.height - kMargin + kLegendGap;
+            picture_.height += height + kLegendGap;
+            picture_.width = std::max(picture_.width, width + 2 * kMargin);
+        }
+        picture_.legend = {static_cast<double>(*x), static_cast<double>(y), static_cast<double>(width),
+                           static_cast<double>(height)};
+    }
+
+    // Where an area at the lower edge is free: a corner, or in a wide picture, of which a corner may lie on another sheet
+    // than anything else, the place that is nearest to the focus.
+    std::optional<int> freePlaceOf(int width, int height, int top) const {
+        const int last = picture_.width - kMargin - width;
+        if (picture_.width <= kWidePicture || content_.picture.focus == picture::kNone) {
+            for (const int x : {kMargin, last}) {
+                if (isFree(x, top, width, height)) return x;
+            }
+            return std::nullopt;
+        }
+        const double focus =
+            frame_.x(content_.picture.boxes[static_cast<std::size_t>(content_.picture.focus)].x);
+        std::optional<int> nearest;
+        for (int i = 0; i <= kLegendPlaces; ++i) {
+            const int x = kMargin + static_cast<int>(static_cast<double>(last - kMargin) * i / kLegendPlaces);
+            const auto distance = [&](int of) { return std::abs(of + width / 2 - focus); };
+            if (nearest && distance(x) >= distance(*nearest)) continue;
+            if (isFree(x, top, width, height)) nearest = x;
+        }
+        return nearest;
+    }
+
+    // Whether nothing is drawn in an area of the picture or close to it.
+    bool isFree(int left, int top, int width, int height) const {
+        if (left < kMargin || top < kMargin) return false;
+        const auto isClear = [&](double x1, double y1, double x2, double y2) {
+            return x2 + kLegendClearance <= left || x1 - kLegendClearance >= left + width ||
+                   y2 + kLegendClearance <= top || y1 - kLegendClearance >= top + height;
+        };
+        const picture::Picture& picture = content_.picture;
+        return std::all_of(picture.boxes.begin(), picture.boxes.end(),
+                           [&](const picture::Box& box) {
+                               const BoxFrame frame = frameOf(box);
+                               return isClear(frame.x, frame.y, frame.x + frame.width,
+                                              frame.y + frame.height);
+                           }) &&
+               std::all_of(picture.lines.begin(), picture.lines.end(),
+                           [&](const picture::Line& line) {
+                               return isClear(frame_.x(std::min(line.x1, line.x2)),
+                                              frame_.y(std::min(line.y1, line.y2)),
+                                              frame_.x(std::max(line.x1, line.x2)),
+                                              frame_.y(std::max(line.y1, line.y2)));
+                           }) &&
+               std::all_of(plates_.begin(), plates_.end(), [&](const picture::KinshipPlate& plate) {
+                   return isClear(frame_.x(plate.x), frame_.y(plate.y), frame_.x(plate.right()),
+                                  frame_.y(plate.bottom()));
+               });
+    }
+
     void appendLegendRow(std::string& legend, int place, const LegendRow& row) const {
-        const int y = picture_.height - kMargin + kLegendGap + kLegendPitch * place + kLegendPitch / 2;
-        put(legend, "<path d=\"M", whole(kMargin), " ", whole(y), "h", whole(kLegendStroke),
-            "\" fill=\"none\" stroke=\"", row.colour, "\" stroke-width=\"", number(row.width), "\"");
-        if (!row.dashes.empty()) put(legend, " stroke-dasharray=\"", row.dashes, "\"");
-        put(legend, "/>\n<text x=\"", whole(kMargin + kLegendStroke + 10), "\" y=\"", whole(y + 4),
+        const int left = static_cast<int>(picture_.legend.x);
+        const int y = static_cast<int>(picture_.legend.y) + kLegendPitch * place + kLegendPitch / 2;
+        if (row.sign.empty()) {
+            put(legend, "<path d=\"M", whole(left), " ", whole(y), "h", whole(kLegendStroke),
+                "\" fill=\"none\" stroke=\"", row.colour, "\" stroke-width=\"", number(row.width), "\"");
+            if (!row.dashes.empty()) put(legend, " stroke-dasharray=\"", row.dashes, "\"");
+            legend += "/>\n";
+        } else {
+            Badge badge{row.sign, row.text, row.hollow};
+            badge.x = left + (kLegendStroke - badge.width()) / 2;
+            appendBadge(legend, y - kBadgeHeight / 2, badge, theme());
+        }
+        put(legend, "<text x=\"", whole(left + kLegendStroke + 10), "\" y=\"", whole(y + 4),
             "\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().quietText, "\">",
             Escaped{cleanText(cutText(row.text))}, "</text>\n");
     }
@@ -288,6 +396,7 @@ private:
     SvgPicture picture_;
     std::unordered_map<std::int64_t, Repeats> repeats_;
     std::set<picture::Index> commonAncestors_;
+    std::vector<std::vector<BoxMark>> marks_;  // of each box
     std::vector<picture::KinshipPlate> plates_;
 };
 

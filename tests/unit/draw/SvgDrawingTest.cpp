@@ -300,10 +300,55 @@ TEST_F(Picture, secondBoxOfTheFocusIsNotDrawnAsFocus) {
 }
 
 TEST_F(Picture, legendAppearsOnlyWhenAStyleIsUsed) {
+    boxOf(4).flag = false;
     EXPECT_THAT(draw(), Not(HasSubstr("Legend")));
     content_.picture.families[0].style = kin::UnionState::divorced;
     EXPECT_THAT(draw(), HasSubstr(">divorced</text>"));
     EXPECT_THAT(draw(), Not(HasSubstr("adopted")));
+}
+
+// On paper no title shows what a sign means.
+TEST_F(Picture, legendStatesWhatTheSignsAtBoxesMean) {
+    const auto rowsOf = [](const std::string& svg) { return svg.substr(svg.find("<title>Legend</title>")); };
+    EXPECT_THAT(rowsOf(draw()), HasSubstr(">relatives not drawn here</text>"));
+    EXPECT_THAT(rowsOf(draw()), Not(HasSubstr("further parents")));
+    EXPECT_THAT(rowsOf(draw()), Not(HasSubstr("same number")));
+    boxOf(2).furtherParents = 1;
+    content_.picture.marks.push_back({{4, 2, picture::kNone}, 7, picture::MarkKind::parentsElsewhere});
+    content_.picture.folded = {{0, 12, picture::Branch::up, picture::Side::top}};
+    const std::string rows = rowsOf(draw());
+    EXPECT_THAT(rows, HasSubstr(">further parents</text>"));
+    EXPECT_THAT(rows, HasSubstr(">goes on at the same number</text>"));
+    EXPECT_THAT(rows, HasSubstr(">folded branch</text>"));
+    EXPECT_THAT(rows, HasSubstr(">+12</text>"));
+    EXPECT_THAT(rows, Not(HasSubstr("several boxes")));
+    repeat(1, 0);
+    EXPECT_THAT(rowsOf(draw()), HasSubstr(">person with several boxes</text>"));
+}
+
+// The boxes of this picture fill both lower corners, until one is moved up.
+TEST_F(Picture, legendStandsInAFreeCornerAndElseBelow) {
+    boxOf(4).flag = false;
+    const int height = drawSvg(content_, options_).height;
+    boxOf(4).flag = true;
+    const SvgPicture below = drawSvg(content_, options_);
+    EXPECT_GT(below.height, height);
+    addBox(9, 300, 0);
+    labels_[9] = label("Ole", "Berg");
+    const SvgPicture inside = drawSvg(content_, options_);
+    EXPECT_EQ(inside.height, height);
+    for (const PictureBox& box : inside.boxes) {
+        const bool isApart = box.area.x + box.area.width < inside.legend.x ||
+                             inside.legend.x + inside.legend.width < box.area.x ||
+                             box.area.y + box.area.height < inside.legend.y;
+        EXPECT_TRUE(isApart) << inside.legend.x << ' ' << inside.legend.y;
+    }
+}
+
+TEST_F(Picture, furtherParentsOfTheLivingAreNotInTheLegend) {
+    boxOf(2).furtherParents = 1;
+    labels_[2].living = true;
+    EXPECT_THAT(draw(), Not(HasSubstr("further parents")));
 }
 
 TEST_F(Picture, adoptedAndFosterChildrenHaveLinesOfTheirOwn) {
@@ -354,7 +399,7 @@ TEST_F(Picture, whatIsElsewhereHasANumberAtBothEnds) {
     EXPECT_EQ(countOf(svg,
                       ">\xE2\x86\x94"
                       "8</text>"),
-              2u);
+              3u);  // at both partners and in the legend
 }
 
 // Of a child and of its parent, and of two partners, in a chart whose children stand on that side.
@@ -407,7 +452,7 @@ TEST_F(Picture, aMarkOfSeveralChildrenStandsOnceAtTheirParent) {
     EXPECT_EQ(countOf(svg,
                       ">\xE2\x86\x93"
                       "7</text>"),
-              1u);
+              2u);  // at the parent and in the legend
 }
 
 TEST_F(Picture, manyMarksOfOneBoxAreCounted) {
@@ -450,6 +495,7 @@ TEST_F(Picture, headlineIsDrawnWhenAskedFor) {
 }
 
 TEST_F(Picture, pageTakesAllBoxes) {
+    boxOf(4).flag = false;
     const SvgPicture picture = drawSvg(content_, options_);
     EXPECT_EQ(picture.width, 135 * 2 + 56);
     EXPECT_EQ(picture.height, 300 * 2 + 56);

@@ -11,6 +11,7 @@ import type { BoxLook } from "./boxArt";
 const kYearsSize = 10;
 const kInset = 4; // points on each side of a text
 const kLeastRoom = 14; // points; less shows no text at all
+const kSmallestName = 8;
 const kLines = 12; // colours for lines of descent
 
 const radians = (degrees: number) => (degrees * Math.PI) / 180;
@@ -66,13 +67,13 @@ function appendText(group: SVGGElement, look: BoxLook, { x, y }: Box, arc: BoxAr
     if (width < kLeastRoom || height < 9) return;
     const { texts } = look;
     const nameHeight = height - (look.years && height >= 26 ? 13 : 0);
-    const name = texts.fitName(look.name, { width, height: nameHeight, gap: 1, lines: 3 });
+    const name = texts.fitName(look.name, { width, height: nameHeight, gap: 1, lines: 3, smallest: kSmallestName });
     const hasYears = look.years !== "" && height >= (name.lines.length + 1) * 13;
     const years = hasYears ? texts.fitLine(look.years, kYearsSize, width) : "";
     const [cx, cy] = pointAt(arc, radius, middle);
     const turn = radius === 0 ? 0 : uprightTurn(isAcross ? middle - 90 : middle);
     const shown = [...name.lines, ...(years ? [years] : [])];
-    const pitch = Math.max(12, name.size + 1);
+    const pitch = Math.max(years ? 12 : 0, name.size + 1);
     const top = -((shown.length - 1) * pitch) / 2 + 4;
     const holder = svg("g", {
         transform: `translate(${(cx - x).toFixed(1)} ${(cy - y).toFixed(1)}) rotate(${turn.toFixed(1)})`,
