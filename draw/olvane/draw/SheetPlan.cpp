@@ -13,7 +13,6 @@
 #include <utility>
 
 #include <olvane/kin/shared/MergeSort.h>
-#include <olvane/picture/Extent.h>
 
 namespace olvane::draw {
 
@@ -272,25 +271,6 @@ bool isBetter(const SheetPlan& one, const SheetPlan& other, bool scaleGiven) {
 }
 
 }  // namespace
-
-SheetSubject subjectOf(const picture::Picture& picture) {
-    SheetSubject subject;
-    if (picture.boxes.empty()) return subject;
-    const picture::Extent extent = picture::extentOf(picture);
-    const double left = extent.left;
-    const double top = extent.top;
-    subject.width = extent.width();
-    subject.height = extent.height();
-    if (picture.isRound()) return subject;
-    for (const picture::Box& box : picture.boxes) {
-        subject.boxes.push_back({box.x - left, box.y - top, double{box.width}, double{box.height}});
-    }
-    for (const picture::Line& line : picture.lines) {
-        subject.others.push_back({std::min(line.x1, line.x2) - left, std::min(line.y1, line.y2) - top,
-                                  std::abs(line.x2 - line.x1), std::abs(line.y2 - line.y1)});
-    }
-    return subject;
-}
 
 SheetPlan planSheets(const SheetSubject& subject, const SheetRequest& request, double mostSheets) {
     check(subject, request);

@@ -8,7 +8,6 @@
 
 #include <olvane/draw/Paper.h>
 #include <olvane/draw/detail/PictureArea.h>
-#include <olvane/picture/Picture.h>
 
 namespace olvane::draw {
 
@@ -21,10 +20,6 @@ struct SheetSubject {
     std::vector<PictureArea> boxes;
     std::vector<PictureArea> others;  // lines and all else that a sheet without boxes may show
 };
-
-// A picture without anything around it; in points of the picture. Not for round charts, which nothing can be cut out
-// of: their subject has no boxes.
-SheetSubject subjectOf(const picture::Picture& picture);
 
 struct SheetRequest {
     Paper paper;

@@ -244,6 +244,58 @@ TEST_F(FoundationPicture, hasBoxesFamiliesAndLinesAsRecords) {
     EXPECT_LT(0u, [picture lineCount]);
 }
 
+// The same records as the picture in C++ has them, of every view, with marks, bridges, arcs and words among them.
+TEST_F(FoundationPicture, hasEveryRecordOfThePictureInCxx) {
+    // 4 has two families of parents, and cousins marry.
+    const CaseFile input = family("1+2: 3 4; 5+6: 4; 3+7: 8 9f; 4+10f: 11f 12; 8+11: 13; 9+12: 14");
+    std::size_t marks = 0, arcs = 0, words = 0;
+    for (int view = OlvaneViewFamily; view <= OlvaneViewEverybody; ++view) {
+        OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:view];
+        options.other = 14;
+        OlvanePicture* picture = [OlvanePicture pictureOfDataSource:hostOf<CaseFoundationHost>(input)
+                                                              focus:13
+                                                            options:options
+                                                              error:NULL];
+        ASSERT_TRUE(picture != nil) << view;
+        charts::ViewRequest request;
+        request.chart.view = static_cast<charts::View>(view);
+        request.chart.effort = 1;
+        const auto expected =
+            charts::pictureOfHost(std::make_shared<support::CaseManager>(input), 13, request, 14);
+        ASSERT_EQ(expected.members.size(), [picture memberCount]);
+        ASSERT_EQ(expected.lines.size(), [picture lineCount]);
+        for (std::size_t i = 0; i < expected.lines.size(); ++i) {
+            const OlvaneLine& line = [picture lines][i];
+            EXPECT_EQ(expected.lines[i].x1, line.x1);
+            EXPECT_EQ(expected.lines[i].y2, line.y2);
+            EXPECT_EQ(static_cast<int>(expected.lines[i].role), static_cast<int>(line.role));
+        }
+        ASSERT_EQ(expected.bridges.size(), [picture bridgeCount]);
+        for (std::size_t i = 0; i < expected.bridges.size(); ++i) {
+            EXPECT_EQ(expected.bridges[i], [picture bridges][i]);
+        }
+        ASSERT_EQ(expected.marks.size(), [picture markCount]);
+        for (std::size_t i = 0; i < expected.marks.size(); ++i) {
+            const OlvaneMark& mark = [picture marks][i];
+            EXPECT_EQ(static_cast<int>(expected.marks[i].kind), static_cast<int>(mark.kind));
+            EXPECT_EQ(expected.marks[i].boxes[1], mark.boxes[1]);
+        }
+        ASSERT_EQ(expected.arcs.size(), [picture arcCount]);
+        for (std::size_t i = 0; i < expected.arcs.size(); ++i) {
+            EXPECT_EQ(expected.arcs[i].from, [picture arcs][i].from);
+        }
+        EXPECT_EQ(expected.focusIs, [[picture focusIs] UTF8String]);
+        EXPECT_EQ(expected.otherIs, [[picture otherIs] UTF8String]);
+        EXPECT_EQ(expected.other, [picture other]);
+        marks += expected.marks.size();
+        arcs += expected.arcs.size();
+        words += expected.otherIs.size();
+    }
+    EXPECT_LT(0U, marks);
+    EXPECT_LT(0U, arcs);
+    EXPECT_LT(0U, words);
+}
+
 TEST_F(FoundationPicture, takesOptionsAsProperties) {
     const CaseFile input = family(kThreeGenerations);
     OlvanePictureOptions* options = [OlvanePictureOptions optionsForView:OlvaneViewFamily];

@@ -99,6 +99,38 @@ TEST(OutputFile, hasThePermissionsThatTheUmaskLeavesWhereItIsNew) {
     EXPECT_EQ(permissionsOf(folder.path("a.svg")), 0640U);
 }
 
+// A device has no ending and nothing to lose: it is written to as it is, and no file takes its place.
+TEST(OutputFile, goesStraightIntoADevice) {
+    writeOutput("/dev/null", "picture", kPictures);
+    struct stat status = {};
+    ASSERT_EQ(::stat("/dev/null", &status), 0);
+    EXPECT_TRUE(S_ISCHR(status.st_mode));
+}
+
+TEST(OutputFile, goesStraightIntoAPipe) {
+    const ScratchFolder folder;
+    const std::string path = folder.path("pipe");
+    ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+    const int reader = ::open(path.c_str(), O_RDONLY | O_NONBLOCK);
+    ASSERT_GE(reader, 0);
+    writeOutput(path, "picture", kPictures);
+    char content[16] = {};
+    EXPECT_EQ(::read(reader, content, sizeof content), 7);
+    ::close(reader);
+    EXPECT_STREQ(content, "picture");
+    EXPECT_THAT(folder.names(), ElementsAre("pipe"));
+}
+
+TEST(OutputFile, saysThatADeviceIsFull) {
+    if (!std::filesystem::exists("/dev/full")) GTEST_SKIP() << "this system has no /dev/full";
+    try {
+        writeOutput("/dev/full", "picture", kPictures);
+        FAIL() << "nothing is refused";
+    } catch (const UsageError& error) {
+        EXPECT_THAT(error.what(), HasSubstr("/dev/full: cannot be written: No space left"));
+    }
+}
+
 // A name of 255 bytes has no room for more.
 TEST(OutputFile, mayHaveTheLongestNameThatThereIs) {
     const ScratchFolder folder;

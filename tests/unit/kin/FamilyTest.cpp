@@ -299,6 +299,70 @@ TEST(FamilyRefuses, childrenOfFamiliesThatAreNotThere) {
     EXPECT_EQ(refusalOf(columns), "family children row 0, field family: 1 is not the number of a family");
 }
 
+TEST(FamilyRefuses, aNumberThatTwoFamiliesHave) {
+    const Couple couple;
+    const Ids numbers{7, 8, 7}, partner{1, 2, 3};
+    FamilyColumns columns = couple.columns();
+    columns.families.number = std::span(numbers);
+    columns.families.partner0 = std::span(partner);
+    EXPECT_EQ(refusalOf(columns), "families row 2, field number: 7 is the number of another row");
+}
+
+// Lists of up to sixteen are looked through, longer ones sorted: the row is that of the first repeat in their own order.
+TEST(FamilyRefuses, aChildWhoStandsTwiceInOneFamilyInShortListsAndLongOnes) {
+    for (const std::int64_t size : {2, 16, 17, 40}) {
+        Ids ids, family, children;
+        for (std::int64_t id = 1; id <= size; ++id) {
+            ids.push_back(id);
+            family.push_back(1);
+            children.push_back(size + 1 - id);
+        }
+        children.back() = 2;  // the child at the place before, again
+        const Ids numbers{1};
+        FamilyColumns columns;
+        columns.persons.id = std::span(ids);
+        columns.families.number = std::span(numbers);
+        columns.familyChildren.family = std::span(family);
+        columns.familyChildren.child = std::span(children);
+        EXPECT_EQ(refusalOf(columns), "family children row " + std::to_string(size - 1) +
+                                          ", field child: 2 is in this family already");
+        children.back() = 1;
+        EXPECT_EQ(refusalOf(columns), "nothing is refused") << size;
+    }
+}
+
+TEST(FamilyRefuses, aFieldThatAPersonHasTwiceAndOneWithoutAKey) {
+    const Couple couple;
+    const Ids persons{2, 1, 2};
+    Texts keys{"job", "job", "job"};
+    const Texts texts{"smith", "smith", "baker"};
+    FamilyColumns columns = couple.columns();
+    columns.fields.person = std::span(persons);
+    columns.fields.key = std::span(keys);
+    columns.fields.text = std::span(texts);
+    EXPECT_EQ(refusalOf(columns), "fields row 2, field key: person 2 has this field already");
+    keys[2] = "";
+    EXPECT_EQ(refusalOf(columns), "fields row 2, field key: the key is empty");
+    keys[2] = "trade";
+    EXPECT_EQ(refusalOf(columns), "nothing is refused");
+}
+
+TEST(FamilyRefuses, moreDifferentKeysThanATableHolds) {
+    const Couple couple;
+    const std::size_t most = Family::kMostFieldKeys;
+    std::vector<std::string> names;
+    for (std::size_t i = 0; i <= most; ++i) names.push_back("key " + std::to_string(i));
+    const Ids persons(most + 1, 3);
+    Texts keys(names.begin(), names.end());
+    const Texts texts(most + 1, "x");
+    FamilyColumns columns = couple.columns();
+    columns.fields.person = std::span(persons);
+    columns.fields.key = std::span(keys);
+    columns.fields.text = std::span(texts);
+    EXPECT_EQ(refusalOf(columns),
+              "fields row " + std::to_string(most) + ", field key: there are too many different keys");
+}
+
 TEST(FamilyKin, familiesBecomeUnionsAndParentsWithoutOneToo) {
     Couple couple;
     couple.ids = {1, 2, 3, 4, 5};
