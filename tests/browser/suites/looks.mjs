@@ -164,6 +164,30 @@ describe("looks", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("on the narrowest phone every view can be read and chosen, in every language", async () => {
+        for (const locale of ["en-GB", "de-DE", "es-ES"]) {
+            const visit = await visitDarwins("#person=I1", {
+                ...kPhone,
+                viewport: { width: 320, height: 568 },
+                locale,
+            });
+            await visit.page.tap("#views-button");
+            const outside = await visit.page.evaluate(() => {
+                const panel = one("#views-panel").getBoundingClientRect();
+                const parts = all("#views-panel .view, #views-panel .view span");
+                return parts
+                    .filter((part) => {
+                        const { left, right } = part.getBoundingClientRect();
+                        return left < panel.left || right > panel.right - 8 || part.scrollWidth > part.clientWidth + 1;
+                    })
+                    .map((part) => part.textContent);
+            });
+            assert.deepEqual(outside, [], locale);
+            await photograph(visit, `narrow-views-${locale}`);
+            await visit.end();
+        }
+    });
+
     test("on a phone everything can be reached, and the panel is a sheet", async () => {
         const visit = await visitDarwins("#person=I1", kPhone);
         const { page } = visit;
