@@ -91,7 +91,7 @@ export class Walk {
     /** All boxes and lines of the picture, in sight or not, for a comparison between engines. */
     picture() {
         return this.window.evaluate(() => {
-            const { picture } = document.querySelector("olvane-tree");
+            const { picture } = document.querySelector("olvane-tree").viewer;
             const boxes = picture.boxes.map(({ key, x, y, width, height }) => [key, x, y, width, height].join(" "));
             const lines = picture.families.flatMap(({ family }) =>
                 family.lines.map(({ x1, y1, x2, y2 }) => [x1, y1, x2, y2].join(" ")),

@@ -323,8 +323,8 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
                       await page.waitForFunction(() => /Renamed/.test(document.querySelector("olvane-tree").saveSvg()));
                       await page.selectOption("select", "descendants");
                       return await page.evaluate(() => {
-                          const { state, picture } = document.querySelector("olvane-tree");
-                          return state.view === "descendants" ? String(picture.boxes.length) : state.view;
+                          const { state, viewer } = document.querySelector("olvane-tree");
+                          return state.view === "descendants" ? String(viewer.picture.boxes.length) : state.view;
                       });
                   } finally {
                       await page.close();
