@@ -68,11 +68,8 @@ void addLists(const kin::KinGraph& graph, const std::vector<std::int32_t>& local
     });
 }
 
-}  // namespace
-
-std::vector<Component> componentsOf(const kin::KinGraph& graph) {
-    const auto persons = static_cast<std::size_t>(graph.personCount());
-    Joined joined(persons);
+Joined joinedPersons(const kin::KinGraph& graph) {
+    Joined joined(static_cast<std::size_t>(graph.personCount()));
     for (kin::UnionPlace u = 0; u < graph.unionCount(); ++u) {
         const std::int32_t first = firstPartner(graph, u);
         for (const kin::Place partner : graph.partners(u)) {
@@ -80,6 +77,27 @@ std::vector<Component> componentsOf(const kin::KinGraph& graph) {
         }
         for (const kin::Place child : graph.children(u)) joined.join(first, child);
     }
+    return joined;
+}
+
+void addUnion(const kin::KinGraph& graph, const std::vector<std::int32_t>& local, kin::UnionPlace u,
+              Component& part) {
+    std::array<std::int32_t, 2> two = {-1, -1};
+    for (std::size_t side = 0; side < 2; ++side) {
+        const kin::Place partner = graph.partners(u)[side];
+        if (partner != kin::kNobody && (side == 0 || partner != graph.partners(u)[0])) {
+            two[side] = local[at(partner)];
+        }
+    }
+    part.unions.push_back(u);
+    part.partners.push_back(two);
+}
+
+}  // namespace
+
+std::vector<Component> componentsOf(const kin::KinGraph& graph) {
+    const auto persons = static_cast<std::size_t>(graph.personCount());
+    Joined joined = joinedPersons(graph);
     std::vector<Component> parts;
     std::vector<std::int32_t> partOf(persons);
     std::vector<std::int32_t> local(persons);
@@ -95,16 +113,7 @@ std::vector<Component> componentsOf(const kin::KinGraph& graph) {
         part.persons.push_back(person);
     }
     for (kin::UnionPlace u = 0; u < graph.unionCount(); ++u) {
-        Component& part = parts[at(partOf[at(firstPartner(graph, u))])];
-        std::array<std::int32_t, 2> two = {-1, -1};
-        for (std::size_t side = 0; side < 2; ++side) {
-            const kin::Place partner = graph.partners(u)[side];
-            if (partner != kin::kNobody && (side == 0 || partner != graph.partners(u)[0])) {
-                two[side] = local[at(partner)];
-            }
-        }
-        part.unions.push_back(u);
-        part.partners.push_back(two);
+        addUnion(graph, local, u, parts[at(partOf[at(firstPartner(graph, u))])]);
     }
     for (Component& part : parts) addLists(graph, local, part);
     kin::mergeSort(parts.begin(), parts.end(), [](const Component& a, const Component& b) {

@@ -172,40 +172,35 @@ void GapTracks::assignTracks() {
     for (std::size_t row = 0; row + 1 < start_.size(); ++row) bars_[row] = tracksOfRow(row);
 }
 
+// From left to right: each leftward bar below the one before that it meets, and those between its children below both;
+// then the same from the right.
 std::int32_t GapTracks::tracksOfRow(std::size_t row) {
+    const std::int32_t leftward = setTracks(row, false);
+    return std::max(leftward, setTracks(row, true));
+}
+
+// Seen from the other side, places have the other sign.
+std::int32_t GapTracks::setTracks(std::size_t row, bool fromRight) {
     constexpr double kFar = std::numeric_limits<double>::infinity();
-    const auto isDrawn = [](const Span& span) { return span.from <= span.to; };
     std::int32_t most = 0;
     const auto set = [this, &most](const Span& span, std::int32_t track) {
         PlannedFamily& family = plan_.families[at(span.family)];
         family.track = static_cast<std::uint16_t>(std::max<std::int32_t>(family.track, track));
         most = std::max<std::int32_t>(most, family.track + 1);
     };
-    // From left to right: each leftward bar below the one before that it meets, and those between its children
-    // below both; then the same from the right.
     double reach = -kFar;
     std::int32_t track = -1;
-    for (std::size_t i = start_[row]; i < start_[row + 1]; ++i) {
-        const Span& span = spans_[i];
-        if (!isDrawn(span) || span.drop < span.from) continue;
-        const bool meets = reach + kMargin > span.from;
-        if (span.drop > span.to) {
+    const std::size_t count = start_[row + 1] - start_[row];
+    for (std::size_t i = 0; i < count; ++i) {
+        const Span& span = spans_[fromRight ? start_[row + 1] - 1 - i : start_[row] + i];
+        const double from = fromRight ? -span.to : span.from;
+        const double to = fromRight ? -span.from : span.to;
+        const double drop = fromRight ? -span.drop : span.drop;
+        if (!(from <= to) || drop < from) continue;
+        const bool meets = reach + kMargin > from;
+        if (drop > to) {
             track = meets ? track + 1 : 0;
-            reach = span.drop;
-            set(span, track);
-        } else {
-            set(span, meets ? track + 1 : 0);
-        }
-    }
-    reach = kFar;
-    track = -1;
-    for (std::size_t i = start_[row + 1]; i-- > start_[row];) {
-        const Span& span = spans_[i];
-        if (!isDrawn(span) || span.drop > span.to) continue;
-        const bool meets = reach - kMargin < span.to;
-        if (span.drop < span.from) {
-            track = meets ? track + 1 : 0;
-            reach = span.drop;
+            reach = drop;
             set(span, track);
         } else {
             set(span, meets ? track + 1 : 0);

@@ -71,6 +71,7 @@ private:
     void take(const Candidate& candidate);
     std::int8_t shiftFor(const Candidate& candidate) const;
     std::int32_t tracksOfRow(std::size_t row);
+    std::int32_t setTracks(std::size_t row, bool fromRight);
 
     Plan& plan_;
     std::int32_t firstRow_ = 0;

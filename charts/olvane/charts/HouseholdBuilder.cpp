@@ -156,50 +156,54 @@ void HouseholdBuilder::joinCouples(const std::vector<Joined>& side) {
 }
 
 // Lines over the boxes leave the top of the inner partner side by side, the farthest nearest to its centre. The
-// farthest of too many get a mark instead. A line lies one track above all those that it passes over: these
-// begin at the same box or farther out, and end before it does.
+// farthest of too many get a mark instead.
 void HouseholdBuilder::chooseOverLines(const std::vector<Joined>& side) {
     PlannedFamily* const own = families_.data() + (families_.size() - side.size());
-    const auto fromOf = [this, &side](std::size_t i) { return plan_.boxOf[at(side[i].from)]; };
     counts_.assign(plan_.persons.size() - at(firstBox_), 0);
     for (std::size_t i = 0; i < side.size(); ++i) {
         if (own[i].coupleLine != CoupleLine::over) continue;
-        int& lines = counts_[at(fromOf(i) - firstBox_)];
-        if (lines < linesThatFit(widthOf(fromOf(i)) / 2 - kLeastLineGap)) {
+        const Index from = plan_.boxOf[at(side[i].from)];
+        int& lines = counts_[at(from - firstBox_)];
+        if (lines < linesThatFit(widthOf(from) / 2 - kLeastLineGap)) {
             own[i].overHeight = static_cast<std::uint16_t>(++lines);
         } else {
-            own[i].coupleLine = CoupleLine::alone;
-            own[i].partnersMarked = true;
+            standAlone(own[i]);
         }
     }
     covered_.clear();
     for (std::size_t i = 0; i < side.size(); ++i) {
-        PlannedFamily& family = own[i];
-        if (family.coupleLine != CoupleLine::over) continue;
-        const Index from = fromOf(i);
-        const bool leftwards = family.holder < from;
-        const float room = widthOf(from) / 2 - kLeastLineGap;
-        const int lines = counts_[at(from - firstBox_)] + 1;
-        const float depart =
-            kLeastLineGap + room * static_cast<float>(lines - family.overHeight) / static_cast<float>(lines);
-        family.departX = leftwards ? -depart : depart;
-        std::uint16_t below = 0;
-        while (!covered_.empty() &&
-               (leftwards ? covered_.back().first <= from : covered_.back().first >= from)) {
-            below = std::max(below, covered_.back().second);
-            covered_.pop_back();
-        }
-        if (below == kMostOverHeight) {
-            family.coupleLine = CoupleLine::alone;
-            family.partnersMarked = true;
-            covered_.emplace_back(from, below);
-            continue;
-        }
-        family.overHeight = static_cast<std::uint16_t>(below + 1);
-        covered_.emplace_back(from, family.overHeight);
-        for (Index box = std::min(from, family.holder) + 1; box < std::max(from, family.holder); ++box) {
-            plan_.isCovered[at(box)] = true;
-        }
+        if (own[i].coupleLine == CoupleLine::over) placeOverLine(own[i], plan_.boxOf[at(side[i].from)]);
+    }
+}
+
+void HouseholdBuilder::standAlone(PlannedFamily& family) {
+    family.coupleLine = CoupleLine::alone;
+    family.partnersMarked = true;
+}
+
+// A line lies one track above all those that it passes over: these begin at the same box or farther out, and end
+// before it does.
+void HouseholdBuilder::placeOverLine(PlannedFamily& family, Index from) {
+    const bool leftwards = family.holder < from;
+    const float room = widthOf(from) / 2 - kLeastLineGap;
+    const int lines = counts_[at(from - firstBox_)] + 1;
+    const float depart =
+        kLeastLineGap + room * static_cast<float>(lines - family.overHeight) / static_cast<float>(lines);
+    family.departX = leftwards ? -depart : depart;
+    std::uint16_t below = 0;
+    while (!covered_.empty() && (leftwards ? covered_.back().first <= from : covered_.back().first >= from)) {
+        below = std::max(below, covered_.back().second);
+        covered_.pop_back();
+    }
+    if (below == kMostOverHeight) {
+        standAlone(family);
+        covered_.emplace_back(from, below);
+        return;
+    }
+    family.overHeight = static_cast<std::uint16_t>(below + 1);
+    covered_.emplace_back(from, family.overHeight);
+    for (Index box = std::min(from, family.holder) + 1; box < std::max(from, family.holder); ++box) {
+        plan_.isCovered[at(box)] = true;
     }
 }
 

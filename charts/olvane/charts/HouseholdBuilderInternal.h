@@ -47,6 +47,8 @@ private:
     void placeBoxes(kin::Place lead);
     void joinCouples(const std::vector<Joined>& side);
     void chooseOverLines(const std::vector<Joined>& side);
+    static void standAlone(PlannedFamily& family);
+    void placeOverLine(PlannedFamily& family, Index from);
     void addFamiliesAlone(Index box);
     void placeDrops();
     void placeDropAlone(PlannedFamily& family, int count, int order) const;

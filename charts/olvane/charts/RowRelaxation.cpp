@@ -73,45 +73,58 @@ void RowRelaxation::placeRow(std::size_t row, Pull pull) {
     blocks_.clear();
     double offset = 0;  // of the household from the first of its row, if all stood side by side
     for (std::size_t i = rowStart_[row]; i < rowStart_[row + 1]; ++i) {
-        const Index h = byRow_[i];
-        const Household& household = plan_.households[at(h)];
-        double sum = 0;
-        double weight = 0;
-        if (household.treeParent != kNone &&
-            pull != (household.isAbove ? Pull::fromAbove : Pull::fromBelow)) {
-            sum += plan_.households[at(household.treeParent)].x + toParent_[at(h)];
+        Block block = blockOf(byRow_[i], pull);
+        block.weighted -= offset * block.weight;
+        addBlock(block);
+        offset += plan_.households[at(byRow_[i])].width + gap_;
+    }
+    placeBlocks(row, offset - gap_);
+}
+
+// A household alone, where its neighbours draw it.
+RowRelaxation::Block RowRelaxation::blockOf(Index h, Pull pull) const {
+    const Household& household = plan_.households[at(h)];
+    double sum = 0;
+    double weight = 0;
+    if (household.treeParent != kNone && pull != (household.isAbove ? Pull::fromAbove : Pull::fromBelow)) {
+        sum += plan_.households[at(household.treeParent)].x + toParent_[at(h)];
+        weight += 1;
+    }
+    const auto pullFrom = [&](Index first, Index end) {
+        for (Index child = first; child < end; ++child) {
+            if (plan_.households[at(child)].treeParent != h) continue;
+            sum += plan_.households[at(child)].x - toParent_[at(child)];
             weight += 1;
         }
-        const auto pullFrom = [&](Index first, Index end) {
-            for (Index child = first; child < end; ++child) {
-                if (plan_.households[at(child)].treeParent != h) continue;
-                sum += plan_.households[at(child)].x - toParent_[at(child)];
-                weight += 1;
-            }
-        };
-        if (pull != Pull::fromAbove) pullFrom(household.downFirst, household.downEnd);
-        if (pull != Pull::fromBelow) pullFrom(household.upFirst, household.upEnd);
-        if (weight == 0) {
-            weight = kWeightOfUnlinked;
-            sum = household.x * weight;
-        }
-        blocks_.push_back({sum - offset * weight, weight, 1});
-        offset += household.width + gap_;
-        while (blocks_.size() > 1) {
-            const Block last = blocks_.back();
-            Block& before = blocks_[blocks_.size() - 2];
-            if (before.weighted * last.weight <= last.weighted * before.weight) break;
-            before.weighted += last.weighted;
-            before.weight += last.weight;
-            before.count += last.count;
-            blocks_.pop_back();
-        }
+    };
+    if (pull != Pull::fromAbove) pullFrom(household.downFirst, household.downEnd);
+    if (pull != Pull::fromBelow) pullFrom(household.upFirst, household.upEnd);
+    if (weight == 0) {
+        weight = kWeightOfUnlinked;
+        sum = household.x * weight;
     }
-    const double total = offset;
+    return {sum, weight, 1};
+}
+
+// At the end of the row; blocks that would overlap become one.
+void RowRelaxation::addBlock(const Block& block) {
+    blocks_.push_back(block);
+    while (blocks_.size() > 1) {
+        const Block last = blocks_.back();
+        Block& before = blocks_[blocks_.size() - 2];
+        if (before.weighted * last.weight <= last.weighted * before.weight) break;
+        before.weighted += last.weighted;
+        before.weight += last.weight;
+        before.count += last.count;
+        blocks_.pop_back();
+    }
+}
+
+void RowRelaxation::placeBlocks(std::size_t row, double rowWidth) {
     std::size_t i = rowStart_[row];
-    offset = 0;
+    double offset = 0;
     for (const Block& block : blocks_) {
-        const double x = std::max(std::min(block.weighted / block.weight, most_ - (total - gap_)), least_);
+        const double x = std::max(std::min(block.weighted / block.weight, most_ - rowWidth), least_);
         for (std::size_t k = 0; k < block.count; ++k, ++i) {
             Household& household = plan_.households[at(byRow_[i])];
             household.x = x + offset;

@@ -41,6 +41,9 @@ private:
     void sortIntoRows(const std::vector<Index>& order);
     void measureLinks();
     void placeRow(std::size_t row, Pull pull);
+    Block blockOf(Index household, Pull pull) const;
+    void addBlock(const Block& block);
+    void placeBlocks(std::size_t row, double rowWidth);
     void setBounds();
     void snap();
     void straighten(std::size_t row, bool above);

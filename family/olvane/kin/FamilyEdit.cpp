@@ -167,47 +167,58 @@ void FamilyEdit::tidy() noexcept {
     }
 }
 
-Family::State* FamilyEdit::tidied() const {
-    auto smaller = std::make_unique<Family::State>();
-    const Family::State& old = state();
-    detail::BlobStore& blobs = smaller->blobs;
-    const auto movedText = [&](Reference& text) { text = blobs.add(old.blobs.text(text)); };
-    const auto movedDate = [&](Reference& sorting, Reference& written) {
+namespace {
+
+// What is moved from one table's texts and lists to another's.
+struct BlobMove {
+    const detail::BlobStore& from;
+    detail::BlobStore& to;
+
+    void text(Reference& text) const { text = to.add(from.text(text)); }
+    void list(Reference& list) const { list = to.add(from.list(list)); }
+    void date(Reference& sorting, Reference& written) const {
         const bool isOne = sorting == written;
-        movedText(sorting);
+        text(sorting);
         if (isOne) {
             written = sorting;
         } else {
-            movedText(written);
+            text(written);
         }
-    };
-    const auto movedList = [&](Reference& list) { list = blobs.add(old.blobs.list(list)); };
+    }
+};
+
+}  // namespace
+
+Family::State* FamilyEdit::tidied() const {
+    auto smaller = std::make_unique<Family::State>();
+    const Family::State& old = state();
+    const BlobMove move{old.blobs, smaller->blobs};
     for (std::size_t row = 0; row < old.persons.size(); ++row) {
         StoredPerson person = old.persons[row];
         if (person.id == 0) continue;
-        movedDate(person.birth, person.birthWritten);
-        movedDate(person.death, person.deathWritten);
-        movedText(person.names);
-        movedText(person.fields);
-        movedList(person.spouses);
-        movedList(person.children);
+        move.date(person.birth, person.birthWritten);
+        move.date(person.death, person.deathWritten);
+        move.text(person.names);
+        move.text(person.fields);
+        move.list(person.spouses);
+        move.list(person.children);
         smaller->personIndex.add(person.id);
         smaller->persons.add(person);
     }
     for (std::size_t row = 0; row < old.families.size(); ++row) {
         StoredFamily family = old.families[row];
         if (family.number == 0) continue;
-        movedDate(family.marriage, family.marriageWritten);
-        movedText(family.marriagePlace);
-        movedText(family.kinds);
-        movedList(family.children);
+        move.date(family.marriage, family.marriageWritten);
+        move.text(family.marriagePlace);
+        move.text(family.kinds);
+        move.list(family.children);
         smaller->familyIndex.add(family.number);
         smaller->families.add(family);
     }
     smaller->fieldKeys = old.fieldKeys;
     smaller->personCount = old.personCount;
     smaller->familyCount = old.familyCount;
-    smaller->tidyWords = blobs.addedWords();
+    smaller->tidyWords = smaller->blobs.addedWords();
     return smaller.release();
 }
 

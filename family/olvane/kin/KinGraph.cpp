@@ -106,12 +106,17 @@ void KinGraphBuilder::checkPerson(Place person) const {
 }
 
 KinGraph KinGraphBuilder::build() {
-    KinGraph graph = std::move(graph_);
-    const std::vector<Child> children = std::exchange(children_, {});
-    const std::size_t persons = graph.ids_.size();
-    const std::size_t unions = graph.partners_.size();
+    listChildren();
+    listUnions();
+    orderUnions();
+    plainIds_ = true;
+    return std::exchange(graph_, KinGraph());
+}
 
-    // Children by union, each child once.
+// Children by union, each child once.
+void KinGraphBuilder::listChildren() {
+    const std::vector<Child> children = std::exchange(children_, {});
+    const std::size_t unions = graph_.partners_.size();
     std::vector<std::int32_t> entries;
     fillLists(
         unions,
@@ -120,23 +125,27 @@ KinGraph KinGraphBuilder::build() {
                 add(children[i].u, static_cast<std::int32_t>(i));
             }
         },
-        graph.childStart_, entries);
-    std::vector<UnionPlace> lastUnionOf(persons, -1);
+        graph_.childStart_, entries);
+    std::vector<UnionPlace> lastUnionOf(graph_.ids_.size(), -1);
     std::vector<std::uint32_t> start{0};
     start.reserve(unions + 1);
     for (std::size_t u = 0; u < unions; ++u) {
-        for (std::uint32_t i = graph.childStart_[u]; i < graph.childStart_[u + 1]; ++i) {
+        for (std::uint32_t i = graph_.childStart_[u]; i < graph_.childStart_[u + 1]; ++i) {
             const Child& entry = children[at(entries[i])];
             if (std::exchange(lastUnionOf[at(entry.child)], entry.u) == entry.u) continue;
-            graph.children_.push_back(entry.child);
-            graph.childKinds_.push_back(entry.kind);
+            graph_.children_.push_back(entry.child);
+            graph_.childKinds_.push_back(entry.kind);
         }
-        start.push_back(static_cast<std::uint32_t>(graph.children_.size()));
+        start.push_back(static_cast<std::uint32_t>(graph_.children_.size()));
     }
-    graph.childStart_ = std::move(start);
+    graph_.childStart_ = std::move(start);
+}
 
+// Unions by partner and by child, in the order in which they were added.
+void KinGraphBuilder::listUnions() {
+    const KinGraph& graph = graph_;
     fillLists(
-        persons,
+        graph.ids_.size(),
         [&graph](auto&& add) {
             for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
                 const auto& two = graph.partners(u);
@@ -144,26 +153,26 @@ KinGraph KinGraphBuilder::build() {
                 if (two[1] != kNobody && two[1] != two[0]) add(two[1], u);
             }
         },
-        graph.partnerStart_, graph.asPartner_);
+        graph_.partnerStart_, graph_.asPartner_);
     fillLists(
-        persons,
+        graph.ids_.size(),
         [&graph](auto&& add) {
             for (UnionPlace u = 0; u < graph.unionCount(); ++u) {
                 for (const Place child : graph.children(u)) add(child, u);
             }
         },
-        graph.parentStart_, graph.asChild_);
+        graph_.parentStart_, graph_.asChild_);
+}
+
+void KinGraphBuilder::orderUnions() {
     for (const auto& [person, order] : std::exchange(partnerOrder_, {})) {
-        putFirst(graph.asPartner_.data() + graph.partnerStart_[at(person)],
-                 graph.asPartner_.data() + graph.partnerStart_[at(person) + 1], order);
+        putFirst(graph_.asPartner_.data() + graph_.partnerStart_[at(person)],
+                 graph_.asPartner_.data() + graph_.partnerStart_[at(person) + 1], order);
     }
     for (const auto& [person, order] : std::exchange(childOrder_, {})) {
-        putFirst(graph.asChild_.data() + graph.parentStart_[at(person)],
-                 graph.asChild_.data() + graph.parentStart_[at(person) + 1], order);
+        putFirst(graph_.asChild_.data() + graph_.parentStart_[at(person)],
+                 graph_.asChild_.data() + graph_.parentStart_[at(person) + 1], order);
     }
-    graph_ = KinGraph();
-    plainIds_ = true;
-    return graph;
 }
 
 }  // namespace olvane::kin

@@ -133,6 +133,9 @@ private:
     };
 
     void checkPerson(Place person) const;
+    void listChildren();
+    void listUnions();
+    void orderUnions();
 
     KinGraph graph_;
     bool plainIds_ = true;
