@@ -43,7 +43,7 @@ private:
         return builder_.addPerson(count_, below(2) == 0 ? olvane::kin::Sex::male : olvane::kin::Sex::female);
     }
 
-    // Everybody who is not yet married takes somebody up to twelve places further along the road.
+    // Everybody who is not yet married takes somebody up to twelve places further along the street.
     void pairOff(const std::vector<Place>& generation, std::vector<Place>& next) {
         const double wanted = static_cast<double>(generationSize_);
         std::vector<std::uint8_t> married(generation.size(), 0);

@@ -410,7 +410,7 @@ void holdHidden(const GedcomData& data, const GedcomData& again, const std::vect
     }
 }
 
-// Every so many-th person, the first one included.
+// Every n-th person, the first one included.
 void writeHidden(const GedcomData& data, std::size_t step) {
     WriteOptions options;
     options.hiddenName = kHiddenName;

@@ -19,7 +19,7 @@ public:
     std::string make_option_desc(const CLI::Option* option) const override;
 };
 
-// A text in lines of at most so many bytes, broken at spaces. A word that is longer stands in a line of its own.
+// A text in lines of at most `width` bytes, broken at spaces. A word that is longer stands in a line of its own.
 std::string wrappedText(const std::string& text, std::size_t width);
 
 }  // namespace olvane::cli

@@ -19,7 +19,7 @@ public:
     explicit MediaFiles(const std::string& gedcomPath);
 
     // file is as the GEDCOM file has it: a relative path, one with backslashes, a file: address. Nothing for what does not
-    // exist, lies elsewhere, is no regular file or larger than so many bytes.
+    // exist, lies elsewhere, is no regular file or larger than that limit.
     // Fails: throws GedcomError for a damaged archive.
     std::optional<std::string> bytesOf(std::string_view file, std::size_t mostBytes) const;
 

@@ -35,7 +35,7 @@ namespace {
 constexpr std::size_t kMostBytes = std::size_t{64} << 20;
 // People do not open a page with more than this in it; a program reads the file itself.
 constexpr std::size_t kMostPersons = 200000;
-// Larger pages are slow to send and to open, so whoever writes one should know.
+// Larger pages are slow to send and to open, so the message says it to the person who writes one.
 constexpr std::size_t kLargePage = std::size_t{20} << 20;
 constexpr std::size_t kNamedFiles = 5;
 

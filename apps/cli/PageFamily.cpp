@@ -105,7 +105,7 @@ std::string familyBlock(const PageFamily& family) {
            "</script>";
 }
 
-// At the page's end: whoever has a page that was cut short still has all else of it. The best compression
+// At the page's end: in a page that was cut short all else is still there. The best compression
 // takes ten times as long, for a hundredth of the size.
 std::string mapBlock(const PageFamily& family) {
     return "<script type=\"application/octet-stream\" id=\"olvane-map\">" +

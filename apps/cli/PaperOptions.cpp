@@ -70,7 +70,7 @@ void addPaperOptions(CLI::App& command, PaperOptions& options) {
     command
         .add_option(
             "--sheets", options.sheets,
-            "On so many sheets of the paper, with strips to glue them by. A .pdf holds them all; other "
+            "On that many sheets of the paper, with strips to glue them by. A .pdf holds them all; other "
             "forms become OUT-1, OUT-2 and so on")
         ->check(complaintOfSheets)
         ->type_name("ROWSxCOLUMNS")
@@ -94,7 +94,8 @@ void checkPaperOptions(const PaperOptions& options, const std::string& output) {
         throw UsageError("--sheets changes nothing without --fit, which says what paper");
     }
     if (!options.sheets.empty() && options.scale > 0) {
-        throw UsageError("--sheets and --scale: either so many sheets, or as many as that scale takes");
+        throw UsageError(
+            "--sheets and --scale exclude each other: a scale decides how many sheets there are");
     }
     if (options.dpi > 0 && !output.ends_with(".png") && !output.ends_with(".PNG")) {
         throw UsageError("--dpi is for .png; .svg and .pdf have no pixels");

@@ -7,7 +7,7 @@
 
 namespace olvane::cli {
 
-// The same PDF with every page so many times as large: its unit is a multiple of a point (ISO 32000-1, 7.7.3.3,
+// The same PDF with every page larger by that factor: its unit is a multiple of a point (ISO 32000-1, 7.7.3.3,
 // UserUnit, of version 1.6), which is how pages beyond 14,400 points are written. Appended as an update, so that no
 // offset changes.
 //

@@ -28,7 +28,7 @@ void requireFonts(const std::vector<draw::SvgPicture>& pictures);
 // The pixels that a PNG has for each px: as many as wanted, or fewer where a side would be too long.
 double pngScale(const draw::SvgPicture& picture, double wanted);
 
-// A PNG of so many pixels for each px; smaller where a side would be too long.
+// A PNG of `scale` pixels for each px; smaller where a side would be too long.
 std::string pngOf(const draw::SvgPicture& picture, double scale);
 
 // A PDF with one page for each picture, of its size at 96 px an inch times scale, in vectors and with its text as

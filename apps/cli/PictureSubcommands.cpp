@@ -127,7 +127,7 @@ void CommandLine::addPageContents() {
         page_
             ->add_option(
                 "--photos", pageOptions_.photoSize,
-                "Put photographs into the page, scaled down to so many pixels on the longer side: those "
+                "Put photographs into the page, scaled down to SIZE pixels on the longer side: those "
                 "in the .gdz archive, or in the folder of the file and below it")
             ->check(wholeNumber(16, 4096))
             ->type_name("SIZE")

@@ -8,7 +8,7 @@
 
 namespace olvane::cli {
 
-// A photograph, JPEG, PNG, GIF, TIFF, BMP or WebP, as a JPEG whose longer side has at most so many pixels, turned as its
+// A photograph, JPEG, PNG, GIF, TIFF, BMP or WebP, as a JPEG whose longer side has at most longestSide pixels, turned as its
 // camera was held, on white where it was transparent. Nothing else of the file is in it: no place, time or name.
 //
 // Holds: a picture of more than 200 million pixels is not unpacked.

@@ -13,7 +13,7 @@ namespace olvane::cli {
 // How far long work is, in one line of stderr that is rewritten in place and removed at the end. On a terminal alone,
 // and not in the first half second, so that quick work prints nothing.
 //
-// Holds: for one thread. Whoever prints a message meanwhile calls clear first.
+// Holds: for one thread. Before a message is printed, clear is called.
 class TerminalProgress {
 public:
     TerminalProgress();

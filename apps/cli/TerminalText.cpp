@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A file's text must not steer the terminal of whoever reads about it.
+// A file's text must not steer the terminal of the person who reads about it.
 
 #include <cli/TerminalText.h>
 

@@ -130,7 +130,7 @@ const parts = {
     parts: lettersOf(packedLzma(Buffer.concat(whole))),
     start,
 };
-// Whose work is inside, for whoever reads the page's source. Two hyphens would be odd in a comment.
+// Whose work is inside, for readers of the page's source. Two hyphens would be odd in a comment.
 parts.notices = (await readFile(here("notices.txt"), "utf8")).trimEnd().replace(/-{2,}/g, "==");
 const template = await readFile(here("src/page.html"), "utf8");
 const page = template.replace(/\{\{(\w+)\}\}/g, (_, name) => parts[name]);

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// serve_borders ROAD SHAPE SIZE: serve_layouts for the roads of C++ and C: for each line with a number on its input it
+// serve_borders INTERFACE SHAPE SIZE: serve_layouts for the interfaces of C++ and C: for each line with a number on its input it
 // lays out that many times and answers with a line: the milliseconds of each layout, and behind a bar the persons shown.
 //
-//   cpp host text    the eight questions of a data source in memory; the road that the others are held against
+//   cpp host text    the eight questions of a data source in memory; the interface that the others are held against
 //   cpp table text   the table of the same family
 //   cpp table typed  boxes and lines as values, without text
 //   c host text      eight callbacks in C
@@ -30,7 +30,7 @@
 
 namespace {
 
-typedef std::function<std::size_t()> Road;  // one layout; the length of its result
+typedef std::function<std::size_t()> Interface;  // one layout; the length of its result
 
 olvane::Family tableOf(const bench::MadeColumns& made) {
     olvane::FamilyColumns columns;
@@ -45,7 +45,7 @@ olvane::Family tableOf(const bench::MadeColumns& made) {
     return olvane::Family(columns);
 }
 
-Road cppTable(const bench::MadeLayout& layout, const bench::MadeColumns& columns, bool typed) {
+Interface cppTable(const bench::MadeLayout& layout, const bench::MadeColumns& columns, bool typed) {
     const std::shared_ptr<OlvaneViewerManagerWrapProtocol> source =
         std::make_shared<olvane::FamilyDataSource>(tableOf(columns));
     if (!typed) return [source, &layout] { return layout.textFrom(source).size(); };
@@ -104,7 +104,7 @@ olvane_host hostOf(bench::MadeFamily& family) {
     return host;
 }
 
-Road cHost(const bench::MadeFamily& made) {
+Interface cHost(const bench::MadeFamily& made) {
     const auto family = std::make_shared<bench::MadeFamily>(made);
     return [family] {
         const olvane_host host = hostOf(*family);
@@ -114,7 +114,7 @@ Road cHost(const bench::MadeFamily& made) {
     };
 }
 
-Road cTable(const bench::MadeColumns& made) {
+Interface cTable(const bench::MadeColumns& made) {
     olvane_family_columns columns = {};
     const auto numbers = [](const std::vector<std::int64_t>& column) {
         return olvane_numbers{column.data(), column.size(), OLVANE_INT64};
@@ -138,13 +138,13 @@ Road cTable(const bench::MadeColumns& made) {
     };
 }
 
-void serve(const Road& road, std::size_t persons) {
+void serve(const Interface& interface, std::size_t persons) {
     std::cout << "ready" << std::endl;
     std::size_t length = 0;
     for (int layouts = 0; std::cin >> layouts;) {
         for (int i = 0; i < layouts; ++i) {
             const auto start = std::chrono::steady_clock::now();
-            length += road();
+            length += interface();
             const auto taken = std::chrono::steady_clock::now() - start;
             std::cout << std::chrono::duration<double, std::milli>(taken).count() << ' ';
         }
@@ -161,21 +161,21 @@ int main(int argc, char** argv) {
         return 2;
     }
     try {
-        const std::string road = argv[1];
+        const std::string interface = argv[1];
         const bench::MadeFamily family = bench::madeFamily(argv[2], std::atoi(argv[3]));
         const bench::MadeLayout layout(argv[2], std::atoi(argv[3]));
         const bench::MadeColumns columns(family);
         const std::size_t persons = bench::shownPersons(layout.text());
-        if (road == "cpp host text") {
+        if (interface == "cpp host text") {
             serve([&layout] { return layout.text().size(); }, persons);
-        } else if (road == "cpp table text" || road == "cpp table typed") {
-            serve(cppTable(layout, columns, road == "cpp table typed"), persons);
-        } else if (road == "c host text") {
+        } else if (interface == "cpp table text" || interface == "cpp table typed") {
+            serve(cppTable(layout, columns, interface == "cpp table typed"), persons);
+        } else if (interface == "c host text") {
             serve(cHost(family), persons);
-        } else if (road == "c table text") {
+        } else if (interface == "c table text") {
             serve(cTable(columns), persons);
         } else {
-            throw std::invalid_argument("no such road: " + road);
+            throw std::invalid_argument("no such interface: " + interface);
         }
     } catch (const std::exception& error) {
         std::cerr << "serve_borders: " << error.what() << "\n";

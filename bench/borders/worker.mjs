@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// node worker.mjs ROAD SHAPE SIZE: serve_borders for JavaScript. OLVANE_WASM names the module.
+// node worker.mjs INTERFACE SHAPE SIZE: serve_borders for JavaScript. OLVANE_WASM names the module.
 //
 //   javascript host text, javascript host typed      eight functions
 //   javascript table text, javascript table typed    the table; typed are the records
@@ -12,7 +12,7 @@ import { createInterface } from 'node:readline';
 import { loadOlvane } from '../../bindings/javascript/olvane.mjs';
 import { makeFamily } from '../peers/families.mjs';
 
-const [road, shape, size] = process.argv.slice(2);
+const [chosen, shape, size] = process.argv.slice(2);
 const olvane = await loadOlvane(await readFile(process.env.OLVANE_WASM));
 const persons = makeFamily(shape, Number(size));
 
@@ -35,8 +35,8 @@ function table() {
   });
 }
 
-const family = road.includes('table') ? table() : new Host();
-const isText = road.endsWith('text');
+const family = chosen.includes('table') ? table() : new Host();
+const isText = chosen.endsWith('text');
 const layOut = isText ? () => olvane.layoutText(family, 1) : () => olvane.layout(family, 1);
 
 function shown() {

@@ -1,6 +1,6 @@
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
-"""worker.py ROAD LAYOUTS: serve_borders for Python, of the family that print_family printed on the file LAYOUTS.
+"""worker.py INTERFACE LAYOUTS: serve_borders for Python, of the family that print_family printed on the file LAYOUTS.
 
 python host text, python host typed      eight methods
 python table text, python table typed    the table; typed are the records
@@ -64,11 +64,13 @@ class Host:
 
 
 def main() -> None:
-    road, lines = sys.argv[1:]
+    interface, lines = sys.argv[1:]
     with open(lines, encoding="utf-8") as file:
         host = Host(file.readlines())
-    family = host.table() if "table" in road else host
-    lay_out = {"text": olvane.layout_text, "typed": olvane.layout, "lazily": olvane.family_layout}[road.split()[-1]]
+    family = host.table() if "table" in interface else host
+    lay_out = {"text": olvane.layout_text, "typed": olvane.layout, "lazily": olvane.family_layout}[
+        interface.split()[-1]
+    ]
     print("ready", flush=True)
     for line in sys.stdin:
         times = []

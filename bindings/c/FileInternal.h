@@ -29,7 +29,7 @@ struct olvane_file {
         return person >= 1 && person <= static_cast<std::int64_t>(data.personCount());
     }
 
-    // Whoever may be living in a year, 0 for the present one: an entry for each person.
+    // Who may be living in a year, 0 for the present one: an entry for each person.
     std::vector<bool> living(int year) const;
 
     const olvane::gedcom::GedcomData data;

@@ -42,7 +42,7 @@ constexpr bool isOneOf(std::int32_t number, std::int32_t count) {
 }
 
 // The request that the options of a picture ask for, but for focus, other and earlier picture, and the folds and sizes that it refers to.
-// A number of no enumeration stays one, so that whoever checks the request refuses it.
+// A number of no enumeration stays one, so that the check of the request refuses it.
 struct AskedView {
     explicit AskedView(const olvane_picture_options& options);
     AskedView(const AskedView&) = delete;

@@ -13,7 +13,7 @@
  *     if (status == OLVANE_OK) draw(layout);
  *     olvane_layout_free(layout);
  *
- * Ownership: a layout belongs to whoever asked for it. Texts and records that it hands out belong to the
+ * Ownership: a layout belongs to the caller. Texts and records that it hands out belong to the
  *     layout and live as long as it does. Everything that the host passes in stays the host's; nothing of it
  *     is kept.
  * Threads: layouts may run on several threads at once if their hosts' data can be read so. Callbacks run on

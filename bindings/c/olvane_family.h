@@ -269,7 +269,7 @@ OLVANE_C_API olvane_status olvane_family_family(const olvane_family* family, int
                                                 int64_t* partner0, int64_t* partner1, int32_t* state,
                                                 olvane_text* marriage, olvane_text* marriage_written,
                                                 olvane_text* marriage_place);
-/* count is set to the number of children; so many are written as there is room for. */
+/* count is set to the number of children; no more are written than there is room for. */
 OLVANE_C_API olvane_status olvane_family_family_children(const olvane_family* family, int64_t number,
                                                          olvane_family_child* children, size_t room,
                                                          size_t* count);

@@ -21,7 +21,7 @@
  *     file's own identifier ("I17", "@I17@"), or a name that means one person.
  * Results: every call that sets an olvane_result sets it to what was asked for, or after a failure to a sentence in
  *     English that says what is wrong; to null where there is no memory. The caller frees it.
- * Ownership: files and results belong to whoever asked for them. Everything that is passed in is copied or read.
+ * Ownership: files and results belong to the caller. Everything that is passed in is copied or read.
  * Threads: any number may ask one file.
  */
 
@@ -101,12 +101,11 @@ typedef struct olvane_draw_options {
     const char* title;       /* stands above the picture; none by default */
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
     int32_t dates;           /* 1 for dates as a file writes them, instead of years */
-    int32_t places;     /* 1 for places of birth and death; of a file that was read with OLVANE_READ_FACTS */
-    int32_t occupation; /* 1 for the first occupation; of a file that was read with OLVANE_READ_FACTS */
-    int32_t marriage;   /* 1 for the year at each line of a marriage */
-    int32_t
-        hide_living; /* of a file: 1 to state nothing of whoever may be living, as "olvane draw --hide-living" */
-    int32_t year;    /* the year that hide_living counts from; the present one by default */
+    int32_t places;      /* 1 for places of birth and death; of a file that was read with OLVANE_READ_FACTS */
+    int32_t occupation;  /* 1 for the first occupation; of a file that was read with OLVANE_READ_FACTS */
+    int32_t marriage;    /* 1 for the year at each line of a marriage */
+    int32_t hide_living; /* of a file: 1 to hide everyone who may be living, as "olvane draw --hide-living" */
+    int32_t year;        /* the year that hide_living counts from; the present one by default */
 } olvane_draw_options;
 
 /* Opens a file, draws a person of it, and closes it: the picture that "olvane draw" makes. options may be null. */

@@ -15,7 +15,7 @@
  *     olvane_picture_free(picture);
  *
  * Units: points; x grows right, y grows down. Places in an array count from 0, and OLVANE_NO_PLACE is nowhere.
- * Ownership: a picture belongs to whoever asked for it and needs neither the layout nor the family any more. Its arrays
+ * Ownership: a picture belongs to the caller and needs neither the layout nor the family any more. Its arrays
  *     live as long as it does.
  * Threads: a picture never changes, so several threads may read one.
  */
@@ -231,20 +231,20 @@ typedef struct olvane_picture_options {
     int32_t effort;          /* everybody: 0 to 100 */
     int32_t all_parts;       /* everybody: 1 for those as well who are not connected with the focus */
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
-    int32_t hide_living; /* of a file: 1 to state nothing of whoever may be living, and to say who that is */
-    int32_t year;        /* the year that hide_living counts from; 0 for the present one */
-    int32_t mirrored;    /* 1 for right and left exchanged */
+    int32_t hide_living;     /* of a file: 1 to hide everyone who may be living, and to mark their boxes */
+    int32_t year;            /* the year that hide_living counts from; 0 for the present one */
+    int32_t mirrored;        /* 1 for right and left exchanged */
     const olvane_fold*
         folds; /* near, ancestors, descendants, hourglass, relatives; may be null without any */
     size_t fold_count;
     olvane_options
         layout; /* the box and the gaps of every view; family, near: shown; pedigree: generations */
-    /* Everybody: an earlier picture of everybody, or null. It is read during the call only. Whoever is in both, by id,
+    /* Everybody: an earlier picture of everybody, or null. It is read during the call only. Who is in both, by id,
        stays where that picture has them as far as the change allows; it is not looked at if it is of another view or
        direction, or if less than half of the family is in it. */
     const olvane_picture* earlier;
     /* Near, ancestors, descendants, hourglass, relatives, kinship, everybody: whose boxes are not of the size that layout
-       has; may be null without any. Whoever is not in the family is passed over, and the last of two sizes for one person
+       has; may be null without any. Who is not in the family is passed over, and the last of two sizes for one person
        counts. They are read during the call only. */
     const olvane_box_size* box_sizes;
     size_t box_size_count;

@@ -215,7 +215,7 @@ export interface PictureOptions {
     folded?: Iterable<Fold> | undefined;
     /**
      * Near, ancestors, descendants, hourglass, relatives, kinship, everybody: persons whose boxes are not of the usual size;
-     * none. Whoever is not in the family is passed over, and the last of two sizes for one person counts.
+     * none. Who is not in the family is passed over, and the last of two sizes for one person counts.
      */
     boxSizes?: Iterable<BoxSize> | undefined;
     /**
@@ -278,7 +278,7 @@ export interface DrawingOptions {
 export interface PaperOptions {
     /** A4 to A0, letter, or WIDTHxHEIGHT in millimetres. A4 if not given. */
     readonly paper?: string | undefined;
-    /** So many sheets, 1 to 100 each way, and the picture as large as they allow. 1 if not given. */
+    /** The sheets, 1 to 100 each way; the picture is as large as they allow. 1 if not given. */
     readonly rows?: number | undefined;
     readonly columns?: number | undefined;
     /** By the size at 96 px an inch, on as many sheets as that takes; rows and columns do not count then. */

@@ -43,7 +43,7 @@ static int children_of(void* context, int64_t id, olvane_person_list* children) 
     return 0;
 }
 
-/* Whoever has a child with the person; here nobody has more than one child with anybody. */
+/* Everyone who has a child with the person; here nobody has more than one child with anybody. */
 static int spouses_of(void* context, int64_t id, olvane_person_list* spouses) {
     int64_t child;
     (void)context;

@@ -83,7 +83,7 @@ def main() -> None:
     for job in sys.stdin:
         for line in answers(families, job):
             sys.stdout.write(line)
-        # Whoever asks may wait for the answer before the next question.
+        # A program may wait for the answer before the next question.
         sys.stdout.flush()
 
 

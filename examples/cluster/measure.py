@@ -3,7 +3,7 @@
 # SPDX-License-Identifier: MIT
 """measure.py WORK [LAYOUTS PICTURES FILES | --goals]: what a cluster of two workers does, printed as a table.
 
-So many layouts and pictures of families of 60 persons, and one layout of each of so many files of 3,000 persons; --goals is a
+Layouts and pictures of many families of 60 persons, and one layout of each of many files of 3,000 persons; --goals is a
 million, 500,000 and 10,000. The answers are written below WORK, counted and thrown away. Many numbers of files share one
 file on disk.
 
@@ -57,7 +57,7 @@ def of_all(client: Client) -> float:
 
 
 def reading_goal(families: str, files: int) -> float:
-    """The seconds that two cores take to read so many files and to do nothing else."""
+    """The seconds that two cores take to read that many files and to do nothing else."""
     contents = [path.read_bytes() for path in sorted(pathlib.Path(families).glob("*.ged"))[:DIFFERENT]]
     start = time.process_time()
     for content in contents:

@@ -6,7 +6,7 @@
     on_dask.py --families FOLDER|DATABASE --out FOLDER [--workers N|--scheduler ADDRESS] [--kill-one]
             [--jobs-per-task N] <jobs
 
-So many jobs one after the other (--jobs-per-task) become one task, which writes its answers to a file of its own,
+Several jobs one after the other (--jobs-per-task) become one task, which writes its answers to a file of its own,
 OUT/0000017.tsv for the 18th task, under another name first: a worker that dies in the middle leaves nothing that counts, the task runs again, and running it twice
 changes nothing. The files one behind the other are what the pipe form prints. Printed are the number of answers and the SHA-256 of
 them all. --kill-one kills a worker when a third of the jobs is done.

@@ -31,7 +31,7 @@ public:
     std::int64_t fatherForPersonWithID(std::int64_t id) override { return known(kPersons.at(id).father); }
     std::int64_t motherForPersonWithID(std::int64_t id) override { return known(kPersons.at(id).mother); }
 
-    // Whoever has a child with the person.
+    // Everyone who has a child with the person.
     std::vector<std::int64_t> spousesForPersonWithID(std::int64_t id) override {
         std::vector<std::int64_t> spouses;
         for (const std::int64_t child : childrenForPersonWithID(id)) {

@@ -18,7 +18,7 @@ const persons = new Map([
 export const myFamily = {
     fatherOf: (id) => persons.get(id).father,
     motherOf: (id) => persons.get(id).mother,
-    // Whoever has a child with the person.
+    // Everyone who has a child with the person.
     spousesOf(id) {
         const children = this.childrenOf(id).map((child) => persons.get(child));
         return new Set(children.map(({ father, mother }) => (father === id ? mother : father)).filter(Boolean));

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A family behind a network: whoever is near the focus is asked for in one batch, shown, and then the next ring.
+// A family behind a network: those near the focus are asked for in one batch, shown, and then the next ring.
 
 // What the batch brings of a person: { id, father, mother, sex, birth, spouses: [ids], children: [ids] }.
 const relativesOf = ({ father, mother, spouses, children }) => [father, mother, ...spouses, ...children];
@@ -27,7 +27,7 @@ function tableOf(olvane, people) {
 }
 
 /**
- * Shows the family of a focus in at most so many rounds. ask(ids) promises the rows of one batch, in any order;
+ * Shows the family of a focus in a limited number of rounds. ask(ids) promises the rows of one batch, in any order;
  * show(boxes, round) is called after each.
  */
 export async function nearFirst(olvane, ask, focus, show, rounds = 6) {

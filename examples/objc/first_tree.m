@@ -34,7 +34,7 @@ enum { personCount = sizeof persons / sizeof persons[0] };
     return persons[personId].mother == 0 ? OlvanePersonNotFound : persons[personId].mother;
 }
 
-// Whoever has a child with the person.
+// Everyone who has a child with the person.
 - (NSArray*)spousesForPersonWithID:(int64_t)personId {
     NSMutableArray* spouses = [NSMutableArray array];
     for (NSNumber* child in [self childrenForPersonWithID:personId]) {

@@ -31,7 +31,7 @@ class MyFamily:
         return PERSONS[person].mother
 
     def spouses_of(self, person: int) -> list[int]:
-        """Whoever has a child with the person."""
+        """Everyone who has a child with the person."""
         parents = [(PERSONS[child].father, PERSONS[child].mother) for child in self.children_of(person)]
         others = [mother if father == person else father for father, mother in parents]
         return list(dict.fromkeys(other for other in others if other is not None))

@@ -1,6 +1,6 @@
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
-"""A family behind a network: whoever is near the focus is asked for in one batch, shown, and then the next ring."""
+"""A family behind a network: those near the focus are asked for in one batch, shown, and then the next ring."""
 
 from collections.abc import Callable, Iterable, Iterator
 from typing import NamedTuple
@@ -37,7 +37,7 @@ def table_of(people: dict[int, Row]) -> olvane.Family:
 
 
 def near_first(ask: Callable[[list[int]], Iterable[Row]], focus: int, rounds: int = 6) -> Iterator[olvane.Family]:
-    """The family of a focus after each of at most so many rounds; ask gives the rows of one batch, in any order."""
+    """The family of a focus after each of a limited number of rounds; ask gives the rows of one batch, in any order."""
     people: dict[int, Row] = {}
     asked: set[int] = set()
     ring = {focus}

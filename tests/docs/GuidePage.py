@@ -4,7 +4,7 @@
 
 A block's first line says what becomes of it:
 
-    ```c file=examples/c/first_tree.c     quotes that file, and is saved under its name by whoever follows the page
+    ```c file=examples/c/first_tree.c     quotes that file, and is saved under its name by readers who follow the page
     ```sh                                 is run
     ```text                               is what the block before it prints
 """

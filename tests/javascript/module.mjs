@@ -17,7 +17,7 @@ export function openInstance() {
     return Instance.of(bytes);
 }
 
-/** Fills the module's memory, until no piece of so many bytes, a power of 2, is free. */
+/** Fills the module's memory, until no block of `size` bytes, a power of 2, is free. */
 export function leaveRoomOf(instance, size) {
     for (let piece = 2 ** 30; piece >= size;) {
         if (instance.exports.malloc(piece) === 0) piece /= 2;

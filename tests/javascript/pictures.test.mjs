@@ -268,7 +268,7 @@ const adopted = olvane.readGedcom(
     "adopted.ged",
 );
 
-test("whose parents come first is a choice, and whoever has further ones says so", () => {
+test("whose parents come first is a choice, and who has further ones is marked", () => {
     const shown = (options) => idsShown(adopted.picture(1, options));
     const idsShown = ({ boxes }) =>
         boxes

@@ -9,7 +9,7 @@
 
 namespace property {
 
-// Families of up to so many persons with a request for one of them. Three kinds are mixed: families as they
+// Families of up to a given size with a request for one of them. Three kinds are mixed: families as they
 // are, families whose data contradict each other (a child that does not name its parent, a man as mother, a
 // person who is their own ancestor, lists that repeat a person), and both at once.
 rc::Gen<support::CaseFile> consistentFamily(int mostPersons);

@@ -14,7 +14,7 @@ namespace support {
 
 namespace {
 
-// -0.0 and 0.0 are one number to whoever compares coordinates, so they are printed alike.
+// -0.0 and 0.0 compare as equal, so they are printed alike.
 std::string floatText(float value) {
     char digits[9];
     std::uint32_t bits = 0;

@@ -7,7 +7,7 @@
 // case is laid out with its graph and its questions. The threads begin at different places, so that different
 // layouts meet.
 //
-// layouts-at-once --race: two threads write one number, for whoever doubts that a race would be seen.
+// layouts-at-once --race: two threads write one number, to prove that a race would be seen.
 
 #include <cstddef>
 #include <exception>

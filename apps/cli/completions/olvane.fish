@@ -70,4 +70,4 @@ complete -c olvane -n '__fish_seen_subcommand_from page' -l view -x -a 'family p
 complete -c olvane -n '__fish_seen_subcommand_from check' -l all -d 'Look at every layout'
 complete -c olvane -n '__fish_seen_subcommand_from page' -l no-notes -d 'Leave notes and sources out'
 complete -c olvane -n '__fish_seen_subcommand_from page' -l no-media -d 'Leave links to media out'
-complete -c olvane -n '__fish_seen_subcommand_from page' -l photos -x -d 'Put photographs in, of so many pixels'
+complete -c olvane -n '__fish_seen_subcommand_from page' -l photos -x -d 'Put photographs in, of that many pixels'

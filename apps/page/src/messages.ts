@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What a language must say about dates and facts. All grammar stands in the tables: whoever asks knows no case,
+// What a language must say about dates and facts. All grammar stands in the tables: the callers know no case,
 // gender or order of words.
 
 import type { GedcomDate } from "olvane";

@@ -64,7 +64,7 @@ test("years stand together, or say which one is known", () => {
     assert.equal(years({ birth: date(0, { written: "?" }), death: date(1882) }), "died 1882");
 });
 
-test("whoever has no name is called unknown", () => {
+test("a person without a name is called unknown", () => {
     assert.equal(nameOf(person(1, ""), english), "unknown name");
     assert.equal(nameOf(person(1, ""), german), "Name unbekannt");
     assert.equal(nameOf(person(1, "Ada"), german), "Ada");

@@ -305,7 +305,7 @@ OLVANE_EXPORT("family_columns_free") void familyColumnsFree(ColumnsInMaking* col
     delete columns;
 }
 
-// Where JavaScript writes so many bytes of a column; null for want of memory.
+// Where JavaScript writes the bytes of a column; null where memory is short.
 OLVANE_EXPORT("family_place") char* familyPlace(ColumnsInMaking* columns, std::size_t bytes) {
     try {
         // Zeros behind the bytes align the next place and end the last text.

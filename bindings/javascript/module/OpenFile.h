@@ -70,7 +70,7 @@ struct OpenFile {
     std::optional<KeptChart> everybody;
 };
 
-// Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for so many.
+// Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for this many.
 constexpr std::size_t kMostRelatives = 1000000;
 
 // What the last call had to say: a table, facts, or why something was refused.

@@ -68,16 +68,16 @@ def picture(
     - fan_of, fan_angle: whom a fan shows, and how far it reaches, in degrees, 90 to 360.
     - to, by, most_ways (0 for all), language: the other person of a kinship, its ways and its words.
     - marks ("all" for all), effort (0 to 100), all_parts: of everybody.
-    - earlier: an earlier picture of everybody, in the same direction; whoever is in both, by id, stays where it has them
+    - earlier: an earlier picture of everybody, in the same direction; who is in both, by id, stays where it has them
       as far as the change allows. A copy of a picture keeps nothing.
     - unknown_parents: family and pedigree; boxes for parents who are not known.
-    - hide_living, year: of a file; nothing is stated of whoever may be living in the year, 0 for the present one, and
+    - hide_living, year: of a file; everyone who may be living is hidden in the year, 0 for the present one, and
       their boxes say living.
     - mirrored: right and left exchanged; folded: branches that are left out of near, ancestors, descendants, hourglass and
       relatives: a person with "up" (ancestors), "down" (descendants) or "beside" (partners and, of the focus and its
       ancestors, siblings with theirs).
     - box_sizes: persons of near, ancestors, descendants, hourglass, relatives, kinship and everybody whose boxes have a
-      width and height of their own, in points, as they stand on paper; whoever is not in the family is passed over.
+      width and height of their own, in points, as they stand on paper; who is not in the family is passed over.
     - aspect: of these but kinship, width by height of the paper that wide generations are folded for, 0 for none.
 
     Raises HostError and LayoutError as :func:`layout` does, FileError for a file that cannot be read and for a text that

@@ -176,7 +176,7 @@ def draw(
 
     source is a path, the bytes of a file, a File that is open, or a Family, whose persons are named by their ids alone.
     to is the other person of a kinship; up and down are generations, 0 for all; generations is of a pedigree; places and
-    occupation need a File that was read with facts. hide_living, of a file, states nothing of whoever may be living in the
+    occupation need a File that was read with facts. hide_living, of a file, hides everyone who may be living in the
     year, 0 for the present one. Raises FileError.
     """
     options: dict[str, Any] = {

@@ -16,7 +16,7 @@ from olvane._file import File, _answer, _declared, _person_number
 
 @dataclass(frozen=True, slots=True)
 class KinWay:
-    """A way over common ancestors: so many steps up from one person, and down to the other.
+    """A way over common ancestors: its steps up from one person, and down to the other.
 
     persons are all on the way, by id. bond is "blood", or "adopted", "foster", "step" or "other" where the way is legal.
     words has what the second person is to the first by this way, by language: "en", "de", "es".
@@ -33,7 +33,7 @@ class KinWay:
 
 @dataclass(frozen=True, slots=True)
 class MarriageWay:
-    """A shortest way over marriages, parents and children, of so many links."""
+    """A shortest way over marriages, parents and children, and the number of its links."""
 
     links: int
     persons: tuple[int, ...]

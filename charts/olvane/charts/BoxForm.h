@@ -30,7 +30,7 @@ OLVANE_API void setBoxForm(ChartRequest& request, BoxForm form);
 // and that of kinship.
 OLVANE_API bool foldsForPaper(View view);
 
-// Sets a request for paper of so many times its height in width. The lines of everybody lie closer together on it.
+// Sets a request for paper whose width is `aspect` times its height. The lines of everybody lie closer together on it.
 OLVANE_API void foldForPaper(ChartRequest& request, double aspect);
 
 // Lets a pedigree of any number of columns flag those who have ancestors beyond the last one.

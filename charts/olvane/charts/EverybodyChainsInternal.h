@@ -11,7 +11,7 @@
 
 namespace olvane::charts {
 
-// Persons welded side by side: each is the partner of the next. Whoever has no partner is a chain alone.
+// Persons welded side by side: each is the partner of the next. A person without a partner is a chain alone.
 //
 // Holds: every person is in one chain, and each couple that stands side by side does so in one chain. The
 //        number of such couples is the most there can be where the couples make no ring; a ring is first

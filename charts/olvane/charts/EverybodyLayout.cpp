@@ -125,7 +125,7 @@ std::vector<double> PartLayouter::boxWidths() const {
     return widths;
 }
 
-// So many that ends stand kLeastStep apart.
+// As many lines as leave kLeastStep between their ends.
 LineRoom PartLayouter::roomForLines() const {
     constexpr double kLeastStep = 4;
     const auto linesIn = [](double points, double step, std::int32_t most) {

@@ -22,7 +22,7 @@ struct LineRoom {
     std::int32_t ofCouple = kMostOfCouple;  // down from between two partners
 };
 
-// No link as a mark, but those for which a box has no room: beyond so many lines below a box, or above it.
+// No link as a mark, but those for which a box has no room: beyond the most lines below a box, or above it.
 MarkedLinks marksForWantOfRoom(const Component& part, const Chains& chains, const LineRoom& room);
 
 // The link of an end becomes a mark. Where several links share the end, between partners or on the way past a row, all

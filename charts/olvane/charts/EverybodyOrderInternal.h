@@ -39,7 +39,7 @@ std::int64_t reduceCrossings(const Rows& rows, RowOrder& order, std::int64_t eff
 // Moves these nodes alone along their rows, each to the nearest place where it crosses the fewest lines.
 void siftNodes(const Rows& rows, RowOrder& order, const std::vector<std::int32_t>& nodes);
 
-// The order with the fewest crossings that so many starts end in: a walk, straightened more or less.
+// The order with the fewest crossings that any of `starts` starts ends in: a walk, straightened more or less.
 RowOrder findOrder(const Rows& rows, std::int64_t effort, int starts, const ShareDone& done = {});
 
 }  // namespace olvane::charts

@@ -55,7 +55,7 @@ void Fan::growAncestors() {
     }
 }
 
-// A father has the left half of his child's cell and a mother the right one, whoever else is known.
+// A father has the left half of his child's cell and a mother the right one, even where the other parent is not known.
 void Fan::spreadHalves(double angle) {
     cells_[0].from = -angle / 2;
     cells_[0].to = angle / 2;

@@ -25,9 +25,9 @@ using kin::at;
 
 // Rows that are not folded are easier to read, so folding must gain as much in the size of the text.
 constexpr double kWorthFolding = 1.1;
-// Of so many links, one more may be a mark for it.
+// For each multiple of this many links, one more may be a mark.
 constexpr std::size_t kLinksForOneMark = 20;
-// Only so many are tried with all links as lines, which takes ten times as long.
+// No more than these are tried with all links as lines, which takes ten times as long.
 constexpr std::size_t kFewPersons = 300;
 // Of more, all second links are marks, whether their lines would cross others or not.
 constexpr std::size_t kManyPersons = 20'000;

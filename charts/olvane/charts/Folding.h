@@ -27,7 +27,7 @@ namespace olvane::charts {
 OLVANE_API bool canFold(View view);
 
 // How many persons the branches up, down and beside of a person have for themselves in the chart, the other branches
-// being as the request says: so many are hidden by a branch that is folded, or would be. All 0 for somebody who is not
+// being as the request says: that many are hidden by a branch that is folded, or would be. All 0 for somebody who is not
 // shown and in a view whose branches do not fold.
 //
 // Fails: as chartOf, for the request.

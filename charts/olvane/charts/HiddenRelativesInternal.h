@@ -10,7 +10,7 @@
 
 namespace olvane::charts {
 
-// Counts the parents, partners and children of a person who are not shown into the person's box. Whoever would be
+// Counts the parents, partners and children of a person who are not shown into the person's box. Who would be
 // counted over two unions is counted over the first. shown is by person.
 void countHiddenRelatives(const kin::KinGraph& graph, kin::Place person, const std::vector<bool>& shown,
                           picture::Box& box);

@@ -21,7 +21,7 @@ constexpr std::int64_t kCellWidth = 200;   // pixels
 constexpr std::int64_t kCellHeight = 60;
 constexpr std::int64_t kWindow =
     1000;  // a small one; farther away than all of the map in it there is nothing
-constexpr std::int64_t kLeastCells = 12;  // a window shows the whole height of a map in so many
+constexpr std::int64_t kLeastCells = 12;  // a window that shows the whole height of a map has that many
 constexpr std::uint32_t kLeastBearers = 3;
 constexpr std::uint32_t kLeastShare = 12;  // a surname speaks for a cell if every twelfth bears it
 

@@ -18,7 +18,7 @@ PlanBuilder::PlanBuilder(const kin::KinGraph& graph, const PlanSizes& sizes, con
     plan_.boxOf.assign(at(graph.personCount()), kNone);
     for (const kin::Place person : selection.persons) plan_.boxOf[at(person)] = kAwaitsBox;
     const std::size_t persons = selection.persons.size();
-    // At most so many; a list that grows by doubling would take more than what stays unused here.
+    // The most there can be; a list that grows by doubling would take more than what stays unused here.
     plan_.households.reserve(persons);
     plan_.persons.reserve(persons);
     plan_.householdOf.reserve(persons);
@@ -150,7 +150,7 @@ void PlanBuilder::growAll(Index first) {
     for (Index h = first; h < static_cast<Index>(plan_.households.size()); ++h) growDownFrom(h);
 }
 
-// Whoever is shown without being an ancestor of the focus or a descendant of somebody shown so far: first who is
+// Everyone who is shown without being an ancestor of the focus or a descendant of somebody shown so far: first who is
 // a parent of somebody placed, then anybody.
 void PlanBuilder::addLeftOver() {
     Index asked = 0;

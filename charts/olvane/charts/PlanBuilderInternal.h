@@ -14,7 +14,7 @@ namespace olvane::charts {
 // From shown persons to a plan: households, and the tree of links by which each was reached first.
 //
 // Breadth first, so that a person reached over several ways gets the place of the shortest one. First the
-// ancestors of the focus, then everybody's children, and last whoever was not reached, each as the start of a
+// ancestors of the focus, then everybody's children, and last those who were not reached, each as the start of a
 // tree of its own. Rows are those of the links: a parent's household one row above the child's.
 // Holds: every shown person is in the plan afterwards. The household of the focus is the first.
 class PlanBuilder {

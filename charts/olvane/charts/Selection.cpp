@@ -70,7 +70,7 @@ public:
         lineLevels_.push_back(1);
     }
 
-    // Ancestors to so many generations; nobody is reached over somebody whom `admit` refuses.
+    // Ancestors as far as `generations` go; nobody is reached over somebody whom `admit` refuses.
     template <class Admit>
     void addAncestors(int generations, const Admit& admit) {
         for (std::size_t i = 0; i < chosen_.line.size(); ++i) {
@@ -88,10 +88,10 @@ public:
         closed_.closeSiblings(chosen_.isLine);
     }
 
-    // The descendants of the focus to so many generations.
+    // The descendants of the focus, as far as `generations` go.
     void addDescendants(int generations) { descend({chosen_.line[0]}, {1}, generations, kAdmitAll); }
 
-    // The descendants of the focus and of every ancestor, to so many generations below the focus's own. The
+    // The descendants of the focus and of every ancestor, up to that many generations below the focus's own. The
     // earliest generation comes first, so that everybody is met over the most generous way, though not over somebody
     // whom `admit` refuses.
     template <class Admit>

@@ -12,7 +12,7 @@ namespace olvane::charts {
 
 namespace {
 
-// A second line to parents may be so many times as long as the way from one box to the next.
+// A second line to parents may be longer by this factor than the way from one box to the next.
 constexpr float kReachOfShortLinks = 4;
 
 // Charts are narrowed to this part of the width that their lines would like best.

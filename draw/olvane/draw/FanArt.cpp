@@ -53,7 +53,7 @@ constexpr auto kDarkFills =
     std::to_array<std::string_view>({"#24405c", "#5a3d1f", "#2b4a26", "#5a2b3a", "#40325a", "#4d4719",
                                      "#1f4a48", "#453f37", "#1c3f80", "#702f22", "#44590f", "#63306f"});
 
-// So many colours take turns that the last line of descent, which may lie beside the first, has another one.
+// Enough colours take turns that the last line of descent, which may lie beside the first, has another one.
 std::size_t coloursInTurn(std::size_t lines) {
     const std::size_t most = kLightFills.size();
     return lines > 1 && lines % most == 1 ? most - 1 : most;

@@ -123,7 +123,7 @@ public:
         plan_.strip = request.strip;
     }
 
-    // False where so many sheets do not suffice at that scale.
+    // False where that many sheets do not suffice at that scale.
     bool tryScale(double scale, double mostRows, double mostColumns) {
         scale_ = scale;
         const double room = plan_.roomHeight() / scale;

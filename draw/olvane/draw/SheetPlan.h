@@ -23,7 +23,7 @@ struct SheetSubject {
 
 struct SheetRequest {
     Paper paper;
-    // So many sheets, and the picture as large as they allow. Ignored where there is a scale.
+    // The number of sheets; the picture is as large as they allow. Ignored where there is a scale.
     int rows = 1;
     int columns = 1;
     // Millimetres of paper for each unit of the picture, on as many sheets as that takes; 0 for what fits.
@@ -73,7 +73,7 @@ struct SheetPlan {
 //        room, numbers of sheets below 1, or lengths that are not finite.
 SheetPlan planSheets(const SheetSubject& subject, const SheetRequest& request, double mostSheets = 1000);
 
-// Width by height of what so many sheets hold together.
+// Width by height of what that many sheets hold together.
 double aspectOf(const SheetRequest& request);
 
 }  // namespace olvane::draw

@@ -95,7 +95,7 @@ public:
     TreeViewPerson& addNonDisplayedSpouse(int id);
     TreeViewPerson& addChildWithSpouse(int childId, int spouseId, bool male);
     TreeViewPerson& addChildWithNoOtherSpouse(int childId, bool male);
-    // The list under that key, with room for so many more children.
+    // The list under that key, with room for `more` more children.
     Persons& childrenWithSpouse(int spouseId, std::size_t more);
 
     // --- Plain reads and writes.

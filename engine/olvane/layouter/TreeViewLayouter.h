@@ -37,7 +37,7 @@ typedef boost::function<void(TreeViewPerson&, bool, const TreeViewPerson::Iterat
 // Holds: one layouter serves one layout. It points to the DataAdapter, which must outlive it.
 // Fails: whatever a callback throws passes on; an empty callback throws boost::bad_function_call.
 //
-// No virtual destructor: a layouter is made and destroyed through its concrete type, by whoever runs it.
+// No virtual destructor: a layouter is made and destroyed through its concrete type, by the code that runs it.
 class OLVANE_API TreeViewLayouter {
 protected:
     olvane::Arena memory;  // of the whole graph: declared ahead of the focus, so destroyed after it

@@ -42,7 +42,7 @@ void Ancestry::reachAll() {
     }
 }
 
-// Whoever waits for no child any more comes next. In a loop everybody waits for ever.
+// A person all of whose children are placed comes next. In a loop nobody ever is.
 void Ancestry::putInOrder() {
     waitsFor_.assign(found_.size(), 0);
     for (const Node node : found_) {

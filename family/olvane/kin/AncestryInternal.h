@@ -27,7 +27,7 @@ struct SpotLink {
     std::int8_t length;
 };
 
-// The ancestors of two persons, the two included: persons and couples in an order in which whoever is an ancestor
+// The ancestors of two persons, the two included: persons and couples in an order in which an ancestor
 // comes after all descendants. The order is by generations as far as the links allow (Kahn, "Topological sorting of
 // large networks", 1962), so founders stand close to their children and searches upwards end early.
 //

@@ -51,7 +51,7 @@ struct Remark {
 };
 
 // Everything odd in a graph and its years: of each person the life, the families by birth and the parents' ages, then
-// of each union the marriage, then whoever is their own ancestor. Only what cannot be is remarked: dates are compared
+// of each union the marriage, then persons who are their own ancestors. Only what cannot be is remarked: dates are compared
 // as all the years that they may stand for. Ages are compared with parents by birth alone. The first four kinds are
 // those of records that name each other, which a graph does not know.
 // Fails: std::invalid_argument where the lives are not as many as the persons, or the marriages as the unions.

@@ -19,7 +19,7 @@ struct ReachAround {
         0;  // generations of descendants of each ancestor: 1 siblings, aunts and uncles; 2 cousins and so on
     bool spouses = true;  // of everybody who is reached; a spouse's own relatives are not asked for
     bool everybody =
-        false;  // whoever is connected with the focus by any links, whatever the numbers above say
+        false;  // everyone who is connected with the focus by any links, whatever the numbers above say
     std::size_t mostPersons = 1000000;
 };
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Removes a person. Data may contradict themselves, so whoever names the person is found by looking at every row.
+// Removes a person. Data may contradict themselves, so those that name the person are found by a look at every row.
 
 #include <olvane/kin/Family.h>
 

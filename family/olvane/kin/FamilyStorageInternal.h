@@ -21,7 +21,7 @@ namespace olvane::detail {
 
 // A value with a count of its owners.
 //
-// Threads: the count is read with acquire, so whoever finds itself the only owner sees all reads of those who let
+// Threads: the count is read with acquire, so the only owner left sees all reads of those who let
 //          go as past. std::shared_ptr::use_count does not promise that.
 template <class Value>
 class CowPointer {
@@ -231,7 +231,7 @@ private:
 
     struct Block {
         explicit Block(std::size_t size) : words(new std::uint32_t[size]), capacity(size) {}
-        // The first of so many words that are the caller's from now on; capacity where there is no room.
+        // The first of `count` words that are the caller's from now on; capacity where there is no room.
         std::size_t claim(std::size_t count);
 
         std::unique_ptr<std::uint32_t[]> words;
@@ -242,7 +242,7 @@ private:
     const std::uint32_t* words(Reference reference) const {
         return blocks_[reference >> 16U].words + (reference & 0xFFFFU);
     }
-    // Room for so many words, and its reference.
+    // Room for `count` words, and its reference.
     std::pair<Reference, std::uint32_t*> allocate(std::size_t count);
     void addBlock(std::size_t count);
 

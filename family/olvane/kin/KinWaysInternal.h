@@ -27,7 +27,7 @@ class KinWays {
 public:
     KinWays(const Ancestry& ancestry, WaySort sort) : ancestry_(ancestry), sort_(sort) {}
 
-    // The ways up to a length, at least limit of them if there are so many; or the nearest alone.
+    // The ways up to a length, at least `limit` of them if that many exist; or the nearest alone.
     std::vector<KinWay> list(std::size_t limit, bool nearestAlone);
 
 private:

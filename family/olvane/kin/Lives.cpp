@@ -37,7 +37,7 @@ void addKin(const KinGraph& graph, Place person, std::vector<Place>& kin) {
     }
 }
 
-// Everybody within so many steps of those marked, each looked at once.
+// Marks everybody within kSteps links of those marked; each person is looked at once.
 void markWithin(const KinGraph& graph, std::vector<bool>& near) {
     std::vector<Place> ring;
     for (Place person = 0; person < graph.personCount(); ++person) {

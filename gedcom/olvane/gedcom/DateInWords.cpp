@@ -107,7 +107,7 @@ bool takeYear(WordScanner& words, ReadDate& result) {
     return result.date.year != 0;
 }
 
-// The letters of up to so many words, without what stands between them; empty if a digit or a phrase is among them.
+// The letters of the next `count` words, without what stands between them; empty if a digit or a phrase is among them.
 std::string lettersAhead(WordScanner words, int count) {
     constexpr std::size_t kLongest = 16;
     std::string letters;

@@ -14,7 +14,7 @@ namespace olvane::gedcom {
 
 // Gathers diagnostics while a file is read.
 //
-// Holds: at most so many of a kind are listed, the rest are counted: memory does not grow with the trouble.
+// Holds: no more than a limit of one kind are listed, the rest are counted: memory does not grow with the trouble.
 class DiagnosticList {
 public:
     DiagnosticList(std::string file, std::size_t listedPerKind);

@@ -17,7 +17,7 @@ std::string yearText(int year) {
     return year < 0 ? std::to_string(-year) + " BC" : std::to_string(year);
 }
 
-// Appends the number in so many digits at least.
+// Appends the number with leading zeros up to `digits` digits.
 void appendPadded(std::string& text, int number, std::size_t digits) {
     const std::string plain = std::to_string(number);
     if (plain.size() < digits) text.append(digits - plain.size(), '0');

@@ -15,7 +15,7 @@ std::optional<std::string> memberOfArchive(std::string_view file);
 
 // The bytes of a media file in a .gdz archive, whose bytes are given. Nothing is fetched or looked for outside.
 //
-// Holds: nothing for a file that is not in the archive, or that unpacks to more than so many bytes: no more are
+// Holds: nothing for a file that is not in the archive, or that unpacks to more than `most` bytes: no more are
 //        unpacked.
 // Fails: GedcomError, in the name of the archive, for bytes that are no archive and for a damaged member. Without libzip
 //        nothing is found.

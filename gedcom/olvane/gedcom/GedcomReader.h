@@ -11,7 +11,7 @@
 namespace olvane::gedcom {
 
 struct ReadOptions {
-    // So many diagnostics of one kind are listed singly; one more then states how many there were.
+    // The most diagnostics of one kind that are listed singly; one more then states how many there were.
     std::size_t diagnosticsPerKind = 100;
     // Whether events and attributes are kept beyond birth, death and marriage, with their places. They take
     // memory, and a layout needs none of them.

@@ -40,7 +40,7 @@ struct PersonName {
 // The whole name for a person to read: the value without its slashes, or else the pieces in order.
 std::string displayName(const PersonName& name);
 
-// The same, of a longer name the beginning that has at most so many bytes, in whole characters. Time and memory grow
+// The same, of a longer name the beginning that has at most mostBytes bytes, in whole characters. Time and memory grow
 // with what comes back, not with the name.
 std::string displayName(const PersonName& name, std::size_t mostBytes);
 

@@ -39,7 +39,7 @@ struct WriteOptions {
 //        are not hidden stay.
 //        Of shared records there are those that something written points to: a note, source or picture that only hidden
 //        persons have is not in the text. A detail that is left out takes along what lies below it.
-// Units: time grows with the size of the data, whoever is hidden.
+// Units: time grows with the size of the data, not with who is hidden.
 // Fails: what was read without facts or details is written without; nothing is thrown but std::bad_alloc.
 std::string writeGedcom(const GedcomData& data, const WriteOptions& options = {});
 

@@ -18,7 +18,7 @@
 namespace olvane::gedcom {
 namespace {
 
-// Lists for persons whom the family does not name as partners may hold so many entries for each child of the
+// Lists for persons whom the family does not name as partners may hold this many entries for each child of the
 // file's families, so that a file in which all claim one family stays small in memory.
 constexpr std::size_t kClaimedChildren = 1;
 constexpr std::size_t kClaimedChildrenAtLeast = 1000;

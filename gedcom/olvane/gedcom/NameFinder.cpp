@@ -27,7 +27,7 @@ constexpr std::size_t kMostNames = 8;
 constexpr std::size_t kMostBytes = 256;
 // A text in which more pairs could be met is a list of people.
 constexpr std::size_t kMostPairs = 4096;
-// Characters; a name of four syllables in Hangul, taken apart, has so many.
+// Characters; a name of four syllables in Hangul, taken apart, has that many.
 constexpr std::size_t kLongestPiece = 12;
 
 constexpr std::uint64_t kHashStart = 14695981039346656037U;

@@ -37,7 +37,7 @@ std::size_t takeSurrogatePair(std::string_view raw, std::string& text) {
     return 2 * kSurrogateBytes;
 }
 
-// Whether nothing but the beginning of a character is left: whoever wrote the value cut it there.
+// Whether nothing but the beginning of a character is left: the program that wrote the value cut it there.
 bool isCutCharacter(std::string_view raw) {
     const unsigned first = byteAt(raw, 0);
     if (first < 0xC2 || first > 0xF4 || raw.size() > 3) return false;

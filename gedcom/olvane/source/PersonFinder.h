@@ -20,7 +20,7 @@ class PersonFinder {
 public:
     explicit PersonFinder(const GedcomData& data) : data_(data) {}
 
-    // Everybody who fits, the best first. Whoever has the text as xref or number is the only one.
+    // Everybody who fits, the best first. A person who has the text as xref or number is the only one.
     std::vector<PersonId> find(const std::string& text,
                                std::size_t limit = std::numeric_limits<std::size_t>::max());
     // Those whom the text can only mean: whose names have each word or a word that begins so; where there is nobody,

@@ -21,7 +21,7 @@ constexpr std::size_t kNoGroup = std::numeric_limits<std::size_t>::max();
 
 }  // namespace
 
-// Reached is whoever is in the group of the family with most members; where no line is drawn, nobody,
+// Reached is who is in the group of the family with most members; where no line is drawn, nobody,
 // but for the one who is left when all others have marks.
 void PictureJudge::listUnjoined() {
     const std::vector<Pair> marked = markedMembers();

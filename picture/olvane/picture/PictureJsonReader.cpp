@@ -91,7 +91,7 @@ Integer integerAt(const Json& object, const char* name) {
     return static_cast<Integer>(integer);
 }
 
-// The value of that name, among the first so many; the fallback where it is absent or not known.
+// The value of that name, among the first `count`; the fallback where it is absent or not known.
 template <class Value>
 Value namedValue(const Json* json, int count, Value fallback) {
     if (json == nullptr || !json->is_string()) return fallback;

@@ -16,7 +16,7 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-// Reads format 2, whoever wrote it. Fields that are not known are ignored; fields that are absent have the
+// Reads format 2, from any program. Fields that are not known are ignored; fields that are absent have the
 // values of an empty Box, Family, Line or Mark. Only in native builds.
 //
 // Fails: PictureJsonError for text that is not JSON, another format, a value of the wrong type, a number that

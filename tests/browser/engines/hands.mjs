@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Three ways to do the same with the page: with a mouse at a desk, with a finger on a phone, and with the keys alone.
-// Whoever does it counts each click, tap or key.
+// Each click, tap or key is counted.
 
 import { Walk } from "./Walk.mjs";
 

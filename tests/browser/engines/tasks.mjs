@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What is to be done, in the words of whoever does it, with whatever hand. What a task returns is the same in every engine.
+// What is to be done, in the words of the person who does it, by mouse, finger or keys. What a task returns is the same in every engine.
 
 import assert from "node:assert/strict";
 import { archiveOf } from "../support/archive.mjs";

@@ -368,7 +368,7 @@ describe("element", () => {
         await end();
     });
 
-    test("a file that cannot be had leaves the element empty and says why to whoever asks", async () => {
+    test("a file that cannot be had leaves the element empty and reports why", async () => {
         files.set(
             "/none.html",
             '<!doctype html><olvane-tree></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',

@@ -37,7 +37,7 @@ async function visitMap(path, settings = {}, hash = "") {
     return visit;
 }
 
-// So many persons in couples, each with two children who marry into other couples.
+// A number of persons in couples, each with two children who marry into other couples.
 function madeFamily(couples) {
     const lines = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
     for (let f = 1; f <= couples; ++f) {
@@ -111,7 +111,7 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         await visit.end();
     });
 
-    test("Enter shows the family of whoever is chosen, and the way back leads to the map", async () => {
+    test("Enter shows the family of the chosen person, and the way back leads to the map", async () => {
         const visit = await visitMap(darwins().path);
         await visit.page.focus("#map canvas");
         await visit.page.keyboard.press("ArrowUp");
@@ -144,7 +144,7 @@ describe("map", { ...kTwoAtOnce, skip: command ? false : "no olvane command" }, 
         await again.end();
     });
 
-    test("the map is mirrored by the switch, and whoever was in the middle stays there", async () => {
+    test("the map is mirrored by the switch, and the person in the middle stays there", async () => {
         const visit = await visitEmpty();
         await visit.choose("darwin.ged", sample("darwin-wedgwood.ged"));
         await visit.untilFamily();

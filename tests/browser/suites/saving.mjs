@@ -153,7 +153,7 @@ describe("saving", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("sheets have a scale as the command has it, and are saved as PNG of so many pixels an inch", async () => {
+    test("sheets have a scale as the command has it, and are saved as PNG at a resolution in pixels an inch", async () => {
         const visit = await visitDarwins("#person=I1&view=descendants&down=1");
         const { page } = visit;
         const message = () => page.evaluate(() => one("#sheet-message").textContent);

@@ -113,7 +113,7 @@ describe("searching", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("Enter in an emptied field leads to nobody, whoever was found before", async () => {
+    test("Enter in an emptied field leads to nobody, even after a search", async () => {
         const visit = await visitDarwins();
         await visit.page.fill("#search", "erasmus");
         assert.ok((await found(visit)).length > 0);

@@ -235,7 +235,7 @@ describe("walking", kTwoAtOnce, () => {
         await visit.end();
     });
 
-    test("whoever is chosen in the panel has the keys, too", async () => {
+    test("a person chosen in the panel has the keys, too", async () => {
         const visit = await visitDarwins();
         await visit.page.focus('#side-panel a[href*="person=I12"]');
         await visit.press("Enter");

@@ -10,7 +10,7 @@ export function gedcom(...lines) {
 }
 
 /**
- * Uncles in one house, so many, with so many children each: seen from any of the children, all are in the picture.
+ * A number of uncles in one house, with a number of children each: seen from any of the children, all are in the picture.
  * I1 and I2 are the grandparents, I3 the first uncle, and the first cousin has the record C0_0.
  */
 export function cousins(uncles, children) {
@@ -347,7 +347,7 @@ export function detailedFamily() {
     );
 }
 
-/** A line of so many generations. */
+/** A line of descent of that many generations. */
 export function lineOf(generations) {
     const lines = ["0 HEAD", "1 GEDC", "2 VERS 5.5.1", "1 CHAR UTF-8"];
     for (let i = 1; i <= generations; ++i) {

@@ -108,7 +108,7 @@ async function titleOf(url) {
 }
 
 // The packages in one program of Node, which is of that version where one is stated.
-function nodeRoads(name, node, version) {
+function nodeWays(name, node, version) {
     const prints = (file, program) => {
         write(file, program);
         if (version) assert.match(run(node, ["--version"]), new RegExp(`^v${version}\\.`));
@@ -126,7 +126,7 @@ function nodeRoads(name, node, version) {
     };
 }
 
-const kRoads = {
+const kWays = {
     "licences, and what is inside"() {
         const others = { olvane: ["boost", "unicode-data", "emscripten-runtime"], "olvane-tree": ["d3-zoom"] };
         for (const [name, parts] of Object.entries(others)) {
@@ -147,10 +147,10 @@ const kRoads = {
         );
         return "3";
     },
-    ...nodeRoads("node", "node"),
+    ...nodeWays("node", "node"),
     ...Object.assign(
         {},
-        ...kNodes.map((version) => nodeRoads(`node ${version}`, bin(`../node${version}/bin/node`), version)),
+        ...kNodes.map((version) => nodeWays(`node ${version}`, bin(`../node${version}/bin/node`), version)),
     ),
     async esbuild() {
         write("esbuild/main.js", kMain("olvane/inline"));
@@ -364,7 +364,7 @@ document.querySelector("olvane-tree").addEventListener("focuschange", ({ detail 
 
 let passed = 0;
 let failed = 0;
-for (const [road, take] of Object.entries(kRoads)) {
+for (const [way, take] of Object.entries(kWays)) {
     let found = "";
     try {
         found = await take();
@@ -373,7 +373,7 @@ for (const [road, take] of Object.entries(kRoads)) {
     }
     if (found === "3") ++passed;
     else ++failed;
-    console.log(found === "3" ? `ok      ${road}` : `NOT OK  ${road}: ${found}`);
+    console.log(found === "3" ? `ok      ${way}` : `NOT OK  ${way}: ${found}`);
 }
 await browser.close();
 server.close();

@@ -92,7 +92,7 @@ TEST(CFile, drawsEveryView) {
     EXPECT_EQ(OLVANE_OK, drawn(file, 3, &kinship).first);
 }
 
-TEST(CFile, hidesWhoeverMayBeLiving) {
+TEST(CFile, hidesEveryoneWhoMayBeLiving) {
     const File file = opened(
         "0 HEAD\n1 GEDC\n2 VERS 5.5.1\n1 CHAR UTF-8\n"
         "0 @I1@ INDI\n1 NAME Ada /Berg/\n1 BIRT\n2 DATE 1990\n0 TRLR\n");

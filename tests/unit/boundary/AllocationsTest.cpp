@@ -65,7 +65,7 @@ std::int64_t allocationsBeforeTheGuard(const Source& source) {
     return allocationsMade() - before;
 }
 
-// The first ones, so many as are stated, and the last one, which makes the returned text, lie outside the guard.
+// The first ones, as many as are stated, and the last one, which makes the returned text, lie outside the guard.
 void expectEveryAllocationMayFail(const Layout& layOut, std::int64_t before) {
     const Attempt whole = layOutWithFailureAt(0, layOut);
     ASSERT_LT(100u, whole.text.size());

@@ -61,7 +61,7 @@ TEST(PersonKeys, stayTheSameWhileManyOthersCome) {
     EXPECT_EQ(kCount, glue.keyOfNumber(kCount * 7));
 }
 
-// A table half full, with every second place taken: whoever looks for a place must find one of the others.
+// A table half full, with every second place taken: a search must find one of the others.
 TEST(PersonKeys, ofNumbersThatFallOnEverySecondPlaceAreFound) {
     const auto fallsOnAnEvenPlace = [](int id) {
         return ((static_cast<std::uint32_t>(id) * std::uint64_t{0x9E3779B97F4A7C15}) >> 32) % 2 == 0;

@@ -259,7 +259,7 @@ TEST(ChartProperties, doNotDependOnTheOrderOfPersonsInTheData) {
     }
 }
 
-// Whoever is in the data beside those who are shown, and before them.
+// Who is in the data beside those who are shown, and before them.
 TEST(ChartProperties, doNotDependOnPersonsWhoAreNotConnected) {
     for (unsigned seed = 1; seed <= kFamilies; ++seed) {
         const AnyKin family = familyOf(seed);

@@ -79,7 +79,7 @@ KinGraph lineOf(int generations) {
     return builder.build();
 }
 
-// Everybody has two parents, to so many generations; person 0 is the focus.
+// Everybody has two parents, up to that many generations; person 0 is the focus.
 KinGraph fullAncestry(int generations) {
     KinGraphBuilder builder;
     std::vector<Place> level{builder.addPerson(1, Sex::male)};
@@ -694,7 +694,7 @@ TEST(AwkwardFamilies, everyGenerationOfAFullAncestryStandsInOneRow) {
 
 // --- What is refused.
 
-TEST(Charts, refuseWhoeverIsNotThere) {
+TEST(Charts, refusePersonsWhoAreNotThere) {
     const KinFamily family{"Adam + Eva"};
     EXPECT_THROW(chartOf(family.graph(), requestFor(View::descendants, 2)), std::out_of_range);
     EXPECT_THROW(chartOf(family.graph(), requestFor(View::descendants, -1)), std::out_of_range);

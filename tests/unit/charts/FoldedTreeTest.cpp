@@ -36,7 +36,7 @@ constexpr double kUpright = 210.0 / 297;
 const std::vector<View> kRowViews{View::near, View::ancestors, View::descendants, View::hourglass,
                                   View::relatives};
 
-// A couple with so many children, each with a spouse if they are married. Persons 1 and 2 are the couple; of child n,
+// A couple with that many children, each with a spouse if they are married. Persons 1 and 2 are the couple; of child n,
 // from 0, the id is 10 + n, and the spouse's is 1000 more.
 KinGraph couplesChildren(int count, bool married) {
     KinGraphBuilder builder;
@@ -181,7 +181,7 @@ TEST(FoldedTree, takesBoxesOfAnySize) {
     expectNothingMisleads(folded, graph);
 }
 
-// Whoever is hidden is hidden in a folded chart as well, and nobody is lost or moved to another generation's parents.
+// Who is hidden is hidden in a folded chart as well, and nobody is lost or moved to another generation's parents.
 TEST(FoldedTree, showsWhomTheTreeShowsInAnyFamily) {
     int folded = 0;
     for (std::uint64_t seed = 1; seed <= 24; ++seed) {

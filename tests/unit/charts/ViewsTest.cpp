@@ -69,7 +69,7 @@ std::set<std::int64_t> idsOf(const picture::Picture& picture) {
     return ids;
 }
 
-// Answers until so many questions have been asked.
+// Answers until that many questions have been asked.
 class FailingHost final : public OlvaneViewerManagerWrapProtocol {
 public:
     FailingHost(const Family& family, int answers) : family_(family), left_(answers) {}

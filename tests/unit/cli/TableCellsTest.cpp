@@ -35,7 +35,7 @@ TEST(TableCells, areOneLineWithTabsBetween) {
     EXPECT_EQ(tableLine({"a", "b\tc\nd", ""}), "a\tb c d\t\n");
 }
 
-// The same cells one after the other, the first in pieces of so many bytes.
+// The same cells one after the other, the first in parts of that many bytes.
 std::string lineInPieces(std::string_view first, std::string_view second, std::size_t bytes) {
     std::string text;
     const picture::TextSink write = [&text](std::string_view piece) { text += piece; };

@@ -38,7 +38,7 @@ TEST(TerminalText, leavesEveryOtherText) {
     }
 }
 
-// A text in pieces of so many bytes each, and how long the longest piece was that came out.
+// A text in parts of that many bytes each, and how long the longest piece was that came out.
 std::string inPieces(int descriptor, std::string_view text, std::size_t bytes, std::size_t& longest) {
     std::string all;
     TextPieces pieces(descriptor, [&](std::string_view piece) {

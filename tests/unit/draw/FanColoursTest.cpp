@@ -16,7 +16,7 @@
 namespace olvane::draw {
 namespace {
 
-// Of the fan of somebody with so many children, in the order of the children.
+// Of the fan of somebody with that many children, in the order of the children.
 std::vector<std::string> coloursOfChildren(int children, const DrawingTheme& theme) {
     kin::KinGraphBuilder builder;
     const kin::Place focus = builder.addPerson(1, kin::Sex::female);

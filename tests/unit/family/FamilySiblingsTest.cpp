@@ -274,7 +274,7 @@ TEST_F(AuntsAndUncles, fathersSideNeedsTheTouchAndTheMothersDoesNot) {
     EXPECT_NO_THROW(setOutMothersSiblings({201}));
 }
 
-TEST_F(AuntsAndUncles, parentsAreThoseOfTheFocusWhoeverIsPassed) {
+TEST_F(AuntsAndUncles, parentsAreThoseOfTheFocusForEveryPersonPassed) {
     father().addSibling(101, kMale);
     TreeViewPerson other(5);
     other.addSibling(5, kMale);

@@ -231,7 +231,7 @@ TEST_F(FamilyWidths, readingTheUnitsWidthChangesNothing) {
     EXPECT_EQ(40.0f, focus.layoutWidth);
 }
 
-TEST_F(FamilyWidths, proximalIsWhoeverIsReachedByDescent) {
+TEST_F(FamilyWidths, proximalAreThoseReachedByDescent) {
     focus.addSpouse(1, kFemale).addChildWithNoOtherSpouse(5, kMale);
     spouse().isProximalPerson = true;
     focus.addChildWithSpouse(2, 1, kMale).addSpouse(3, kFemale);

@@ -75,7 +75,7 @@ TEST(Kinship, doubleCousinsAreRelatedInTwoWays) {
     EXPECT_EQ(found.degree, 4);
 }
 
-TEST(Kinship, whoeverDescendsTwiceIsRelatedOverBothParents) {
+TEST(Kinship, aPersonWhoDescendsTwiceIsRelatedOverBothParents) {
     // The parents of Theo are brother and sister: phi(Theo, Theo) = (1 + 1/4) / 2.
     const KinFamily family{"Abel + Anna: Bert.m Bea.f Bodo.m", "Bert + Bea: Theo.m"};
     const Kinship found = kinship(family, "Theo", "Bodo");

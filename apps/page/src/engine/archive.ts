@@ -39,7 +39,7 @@ export class Archive {
         this.entries = new Map(entriesOf(bytes).map((entry) => [entry.name, entry]));
     }
 
-    /** The GEDCOM file: gedcom.ged, or else the first that ends in .ged. At most so many bytes come out of it. */
+    /** The GEDCOM file: gedcom.ged, or else the first that ends in .ged. No more bytes than `most` come out of it. */
     async gedcom(most: number): Promise<Uint8Array<ArrayBuffer>> {
         const names = [...this.entries.keys()];
         const name = names.find((one) => /(^|\/)gedcom\.ged$/i.test(one)) ?? names.find((one) => /\.ged$/i.test(one));

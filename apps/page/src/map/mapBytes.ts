@@ -125,7 +125,7 @@ class Reader {
         }
     }
 
-    // Of so many items of so many bytes each; of any number of them where count is -1.
+    // Of `count` items of a size in bytes; of any number of them where count is -1.
     private section(name: Section, itemSize: number, count = -1): Uint8Array<ArrayBuffer> {
         const bytes = this.sections.get(name);
         if (!bytes || bytes.length % itemSize !== 0 || (count >= 0 && bytes.length !== count * itemSize))

@@ -18,7 +18,7 @@ export class MapSearch {
         private readonly fold: (texts: readonly string[]) => readonly string[],
     ) {}
 
-    /** Folds for so many ms; whether all is done. A search does what is left. */
+    /** Folds for the given time in ms; whether all is done. A search does what is left. */
     prepare(time = Infinity): boolean {
         const count = this.map.arrays.stringEnds.length;
         const end = performance.now() + time;
@@ -31,7 +31,7 @@ export class MapSearch {
         return this.folded.length === count;
     }
 
-    /** Persons, those with each word whole first; at most so many. */
+    /** Persons, those with each word whole first; at most `limit`. */
     find(text: string, limit: number): number[] {
         this.prepare();
         const words = (this.fold([text])[0] ?? "").split(" ").filter((word) => word !== "");

@@ -40,7 +40,7 @@ function moved<List extends Numbers>(list: List, now: Int32Array, change = (valu
     return to;
 }
 
-// Whoever stood at the left of a couple stands at its right.
+// The left partner of a couple becomes the right one.
 function mirroredFlags(flags: Uint8Array, now: Int32Array): Uint8Array {
     const to = moved(flags, now, (flag) => flag & ~kJoined);
     for (let p = 0; p + 1 < flags.length; ++p) if ((flags[p]! & kJoined) !== 0) to[now[p + 1]!]! |= flags[p]! & kJoined;

@@ -41,7 +41,7 @@ export class PaperDialog {
     private shown: PaperSheets | null = null;
 
     // sheetsOf gives what is shown on that paper, or null before any family is open; look shows another view, and
-    // save hands the sheets to the browser's downloads as PNG of so many pixels an inch.
+    // save hands the sheets to the browser's downloads as PNG at a resolution in pixels an inch.
     constructor(
         private readonly ui: UiMessages,
         private readonly papers: readonly string[],

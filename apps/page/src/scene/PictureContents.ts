@@ -52,7 +52,7 @@ export class PictureContents implements BoxContents {
         return short === "" ? [] : [short, ...shorter];
     }
 
-    // Finds out what the persons of the picture are to the focus, for so many ms; true where all is known then.
+    // Finds out what the persons of the picture are to the focus, for the given time in ms; true where all is known then.
     learnKinships(time: number): boolean {
         this.kinshipKnown ||= this.kinships.learn(this.persons(), time);
         return this.kinshipKnown;

@@ -45,7 +45,7 @@ enum {
 @property(nonatomic, assign) BOOL places;          // of birth and death
 @property(nonatomic, assign) BOOL occupation;      // the first one
 @property(nonatomic, assign) BOOL marriage;        // its year, at its line
-@property(nonatomic, assign) BOOL hideLiving;      // nothing is stated of whoever may be living
+@property(nonatomic, assign) BOOL hideLiving;      // everyone who may be living is hidden
 @property(nonatomic, assign) int year;             // that hideLiving counts from; 0 is the present one
 
 @end

@@ -87,7 +87,7 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 @property(nonatomic, assign) int marks;      // everybody: how many second links become marks; -1 for all
 @property(nonatomic, assign) int effort;     // everybody: 0 to 100
 @property(nonatomic, assign) BOOL allParts;  // everybody: also those who are not connected with the focus
-// Everybody: an earlier picture of everybody, or nil. Whoever is in both, by id, stays where that picture has them as far
+// Everybody: an earlier picture of everybody, or nil. Who is in both, by id, stays where that picture has them as far
 // as the change allows; it is not looked at if it is of another view or direction, or if less than half of the family is
 // in it.
 @property(nonatomic, retain) OlvanePicture* earlier;
@@ -116,7 +116,7 @@ struct olvane_picture_options;  // of the C interface, whose header is not neede
 - (NSUInteger)foldedCount;
 
 // Near, ancestors, descendants, hourglass, relatives, kinship, everybody: whose boxes are not of the usual size, as they stand
-// on paper. Whoever is not in the family is passed over, and the last of two sizes for one person counts. The array
+// on paper. Who is not in the family is passed over, and the last of two sizes for one person counts. The array
 // lives until the next size, and no longer than the options.
 - (void)setBoxWidth:(float)width height:(float)height ofPerson:(int64_t)personId;
 - (const OlvaneBoxSize*)boxSizes;

@@ -45,7 +45,7 @@ constexpr std::array<Words, kPhrases> kWords{{
     {"add father", "Vater ergänzen", "añadir padre"},
     {"add mother", "Mutter ergänzen", "añadir madre"},
     {"{} of {}", "{} (zu {})", "{} de {}"},
-    {"Child of whoever is marked {}", "Kind der mit {} Bezeichneten", "Hijo de quienes llevan la marca {}"},
+    {"Child of those marked {}", "Kind der mit {} Bezeichneten", "Hijo de quienes llevan la marca {}"},
     {"Parent of who is marked {}", "Elternteil von wem {} trägt", "Padre o madre de quien lleva la marca {}"},
     {"Partner of who is marked {} as well", "Partner von wem auch {} trägt",
      "Pareja de quien también lleva la marca {}"},

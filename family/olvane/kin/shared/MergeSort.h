@@ -27,10 +27,10 @@ namespace detail {
 // Whether one item goes before another, by the rule that the caller knows.
 using IsBefore = bool (*)(const void* rule, const void* one, const void* other);
 
-// Sorts count items of so many bytes each, which may be copied as bytes.
+// Sorts `count` items of `size` bytes each, which may be copied as bytes.
 void sortBytes(void* first, std::size_t count, std::size_t size, IsBefore isBefore, const void* rule);
 
-// The places of count items of so many bytes each, in the order that the rule gives them. The items stay.
+// The places of `count` items of `size` bytes each, in the order that the rule gives them. The items stay.
 std::vector<std::size_t> sortedPlaces(const void* first, std::size_t count, std::size_t size,
                                       IsBefore isBefore, const void* rule);
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // German words for relatives. A cousin of a parent is an "Onkel zweiten Grades", a cousin's child a "Neffe zweiten
-// Grades", and only whoever is of one's own generation a cousin.
+// Grades", and only a person of one's own generation a cousin.
 
 #include <algorithm>
 #include <array>

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Spanish words for relatives. A cousin of a parent is a "tío segundo", a cousin's child a "sobrino segundo", and only
-// whoever is of one's own generation a cousin.
+// a person of one's own generation a cousin.
 
 #include <algorithm>
 #include <array>
