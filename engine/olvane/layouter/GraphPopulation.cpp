@@ -194,7 +194,7 @@ void TreeViewLayouter::addChildrenWithSpousesToPerson(TreeViewPerson& person, Tr
 // The mixed cases look redundant and are kept: sexes that contradict each other in the data (a man listed as
 // a mother) come through here, and a child would vanish from its couple without them. So is the last test
 // over the whole record of the admitted: a child of whom nobody stands on the chart yet is let through,
-// whoever asks.
+// for any person.
 bool TreeViewLayouter::checkIfPrefferedParent(TreeViewPerson& person, int& child, int& other) {
     int father = TreeViewPerson::kNoKey;
     int mother = TreeViewPerson::kNoKey;

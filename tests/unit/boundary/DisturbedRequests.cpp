@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A handful of golden cases that together take most roads through both layouters: step-children, cousins, unknown
+// A handful of golden cases that together take most paths through both layouters: step-children, cousins, unknown
 // parents, loops, many wives, the bare adapter. All have the sizes and options that every binding starts with.
 
 #include <unit/boundary/DisturbedRequests.h>

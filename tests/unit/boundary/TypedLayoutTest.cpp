@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The typed layout of the man 17 with his wife 42, their child 5 and his parents 3 and 4, whose places and lines
-// are worked out by hand in RoadOfOneRequestTest.cpp.
+// are worked out by hand in PathOfOneRequestTest.cpp.
 //
 //     y -220   [-1 father?][-2 mother?]   [-3 father?][-4 mother?]
 //     y -110               [3]------------[4]

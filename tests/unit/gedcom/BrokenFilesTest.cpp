@@ -170,7 +170,7 @@ TEST(BrokenFiles, emptyLinesAreCountedTogether) {
     EXPECT_EQ(allReported(data), "test.ged:1: note: empty line, the first of 4; skipped\n");
 }
 
-TEST(BrokenFiles, ofOneKindSoManyAreListedAndTheRestCounted) {
+TEST(BrokenFiles, ofOneKindTheFirstAreListedAndTheRestCounted) {
     std::string records = "0 @I1@ INDI\n";
     for (int line = 0; line < 250; ++line) records.append("not a line\n");
     const GedcomData data = read(document(records));

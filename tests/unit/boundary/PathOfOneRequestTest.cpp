@@ -45,20 +45,20 @@ const char kRoadText[] =
     "42:107:0:0:95,40,95,95|;"
     "5:67:110:0:95,95,95,95|95,110,95,95|;";
 
-TEST(RoadOfOneRequest, bridgeHandsTheWholeTextBack) {
+TEST(PathOfOneRequest, bridgeHandsTheWholeTextBack) {
     const auto bridge =
         OlvaneViewerBridge::initWithManagerWrap(std::make_shared<support::CaseManager>(fiveRelatives()));
     EXPECT_EQ(kRoadText, bridge.valuesForPersonId(17));
 }
 
-TEST(RoadOfOneRequest, entryFunctionGivesTheSameText) {
+TEST(PathOfOneRequest, entryFunctionGivesTheSameText) {
     EXPECT_EQ(kRoadText, FamilyViewLayout("17", std::make_shared<support::CaseManager>(fiveRelatives())));
 }
 
 // A host's own frame around the layouter, in the order of the request.
-class RoadOfOneRequestByPieces : public testing::Test {
+class PathOfOneRequestByPieces : public testing::Test {
 protected:
-    RoadOfOneRequestByPieces()
+    PathOfOneRequestByPieces()
         : request(fiveRelatives()), adapter(request.callbacks.dataAdapter()), focusKey(request.key(17)) {
         options[SharedTreeViewer::IndicateNonDisplayedRelationships] = true;
     }
@@ -72,7 +72,7 @@ protected:
     TreeSize size = olvane::familyTreeSize();
 };
 
-TEST_F(RoadOfOneRequestByPieces, focusGetsKeyZeroAndItsSexIsAskedFor) {
+TEST_F(PathOfOneRequestByPieces, focusGetsKeyZeroAndItsSexIsAskedFor) {
     EXPECT_EQ(0, focusKey);
     EXPECT_EQ(1, isMale());
     EXPECT_EQ((Calls{"sexOfPersonWithID 17"}), request.newCalls());
@@ -91,7 +91,7 @@ std::ostream& operator<<(std::ostream& out, const Placed& placed) {
     return out << placed.idText << " (" << placed.x << ", " << placed.y << ") flag " << placed.flag;
 }
 
-TEST_F(RoadOfOneRequestByPieces, everyoneHasAPlaceAndNoFlagInTheOrderOfTheWalk) {
+TEST_F(PathOfOneRequestByPieces, everyoneHasAPlaceAndNoFlagInTheOrderOfTheWalk) {
     TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale(), options, size);
     layouter.layoutForFocusNID();
     std::vector<Placed> placed;
@@ -106,7 +106,7 @@ TEST_F(RoadOfOneRequestByPieces, everyoneHasAPlaceAndNoFlagInTheOrderOfTheWalk) 
     EXPECT_EQ(expected, placed);
 }
 
-TEST_F(RoadOfOneRequestByPieces, onlyChildIsWidenedAndTheCouplesSpanIsAsWide) {
+TEST_F(PathOfOneRequestByPieces, onlyChildIsWidenedAndTheCouplesSpanIsAsWide) {
     TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale(), options, size);
     layouter.layoutForFocusNID();
     TreeViewPerson& focus = layouter.focusPerson;
@@ -116,14 +116,14 @@ TEST_F(RoadOfOneRequestByPieces, onlyChildIsWidenedAndTheCouplesSpanIsAsWide) {
     EXPECT_EQ(135.0f, layouter.familyUnitWidthForProximalPerson(focus));
 }
 
-TEST_F(RoadOfOneRequestByPieces, siblingsFindNobodyBesideTheFocus) {
+TEST_F(PathOfOneRequestByPieces, siblingsFindNobodyBesideTheFocus) {
     TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale(), options, size);
     layouter.layoutForFocusNID();
     ASSERT_EQ(1, layouter.focusPerson.getSiblingCount());
     EXPECT_EQ(focusKey, layouter.focusPerson.siblings[0].personId);
 }
 
-TEST_F(RoadOfOneRequestByPieces, piecesPutTogetherGiveTheSameText) {
+TEST_F(PathOfOneRequestByPieces, piecesPutTogetherGiveTheSameText) {
     std::string text;
     olvane::guarded([&] {
         TreeViewFamilyLayouter layouter(&adapter, focusKey, isMale(), options, size);
@@ -218,7 +218,7 @@ const Calls kRoadCalls = {
     "motherForPersonWithID 5",
 };
 
-TEST(RoadOfOneRequest, hostIsAskedExactlyAsOftenAndInTheOrderOfTheSteps) {
+TEST(PathOfOneRequest, hostIsAskedExactlyAsOftenAndInTheOrderOfTheSteps) {
     Request request(fiveRelatives());
     FamilyViewLayout("17", request.source);
     EXPECT_EQ(kRoadCalls, request.newCalls());
