@@ -138,7 +138,7 @@ private:
 std::optional<RowWriter> lastWriter;
 Rows lastRows;
 
-// The rows of ids from first on, at most so many, that row gives.
+// The rows that row gives of ids from first on, at most `count`.
 template <class Row>
 const Rows* rowsOf(const gedcom::GedcomData& data, std::uint32_t first, std::uint32_t count, std::size_t all,
                    const Row& row) {

@@ -4,7 +4,7 @@
 // How long a file of 100,000 persons takes from the drop until its picture stands, in every engine of this machine, and where
 // that time goes: node engines/opening.mjs [--only ENGINE] [--rounds N] [--wait MS] [--persons N]
 //
-// Each round opens the page in a browser of its own, waits so many milliseconds, and drops the file twice. Beside the seconds
+// Each round opens the page in a browser of its own, waits as long as --wait states, and drops the file twice. Beside the seconds
 // stands how long the browser ran on processors, which says more on a machine that others use as well.
 
 import { readdirSync, readFileSync } from "node:fs";

@@ -34,7 +34,7 @@ support::CaseFile fiveRelatives() {
     return family("17+42: 5; 3+4: 17");
 }
 
-const char kRoadText[] =
+const char kWholeText[] =
     "17:27:0:0:82,40,107,40|55,-15,55,-15|55,0,55,-15|;"
     "3:-12:-110:0:55,-70,55,-15|42,-70,67,-70|15,-125,-25,-125|15,-110,15,-125|;"
     "-1:-92:-220:0:-25,-180,-25,-125|-37,-180,-12,-180|:M:3;"
@@ -48,11 +48,11 @@ const char kRoadText[] =
 TEST(PathOfOneRequest, bridgeHandsTheWholeTextBack) {
     const auto bridge =
         OlvaneViewerBridge::initWithManagerWrap(std::make_shared<support::CaseManager>(fiveRelatives()));
-    EXPECT_EQ(kRoadText, bridge.valuesForPersonId(17));
+    EXPECT_EQ(kWholeText, bridge.valuesForPersonId(17));
 }
 
 TEST(PathOfOneRequest, entryFunctionGivesTheSameText) {
-    EXPECT_EQ(kRoadText, FamilyViewLayout("17", std::make_shared<support::CaseManager>(fiveRelatives())));
+    EXPECT_EQ(kWholeText, FamilyViewLayout("17", std::make_shared<support::CaseManager>(fiveRelatives())));
 }
 
 // A host's own frame around the layouter, in the order of the request.
@@ -131,11 +131,11 @@ TEST_F(PathOfOneRequestByPieces, piecesPutTogetherGiveTheSameText) {
         olvane::ResultBounds bounds;
         layouter.graphIterator(olvane::resultWriter(request.glue, bounds, text));
     });
-    EXPECT_EQ(kRoadText, text);
+    EXPECT_EQ(kWholeText, text);
 }
 
 // Each question below stands where one step needs it; the comments name the steps.
-const Calls kRoadCalls = {
+const Calls kWholeCalls = {
     // the focus
     "sexOfPersonWithID 17",
     // the wife
@@ -221,7 +221,7 @@ const Calls kRoadCalls = {
 TEST(PathOfOneRequest, hostIsAskedExactlyAsOftenAndInTheOrderOfTheSteps) {
     Request request(fiveRelatives());
     FamilyViewLayout("17", request.source);
-    EXPECT_EQ(kRoadCalls, request.newCalls());
+    EXPECT_EQ(kWholeCalls, request.newCalls());
 }
 
 }  // namespace
