@@ -25,7 +25,7 @@ test("the box that was acted on hands its place to the new focus, and all others
     assert.deepEqual(glide.placeOf(after.boxesOf(1)[0]!, start), { x: 400, y: -110 });
 });
 
-test("whoever was not there before is in place at once, and everybody is at the end", () => {
+test("a person who was not there before is in place at once, and everybody is at the end", () => {
     const [newcomer] = after.boxesOf(4);
     for (const now of [-Infinity, start, start + kGlideTime / 2])
         assert.deepEqual(glide.placeOf(newcomer!, now), { x: 620, y: 0 });

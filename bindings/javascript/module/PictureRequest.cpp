@@ -123,7 +123,7 @@ picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked) {
     return picture;
 }
 
-// The file's next chart of everybody keeps the places of the earlier file's last one. Whoever has an xref is the person
+// The file's next chart of everybody keeps the places of the earlier file's last one. A person with an xref is the one
 // of that xref there; nobody else is in both. False where there is no such chart.
 bool takePlaces(OpenFile& file, const OpenFile& earlier) {
     if (!earlier.everybody) return false;
@@ -171,7 +171,7 @@ OLVANE_EXPORT("later_side") int laterSide(int view, int direction, int mirrored)
     return static_cast<int>(charts::laterSideOf(request));
 }
 
-// Room for so many numbers, which JavaScript fills before it asks for a picture.
+// Room for `count` numbers, which JavaScript fills before it asks for a picture.
 OLVANE_EXPORT("picture_options") double* pictureOptionsRoom(std::size_t count) {
     pictureOptions.assign(count, 0);
     return pictureOptions.data();

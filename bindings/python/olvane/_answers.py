@@ -2,7 +2,7 @@
 # SPDX-License-Identifier: MIT
 """A host's methods as callbacks of C, and what they raise.
 
-An exception can't pass through C, so a callback keeps what the host raised and reports a failure; whoever called C raises it
+An exception can't pass through C, so a callback keeps what the host raised and reports a failure; the caller of C raises it
 again when the call has ended. Nothing else may raise in a callback, but a signal's handler can: see the hook below.
 """
 

@@ -39,7 +39,7 @@ constexpr ViewSet setOf(View view) {
 
 // An option of a request for a picture.
 //
-// set writes what the option takes into a request. Of anything else it writes what whoever checks the request refuses, if it
+// set writes what the option takes into a request. Of anything else it writes what the check of the request refuses, if it
 // refuses anything.
 struct ViewOption {
     OptionForm form;

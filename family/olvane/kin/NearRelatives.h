@@ -17,7 +17,7 @@ OLVANE_API std::vector<Place> siblingsOf(const KinGraph& graph, Place person);
 
 // Whom to show first where nobody said: the person with the most relatives near, two generations up and down and across, the
 // first of several. Parents count most, so that the picture has all its parts; isNamed says of whom a name is known, and
-// whoever has none comes behind all others of ordinary families. kNobody in a family of nobody.
+// a person without any comes behind all others of ordinary families. kNobody in a family of nobody.
 OLVANE_API Place bestFocus(const KinGraph& graph, const std::function<bool(Place)>& isNamed);
 
 }  // namespace olvane::kin

@@ -58,7 +58,7 @@ TEST(ViewOptions, takeNumbersInTheirRangeAndWholeOnesWhereTheyAreCounted) {
     EXPECT_FALSE(takes(viewOption("direction").form, 4));
 }
 
-// A word that is none stays none, so that whoever makes a picture refuses it; 256 is not 0.
+// A word that is none stays none, so that the call for a picture refuses it; 256 is not 0.
 TEST(ViewOptions, keepWhatIsNoWordOutOfRange) {
     ViewRequest request;
     for (const double number : {256.0, -1.0, 1e300}) {

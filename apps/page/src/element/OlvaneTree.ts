@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The viewer as an element of its own, <olvane-tree>: the picture, the buttons over it and the panel about the
-// selected person. Whoever places it listens to its events and sets what it shows; it keeps no history, opens
+// selected person. The page around it listens to its events and sets what it shows; it keeps no history, opens
 // no dialog and stores nothing. Everything inside lies in its own shadow tree, so that any number of them stand
 // on one page. Here are its attributes, properties and methods; Viewer is what they act on.
 

@@ -18,7 +18,7 @@ import type { Picture } from "../view/Picture";
 import { kUsualState, type Reader, type ViewState } from "../view/ViewState";
 import type { BoxRenderer } from "./treeTypes";
 
-const kSoonSearched = 6000; // persons; among so many, kinship is known before a picture of usual size is drawn
+const kSoonSearched = 6000; // persons; up to here, kinship is known before a picture of usual size is drawn
 const kKinshipTime = 12; // ms at a time for finding it out
 const kWarmUps = 8;
 const kWarmUpPause = 120; // ms

@@ -208,7 +208,7 @@ export class Scene {
         }
 
         this.glide = glide;
-        // Whoever was found far away is not travelled to: the way would show, and draw, all that lies between.
+        // To a person far away the picture does not travel: the way would show, and draw, all that lies between.
         const wasInSight = touches(before.areaOf(held), this.camera.window());
         if (wasInSight) leaveGhosts(this.ghosts, picture, shift, oldElements);
         else this.ghosts.replaceChildren();
