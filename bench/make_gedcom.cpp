@@ -37,7 +37,7 @@ std::string wordOf(long number) {
     return word;
 }
 
-// One of so many words, the first ones oftenest.
+// One of that many words, the first ones most often.
 std::string wordAmong(long words, long person, long salt) {
     const auto mixed =
         (static_cast<unsigned long long>(person) * 64 + static_cast<unsigned long long>(salt)) *

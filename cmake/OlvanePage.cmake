@@ -21,7 +21,7 @@ if(NOT OLVANE_EMCMAKE OR NOT OLVANE_NODE OR NOT OLVANE_NPM)
   if(OLVANE_BUILD_PAGE STREQUAL "ON")
     message(FATAL_ERROR "OLVANE_BUILD_PAGE needs emscripten, nodejs and npm; install them or switch the option off")
   endif()
-  message(STATUS "olvane: the viewer page is not built, for want of emscripten, nodejs or npm")
+  message(STATUS "olvane: the viewer page is not built, because emscripten, nodejs or npm is missing")
   return()
 endif()
 

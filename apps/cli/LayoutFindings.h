@@ -12,7 +12,7 @@
 
 namespace olvane::cli {
 
-// What makes one picture hard to read, by the ids of those whom it is about. A family goes by the id of its first child,
+// What makes one picture hard to read, by the ids of those whom it is about. A family has the id of its first child,
 // or by that of a parent where it has none.
 struct LayoutFindings {
     struct Pair {

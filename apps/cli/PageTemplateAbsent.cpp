@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Stands in for the page where it could not be built, for want of a compiler for browsers.
+// Stands in for the page where it could not be built, because no compiler for browsers is installed.
 
 #include <cli/PageTemplate.h>
 

@@ -54,10 +54,10 @@ typedef enum olvane_status {
     OLVANE_UNREADABLE = 9 /* a file cannot be opened, or is not GEDCOM */
 } olvane_status;
 
-/* A sentence in English for every status, and for any other number one that says so. Lives for ever. */
+/* A sentence in English for every status, and for any other number one that says so. Valid until the program ends. */
 OLVANE_C_API const char* olvane_status_text(olvane_status status);
 
-/* "MAJOR.MINOR.PATCH" of the library that is loaded. Lives for ever. */
+/* "MAJOR.MINOR.PATCH" of the library that is loaded. Valid until the program ends. */
 OLVANE_C_API const char* olvane_version(void);
 
 /* ---- The host's data ----------------------------------------------------------------------------------- */

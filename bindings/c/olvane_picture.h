@@ -116,7 +116,7 @@ typedef struct olvane_picture_way {
     uint32_t ancestor_count;
     uint32_t first_piece;
     uint32_t piece_count;
-    int32_t kind;      /* 0 by blood, 1 by adoption and the like, 2 by marriage */
+    int32_t kind;      /* 0 by blood, 1 by adoption, fostering or similar, 2 by marriage */
     const char* words; /* what the other person is to the focus by this way alone */
 } olvane_picture_way;
 

@@ -1,7 +1,7 @@
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
 
-# Sets OLVANE_GNUSTEP_FOUND where the C++ compiler at hand takes Objective-C++ and GNUstep's Foundation is installed,
+# Sets OLVANE_GNUSTEP_FOUND where the C++ compiler in use takes Objective-C++ and GNUstep's Foundation is installed,
 # and OLVANE_GNUSTEP_FLAGS to what a source needs then, OLVANE_GNUSTEP_C_FLAGS for plain Objective-C.
 include(CheckLanguage)
 

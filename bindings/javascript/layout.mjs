@@ -30,7 +30,7 @@ function readAnswer(instance, answer, wanted) {
     }
 }
 
-// A host that could not be heard for want of memory has not failed.
+// A host that could not be asked because memory is short has not failed.
 function statusOf(result, thrown) {
     return thrown?.[0] instanceof OutOfMemory ? STATUSES.indexOf("outOfMemory") : result.status;
 }

@@ -783,7 +783,7 @@ export class GedcomFile {
      */
     search(text: string, limit?: number): SearchHit[];
     /**
-     * Makes the index of searches for about so many milliseconds, or all of it. True once it is complete: a program that
+     * Makes the index of searches for about that many milliseconds, or all of it. True once it is complete: a program that
      * asks whenever it has nothing else to do has no slow first search. Throws GedcomError where memory runs out.
      */
     prepareSearch(milliseconds?: number): boolean;

@@ -64,7 +64,7 @@ std::string lastFamilyJson;
 // Ids that were asked for last.
 std::vector<FamilyId> lastIds;
 
-// 0, or the number of what went wrong: 1 for rows that are refused, with the error as JSON, 2 for want of memory.
+// 0, or the number of what went wrong: 1 for rows that were refused, with the error as JSON, 2 where memory is short.
 constexpr int kRefused = 1;
 constexpr int kLacksMemory = 2;
 
@@ -323,7 +323,7 @@ void familyNumbers(ColumnsInMaking* columns, std::size_t column, int type, const
         NumberColumn(static_cast<NumberColumn::Type>(type), place, count);
 }
 
-// The texts at place, each ended by a zero byte. 0, or 2 for want of memory.
+// The texts at place, each ended by a zero byte. 0, or 2 where memory is short.
 OLVANE_EXPORT("family_texts")
 int familyTexts(ColumnsInMaking* columns, std::size_t column, const char* place, std::size_t count) {
     return js::outcomeOf([&] {
@@ -336,7 +336,7 @@ int familyTexts(ColumnsInMaking* columns, std::size_t column, const char* place,
     });
 }
 
-// 0 with the family in *family; 1 with an error in last_family_text; 2 for want of memory.
+// 0 with the family in *family; 1 with an error in last_family_text; 2 where memory is short.
 OLVANE_EXPORT("family_create") int familyCreate(const ColumnsInMaking* columns, HeldFamily** family) {
     *family = nullptr;
     return js::outcomeOf([&] { *family = new HeldFamily{Family(columns->columns)}; });
@@ -375,7 +375,7 @@ OLVANE_EXPORT("family_has") int familyHas(const HeldFamily* family, double id) {
     return family->table.hasPerson(static_cast<std::int64_t>(id)) ? 1 : 0;
 }
 
-// Null for want of memory.
+// Null where memory is short.
 OLVANE_EXPORT("family_ids") const std::uint32_t* familyIds(const HeldFamily* family, int ofFamilies) {
     static const std::uint32_t none = 0;
     try {
@@ -400,7 +400,7 @@ OLVANE_EXPORT("family_family") const char* familyFamily(const HeldFamily* family
         [&](js::JsonText& json) { js::writeFamily(json, family->table, static_cast<std::int64_t>(number)); });
 }
 
-// The first search after an edit makes the index. Null for want of memory.
+// The first search after an edit makes the index. Null where memory is short.
 OLVANE_EXPORT("family_search")
 const char* familySearch(HeldFamily* family, const char* text, std::size_t limit) {
     try {
@@ -412,7 +412,7 @@ const char* familySearch(HeldFamily* family, const char* text, std::size_t limit
     }
 }
 
-// The table as a GEDCOM file. Null for want of memory.
+// The table as a GEDCOM file. Null where memory is short.
 OLVANE_EXPORT("family_gedcom") const char* familyGedcom(const HeldFamily* family) {
     try {
         js::lastFamilyJson = gedcom::gedcomTextOf(family->table);

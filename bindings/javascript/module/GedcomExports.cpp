@@ -126,7 +126,7 @@ OLVANE_EXPORT("gedcom_family_facts") const char* gedcomFamilyFacts(const OpenFil
     return js::textOrRefusal([&] { return js::factsText(file->data.factsOfFamily(id)); });
 }
 
-// Adds so many persons more to the index: 1 where all are in it, 0 where some are to come, -1 for want of memory.
+// Adds more persons to the index, at most that many: 1 where all are in it, 0 where some are to come, -1 where memory is short.
 OLVANE_EXPORT("gedcom_prepare_search") int gedcomPrepareSearch(OpenFile* file, std::size_t persons) {
     try {
         return file->personIndex.add(file->searchTexts, persons) ? 1 : 0;
@@ -141,7 +141,7 @@ OLVANE_EXPORT("gedcom_search") const char* gedcomSearch(OpenFile* file, const ch
     return js::textOrRefusal([&] { return js::searchJson(file->index(), file->searchTexts, text, limit); });
 }
 
-// The text of a layout, or else its records. Null for want of memory.
+// The text of a layout, or else its records. Null where memory is short.
 OLVANE_EXPORT("gedcom_layout")
 js::LayoutAnswer* gedcomLayout(OpenFile* file, int view, double focus, int withText) {
     try {

@@ -185,7 +185,7 @@ OLVANE_EXPORT("gedcom_family_count") std::size_t gedcomFamilyCount(const OpenFil
 }
 
 // Releases the rows, and makes what the first picture asks for: a copy of the memory then has no more than is needed, and a
-// worker has done what the page would wait for. False for want of memory.
+// worker has done what the page would wait for. False where memory is short.
 OLVANE_EXPORT("gedcom_prepare") int gedcomPrepare(OpenFile* file) {
     try {
         js::lastWriter.reset();

@@ -7,7 +7,7 @@
 
 // What the module asks of JavaScript, and how JavaScript answers.
 //
-// Units: ids are doubles here, since JavaScript has no other numbers; it hands over whole ones only.
+// Units: ids are doubles here, since JavaScript has no other numbers; it passes whole ones only.
 namespace olvane::js {
 
 // A data source whose questions JavaScript answers for the layout that is running: its functions keep what the

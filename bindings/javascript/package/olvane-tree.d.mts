@@ -64,7 +64,7 @@ export declare class OlvaneTree extends HTMLElement {
     readonly state: ViewState | null;
     /** The selected person: the one that the panel is about. */
     readonly selected: Person | null;
-    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be had or read. */
+    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read. */
     load(address: string): Promise<void>;
     /** Shows the bytes of a GEDCOM file. Rejects where they are none. */
     open(bytes: Uint8Array, name?: string): Promise<void>;

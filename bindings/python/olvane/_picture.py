@@ -34,7 +34,7 @@ class WayKind(IntEnum):
     """How a way between two persons runs."""
 
     BLOOD = 0
-    LEGAL = 1  # by adoption and the like
+    LEGAL = 1  # by adoption, fostering or similar
     MARRIAGE = 2
 
 

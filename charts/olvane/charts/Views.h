@@ -20,7 +20,7 @@ struct ViewRequest {
     bool unknownParents = true;  // family, pedigree: parents who are not known have boxes of their own
 };
 
-// The picture of any view, in one call. The engine's two views ask the source, all others the graph; both speak of
+// The picture of any view, in one call. The engine's two views ask the source, all others the graph; both mean
 // the same persons, by the same ids.
 //
 // Fails: as chartOf, familyLayout and pedigreeLayout, with std::invalid_argument for sizes that are not between 0 and

@@ -88,7 +88,7 @@ Reference FamilyEdit::without(Reference list, FamilyId id) {
     return shorter.size() == old.size() ? list : blobs().add(std::span<const FamilyId>(shorter));
 }
 
-// Everything that may fail for want of memory. What it does nobody sees: room, and chunks that are the table's own.
+// Everything that may fail where memory is short. Its effects are not visible: room, and chunks that are the table's own.
 void FamilyEdit::prepare() {
     Family::State& own = *family_.state_;
     if (addsPerson_) {

@@ -16,7 +16,7 @@ namespace olvane {
 // The lists of rows that a table of a family is filled from.
 enum class FamilyTable : std::uint8_t { persons, spouses, children, families, familyChildren, names, fields };
 
-// "persons", "spouses", "children", "families", "family children", "names" or "fields". Lives for ever.
+// "persons", "spouses", "children", "families", "family children", "names" or "fields". Valid until the program ends.
 OLVANE_API std::string_view familyTableName(FamilyTable table);
 
 // What a table of a family refuses. Thrown before anything of the table changes.

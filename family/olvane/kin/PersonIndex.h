@@ -63,7 +63,7 @@ public:
     explicit PersonIndex(const SearchTexts& texts);
     explicit PersonIndex(const Family& family);
 
-    // Adds the next persons, at most so many, for a program that has other things to do in between. True where all of
+    // Adds the next persons, at most that many, for a program that has other things to do in between. True where all of
     // the texts are in; until then a search finds those who are. texts are the same each time.
     bool add(const SearchTexts& texts, std::size_t most = kEverybody);
 

@@ -22,7 +22,7 @@ enum class EncodingSort : std::uint8_t {
 
 // An encoding that files come in.
 //
-// Holds: lives for ever. Of a platform's encoding there are the names that iconv and a browser's TextDecoder have
+// Holds: valid until the program ends. Of a platform's encoding there are the names that iconv and a browser's TextDecoder have
 //        for it, chosen so that both read the same.
 struct KnownEncoding {
     std::string_view name;  // to be shown

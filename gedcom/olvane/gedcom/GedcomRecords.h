@@ -114,7 +114,7 @@ struct Family {
 
 // Something that a file states of a person or a couple: an event or an attribute.
 //
-// Holds: tag is in capitals and one of the standard's, and lives for ever. value is what stands behind the
+// Holds: tag is in capitals and one of the standard's, and valid until the program ends. value is what stands behind the
 //        tag, or else the TYPE below it; the texts are as those of a name. An event that the file says did not
 //        happen is no fact.
 struct Fact {
@@ -125,7 +125,7 @@ struct Fact {
     LineNumber line = 0;
 };
 
-// A line of the file that no other table has: a note, a source, a page, a media file and so on, with the lines below it
+// A line of the file that is in no other table: a note, a source, a page, a media file and so on, with the lines below it
 // behind it.
 //
 // Holds: tag is as written, in ASCII. value is valid UTF-8 without control characters but line ends: of several lines

@@ -27,7 +27,7 @@ struct WriteOptions {
 // Holds: UTF-8. Read again with facts, it gives the same persons and families with the same ids, relatives,
 //        names, dates and facts, and read with details the same details. Identifiers stay where each stands for one record; others are made. Of a
 //        hidden person there are sex and links alone, but for links to other parents than father and mother, so that
-//        nothing speaks of an adoption; of a family with a hidden partner, or
+//        nothing mentions an adoption; of a family with a hidden partner, or
 //        with hidden children and no partner, there is nothing but who belongs to it. No identifier of theirs is
 //        in the text, not even for another record.
 //        With anybody hidden, free text of others stays out too: the values of EVEN and FACT, and any value,

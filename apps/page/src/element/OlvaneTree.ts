@@ -86,7 +86,7 @@ export class OlvaneTree extends HTMLElement {
         return this.family?.person(this.viewer.panelPersonId) ?? null;
     }
 
-    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be had or read. */
+    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read. */
     async load(address: string): Promise<void> {
         const response = await fetch(address);
         if (!response.ok) throw new Error(`${response.url}: ${response.status} ${response.statusText}`);

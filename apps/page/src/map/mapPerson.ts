@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Somebody of a map in the form that the rest of the page speaks of persons in. What a map does not know is empty.
+// Somebody of a map in the form that the rest of the page uses for persons. What a map does not know is empty.
 
 import type { GedcomDate, Person } from "olvane";
 import type { FamilyMap } from "./FamilyMap";

@@ -148,7 +148,7 @@ export const uiEnglish: UiMessages = {
             `${sheets} ${sheets === 1 ? "sheet" : "sheets"}, names of at least ${points} points, scale ${scale}.`,
         cut: (boxes) => (boxes === 1 ? "1 box is on no sheet whole." : `${boxes} boxes are on no sheet whole.`),
     },
-    inSight: "Only what is in sight",
+    inSight: "Only the visible part",
     saved: (name) => `Saved as ${name}.`,
     savedSmaller: (name, percent) =>
         `Saved as ${name}, at ${percent} % of its size: browsers draw no larger one. SVG has no such limit.`,

@@ -67,7 +67,7 @@ export class PictureContents implements BoxContents {
     }
 
     // How many relatives of a box are off the picture: -1 for none, 0 for an unknown number. The pedigree's flags
-    // speak of ancestors alone, and its last column has none; so only the family view goes by its flag.
+    // state ancestors alone, and its last column has none; so only the family view uses its flag.
     hiddenOf(box: Box): number {
         const { parents, partners, children } = box.hidden;
         const hidden = parents + partners + children;

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The picture on the screen. Only what is in sight has elements, with some room around it, so that panning
+// The picture on the screen. Only the visible part has elements, with some room around it, so that panning
 // moves one group and nothing else. Where too many boxes to be read are in sight, they are drawn in overview mode: one
 // path a colour.
 //

@@ -81,7 +81,7 @@ export class Chrome {
         return this.remarks.element;
     }
 
-    // encoding is the one that was chosen, null where the bytes of the file are not at hand.
+    // encoding is the one that was chosen, null where the bytes of the file are not available.
     showEncoding(encoding: string | null): void {
         this.file.showEncoding(encoding);
     }

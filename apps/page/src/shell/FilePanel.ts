@@ -54,7 +54,7 @@ export class FilePanel {
         this.element = this.filled();
     }
 
-    // encoding is the one that was chosen, null where the bytes of the file are not at hand.
+    // encoding is the one that was chosen, null where the bytes of the file are not available.
     showEncoding(encoding: string | null): void {
         this.encodingRow.hidden = encoding === null;
         this.encoding.value = encoding ?? "";

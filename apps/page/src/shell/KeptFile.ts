@@ -27,7 +27,7 @@ export async function keptFile(): Promise<KeptBytes | null> {
     return found ?? null;
 }
 
-/** False where the browser keeps nothing, in a private window or for want of room. */
+/** False where the browser keeps nothing, in a private window or where space is short. */
 export function keepFile(file: KeptBytes): Promise<boolean> {
     return within("readwrite", (store) => store.put(file, kKey)).then(
         () => true,

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // A link that shows somebody else what is seen here: beside the state of the picture it says who is selected, which part of
-// the picture is in sight and how large, the language and the colours. The address that the page itself goes by says no more
+// the picture is in sight and how large, the language and the colours. The address that the page itself uses says no more
 // than the state, so that a step back changes neither language nor zoom.
 
 import type { Person } from "olvane";
