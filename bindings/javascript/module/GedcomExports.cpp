@@ -15,7 +15,6 @@
 #include <olvane/gedcom/GedcomEncodings.h>
 #include <olvane/gedcom/GedcomMedia.h>
 #include <olvane/gedcom/GedcomReader.h>
-#include <olvane/source/GedcomLabels.h>
 #include <olvane/source/LimitedDataSource.h>
 
 #include "GedcomJson.h"
