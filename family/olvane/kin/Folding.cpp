@@ -47,7 +47,7 @@ const char* foldedLetter(char32_t code) {
     const FoldedLetter* const end = kFoldings + kFoldingCount;
     const FoldedLetter* const found = std::lower_bound(
         kFoldings, end, code, [](const FoldedLetter& each, char32_t value) { return each.letter < value; });
-    return found != end && found->letter == code ? kFoldedLetters[found->folded] : nullptr;
+    return found != end && found->letter == code ? kFoldedLetters + found->folded : nullptr;
 }
 
 // Also those that Unicode counts as letters. Asked for letters beyond ASCII alone.

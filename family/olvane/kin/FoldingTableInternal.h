@@ -8,7 +8,7 @@
 
 namespace olvane::kin {
 
-// A letter and the place of what it is compared by. Sorted by letter.
+// A letter, and where in kFoldedLetters stands what it is compared by. Sorted by letter.
 struct FoldedLetter {
     std::uint16_t letter;
     std::uint16_t folded;
@@ -19,7 +19,8 @@ struct LetterRange {
     std::uint32_t last;
 };
 
-extern const char* const kFoldedLetters[];
+// One text behind the other, each ended by a zero.
+extern const char kFoldedLetters[];
 extern const FoldedLetter kFoldings[];
 extern const std::size_t kFoldingCount;
 // Accents and the like, which are left out. Sorted.
