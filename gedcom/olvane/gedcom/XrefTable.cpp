@@ -11,7 +11,12 @@
 
 #include <algorithm>
 #include <cstring>
+
+#ifdef __EMSCRIPTEN__
+#include <unistd.h>
+#else
 #include <random>
+#endif
 
 #include <olvane/gedcom/LineScannerInternal.h>
 
@@ -34,8 +39,14 @@ std::uint64_t mixed(std::uint64_t a, std::uint64_t b) {
 }
 
 std::uint64_t randomSeed() {
+#ifdef __EMSCRIPTEN__
+    // The standard's device brings the words of all errors of a system along, and printf.
+    std::uint64_t seed = 0;
+    return getentropy(&seed, sizeof seed) == 0 ? seed : 0;
+#else
     std::random_device device;
     return std::uint64_t{device()} << 32 | device();
+#endif
 }
 
 }  // namespace

@@ -4,8 +4,13 @@
 #include <olvane/kin/detail/TextNumbers.h>
 
 #include <array>
-#include <random>
 #include <stdexcept>
+
+#ifdef __EMSCRIPTEN__
+#include <unistd.h>
+#else
+#include <random>
+#endif
 
 namespace olvane::kin {
 
@@ -13,11 +18,20 @@ namespace {
 
 constexpr std::size_t kFirstSlots = 64;
 
+std::uint64_t randomNumber() {
+#ifdef __EMSCRIPTEN__
+    // The standard's device brings the words of all errors of a system along, and printf.
+    std::uint64_t number = 0;
+    return getentropy(&number, sizeof number) == 0 ? number : 0;
+#else
+    std::random_device device;
+    return (std::uint64_t{device()} << 32U) | device();
+#endif
+}
+
 // Odd, so that no bit of a text is lost. Where a system has no random numbers, the golden ratio's digits spread texts.
 std::uint64_t randomFactor() {
-    std::random_device device;
-    const std::uint64_t random = (std::uint64_t{device()} << 32U) | device();
-    return (random ^ 0x9E3779B97F4A7C15U) | 1U;
+    return (randomNumber() ^ 0x9E3779B97F4A7C15U) | 1U;
 }
 
 // Eight bytes of a text, or those that are left.
