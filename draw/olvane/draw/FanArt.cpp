@@ -252,15 +252,18 @@ private:
     void appendTexts(std::size_t i, const FanText& text) {
         if (fan_.arcs[i].ring == 0) return appendMiddle(fitFanText(text, roomInMiddle(i)));
         const double depth = outerOf(i) - innerOf(i) - 2 * kPad;
-        const bool isBroad = roomAcross(i, middleOf(i), kUsualTextHeight) >= depth;
-        FanTextLines lines = fitFanText(text, isBroad ? roomOfAcross(i) : roomOfAlong(i));
-        bool isAcross = isBroad;
-        const bool hasChoice = isBroad || roomAcross(i, middleOf(i), kUsualTextHeight) >= kLeastAcross;
-        if (hasChoice && (lines.lines.empty() || lines.loss == picture::NameLoss::letters)) {
-            FanTextLines others = fitFanText(text, isBroad ? roomOfAlong(i) : roomOfAcross(i));
+        const double broad = roomOfAcross(i).width(0, kUsualTextHeight);
+        bool isAcross = broad >= depth;
+        const auto linesOf = [&](bool across) {
+            return fitFanText(text, across ? roomOfAcross(i) : roomOfAlong(i));
+        };
+        FanTextLines lines = linesOf(isAcross);
+        if (broad >= std::min(depth, kLeastAcross) &&
+            (lines.lines.empty() || lines.loss == picture::NameLoss::letters)) {
+            FanTextLines others = linesOf(!isAcross);
             if (!others.lines.empty() && (lines.lines.empty() || others.loss < lines.loss)) {
                 lines = std::move(others);
-                isAcross = !isBroad;
+                isAcross = !isAcross;
             }
         }
         if (isAcross) {
@@ -275,45 +278,38 @@ private:
     bool isBelow(std::size_t i) const { return picture::sineOfDegrees(angleOf(i) + 90) < -1e-9; }
 
     FanTextRoom roomInMiddle(std::size_t i) const {
-        const double r = outerOf(i) - kPad;
-        return {2 * r, [r](double offset, double height) {
-                    const double reach = std::abs(offset) + height / 2;
-                    return reach < r ? 2 * std::sqrt(r * r - reach * reach) : 0;
-                }};
+        FanTextRoom room = roomOf(i, FanTextRoom::Form::disc);
+        room.height = 2 * room.outer;
+        return room;
     }
 
     FanTextRoom roomOfAcross(std::size_t i) const {
-        return {outerOf(i) - innerOf(i) - 2 * kPad, [this, i](double offset, double height) {
-                    return roomAcross(i, middleOf(i) + (isBelow(i) ? offset : -offset), height);
-                }};
+        FanTextRoom room = roomOf(i, FanTextRoom::Form::across);
+        room.height = room.outer - room.inner;
+        room.isReversed = isBelow(i);
+        const double span = fan_.arcs[i].to - fan_.arcs[i].from;
+        if (span < 170) room.slope = slopeOf(span / 2);
+        return room;
     }
 
     // As high as the cell is broad at its inner end.
     FanTextRoom roomOfAlong(std::size_t i) const {
-        const double half = std::min(89.0, (fan_.arcs[i].to - fan_.arcs[i].from) / 2);
-        const double inner = innerOf(i) + kPad;
-        const double breadth = 2 * inner * picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
-        const double outer = outerOf(i) - kPad;
-        return {breadth - 2, [this, i, inner, outer](double offset, double height) {
-                    const double reach = std::abs(offset) + height / 2;
-                    const double end = reach < outer ? std::sqrt(outer * outer - reach * reach) : 0;
-                    return std::max(0.0, 2 * std::min(middleOf(i) - inner, end - middleOf(i)));
-                }};
+        FanTextRoom room = roomOf(i, FanTextRoom::Form::along);
+        room.height = 2 * room.inner * slopeOf(std::min(89.0, (fan_.arcs[i].to - fan_.arcs[i].from) / 2)) - 2;
+        return room;
     }
 
-    // The width of a line of text of that height at that radius.
-    double roomAcross(std::size_t i, double r, double height) const {
-        const double outer = outerOf(i) - kPad;
-        const double reach = r + height / 2;
-        if (reach >= outer) return 0;
-        double room = 2 * std::sqrt(outer * outer - reach * reach);
-        const double span = fan_.arcs[i].to - fan_.arcs[i].from;
-        if (span < 170) {
-            const double half = span / 2;
-            const double slope = picture::sineOfDegrees(half) / picture::sineOfDegrees(half + 90);
-            room = std::min(room, 2 * ((r - height / 2) * slope - kPad));
-        }
-        return std::max(0.0, room);
+    FanTextRoom roomOf(std::size_t i, FanTextRoom::Form form) const {
+        FanTextRoom room;
+        room.form = form;
+        room.inner = innerOf(i) + kPad;
+        room.middle = middleOf(i);
+        room.outer = outerOf(i) - kPad;
+        return room;
+    }
+
+    static double slopeOf(double degrees) {
+        return picture::sineOfDegrees(degrees) / picture::sineOfDegrees(degrees + 90);
     }
 
     void appendMiddle(const FanTextLines& text) {
@@ -369,24 +365,25 @@ private:
         const int top = svg_.height - kMargin + 12;
         double widest = 0;
         int y = top;
-        const auto addText = [&](std::string_view content) {
-            const std::string text = fitLine(content, {kLegendSize, false}, 300);
+        for (std::size_t i = 0; i < lines_.size() + (sign_.empty() ? 0 : 1); ++i) {
+            std::string name;
+            if (i < lines_.size()) {
+                const auto box = static_cast<std::size_t>(lines_[i]);
+                put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
+                    "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line,
+                    "\"/>\n");
+                name = cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language));
+            } else {
+                put(legend, "<text x=\"", whole(kMargin + 14), "\" y=\"", whole(y + 11),
+                    "\" text-anchor=\"middle\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().text,
+                    "\">", Escaped{sign_}, "</text>\n");
+                name = wordsOf(Phrase::meansElsewhere, options_.language);
+            }
+            const std::string text = fitLine(name, {kLegendSize, false}, 300);
             widest = std::max(widest, textWidth(text, {kLegendSize, false}));
             put(legend, "<text x=\"", whole(kMargin + 38), "\" y=\"", whole(y + 11), "\" font-size=\"",
                 number(kLegendSize), "\" fill=\"", theme().quietText, "\">", Escaped{text}, "</text>\n");
             y += kLegendPitch;
-        };
-        for (const Index line : lines_) {
-            const auto box = static_cast<std::size_t>(line);
-            put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
-                "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line, "\"/>\n");
-            addText(cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language)));
-        }
-        if (!sign_.empty()) {
-            put(legend, "<text x=\"", whole(kMargin + 14), "\" y=\"", whole(y + 11),
-                "\" text-anchor=\"middle\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().text,
-                "\">", Escaped{sign_}, "</text>\n");
-            addText(wordsOf(Phrase::meansElsewhere, options_.language));
         }
         svg_.height += y - top + 12;
         svg_.width = std::max(svg_.width, static_cast<int>(widest) + 38 + 2 * kMargin);

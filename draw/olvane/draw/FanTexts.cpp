@@ -7,6 +7,7 @@
 #include <olvane/draw/FanTextsInternal.h>
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 #include <utility>
 
@@ -25,27 +26,31 @@ constexpr double kStep = 1;
 constexpr double kPitch = 1.22;       // of lines, by the size of names
 constexpr double kFactsShare = 0.85;  // of the size of names
 constexpr std::size_t kMostNameLines = 4;
+constexpr double kPad = 4;  // from the sides of a cell to its text
 
-std::string joinedFacts(const std::vector<std::string>& facts, std::size_t first, std::size_t end) {
+std::string joinedFacts(const std::vector<std::string>& facts, std::size_t first) {
     std::string text;
-    for (std::size_t i = first; i < end; ++i) text += (text.empty() ? "" : "  ") + facts[i];
+    for (std::size_t i = first; i < facts.size(); ++i) {
+        if (!text.empty()) text += "  ";
+        text += facts[i];
+    }
     return text;
 }
 
 class FanTextFitter {
 public:
-    FanTextFitter(const FanText& text, const FanTextRoom& room) : text_(text), room_(room) {
-        const std::size_t count = text.facts.size();
-        factLines_.emplace_back();
-        if (count > 0) factLines_.push_back({joinedFacts(text.facts, 0, count)});
-        if (count > 1) factLines_.push_back({text.facts[0], joinedFacts(text.facts, 1, count)});
-    }
+    FanTextFitter(const FanText& text, const FanTextRoom& room)
+        : text_(text),
+          room_(room),
+          allFacts_(joinedFacts(text.facts, 0)),
+          laterFacts_(joinedFacts(text.facts, 1)),
+          mostFactLines_(std::min<std::size_t>(text.facts.size(), 2)) {}
 
     FanTextLines fit() {
-        const std::size_t fewest = factLines_.size() > 1 ? 1 : 0;
+        const std::size_t fewest = std::min<std::size_t>(mostFactLines_, 1);
         for (double size = kLargest; size >= kSmallest; size -= kStep) {
-            for (std::size_t facts = fewest; facts < factLines_.size(); ++facts) {
-                if (tryLines(size, factLines_[facts])) return std::move(best_);
+            for (std::size_t facts = fewest; facts <= mostFactLines_; ++facts) {
+                if (tryLines(size, facts)) return std::move(best_);
             }
         }
         if (best_.lines.empty()) fitThin(fewest);
@@ -56,10 +61,10 @@ private:
     // With facts in letters as small as they can be, and then without facts.
     void fitThin(std::size_t facts) {
         const double forTwo = room_.height / (1 + kPitch);
-        if (facts > 0 && forTwo >= kLeast && tryLines(forTwo, factLines_[facts])) return;
+        if (facts > 0 && forTwo >= kLeast && tryLines(forTwo, facts)) return;
         const double largest = std::min(kLargest, room_.height);
         for (double size = largest; size >= std::min(kSmallest, largest) && size >= kLeast; size -= kStep) {
-            if (tryLines(size, factLines_[0])) return;
+            if (tryLines(size, 0)) return;
         }
     }
 
@@ -71,14 +76,14 @@ private:
 
     // True where nothing is lost. Else the result is kept if less is lost than before; of names that are cut, more is left
     // in more lines and smaller letters.
-    bool tryLines(double size, const std::vector<std::string>& facts) {
+    bool tryLines(double size, std::size_t facts) {
         const std::size_t all = linesOf(size);
-        if (all <= facts.size()) return false;
-        const std::size_t most = std::min(all - facts.size(), kMostNameLines);
+        if (all <= facts) return false;
+        const std::size_t most = std::min(all - facts, kMostNameLines);
         const std::size_t parts = text_.given.empty() || text_.surname.empty() ? 1 : 2;
         bool isWhole = false;
         for (std::size_t names = std::min(parts, most); names <= most; ++names) {
-            const FittedName name = nameIn(size, names, facts.size());
+            const FittedName name = nameIn(size, names, facts);
             const NameLoss loss = haveRoom(facts, size, name.lines.size()) ? name.loss : NameLoss::letters;
             if (loss == NameLoss::nothing) {
                 const bool isLast = parts == 1 || setsSurnameApart(name);
@@ -132,36 +137,57 @@ private:
         return room_.width(offsetOf(names + i, names + facts, size), size * kFactsShare);
     }
 
-    bool haveRoom(const std::vector<std::string>& facts, double size, std::size_t names) const {
-        for (std::size_t i = 0; i < facts.size(); ++i) {
-            const double width = picture::textWidth(facts[i], {size * kFactsShare, false});
-            if (width > factsWidth(i, facts.size(), size, names)) return false;
+    const std::string& factAt(std::size_t i, std::size_t lines) const {
+        if (lines == 1) return allFacts_;
+        return i == 0 ? text_.facts.front() : laterFacts_;
+    }
+
+    bool haveRoom(std::size_t facts, double size, std::size_t names) const {
+        for (std::size_t i = 0; i < facts; ++i) {
+            const double width = picture::textWidth(factAt(i, facts), {size * kFactsShare, false});
+            if (width > factsWidth(i, facts, size, names)) return false;
         }
         return true;
     }
 
-    void keep(const FittedName& name, const std::vector<std::string>& facts, double size, NameLoss loss) {
+    void keep(const FittedName& name, std::size_t facts, double size, NameLoss loss) {
         const std::size_t names = name.lines.size();
-        const std::size_t count = names + facts.size();
+        const std::size_t count = names + facts;
         best_ = {};
         best_.loss = loss;
         for (std::size_t i = 0; i < names; ++i)
             best_.lines.push_back({name.lines[i], true, size, offsetOf(i, count, size)});
-        for (std::size_t i = 0; i < facts.size(); ++i) {
+        for (std::size_t i = 0; i < facts; ++i) {
             const double used = size * kFactsShare;
             best_.lines.push_back(
-                {picture::fitLine(facts[i], {used, false}, factsWidth(i, facts.size(), size, names)), false,
+                {picture::fitLine(factAt(i, facts), {used, false}, factsWidth(i, facts, size, names)), false,
                  used, offsetOf(names + i, count, size)});
         }
     }
 
     const FanText& text_;
     const FanTextRoom& room_;
-    std::vector<std::vector<std::string>> factLines_;  // none, in one line, in two
+    std::string allFacts_;    // in one line
+    std::string laterFacts_;  // in the second of two
+    std::size_t mostFactLines_;
     FanTextLines best_;
 };
 
 }  // namespace
+
+double FanTextRoom::width(double offset, double lineHeight) const {
+    const double half = lineHeight / 2;
+    const double shift = isReversed ? offset : -offset;
+    // Of a line across, the upper corners are the farthest out.
+    const double reach = form == Form::across ? middle + shift + half : std::abs(offset) + half;
+    if (form == Form::rectangle) return breadth;
+    if (reach >= outer) return 0;
+    const double end = std::sqrt(outer * outer - reach * reach);
+    if (form == Form::disc) return 2 * end;
+    if (form == Form::along) return std::max(0.0, 2 * std::min(middle - inner, end - middle));
+    const double side = slope > 0 ? (middle + shift - half) * slope - kPad : end;
+    return std::max(0.0, 2 * std::min(end, side));
+}
 
 FanTextLines fitFanText(const FanText& text, const FanTextRoom& room) {
     return FanTextFitter(text, room).fit();

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include <functional>
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -19,12 +19,25 @@ struct FanText {
     std::vector<std::string> facts;
 };
 
-// The room for lines of text that stand one below the other around the middle of a cell.
+// The room for lines of text that stand one below the other around the middle of a cell: a rectangle, one that is cut
+// off by the outer arc of the cell, by both arcs and the sides, or a disc.
 //
-// Units: px. width says how long a line may be of which the middle is so far below that of the cell, and which is so high.
+// Units: px. Radii are those between which text may stand, middle is that of the middle of the cell; slope is half of the
+// width of the sides at a distance of 1.
 struct FanTextRoom {
+    enum class Form : std::uint8_t { rectangle, along, across, disc };
+
+    Form form = Form::rectangle;
     double height = 0;
-    std::function<double(double offset, double height)> width;
+    double breadth = 0;  // of a rectangle
+    double inner = 0;
+    double middle = 0;
+    double outer = 0;
+    double slope = 0;         // across; 0 where the cell is too wide for its sides to matter
+    bool isReversed = false;  // across: lines go outwards
+
+    // How long a line may be of which the middle is so far below that of the cell, and which is so high.
+    double width(double offset, double lineHeight) const;
 };
 
 struct FanTextLine {

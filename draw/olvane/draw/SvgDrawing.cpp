@@ -10,6 +10,7 @@
 #include <optional>
 #include <set>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include <olvane/draw/BoxArtInternal.h>
@@ -243,13 +244,6 @@ private:
     };
 
     void addSigns(std::vector<LegendRow>& rows) const {
-        const auto add = [&](std::string_view sign, bool hollow, Phrase meaning) {
-            LegendRow row;
-            row.text = wordsOf(meaning, options_.language);
-            row.sign = sign;
-            row.hollow = hollow;
-            rows.push_back(std::move(row));
-        };
         const picture::Picture& picture = content_.picture;
         bool hasHidden = false, hasFurther = false;
         std::string elsewhere, folded;
@@ -265,11 +259,20 @@ private:
             hasHidden = hasHidden || (!isFolded && frameOf(box).hasHidden());
             hasFurther = hasFurther || (box.furtherParents > 0 && !content_.labelOf(box.id).living);
         }
-        if (hasHidden) add("+", false, Phrase::meansHidden);
-        if (!repeats_.empty()) add("=", true, Phrase::meansSamePerson);
-        if (!elsewhere.empty()) add(elsewhere, true, Phrase::meansElsewhere);
-        if (hasFurther) add(kTwoUp, true, Phrase::meansFurtherParents);
-        if (!folded.empty()) add(folded, false, Phrase::meansFolded);
+        const std::pair<std::string_view, Phrase> signs[] = {
+            {hasHidden ? "+" : "", Phrase::meansHidden},
+            {repeats_.empty() ? "" : "=", Phrase::meansSamePerson},
+            {elsewhere, Phrase::meansElsewhere},
+            {hasFurther ? kTwoUp : "", Phrase::meansFurtherParents},
+            {folded, Phrase::meansFolded},
+        };
+        for (const auto& [sign, meaning] : signs) {
+            if (sign.empty()) continue;
+            LegendRow& row = rows.emplace_back();
+            row.text = wordsOf(meaning, options_.language);
+            row.sign = sign;
+            row.hollow = meaning != Phrase::meansHidden && meaning != Phrase::meansFolded;
+        }
     }
 
     std::vector<LegendRow> legendRows(const LineStylesUsed& styles) const {
@@ -348,28 +351,26 @@ private:
     // Whether nothing is drawn in an area of the picture or close to it.
     bool isFree(int left, int top, int width, int height) const {
         if (left < kMargin || top < kMargin) return false;
-        const auto isClear = [&](double x1, double y1, double x2, double y2) {
-            return x2 + kLegendClearance <= left || x1 - kLegendClearance >= left + width ||
-                   y2 + kLegendClearance <= top || y1 - kLegendClearance >= top + height;
+        const double x = left - kLegendClearance;
+        const double y = top - kLegendClearance;
+        const auto covers = [&](double x1, double y1, double x2, double y2) {
+            return frame_.x(std::max(x1, x2)) > x &&
+                   frame_.x(std::min(x1, x2)) < left + width + kLegendClearance &&
+                   frame_.y(std::max(y1, y2)) > y &&
+                   frame_.y(std::min(y1, y2)) < top + height + kLegendClearance;
         };
-        const picture::Picture& picture = content_.picture;
-        return std::all_of(picture.boxes.begin(), picture.boxes.end(),
-                           [&](const picture::Box& box) {
-                               const BoxFrame frame = frameOf(box);
-                               return isClear(frame.x, frame.y, frame.x + frame.width,
-                                              frame.y + frame.height);
-                           }) &&
-               std::all_of(picture.lines.begin(), picture.lines.end(),
-                           [&](const picture::Line& line) {
-                               return isClear(frame_.x(std::min(line.x1, line.x2)),
-                                              frame_.y(std::min(line.y1, line.y2)),
-                                              frame_.x(std::max(line.x1, line.x2)),
-                                              frame_.y(std::max(line.y1, line.y2)));
-                           }) &&
-               std::all_of(plates_.begin(), plates_.end(), [&](const picture::KinshipPlate& plate) {
-                   return isClear(frame_.x(plate.x), frame_.y(plate.y), frame_.x(plate.right()),
-                                  frame_.y(plate.bottom()));
-               });
+        for (const picture::Box& box : content_.picture.boxes) {
+            if (covers(box.x, box.y, box.x + static_cast<double>(box.width),
+                       box.y + static_cast<double>(box.height)))
+                return false;
+        }
+        for (const picture::Line& line : content_.picture.lines) {
+            if (covers(line.x1, line.y1, line.x2, line.y2)) return false;
+        }
+        for (const picture::KinshipPlate& plate : plates_) {
+            if (covers(plate.x, plate.y, plate.right(), plate.bottom())) return false;
+        }
+        return true;
     }
 
     void appendLegendRow(std::string& legend, int place, const LegendRow& row) const {

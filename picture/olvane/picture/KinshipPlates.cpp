@@ -8,6 +8,7 @@
 #include <olvane/picture/KinshipPlates.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <cstddef>
 
@@ -96,14 +97,14 @@ public:
         : picture_(picture), style_(style), marked_(marked) {}
 
     void place(Index box, const std::string& text) {
-        own_ = box;
-        best_ = KinshipPlate();
-        leastPenalty_ = -1;
-        const std::vector<Form> forms = FormMaker(text, style_.letters).make();
+        std::vector<Form> forms = FormMaker(text, style_.letters).make();
         if (forms.empty()) return;
+        own_ = box;
+        leastPenalty_ = -1;
         collectNeighbours(forms.front().width);
-        for (const Form& form : forms) tryForm(form);
-        plates_.push_back(std::move(best_));
+        for (Form& form : forms) tryForm(form);
+        plates_.push_back(
+            {box, best_.x1, best_.y1, best_.x2 - best_.x1, best_.y2 - best_.y1, std::move(bestForm_->lines)});
     }
 
     std::vector<KinshipPlate> take() { return std::move(plates_); }
@@ -148,7 +149,7 @@ private:
 
     const Box& ownBox() const { return picture_.boxes[static_cast<std::size_t>(own_)]; }
 
-    void tryForm(const Form& form) {
+    void tryForm(Form& form) {
         const Rect box = areaOf(ownBox());
         const double boxWidth = box.x2 - box.x1;
         const double boxHeight = box.y2 - box.y1;
@@ -159,26 +160,24 @@ private:
         const double below = box.y2 + (marked_[own].bottom ? style_.marks : -style_.onBorder);
         const double penalty = kPerLine * static_cast<double>(form.lines.size() - 1) +
                                kPerExcess * std::max(0.0, width / boxWidth - kWiderThanBox);
-        const auto tryAt = [&](double x, double y, double more) {
-            tryPlate(KinshipPlate{own_, x, y, width, height, form.lines}, penalty + more);
-        };
         for (int i = -kShifts; i <= kShifts; ++i) {
             const double share = static_cast<double>(i) / kShifts;
             const double right = share * std::max(0.0, (boxWidth + width) / 2 - kContact * boxWidth);
             const double x = (box.x1 + box.x2 - width) / 2 + right;
-            const double shifted = kPerShift * std::abs(right) / boxWidth;
-            tryAt(x, below, shifted);
-            tryAt(x, above, kAbove + shifted);
             const double down = share * std::max(0.0, (boxHeight - height) / 2);
             const double y = (box.y1 + box.y2 - height) / 2 + down;
+            const double shifted = kPerShift * std::abs(right) / boxWidth;
             const double moved = kBeside + kPerShift * std::abs(down) / boxHeight;
-            tryAt(box.x2 - style_.onBorder, y, moved);
-            tryAt(box.x1 + style_.onBorder - width, y, moved);
+            const std::array<double, 3> places[] = {{x, below, shifted},
+                                                    {x, above, kAbove + shifted},
+                                                    {box.x2 - style_.onBorder, y, moved},
+                                                    {box.x1 + style_.onBorder - width, y, moved}};
+            for (const auto& [left, top, more] : places)
+                tryArea({left, top, left + width, top + height}, penalty + more, form);
         }
     }
 
-    void tryPlate(KinshipPlate&& plate, double penalty) {
-        const Rect area = areaOf(plate);
+    void tryArea(const Rect& area, double penalty, Form& form) {
         for (const Rect& neighbour : neighbours_) {
             if (meet(area, neighbour)) penalty += kOnBox * (1 + sharedArea(area, neighbour));
         }
@@ -187,7 +186,8 @@ private:
         }
         if (leastPenalty_ >= 0 && penalty >= leastPenalty_) return;
         leastPenalty_ = penalty;
-        best_ = std::move(plate);
+        best_ = area;
+        bestForm_ = &form;
     }
 
     const Picture& picture_;
@@ -197,7 +197,8 @@ private:
     Index own_ = kNone;
     std::vector<Rect> neighbours_;
     std::vector<Rect> lines_;
-    KinshipPlate best_;
+    Rect best_;
+    Form* bestForm_ = nullptr;
     double leastPenalty_ = -1;
 };
 

@@ -18,15 +18,32 @@ using picture::NameLoss;
 using picture::textWidth;
 
 FanTextRoom rectangle(double width, double height) {
-    return {height, [width](double, double) { return width; }};
+    FanTextRoom room;
+    room.breadth = width;
+    room.height = height;
+    return room;
 }
 
 // Narrower the farther a line is from the middle.
 FanTextRoom disc(double radius) {
-    return {2 * radius, [radius](double offset, double height) {
-                const double reach = std::abs(offset) + height / 2;
-                return reach < radius ? 2 * std::sqrt(radius * radius - reach * reach) : 0;
-            }};
+    FanTextRoom room;
+    room.form = FanTextRoom::Form::disc;
+    room.height = 2 * radius;
+    room.outer = radius;
+    return room;
+}
+
+// Of a quarter of a ring.
+FanTextRoom quarter(FanTextRoom::Form form, bool isReversed) {
+    FanTextRoom room;
+    room.form = form;
+    room.height = 60;
+    room.inner = 100;
+    room.middle = 130;
+    room.outer = 160;
+    room.slope = 1;
+    room.isReversed = isReversed;
+    return room;
 }
 
 FanText anna() {
@@ -96,6 +113,23 @@ TEST(FanTexts, aThinCellHasSmallerLettersBeforeItsNameIsCut) {
     EXPECT_EQ(fitted.loss, NameLoss::nothing);
     EXPECT_EQ(fitted.lines.size(), 1u);
     EXPECT_LT(fitted.lines[0].size, 13);
+}
+
+// By hand: a line of 20 whose middle is 20 above that of the ring reaches to a radius of 160, one below it to 120.
+TEST(FanTexts, linesAcrossARingEndAtItsOuterArcAndItsSides) {
+    const FanTextRoom upper = quarter(FanTextRoom::Form::across, false);
+    EXPECT_EQ(upper.width(-20, 20), 0);
+    EXPECT_DOUBLE_EQ(upper.width(20, 20), 2 * std::min(100.0 - 4, std::sqrt(160.0 * 160 - 120 * 120)));
+    const FanTextRoom lower = quarter(FanTextRoom::Form::across, true);
+    EXPECT_EQ(lower.width(20, 20), 0);
+    EXPECT_EQ(lower.width(-20, 20), upper.width(20, 20));
+}
+
+TEST(FanTexts, linesAlongTheRadiusEndAtBothArcs) {
+    const FanTextRoom room = quarter(FanTextRoom::Form::along, false);
+    EXPECT_DOUBLE_EQ(room.width(0, 0), 60);
+    EXPECT_EQ(room.width(90, 12), 0);  // 128 from the middle, as (128, 96) lies on the arc
+    EXPECT_NEAR(room.width(30, 20), 2 * (154.92 - 130), 0.01);
 }
 
 TEST(FanTexts, everyLineLiesInItsRoom) {

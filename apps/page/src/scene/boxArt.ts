@@ -155,7 +155,7 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const room = nodeWidth - 2 * kInset;
     const lastLine = nodeHeight - 8;
     const facts = factLines(look, room);
-    const kin = kinLines(look, room, () => true);
+    const kin = kinLines(look, room);
     const kinHeight = look.kinship === null ? 0 : kLinePitch + kKinPitch * Math.max(0, kin.lines.length - 1);
     const firstFact = lastLine - kinHeight - kLinePitch * Math.max(0, facts.length - 1);
     const bottom = facts.length > 0 || look.kinship !== null ? firstFact - kYearsSize - 1 : nodeHeight - 6;
@@ -165,7 +165,8 @@ function appendTallText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
         look.texts.fitName(look.name, { width: room, height: bottom - 9 - figureHeight, gap: 1, lines: 3 });
     // A second line of kinship takes its room from the figure where the name would lose words.
     const smallHeight = fullHeight - kKinPitch;
-    const isCrowded = kin.lines.length > 1 && !haveSameWords(nameBelow(fullHeight), nameBelow(smallHeight));
+    const lettersBelow = (figureHeight: number) => nameBelow(figureHeight).lines.join("").replaceAll(" ", "");
+    const isCrowded = kin.lines.length > 1 && lettersBelow(fullHeight) !== lettersBelow(smallHeight);
     const figureHeight = isCrowded ? smallHeight : fullHeight;
     const name = nameBelow(figureHeight);
     const top = 9 + figureHeight;
@@ -187,18 +188,17 @@ function appendWideText(box: SVGGElement, look: BoxLook, { width: nodeWidth, hei
     const right = nodeWidth - kInset;
     const room = right - left;
     const facts = factLines(look, room);
-    const lowerHeight = (kinLines: number) =>
-        (facts.length + (kinLines > 0 ? 1 : 0)) * kLinePitch + kKinPitch * Math.max(0, kinLines - 1);
-    const nameAbove = (lower: number) => {
-        const height = nodeHeight - 8 - lower;
-        return look.texts.fitName(look.name, { width: room, height, gap: 2, lines: height < kTwoNameLines ? 1 : 2 });
-    };
     const joined = joinedFacts(look, facts, room);
-    const kin = joined
-        ? { lines: [], size: kKinSize }
-        : kinLines(look, room, () => haveSameWords(nameAbove(lowerHeight(1)), nameAbove(lowerHeight(2))));
-    const lower = lowerHeight(kin.lines.length);
-    const name = nameAbove(lower);
+    const kin = joined ? { lines: [], size: kKinSize } : kinLines(look, room);
+    const kinHeight = kin.lines.length > 0 ? kLinePitch + kKinPitch * (kin.lines.length - 1) : 0;
+    const lower = facts.length * kLinePitch + kinHeight;
+    const nameHeight = nodeHeight - 8 - lower;
+    const name = look.texts.fitName(look.name, {
+        width: room,
+        height: nameHeight,
+        gap: 2,
+        lines: nameHeight < kTwoNameLines ? 1 : 2,
+    });
     const pitch = name.size + 2;
     const height = name.lines.length * pitch + lower;
     const firstY = (nodeHeight - height) / 2 + name.size - 1;
@@ -227,25 +227,15 @@ interface SizedLines {
     readonly size: number;
 }
 
-// The fullest wording of a kinship that has room: in one line, or in two where the name does not suffer from it. The last
-// wording, which names no relation, stands only where no other one goes into two lines.
-function kinLines({ kinship, texts }: BoxLook, room: number, hasRoomForTwo: () => boolean): SizedLines {
-    const wordings = kinship ?? [];
-    const inTwo = (wording: string) => texts.fitLines(wording, kLeastKinSize, room, 2);
-    for (const wording of wordings.length > 1 ? wordings.slice(0, -1) : wordings) {
+// The fullest wording of a kinship that has room, in one line or in two; the last ones have room in every box.
+function kinLines({ kinship, texts }: BoxLook, room: number): SizedLines {
+    for (const wording of kinship ?? []) {
         const size = [kKinSize, kLeastKinSize].find((size) => texts.width(wording, size) <= room);
         if (size) return { lines: [wording], size };
-        if (inTwo(wording).whole && hasRoomForTwo()) return { lines: inTwo(wording).lines, size: kLeastKinSize };
+        const { lines, whole } = texts.fitLines(wording, kLeastKinSize, room, 2);
+        if (whole) return { lines, size: kLeastKinSize };
     }
-    const shortened = wordings.map(inTwo);
-    const lines = (shortened.find(({ whole }) => whole) ?? shortened.at(-1))?.lines ?? [];
-    return { lines, size: kLeastKinSize };
-}
-
-// However they are broken into lines.
-function haveSameWords(a: SizedLines, b: SizedLines): boolean {
-    const letters = ({ lines }: SizedLines) => lines.join("").replaceAll(" ", "");
-    return letters(a) === letters(b);
+    return { lines: [], size: kKinSize };
 }
 
 // Years or dates, then the details.

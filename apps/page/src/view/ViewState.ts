@@ -81,8 +81,7 @@ const kTall = { width: 118, height: 104, gapX: 22, gapY: 42 };
 const kPhotoHeight = 32; // that it adds to a tall box
 const kWide = { width: 196, height: 58, gapX: 14, gapY: 36 };
 // Room for the lines of ways between rows, and for what the ends of a kinship are to one another.
-const kTallInKinship = { ...kTall, gapY: 58 };
-const kWideInKinship = { ...kWide, gapX: 56 };
+const kGapInKinship = 57;
 const kPedigree = { width: 196, height: 58, gapX: 36, gapY: 14 };
 
 const kFactPitch = 14;
@@ -112,9 +111,9 @@ export function optionsOf(
 ): PictureOptions {
     const { view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact } = state;
     const { folded, mirrored } = state;
-    const usual = view === "kinship" ? kTallInKinship : kTall;
-    const tall = state.photos ? { ...usual, height: usual.height + kPhotoHeight } : usual;
-    const wide = view === "kinship" ? kWideInKinship : kWide;
+    const gap = view === "kinship" ? kGapInKinship : 0;
+    const tall = { ...kTall, height: kTall.height + (state.photos ? kPhotoHeight : 0), gapY: gap || kTall.gapY };
+    const wide = { ...kWide, gapX: gap || kWide.gapX };
     const sizes = view === "pedigree" ? kPedigree : boxes === "wide" ? wide : tall;
     return {
         ...{ view, generations, direction, up, down, to, unknownParents, parentsOf, parentFamily, compact, language },
