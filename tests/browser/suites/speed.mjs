@@ -142,7 +142,7 @@ describe("speed", () => {
             `royal92.ged: a letter typed into the search takes ${first.toFixed(1)} ms the first time, then ` +
                 `${median.toFixed(1)} ms, ${others.at(-1).toFixed(1)} at most, with all rows of the list`,
         );
-        assert.ok(median < 5 * kPatience, `${median} ms`);
+        assert.ok(median < 10 * kPatience, `${median} ms`);
         await visit.end();
     });
 
