@@ -341,7 +341,7 @@ private:
         std::optional<int> nearest;
         for (int i = 0; i <= kLegendPlaces; ++i) {
             const int x = kMargin + static_cast<int>(static_cast<double>(last - kMargin) * i / kLegendPlaces);
-            const auto distance = [&](int of) { return std::abs(of + width / 2 - focus); };
+            const auto distance = [&](int of) { return std::abs(of + width / 2.0 - focus); };
             if (nearest && distance(x) >= distance(*nearest)) continue;
             if (isFree(x, top, width, height)) nearest = x;
         }
