@@ -4,6 +4,7 @@
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import { deflateRawSync } from "node:zlib";
+import "./rawInflate";
 import { Archive, ArchiveError, isArchive, TooLargeError } from "../src/engine/archive";
 
 interface Member {
