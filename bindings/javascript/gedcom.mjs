@@ -4,6 +4,7 @@
 // A GEDCOM file that the module has read. Persons and families come over once, as rows; facts when they are asked for.
 
 import { GedcomError, LayoutError } from "./errors.mjs";
+import { detailedFactFrom, detailedNameFrom, detailsFrom, factFrom, sheetsFrom } from "./gedcomValues.mjs";
 import { Instance } from "./instance.mjs";
 import { refuseNested, runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
@@ -11,77 +12,20 @@ import { BRANCHES, readPicture, SIDES } from "./picture.mjs";
 import {
     drawingNumbers,
     factBits,
+    laterSideFrom,
     paperNumbers,
     partText,
     pictureNumbers,
-    laterSideFrom,
     usualBoxesFrom,
 } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
-import { appendPart, MARKS, partsOf } from "./rows.mjs";
+import { appendPart, partsOf } from "./rows.mjs";
 import { searchWith } from "./search.mjs";
 import { Texts } from "./texts.mjs";
 
 // Persons that a search's index takes in between two looks at the clock: a fifth of a millisecond.
 const INDEXED_AT_ONCE = 50;
-
-function dateFrom(values) {
-    if (values === 0) return null;
-    const [written, year, month, day, mark, lastYear, shown, period] = values;
-    return { written, year, month, day, mark: MARKS[mark], lastYear, shown, period: period !== 0 };
-}
-
-function factFrom([tag, value, date, place]) {
-    return { tag, value, date: dateFrom(date), place };
-}
-
-function citationFrom([title, author, publication, page, text, quality]) {
-    return { title, author, publication, page, text, quality: quality < 0 ? null : quality };
-}
-
-function mediumFrom([title, file, format]) {
-    return { title, file, format };
-}
-
-// 0 stands for no details at all.
-function detailsFrom(row) {
-    const [type, cause, age, husbandAge, wifeAge, agency, address, notes, citations, media, links] =
-        row === 0 ? ["", "", "", "", "", "", "", [], [], [], []] : row;
-    return {
-        type,
-        cause,
-        age,
-        husbandAge,
-        wifeAge,
-        agency,
-        address,
-        notes,
-        citations: citations.map(citationFrom),
-        media: media.map(mediumFrom),
-        links,
-    };
-}
-
-function detailedFactFrom([tag, value, date, place, details]) {
-    return { tag, value, date: dateFrom(date), place, details: detailsFrom(details) };
-}
-
-function detailedNameFrom([text, type, nickname, details]) {
-    return { text, type, nickname, details: detailsFrom(details) };
-}
-
-function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes, sheets]) {
-    return {
-        width: width / 1000,
-        height: height / 1000,
-        scale: scale / 1000,
-        smallestName: smallestName / 1000,
-        smallestText: smallestText / 1000,
-        cutBoxes,
-        sheets: sheets.map(([row, column, svg]) => ({ row, column, svg })),
-    };
-}
 
 // Closes what nobody holds any more and nobody closed.
 const unclosed = new FinalizationRegistry(({ instance, file }) => instance.exports.gedcom_close(file));
