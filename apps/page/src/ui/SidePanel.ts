@@ -5,33 +5,15 @@
 // relatives, each a link. On a narrow window it is a sheet at the lower edge that shows the name until it is
 // drawn up.
 
-import type { DetailedFact, DetailedName, GedcomFamily as Family, KinshipWay, Person, PersonDetails } from "olvane";
-import { factLabel, type Messages } from "../messages";
+import type { GedcomFamily as Family, KinshipWay, Person } from "olvane";
+import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { dateText, nameOf, placeText, yearsOf } from "../messages/names";
+import { nameOf, yearsOf } from "../messages/names";
 import type { OpenFamily } from "../view/OpenFamily";
 import { html, isolated, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
-import { DetailView, ownNameOf } from "./DetailView";
-import { inLifeOrder } from "./lifeOrder";
-
-// Shown by the panel in other ways, or of no use to a reader.
-const kShownElsewhere = new Set([
-    "NAME",
-    "SEX",
-    "FAMC",
-    "FAMS",
-    "HUSB",
-    "WIFE",
-    "CHIL",
-    "CHAN",
-    "CREA",
-    "RIN",
-    "UID",
-    "_UID",
-    "SUBM",
-    "EXID",
-]);
+import { DetailView } from "./DetailView";
+import { FactLists } from "./FactLists";
 
 const kMostListed = 24; // relatives of a kind, until all are asked for
 
@@ -62,7 +44,8 @@ export class SidePanel {
     // Known without asking: a question, or a scroll that changes nothing, has the browser lay out the whole
     // page.
     private isScrolled = false;
-    private details!: DetailView; // of the family that is shown
+    private details!: DetailView; // of the family that is shown, as the next one
+    private factLists!: FactLists;
 
     constructor(
         private readonly messages: Messages,
@@ -92,18 +75,19 @@ export class SidePanel {
 
     show(person: Person, family: OpenFamily, standing: Standing): void {
         this.details = new DetailView(this.ui, family.photographs);
+        this.factLists = new FactLists(this.messages, this.ui, this.details);
         const known = family.file.detailsOfPerson(person.id);
         const sections = [
             this.header(person, standing),
             standing.kinship === "" ? null : this.ways(person, family, standing),
             this.details.media(known.media),
-            this.facts(known),
+            this.factLists.facts(known),
             this.people(this.ui.panel.parents, this.parents(person, family), (link) => link),
             this.couples(person, family),
             this.people(this.ui.panel.siblings, family.file.siblingsOf(person.id), (id) =>
                 this.link(family.person(id)),
             ),
-            this.further(known),
+            this.factLists.further(known),
         ];
         this.body.replaceChildren(...sections.filter((section) => section !== null));
         if (this.isScrolled) [this.element, this.body].forEach((part) => part.scrollTo(0, 0));
@@ -170,71 +154,6 @@ export class SidePanel {
         return button;
     }
 
-    private facts({ names, facts }: PersonDetails): HTMLElement {
-        const list = html("dl", {});
-        const first = names[0];
-        if (first) {
-            const parts = [...this.nicknameOf(first, names), ...this.details.linesOf(first.details)];
-            if (parts.length > 0) this.appendFact(list, this.ui.details.name, parts);
-        }
-        for (const name of names.slice(1)) this.appendName(list, name, names);
-        for (const fact of inLifeOrder(facts)) if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(list, fact);
-        return html(
-            "section",
-            { class: "facts" },
-            html("h3", {}, this.ui.panel.facts),
-            list.childElementCount > 0 ? list : html("p", { class: "quiet" }, this.ui.panel.noFacts),
-        );
-    }
-
-    // A nickname that stands in a name already needs no line.
-    private nicknameOf({ nickname }: DetailedName, names: readonly DetailedName[]): HTMLElement[] {
-        if (!nickname || names.some(({ text }) => text.includes(nickname))) return [];
-        return [html("span", { class: "detail" }, this.ui.details.nickname + ": ", isolated(nickname))];
-    }
-
-    private appendName(list: HTMLElement, name: DetailedName, names: readonly DetailedName[]): void {
-        const isAgain = name.text === "" || names.find(({ text }) => text === name.text) !== name;
-        const parts = [
-            ...(isAgain ? [] : [isolated(name.text)]),
-            ...this.nicknameOf(name, names),
-            ...this.details.linesOf(name.details),
-        ];
-        if (parts.length > 0) this.appendFact(list, this.nameLabel(name.type), parts);
-    }
-
-    private nameLabel(type: string): string {
-        const { nameTypes } = this.ui.details;
-        const known = type.toLowerCase();
-        return Object.hasOwn(nameTypes, known) ? nameTypes[known]! : type || this.ui.panel.otherNames;
-    }
-
-    // What the file says of the person in no certain place of their life.
-    private further(known: PersonDetails): HTMLElement | null {
-        const address = known.address && html("p", { class: "note", dir: "auto" }, known.address);
-        const parts = this.details.partsOf({ ...known, media: [] });
-        if (parts.length === 0 && !address) return null;
-        return html("section", { class: "further" }, html("h3", {}, this.ui.details.notes), address, ...parts);
-    }
-
-    private appendFactOf(list: HTMLElement, fact: DetailedFact): void {
-        const { date, place, value, details } = fact;
-        const label = ownNameOf(fact) || factLabel(fact.tag, this.messages);
-        const type = details.type === label || details.type === value ? "" : details.type;
-        const parts = [
-            date && html("span", { class: "date" }, dateText(date, this.messages)),
-            place && html("span", { class: "place", dir: "auto" }, placeText(place)),
-            value && value !== "Y" && value !== label && html("span", { class: "value", dir: "auto" }, value),
-            type && html("span", { class: "detail", dir: "auto" }, type),
-            ...this.details.linesOf(details),
-        ].filter((part): part is HTMLElement => Boolean(part));
-        this.appendFact(list, label, parts);
-    }
-
-    private appendFact(list: HTMLElement, label: string, parts: readonly HTMLElement[]): void {
-        list.append(html("div", {}, html("dt", {}, label), html("dd", {}, ...(parts.length > 0 ? parts : ["\u2713"]))));
-    }
-
     private parents(person: Person, family: OpenFamily): HTMLElement[] {
         const links: HTMLElement[] = [];
         const listed = new Set<number>();
@@ -274,9 +193,8 @@ export class SidePanel {
 
     private couple(person: Person, couple: Family, family: OpenFamily): HTMLElement {
         const partner = couple.husband === person.id ? couple.wife : couple.husband;
-        const facts = html("dl", {});
         const known = family.file.detailsOfFamily(couple.id);
-        for (const fact of inLifeOrder(known.facts)) if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(facts, fact);
+        const facts = this.factLists.listOf(known.facts);
         const further = this.details.partsOf(known);
         const children = this.list(couple.children, (id) => this.link(family.person(id)));
         children.className = "children";
