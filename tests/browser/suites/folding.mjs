@@ -157,7 +157,7 @@ describe("folding", kTwoAtOnce, () => {
         await visit.still();
         assert.deepEqual((await captions()).sort(), ["Sohn", "Vater"]);
         assert.equal(await visit.page.locator(".corner .ways li").first().innerText(), "Vater");
-        assert.deepEqual(await visit.placing(), before);
+        await visit.assertPlacedAs(before);
         await visit.end();
     });
 

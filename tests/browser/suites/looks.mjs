@@ -304,7 +304,7 @@ describe("looks", kTwoAtOnce, () => {
         const at = await visit.placing();
         const places = await visit.places();
         await visit.page.waitForTimeout(200);
-        assert.deepEqual(await visit.placing(), at);
+        await visit.assertPlacedAs(at);
         assert.deepEqual(await visit.places(), places);
         const running = await visit.page.evaluate(
             () => document.getAnimations().filter((one) => one.playState === "running").length,

@@ -16,7 +16,7 @@ describe("walking", kTwoAtOnce, () => {
         await visit.box("I34").click();
         await visit.still();
         assert.equal(await visit.focus(), "I1");
-        assert.deepEqual(await visit.placing(), before);
+        await visit.assertPlacedAs(before);
         assert.equal(await visit.page.innerText("#side-panel h2"), "Caroline Sarah Darwin");
         assert.doesNotMatch(await visit.hash(), /person=I34/);
         await visit.click("#make-focus");

@@ -215,6 +215,14 @@ export class Visit {
         return { x, y, k };
     }
 
+    /** Whether the picture stands where it stood; places are written in hundredths of a pixel, whose last digit may round. */
+    async assertPlacedAs(before) {
+        const now = await this.placing();
+        for (const part of ["x", "y", "k"]) {
+            assert.ok(Math.abs(now[part] - before[part]) < 0.011, `${part}: ${before[part]} became ${now[part]}`);
+        }
+    }
+
     /** Through the search, as a person would. */
     async goTo(text) {
         await this.page.fill("#search", text);
