@@ -19,6 +19,7 @@ constexpr int kSizes = 4;
 std::vector<double> sizesOf(const NameRoom& room) {
     if (room.largest == room.smallest) return {room.largest};
     std::vector<double> sizes;
+    sizes.reserve(kSizes);
     for (int i = 0; i < kSizes; ++i) {
         sizes.push_back(room.largest - (room.largest - room.smallest) * i / (kSizes - 1));
     }
