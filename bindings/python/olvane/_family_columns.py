@@ -58,44 +58,34 @@ class Columns:
         self._fill(table, {name: rows.get(name, ()) for name in known[:2]} | dict(rows), known, choices or {})
 
     def names_and_fields(self, names: Rows | None, fields: Rows | None) -> None:
-        """Names and fields of their own rows, behind those that stood in the rows of persons."""
-        persons: list[Any] = []
-        kinds: list[Any] = []
-        texts: list[Any] = []
-        for owners, kind, column in self._names:
+        """Names and fields of their own rows, or else those that stood in the rows of persons."""
+        self._own_rows("names", ("person", "kind", "text"), names, self._names, {"kind": NAME_KINDS})
+        self._own_rows("fields", ("person", "key", "text"), fields, self._fields, {})
+
+    def _own_rows(
+        self,
+        table: str,
+        known: tuple[str, str, str],
+        given: Rows | None,
+        beside: Sequence[tuple[Sequence[Any], Any, list[Any]]],
+        choices: Mapping[str, Mapping[str, int]],
+    ) -> None:
+        gathered: dict[str, list[Any]] = {name: [] for name in known}
+        persons, kinds, texts = gathered.values()
+        for owners, kind, column in beside:
             for owner, text in zip(owners, column):
                 if text is not None and text != "":
                     persons.append(owner)
                     kinds.append(kind)
                     texts.append(text)
-        own = rows_from("names", names, ("person", "kind", "text"))
-        if own is None and texts:
-            self._fill("names", {"person": persons, "kind": kinds, "text": texts}, ("person", "kind", "text"), {})
-        elif own is not None:
-            if texts:
-                raise ValueError("names stand in the rows of persons and in rows of their own: give one of them")
-            refuse_unknown("names", 0, own, ("person", "kind", "text"))
-            self._fill("names", own, ("person", "kind", "text"), {"kind": NAME_KINDS})
-        self._own_fields(fields)
-
-    def _own_fields(self, fields: Rows | None) -> None:
-        persons: list[Any] = []
-        keys: list[Any] = []
-        texts: list[Any] = []
-        for owners, key, column in self._fields:
-            for owner, text in zip(owners, column):
-                if text is not None and text != "":
-                    persons.append(owner)
-                    keys.append(key)
-                    texts.append(text)
-        own = rows_from("fields", fields, ("person", "key", "text"))
+        own = rows_from(table, given, known)
         if own is not None:
-            refuse_unknown("fields", 0, own, ("person", "key", "text"))
+            refuse_unknown(table, 0, own, known)
             if texts:
-                raise ValueError("fields stand in the rows of persons and in rows of their own: give one of them")
-            self._fill("fields", own, ("person", "key", "text"), {})
+                raise ValueError(f"{table} stand in the rows of persons and in rows of their own: give one of them")
+            self._fill(table, own, known, choices)
         elif texts:
-            self._fill("fields", {"person": persons, "key": keys, "text": texts}, ("person", "key", "text"), {})
+            self._fill(table, gathered, known, {})
 
     def _fill(
         self,

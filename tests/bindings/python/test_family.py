@@ -133,6 +133,14 @@ class Refusals(unittest.TestCase):
         with self.assertRaises(olvane.FamilyError):
             olvane.Family().add_person(1, fathr=2)
 
+    def test_names_and_fields_that_stand_in_two_places(self) -> None:
+        for table, person, own in (
+            ("names", {"id": 1, "nickname": "Kalle"}, {"names": [(1, "nickname", "Karl")]}),
+            ("fields", {"id": 1, "job": "smith"}, {"fields": [(1, "job", "baker")]}),
+        ):
+            with self.assertRaisesRegex(ValueError, f"^{table} stand in the rows of persons and in rows of their own"):
+                olvane.Family([person], **own)
+
     def test_rows_of_another_length(self) -> None:
         self.assertEqual(1, refusal([(1, 0, 0), (2, 0)]).row)
 
