@@ -118,7 +118,8 @@ describe("sharing", kTwoAtOnce, () => {
         assert.equal(await kept(), 0, "nothing is kept unasked");
         await visit.page.click("#file-button");
         await visit.page.check("#keep-file");
-        await visit.page.waitForFunction(async () => (await indexedDB.databases()).length === 1);
+        await visit.page.waitForSelector("#notices .notice >> text=This file stays");
+        assert.equal(await kept(), 1);
         await photograph(visit, "keep");
         await visit.page.goto(address + "/page.html");
         await visit.untilFamily();
@@ -130,6 +131,51 @@ describe("sharing", kTwoAtOnce, () => {
         assert.equal(await kept(), 0);
         await visit.page.goto(address + "/page.html");
         await visit.page.waitForSelector("#welcome");
+        await context.close();
+    });
+
+    test("a file that was kept and at once removed is not kept", async () => {
+        const context = await newContext();
+        const visit = await Visit.begin(context, address + "/page.html");
+        await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
+        await visit.untilFamily();
+        await visit.page.click("#file-button");
+        await visit.page.evaluate(() => {
+            const box = document.querySelector("#keep-file");
+            box.click();
+            box.click();
+        });
+        await visit.page.waitForSelector("#notices .notice >> text=removed");
+        assert.ok(!(await visit.page.isChecked("#keep-file")));
+        assert.equal(await visit.page.evaluate(async () => (await indexedDB.databases()).length), 0);
+        await context.close();
+    });
+
+    test("a kept file that the browser cannot read now is there on the next visit", async () => {
+        const context = await newContext();
+        const visit = await Visit.begin(context, address + "/page.html");
+        await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
+        await visit.untilFamily();
+        await visit.page.click("#file-button");
+        await visit.page.check("#keep-file");
+        await visit.page.waitForSelector("#notices .notice >> text=This file stays");
+        const refusing = await context.newPage();
+        await refusing.addInitScript(() => {
+            IDBObjectStore.prototype.get = () => {
+                throw new DOMException("not now", "UnknownError");
+            };
+        });
+        await refusing.goto(address + "/page.html");
+        await refusing.waitForSelector("#welcome");
+        // Whatever it does about its file is done before this is answered.
+        const names = await refusing.evaluate(async () => {
+            await new Promise((done) => (indexedDB.open("other").onsuccess = done));
+            return (await indexedDB.databases()).map(({ name }) => name);
+        });
+        assert.ok(names.includes("olvane"), names.join());
+        await visit.page.goto(address + "/page.html");
+        await visit.untilFamily();
+        assert.equal(await visit.page.title(), "darwin-wedgwood");
         await context.close();
     });
 

@@ -119,7 +119,9 @@ export const uiGerman: UiMessages = {
     keep: {
         label: "Diese Datei im Browser behalten",
         hint: "Sie bleibt auf diesem Gerät, bis Sie das abschalten.",
+        kept: "Diese Datei bleibt im Browser.",
         removed: "Die behaltene Datei wurde aus dem Browser entfernt.",
+        notRemoved: "Die behaltene Datei konnte nicht entfernt werden.",
         failed: "Dieser Browser behält keine Datei.",
     },
     saveSvg: "Als SVG sichern",

@@ -118,7 +118,9 @@ export const uiEnglish: UiMessages = {
     keep: {
         label: "Keep this file in this browser",
         hint: "It stays on this machine until you switch this off.",
+        kept: "This file stays in this browser.",
         removed: "The kept file was removed from this browser.",
+        notRemoved: "The kept file could not be removed.",
         failed: "This browser keeps no file.",
     },
     saveSvg: "Save as SVG",

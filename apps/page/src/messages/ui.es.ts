@@ -123,7 +123,9 @@ export const uiSpanish: UiMessages = {
     keep: {
         label: "Conservar este archivo en el navegador",
         hint: "Queda en este equipo hasta que lo desactive.",
+        kept: "Este archivo queda en el navegador.",
         removed: "El archivo conservado se quitó del navegador.",
+        notRemoved: "No se pudo quitar el archivo conservado.",
         failed: "Este navegador no conserva archivos.",
     },
     saveSvg: "Guardar como SVG",

@@ -101,7 +101,9 @@ export interface UiMessages {
     readonly keep: {
         readonly label: string;
         readonly hint: string;
+        readonly kept: string;
         readonly removed: string;
+        readonly notRemoved: string;
         readonly failed: string;
     };
     readonly saveSvg: string;

@@ -20,6 +20,9 @@ import type { Panels } from "./Panels";
 import { CancelledError } from "./Reading";
 
 export class Opening {
+    // The reader's last wish to keep or remove the file, until it is done.
+    private keeping: Promise<void> = Promise.resolve();
+
     constructor(
         private readonly page: Page,
         private readonly panels: Panels,
@@ -92,18 +95,30 @@ export class Opening {
         }
     }
 
-    /** Keeps the open file in the browser for the next visit, or removes it. */
-    async setKept(isKept: boolean): Promise<void> {
+    /** Keeps the open file in the browser for the next visit, or removes it, each wish after the one before. */
+    setKept(isKept: boolean): Promise<void> {
+        this.keeping = this.keeping.then(() => (isKept ? this.keep() : this.remove()));
+        return this.keeping;
+    }
+
+    private async keep(): Promise<void> {
         const { page } = this;
         const { files, notices, ui } = page;
-        if (!isKept) {
-            await removeKeptFile();
-            notices.show(ui.keep.removed);
-        } else if (files.opened && !(await keepFile(files.opened))) {
-            notices.fail(ui.keep.failed, []);
-            isKept = false;
-        }
-        page.isKept = isKept;
+        if (!files.opened) return;
+        const isStored = await keepFile(files.opened);
+        if (isStored) notices.show(ui.keep.kept);
+        else notices.fail(ui.keep.failed, []);
+        page.isKept = isStored;
+        this.panels.showKept();
+    }
+
+    private async remove(): Promise<void> {
+        const { page } = this;
+        const { notices, ui } = page;
+        const isRemoved = await removeKeptFile();
+        if (isRemoved) notices.show(ui.keep.removed);
+        else notices.fail(ui.keep.notRemoved, []);
+        page.isKept = !isRemoved;
         this.panels.showKept();
     }
 
