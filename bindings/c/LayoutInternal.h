@@ -26,11 +26,6 @@ struct olvane_layout {
 
 namespace olvane::c {
 
-bool isComplete(const olvane_host& host);
-
-// The callbacks as a data source; the host outlives it.
-std::shared_ptr<OlvaneViewerManagerWrapProtocol> sourceOf(const olvane_host& host);
-
 // Runs the work, and makes a status and a sentence of what it throws.
 olvane_status guarded(const std::function<void()>& work, std::string& failure);
 

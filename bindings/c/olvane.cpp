@@ -1,168 +1,33 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The one file that sees both sides: C structs and callbacks on the left, the engine on the right. A host's
-// callbacks become a data source for the length of a call; a failure that one of them reports travels through
-// the engine as an exception and becomes a status at the entry. Records and pictures are made from the typed layout
-// that the engine fills beside the text.
+// Layouts in C: the engine is asked, what it throws becomes a status, and records are made from the typed layout that
+// it fills beside the text.
 
 #include <olvane.h>
 
 #include <cstdint>
-#include <limits>
 #include <memory>
 #include <new>
 #include <stdexcept>
 #include <string>
-#include <utility>
 #include <vector>
 
 #include "FamilyInternal.h"
+#include "HostSource.h"
 #include "LayoutInternal.h"
 #include "ViewOptions.h"
-
-// The opaque answers are what the engine takes, so nothing is copied twice. An append that found no memory is
-// remembered: a callback that does not look at its status must not hand in a shorter list unnoticed.
-struct olvane_person_list {
-    std::vector<std::int64_t> ids;
-    bool lacksMemory = false;
-};
-
-struct olvane_date {
-    std::string text;
-    bool lacksMemory = false;
-};
 
 namespace {
 
 using olvane::TypedLayout;
 using olvane::c::areInRange;
 using olvane::c::defaultOptions;
+using olvane::c::HostFailure;
+using olvane::c::isComplete;
+using olvane::c::isPersonId;
 using olvane::c::layoutOptionsOf;
-
-constexpr int kThrownCode = -1;
-
-bool isPersonId(std::int64_t id) {
-    return id >= 1 && id <= std::numeric_limits<std::int32_t>::max();
-}
-
-// These travel through the engine only and never leave this file.
-struct HostFailure {
-    int code;
-    std::string what;
-};
-
-struct WrongId {
-    std::string what;
-};
-
-// The operation and the person that a failure is about: "spouses_of(17)".
-struct Question {
-    const char* operation;
-    std::int64_t person;
-
-    std::string text() const { return std::string(operation) + "(" + std::to_string(person) + ")"; }
-};
-
-// A data source that asks C callbacks.
-class CallbackManager final : public OlvaneViewerManagerWrapProtocol {
-public:
-    explicit CallbackManager(const olvane_host& host) : host_(host) {}
-
-    std::int64_t fatherForPersonWithID(std::int64_t personId) override {
-        return parentFrom(host_.father_of, {"father_of", personId});
-    }
-
-    std::int64_t motherForPersonWithID(std::int64_t personId) override {
-        return parentFrom(host_.mother_of, {"mother_of", personId});
-    }
-
-    std::vector<std::int64_t> spousesForPersonWithID(std::int64_t personId) override {
-        return listFrom(host_.spouses_of, {"spouses_of", personId});
-    }
-
-    std::vector<std::int64_t> childrenForPersonWithID(std::int64_t personId) override {
-        return listFrom(host_.children_of, {"children_of", personId});
-    }
-
-    bool isPreferredSpouse(std::int64_t personId, std::int64_t spouseId) override {
-        int preferred = 0;
-        ask({"is_preferred_spouse", personId},
-            [&] { return host_.is_preferred_spouse(host_.context, personId, spouseId, &preferred); });
-        return preferred != 0;
-    }
-
-    bool isPersonDead(std::int64_t personId) override {
-        int dead = 0;
-        ask({"is_dead", personId}, [&] { return host_.is_dead(host_.context, personId, &dead); });
-        return dead != 0;
-    }
-
-    std::string dateForPersonWithID(std::int64_t personId, bool isBirth) override {
-        olvane_date date;
-        askInto(date, {"date_of", personId},
-                [&] { return host_.date_of(host_.context, personId, isBirth ? 1 : 0, &date); });
-        return std::move(date.text);
-    }
-
-    std::int32_t sexOfPersonWithID(std::int64_t personId) override {
-        std::int32_t sex = 0;
-        ask({"sex_of", personId}, [&] { return host_.sex_of(host_.context, personId, &sex); });
-        return sex;
-    }
-
-private:
-    typedef int (*ParentCallback)(void*, std::int64_t, std::int64_t*);
-    typedef int (*ListCallback)(void*, std::int64_t, olvane_person_list*);
-
-    // A callback in C++ may throw in spite of the rule.
-    template <class Call>
-    static void ask(const Question& question, const Call& call) {
-        int code = kThrownCode;
-        bool hasThrown = false;
-        try {
-            code = call();
-        } catch (...) {
-            hasThrown = true;
-        }
-        if (hasThrown) throw HostFailure{kThrownCode, question.text() + " threw an exception"};
-        if (code != 0) throw HostFailure{code, question.text() + " returned " + std::to_string(code)};
-    }
-
-    // For the opaque answers. One that found no memory is why the callback failed, if it did.
-    template <class OpaqueAnswer, class Call>
-    static void askInto(const OpaqueAnswer& answer, const Question& question, const Call& call) {
-        try {
-            ask(question, call);
-        } catch (const HostFailure&) {
-            if (!answer.lacksMemory) throw;
-        }
-        if (answer.lacksMemory) throw std::bad_alloc();
-    }
-
-    // The engine would cut any other number to 32 bits, and draw another person.
-    static void checkId(const Question& question, std::int64_t id) {
-        if (isPersonId(id)) return;
-        throw WrongId{question.text() + " answered " + std::to_string(id) +
-                      ", which is no id: ids are 1 to 2147483647"};
-    }
-
-    std::int64_t parentFrom(ParentCallback callback, const Question& question) const {
-        std::int64_t parent = kPersonNotFound;
-        ask(question, [&] { return callback(host_.context, question.person, &parent); });
-        if (parent != kPersonNotFound) checkId(question, parent);
-        return parent;
-    }
-
-    std::vector<std::int64_t> listFrom(ListCallback callback, const Question& question) const {
-        olvane_person_list list;
-        askInto(list, question, [&] { return callback(host_.context, question.person, &list); });
-        for (const std::int64_t id : list.ids) checkId(question, id);
-        return std::move(list.ids);
-    }
-
-    const olvane_host& host_;
-};
+using olvane::c::WrongId;
 
 // Counts this thread's layouts: the engine numbers its unknown parents by thread, and a second layout inside the
 // first would start the numbers of both again.
@@ -184,11 +49,6 @@ private:
 
 thread_local bool RunningLayout::isRunning_ = false;
 
-bool isComplete(const olvane_host& host) {
-    return host.struct_size == sizeof(olvane_host) && host.father_of && host.mother_of && host.spouses_of &&
-           host.children_of && host.is_preferred_spouse && host.is_dead && host.date_of && host.sex_of;
-}
-
 // What both views ask for. Exactly one of host and source is there.
 struct Request {
     const olvane_host* host;
@@ -199,7 +59,7 @@ struct Request {
 };
 
 std::shared_ptr<OlvaneViewerManagerWrapProtocol> managerOf(const Request& request) {
-    if (request.host) return std::make_shared<CallbackManager>(*request.host);
+    if (request.host) return olvane::c::sourceOf(*request.host);
     return request.source;
 }
 
@@ -289,14 +149,6 @@ olvane_status layOutHost(const olvane_host* host, std::int64_t focus, const olva
 
 }  // namespace
 
-bool olvane::c::isComplete(const olvane_host& host) {
-    return ::isComplete(host);
-}
-
-std::shared_ptr<OlvaneViewerManagerWrapProtocol> olvane::c::sourceOf(const olvane_host& host) {
-    return std::make_shared<CallbackManager>(host);
-}
-
 olvane_status olvane::c::guarded(const std::function<void()>& work, std::string& failure) {
     try {
         work();
@@ -367,28 +219,6 @@ const char* olvane_status_text(olvane_status status) {
 
 const char* olvane_version(void) {
     return OLVANE_VERSION;
-}
-
-olvane_status olvane_person_list_append(olvane_person_list* list, const int64_t* ids, size_t count) {
-    if (!list || (!ids && count > 0)) return OLVANE_INVALID_ARGUMENT;
-    try {
-        list->ids.insert(list->ids.end(), ids, ids + count);
-    } catch (...) {
-        list->lacksMemory = true;
-        return OLVANE_OUT_OF_MEMORY;
-    }
-    return OLVANE_OK;
-}
-
-olvane_status olvane_date_set(olvane_date* date, const char* text) {
-    if (!date) return OLVANE_INVALID_ARGUMENT;
-    try {
-        date->text = text ? text : "";
-    } catch (...) {
-        date->lacksMemory = true;
-        return OLVANE_OUT_OF_MEMORY;
-    }
-    return OLVANE_OK;
 }
 
 olvane_status olvane_layout_family(const olvane_host* host, int64_t focus, const olvane_options* options,

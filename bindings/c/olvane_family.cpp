@@ -1,27 +1,27 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// The table of a family in C: columns and rows go in as they lie, and what is refused becomes a status and an error.
+// The table of a family in C: made, changed and read; what it refuses becomes a status and an error.
 
 #include <olvane_family.h>
 
 #include <algorithm>
 #include <cstring>
-#include <list>
 #include <memory>
 #include <new>
 #include <string_view>
 #include <vector>
 
+#include "FamilyInput.h"
 #include "FamilyInternal.h"
 
 namespace {
 
 using olvane::Family;
-using olvane::FamilyColumns;
 using olvane::FamilyError;
-using olvane::NumberColumn;
-using olvane::TextColumn;
+using olvane::c::childrenOf;
+using olvane::c::rowOf;
+using olvane::c::viewOf;
 
 template <std::size_t size>
 void copyText(char (&target)[size], std::string_view text) {
@@ -63,114 +63,8 @@ olvane_status guarded(olvane_family_error* error, Work work) noexcept {
     return OLVANE_OK;
 }
 
-// Columns as the table takes them. Texts that end with zero bytes are looked through once for where they begin.
-class Columns {
-public:
-    explicit Columns(const olvane_family_columns& given) {
-        const auto& persons = given.persons;
-        columns_.persons = {numbers(persons.id),  numbers(persons.father),      numbers(persons.mother),
-                            numbers(persons.sex), numbers(persons.dead),        texts(persons.birth),
-                            texts(persons.death), texts(persons.birth_written), texts(persons.death_written)};
-        columns_.spouses = {numbers(given.spouses.person), numbers(given.spouses.spouse),
-                            numbers(given.spouses.preferred)};
-        columns_.children = {numbers(given.children.parent), numbers(given.children.child)};
-        const auto& families = given.families;
-        columns_.families = {numbers(families.number),      numbers(families.partner0),
-                             numbers(families.partner1),    numbers(families.state),
-                             texts(families.marriage),      texts(families.marriage_written),
-                             texts(families.marriage_place)};
-        columns_.familyChildren = {numbers(given.family_children.family),
-                                   numbers(given.family_children.child), numbers(given.family_children.kind)};
-        columns_.names = {numbers(given.names.person), numbers(given.names.kind), texts(given.names.text)};
-        columns_.fields = {numbers(given.fields.person), texts(given.fields.key), texts(given.fields.text)};
-    }
-    Columns(const Columns&) = delete;
-    Columns& operator=(const Columns&) = delete;
-
-    const FamilyColumns& columns() const { return columns_; }
-    bool areOfKnownTypes() const { return typesAreKnown_; }
-
-private:
-    NumberColumn numbers(const olvane_numbers& given) {
-        if (!given.data) return {};
-        if (given.type < OLVANE_INT8 || given.type > OLVANE_DOUBLE) {
-            typesAreKnown_ = false;
-            return {};
-        }
-        return NumberColumn(static_cast<NumberColumn::Type>(given.type), given.data, given.count);
-    }
-
-    TextColumn texts(const olvane_texts& given) {
-        if (given.texts) return TextColumn(std::span(given.texts, given.count));
-        if (!given.bytes) return {};
-        if (given.starts)
-            return TextColumn(given.bytes, given.length, std::span(given.starts, given.count + 1));
-        return TextColumn(std::span<const std::string_view>(endedByZero(given)));
-    }
-
-    // As many as there are, which may be another number than was said: the table sees that.
-    const std::vector<std::string_view>& endedByZero(const olvane_texts& given) {
-        std::vector<std::string_view>& views = views_.emplace_back();
-        views.reserve(given.count);
-        const char* at = given.bytes;
-        const char* const end = given.bytes + given.length;
-        while (at != end) {
-            const void* const found = std::memchr(at, '\0', static_cast<std::size_t>(end - at));
-            const char* const last = found ? static_cast<const char*>(found) : end;
-            views.emplace_back(at, static_cast<std::size_t>(last - at));
-            at = found ? last + 1 : end;
-        }
-        return views;
-    }
-
-    FamilyColumns columns_;
-    std::list<std::vector<std::string_view>> views_;
-    bool typesAreKnown_ = true;
-};
-
-std::string_view viewOf(const char* text) {
-    return text ? std::string_view(text) : std::string_view();
-}
-
 olvane_text textOf(std::string_view text) {
     return {text.empty() ? "" : text.data(), text.size()};
-}
-
-// A choice that does not fit its byte must not become one that does.
-template <class Choice>
-Choice choiceOf(std::int32_t number) {
-    return static_cast<Choice>(number >= 0 && number < 255 ? number : 255);
-}
-
-olvane::PersonRow rowOf(const olvane_person_row& row) {
-    return {row.id,
-            row.father,
-            row.mother,
-            choiceOf<olvane::kin::Sex>(row.sex),
-            row.dead != 0,
-            viewOf(row.birth),
-            viewOf(row.death),
-            viewOf(row.birth_written),
-            viewOf(row.death_written)};
-}
-
-olvane::FamilyRow rowOf(const olvane_family_row& row) {
-    return {row.number,
-            row.partner0,
-            row.partner1,
-            choiceOf<olvane::kin::UnionState>(row.state),
-            viewOf(row.marriage),
-            viewOf(row.marriage_written),
-            viewOf(row.marriage_place)};
-}
-
-std::vector<olvane::FamilyChild> childrenOf(const olvane_family_child* children, std::size_t count) {
-    std::vector<olvane::FamilyChild> list;
-    list.reserve(count);
-    for (std::size_t i = 0; i < count; ++i) {
-        list.push_back({children[i].child, choiceOf<olvane::kin::ChildKind>(children[i].kind)});
-    }
-    return list;
 }
 
 olvane_status copyIds(const std::vector<olvane::FamilyId>& ids, std::uint32_t* target, std::size_t room) {
@@ -189,7 +83,7 @@ olvane_status olvane_family_create(const olvane_family_columns* columns, olvane_
     const olvane_status status = guarded(error, [&] {
         auto made = std::make_unique<olvane_family>();
         if (columns) {
-            const Columns given(*columns);
+            const olvane::c::FamilyInput given(*columns);
             isKnown = given.areOfKnownTypes();
             if (isKnown) made->table = Family(given.columns());
         }
@@ -241,14 +135,7 @@ olvane_status olvane_family_set_children(olvane_family* family, int64_t id, cons
 olvane_status olvane_family_set_names(olvane_family* family, int64_t id, const olvane_name_part* names,
                                       size_t count, olvane_family_error* error) {
     if (!family || (!names && count > 0)) return OLVANE_INVALID_ARGUMENT;
-    return guarded(error, [&] {
-        std::vector<olvane::NamePart> parts;
-        parts.reserve(count);
-        for (std::size_t i = 0; i < count; ++i) {
-            parts.push_back({choiceOf<olvane::NameKind>(names[i].kind), viewOf(names[i].text)});
-        }
-        family->table.setNames(id, parts);
-    });
+    return guarded(error, [&] { family->table.setNames(id, olvane::c::namesOf(names, count)); });
 }
 
 olvane_status olvane_family_set_field(olvane_family* family, int64_t id, const char* key, const char* text,

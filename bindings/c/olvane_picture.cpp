@@ -1,13 +1,12 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A picture in C: the library's own picture, copied once into structs whose layout never changes.
+// Pictures in C: one of each view of a family, a file or a host, or of a layout; its JSON, and what the judge counts.
 
 #include <olvane_picture.h>
 
 #include <cstddef>
 #include <functional>
-#include <limits>
 #include <memory>
 #include <mutex>
 #include <new>
@@ -18,7 +17,9 @@
 
 #include "FamilyInternal.h"
 #include "FileInternal.h"
+#include "HostSource.h"
 #include "LayoutInternal.h"
+#include "PictureArrays.h"
 #include "ViewOptions.h"
 
 #include <olvane/charts/Views.h>
@@ -29,132 +30,10 @@
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/LimitedDataSource.h>
 
-// The opaque picture.
-struct olvane_picture {
-    std::vector<olvane_picture_box> boxes;
-    std::vector<olvane_picture_family> families;
-    std::vector<std::int32_t> members;
-    std::vector<std::int32_t> childKinds;
-    std::vector<olvane_picture_line> lines;
-    std::vector<double> bridges;
-    std::vector<olvane_picture_mark> marks;
-    std::int32_t focus = OLVANE_NO_PLACE;
-    std::int32_t other = OLVANE_NO_PLACE;
-    std::vector<olvane_picture_arc> arcs;
-    std::vector<double> ringRadii;
-    double middleX = 0;
-    double middleY = 0;
-    std::vector<std::string> words;  // of ways, which point to them
-    std::vector<olvane_picture_way> ways;
-    std::vector<std::int32_t> wayBoxes;
-    std::vector<olvane_picture_piece> wayPieces;
-    std::string focusIs;
-    std::string otherIs;
-    std::vector<olvane_picture_folded> folded;
-    std::string failure;
-
-    olvane::picture::Picture
-        source;  // of which the text is made at the first question, and a later picture's places
-    mutable std::mutex guard;
-    mutable std::string json;
-    std::int32_t direction = 0;  // of a view in one call
-    bool mirrored = false;
-};
-
 namespace {
 
 namespace picture = olvane::picture;
 namespace charts = olvane::charts;
-
-olvane_picture_box boxOf(const picture::Box& box) {
-    return {box.id,
-            box.x,
-            box.y,
-            box.width,
-            box.height,
-            static_cast<std::int32_t>(box.kind),
-            static_cast<std::int32_t>(box.sex),
-            box.childOf,
-            box.repeat,
-            box.flag ? 1 : 0,
-            box.hiddenParents,
-            box.hiddenPartners,
-            box.hiddenChildren,
-            box.furtherParents,
-            0};
-}
-
-olvane_picture_family familyOf(const picture::Family& family) {
-    return {family.firstMember,
-            family.parentCount,
-            family.childCount,
-            family.firstLine,
-            family.lineCount,
-            family.number,
-            static_cast<std::int32_t>(family.style)};
-}
-
-olvane_picture_line lineOf(const picture::Line& line) {
-    return {line.x1,    line.y1,          line.x2,         line.y2, static_cast<std::int32_t>(line.role),
-            line.child, line.firstBridge, line.bridgeCount};
-}
-
-olvane_picture_mark markOf(const picture::Mark& mark) {
-    return {static_cast<std::int32_t>(mark.kind), mark.number, {mark.boxes[0], mark.boxes[1], mark.boxes[2]}};
-}
-
-template <class Target, class Source, class Convert>
-void copyAll(const std::vector<Source>& from, std::vector<Target>& to, const Convert& convert) {
-    to.reserve(from.size());
-    for (const Source& entry : from) to.push_back(convert(entry));
-}
-
-void fillKinship(const picture::Picture& from, olvane_picture& to) {
-    to.other = from.other;
-    to.focusIs = from.focusIs;
-    to.otherIs = from.otherIs;
-    copyAll(from.ways, to.words, [](const picture::Way& way) { return way.words; });
-    for (std::size_t i = 0; i < from.ways.size(); ++i) {
-        const picture::Way& way = from.ways[i];
-        to.ways.push_back({way.firstBox, way.boxCount, way.ancestorCount, way.firstPiece, way.pieceCount,
-                           static_cast<std::int32_t>(way.kind), to.words[i].c_str()});
-    }
-    to.wayBoxes = from.wayBoxes;
-    copyAll(from.wayPieces, to.wayPieces, [](const picture::WayPiece& piece) {
-        return olvane_picture_piece{piece.x1, piece.y1, piece.x2, piece.y2};
-    });
-}
-
-void fill(picture::Picture from, olvane_picture& to) {
-    copyAll(from.boxes, to.boxes, boxOf);
-    copyAll(from.families, to.families, familyOf);
-    copyAll(from.lines, to.lines, lineOf);
-    copyAll(from.marks, to.marks, markOf);
-    to.members = from.members;
-    copyAll(from.childKinds, to.childKinds,
-            [](olvane::kin::ChildKind kind) { return static_cast<std::int32_t>(kind); });
-    to.bridges = from.bridges;
-    to.focus = from.focus;
-    copyAll(from.arcs, to.arcs, [](const picture::Arc& arc) {
-        return olvane_picture_arc{arc.from, arc.to, arc.ring, arc.line};
-    });
-    to.ringRadii = from.ringRadii;
-    to.middleX = from.middleX;
-    to.middleY = from.middleY;
-    fillKinship(from, to);
-    copyAll(from.folded, to.folded, [](const picture::FoldedBranch& folded) {
-        return olvane_picture_folded{folded.box, folded.count, static_cast<std::int32_t>(folded.branch),
-                                     static_cast<std::int32_t>(folded.side)};
-    });
-    to.source = std::move(from);
-}
-
-template <class Entry>
-const Entry* dataOrNull(const std::vector<Entry>& entries) {
-    return entries.empty() ? nullptr : entries.data();
-}
-
-constexpr std::int64_t kGreatestId = std::numeric_limits<std::int32_t>::max();
 
 // The request, with the places of an earlier picture where that was laid out alike.
 struct Request : olvane::c::AskedView {
@@ -167,10 +46,11 @@ struct Request : olvane::c::AskedView {
 };
 
 void fillAsked(picture::Picture from, const olvane_picture_options& options, olvane_picture& to) {
-    fill(std::move(from), to);
+    olvane::c::fill(std::move(from), to);
     to.direction = options.direction;
     to.mirrored = options.mirrored != 0;
 }
+
 olvane_picture_options chosenOptions(const olvane_picture_options* options) {
     olvane_picture_options chosen;
     if (options) return *options;
@@ -283,7 +163,7 @@ olvane_status olvane_picture_of_host(const olvane_host* host, int64_t focus,
         return OLVANE_INVALID_ARGUMENT;
     }
     const auto work = [&](olvane_picture& made) {
-        if (focus < 1 || focus > kGreatestId) throw std::out_of_range("no id of a person");
+        if (!olvane::c::isPersonId(focus)) throw std::out_of_range("no id of a person");
         fillAsked(
             charts::pictureOfHost(olvane::c::sourceOf(*host), focus, Request(chosen).request, chosen.other),
             chosen, made);
@@ -311,7 +191,7 @@ olvane_status olvane_picture_create(const olvane_layout* layout, const olvane_fa
             options.known = &known;
         }
         auto made = std::make_unique<olvane_picture>();
-        fill(picture::pictureOf(layout->typed, options), *made);
+        olvane::c::fill(picture::pictureOf(layout->typed, options), *made);
         *picture = made.release();
     } catch (...) {
         return OLVANE_OUT_OF_MEMORY;  // nothing else can fail here
@@ -321,45 +201,6 @@ olvane_status olvane_picture_create(const olvane_layout* layout, const olvane_fa
 
 void olvane_picture_free(olvane_picture* picture) {
     delete picture;
-}
-
-olvane_status olvane_picture_read(const olvane_picture* picture, olvane_picture_arrays* arrays) {
-    if (!picture || !arrays || arrays->struct_size != sizeof(olvane_picture_arrays)) {
-        return OLVANE_INVALID_ARGUMENT;
-    }
-    *arrays = {sizeof(olvane_picture_arrays),
-               dataOrNull(picture->boxes),
-               picture->boxes.size(),
-               dataOrNull(picture->families),
-               picture->families.size(),
-               dataOrNull(picture->members),
-               dataOrNull(picture->childKinds),
-               picture->members.size(),
-               dataOrNull(picture->lines),
-               picture->lines.size(),
-               dataOrNull(picture->bridges),
-               picture->bridges.size(),
-               dataOrNull(picture->marks),
-               picture->marks.size(),
-               picture->focus,
-               picture->other,
-               dataOrNull(picture->arcs),
-               picture->arcs.size(),
-               dataOrNull(picture->ringRadii),
-               picture->ringRadii.size(),
-               picture->middleX,
-               picture->middleY,
-               dataOrNull(picture->ways),
-               picture->ways.size(),
-               dataOrNull(picture->wayBoxes),
-               picture->wayBoxes.size(),
-               dataOrNull(picture->wayPieces),
-               picture->wayPieces.size(),
-               picture->focusIs.c_str(),
-               picture->otherIs.c_str(),
-               dataOrNull(picture->folded),
-               picture->folded.size()};
-    return OLVANE_OK;
 }
 
 olvane_status olvane_picture_json(const olvane_picture* picture, const char** text, size_t* length) {
