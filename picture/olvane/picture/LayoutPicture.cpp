@@ -7,15 +7,11 @@
 #include <cmath>
 #include <cstddef>
 #include <map>
-#include <set>
-#include <span>
-#include <tuple>
-#include <unordered_map>
 #include <utility>
 #include <vector>
 
 #include <olvane/kin/shared/Index.h>
-#include <olvane/kin/shared/MergeSort.h>
+#include <olvane/picture/PersonMarksInternal.h>
 #include <olvane/picture/shared/FurtherParents.h>
 
 namespace olvane::picture {
@@ -54,9 +50,11 @@ public:
         for (const TypedLayout::Family& family : layout_.families) addFamily(family);
         mergeSiblings();
         writeFamilies();
-        numberRepeats();
-        countHidden();
-        markShownElsewhere();
+        numberRepeats(picture_);
+        if (known_ != nullptr) {
+            countHidden(*known_, picture_);
+            markShownElsewhere(*known_, picture_);
+        }
         RouteOptions route;
         route.direction = directionOf(layout_.view);
         routeLines(picture_, route);
@@ -119,8 +117,6 @@ private:
         return picture_.boxes[at(box)].kind == BoxKind::person ? placeOf(picture_.boxes[at(box)].id)
                                                                : kin::kNobody;
     }
-
-    // --- families
 
     // One family of the layout, split into the known ones.
     void addFamily(const TypedLayout::Family& family) {
@@ -250,160 +246,12 @@ private:
         }
     }
 
-    // --- persons with several boxes, and without
-
-    double distanceFromFocus(Index box) const {
-        const Box& focus = picture_.boxes[at(picture_.focus)];
-        const double dx = picture_.boxes[at(box)].x - focus.x;
-        const double dy = picture_.boxes[at(box)].y - focus.y;
-        return dx * dx + dy * dy;
-    }
-
-    void numberRepeats() {
-        std::vector<Index> order;
-        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
-            if (picture_.boxes[i].kind == BoxKind::person) order.push_back(static_cast<Index>(i));
-        }
-        const auto key = [this](Index i) {
-            return std::tuple(picture_.boxes[at(i)].id, distanceFromFocus(i), i);
-        };
-        kin::mergeSort(order.begin(), order.end(), [&](Index a, Index b) { return key(a) < key(b); });
-        std::vector<std::span<const Index>> repeated;
-        for (std::size_t i = 0, next = 0; i < order.size(); i = next) {
-            while (next < order.size() &&
-                   picture_.boxes[at(order[next])].id == picture_.boxes[at(order[i])].id)
-                ++next;
-            if (next - i > 1) repeated.push_back(std::span(order).subspan(i, next - i));
-        }
-        // Numbers run in the order of the first boxes.
-        kin::mergeSort(repeated.begin(), repeated.end(), [](const auto& a, const auto& b) {
-            return *std::min_element(a.begin(), a.end()) < *std::min_element(b.begin(), b.end());
-        });
-        std::int32_t number = 0;
-        for (const std::span<const Index> boxes : repeated) markRepeats(boxes, ++number);
-    }
-
-    void markRepeats(std::span<const Index> boxes, std::int32_t number) {
-        for (std::size_t i = 0; i < boxes.size(); ++i) {
-            picture_.boxes[at(boxes[i])].repeat = static_cast<std::int32_t>(i) + 1;
-            if (i > 0) picture_.marks.push_back({{boxes[0], boxes[i], kNone}, number, MarkKind::samePerson});
-        }
-    }
-
-    void countHidden() {
-        if (known_ == nullptr) return;
-        std::vector<bool> shown(at(known_->personCount()));
-        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
-            const kin::Place person = placeOfBox(static_cast<Index>(i));
-            if (person != kin::kNobody) shown[at(person)] = true;
-        }
-        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
-            const kin::Place person = placeOfBox(static_cast<Index>(i));
-            if (person != kin::kNobody) countHiddenOf(person, shown, picture_.boxes[i]);
-        }
-    }
-
-    // Everybody once, in however many families.
-    void countHiddenOf(kin::Place person, const std::vector<bool>& shown, Box& box) const {
-        std::vector<kin::Place> parents;
-        std::vector<kin::Place> partners;
-        std::vector<kin::Place> children;
-        for (const kin::UnionPlace u : known_->unionsAsChild(person)) {
-            const auto& two = known_->partners(u);
-            parents.insert(parents.end(), two.begin(), two.end());
-        }
-        for (const kin::UnionPlace u : known_->unionsAsPartner(person)) {
-            partners.push_back(known_->otherPartner(u, person));
-            const auto all = known_->children(u);
-            children.insert(children.end(), all.begin(), all.end());
-        }
-        const auto countOf = [&shown](std::vector<kin::Place>& persons) {
-            std::erase_if(persons, [&](kin::Place p) { return p == kin::kNobody || shown[at(p)]; });
-            kin::mergeSort(persons.begin(), persons.end());
-            return static_cast<std::int32_t>(std::unique(persons.begin(), persons.end()) - persons.begin());
-        };
-        box.hiddenParents = countOf(parents);
-        box.hiddenPartners = countOf(partners);
-        box.hiddenChildren = countOf(children);
-    }
-
-    // --- relations between persons who are shown, of which the view draws nothing
-
-    // The person's first box; kNone for who is not shown.
-    Index firstBox(kin::Place person) const { return person == kin::kNobody ? kNone : firstBox_[at(person)]; }
-
-    void markShownElsewhere() {
-        if (known_ == nullptr) return;
-        firstBox_.assign(at(known_->personCount()), kNone);
-        std::set<kin::UnionPlace> unions;
-        for (std::size_t i = 0; i < picture_.boxes.size(); ++i) {
-            const kin::Place person = placeOfBox(static_cast<Index>(i));
-            if (person == kin::kNobody || picture_.boxes[i].repeat > 1) continue;
-            firstBox_[at(person)] = static_cast<Index>(i);
-            for (const kin::UnionPlace u : known_->unionsAsPartner(person)) unions.insert(u);
-        }
-        listExpressed();
-        for (const kin::UnionPlace u : unions) markShownElsewhereOf(u);
-    }
-
-    using Relation = std::pair<kin::Place, kin::Place>;
-
-    void listExpressed() {
-        for (const Family& family : picture_.families) {
-            const auto parents = picture_.parents(family);
-            if (parents.size() == 2)
-                addBothWays(expressedPartners_, placeOfBox(parents[0]), placeOfBox(parents[1]));
-            for (const Index child : picture_.children(family)) {
-                for (const Index parent : parents)
-                    expressedParents_.emplace(placeOfBox(child), placeOfBox(parent));
-            }
-        }
-    }
-
-    // Both ways.
-    static void addBothWays(std::set<Relation>& expressed, kin::Place a, kin::Place b) {
-        expressed.emplace(a, b);
-        expressed.emplace(b, a);
-    }
-
-    void markShownElsewhereOf(kin::UnionPlace u) {
-        const auto& partners = known_->partners(u);
-        const Index one = firstBox(partners[0]);
-        const Index other = firstBox(partners[1]);
-        const bool areExpressed =
-            partners[0] == partners[1] || expressedPartners_.contains({partners[0], partners[1]});
-        if (one != kNone && other != kNone && !areExpressed) {
-            addMark(one, other, kNone, MarkKind::partnersElsewhere);
-            addBothWays(expressedPartners_, partners[0], partners[1]);
-        }
-        for (const kin::Place child : known_->children(u)) {
-            if (firstBox(child) == kNone) continue;
-            std::vector<Index> untold;
-            for (const kin::Place parent : partners) {
-                if (firstBox(parent) != kNone && expressedParents_.emplace(child, parent).second) {
-                    untold.push_back(firstBox(parent));
-                }
-            }
-            if (untold.empty()) continue;
-            addMark(firstBox(child), untold[0], untold.size() > 1 ? untold[1] : kNone,
-                    MarkKind::parentsElsewhere);
-        }
-    }
-
-    void addMark(Index a, Index b, Index c, MarkKind kind) {
-        const std::int32_t number = picture_.marks.empty() ? 1 : picture_.marks.back().number + 1;
-        picture_.marks.push_back({{a, b, c}, number, kind});
-    }
-
     const TypedLayout& layout_;
     const LayoutPictureOptions& options_;
     const kin::KinGraph* known_;
     Picture picture_;
     std::vector<Index> boxOf_;  // by box of the layout
     std::vector<PictureFamily> families_;
-    std::vector<Index> firstBox_;  // by person
-    std::set<Relation> expressedParents_;
-    std::set<Relation> expressedPartners_;
 };
 
 }  // namespace
