@@ -1,7 +1,7 @@
 /* SPDX-FileCopyrightText: The Olvane developers */
 /* SPDX-License-Identifier: MIT */
 
-/* A data base that breaks down in the middle of a layout, and what its program learns of that. */
+/* A database that breaks down in the middle of a layout, and what its program learns of that. */
 
 #include <olvane.h>
 

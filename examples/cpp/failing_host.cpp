@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// A data base that breaks down in the middle of a layout, and what its program learns of that.
+// A database that breaks down in the middle of a layout, and what its program learns of that.
 
 #include <olvane/boundary/CheckedLayout.h>
 
@@ -18,7 +18,7 @@ public:
     std::int64_t motherForPersonWithID(std::int64_t) override { return kPersonNotFound; }
     std::vector<std::int64_t> spousesForPersonWithID(std::int64_t) override { return {}; }
     std::vector<std::int64_t> childrenForPersonWithID(std::int64_t) override {
-        throw std::runtime_error("the data base is closed");
+        throw std::runtime_error("the database is closed");
     }
     bool isPreferredSpouse(std::int64_t, std::int64_t) override { return false; }
     bool isPersonDead(std::int64_t) override { return false; }

@@ -1,6 +1,6 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
-// A data base that breaks down in the middle of a layout, and what its program learns of that.
+// A database that breaks down in the middle of a layout, and what its program learns of that.
 
 import { HostError, loadOlvane } from "olvane";
 
@@ -9,7 +9,7 @@ const brokenFamily = {
     motherOf: () => null,
     spousesOf: () => [],
     childrenOf() {
-        throw new Error("the data base is closed");
+        throw new Error("the database is closed");
     },
     isPreferredSpouse: () => false,
     isDead: () => false,

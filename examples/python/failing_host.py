@@ -1,6 +1,6 @@
 # SPDX-FileCopyrightText: The Olvane developers
 # SPDX-License-Identifier: MIT
-"""A data base that breaks down in the middle of a layout, and what its program learns of that."""
+"""A database that breaks down in the middle of a layout, and what its program learns of that."""
 
 import first_tree
 import olvane
@@ -8,7 +8,7 @@ import olvane
 
 class BrokenFamily(first_tree.MyFamily):
     def children_of(self, person: int) -> list[int]:
-        raise ConnectionError("the data base is closed")
+        raise ConnectionError("the database is closed")
 
 
 try:

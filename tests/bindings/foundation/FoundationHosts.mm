@@ -22,7 +22,7 @@ auto answerOf(support::CaseHost* source, Question question) {
         return question(*source);
     } catch (const support::HostFailure&) {
     }
-    [NSException raise:NSGenericException format:@"the data base is closed"];
+    [NSException raise:NSGenericException format:@"the database is closed"];
     return decltype(question(*source)){};
 }
 
@@ -264,7 +264,7 @@ NSString* textOf(const std::string& date) {
 
 - (NSArray*)childrenForPersonWithID:(int64_t)personId {
     (void)personId;
-    @throw @"the data base is closed";
+    @throw @"the database is closed";
 }
 
 @end

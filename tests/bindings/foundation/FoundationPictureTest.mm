@@ -39,7 +39,7 @@
 
 - (NSArray*)childrenForPersonWithID:(int64_t)personId {
     (void)personId;
-    [NSException raise:NSGenericException format:@"the data base is closed"];
+    [NSException raise:NSGenericException format:@"the database is closed"];
     return nil;
 }
 
@@ -53,7 +53,7 @@
 
 - (NSArray*)childrenForPersonWithID:(int64_t)personId {
     (void)personId;
-    throw std::runtime_error("the data base is closed");
+    throw std::runtime_error("the database is closed");
 }
 
 @end
@@ -361,8 +361,8 @@ TEST_F(FoundationPicture, namesOperationPersonAndCauseWhereTheHostRaises) {
         [[[error userInfo] objectForKey:OlvaneErrorOperationKey] isEqual:@"childrenForPersonWithID:"]);
     EXPECT_EQ(17, [[[error userInfo] objectForKey:OlvaneErrorPersonKey] longLongValue]);
     EXPECT_TRUE([[[error userInfo] objectForKey:OlvaneErrorCauseKey]
-        isEqual:@"NSGenericException: the data base is closed"]);
-    EXPECT_EQ("childrenForPersonWithID: for person 17: NSGenericException: the data base is closed",
+        isEqual:@"NSGenericException: the database is closed"]);
+    EXPECT_EQ("childrenForPersonWithID: for person 17: NSGenericException: the database is closed",
               descriptionOf(error));
 }
 
@@ -381,7 +381,7 @@ TEST_F(FoundationPicture, reportsARaiseOfEachOperation) {
 TEST_F(FoundationPicture, reportsWhateverElseTheHostThrows) {
     EXPECT_EQ("childrenForPersonWithID: for person 17: an exception without a text",
               descriptionOf(errorOf(hostOf<ThrowingHost>(family("17+42")))));
-    EXPECT_EQ("childrenForPersonWithID: for person 17: the data base is closed",
+    EXPECT_EQ("childrenForPersonWithID: for person 17: the database is closed",
               descriptionOf(errorOf(hostOf<CxxThrowingHost>(family("17+42")))));
     EXPECT_EQ(OlvaneErrorHostFailed, [errorOf(hostOf<RaisingListHost>(family("17+42: 5"))) code]);
     EXPECT_EQ(OlvaneErrorHostFailed, [errorOf(hostOf<NullListHost>(family("17+42: 5"))) code]);

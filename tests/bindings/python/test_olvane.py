@@ -152,13 +152,13 @@ class Failures(unittest.TestCase):
         for method in METHODS:
             with self.subTest(method):
                 host = Family(THREE_GENERATIONS)
-                reason = ValueError("the data base is closed")
+                reason = ValueError("the database is closed")
                 setattr(host, method, raiser(reason))
                 with self.assertRaises(olvane.HostError) as caught:
                     olvane.layout(host, 17)
                 self.assertIs(reason, caught.exception.__cause__)
                 self.assertEqual(olvane.Status.HOST_FAILED, caught.exception.status)
-                self.assertIn("the data base is closed", str(caught.exception))
+                self.assertIn("the database is closed", str(caught.exception))
 
     def test_an_answer_of_the_wrong_type_is_the_hosts_failure(self) -> None:
         host = Family({})
