@@ -5,6 +5,7 @@
 
 import { after } from "node:test";
 import { closeBrowser } from "./support/browser.mjs";
+import { suitesInOrder } from "./support/disturbance.mjs";
 
 const kSuites = [
     "opening",
@@ -28,7 +29,7 @@ const kSuites = [
 ];
 
 const only = optionOf("--only");
-for (const suite of kSuites) {
+for (const suite of suitesInOrder(kSuites)) {
     if (!only || suite.startsWith(only)) await import(`./suites/${suite}.mjs`);
 }
 after(closeBrowser);

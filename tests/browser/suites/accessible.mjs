@@ -2,10 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 import assert from "node:assert/strict";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import axe from "axe-core";
 import { kTwoAtOnce, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { brokenFamily } from "../support/families.mjs";
+import { test } from "../support/reported.mjs";
 
 async function expectNoViolation(visit, state) {
     await visit.page.evaluate(axe.source);

@@ -7,7 +7,7 @@ import assert from "node:assert/strict";
 import { execFileSync, spawnSync } from "node:child_process";
 import { mkdirSync, readFileSync, symlinkSync, writeFileSync } from "node:fs";
 import { join } from "node:path";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { gunzipSync } from "node:zlib";
 import {
     fileFor,
@@ -20,6 +20,7 @@ import {
 } from "../support/browser.mjs";
 import { detailedFamily, kDetailWords, livingFamily } from "../support/families.mjs";
 import { archiveOf } from "../support/archive.mjs";
+import { test } from "../support/reported.mjs";
 
 const command = process.env.OLVANE_COMMAND;
 const kPhone = { viewport: { width: 390, height: 844 }, hasTouch: true, isMobile: true };
@@ -134,7 +135,15 @@ describe("details", kTwoAtOnce, () => {
         await visit.untilFamily();
         await visit.goTo("Berta");
         await visit.page.waitForSelector("#side-panel .photograph img");
-        await visit.page.waitForTimeout(300);
+        // What is none or is endless is known to be so then.
+        await visit.page.evaluate(
+            async (names) => {
+                const { photographs } = document.querySelector("olvane-tree").family;
+                await Promise.all(names.map((name) => photographs.urlOf(name)));
+                await Promise.all(all("#side-panel .photograph img").map((image) => image.decode()));
+            },
+            ["portrait.jpg", "drawing.svg", "bomb.png"],
+        );
         const shown = await visit.page.$$eval("#side-panel .photograph img", (all) =>
             all.map((one) => [one.alt, one.naturalWidth, one.src.slice(0, 5)]),
         );

@@ -6,8 +6,9 @@
 import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { join } from "node:path";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins } from "../support/browser.mjs";
+import { test } from "../support/reported.mjs";
 
 const kPhone = { viewport: { width: 390, height: 844 }, hasTouch: true, isMobile: true };
 
@@ -73,8 +74,7 @@ describe("folding", kTwoAtOnce, () => {
         const visit = await visitDarwins(kDescendants + "&fold=I1.down,I7.nobody,I999.up", kPhone);
         const folded = (await visit.shown()).length;
         await visit.fit();
-        await visit.page.tap('#tree [data-xref="I1"] .fold');
-        await visit.still();
+        await visit.tap('#tree [data-xref="I1"] .fold');
         assert.ok((await visit.shown()).length > folded);
         await visit.end();
     });
@@ -163,10 +163,9 @@ describe("folding", kTwoAtOnce, () => {
 
     test("on a phone the picture of a kinship is not hidden by the panel that led to it", async () => {
         const visit = await visitDarwins("#person=I1", kPhone);
-        await visit.page.tap('#tree [data-xref="I12"] .frame');
-        await visit.page.tap("#side-panel .handle");
-        await visit.page.tap("#how-related");
-        await visit.still();
+        await visit.tap('#tree [data-xref="I12"] .frame');
+        await visit.tap("#side-panel .handle");
+        await visit.tap("#how-related");
         assert.match(await visit.hash(), /view=kinship/);
         assert.equal(await visit.page.locator("#side-panel.drawn").count(), 0);
         await visit.end();

@@ -5,9 +5,10 @@
 
 import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { hostileFamily } from "../support/families.mjs";
+import { test } from "../support/reported.mjs";
 
 const kHostile = hostileFamily();
 
@@ -27,9 +28,10 @@ describe("hostile", kTwoAtOnce, () => {
             await visit.stand(`R${n}`);
             assert.equal(await page.locator("#side-panel header h2").count(), 1);
         }
-        await page.fill("#search", "script");
+        await visit.fit();
         await visit.box("R1").hover({ force: true });
-        await page.waitForTimeout(400);
+        await page.waitForSelector(".tooltip", { state: "visible" });
+        await page.fill("#search", "script");
         const after = await page.evaluate(() => ({
             elements: all("script, style, link, iframe, object, img, base, form").length,
             handlers: [...all("*")].filter((one) => one.getAttributeNames().some((name) => name.startsWith("on")))

@@ -5,8 +5,9 @@
 // stands there in English too is a word that nobody translated.
 
 import assert from "node:assert/strict";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { sample, visitEmpty } from "../support/browser.mjs";
+import { test } from "../support/reported.mjs";
 
 const kViews = ["pedigree", "near", "ancestors", "descendants", "hourglass", "relatives", "fan", "everybody", "family"];
 
@@ -77,7 +78,7 @@ const kPlaces = {
         await visit.still();
     },
     "nobody behind a link": async (visit) => {
-        await visit.page.evaluate(() => (location.hash = "#person=nobody"));
+        await visit.follow("#person=nobody");
         await visit.page.waitForSelector(".notice.failed");
     },
     map: async (visit) => {

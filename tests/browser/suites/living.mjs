@@ -6,10 +6,11 @@
 import assert from "node:assert/strict";
 import { execFileSync } from "node:child_process";
 import { readFileSync } from "node:fs";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { gunzipSync } from "node:zlib";
 import { fileFor, photograph, visitFile } from "../support/browser.mjs";
 import { livingFamily } from "../support/families.mjs";
+import { test } from "../support/reported.mjs";
 
 const kSecrets = /Zacharias|Geheimrat|Yolanda|Versteckt|Verborgen|Heimlichtuer|Niemandshausen|13 MAY|14 JUN|15 JUL/i;
 // Such numbers may stand in the page's own code; in what is stated of the family they are theirs.

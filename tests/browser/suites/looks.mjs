@@ -2,9 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 import assert from "node:assert/strict";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { brokenFamily, rightToLeftFamily } from "../support/families.mjs";
+import { becomes } from "../support/patience.mjs";
+import { test } from "../support/reported.mjs";
 
 const kPhone = { viewport: { width: 360, height: 740 }, hasTouch: true, isMobile: true, deviceScaleFactor: 2 };
 
@@ -35,15 +37,15 @@ describe("looks", kTwoAtOnce, () => {
         const visit = await visitDarwins("#person=I1", { ...kPhone, viewport: { width: 640, height: 360 } });
         await visit.dismiss();
         assert.deepEqual(await unreachable(visit), []);
-        await visit.page.tap("#legend summary");
-        assert.ok(await visit.page.isVisible("#legend ul"));
+        await visit.tap("#legend summary");
+        await visit.untilVisible("#legend ul", true);
         assert.deepEqual(await unreachable(visit), []);
-        await visit.page.tap("#legend summary");
-        assert.ok(!(await visit.page.isVisible("#legend ul")));
-        await visit.page.tap("#legend summary");
+        await visit.tap("#legend summary");
+        await visit.untilVisible("#legend ul", false);
+        await visit.tap("#legend summary");
         await visit.page.focus("#legend ul");
         await visit.press("Escape");
-        assert.ok(!(await visit.page.isVisible("#legend ul")));
+        await visit.untilVisible("#legend ul", false);
         assert.equal(await visit.page.evaluate(() => holder().tagName), "SUMMARY");
         await visit.end();
     });
@@ -114,12 +116,12 @@ describe("looks", kTwoAtOnce, () => {
             await page.click("#views-button");
             await page.click("#choose-map");
             await page.waitForSelector("#map canvas");
-            const corner = await page.evaluate(async () => {
-                await new Promise((next) => requestAnimationFrame(() => requestAnimationFrame(next)));
-                const { data } = one("#map canvas").getContext("2d").getImageData(2, 2, 1, 1);
-                return `rgb(${data[0]}, ${data[1]}, ${data[2]})`;
-            });
-            assert.equal(corner, canvas);
+            const corner = () =>
+                page.evaluate(() => {
+                    const { data } = one("#map canvas").getContext("2d").getImageData(2, 2, 1, 1);
+                    return `rgb(${data[0]}, ${data[1]}, ${data[2]})`;
+                });
+            await becomes(corner, canvas);
             await visit.end();
         }
     });
@@ -171,7 +173,7 @@ describe("looks", kTwoAtOnce, () => {
                 viewport: { width: 320, height: 568 },
                 locale,
             });
-            await visit.page.tap("#views-button");
+            await visit.tap("#views-button");
             const outside = await visit.page.evaluate(() => {
                 const panel = one("#views-panel").getBoundingClientRect();
                 const parts = all("#views-panel .view, #views-panel .view span");
@@ -198,22 +200,17 @@ describe("looks", kTwoAtOnce, () => {
         const sheet = () => page.locator("#side-panel .panel-body").boundingBox();
         const down = await sheet();
         assert.ok(down.y > 500, "most of the window is the picture's");
-        await page.tap("#side-panel .handle");
-        await page.waitForTimeout(400);
+        await visit.tap("#side-panel .handle");
         const up = await sheet();
         assert.ok(up.y < down.y - 100);
         await photograph(visit, "phone-panel");
-        await page.tap("#side-panel .handle");
-        await page.waitForTimeout(400);
+        await visit.tap("#side-panel .handle");
         const father = await visit.middleOf("I12");
-        await page.touchscreen.tap(father.x, father.y);
-        await visit.still();
+        await visit.tapAt(father);
         assert.equal(await visit.focus(), "I1", "a tap selects");
         assert.equal(await page.innerText("#side-panel h2"), "Robert Waring Darwin");
-        await page.tap("#side-panel .handle");
-        await page.waitForTimeout(400);
-        await page.tap("#make-focus");
-        await visit.still();
+        await visit.tap("#side-panel .handle");
+        await visit.tap("#make-focus");
         assert.equal(await visit.focus(), "I12");
         await visit.end();
     });
@@ -248,7 +245,7 @@ describe("looks", kTwoAtOnce, () => {
         await hasColours("contrast");
         await page.keyboard.press("Escape");
         await photograph(visit, "contrast");
-        await page.reload();
+        await visit.reload();
         await visit.untilFamily();
         await hasColours("contrast");
         await visit.end();
@@ -303,7 +300,7 @@ describe("looks", kTwoAtOnce, () => {
         await visit.page.mouse.click(middle.x, middle.y);
         const at = await visit.placing();
         const places = await visit.places();
-        await visit.page.waitForTimeout(200);
+        await visit.still();
         await visit.assertPlacedAs(at);
         assert.deepEqual(await visit.places(), places);
         const running = await visit.page.evaluate(

@@ -4,9 +4,10 @@
 // Charles Darwin's nearest: each switch with one of those whom it shows.
 
 import assert from "node:assert/strict";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
 import { gedcom, kFactFamily } from "../support/families.mjs";
+import { test } from "../support/reported.mjs";
 
 // Sister Susan; Henry Parker, husband of sister Marianne; their brother's child does not live in this file, so the
 // nieces are Caroline's daughters; uncle John; cousin Hensleigh; great-grandfather Robert; a son's wife; a grandson.
@@ -54,7 +55,7 @@ describe("options", kTwoAtOnce, () => {
         await visit.click("#unknown-parents");
         assert.equal(await unknown(), 0);
         assert.match(await visit.hash(), /hide=unknownParents/);
-        await visit.page.reload();
+        await visit.reload();
         await visit.untilFamily();
         assert.equal(await unknown(), 0);
         await visit.end();
@@ -88,7 +89,7 @@ describe("options", kTwoAtOnce, () => {
         assert.match(await visit.label("I1"), /\* 12 FEB 1809, \u2020 19 APR 1882, \* Bath, \u2020 Hove, Baker/);
         assert.match(await visit.hash(), /show=dates,places,occupation,marriage/);
         await photograph(visit, "facts");
-        await visit.page.reload();
+        await visit.reload();
         await visit.untilFamily();
         assert.equal((await linesOf("I1")).length, 5);
         assert.deepEqual(await marriages(), ["1839"]);
@@ -140,8 +141,7 @@ describe("options", kTwoAtOnce, () => {
         await visit.page.keyboard.press("Escape");
         await visit.fit();
         assert.notDeepEqual(await visit.places(), loose);
-        await visit.page.goto((await visit.page.url()).replace(/#.*/, "#person=I5&view=fan&compact=yes"));
-        await visit.untilFamily();
+        await visit.follow("#person=I5&view=fan&compact=yes");
         await visit.click("#views-button");
         assert.ok(!(await visit.page.isVisible("#compact")), "a fan cannot be");
         await visit.end();
@@ -203,7 +203,7 @@ describe("options", kTwoAtOnce, () => {
         await visit.click("#tree .further");
         assert.deepEqual(await allPersons(visit), ["I1", "I3"]);
         assert.match(await visit.hash(), /parents=1\.2/);
-        await visit.page.reload();
+        await visit.reload();
         await visit.untilFamily();
         assert.deepEqual(await allPersons(visit), ["I1", "I3"]);
         await visit.click("#tree .further");
@@ -222,8 +222,7 @@ describe("options", kTwoAtOnce, () => {
         assert.deepEqual(wordsAtEnds, ["husbandandfirstcousin", "wifeandfirstcousin"]);
         assert.ok((await visit.page.locator("#tree .ancestor").count()) > 0);
         await photograph(visit, "kinship");
-        await visit.page.goto((await visit.page.url()).replace(/#.*/, "#person=I1"));
-        await visit.page.waitForSelector("#tree .box");
+        await visit.follow("#person=I1");
         assert.equal(await visit.page.locator(".corner .ways li").count(), 0);
         await visit.end();
     });

@@ -6,9 +6,11 @@ import { execFileSync } from "node:child_process";
 import { mkdtempSync, readFileSync, rmSync, writeFileSync } from "node:fs";
 import { tmpdir } from "node:os";
 import { join } from "node:path";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, visitDarwins, visitFamily } from "../support/browser.mjs";
 import { kFactFamily } from "../support/families.mjs";
+import { becomes } from "../support/patience.mjs";
+import { test } from "../support/reported.mjs";
 
 async function save(visit, button) {
     await visit.click("#file-button");
@@ -175,7 +177,7 @@ describe("saving", kTwoAtOnce, () => {
         const downloads = [];
         page.on("download", (download) => downloads.push(download));
         await page.click("#sheets-png");
-        for (let tries = 0; downloads.length < sheets && tries < 100; ++tries) await page.waitForTimeout(50);
+        await becomes(() => downloads.length >= sheets, true);
         assert.deepEqual(
             downloads.map((one) => one.suggestedFilename()),
             Array.from({ length: sheets }, (_, i) => `darwin-wedgwood - Charles Robert Darwin-${i + 1}.png`),
@@ -239,15 +241,15 @@ describe("saving", kTwoAtOnce, () => {
         // A4 in points, upright or across.
         assert.match(pdf.toString("latin1"), /\/MediaBox \[0 0 (59[45][.0-9]* 84[12]|84[12][.0-9]* 59[45])/);
         await page.selectOption("#purpose", "grandparents");
-        assert.match(page.url(), /view=hourglass/);
-        assert.match(page.url(), /up=2/);
+        assert.match(await visit.hash(), /view=hourglass/);
+        assert.match(await visit.hash(), /up=2/);
         assert.deepEqual(
             await page.evaluate(() => ["paper", "sheet-rows", "sheet-columns"].map((id) => one("#" + id).value)),
             ["A4", "1", "1"],
         );
         assert.match(await message(), /^1 sheet, /);
         await page.selectOption("#purpose", "everybody");
-        assert.match(page.url(), /view=everybody/);
+        assert.match(await visit.hash(), /view=everybody/);
         assert.equal(await page.inputValue("#paper"), "A0");
         await visit.click("#print-dialog-close");
         assert.equal(pagesOf(await page.pdf({ preferCSSPageSize: true })), 1);

@@ -2,11 +2,10 @@
 // SPDX-License-Identifier: MIT
 
 import assert from "node:assert/strict";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, photograph, visitDarwins, visitFamily } from "../support/browser.mjs";
 import { gedcom } from "../support/families.mjs";
-
-const kIndexed = 3000; // ms, in which a small family has long been indexed
+import { test } from "../support/reported.mjs";
 
 async function found(visit) {
     return visit.page.$$eval("#search-list [role=option] bdi.name", (names) => names.map((name) => name.textContent));
@@ -15,7 +14,7 @@ async function found(visit) {
 describe("searching", kTwoAtOnce, () => {
     test("the index is made before anybody types", async () => {
         const visit = await visitDarwins();
-        await visit.page.waitForTimeout(kIndexed);
+        await visit.page.waitForFunction(() => performance.getEntriesByName("olvane-index").length > 0);
         // One call adds 50 persons of 142.
         assert.ok(await visit.page.evaluate(() => document.querySelector("olvane-tree").family.file.prepareSearch(0)));
         await visit.end();

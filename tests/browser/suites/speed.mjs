@@ -1,16 +1,41 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Figures are printed; what is asserted is far above them, since test machines are busy.
+// Figures are printed; what is asserted is far above them, since test machines are busy, and counts what this machine
+// computes meanwhile as slowly as that.
 
 import assert from "node:assert/strict";
 import { readFileSync, statSync } from "node:fs";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { engineIn, photograph, realFile, sample, visitEmpty, visitFamily } from "../support/browser.mjs";
 import { cousins } from "../support/families.mjs";
 import { gzipSync } from "node:zlib";
+import { test } from "../support/reported.mjs";
 
 const kPatience = 8;
+const kReference = 10; // ms that the computation of slowness() takes on a machine at rest
+const kRounds = 3;
+
+// How many times slower than a machine at rest the page computes just now; at least 1.
+async function slowness(visit) {
+    const time = await visit.page.evaluate(() => {
+        let best = Infinity;
+        for (let round = 0; round < 5; ++round) {
+            const start = performance.now();
+            let state = 1;
+            for (let i = 0; i < 4_000_000; ++i) state = (Math.imul(state ^ (state >>> 15), 48271) + 1) | 0;
+            if (state !== 0) best = Math.min(best, performance.now() - start);
+        }
+        return best;
+    });
+    return Math.max(1, time / kReference);
+}
+
+// Fails where the least of several times in ms is more than a bound on a machine at rest, with patience.
+function assertWithin(times, bound, slow) {
+    const least = Math.min(...times);
+    assert.ok(least < bound * kPatience * slow, `${times} ms on a machine ${slow.toFixed(1)} times slower`);
+}
 
 // A name, one letter of it wrong, words reversed, from the middle, a place, years, an xref, a letter, nobody, and on.
 const kTyped = [
@@ -46,6 +71,19 @@ async function refocusTime(visit, xref) {
     return (await scripts()) - before;
 }
 
+// From the drop of a file until its picture stands; ms.
+async function openingTime(visit, file) {
+    await visit.page.evaluate(() => {
+        addEventListener("drop", () => (window.droppedAt = performance.now()), true);
+        new MutationObserver(() => {
+            if (one("#tree .box.focus")) window.readyAt ??= performance.now();
+        }).observe(document.body, { childList: true, subtree: true });
+    });
+    await visit.drop("royal92.ged", file);
+    await visit.untilFamily();
+    return visit.page.evaluate(() => window.readyAt - window.droppedAt);
+}
+
 describe("speed", () => {
     test("a family of 1,000 boxes has a new focus within 50 ms of script", async (context) => {
         const visit = await visitFamily(cousins(31, 30), {}, {}, "#person=C3_4");
@@ -55,12 +93,11 @@ describe("speed", () => {
             await visit.still();
         }
         const boxes = Number(/(\d+) boxes/.exec(await visit.page.locator("#live").innerText())[1]);
-        const best = Math.min(...times);
         context.diagnostic(
             `${boxes} boxes: ${times.map((time) => time.toFixed(0)).join(", ")} ms of script for a new focus`,
         );
         assert.ok(boxes >= 950 && boxes <= 1100, String(boxes));
-        assert.ok(best < 50 * kPatience, `${best} ms`);
+        assertWithin(times, 50, await slowness(visit));
         await visit.end();
     });
 
@@ -99,7 +136,7 @@ describe("speed", () => {
         context.diagnostic(
             `${boxes} boxes: a step of a drag takes ${median.toFixed(1)} ms, the worst ${worst.toFixed(0)} ms`,
         );
-        assert.ok(median < 16 * kPatience, `${median} ms`);
+        assertWithin([median], 16, await slowness(visit));
         await visit.click("#fit");
         await photograph(visit, "overview");
         await visit.end();
@@ -108,18 +145,16 @@ describe("speed", () => {
     test("3,010 persons are ready within half a second of the drop", async (context) => {
         const file = realFile("history/royal92.ged");
         if (!file) return context.skip("OLVANE_GEDCOM_DIR is not set");
-        const visit = await visitEmpty();
-        await visit.page.evaluate(() => {
-            addEventListener("drop", () => (window.droppedAt = performance.now()), true);
-            new MutationObserver(() => {
-                if (one("#tree .box.focus")) window.readyAt ??= performance.now();
-            }).observe(document.body, { childList: true, subtree: true });
-        });
-        await visit.drop("royal92.ged", file);
-        await visit.untilFamily();
-        const time = await visit.page.evaluate(() => window.readyAt - window.droppedAt);
-        context.diagnostic(`royal92.ged: ready ${time.toFixed(0)} ms after the drop`);
-        assert.ok(time < 500 * kPatience, `${time} ms`);
+        const opened = [];
+        let visit = null;
+        for (let round = 0; round < kRounds; ++round) {
+            await visit?.end();
+            visit = await visitEmpty();
+            opened.push(await openingTime(visit, file));
+        }
+        const printed = opened.map((time) => time.toFixed(0)).join(", ");
+        context.diagnostic(`royal92.ged: ready ${printed} ms after the drop`);
+        assertWithin(opened, 500, await slowness(visit));
         await visit.goTo("Victoria Hanover");
         assert.match(await visit.page.innerText("#side-panel h2"), /Victoria/);
         await photograph(visit, "royal");
@@ -142,7 +177,7 @@ describe("speed", () => {
             `royal92.ged: a letter typed into the search takes ${first.toFixed(1)} ms the first time, then ` +
                 `${median.toFixed(1)} ms, ${others.at(-1).toFixed(1)} at most, with all rows of the list`,
         );
-        assert.ok(median < 10 * kPatience, `${median} ms`);
+        assertWithin([median], 10, await slowness(visit));
         await visit.end();
     });
 

@@ -7,10 +7,11 @@
 import assert from "node:assert/strict";
 import { existsSync, readFileSync, writeFileSync } from "node:fs";
 import { join } from "node:path";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
 import { kTwoAtOnce, visitDarwins, visitFamily } from "../support/browser.mjs";
 import { detailedFamily } from "../support/families.mjs";
 import { announced, spoken } from "../support/spoken.mjs";
+import { test } from "../support/reported.mjs";
 
 function compare(name, lines) {
     const path = join(process.env.OLVANE_SOURCES, "tests/browser/golden", name + ".txt");

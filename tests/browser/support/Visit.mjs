@@ -4,6 +4,9 @@
 // A window on the page, and what a person does in it.
 
 import assert from "node:assert/strict";
+import { becomes } from "./patience.mjs";
+
+const kShortLived = 5000; // ms; what goes away by itself after this or more
 
 /** In the page: what a selector finds in it and in the viewer's own tree, and what has the keys in either. */
 function lookInside() {
@@ -17,6 +20,14 @@ function lookInside() {
     window.holder = () => document.activeElement?.shadowRoot?.activeElement ?? document.activeElement;
 }
 
+/** In the page: how many clicks and steps of its history have come, and messages that stay until a slow test has read them. */
+function countEvents(shortLived) {
+    window.counts = { click: 0, popstate: 0 };
+    for (const kind of Object.keys(window.counts)) addEventListener(kind, () => ++window.counts[kind], true);
+    const later = window.setTimeout.bind(window);
+    window.setTimeout = (run, time = 0, ...parts) => later(run, time >= shortLived ? 1000 * time : time, ...parts);
+}
+
 export class Visit {
     /** Addresses that the page asked for, but for the page itself. */
     requests = [];
@@ -28,10 +39,21 @@ export class Visit {
         visit.context = context;
         visit.page = await context.newPage();
         await visit.page.addInitScript(lookInside);
+        await visit.page.addInitScript(countEvents, kShortLived);
         visit.watch(address);
         await visit.page.goto(address);
-        await visit.page.waitForSelector("#welcome, #tree:visible, #map canvas, .fatal");
+        await visit.untilStarted();
         return visit;
+    }
+
+    /** Until the page is ready for whatever is done with it. */
+    async untilStarted() {
+        await this.page.waitForSelector("#welcome, #tree:visible, #map canvas, .fatal");
+    }
+
+    async reload() {
+        await this.page.reload();
+        await this.untilStarted();
     }
 
     /** Every test ends with this: whatever was done, nothing was fetched and nothing broke. */
@@ -64,7 +86,7 @@ export class Visit {
         await this.still();
     }
 
-    /** Until nothing in the picture has moved or changed its words for a while. */
+    /** Until nothing in the picture has moved or changed its words for a while, and all of them are known. */
     async still() {
         await this.page.evaluate(async () => {
             const look = () => {
@@ -77,13 +99,17 @@ export class Visit {
                 const places = boxes.map((box) => box.getAttribute("transform")).join();
                 return [one("#tree .world")?.getAttribute("transform"), ghosts, words, places].join("|");
             };
+            const areWordsKnown = () =>
+                document.querySelector("olvane-tree")?.viewer?.shown.contents?.kinshipKnown ?? true;
             let last = look();
             let since = performance.now();
-            while (performance.now() - since < 80) {
+            for (let frames = 0; frames < 4 || performance.now() - since < 80;) {
                 await new Promise((next) => requestAnimationFrame(next));
                 const now = look();
-                if (now === last) continue;
+                ++frames;
+                if (now === last && areWordsKnown()) continue;
                 last = now;
+                frames = 0;
                 since = performance.now();
             }
         });
@@ -237,6 +263,57 @@ export class Visit {
     async click(selector) {
         await this.page.click(selector);
         await this.still();
+    }
+
+    /** Does something, and waits until the page has had the event that it brings later: a click or a step of the history. */
+    async until(kind, act) {
+        const before = await this.page.evaluate((kind) => counts[kind], kind);
+        await act();
+        await this.page.waitForFunction(([kind, before]) => counts[kind] > before, [kind, before]);
+        await this.still();
+    }
+
+    /** The browser makes a click of a tap when the finger has long gone. */
+    async tap(selector) {
+        await this.until("click", () => this.page.tap(selector));
+    }
+
+    async tapAt({ x, y }) {
+        await this.until("click", () => this.page.touchscreen.tap(x, y));
+    }
+
+    /** A step in the browser's history, by whatever leads there. */
+    async step(act) {
+        await this.until("popstate", act);
+    }
+
+    /** Through a link to another place in the page. */
+    async follow(hash) {
+        await this.step(() => this.page.evaluate((hash) => (location.hash = hash), hash));
+    }
+
+    /** Turns the wheel over the picture, and waits until that has zoomed. */
+    async wheel(dy) {
+        const { k } = await this.placing();
+        await this.page.mouse.wheel(0, dy);
+        await becomes(async () => (await this.placing()).k !== k, true);
+        await this.still();
+    }
+
+    /** The page has the window's new size. */
+    async resize(size) {
+        await this.page.setViewportSize(size);
+        await this.page.waitForFunction(({ width, height }) => innerWidth === width && innerHeight === height, size);
+        await this.still();
+    }
+
+    async untilVisible(selector, isVisible) {
+        await this.page.waitForSelector(selector, { state: isVisible ? "visible" : "hidden" });
+    }
+
+    /** The id of what has the keys. */
+    async untilKeysOn(id) {
+        await becomes(() => this.page.evaluate(() => holder().id), id);
     }
 
     async press(key) {

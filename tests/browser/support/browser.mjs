@@ -9,6 +9,9 @@ import { join, resolve } from "node:path";
 import { pathToFileURL } from "node:url";
 import { gzipSync } from "node:zlib";
 import { chromium } from "playwright-core";
+import { disturb } from "./disturbance.mjs";
+import { kPatience } from "./patience.mjs";
+import { reportOn } from "./reported.mjs";
 import { Visit } from "./Visit.mjs";
 
 const kArguments = [
@@ -20,7 +23,6 @@ const kArguments = [
     "--disable-component-update",
     "--disable-sync",
 ];
-const kPatience = 20_000; // ms, for what should be there at once
 const kWindow = { width: 1280, height: 800 };
 
 const folder = mkdtempSync(join(tmpdir(), "olvane-browser-"));
@@ -112,6 +114,8 @@ export async function newContext(settings = {}) {
         ...settings,
     });
     context.setDefaultTimeout(kPatience);
+    reportOn(context);
+    await disturb(context);
     return context;
 }
 
