@@ -9,16 +9,20 @@ import { embeddedFamily, embeddedMap, startEngine } from "./engine/engine";
 import { isWorker, serveMap } from "./engine/mapWorker";
 import { uiMessagesFor } from "./messages/ui";
 import { App } from "./shell/App";
+import { holdDrops } from "./shell/dropping";
 
 async function start(): Promise<void> {
     const root = document.getElementById("app")!;
+    const dropped = holdDrops();
     const { errors } = uiMessagesFor(navigator.language);
     try {
         defineOlvaneTree();
         const [engine, family] = await Promise.all([startEngine(), embeddedFamily()]);
         OlvaneTree.engine = () => Promise.resolve(engine);
         const app = new App(root, engine);
-        if (family?.hasMap) await app.opening.openMap(family, embeddedMap());
+        const files = dropped();
+        if (files.length > 0) await app.opening.openDropped(files);
+        else if (family?.hasMap) await app.opening.openMap(family, embeddedMap());
         else if (family) app.opening.openEmbedded(family);
         else await app.opening.openKept();
     } catch (error) {

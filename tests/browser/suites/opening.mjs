@@ -4,10 +4,12 @@
 import assert from "node:assert/strict";
 import { execFileSync, spawnSync } from "node:child_process";
 import { deflateRawSync } from "node:zlib";
-import { describe, test } from "node:test";
+import { describe } from "node:test";
+import { pathToFileURL } from "node:url";
 import {
     fileFor,
     kTwoAtOnce,
+    newContext,
     photograph,
     sample,
     visitDarwins,
@@ -16,6 +18,8 @@ import {
     visitFile,
 } from "../support/browser.mjs";
 import { brokenFamily, gedcom, hugeHousehold } from "../support/families.mjs";
+import { test } from "../support/reported.mjs";
+import { Visit } from "../support/Visit.mjs";
 
 const kDarwins = sample("darwin-wedgwood.ged");
 const command = process.env.OLVANE_COMMAND;
@@ -46,6 +50,37 @@ describe("opening", kTwoAtOnce, () => {
         await visit.end();
     });
 
+    test("a file that is dropped while the page is starting opens as soon as it has", async () => {
+        const context = await newContext();
+        // The engine waits for a word to go on.
+        await context.addInitScript(() => {
+            const compile = WebAssembly.compile.bind(WebAssembly);
+            WebAssembly.compile = async (...parts) => {
+                await new Promise((goOn) => (window.goOn = goOn));
+                return compile(...parts);
+            };
+        });
+        const opened = context.waitForEvent("page");
+        const begun = Visit.begin(context, pathToFileURL(process.env.OLVANE_PAGE).href);
+        const page = await opened;
+        await page.waitForFunction(() => window.goOn);
+        const isTaken = await page.evaluate((text) => {
+            const dataTransfer = new DataTransfer();
+            dataTransfer.items.add(new File([text], "early.ged"));
+            const events = ["dragover", "drop"].map(
+                (type) => new DragEvent(type, { bubbles: true, cancelable: true, dataTransfer }),
+            );
+            for (const event of events) document.body.dispatchEvent(event);
+            window.goOn();
+            return events.every((event) => event.defaultPrevented);
+        }, "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Early/\n0 TRLR\n");
+        assert.ok(isTaken, "the browser would leave the page for the file");
+        const visit = await begun;
+        await visit.untilFamily();
+        assert.equal(await visit.page.title(), "early");
+        await visit.end();
+    });
+
     test("of several files that are dropped the first opens, and the page says which", async () => {
         const visit = await visitEmpty();
         const other = "0 HEAD\n0 @A@ INDI\n1 NAME Ada /Only/\n0 TRLR\n";
@@ -72,7 +107,7 @@ describe("opening", kTwoAtOnce, () => {
         await visit.page.waitForFunction(() => document.title === "small");
         await visit.still();
         assert.equal(await visit.focus(), "A", "the link named a person of the first file");
-        await visit.page.reload();
+        await visit.reload();
         await visit.drop("darwin-wedgwood.ged", kDarwins);
         await visit.untilFamily();
         assert.notEqual(await visit.hash(), "#person=A", "the address was that of another file");
@@ -93,14 +128,13 @@ describe("opening", kTwoAtOnce, () => {
         await visit.still();
         assert.equal(await visit.focus(), "I2");
         assert.ok(await visit.page.isDisabled("#back"));
-        await visit.page.goBack();
-        await visit.still();
+        await visit.step(() => visit.page.goBack());
         assert.equal(await visit.focus(), "I2", "the browser's button led to Emma, who has the same record");
         assert.equal(await visit.hash(), "#person=I2");
         await visit.goTo("Cid");
-        await visit.click("#back");
+        await visit.step(() => visit.page.click("#back"));
         assert.equal(await visit.focus(), "I2");
-        await visit.click("#forward");
+        await visit.step(() => visit.page.click("#forward"));
         assert.equal(await visit.focus(), "I1");
         await visit.end();
     });
@@ -161,8 +195,7 @@ describe("opening", kTwoAtOnce, () => {
         const visit = await visitEmpty();
         await visit.drop("ivan.ged", bytes);
         await visit.untilFamily();
-        await visit.page.evaluate(() => (location.hash = "#person=I2"));
-        await visit.still();
+        await visit.follow("#person=I2");
         assert.notEqual(await visit.page.innerText("#side-panel h2"), "Иван");
         await visit.click("#file-button");
         await visit.page.selectOption("#encoding", "windows-1251");
@@ -196,7 +229,7 @@ describe("opening", kTwoAtOnce, () => {
         await visit.page.click("#notices .warned .plain");
         assert.ok(await visit.page.isVisible("#diagnostics"));
         await visit.page.keyboard.press("Escape");
-        assert.equal(await visit.page.evaluate(() => holder().id), "diagnostics-button");
+        await visit.untilKeysOn("diagnostics-button");
         await visit.page.click("#diagnostics-button");
         assert.ok(await visit.page.isVisible("#diagnostics"));
         const shown = await visit.page.innerText("#diagnostics");
@@ -205,7 +238,7 @@ describe("opening", kTwoAtOnce, () => {
         assert.ok((await visit.page.locator("#diagnostics li").count()) >= 4);
         await photograph(visit, "diagnostics");
         await visit.page.keyboard.press("Escape");
-        assert.ok(!(await visit.page.isVisible("#diagnostics")));
+        await visit.untilVisible("#diagnostics", false);
         await visit.end();
     });
 
@@ -310,9 +343,8 @@ describe("opening", kTwoAtOnce, () => {
 
     test("an address is put right that asks for too much, or has other letters", async () => {
         const visit = await visitDarwins("#person=I1");
-        await visit.page.evaluate(() => (location.hash = "#person=i5&view=pedigree&generations=99"));
-        await visit.page.waitForFunction(() => one("#tree .box.focus")?.getAttribute("data-xref") === "I5");
-        await visit.still();
+        await visit.follow("#person=i5&view=pedigree&generations=99");
+        assert.equal(await visit.focus(), "I5");
         assert.equal(await visit.hash(), "#person=I5&view=pedigree&generations=10");
         await visit.end();
     });
@@ -374,9 +406,8 @@ describe("opening", kTwoAtOnce, () => {
         assert.match(await shown(), /I9999.*not in this file/);
         const here = await visit.focus();
         assert.equal(await visit.hash(), `#person=${here}&view=pedigree`);
-        await visit.page.evaluate(() => (location.hash = "#person=NOBODY"));
-        await visit.page.waitForFunction(() => /NOBODY/.test(one("#notices").textContent));
-        await visit.still();
+        await visit.follow("#person=NOBODY");
+        assert.match(await visit.page.innerText("#notices"), /NOBODY/);
         assert.equal(await visit.focus(), here);
         assert.equal(await visit.hash(), `#person=${here}`);
         await visit.end();

@@ -87,6 +87,7 @@ export class FileOpening {
         const bytes = new Uint8Array(await file.arrayBuffer());
         const archive = isArchive(bytes) ? new Archive(bytes) : null;
         const gedcom = archive ? await archive.gedcom(kMostBytes) : bytes;
+        signal.throwIfAborted();
         if (gedcom.length === 0) throw new EmptyFileError();
         const photographs = archive
             ? Photographs.inArchive(archive, (name) => this.engine.archiveMember(name))

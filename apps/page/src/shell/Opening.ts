@@ -81,7 +81,7 @@ export class Opening {
         } catch (error) {
             this.refuse(file.name, error);
         }
-        reading.end();
+        reading.end(signal);
     }
 
     setEncoding(encoding: string): void {
@@ -127,7 +127,8 @@ export class Opening {
         const { page } = this;
         const kept = await keptFile();
         if (!kept) return page.files.warmUp();
-        if (page.tree.family) return;
+        // What is chosen while the browser looks for it counts more.
+        if (page.tree.family || this.panels.reading.isUnderWay) return;
         page.isKept = true;
         await this.openDropped([new File([kept.bytes], kept.name)]);
     }

@@ -11,8 +11,12 @@ export class Reading {
     private readonly bar = html("progress", { max: 1 });
     private controller = new AbortController();
 
-    /** Shows the progress of another file; the signal is set off when the reader of the page ends it. */
+    /**
+     * Shows the progress of another file, and ends the reading of the one before: the file that was chosen last counts.
+     * The signal is set off when the reader of the page ends it, or chooses another file meanwhile.
+     */
     begin(name: string, ui: UiMessages): AbortSignal {
+        this.controller.abort(new CancelledError());
         this.controller = new AbortController();
         const text = html(
             "span",
@@ -32,8 +36,13 @@ export class Reading {
         this.bar.value = part;
     }
 
-    end(): void {
-        this.element.hidden = true;
+    /** Of the file whose signal is given; nothing where another one is being read already. */
+    end(signal: AbortSignal): void {
+        if (signal === this.controller.signal) this.element.hidden = true;
+    }
+
+    get isUnderWay(): boolean {
+        return !this.element.hidden;
     }
 }
 

@@ -22,6 +22,29 @@ export function fileInput(take: (file: File) => void): HTMLInputElement {
     return input;
 }
 
+/**
+ * While the page is starting, keeps the browser from leaving it for a file that is dropped. The function that is returned
+ * ends that, and returns what was dropped last.
+ */
+export function holdDrops(): () => readonly File[] {
+    let held: readonly File[] = [];
+    const end = new AbortController();
+    const { signal } = end;
+    addEventListener("dragover", (event) => event.preventDefault(), { signal });
+    addEventListener(
+        "drop",
+        (event) => {
+            event.preventDefault();
+            held = [...(event.dataTransfer?.files ?? [])];
+        },
+        { signal },
+    );
+    return () => {
+        end.abort();
+        return held;
+    };
+}
+
 export function takeDrops(cover: HTMLElement, take: (files: readonly File[]) => void): void {
     const holdsFiles = (event: DragEvent) => event.dataTransfer?.types.includes("Files") ?? false;
     addEventListener("dragover", (event) => {
