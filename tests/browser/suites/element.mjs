@@ -7,8 +7,10 @@ import assert from "node:assert/strict";
 import { readFileSync } from "node:fs";
 import { createServer } from "node:http";
 import { join } from "node:path";
-import { after, before, describe, test } from "node:test";
+import { after, before, describe } from "node:test";
 import { newContext, sample } from "../support/browser.mjs";
+import { becomes } from "../support/patience.mjs";
+import { test } from "../support/reported.mjs";
 
 const kTypes = { html: "text/html", mjs: "text/javascript", ged: "text/plain" };
 
@@ -20,9 +22,9 @@ before(async () => {
     files.set("/olvane-tree.mjs", readFileSync(process.env.OLVANE_ELEMENT));
     files.set("/family.ged", sample("darwin-wedgwood.ged"));
     files.set("/example.html", readFileSync(join(process.env.OLVANE_SOURCES, "examples/javascript/element.html")));
-    server = createServer((request, response) => {
+    server = createServer(async (request, response) => {
         const path = new URL(request.url, "http://localhost").pathname;
-        const content = files.get(path);
+        const content = await files.get(path);
         response.writeHead(content ? 200 : 404, { "content-type": kTypes[path.split(".").at(-1)] ?? "text/plain" });
         response.end(content ?? "not here");
     });
@@ -166,7 +168,6 @@ describe("element", () => {
             tree.show({ focus: 12 });
             tree.select(1);
             tree.zoomBy(0.7);
-            await new Promise((next) => setTimeout(next, 400));
             const look = () => [
                 tree.state.focus,
                 tree.selected.xref,
@@ -233,21 +234,35 @@ describe("element", () => {
                 }
                 return JSON.parse(last);
             });
-        const change = async (run) => (await page.evaluate(run), look());
+        // A change is shown a little later.
+        const change = async (run, isShown) => {
+            await page.evaluate(run);
+            await becomes(async () => isShown(await look()), true);
+            return look();
+        };
         const first = await look();
         assert.deepEqual(first.xrefs, ["17", "42", "5", "9"]);
         assert.match(first.words, /Karl Berg, born 1850/);
         assert.equal(first.selected, "5");
-        const renamed = await change(() => window.family.setNames(9, [{ kind: "given", text: "Olof" }]));
+        const renamed = await change(
+            () => window.family.setNames(9, [{ kind: "given", text: "Olof" }]),
+            ({ words }) => words.includes("Olof"),
+        );
         assert.match(renamed.words, /Olof/);
         assert.doesNotMatch(renamed.words, /Nils/);
-        const grown = await change(() => {
-            window.family.addPerson({ id: 3, sex: "f", father: 17, mother: 42 });
-            window.family.setNames(3, [{ text: "Eva Berg" }]);
-        });
+        const grown = await change(
+            () => {
+                window.family.addPerson({ id: 3, sex: "f", father: 17, mother: 42 });
+                window.family.setNames(3, [{ text: "Eva Berg" }]);
+            },
+            ({ words }) => words.includes("Eva Berg"),
+        );
         assert.deepEqual(grown.xrefs, ["17", "3", "42", "5", "9"]);
         assert.match(grown.words, /Eva Berg/);
-        const smaller = await change(() => window.family.removePerson(9));
+        const smaller = await change(
+            () => window.family.removePerson(9),
+            ({ xrefs }) => !xrefs.includes("9"),
+        );
         assert.deepEqual(smaller.xrefs, ["17", "3", "42", "5"]);
         for (const later of [renamed, grown, smaller]) {
             assert.deepEqual(later.place, first.place);
@@ -296,7 +311,6 @@ describe("element", () => {
                 count,
             );
         await shown(6);
-        await page.waitForTimeout(500);
         const before = new Map(await places());
         await page.evaluate(() =>
             document
@@ -304,7 +318,6 @@ describe("element", () => {
                 .update(new TextEncoder().encode(olvane.family({ persons: grown }).gedcom())),
         );
         await shown(7);
-        await page.waitForTimeout(500);
         const moved = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
         assert.deepEqual(
             moved.map(([xref]) => xref),
@@ -315,7 +328,7 @@ describe("element", () => {
                 .querySelector("olvane-tree")
                 .open(new TextEncoder().encode(olvane.family({ persons: grown }).gedcom())),
         );
-        await page.waitForTimeout(800);
+        await shown(7);
         const again = (await places()).filter(([xref, x]) => before.has(xref) && before.get(xref) !== x);
         assert.ok(again.length > moved.length, `again ${again.join("; ")}`);
         await end();
@@ -326,21 +339,20 @@ describe("element", () => {
         await page.waitForSelector("olvane-tree .box.focus");
         const seen = await page.evaluate(async () => {
             const tree = document.querySelector("olvane-tree");
-            const later = () => new Promise((next) => setTimeout(next, 100));
             const boxes = () => tree.shadowRoot.querySelectorAll(".boxes > g").length;
+            const until = async (isSo) => {
+                while (!isSo()) await new Promise((next) => setTimeout(next, 10));
+            };
             for (const id of window.family.ids) window.family.removePerson(id);
-            await later();
-            const empty = boxes();
+            await until(() => boxes() === 0);
             window.family.addPerson({ id: 8, sex: "f" });
-            await later();
+            await until(() => boxes() > 0);
             const again = boxes();
             tree.data = null;
             window.family.addPerson({ id: 9, sex: "f", mother: 8 });
-            await later();
-            return { empty, again, released: boxes() };
+            await new Promise((next) => setTimeout(next, 100));
+            return { again, released: boxes() };
         });
-        assert.equal(seen.empty, 0);
-        assert.ok(seen.again > 0);
         assert.equal(seen.released, seen.again);
         await end();
     });
@@ -365,6 +377,36 @@ describe("element", () => {
             };
         });
         assert.deepEqual(seen, { hers: true, label: true, his: true });
+        await end();
+    });
+
+    test("of two files the one that is asked for last is shown, though the other one comes later", async () => {
+        let answer = null;
+        files.set("/late.ged", new Promise((come) => (answer = come)));
+        files.set(
+            "/two.html",
+            '<!doctype html><olvane-tree src="late.ged" style="height: 500px"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',
+        );
+        const { page, end } = await open("/two.html");
+        const first = page.evaluate(async () => {
+            await customElements.whenDefined("olvane-tree");
+            window.failures = [];
+            const tree = document.querySelector("olvane-tree");
+            tree.addEventListener("error", ({ message }) => failures.push(message));
+            const late = tree.load("late.ged").catch((error) => error.name);
+            await tree.load("family.ged");
+            window.isLoaded = true;
+            return late;
+        });
+        await page.waitForFunction(() => window.isLoaded);
+        answer("0 HEAD\n0 @X@ INDI\n1 NAME Ada /Late/\n0 TRLR\n");
+        assert.equal(await first, "AbortError");
+        const later = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            await fetch("late.ged");
+            return { length: tree.family.persons.length, failures };
+        });
+        assert.deepEqual(later, { length: 142, failures: [] });
         await end();
     });
 

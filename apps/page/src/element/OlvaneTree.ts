@@ -24,6 +24,7 @@ export class OlvaneTree extends HTMLElement {
     static readonly observedAttributes = ["src", "focus", "view", "language", "panel", "kinship", "theme", "show"];
 
     private readonly viewer: Viewer;
+    private loading = new AbortController(); // of the file that was asked for last
     private readonly watched = new WatchedData(() => this.orReport(this.refresh()));
 
     constructor() {
@@ -86,12 +87,23 @@ export class OlvaneTree extends HTMLElement {
         return this.family?.person(this.viewer.panelPersonId) ?? null;
     }
 
-    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read. */
+    /**
+     * Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read, and with an AbortError where another
+     * file is asked for before it has come: the one that is asked for last is shown, however long each takes.
+     */
     async load(address: string): Promise<void> {
-        const response = await fetch(address);
+        const signal = this.supersede();
+        const response = await fetch(address, { signal });
         if (!response.ok) throw new Error(`${response.url}: ${response.status} ${response.statusText}`);
         const name = decodeURIComponent(new URL(address, document.baseURI).pathname.split("/").at(-1) || address);
-        await this.open(new Uint8Array(await response.arrayBuffer()), name);
+        await this.openUnless(signal, new Uint8Array(await response.arrayBuffer()), name);
+    }
+
+    // Ends the loading of the file before; the signal is that of the file that follows.
+    private supersede(): AbortSignal {
+        this.loading.abort();
+        this.loading = new AbortController();
+        return this.loading.signal;
     }
 
     private loadAttribute(address: string): void {
@@ -101,20 +113,27 @@ export class OlvaneTree extends HTMLElement {
     // Nobody waits for what an attribute or a property asks for, so a failure is an event.
     private orReport(work: Promise<void>): void {
         work.catch((error: unknown) => {
+            if (error instanceof DOMException && error.name === "AbortError") return;
             const message = error instanceof Error ? error.message : String(error);
             this.dispatchEvent(new ErrorEvent("error", { message, error }));
         });
     }
 
-    /** Shows the bytes of a GEDCOM file. Rejects with GedcomError where they are none. */
+    /** Shows the bytes of a GEDCOM file. Rejects with GedcomError where they are none, and with an AbortError as load() does. */
     async open(bytes: Uint8Array, name = "family.ged"): Promise<void> {
+        await this.openUnless(this.supersede(), bytes, name);
+    }
+
+    private async openUnless(signal: AbortSignal, bytes: Uint8Array, name: string): Promise<void> {
         if (!OlvaneTree.engine) throw new Error("OlvaneTree.engine is not set");
         const engine = await OlvaneTree.engine();
+        signal.throwIfAborted();
         this.openFile(engine.readGedcom(bytes, name));
     }
 
     /** Shows a file that is open already; the viewer closes it when it gets another. */
     openFile(file: GedcomFile, title = file.name, livingHidden = false): void {
+        this.supersede();
         const family = new OpenFamily(file, title, livingHidden);
         this.setFamily(family);
         this.show(this.attributeState(family));
