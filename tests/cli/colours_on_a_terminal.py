@@ -20,6 +20,11 @@ def on_terminal(arguments, **environment):
     clean = {name: value for name, value in os.environ.items() if name != "NO_COLOR"}
     process = subprocess.Popen(arguments, stdout=subprocess.DEVNULL, stderr=follower, env=dict(clean, **environment))
     os.close(follower)
+    return rest_of(leader, process)
+
+
+def rest_of(leader, process):
+    """What a process still writes to a terminal until it ends."""
     text = b""
     while True:
         try:
@@ -29,7 +34,7 @@ def on_terminal(arguments, **environment):
         if not part:
             break
         text += part
-    process.wait(timeout=60)
+    process.wait()
     os.close(leader)
     return text
 

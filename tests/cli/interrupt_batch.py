@@ -9,8 +9,10 @@ Usage: interrupt_batch.py PATH/TO/olvane GEDCOMFILE
 import fcntl
 import os
 import signal
+import struct
 import subprocess
 import sys
+import termios
 import time
 
 F_SETPIPE_SZ = 1031  # Linux; Python 3.10 has it in fcntl
@@ -23,7 +25,7 @@ def start(command, file):
 
 
 def require_whole_lines(batch, first, text):
-    status = batch.wait(timeout=60)
+    status = batch.wait()
     if status != 130:
         raise SystemExit(f"status {status}, not 130")
     if not text.endswith(b";\n"):
@@ -43,16 +45,26 @@ def interrupt_at_work(command, file):
     require_whole_lines(batch, first, first + batch.stdout.read())
 
 
-def wait_until_asleep(process):
-    deadline = time.monotonic() + 30
-    asleep = 0
-    while asleep < 10:
-        with open(f"/proc/{process.pid}/stat", encoding="ascii") as file:
-            state = file.read().rsplit(")", 1)[1].split()[0]
-        asleep = asleep + 1 if state == "S" else 0
+def held_bytes(pipe):
+    return struct.unpack("i", fcntl.ioctl(pipe, termios.FIONREAD, b"\0" * 4))[0]
+
+
+def is_asleep(process):
+    with open(f"/proc/{process.pid}/stat", encoding="ascii") as file:
+        return file.read().rsplit(")", 1)[1].split()[0] == "S"
+
+
+def wait_until_stuck(process):
+    """Until the command waits for its reader: it sleeps, and for a second its pipe has held as much as before."""
+    deadline = time.monotonic() + 100
+    held, since = 0, time.monotonic()
+    while held == 0 or time.monotonic() - since < 1:
         if time.monotonic() > deadline:
             raise SystemExit("the command never came to wait for its reader")
         time.sleep(0.02)
+        now = held_bytes(process.stdout)
+        if now != held or not is_asleep(process):
+            held, since = now, time.monotonic()
 
 
 def interrupt_before_a_full_pipe(command, file):
@@ -61,7 +73,7 @@ def interrupt_before_a_full_pipe(command, file):
     fcntl.fcntl(batch.stdout.fileno(), F_SETPIPE_SZ, 4096)
     batch.stdin.write(b"1\n" * 600)
     batch.stdin.close()
-    wait_until_asleep(batch)
+    wait_until_stuck(batch)
     batch.send_signal(signal.SIGINT)
     time.sleep(0.1)
     if batch.poll() is not None:

@@ -28,7 +28,7 @@ def on_terminal(arguments):
         if not part:
             break
         text += part
-    process.wait(timeout=60)
+    process.wait()
     os.close(leader)
     return text.decode("utf-8")
 

@@ -6,7 +6,9 @@
 #include <gtest/gtest.h>
 
 #include <atomic>
+#include <chrono>
 #include <stdexcept>
+#include <thread>
 #include <vector>
 
 namespace olvane::cli {
@@ -23,6 +25,8 @@ TEST(ParallelWork, passesAnExceptionOnAndLeavesTheRest) {
     std::atomic<std::size_t> done = 0;
     const auto work = [&done](std::size_t i) {
         if (i == 10) throw std::runtime_error("ten");
+        // However late the thread that throws is, the others are not through by then.
+        if (i > 10) std::this_thread::sleep_for(std::chrono::milliseconds(1));
         ++done;
     };
     EXPECT_THROW(inParallel(1000000, work), std::runtime_error);

@@ -7,6 +7,8 @@
 #include <fstream>
 #include <string>
 
+#include <unistd.h>
+
 #include <gtest/gtest.h>
 
 #include "GedcomText.h"
@@ -42,7 +44,9 @@ TEST(ReadingFiles, pathsThatAreNoFileAreRefused) {
 }
 
 TEST(ReadingFiles, anEmptyFileIsRefused) {
-    const std::string path = std::filesystem::temp_directory_path() / "olvane-test-empty.ged";
+    // Of this process alone: the tests of several builds may run at once.
+    const std::string name = "olvane-test-empty-" + std::to_string(::getpid()) + ".ged";
+    const std::string path = std::filesystem::temp_directory_path() / name;
     std::ofstream(path).close();
     EXPECT_EQ(refusalOfFile(path), "is empty");
     std::filesystem::remove(path);
