@@ -14,6 +14,7 @@
 #include <olvane/charts/Views.h>
 #include <olvane/picture/MarriageLabels.h>
 
+#include <HostSource.h>
 #include <LayoutInternal.h>
 
 #include "HostImports.h"
