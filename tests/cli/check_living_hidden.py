@@ -66,7 +66,7 @@ def records_of(text):
 
 def run(command, *words):
     """What it prints; status 1 is that of a file whose encoding is in doubt."""
-    result = subprocess.run([command, *words], capture_output=True, timeout=120)
+    result = subprocess.run([command, *words], capture_output=True, timeout=1200)
     if result.returncode not in (0, 1):
         raise SystemExit(f"olvane {' '.join(words)} ended with {result.returncode}: {result.stderr[-500:]!r}")
     return result.stdout
@@ -99,7 +99,7 @@ class Outputs:
         self.texts = {}
         with tempfile.TemporaryDirectory() as folder:
             self.folder = pathlib.Path(folder)
-            listed = subprocess.run([command, "people", self.path], capture_output=True, timeout=120)
+            listed = subprocess.run([command, "people", self.path], capture_output=True, timeout=1200)
             if listed.returncode not in (0, 1, 2):
                 raise SystemExit(f"{path}: olvane people ended with {listed.returncode}")
             self.people = [line.split("\t") for line in listed.stdout.decode().split("\n")[:-1]]
@@ -152,7 +152,7 @@ class Outputs:
                 "dates,places,occupation,marriage",
                 *self.hiding,
             ]
-            if subprocess.run(words, capture_output=True, timeout=120).returncode in (0, 1):
+            if subprocess.run(words, capture_output=True, timeout=1200).returncode in (0, 1):
                 data = picture.read_bytes()
                 self.texts[ending + " " + name] = (
                     unpacked_pdf(data) if ending == ".pdf" else data.decode("utf-8", "replace")

@@ -57,7 +57,7 @@ def run(command, text, *words):
             capture_output=True,
             text=True,
             cwd=folder,
-            timeout=100,
+            timeout=1000,
             check=False,
         )
         return done, sorted(path.name for path in pathlib.Path(folder).iterdir())

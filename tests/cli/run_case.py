@@ -76,7 +76,7 @@ def complaints_about(step, result, folder):
 
 
 def run_step(step, folder, environment):
-    return subprocess.run(["bash", "-c", step.command], cwd=folder, env=environment, capture_output=True, timeout=60)
+    return subprocess.run(["bash", "-c", step.command], cwd=folder, env=environment, capture_output=True, timeout=600)
 
 
 def main():

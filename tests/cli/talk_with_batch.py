@@ -28,7 +28,7 @@ def main():
         (b"2\n", b"2\t2:"),
     ):
         process.stdin.write(question)
-        ready, _, _ = select.select([process.stdout], [], [], 30)
+        ready, _, _ = select.select([process.stdout], [], [], 300)
         if not ready:
             process.kill()
             raise SystemExit(f"no answer to {question!r}")
@@ -38,7 +38,7 @@ def main():
             raise SystemExit(f"{question!r} was answered by {answer!r}")
     process.stdin.close()
     rest = process.stdout.read()
-    if rest or process.wait(timeout=30) != 1:
+    if rest or process.wait(timeout=300) != 1:
         raise SystemExit(f"at the end: {rest!r}, status {process.returncode}")
 
 

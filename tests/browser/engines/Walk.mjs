@@ -3,6 +3,8 @@
 
 // What a person does on the page, in any engine, with every click and key counted.
 
+const kPatience = 90_000; // ms; what takes longer hangs
+
 export class Walk {
     clicks = 0;
     keys = 0;
@@ -25,7 +27,7 @@ export class Walk {
     }
 
     async until(run, ...values) {
-        for (let tries = 0; tries < 400; ++tries) {
+        for (const end = Date.now() + kPatience; Date.now() < end;) {
             if (await this.window.evaluate(run, ...values)) return;
             await new Promise((next) => setTimeout(next, 50));
         }
