@@ -7,17 +7,10 @@
 #include <string>
 #include <vector>
 
+#include <olvane/draw/FanCell.h>
 #include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
-
-// What a cell of a fan says: a name, and what stands below it. The facts are parts of one line, or of two.
-struct FanText {
-    std::string given;
-    std::string surname;
-    bool surnameFirst = false;
-    std::vector<std::string> facts;
-};
 
 // The room for lines of text that stand one below the other around the middle of a cell: a rectangle, one that is cut
 // off by the outer arc of the cell, by both arcs and the sides, or a disc.

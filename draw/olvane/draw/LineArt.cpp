@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // Draws the lines of each family as one group: a path for the plain pieces, and one for each style that some
-// of its pieces have. A piece that lies flat jumps over another family's line with a small arc.
+// of its pieces have.
 
 #include <olvane/draw/LineArtInternal.h>
 
@@ -10,9 +10,8 @@
 #include <utility>
 #include <vector>
 
-#include <olvane/draw/DrawingWordsInternal.h>
+#include <olvane/draw/LinePathsInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
-#include <olvane/kin/shared/MergeSort.h>
 #include <olvane/picture/MarriageLabels.h>
 #include <olvane/picture/TextFit.h>
 
@@ -26,41 +25,9 @@ using picture::cutText;
 using picture::Family;
 using picture::LabelSide;
 using picture::Line;
-using picture::LineRole;
 
 constexpr double kLineWidth = 1.6;
-constexpr double kBridge = 4;  // px, the radius of a jump
 constexpr double kLabelSize = 9.5;
-
-LineStyle styleOf(kin::UnionState state) {
-    switch (state) {
-        case kin::UnionState::divorced:
-            return LineStyle::divorced;
-        case kin::UnionState::unmarried:
-            return LineStyle::unmarried;
-        case kin::UnionState::married:
-        case kin::UnionState::unknown:
-            break;
-    }
-    return LineStyle::plain;
-}
-
-LineStyle styleOf(kin::ChildKind kind) {
-    switch (kind) {
-        case kin::ChildKind::adopted:
-            return LineStyle::adopted;
-        case kin::ChildKind::foster:
-            return LineStyle::foster;
-        case kin::ChildKind::step:
-            return LineStyle::step;
-        case kin::ChildKind::sealing:
-            return LineStyle::sealing;
-        case kin::ChildKind::birth:
-        case kin::ChildKind::unknown:
-            break;
-    }
-    return LineStyle::plain;
-}
 
 class FamilyPen {
 public:
@@ -82,72 +49,27 @@ public:
 
 private:
     void draw(const Family& family) {
-        std::array<std::string, kLineStyles> paths;
         PictureArea bounds = areaOf(picture_.linesOf(family).front());
         for (const Line& line : picture_.linesOf(family)) {
-            const LineStyle style = styleOfPiece(family, line);
-            paths[static_cast<std::size_t>(style)] += pathOf(line);
             const PictureArea area = areaOf(line);
             svg_.lines.push_back(area);
             include(bounds, area);
         }
         const std::size_t start = svg_.svg.size();
         svg_.svg += "<g>";
-        for (std::size_t s = 0; s < kLineStyles; ++s) appendPath(paths[s], static_cast<LineStyle>(s));
+        for (const LinePath& path : linePathsOf(picture_, family, frame_)) appendPath(path);
         appendLabel(family);
         svg_.svg += "</g>\n";
         svg_.strokes.push_back({bounds, start, svg_.svg.size() - start});
     }
 
-    LineStyle styleOfPiece(const Family& family, const Line& line) const {
-        if (line.role == LineRole::marriage) return styleOf(family.style);
-        if (line.child == picture::kNone) return LineStyle::plain;
-        const auto children = picture_.children(family);
-        const auto found = std::find(children.begin(), children.end(), line.child);
-        if (found == children.end()) return LineStyle::plain;
-        return styleOf(picture_.kinds(family)[static_cast<std::size_t>(found - children.begin())]);
-    }
-
-    void appendPath(const std::string& path, LineStyle style) {
-        if (path.empty()) return;
-        used_[static_cast<std::size_t>(style)] = true;
+    void appendPath(const LinePath& path) {
+        used_[static_cast<std::size_t>(path.style)] = true;
         svg_.svg += "<path";
-        if (style != LineStyle::plain) {
-            put(svg_.svg, " stroke-linecap=\"butt\" stroke-dasharray=\"", dashesOf(style), "\"");
+        if (path.style != LineStyle::plain) {
+            put(svg_.svg, " stroke-linecap=\"butt\" stroke-dasharray=\"", dashesOf(path.style), "\"");
         }
-        put(svg_.svg, " d=\"", path, "\"/>");
-    }
-
-    std::string pathOf(const Line& line) const {
-        const double x1 = frame_.x(std::min(line.x1, line.x2));
-        const double x2 = frame_.x(std::max(line.x1, line.x2));
-        if (line.x1 == line.x2) {
-            return joined("M", number(x1), " ", number(frame_.y(std::min(line.y1, line.y2))), "V",
-                          number(frame_.y(std::max(line.y1, line.y2))));
-        }
-        if (line.y1 != line.y2) {
-            return joined("M", number(frame_.x(line.x1)), " ", number(frame_.y(line.y1)), "L",
-                          number(frame_.x(line.x2)), " ", number(frame_.y(line.y2)));
-        }
-        std::string path = joined("M", number(x1), " ", number(frame_.y(line.y1)));
-        appendJumps(path, line);
-        put(path, "H", number(x2));
-        return path;
-    }
-
-    // Up in a quarter of a circle, over one line or several that are close, and down again.
-    void appendJumps(std::string& path, const Line& line) const {
-        std::vector<double> places;
-        for (const double place : picture_.bridgesOf(line)) places.push_back(frame_.x(place));
-        kin::mergeSort(places.begin(), places.end());
-        const Number r = number(kBridge);
-        for (std::size_t i = 0, next = 0; i < places.size(); i = next) {
-            while (next < places.size() && places[next] - places[i == next ? i : next - 1] <= 2 * kBridge)
-                ++next;
-            put(path, "H", number(places[i] - kBridge), "a", r, " ", r, " 0 0 1 ", r, " -", r);
-            if (next - i > 1) put(path, "H", number(places[next - 1]));
-            put(path, "a", r, " ", r, " 0 0 1 ", r, " ", r);
-        }
+        put(svg_.svg, " d=\"", path.data, "\"/>");
     }
 
     // In page colour around, so that lines below do not show.
@@ -192,19 +114,6 @@ private:
 };
 
 }  // namespace
-
-std::string_view dashesOf(LineStyle style) {
-    constexpr auto kDashes =
-        std::to_array<std::string_view>({"", "7 5", "3 3", "2 4", "9 3 2 3", "12 3", "1 3"});
-    return kDashes[static_cast<std::size_t>(style)];
-}
-
-std::string_view meaningOf(LineStyle style, kin::Language language) {
-    constexpr auto kMeanings = std::to_array<Phrase>({Phrase::divorced, Phrase::unmarried, Phrase::adopted,
-                                                      Phrase::foster, Phrase::step, Phrase::sealing});
-    if (style == LineStyle::plain) return {};
-    return wordsOf(kMeanings[static_cast<std::size_t>(style) - 1], language);
-}
 
 LineStylesUsed appendLines(SvgPicture& svg, const DrawingContent& content, const DrawingOptions& options,
                            const Frame& frame) {
