@@ -143,7 +143,8 @@ export class GedcomFile {
         const { exports } = this.#instance;
         const file = this.#opened();
         this.#setPictureOptions(focus, options);
-        return readPicture(this.#instance, options, exports.gedcom_picture(file, focus)) ?? this.#refuse();
+        const answer = exports.gedcom_picture(file, focus);
+        return readPicture(this.#instance, options, answer, exports.picture_art()) ?? this.#refuse();
     }
 
     branches(focus, person, options = {}) {

@@ -230,6 +230,8 @@ export interface PictureOptions {
     keepPlaces?: boolean | undefined;
     /** Of a text at the lines of marriages, in points: families then have a place for it; 0 for none. */
     labelSize?: number | undefined;
+    /** Of a file: whether the picture has what a screen draws of lines and cells; false. */
+    paths?: boolean | undefined;
     /** Family and pedigree: whether unknown parents have boxes; true. */
     unknownParents?: boolean | undefined;
     /** Whose parents come first where somebody is a child of several families: those by birth, if not given. */
@@ -346,10 +348,35 @@ export interface Texts {
     ): { readonly lines: readonly string[]; readonly whole: boolean };
     /** In bold letters of at most 13 px, as large as the room allows. */
     fitName(name: NameParts, room: NameRoom): { readonly size: number; readonly lines: readonly string[] };
+    /** In a cell of a round chart, straight, in the largest letters for which it has room; empty where nothing can be read. */
+    placeInCell(name: NameParts, facts: readonly string[], cell: FanCell): readonly CellLine[];
     /** Whether the first letter that has a direction is of a script that runs from right to left. */
     runsRightToLeft(text: string): boolean;
     /** Of each text the words as searches compare them, small and without accents and apostrophes, with a space between. */
     foldedWords(texts: Iterable<string>): string[];
+}
+
+/** A piece of a ring around the middle of a round chart: degrees clockwise from the top, and radii in px. */
+export interface FanCell {
+    readonly from: number;
+    readonly to: number;
+    readonly inner: number;
+    readonly outer: number;
+    /** Whether it is the disc in the middle of the chart. */
+    readonly isCentre: boolean;
+}
+
+/** A line of text, of which (x, y) is the middle, seen from that of the chart, and turned around it by so many degrees. */
+export interface CellLine {
+    readonly text: string;
+    readonly isName: boolean;
+    readonly rightToLeft: boolean;
+    readonly size: number;
+    readonly x: number;
+    readonly y: number;
+    readonly turn: number;
+    /** How far the baseline is below y. */
+    readonly baseline: number;
 }
 
 /** A place in one of the lists of a picture. */
@@ -468,6 +495,31 @@ export interface FoldedBranch extends BranchSize {
     readonly box: PictureIndex;
 }
 
+/** How lines are drawn that stand for more than a birth or a marriage. */
+export interface LineStyle {
+    readonly name: "plain" | "divorced" | "unmarried" | "adopted" | "foster" | "step" | "sealing";
+    /** For stroke-dasharray; empty for the plain one, and so its meaning. */
+    readonly dashes: string;
+    /** For a legend, in the language that was asked for. */
+    readonly meaning: string;
+}
+
+/** Lines of one style, as the data of an SVG path. */
+export interface LinePath {
+    readonly style: LineStyle;
+    readonly data: string;
+}
+
+/** What a screen draws of a picture that shows one px for each point, by the rules of the drawings in files. */
+export interface PictureArt {
+    /** Those that the lines have. */
+    readonly styles: readonly LineStyle[];
+    /** Of each family its lines, a path for each style. What crosses another family's line jumps over it. */
+    readonly lines: readonly (readonly LinePath[])[];
+    /** Of each box of a round chart: one of 12 colours, null where it belongs to no line of descent, and its outline. */
+    readonly cells: readonly { readonly colour: number | null; readonly outline: string }[];
+}
+
 /** What is drawn, as values. arcs has one entry for each box of a round chart, and is empty otherwise. */
 export interface Picture {
     readonly view: PictureView;
@@ -479,6 +531,8 @@ export interface Picture {
     readonly families: readonly PictureFamily[];
     readonly marks: readonly PictureMark[];
     readonly folded: readonly FoldedBranch[];
+    /** Of a file, where paths were asked for; else null. */
+    readonly art: PictureArt | null;
     /** Of the view of kinship; else null. */
     readonly kinship: PictureKinship | null;
 }

@@ -10,6 +10,7 @@ const STYLES = ["married", "divorced", "unmarried", "unknown"];
 const CHILD_KINDS = ["birth", "adopted", "foster", "step", "sealing", "unknown"];
 const MARK_KINDS = ["samePerson", "parentsElsewhere", "partnersElsewhere"];
 const WAY_KINDS = ["blood", "legal", "marriage"];
+const LINE_STYLES = ["plain", "divorced", "unmarried", "adopted", "foster", "step", "sealing"];
 const LABEL_SIDES = ["none", "above", "below", "right"];
 /** In the order of the module's numbers. */
 export const BRANCHES = ["up", "down", "beside"];
@@ -88,8 +89,32 @@ function wayAt(n, at, words, { wayBoxes, pieces }) {
     };
 }
 
+/** What screens draw, as the module wrote it down: the styles, a line for each family, one for each cell of a round chart. */
+function artFrom(text, familyCount, arcCount) {
+    const [first, ...rows] = text.split("\n");
+    const styles = first.split(";").map((words, i) => {
+        const [dashes, meaning] = words.split("\t");
+        return { name: LINE_STYLES[i], dashes, meaning };
+    });
+    const used = new Set();
+    const pathFrom = (path) => {
+        const style = styles[path[0]];
+        used.add(style);
+        return { style, data: path.slice(1) };
+    };
+    const lines = rows.slice(0, familyCount).map((row) => (row === "" ? [] : row.split(";").map(pathFrom)));
+    return {
+        styles: styles.filter((style) => used.has(style)),
+        lines,
+        cells: rows.slice(familyCount, familyCount + arcCount).map((row) => {
+            const [colour, outline] = row.split(/ (.*)/);
+            return { colour: colour === "-1" ? null : Number(colour), outline };
+        }),
+    };
+}
+
 /** The picture of a view; numbers may be memory of the module's, which is not kept. texts gives its words. */
-export function pictureFrom(view, numbers, texts) {
+export function pictureFrom(view, numbers, texts, art) {
     const [
         boxCount,
         arcCount,
@@ -154,6 +179,7 @@ export function pictureFrom(view, numbers, texts) {
             branch: BRANCHES[numbers[start + 2]],
             side: SIDES[numbers[start + 3]],
         })),
+        art: art === null ? null : artFrom(art, familyCount, arcCount),
         kinship:
             other < 0
                 ? null
@@ -180,14 +206,20 @@ export function usePictureOptions({ exports }, numbers) {
     new Float64Array(exports.memory.buffer, head >>> 0, numbers.length).set(numbers);
 }
 
-/** Reads what the module answered, and releases it; null for a picture that was refused. */
-export function readPicture(instance, options, answer) {
+/** Reads what the module answered, and releases it; null for a picture that was refused. art is where its drawn form is. */
+export function readPicture(instance, options, answer, art = 0) {
     if (answer === 0) return null;
     const { exports } = instance;
     try {
         const count = exports.picture_count(answer) >>> 0;
         const values = new Float64Array(exports.memory.buffer, exports.picture_numbers(answer) >>> 0, count);
-        return pictureFrom(options.view ?? "family", values, () => JSON.parse(instance.text(exports.last_text())));
+        const texts = () => JSON.parse(instance.text(exports.last_text()));
+        return pictureFrom(
+            options.view ?? "family",
+            values,
+            texts,
+            options.paths && art !== 0 ? instance.text(art) : null,
+        );
     } finally {
         exports.picture_free(answer);
     }

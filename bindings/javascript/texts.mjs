@@ -55,6 +55,25 @@ export class Texts {
         });
     }
 
+    placeInCell({ given, surname, surnameFirst = false }, facts, { from, to, inner, outer, isCentre }) {
+        const cell = [from, to, inner, outer, isCentre ? 1 : 0];
+        return this.#remembered(`c/${cell.join("/")}/${surnameFirst}/${given}\n${surname}\n${facts.join("\n")}`, () => {
+            const answer = this.#instance.withText(given, (first) =>
+                this.#instance.withText(surname, (second) =>
+                    this.#instance.withText(facts.join("\n"), (others) =>
+                        this.#answer(
+                            this.#instance.exports.fan_text(first, second, surnameFirst ? 1 : 0, others, ...cell),
+                        ),
+                    ),
+                ),
+            );
+            return JSON.parse(answer).map(([text, isName, rightToLeft, ...numbers]) => {
+                const [size, x, y, turn, baseline] = numbers.map((number) => number / 100);
+                return { text, isName: isName === 1, rightToLeft: rightToLeft === 1, size, x, y, turn, baseline };
+            });
+        });
+    }
+
     runsRightToLeft(text) {
         return this.#remembered(`d/${text}`, () =>
             this.#instance.withText(text, (pointer) => this.#instance.exports.runs_right_to_left(pointer) !== 0),

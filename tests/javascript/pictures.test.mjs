@@ -127,6 +127,65 @@ test("a family has a place for the year of its marriage, where one is asked for"
     assert.throws(() => file.picture(1, { labelSize: -1 }), RangeError);
 });
 
+test("what a screen draws of lines is there where it is asked for, with its styles in words", () => {
+    assert.equal(file.picture(1).art, null);
+    const picture = file.picture(1, { paths: true, language: "german" });
+    const { styles, lines, cells } = picture.art;
+    assert.deepEqual(
+        styles.map(({ name }) => name),
+        ["plain", "divorced", "adopted"],
+    );
+    assert.deepEqual(
+        styles.map(({ dashes, meaning }) => [dashes !== "", meaning]),
+        [
+            [false, ""],
+            [true, "geschieden"],
+            [true, "adoptiert"],
+        ],
+    );
+    assert.equal(lines.length, picture.families.length);
+    picture.families.forEach((family, i) => {
+        const names = lines[i].map(({ style }) => style.name);
+        assert.deepEqual(names, family.number === 1 ? ["plain", "adopted"] : ["plain", "divorced"]);
+        // Each piece once, where no line crosses another.
+        const pieces = lines[i].flatMap(({ data }) => data.match(/M[^M]+/g));
+        assert.equal(pieces.length, family.lines.length);
+        const [marriage] = family.lines.filter(({ role }) => role === "marriage");
+        const [left, right] = [marriage.x1, marriage.x2].sort((a, b) => a - b);
+        assert.ok(pieces.includes(`M${left} ${marriage.y1}H${right}`), pieces.join(" "));
+    });
+    assert.deepEqual(cells, []);
+    assert.throws(() => file.picture(1, { paths: 1 }), TypeError);
+});
+
+test("a fan's cells have their outlines and colours, and a place for each line of text", () => {
+    const { art, arcs, rings } = file.picture(3, { view: "fan", paths: true });
+    assert.equal(art.cells.length, arcs.length);
+    arcs.forEach(({ ring, from, to, line }, i) => {
+        const { colour, outline } = art.cells[i];
+        assert.equal(colour === null, line === null && !arcs.some((other) => other.line === i));
+        const radius = rings.radii[ring + 1];
+        assert.ok(outline.includes(`A${radius} ${radius} 0 `), outline);
+        if (from !== 0 || to - from >= 360) return;
+        assert.ok(outline.startsWith(`M${rings.middleX} ${rings.middleY - radius}A`), outline);
+    });
+    const cell = { from: -45, to: 45, inner: 100, outer: 160, isCentre: false };
+    const lines = olvane.texts.placeInCell({ given: "Anna", surname: "Berg" }, ["* 1800"], cell);
+    assert.deepEqual(
+        lines.map(({ text, isName }) => [text, isName]),
+        [
+            ["Anna", true],
+            ["Berg", true],
+            ["* 1800", false],
+        ],
+    );
+    for (const { x, y, turn, size, baseline } of lines) {
+        assert.ok(x === 0 && y < -100 && y > -160 && turn === 0, `${x} ${y} ${turn}`);
+        assert.ok(baseline > 0.3 * size && baseline < 0.4 * size);
+    }
+    assert.deepEqual(olvane.texts.placeInCell({ given: "Anna", surname: "" }, [], { ...cell, outer: 105 }), []);
+});
+
 test("the usual boxes are wide in the pedigree and where a chart lies sideways", () => {
     assert.equal(file.usualBoxes(), "tall");
     for (const direction of ["left", "right", "up", "down"]) {

@@ -20,6 +20,7 @@
 #include "HostImports.h"
 #include "OpenFile.h"
 #include "PictureAnswer.h"
+#include "PictureArt.h"
 #include "PictureRequest.h"
 
 #define OLVANE_EXPORT(name) extern "C" __attribute__((export_name(name)))
@@ -29,6 +30,8 @@ namespace olvane::js {
 namespace {
 
 olvane_status lastStatus = OLVANE_OK;
+
+std::string lastArt;  // of the last picture that was asked for with it
 
 }  // namespace
 }  // namespace olvane::js
@@ -45,6 +48,7 @@ OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* fil
         picture::Picture picture = js::pictureOf(*file, asked);
         labelSize = asked.labelSize;
         if (labelSize > 0) labels = picture::marriageLabelPlaces(picture, labelSize);
+        js::lastArt = asked.paths ? js::artOf(picture, asked.view.chart.language) : std::string();
         return picture;
     };
     return js::pictureAnswer(make, [&](std::vector<double>& numbers) {
@@ -54,6 +58,11 @@ OLVANE_EXPORT("gedcom_picture") std::vector<double>* gedcomPicture(OpenFile* fil
                                            label.x + offset.x, label.y + offset.y});
         }
     });
+}
+
+// What is drawn of that picture, where it was asked for with its paths.
+OLVANE_EXPORT("picture_art") const char* pictureArt() {
+    return js::lastArt.c_str();
 }
 
 // How many persons the branches up, down and beside of a person have for themselves, and on which side of the box each

@@ -57,6 +57,7 @@ constexpr FileOption kFileOptions[] = {
     {{"keepPlaces"}, [](PictureRequest& request, double value) { request.keepsPlaces = value != 0; }},
     {{"labelSize", charts::OptionKind::number, 0, charts::kLargestSize, 0, {}},
      [](PictureRequest& request, double value) { request.labelSize = value; }},
+    {{"paths"}, [](PictureRequest& request, double value) { request.paths = value != 0; }},
 };
 
 class OptionReader {

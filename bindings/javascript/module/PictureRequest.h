@@ -18,6 +18,7 @@ struct PictureRequest {
     std::vector<charts::SizedBox> boxSizes;
     bool keepsPlaces = false;  // everybody: of the file's last picture that was asked for so
     double labelSize = 0;      // in points, of a text at the line of a marriage; 0 where none is wanted
+    bool paths = false;        // whether lines and cells are asked for as path data, too
 };
 
 // What JavaScript last asked of a picture, for a focus. view has no branches folded and no boxes of their own size: viewOf

@@ -138,7 +138,7 @@ export class Viewer {
         this.input.tooltip.hide();
         this.scene.show(picture, contents, anchor);
         this.overview.show(picture);
-        this.corner.showWays(picture.kinship?.ways ?? []);
+        this.corner.explain(picture);
         this.nameTree();
         this.shown.learnKinships();
     }
@@ -265,18 +265,18 @@ export class Viewer {
     changeLanguage(): void {
         this.words = this.wordsOfLanguage();
         this.rebuildUi();
-        this.showWays();
+        this.explainLines();
     }
 
-    // Kinship is put into words with the picture, so another language needs another one.
-    private showWays(): void {
+    // Kinship and lines are put into words with the picture, so another language needs another one.
+    private explainLines(): void {
         const { sight } = this;
-        if (this.picture?.kinship) {
+        if (this.picture?.kinship || this.picture?.lineStyles.length) {
             this.shown.forgetPicture();
             this.show({});
             this.sight = sight;
         }
-        this.corner.showWays(this.picture?.kinship?.ways ?? []);
+        if (this.picture) this.corner.explain(this.picture);
     }
 
     // Makes everything that holds words.

@@ -181,8 +181,6 @@ export const uiGerman: UiMessages = {
         focus: "Hauptperson des Bildes",
         hidden: "Nicht gezeigte Verwandte: zweimal klicken",
         missing: "Elternteil unbekannt",
-        divorced: "Geschieden",
-        adopted: "Adoptiert oder Pflegekind",
         repeated: "Steht an mehreren Stellen",
     },
     treeLabel: (name, view) => `${view}: ${name}`,

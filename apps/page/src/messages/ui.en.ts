@@ -179,8 +179,6 @@ export const uiEnglish: UiMessages = {
         focus: "Focus of the picture",
         hidden: "Relatives not shown: click twice",
         missing: "Parent not known",
-        divorced: "Divorced",
-        adopted: "Adopted or foster child",
         repeated: "Stands in several places",
     },
     treeLabel: (name, view) => `${view} of ${name}`,

@@ -187,8 +187,6 @@ export const uiSpanish: UiMessages = {
         focus: "Persona central de la imagen",
         hidden: "Parientes no mostrados: doble clic",
         missing: "Padre o madre desconocidos",
-        divorced: "Divorciados",
-        adopted: "Hijo adoptado o de acogida",
         repeated: "Aparece en varios lugares",
     },
     treeLabel: (name, view) => `${view}: ${name}`,

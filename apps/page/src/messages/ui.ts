@@ -145,8 +145,6 @@ export interface UiMessages {
         readonly focus: string;
         readonly hidden: string;
         readonly missing: string;
-        readonly divorced: string;
-        readonly adopted: string;
         readonly repeated: string;
     };
     readonly treeLabel: (name: string, view: string) => string;

@@ -5,7 +5,6 @@
 
 import { svg } from "../base/dom";
 import type { FamilyLines, Picture } from "../view/Picture";
-import { arcPath } from "./arcArt";
 
 /** All boxes of a picture, a path for each sex. */
 export function overviewPaths(picture: Picture): SVGPathElement[] {
@@ -14,13 +13,13 @@ export function overviewPaths(picture: Picture): SVGPathElement[] {
         const { person, sex, x, y, width, height } = box;
         const kind = person ? sex : "missing";
         const list = paths.get(kind) ?? [];
-        list.push(box.arc ? arcPath(box.arc, { x: 0, y: 0 }) : `M${x} ${y}h${width}v${height}h${-width}z`);
+        list.push(box.arc ? box.arc.outline : `M${x} ${y}h${width}v${height}h${-width}z`);
         paths.set(kind, list);
     }
     return [...paths].map(([kind, list]) => svg("path", { class: kind, d: list.join("") }));
 }
 
-/** The lines of families, without bridges. */
+/** The lines of families, without the arcs of their bridges, which nobody sees from afar: of the screen alone. */
 export function farLines(families: readonly FamilyLines[]): SVGPathElement {
     const d = families
         .flatMap(({ family }) => family.lines.map(({ x1, y1, x2, y2 }) => `M${x1} ${y1}L${x2} ${y2}`))

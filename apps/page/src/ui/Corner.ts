@@ -3,11 +3,13 @@
 
 // What floats over the lower edge of the picture: the legend, the overview, and the buttons for zooming.
 
+import type { LineStyle } from "olvane";
 import { iconButton } from "../base/controls";
 import { html, svg } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
 import type { UiMessages } from "../messages/ui";
 import { wayClass } from "../scene/wayLines";
+import type { Picture } from "../view/Picture";
 
 export interface CornerActions {
     zoomIn(): void;
@@ -27,12 +29,21 @@ export class Corner {
         this.element = html("div", { class: "corner" }, this.ways, this.legend, overview, zoomButtons(ui, actions));
     }
 
-    // What the line of each way means; nothing without ways.
-    showWays(ways: readonly { readonly words: string }[]): void {
+    // What the lines of a picture mean: of each way of a kinship, and in the legend of those that are dashed.
+    explain({ kinship, lineStyles }: Picture): void {
+        const ways = kinship?.ways ?? [];
         this.ways.hidden = ways.length === 0;
         this.ways.replaceChildren(
             ...ways.map(({ words }, index) => html("li", {}, waySign(index), html("span", {}, words))),
         );
+        for (const row of this.legend.querySelectorAll(".of-lines")) row.remove();
+        this.legend
+            .querySelector("ul")!
+            .append(
+                ...lineStyles.map((style) =>
+                    html("li", { class: "of-lines" }, lineSign(style), html("span", {}, style.meaning)),
+                ),
+            );
     }
 
     // The keys move to the legend's heading when they stood inside it.
@@ -43,11 +54,21 @@ export class Corner {
     }
 }
 
+const kSign = "M0 5H44"; // of a line
+
+function lineSign({ dashes }: LineStyle): SVGElement {
+    return svg(
+        "svg",
+        { class: "line-sign", width: 28, height: 10, "aria-hidden": "true" },
+        svg("path", { class: "line", "stroke-dasharray": dashes, d: kSign }),
+    );
+}
+
 function waySign(index: number): SVGElement {
     return svg(
         "svg",
         { width: 44, height: 10, "aria-hidden": "true" },
-        svg("path", { class: "way " + wayClass(index), d: "M0 5H44" }),
+        svg("path", { class: "way " + wayClass(index), d: kSign }),
     );
 }
 
@@ -76,8 +97,6 @@ function legendOf(ui: UiMessages): HTMLDetailsElement {
         row(sign("focus"), items.focus),
         row(sign("more", "+3"), items.hidden),
         row(sign("missing", "?"), items.missing),
-        row(sign("divorced"), items.divorced),
-        row(sign("adopted"), items.adopted),
         row(sign("duplicate", icon("duplicates")), items.repeated),
     );
     return html("details", { id: "legend", part: "legend" }, html("summary", {}, ui.legend), list);

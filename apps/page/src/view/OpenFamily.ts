@@ -48,7 +48,7 @@ export class OpenFamily {
     picture(state: ViewState, reader: Reader): Picture {
         const options = keeping(this.optionsOf(state, reader));
         const labelSize = state.show.has("marriage") ? kLabelSize : 0;
-        const values = this.file.picture(state.focus, { ...options, labelSize });
+        const values = this.file.picture(state.focus, { ...options, labelSize, paths: true });
         const laterSide = this.file.laterSide(state.view, state.direction, options.mirrored);
         return new Picture(state.view, laterSide, state.focus, values);
     }

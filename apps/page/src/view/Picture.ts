@@ -6,9 +6,12 @@
 // upper-left corner.
 
 import type {
+    FanCell,
     FoldedBranch,
     GedcomFile,
     KinshipPlate,
+    LinePath,
+    LineStyle,
     PictureBox,
     PictureFamily,
     PictureMark,
@@ -53,22 +56,21 @@ export interface Box {
 
 export type LaterSide = ReturnType<GedcomFile["laterSide"]>;
 
-/** A piece of a ring: angles in degrees clockwise from the top, radii and middle in points. */
-export interface BoxArc {
-    readonly from: number;
-    readonly to: number;
-    readonly inner: number;
-    readonly outer: number;
+/** A piece of a ring; the middle of the chart in points. */
+export interface BoxArc extends FanCell {
     readonly middleX: number;
     readonly middleY: number;
-    // Counts the lines of descent of the chart from 0; -1 for the boxes near the middle.
-    readonly line: number;
+    // The data of a path, not seen from the box.
+    readonly outline: string;
+    // Of its line of descent, by number; null near the middle.
+    readonly colour: number | null;
 }
 
-/** A family as the scene draws it: its lines, and the rectangle that they fill. */
+/** A family as the scene draws it: its lines as paths, and the rectangle that they fill. */
 export interface FamilyLines {
     readonly index: number;
     readonly family: PictureFamily;
+    readonly paths: readonly LinePath[];
     readonly area: Rectangle;
 }
 
@@ -77,6 +79,8 @@ export class Picture {
     readonly families: readonly FamilyLines[];
     readonly marks: readonly PictureMark[];
     readonly kinship: PictureValues["kinship"];
+    // How lines are drawn that stand for more than a birth or a marriage.
+    readonly lineStyles: readonly LineStyle[];
     readonly bounds: Rectangle;
     readonly focusBox: Box;
     private readonly boxGrid: SpatialGrid;
@@ -94,11 +98,13 @@ export class Picture {
         values: PictureValues,
     ) {
         const numbers = markNumbers(values.marks);
-        const lines = [...new Set(values.arcs.map((arc) => arc.line))].filter((line) => line !== null);
-        this.boxes = values.boxes.map((box, i) => this.boxOf(box, values, numbers, arcOf(values, i, lines)));
+        this.boxes = values.boxes.map((box, i) => this.boxOf(box, values, numbers, arcOf(values, i)));
         this.marks = values.marks;
         this.kinship = values.kinship;
-        this.families = values.families.map((family, index) => this.linesOf(family, index));
+        this.lineStyles = values.art?.styles.filter(({ meaning }) => meaning) ?? [];
+        this.families = values.families.map((family, index) =>
+            this.linesOf(family, index, values.art?.lines[index] ?? []),
+        );
         const drawn = this.families.filter(({ family }) => family.lines.length > 0);
         this.boxGrid = new SpatialGrid(this.boxes.map(areaOf));
         this.lineGrid = new SpatialGrid(this.families.map(({ area }) => area));
@@ -167,7 +173,7 @@ export class Picture {
         return box;
     }
 
-    private linesOf(family: PictureFamily, index: number): FamilyLines {
+    private linesOf(family: PictureFamily, index: number, paths: readonly LinePath[]): FamilyLines {
         const area = boundsOf(
             family.lines.map(({ x1, y1, x2, y2 }) => ({
                 left: Math.min(x1, x2),
@@ -176,7 +182,7 @@ export class Picture {
                 bottom: Math.max(y1, y2),
             })),
         );
-        const lines = { index, family, area };
+        const lines = { index, family, paths, area };
         for (const box of new Set([...family.parents, ...family.children])) {
             const known = this.familiesByBox.get(box);
             if (known) known.push(lines);
@@ -192,18 +198,20 @@ function placeInKinship(index: number, kinship: PictureValues["kinship"]): Box["
     return kinship.ways.some(({ ancestors }) => ancestors.includes(index)) ? "ancestor" : null;
 }
 
-function arcOf({ arcs, rings }: PictureValues, index: number, lines: readonly number[]): BoxArc | null {
+function arcOf({ arcs, rings, art }: PictureValues, index: number): BoxArc | null {
     const arc = arcs[index];
-    if (!arc || !rings) return null;
+    const cell = art?.cells[index];
+    if (!arc || !rings || !cell) return null;
     const { radii, middleX, middleY } = rings;
     return {
+        ...cell,
         from: arc.from,
         to: arc.to,
+        isCentre: arc.ring === 0,
         inner: radii[arc.ring] ?? 0,
         outer: radii[arc.ring + 1] ?? 0,
         middleX,
         middleY,
-        line: arc.line === null ? -1 : lines.indexOf(arc.line),
     };
 }
 
