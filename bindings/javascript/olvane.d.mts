@@ -366,7 +366,7 @@ export interface FanCell {
     readonly isCentre: boolean;
 }
 
-/** A line of text, of which (x, y) is the middle, seen from that of the chart, and turned around it by so many degrees. */
+/** A line of text, of which (x, y) is the middle, seen from that of the chart, and turned around it by `turn` degrees. */
 export interface CellLine {
     readonly text: string;
     readonly isName: boolean;

@@ -16,6 +16,7 @@
 #include <olvane/draw/FanCell.h>
 #include <olvane/draw/LineArtInternal.h>
 #include <olvane/draw/MarkArtInternal.h>
+#include <olvane/draw/PageArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/picture/TextFit.h>
 
@@ -31,8 +32,6 @@ using picture::textWidth;
 using picture::Index;
 
 // All in px.
-constexpr int kMargin = 28;
-constexpr int kHeadlineHeight = 40;
 constexpr double kBorder = 1;
 constexpr double kFocusBorder = 4;
 constexpr int kLegendPitch = 22;

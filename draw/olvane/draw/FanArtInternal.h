@@ -11,8 +11,4 @@ namespace olvane::draw {
 // cell or along the radius, whichever leaves it more room. What has no room is in the cell's title.
 SvgPicture drawFan(const DrawingContent& content, const DrawingOptions& options);
 
-// The parts of a page that all pictures share: from the beginning to the headline, and the end.
-void openPage(SvgPicture& picture, const DrawingOptions& options);
-void closePage(SvgPicture& picture);
-
 }  // namespace olvane::draw

@@ -23,7 +23,7 @@ struct FanCell {
     double middleY = 0;
     bool isCentre = false;  // the disc in the middle of the chart
 
-    // The cell of a box in a round picture, with so many px for a point and the middle of the chart at (0, 0).
+    // The cell of a box in a round picture, with `scale` px for a point and the middle of the chart at (0, 0).
     static FanCell of(const picture::Picture& fan, std::size_t box, double scale = 1);
 };
 
@@ -38,7 +38,7 @@ struct FanText {
     std::vector<std::string> facts;
 };
 
-// A line of text with its middle at (x, y), turned around it by so many degrees. The baseline is below the middle by
+// A line of text with its middle at (x, y), turned around it by `turn` degrees. The baseline is below the middle by
 // kFanBaseline of the size.
 struct PlacedFanLine {
     std::string text;

@@ -6,8 +6,6 @@
 #include <olvane/draw/SvgDrawing.h>
 
 #include <algorithm>
-#include <cmath>
-#include <optional>
 #include <set>
 #include <unordered_map>
 #include <utility>
@@ -17,74 +15,15 @@
 #include <olvane/draw/BoxPartsInternal.h>
 #include <olvane/draw/DrawingWordsInternal.h>
 #include <olvane/draw/FanArtInternal.h>
+#include <olvane/draw/LegendInternal.h>
 #include <olvane/draw/LineArtInternal.h>
+#include <olvane/draw/PageArtInternal.h>
 #include <olvane/draw/SvgTextInternal.h>
 #include <olvane/draw/WayArtInternal.h>
-#include <olvane/picture/TextFit.h>
 
 namespace olvane::draw {
 
 namespace {
-
-using picture::cleanText;
-using picture::cutText;
-using picture::fitLine;
-using picture::Font;
-using picture::kFontFamilies;
-using picture::textWidth;
-
-// All in px.
-constexpr int kMargin = 28;
-constexpr int kHeadlineHeight = 40;
-constexpr double kHeadlineSize = 20;
-constexpr int kLegendPitch = 22;
-constexpr int kLegendGap = 12;  // between the last row of boxes and the legend
-constexpr double kLegendWidth = 170;
-constexpr int kLegendStroke = 44;
-constexpr double kLegendSize = 11.5;
-constexpr double kLegendLine = 1.6;
-constexpr int kWidePicture = 3000;
-constexpr int kLegendPlaces = 64;        // tried at the lower edge of a wide picture
-constexpr double kLegendClearance = 20;  // to boxes, their frames and marks, and to lines
-
-struct Bounds {
-    double left = 0;
-    double top = 0;
-    double right = 0;
-    double bottom = 0;
-
-    void include(double x, double y) {
-        left = std::min(left, x);
-        right = std::max(right, x);
-        top = std::min(top, y);
-        bottom = std::max(bottom, y);
-    }
-};
-
-// Of boxes, lines and plates; of an empty picture, the room that its sentence needs.
-Bounds boundsOf(const picture::Picture& picture, const std::vector<picture::KinshipPlate>& plates) {
-    if (picture.boxes.empty()) return {0, 0, 55, 80};
-    const picture::Box& first = picture.boxes.front();
-    Bounds bounds{first.x, first.y, first.x, first.y};
-    for (const picture::Box& box : picture.boxes) {
-        bounds.include(box.x, box.y);
-        bounds.include(box.x + static_cast<double>(box.width), box.y + static_cast<double>(box.height));
-    }
-    for (const picture::Line& line : picture.lines) {
-        bounds.include(line.x1, line.y1);
-        bounds.include(line.x2, line.y2);
-    }
-    for (const picture::KinshipPlate& plate : plates) {
-        bounds.include(plate.x, plate.y);
-        bounds.include(plate.right(), plate.bottom());
-    }
-    return bounds;
-}
-
-// Up to the next whole px; a picture is at most as large as a renderer's numbers.
-int wholePx(double size) {
-    return static_cast<int>(std::ceil(std::clamp(size, 0.0, 1e9)));
-}
 
 class Composer {
 public:
@@ -233,16 +172,6 @@ private:
             options_.language);
     }
 
-    // What a line of a kind looks like, and what it means.
-    struct LegendRow {
-        std::string_view colour;
-        double width = kLegendLine;
-        std::string_view dashes;
-        std::string text;
-        std::string sign;  // of a badge, instead of a line
-        bool hollow = false;
-    };
-
     void addSigns(std::vector<LegendRow>& rows) const {
         const picture::Picture& picture = content_.picture;
         bool hasHidden = false, hasFurther = false;
@@ -295,100 +224,13 @@ private:
         return rows;
     }
 
-    // Lists only what is there: in a lower corner of the picture where that is free, else below it.
+    // Lists only what is there.
     std::string legendFor(const LineStylesUsed& styles) {
-        const std::vector<LegendRow> rows = legendRows(styles);
-        if (rows.empty()) return std::string();
-        picture_.text.add(kLegendSize);
-        double width = kLegendWidth;
-        for (const LegendRow& row : rows) {
-            const double text = textWidth(cleanText(cutText(row.text)), {kLegendSize});
-            width = std::max(width, kLegendStroke + 10 + text);
-        }
-        placeLegend(wholePx(width), kLegendPitch * static_cast<int>(rows.size()));
-        std::string legend;
-        put(legend, "<g>\n<title>", Escaped{wordsOf(Phrase::legend, options_.language)}, "</title>\n");
-        int number = 0;
-        for (const LegendRow& row : rows) appendLegendRow(legend, number++, row);
-        return legend + "</g>\n";
-    }
-
-    void placeLegend(int width, int height) {
-        int y = picture_.height - kMargin - height;
-        std::optional<int> x = freePlaceOf(width, height, y);
-        if (!x) {
-            x = kMargin;
-            y = picture_.height - kMargin + kLegendGap;
-            picture_.height += height + kLegendGap;
-            picture_.width = std::max(picture_.width, width + 2 * kMargin);
-        }
-        picture_.legend = {static_cast<double>(*x), static_cast<double>(y), static_cast<double>(width),
-                           static_cast<double>(height)};
-    }
-
-    // Where an area at the lower edge is free: a corner, or in a wide picture, of which a corner may lie on another sheet
-    // than anything else, the place that is nearest to the focus.
-    std::optional<int> freePlaceOf(int width, int height, int top) const {
-        const int last = picture_.width - kMargin - width;
-        if (picture_.width <= kWidePicture || content_.picture.focus == picture::kNone) {
-            for (const int x : {kMargin, last}) {
-                if (isFree(x, top, width, height)) return x;
-            }
-            return std::nullopt;
-        }
-        const double focus =
-            frame_.x(content_.picture.boxes[static_cast<std::size_t>(content_.picture.focus)].x);
-        std::optional<int> nearest;
-        for (int i = 0; i <= kLegendPlaces; ++i) {
-            const int x = kMargin + static_cast<int>(static_cast<double>(last - kMargin) * i / kLegendPlaces);
-            const auto distance = [&](int of) { return std::abs(of + width / 2.0 - focus); };
-            if (nearest && distance(x) >= distance(*nearest)) continue;
-            if (isFree(x, top, width, height)) nearest = x;
-        }
-        return nearest;
-    }
-
-    // Whether nothing is drawn in an area of the picture or close to it.
-    bool isFree(int left, int top, int width, int height) const {
-        if (left < kMargin || top < kMargin) return false;
-        const double x = left - kLegendClearance;
-        const double y = top - kLegendClearance;
-        const auto covers = [&](double x1, double y1, double x2, double y2) {
-            return frame_.x(std::max(x1, x2)) > x &&
-                   frame_.x(std::min(x1, x2)) < left + width + kLegendClearance &&
-                   frame_.y(std::max(y1, y2)) > y &&
-                   frame_.y(std::min(y1, y2)) < top + height + kLegendClearance;
-        };
-        for (const picture::Box& box : content_.picture.boxes) {
-            if (covers(box.x, box.y, box.x + static_cast<double>(box.width),
-                       box.y + static_cast<double>(box.height)))
-                return false;
-        }
-        for (const picture::Line& line : content_.picture.lines) {
-            if (covers(line.x1, line.y1, line.x2, line.y2)) return false;
-        }
-        for (const picture::KinshipPlate& plate : plates_) {
-            if (covers(plate.x, plate.y, plate.right(), plate.bottom())) return false;
-        }
-        return true;
-    }
-
-    void appendLegendRow(std::string& legend, int place, const LegendRow& row) const {
-        const int left = static_cast<int>(picture_.legend.x);
-        const int y = static_cast<int>(picture_.legend.y) + kLegendPitch * place + kLegendPitch / 2;
-        if (row.sign.empty()) {
-            put(legend, "<path d=\"M", whole(left), " ", whole(y), "h", whole(kLegendStroke),
-                "\" fill=\"none\" stroke=\"", row.colour, "\" stroke-width=\"", number(row.width), "\"");
-            if (!row.dashes.empty()) put(legend, " stroke-dasharray=\"", row.dashes, "\"");
-            legend += "/>\n";
-        } else {
-            Badge badge{row.sign, row.text, row.hollow};
-            badge.x = left + (kLegendStroke - badge.width()) / 2;
-            appendBadge(legend, y - kBadgeHeight / 2, badge, theme());
-        }
-        put(legend, "<text x=\"", whole(left + kLegendStroke + 10), "\" y=\"", whole(y + 4),
-            "\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().quietText, "\">",
-            Escaped{cleanText(cutText(row.text))}, "</text>\n");
+        const Legend legend(legendRows(styles), options_);
+        if (legend.isEmpty()) return std::string();
+        picture_.text.add(kLegendLetters);
+        picture_.legend = legend.placeIn(picture_, {content_.picture, plates_, frame_});
+        return legend.svgIn(picture_.legend);
     }
 
     const DrawingContent& content_;
@@ -401,35 +243,7 @@ private:
     std::vector<picture::KinshipPlate> plates_;
 };
 
-void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
-    if (!options.headline) return;
-    const Font font{kHeadlineSize, true};
-    const std::string text = fitLine(cleanText(cutText(options.title)), font, picture.width - 2 * kMargin);
-    put(picture.svg, "<text x=\"", whole(kMargin), "\" y=\"", whole(kMargin + 12),
-        "\" font-weight=\"bold\" font-size=\"", number(kHeadlineSize), "\" fill=\"", options.theme->text,
-        "\">", Escaped{text}, "</text>\n");
-}
-
 }  // namespace
-
-void openPage(SvgPicture& picture, const DrawingOptions& options) {
-    const Whole width = whole(picture.width);
-    const Whole height = whole(picture.height);
-    const std::string title = escaped(cutText(options.title));
-    put(picture.svg,
-        "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"",
-        number(picture.width * options.scale), "\" height=\"", number(picture.height * options.scale),
-        "\" viewBox=\"0 0 ", width, " ", height, "\" role=\"group\" aria-label=\"", title, "\">\n<title>",
-        title, "</title>\n");
-    appendBoxDefinitions(picture.svg);
-    put(picture.svg, "<rect width=\"", width, "\" height=\"", height, "\" fill=\"", options.theme->page,
-        "\"/>\n<g font-family=\"", kFontFamilies, "\">\n");
-    appendHeadline(picture, options);
-}
-
-void closePage(SvgPicture& picture) {
-    picture.svg += "</g>\n</svg>\n";
-}
 
 std::string titleOf(std::string_view view, const DrawingContent& content, kin::Language language) {
     std::string title = viewTitle(view, language);
