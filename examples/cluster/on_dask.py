@@ -91,6 +91,8 @@ def main() -> None:
     parser.add_argument("--jobs-per-task", type=int, default=1)
     chosen = parser.parse_args()
     os.makedirs(chosen.out, exist_ok=True)
+    if any(pathlib.Path(chosen.out).glob("*.tsv")):
+        sys.exit(f"{chosen.out} holds answers of an earlier run: take another folder, or empty it")
     jobs = sys.stdin.readlines()
     start = time.perf_counter()
     if chosen.scheduler:

@@ -116,7 +116,9 @@ class File:
         try:
             status = _layout(self._pointer, _view_number(view), _person_number(focus), chosen, byref(layout))
             if status != Status.OK:
-                raise FileError(Status(status), f"layout of person {focus}: {_status_text(status)}")
+                is_missing = status == Status.INVALID_PERSON
+                reason = f"the file has no person {focus}" if is_missing else _status_text(status)
+                raise FileError(Status(status), f"layout of person {focus}: {reason}")
             return _text_of(layout)
         finally:
             _native.library.olvane_layout_free(layout)

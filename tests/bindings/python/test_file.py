@@ -121,6 +121,8 @@ class Files(unittest.TestCase):
         with self.assertRaisesRegex(olvane.FileError, "no/file.ged: does not exist") as raised:
             olvane.draw("no/file.ged", 1)
         self.assertIs(olvane.Status.UNREADABLE, raised.exception.status)
+        with self.assertRaisesRegex(olvane.FileError, "^layout of person 4: the file has no person 4$"):
+            olvane.File(FAMILY).layout_text(4)
         with self.assertRaisesRegex(olvane.FileError, "'Carl' may be any of 2 persons"):
             olvane.draw(FAMILY, "Carl")
         with self.assertRaisesRegex(olvane.FileError, "view is 'paper', and takes family"):
