@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Made by family/make-folding-table. Do not edit.
+// Made by family/make-folding-table from Unicode 14.0.0. Do not edit.
 
 #include <olvane/kin/FoldingTableInternal.h>
 
