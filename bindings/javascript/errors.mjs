@@ -6,14 +6,20 @@
 export class LayoutError extends Error {
     constructor(status, message, text, records, options) {
         super(message, options);
-        this.name = new.target.name;
+        this.name = "LayoutError";
         this.status = status;
         this.text = text;
         this.records = records;
     }
 }
 
-export class HostError extends LayoutError {}
+// Names are texts, since what packs a page shortens those of classes.
+export class HostError extends LayoutError {
+    constructor(...given) {
+        super(...given);
+        this.name = "HostError";
+    }
+}
 
 /** The module's memory has no room for what comes from JavaScript. */
 export class OutOfMemory extends RangeError {

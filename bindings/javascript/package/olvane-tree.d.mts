@@ -42,7 +42,7 @@ export interface Person {
 }
 
 /** A family of the program's own: a Family of the package olvane, or whatever answers as one does. */
-export interface FamilyData extends Pick<EventTarget, "addEventListener" | "removeEventListener"> {
+export interface FamilyData extends Partial<Pick<EventTarget, "addEventListener" | "removeEventListener">> {
     /** The text of a GEDCOM file, with everybody as they are now. */
     gedcom(): string;
 }
@@ -56,6 +56,10 @@ export interface OlvaneTreeEventMap {
     action: CustomEvent<{ child: Person; parent: "father" | "mother" }>;
     /** A picture could not be laid out; the one before stays. */
     refused: CustomEvent<{ tooLarge: boolean }>;
+    /** A key that leads out of the viewer; preventDefault() says that it was taken. */
+    outerkey: CustomEvent<{ key: string }>;
+    /** What src or data ask for cannot be fetched or read. */
+    error: ErrorEvent;
 }
 
 /** <olvane-tree src="family.ged" focus="I1" view="hourglass">; importing this package makes it known. */
@@ -64,7 +68,10 @@ export declare class OlvaneTree extends HTMLElement {
     readonly state: ViewState | null;
     /** The selected person: the one that the panel is about. */
     readonly selected: Person | null;
-    /** Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read. */
+    /**
+     * Fetches a GEDCOM file and shows it. Rejects where it cannot be fetched or read, and with an AbortError where another file
+     * is asked for before it has come.
+     */
     load(address: string): Promise<void>;
     /** Shows the bytes of a GEDCOM file. Rejects where they are none. */
     open(bytes: Uint8Array, name?: string): Promise<void>;
@@ -91,8 +98,8 @@ export declare class OlvaneTree extends HTMLElement {
     fit(): void;
     home(): void;
     zoomBy(factor: number): void;
-    /** The whole picture as the text of an SVG file; null before any. */
-    saveSvg(): string | null;
+    /** The whole picture, or what of it is in sight, as the text of an SVG file; null before any. */
+    saveSvg(inSight?: boolean): string | null;
     addEventListener<Name extends keyof OlvaneTreeEventMap>(
         type: Name,
         listener: (this: OlvaneTree, event: OlvaneTreeEventMap[Name]) => unknown,

@@ -17,6 +17,7 @@ const kTypes = { html: "text/html", mjs: "text/javascript", ged: "text/plain" };
 let server = null;
 let address = "";
 const files = new Map();
+const asked = []; // the paths, in the order in which they were asked for
 
 before(async () => {
     files.set("/olvane-tree.mjs", readFileSync(process.env.OLVANE_ELEMENT));
@@ -24,6 +25,7 @@ before(async () => {
     files.set("/example.html", readFileSync(join(process.env.OLVANE_SOURCES, "examples/javascript/element.html")));
     server = createServer(async (request, response) => {
         const path = new URL(request.url, "http://localhost").pathname;
+        asked.push(path);
         const content = await files.get(path);
         response.writeHead(content ? 200 : 404, { "content-type": kTypes[path.split(".").at(-1)] ?? "text/plain" });
         response.end(content ?? "not here");
@@ -408,6 +410,119 @@ describe("element", () => {
         });
         assert.deepEqual(later, { length: 142, failures: [] });
         await end();
+    });
+
+    test("src is asked for once, and again when it changed while the viewer stood in no page", async () => {
+        for (const name of ["once", "again"]) files.set(`/${name}.ged`, sample("darwin-wedgwood.ged"));
+        files.set(
+            "/once.html",
+            '<!doctype html><olvane-tree src="once.ged"></olvane-tree><script type="module" src="olvane-tree.mjs"></script>',
+        );
+        const { page, end } = await open("/once.html");
+        await page.waitForFunction(() => document.querySelector("olvane-tree").state);
+        await page.evaluate(() => {
+            window.tree = document.querySelector("olvane-tree");
+            tree.remove();
+            document.body.append(tree);
+            tree.remove();
+            tree.setAttribute("src", "again.ged");
+            document.body.append(tree);
+        });
+        await page.waitForFunction(() => tree.family.file.name === "again.ged");
+        assert.deepEqual(
+            asked.filter((path) => /once\.ged|again\.ged/.test(path)),
+            ["/once.ged", "/again.ged"],
+        );
+        await end();
+    });
+
+    test("a viewer that stands in no page follows no changes, and shows them when it does again", async () => {
+        const { page, end } = await open("/own.html");
+        await page.waitForFunction(() => document.querySelector("olvane-tree").state);
+        const seen = await page.evaluate(async () => {
+            const tree = document.querySelector("olvane-tree");
+            const shown = () => [...tree.family.persons.map(({ given }) => given)].includes("Olof");
+            const written = () => new Promise((next) => setTimeout(next));
+            tree.remove();
+            let texts = 0;
+            const { gedcom } = window.family;
+            window.family.gedcom = function () {
+                ++texts;
+                return gedcom.call(this);
+            };
+            window.family.setNames(9, [{ kind: "given", text: "Olof" }]);
+            await written();
+            const away = [texts, shown()];
+            document.body.append(tree);
+            await written();
+            const back = [texts, shown()];
+            tree.remove();
+            document.body.append(tree);
+            await written();
+            return { away, back, unchanged: texts };
+        });
+        assert.deepEqual(seen, { away: [0, false], back: [1, true], unchanged: 1 });
+        await end();
+    });
+
+    test("viewers that were removed are released, though the family that they showed stays", async () => {
+        const { page, end } = await open("/own.html");
+        await page.waitForFunction(() => document.querySelector("olvane-tree").state);
+        await page.evaluate(async () => {
+            window.removed = [];
+            for (let count = 0; count < 20; ++count) {
+                const tree = document.createElement("olvane-tree");
+                const shown = new Promise((done) => tree.addEventListener("focuschange", done, { once: true }));
+                tree.data = window.family;
+                document.body.append(tree);
+                await shown;
+                tree.remove();
+                window.removed.push(new WeakRef(tree));
+            }
+        });
+        const session = await page.context().newCDPSession(page);
+        // The last one may still be in the hands of the browser.
+        await becomes(async () => {
+            await session.send("HeapProfiler.collectGarbage");
+            return page.evaluate(() => window.removed.filter((one) => one.deref()).length <= 1);
+        }, true);
+        await end();
+    });
+
+    test("the colours of the system are back when the attribute for others is gone", async () => {
+        const { page, end } = await open("/one.html");
+        await page.waitForFunction(() => document.querySelector("olvane-tree").state);
+        const themes = await page.evaluate(() => {
+            const tree = document.querySelector("olvane-tree");
+            const seen = [tree.dataset.theme];
+            tree.setAttribute("theme", "dark");
+            seen.push(tree.dataset.theme);
+            tree.removeAttribute("theme");
+            return [...seen, tree.dataset.theme];
+        });
+        assert.deepEqual(themes, [undefined, "dark", undefined]);
+        await end();
+    });
+
+    test("the types state every event and method of the manifest", () => {
+        const source = (path) => readFileSync(join(process.env.OLVANE_SOURCES, path), "utf8");
+        const { declarations } = JSON.parse(source("apps/page/src/element/custom-elements.json")).modules[0];
+        const types = source("bindings/javascript/package/olvane-tree.d.mts");
+        const [, events] = types.match(/interface OlvaneTreeEventMap \{([^]*?)\n\}/);
+        const [, members] = types.match(/declare class OlvaneTree [^{]*\{([^]*?)\n\}/);
+        for (const { name } of declarations[0].events) assert.match(events, new RegExp(`^ {4}${name}: `, "m"));
+        for (const { kind, name, parameters = [] } of declarations[0].members) {
+            const line = members.split("\n").find((line) => new RegExp(`^ {4}(readonly )?${name}[(:]`).test(line));
+            assert.ok(line, `${name} is not declared`);
+            if (kind !== "method") continue;
+            const [, declared] = line.match(/\((.*)\): /);
+            const names = declared.split(/, (?=\w+\??:)/).map((one) => one.match(/^\w*/)[0]);
+            assert.deepEqual(
+                names.filter(Boolean),
+                parameters.map((one) => one.name),
+                name,
+            );
+        }
     });
 
     test("a file that cannot be had leaves the element empty and reports why", async () => {

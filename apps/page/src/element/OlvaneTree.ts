@@ -26,6 +26,7 @@ export class OlvaneTree extends HTMLElement {
     private readonly viewer: Viewer;
     private loading = new AbortController(); // of the file that was asked for last
     private readonly watched = new WatchedData(() => this.orReport(this.refresh()));
+    private askedSrc: string | null = null; // by the attribute, at last and without a failure
 
     constructor() {
         super();
@@ -41,8 +42,9 @@ export class OlvaneTree extends HTMLElement {
         this.viewer.connect();
         if (!this.hasAttribute("data-theme")) this.applyTheme();
         const src = this.getAttribute("src");
-        if (src && !this.family) this.loadAttribute(src);
+        if (src && src !== this.askedSrc && !(this.family && this.askedSrc === null)) this.loadAttribute(src);
         this.takeEarlyProperties();
+        this.watched.follow(true);
     }
 
     // What was set before the browser knew the element hides the property of that name.
@@ -57,6 +59,7 @@ export class OlvaneTree extends HTMLElement {
 
     disconnectedCallback(): void {
         this.viewer.disconnect();
+        this.watched.follow(false);
     }
 
     attributeChangedCallback(name: string, before: string | null, now: string | null): void {
@@ -107,6 +110,7 @@ export class OlvaneTree extends HTMLElement {
     }
 
     private loadAttribute(address: string): void {
+        this.askedSrc = address;
         this.orReport(this.load(address));
     }
 
@@ -114,6 +118,7 @@ export class OlvaneTree extends HTMLElement {
     private orReport(work: Promise<void>): void {
         work.catch((error: unknown) => {
             if (error instanceof DOMException && error.name === "AbortError") return;
+            this.askedSrc = null;
             const message = error instanceof Error ? error.message : String(error);
             this.dispatchEvent(new ErrorEvent("error", { message, error }));
         });
@@ -302,6 +307,7 @@ export class OlvaneTree extends HTMLElement {
         const theme = this.getAttribute("theme");
         if (theme) this.dataset["theme"] = theme;
         else if (matchMedia("(prefers-color-scheme: dark)").matches) this.dataset["theme"] = "dark";
+        else delete this.dataset["theme"];
     }
 
     // The state that the attributes ask for, in the form of an address.

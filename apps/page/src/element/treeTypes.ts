@@ -11,7 +11,7 @@ import type { ViewState } from "../view/ViewState";
 export type BoxRenderer = (person: Person, box: { width: number; height: number }) => SVGElement | null;
 
 /** A family of the program's own: a Family of the package olvane, or whatever answers as one does. */
-export interface FamilyData extends Pick<EventTarget, "addEventListener" | "removeEventListener"> {
+export interface FamilyData extends Partial<Pick<EventTarget, "addEventListener" | "removeEventListener">> {
     /** The text of a GEDCOM file, with everybody as they are now. */
     gedcom(): string;
 }
