@@ -8,6 +8,7 @@ import type { Box } from "../view/Picture";
 import type { Placing } from "./Camera";
 
 const kDoubleTap = 400; // ms
+const kReleases = ["pointerup", "pointercancel"] as const;
 
 export interface SceneEvents {
     // A box was clicked or tapped twice.
@@ -57,8 +58,16 @@ export function listenToSurface(surface: SVGSVGElement, target: SceneTarget, eve
     // A box that is pressed gets the keys, but the picture must hold still until it is known whether that is a
     // click or the beginning of a drag.
     let pressed = false;
-    surface.addEventListener("pointerdown", () => (pressed = true), { capture: true });
-    for (const end of ["pointerup", "pointercancel"]) addEventListener(end, () => (pressed = false), true);
+    const release = (): void => {
+        pressed = false;
+        for (const end of kReleases) removeEventListener(end, release, true);
+    };
+    // The window outlives the surface, so it holds a listener no longer than the surface is pressed.
+    const press = (): void => {
+        pressed = true;
+        for (const end of kReleases) addEventListener(end, release, true);
+    };
+    surface.addEventListener("pointerdown", press, { capture: true });
     surface.addEventListener("focusin", (event) => {
         const box = target.boxAt(event.target);
         if (box && box !== target.active && !pressed) target.activate(box);
