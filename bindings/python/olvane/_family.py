@@ -6,7 +6,7 @@ from __future__ import annotations
 
 from collections.abc import Iterable, Sequence
 from ctypes import byref, c_int32, c_int64, c_size_t, c_uint32, c_void_p
-from typing import Any
+from typing import Any, NoReturn
 
 from olvane import _family_native as _table
 from olvane import _native
@@ -101,6 +101,10 @@ class Family:
         return Family._of(made)
 
     __copy__ = copy
+
+    def __reduce__(self) -> NoReturn:
+        """What is pickled would be an address in this process."""
+        raise TypeError("a Family cannot be pickled: hand its rows to the other process, which makes its own")
 
     @classmethod
     def _of(cls, made: c_void_p) -> Family:

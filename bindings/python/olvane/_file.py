@@ -12,7 +12,7 @@ import zipfile
 from collections.abc import Callable
 from ctypes import POINTER, byref, c_char_p, c_int, c_int32, c_int64, c_size_t, c_uint32, c_void_p
 from dataclasses import dataclass
-from typing import Any, Literal
+from typing import Any, Literal, NoReturn
 
 from olvane import _native
 from olvane._errors import Status
@@ -44,6 +44,10 @@ class FileError(ValueError):
     def __init__(self, status: Status, message: str) -> None:
         super().__init__(message)
         self.status = status
+
+    # Another process gets a pickled one.
+    def __reduce__(self) -> tuple[Any, ...]:
+        return type(self), (self.status, str(self))
 
 
 @dataclass(frozen=True, slots=True)
@@ -84,6 +88,12 @@ class File:
     def __del__(self) -> None:
         if getattr(self, "_pointer", None):
             _free(self._pointer)
+
+    def __reduce__(self) -> NoReturn:
+        """What is pickled would be an address in this process."""
+        raise TypeError(
+            "a File cannot be pickled or copied: hand its path or bytes to the other process, which reads it"
+        )
 
     def __len__(self) -> int:
         """How many persons there are."""

@@ -289,6 +289,14 @@ def text_of(host: Any, focus: int) -> str:
     except olvane.LayoutError as error:
         return f"{error.status.name} {error.text}"
 
+    def test_deepCopiesAreCopiesAndNothingIsPickled(self) -> None:
+        family = olvane.Family([{"id": 1}])
+        deep = copy.deepcopy({"family": family})["family"]
+        deep.add_person(2)
+        self.assertEqual((1, 2), (len(family), len(deep)))
+        with self.assertRaisesRegex(TypeError, "a Family cannot be pickled: hand its rows to the other process"):
+            pickle.dumps(family)
+
 
 class Layouts(unittest.TestCase):
     def test_records_are_those_of_the_text(self) -> None:

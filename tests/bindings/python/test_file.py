@@ -2,7 +2,9 @@
 # SPDX-License-Identifier: MIT
 """GEDCOM files and drawings: one call draws, and what is wrong is said."""
 
+import copy
 import pathlib
+import pickle
 import tempfile
 import unittest
 import xml.etree.ElementTree
@@ -116,6 +118,17 @@ class Files(unittest.TestCase):
         self.assertEqual("mother", file.kinship(3, 1)["words"]["en"])
         expected = olvane.Remark("diedBeforeBirth", 3, None, "Cy Carl died before being born")
         self.assertEqual([expected], file.remarks())
+
+    def test_anotherProcessGetsTheErrorButNotTheFile(self) -> None:
+        file = olvane.File(FAMILY)
+        with self.assertRaises(olvane.FileError) as raised:
+            file.draw(99)
+        again = pickle.loads(pickle.dumps(raised.exception))
+        self.assertEqual((olvane.FileError, raised.exception.status), (type(again), again.status))
+        self.assertEqual(str(raised.exception), str(again))
+        for duplicate in (pickle.dumps, copy.copy, copy.deepcopy):
+            with self.assertRaisesRegex(TypeError, "a File cannot be pickled or copied: hand its path or bytes"):
+                duplicate(file)
 
     def test_whatIsWrongIsSaid(self) -> None:
         with self.assertRaisesRegex(olvane.FileError, "no/file.ged: does not exist") as raised:
