@@ -24,7 +24,7 @@
 #include <vector>
 
 #include "CountedMemory.h"
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 
 namespace {
 

@@ -28,7 +28,7 @@
 #include <string>
 #include <vector>
 
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 
 namespace {
 

@@ -200,12 +200,12 @@ KinGraph withOneMore(const KinGraph& graph, int turn, std::uint64_t random, std:
 }
 
 // The share of persons whose row, and whose neighbours to the left and right, stay; rows are counted from the focus's.
-struct Kept {
+struct Stability {
     double row = 0;
     double neighbours = 0;
 };
 
-Kept keptIn(const Picture& before, const Picture& after) {
+Stability stabilityOf(const Picture& before, const Picture& after) {
     const auto neighbours = [](const Picture& picture, std::vector<std::int64_t>& rowOf) {
         std::vector<std::size_t> order(picture.boxes.size());
         std::iota(order.begin(), order.end(), std::size_t{0});
@@ -232,14 +232,14 @@ Kept keptIn(const Picture& before, const Picture& after) {
     std::vector<std::int64_t> rowsAfter;
     const auto rightBefore = neighbours(before, rowsBefore);
     const auto rightAfter = neighbours(after, rowsAfter);
-    Kept kept;
+    Stability stability;
     for (std::size_t i = 0; i < before.boxes.size(); ++i) {
-        kept.row += rowsBefore[i] == rowsAfter[i] ? 1 : 0;
-        kept.neighbours += rightBefore[i] == rightAfter[i] ? 1 : 0;
+        stability.row += rowsBefore[i] == rowsAfter[i] ? 1 : 0;
+        stability.neighbours += rightBefore[i] == rightAfter[i] ? 1 : 0;
     }
-    kept.row /= static_cast<double>(before.boxes.size());
-    kept.neighbours /= static_cast<double>(before.boxes.size());
-    return kept;
+    stability.row /= static_cast<double>(before.boxes.size());
+    stability.neighbours /= static_cast<double>(before.boxes.size());
+    return stability;
 }
 
 // After one more person, N times; from scratch, and with the places of the picture before.
@@ -253,7 +253,7 @@ void measureMoved(const KinGraph& graph, int times, bool keep) {
         double moved = 0;
         double ms = 0;
         double crossings = 0;
-        Kept kept;
+        Stability stability;
         std::uint64_t random = 1;
         for (int i = 0; i < times; ++i) {
             random = random * 6364136223846793005U + 1442695040888963407U;
@@ -263,13 +263,13 @@ void measureMoved(const KinGraph& graph, int times, bool keep) {
             ms += msSince(start) / times;
             moved += olvane::picture::movedShare(before, after) / times;
             crossings += static_cast<double>(olvane::picture::judge(after, &larger).crossings) / times;
-            const Kept once = keptIn(before, after);
-            kept.row += once.row / times;
-            kept.neighbours += once.neighbours / times;
+            const Stability once = stabilityOf(before, after);
+            stability.row += once.row / times;
+            stability.neighbours += once.neighbours / times;
         }
         std::printf("| %s, marks %d | %.1f%% | %.2f%% | %.2f%% | %.0f | %.0f |\n",
-                    keep ? "places kept" : "from scratch", marks, 100 * (1 - moved), 100 * kept.row,
-                    100 * kept.neighbours, crossings, ms);
+                    keep ? "places kept" : "from scratch", marks, 100 * (1 - moved), 100 * stability.row,
+                    100 * stability.neighbours, crossings, ms);
         std::fflush(stdout);
     }
 }

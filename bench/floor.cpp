@@ -13,7 +13,7 @@
 #include <vector>
 
 #include "Floor.h"
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 #include "MadeLayout.h"
 
 namespace {

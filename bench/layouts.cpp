@@ -11,7 +11,7 @@
 #include <string>
 #include <utility>
 
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 #include "MadeLayout.h"
 
 namespace {

@@ -14,7 +14,7 @@
 #include <functional>
 #include <limits>
 
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 #include "MadeLayout.h"
 
 namespace {

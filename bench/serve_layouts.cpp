@@ -11,7 +11,7 @@
 #include <iostream>
 #include <string>
 
-#include "KeptMemory.h"
+#include "FreedMemory.h"
 #include "MadeLayout.h"
 
 namespace {

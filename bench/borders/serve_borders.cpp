@@ -24,7 +24,7 @@
 #include <olvane/boundary/TypedLayout.h>
 #include <olvane/kin/FamilyDataSource.h>
 
-#include "../KeptMemory.h"
+#include "../FreedMemory.h"
 #include "../MadeLayout.h"
 #include "../MadeTable.h"
 

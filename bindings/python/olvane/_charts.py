@@ -127,9 +127,9 @@ def picture(
     chosen.box_size_count = len(boxes)
     if earlier is not None and not isinstance(earlier, Picture):
         raise TypeError(f"earlier is {earlier!r}, and takes a Picture")
-    kept = None if earlier is None else earlier._kept
-    if isinstance(kept, _native_picture.KeptPicture):
-        chosen.earlier = kept.pointer
+    handle = None if earlier is None else earlier._handle
+    if isinstance(handle, _native_picture.PictureHandle):
+        chosen.earlier = handle.pointer
     return _made(source, _number(source, focus), name, chosen)
 
 
@@ -152,13 +152,13 @@ def _made(source: Host | Family | File, focus: int, view: DrawView, chosen: Opti
     def ask(made: Any) -> int:
         with watching_for_strays(answers):
             status: int = _native_picture.of_host(byref(callbacks), focus, byref(chosen), made)
-        _raise_kept(answers, status)
+        _raise_from_host(answers, status)
         return status
 
     return _read(ask, focus, view)
 
 
-def _raise_kept(answers: Answers, status: int) -> None:
+def _raise_from_host(answers: Answers, status: int) -> None:
     """Raises what the host raised, as it is or as the cause of a HostError."""
     raised = answers.take_raised()
     try:
@@ -172,12 +172,12 @@ def _raise_kept(answers: Answers, status: int) -> None:
 
 def _read(make: Callable[[Any], int], focus: int, view: DrawView) -> Picture:
     made = c_void_p()
-    kept = _native_picture.KeptPicture(made)
+    handle = _native_picture.PictureHandle(made)
     status = make(byref(made))
     if status != Status.OK:
         reason = _native_picture.failure_of(made) or message_of(status)
         raise LayoutError(Status(status), f"{view} of person {focus}: {reason}", "", [])
-    return _native_picture.picture_of(made, view, kept)
+    return _native_picture.picture_of(made, view, handle)
 
 
 def _view_name(view: View | DrawView) -> DrawView:

@@ -253,15 +253,15 @@ class Family:
         self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any
     ) -> None:
         """A new family, with the fields of a row of families. Partners and children enter each other's lists."""
-        struct, kept = family_row(number, row), family_children_of(number, children)
-        self._change("add_family", byref(struct), kept, len(kept))
+        struct, members = family_row(number, row), family_children_of(number, children)
+        self._change("add_family", byref(struct), members, len(members))
 
     def set_family(
         self, number: int, *, children: Iterable[int | tuple[int, ChildKind | str]] = (), **row: Any
     ) -> None:
         """In place of the family of that number. Partners whom no family joins any longer are separated."""
-        struct, kept = family_row(number, row), family_children_of(number, children)
-        self._change("set_family", byref(struct), kept, len(kept))
+        struct, members = family_row(number, row), family_children_of(number, children)
+        self._change("set_family", byref(struct), members, len(members))
 
     def remove_family(self, family: int) -> None:
         """Partners whom no other family joins are no longer each other's spouses. Lists of children stay."""

@@ -17,7 +17,7 @@ class Columns:
 
     def __init__(self) -> None:
         self.struct = _table.ColumnsStruct()
-        self._kept: list[object] = []
+        self._buffers: list[object] = []
         self._names: list[tuple[Sequence[Any], int, list[Any]]] = []
         self._fields: list[tuple[Sequence[Any], str, list[Any]]] = []
         self._person_ids: Sequence[Any] = ()
@@ -105,4 +105,4 @@ class Columns:
             else:
                 filled = _table.number_column(label, rows[name], name, choices.get(name))
             setattr(group, name, filled[0])
-            self._kept.append(filled[1])
+            self._buffers.append(filled[1])

@@ -177,10 +177,10 @@ def number_column(
         return NumbersStruct(address or ctypes.addressof(_EMPTY), count, _INT64), values
     number_type = _TYPES[view.format.lstrip("@=<"), view.itemsize]
     if view.readonly or view.nbytes == 0:
-        kept: Any = ctypes.create_string_buffer(view.tobytes(), max(view.nbytes, 1))
+        buffer: Any = ctypes.create_string_buffer(view.tobytes(), max(view.nbytes, 1))
     else:
-        kept = (c_char * view.nbytes).from_buffer(view)
-    return NumbersStruct(ctypes.addressof(kept), view.shape[0] if view.shape else 0, number_type), (kept, view)
+        buffer = (c_char * view.nbytes).from_buffer(view)
+    return NumbersStruct(ctypes.addressof(buffer), view.shape[0] if view.shape else 0, number_type), (buffer, view)
 
 
 _EMPTY = ctypes.create_string_buffer(8)
@@ -220,8 +220,8 @@ def text_column(table: str, column: Sequence[Any], field: str) -> tuple[TextsStr
     if joined.count(b"\0") != count:
         for row, text in enumerate(column):
             encoded(table, text, field, row=row)
-    kept = ctypes.create_string_buffer(joined, max(len(joined), 1))
-    return TextsStruct(None, ctypes.addressof(kept), None, len(joined), count), kept
+    buffer = ctypes.create_string_buffer(joined, max(len(joined), 1))
+    return TextsStruct(None, ctypes.addressof(buffer), None, len(joined), count), buffer
 
 
 def _declare(loaded: ctypes.CDLL) -> None:

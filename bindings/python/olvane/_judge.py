@@ -14,7 +14,7 @@ from olvane._errors import Status
 from olvane._family import Family
 from olvane._file import File
 from olvane._picture import Picture
-from olvane._picture_native import KeptPicture
+from olvane._picture_native import PictureHandle
 
 
 @dataclass(frozen=True, slots=True)
@@ -81,11 +81,11 @@ def judge(picture: Picture, family: Family | File | None = None) -> Judgement:
     family says who is related to whom, by the ids of the picture, for relations that the picture does not express. Raises
     ValueError for a copy of a picture, of which the library keeps nothing.
     """
-    if not isinstance(picture._kept, KeptPicture):
+    if not isinstance(picture._handle, PictureHandle):
         raise ValueError("only a picture that olvane.picture returned can be judged, not a copy of it")
     known = family.family() if isinstance(family, File) else family
     found = _Judgement(struct_size=ctypes.sizeof(_Judgement))
-    status = _judge(picture._kept.pointer, None if known is None else known._pointer, byref(found))
+    status = _judge(picture._handle.pointer, None if known is None else known._pointer, byref(found))
     if status != Status.OK:
         raise MemoryError("a picture could not be judged")
     values: dict[str, Any] = {field.name: getattr(found, field.name) for field in fields(Judgement)}

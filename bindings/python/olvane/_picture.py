@@ -171,7 +171,7 @@ class Picture:
     middle: tuple[float, float] | None = None
     folded: tuple[FoldedBranch, ...] = ()
     # What the library keeps of it, for a later picture's places and for olvane.judge.
-    _kept: object = field(default=None, repr=False, compare=False)
+    _handle: object = field(default=None, repr=False, compare=False)
 
     def svg(self, label: Callable[[int], str] = str) -> Svg:
         """A plain drawing; label gives the text of a person's box, and is the id by default."""

@@ -40,7 +40,7 @@ def _text(text: bytes | None) -> str:
     return (text or b"").decode("utf-8")
 
 
-class KeptPicture:
+class PictureHandle:
     """A picture that the library holds until nobody needs it any more. A copy of a Picture has none."""
 
     __slots__ = ("pointer",)
@@ -59,7 +59,7 @@ def _nothing() -> None:
     return None
 
 
-def picture_of(made: c_void_p, view: str, kept: KeptPicture | None = None) -> Picture:
+def picture_of(made: c_void_p, view: str, handle: PictureHandle | None = None) -> Picture:
     """All of a picture that the library holds."""
     arrays = ArraysStruct(struct_size=ctypes.sizeof(ArraysStruct))
     status = _read(made, byref(arrays))
@@ -79,7 +79,7 @@ def picture_of(made: c_void_p, view: str, kept: KeptPicture | None = None) -> Pi
         rings=tuple(arrays.ring_radii[i] for i in range(arrays.ring_radius_count)),
         middle=(arrays.middle_x, arrays.middle_y) if is_round else None,
         folded=tuple(_folded(arrays.folded[i]) for i in range(arrays.folded_count)),
-        _kept=kept,
+        _handle=handle,
     )
 
 

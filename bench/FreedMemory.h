@@ -9,8 +9,8 @@
 
 namespace bench {
 
-// Has this program keep what it frees, as Node does for the peers. glibc would give the end of the heap back to the
-// system after a layout and take it again, page by page, in the next.
+// Has this program keep what it frees, as Node does for the peers. glibc would return the end of the heap to the system
+// after a layout and request it again, page by page, in the next.
 inline void keepFreedMemory() {
 #if defined(__GLIBC__)
     constexpr int kMoreThanAnyLayout = 1 << 30;  // bytes
