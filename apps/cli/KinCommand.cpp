@@ -7,8 +7,8 @@
 
 #include <cstdlib>
 
+#include <olvane/kin/KinJson.h>
 #include <olvane/kin/Kinship.h>
-#include <olvane/kin/KinshipJson.h>
 #include <olvane/kin/KinshipText.h>
 #include <olvane/source/GedcomKin.h>
 

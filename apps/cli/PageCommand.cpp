@@ -14,8 +14,8 @@
 #include <olvane/charts/MapIndex.h>
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/gedcom/GedcomWriter.h>
-#include <olvane/source/GedcomCaptions.h>
 #include <olvane/source/GedcomKin.h>
+#include <olvane/source/GedcomLabels.h>
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>

@@ -18,9 +18,8 @@
 
 #include <olvane/gedcom/GedcomReader.h>
 #include <olvane/kin/DataCheck.h>
+#include <olvane/kin/KinJson.h>
 #include <olvane/kin/Kinship.h>
-#include <olvane/kin/KinshipJson.h>
-#include <olvane/kin/RemarkJson.h>
 #include <olvane/source/GedcomDataSource.h>
 #include <olvane/source/GedcomFamily.h>
 #include <olvane/source/GedcomKin.h>

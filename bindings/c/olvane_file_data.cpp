@@ -7,7 +7,7 @@
 
 #include <chrono>
 
-#include <olvane/kin/KinshipJson.h>
+#include <olvane/kin/KinJson.h>
 #include <olvane/kin/Lives.h>
 #include <olvane/source/GedcomKin.h>
 #include <olvane/source/GedcomLives.h>

@@ -9,7 +9,7 @@
 #include <string>
 
 #include <olvane/charts/MapIndex.h>
-#include <olvane/source/GedcomCaptions.h>
+#include <olvane/source/GedcomLabels.h>
 
 #include "OpenFile.h"
 

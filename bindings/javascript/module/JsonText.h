@@ -5,6 +5,9 @@
 
 #include <string>
 #include <string_view>
+#include <utility>
+
+#include <olvane/kin/KinJson.h>
 
 namespace olvane::js {
 
@@ -26,7 +29,10 @@ public:
         separate();
         text_ += std::to_string(value);
     }
-    void string(std::string_view value);
+    void string(std::string_view value) {
+        separate();
+        kin::appendJsonText(text_, value);
+    }
 
     std::string take() && { return std::move(text_); }
 

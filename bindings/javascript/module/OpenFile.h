@@ -23,7 +23,7 @@
 namespace olvane::js {
 
 // A chart of everybody whose places a later one may keep.
-struct KeptChart {
+struct EarlierChart {
     picture::Picture picture;
     charts::Direction direction = charts::Direction::down;
     bool mirrored = false;
@@ -67,7 +67,7 @@ struct OpenFile {
     gedcom::ParentChoice chosenParents;
     std::optional<kin::KinshipFinder> kinshipFinder;
     kin::PersonIndex personIndex;  // of those who were added so far
-    std::optional<KeptChart> everybody;
+    std::optional<EarlierChart> everybody;
 };
 
 // Two hundred times what charts of real families ask for; a browser takes some seconds and 300 MB for this many.

@@ -115,12 +115,12 @@ picture::Picture pictureOf(OpenFile& file, const PictureRequest& asked) {
     gedcom::GedcomDataSource source(file.data, asked.parents);
     const auto limited = std::make_shared<gedcom::LimitedDataSource>(source, kMostRelatives);
     charts::ViewRequest view = viewOf(asked);
-    std::optional<KeptChart>& kept = file.everybody;
-    if (asked.keepsPlaces && kept && kept->direction == view.chart.direction &&
-        kept->mirrored == view.chart.mirrored)
-        view.chart.earlier = &kept->picture;
+    std::optional<EarlierChart>& earlier = file.everybody;
+    if (asked.keepsPlaces && earlier && earlier->direction == view.chart.direction &&
+        earlier->mirrored == view.chart.mirrored)
+        view.chart.earlier = &earlier->picture;
     picture::Picture picture = charts::pictureOf(limited, file.kin(asked.parents), view);
-    if (asked.keepsPlaces) kept = KeptChart{picture, view.chart.direction, view.chart.mirrored};
+    if (asked.keepsPlaces) earlier = EarlierChart{picture, view.chart.direction, view.chart.mirrored};
     return picture;
 }
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/kin/KinshipJson.h>
+#include <olvane/kin/KinJson.h>
 
 #include <array>
 #include <cstdio>

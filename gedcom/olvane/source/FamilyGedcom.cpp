@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/source/FamilyGedcom.h>
+#include <olvane/source/GedcomFamily.h>
 
 #include <algorithm>
 #include <array>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-#include <olvane/source/GedcomCaptions.h>
+#include <olvane/source/GedcomLabels.h>
 
 #include <cstddef>
 #include <string>

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include <olvane/gedcom/GedcomData.h>
+#include <olvane/kin/PersonCaption.h>
 #include <olvane/kin/PersonLabel.h>
 
 namespace olvane::gedcom {
@@ -65,5 +66,11 @@ private:
     ShownFacts shown_;
     HiddenTexts hidden_;
 };
+
+// What the map of a population says of each person of a file, by place: the first name, and the years of birth and death.
+//
+// Holds: names longer than kMostCaptionBytes are cut, in whole characters.
+constexpr std::size_t kMostCaptionBytes = 200;
+std::vector<kin::PersonCaption> captionsOf(const GedcomData& data);
 
 }  // namespace olvane::gedcom

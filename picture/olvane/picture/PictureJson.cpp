@@ -10,12 +10,14 @@
 #include <cstdint>
 #include <string_view>
 
-#include <olvane/kin/RemarkJson.h>
+#include <olvane/kin/KinJson.h>
 #include <olvane/picture/PictureNames.h>
 
 namespace olvane::picture {
 
 namespace {
+
+using kin::jsonText;
 
 // Points in thousandths. A cell in ring 25 may have a hundred-thousandth of a degree, so angles have more decimals.
 constexpr std::int64_t kPartsOfPoint = 1000;
@@ -37,10 +39,6 @@ std::string numberIn(double value, std::int64_t partsOfOne) {
 
 std::string number(double value) {
     return numberIn(value, kPartsOfPoint);
-}
-
-std::string quoted(std::string_view text) {
-    return kin::jsonText(text);
 }
 
 template <class Values, class Text>
@@ -73,7 +71,7 @@ public:
     void write() {
         const std::int64_t focus =
             picture_.focus == kNone ? 0 : picture_.boxes[static_cast<std::size_t>(picture_.focus)].id;
-        json_ = "{\n \"format\": 2,\n \"view\": " + quoted(picture_.view) +
+        json_ = "{\n \"format\": 2,\n \"view\": " + jsonText(picture_.view) +
                 ",\n \"focus\": " + std::to_string(focus) + ",\n";
         if (picture_.isRound()) {
             json_ += " \"rings\": " + listOf(picture_.ringRadii, number) +
@@ -94,8 +92,8 @@ public:
         if (picture_.other != kNone) {
             json_ += ",\n \"other\": " +
                      std::to_string(picture_.boxes[static_cast<std::size_t>(picture_.other)].id) +
-                     ",\n \"focusIs\": " + quoted(picture_.focusIs) +
-                     ",\n \"otherIs\": " + quoted(picture_.otherIs) + ",\n";
+                     ",\n \"focusIs\": " + jsonText(picture_.focusIs) +
+                     ",\n \"otherIs\": " + jsonText(picture_.otherIs) + ",\n";
             addList("ways", picture_.ways.size(),
                     [this](std::size_t i) { json_ += wayJson(picture_.ways[i]); });
         }
@@ -106,7 +104,7 @@ public:
 private:
     template <class Entry>
     void addList(std::string_view name, std::size_t count, Entry addEntry) {
-        json_ += " " + quoted(name) + ": [";
+        json_ += " " + jsonText(name) + ": [";
         for (std::size_t i = 0; i < count; ++i) {
             json_ += i == 0 ? "\n  " : ",\n  ";
             addEntry(i);
@@ -149,7 +147,7 @@ private:
 
     std::string placeOfBox(std::size_t i) const {
         const Box& box = picture_.boxes[i];
-        std::string json = "{\"id\": " + std::to_string(box.id) + ", \"kind\": " + quoted(nameOf(box.kind));
+        std::string json = "{\"id\": " + std::to_string(box.id) + ", \"kind\": " + jsonText(nameOf(box.kind));
         if (picture_.isRound()) {
             const Arc& arc = picture_.arcs[i];
             json += ", \"ring\": " + std::to_string(arc.ring) + angle("from", arc.from) + angle("to", arc.to);
@@ -159,7 +157,7 @@ private:
                     field("height", static_cast<double>(box.height));
         }
         if (box.kind == BoxKind::unknownParent) {
-            json += ", \"sex\": " + quoted(nameOf(box.sex));
+            json += ", \"sex\": " + jsonText(nameOf(box.sex));
             if (box.childOf != kNone) json += ", \"childOf\": " + std::to_string(box.childOf);
         }
         return json;
@@ -180,8 +178,8 @@ private:
         if (family.number != 0) json += knownFamilyFields(family.number);
         json += "\"parents\": " + placesJson(picture_.parents(family)) +
                 ", \"children\": " + placesJson(picture_.children(family)) + ", \"childKinds\": " +
-                listOf(picture_.kinds(family), [](kin::ChildKind kind) { return quoted(nameOf(kind)); }) +
-                ", \"style\": " + quoted(nameOf(family.style)) + ",\n   \"lines\": [";
+                listOf(picture_.kinds(family), [](kin::ChildKind kind) { return jsonText(nameOf(kind)); }) +
+                ", \"style\": " + jsonText(nameOf(family.style)) + ",\n   \"lines\": [";
         std::string_view separator = "\n    ";
         for (const Line& line : picture_.linesOf(family)) {
             json.append(separator).append(lineJson(line));
@@ -193,24 +191,24 @@ private:
     std::string knownFamilyFields(std::uint32_t familyNumber) const {
         std::string json = "\"number\": " + std::to_string(familyNumber) + ", ";
         const std::string xref = facts_.familyXref ? facts_.familyXref(familyNumber) : std::string();
-        if (!xref.empty()) json += "\"xref\": " + quoted(xref) + ", ";
+        if (!xref.empty()) json += "\"xref\": " + jsonText(xref) + ", ";
         const std::string label = facts_.familyLabel ? facts_.familyLabel(familyNumber) : std::string();
-        if (!label.empty()) json += "\"label\": " + quoted(label) + ", ";
+        if (!label.empty()) json += "\"label\": " + jsonText(label) + ", ";
         return json;
     }
 
     std::string lineJson(const Line& line) const {
-        return "{\"role\": " + quoted(nameOf(line.role)) + field("x1", line.x1) + field("y1", line.y1) +
+        return "{\"role\": " + jsonText(nameOf(line.role)) + field("x1", line.x1) + field("y1", line.y1) +
                field("x2", line.x2) + field("y2", line.y2) +
                ", \"child\": " + (line.child == kNone ? "null" : std::to_string(line.child)) +
                ", \"bridges\": " + listOf(picture_.bridgesOf(line), number) + "}";
     }
 
     std::string wayJson(const Way& way) const {
-        return "{\"kind\": " + quoted(nameOf(way.kind)) +
+        return "{\"kind\": " + jsonText(nameOf(way.kind)) +
                ", \"boxes\": " + placesJson(picture_.boxesOf(way)) +
                ", \"ancestors\": " + placesJson(picture_.ancestorsOf(way)) +
-               ", \"words\": " + quoted(way.words) + ", \"lines\": " +
+               ", \"words\": " + jsonText(way.words) + ", \"lines\": " +
                listOf(picture_.piecesOf(way),
                       [](const WayPiece& piece) {
                           return listOf(std::array{piece.x1, piece.y1, piece.x2, piece.y2}, number);
@@ -219,9 +217,10 @@ private:
     }
 
     static std::string foldedJson(const FoldedBranch& folded) {
-        return "{\"box\": " + std::to_string(folded.box) + ", \"branch\": " + quoted(nameOf(folded.branch)) +
-               ", \"side\": " + quoted(nameOf(folded.side)) + ", \"count\": " + std::to_string(folded.count) +
-               "}";
+        return "{\"box\": " + std::to_string(folded.box) +
+               ", \"branch\": " + jsonText(nameOf(folded.branch)) +
+               ", \"side\": " + jsonText(nameOf(folded.side)) +
+               ", \"count\": " + std::to_string(folded.count) + "}";
     }
 
     static std::string markJson(const Mark& mark) {
@@ -229,7 +228,7 @@ private:
         for (const Index box : mark.boxes) {
             if (box != kNone) boxes += (boxes.empty() ? "" : ", ") + std::to_string(box);
         }
-        return "{\"kind\": " + quoted(nameOf(mark.kind)) + ", \"boxes\": [" + boxes +
+        return "{\"kind\": " + jsonText(nameOf(mark.kind)) + ", \"boxes\": [" + boxes +
                "], \"number\": " + std::to_string(mark.number) + "}";
     }
 

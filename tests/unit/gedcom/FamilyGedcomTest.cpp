@@ -14,7 +14,6 @@
 #include <gtest/gtest.h>
 
 #include <olvane/gedcom/GedcomReader.h>
-#include <olvane/source/FamilyGedcom.h>
 #include <olvane/source/GedcomFamily.h>
 #include <olvane/source/GedcomKin.h>
 

@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include <olvane/kin/KinshipJson.h>
+#include <olvane/kin/KinJson.h>
 #include <olvane/kin/words/KinshipWordsInternal.h>
 
 #include "KinFamily.h"

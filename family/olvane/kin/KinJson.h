@@ -4,8 +4,11 @@
 #pragma once
 
 #include <string>
+#include <string_view>
+#include <vector>
 
 #include <olvane/Export.h>
+#include <olvane/kin/DataCheck.h>
 #include <olvane/kin/Kinship.h>
 
 namespace olvane::kin {
@@ -20,5 +23,18 @@ namespace olvane::kin {
 // Numbers that nobody can say are null; behind them, "reason" is "loop" where somebody among the ancestors is their
 // own ancestor. Units: phi is written with as few digits as give the same number back.
 OLVANE_API std::string kinshipJson(const KinGraph& graph, const Kinship& kinship);
+
+// Remarks as a JSON array, one on each line, with persons by their ids, families by their numbers, and words in English:
+//
+//   [
+//   {"kind": "diedBeforeBirth", "person": 17, "family": null, "text": "Ada Berg died before being born"}]
+OLVANE_API std::string remarksJson(const KinGraph& graph, const std::vector<Remark>& remarks,
+                                   const RemarkNames& names);
+
+// A string of JSON with its quotes. The text is UTF-8.
+OLVANE_API std::string jsonText(std::string_view text);
+
+// The same, behind what is there.
+OLVANE_API void appendJsonText(std::string& json, std::string_view text);
 
 }  // namespace olvane::kin
