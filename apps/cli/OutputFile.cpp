@@ -17,6 +17,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <cli/JoinedTexts.h>
 #include <cli/TemporaryFile.h>
 #include <cli/TerminalText.h>
 #include <cli/UsageError.h>
@@ -73,12 +74,6 @@ bool hasEnding(const fs::path& path, const std::vector<std::string>& endings) {
     });
 }
 
-std::string joined(const std::vector<std::string>& endings) {
-    std::string text;
-    for (const std::string& ending : endings) text += (text.empty() ? "" : " or ") + ending;
-    return text;
-}
-
 void checkRegularFile(const std::string& path, const OutputRules& rules) {
     if (rules.inputs.hasPath(path)) {
         throw UsageError(path + ": is the input file, which is never written to; name another file");
@@ -86,7 +81,7 @@ void checkRegularFile(const std::string& path, const OutputRules& rules) {
     const fs::path place = withoutLinks(path);
     if (!hasEnding(path, rules.endings) || !hasEnding(place, rules.endings)) {
         throw UsageError(path + ": is there already and is not replaced, since its name does not end in " +
-                         joined(rules.endings) + "; name another file");
+                         joined(rules.endings, " or ") + "; name another file");
     }
     if (::faccessat(AT_FDCWD, place.c_str(), W_OK, AT_EACCESS) != 0) refuse(path, errno);
 }

@@ -7,6 +7,7 @@
 
 #include <cli/FileReading.h>
 #include <cli/FocusChoice.h>
+#include <cli/JoinedTexts.h>
 #include <cli/Messages.h>
 #include <cli/OutputFile.h>
 #include <cli/PeopleList.h>
@@ -15,12 +16,6 @@
 namespace olvane::cli {
 
 namespace {
-
-std::string joined(const std::vector<std::string>& words) {
-    std::string text;
-    for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
-    return text;
-}
 
 std::vector<gedcom::PersonId> everybody(const gedcom::GedcomData& data) {
     std::vector<gedcom::PersonId> all(data.personCount());
@@ -38,7 +33,7 @@ void writePeople(const gedcom::GedcomData& data, const std::vector<gedcom::Perso
 }  // namespace
 
 int runPeople(const PeopleOptions& options) {
-    const std::string words = joined(options.words);
+    const std::string words = joined(options.words, " ");
     const bool needsFacts = options.format != ListFormat::text || !words.empty();
     const gedcom::GedcomData data = needsFacts ? readFileWithFacts(options.input) : readFile(options.input);
     const auto persons = words.empty() ? everybody(data) : gedcom::PersonFinder(data).find(words);

@@ -8,17 +8,12 @@
 #include <olvane/source/GedcomCheck.h>
 
 #include <cli/FocusChoice.h>
+#include <cli/JoinedTexts.h>
 #include <cli/TableCells.h>
 
 namespace olvane::cli {
 
 namespace {
-
-std::string joined(const std::vector<std::string>& words) {
-    std::string text;
-    for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
-    return text;
-}
 
 std::string lineText(const Remark& remark) {
     return remark.line == 0 ? std::string() : std::to_string(remark.line);
@@ -47,8 +42,8 @@ std::string remarksText(const gedcom::GedcomData& data, const std::vector<Remark
 std::string remarksTable(const gedcom::GedcomData& data, const std::vector<Remark>& remarks) {
     std::string text = "kind\tseverity\tfile\tline\txrefs\ttext\n";
     for (const Remark& remark : remarks) {
-        text += tableLine(
-            {remark.kind, remark.severity, data.file(), lineText(remark), joined(remark.xrefs), remark.text});
+        text += tableLine({remark.kind, remark.severity, data.file(), lineText(remark),
+                           joined(remark.xrefs, " "), remark.text});
     }
     return text;
 }

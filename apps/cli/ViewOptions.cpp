@@ -15,6 +15,7 @@
 #include <CLI/CLI.hpp>
 
 #include <cli/FamilySwitches.h>
+#include <cli/JoinedTexts.h>
 #include <cli/OptionChecks.h>
 #include <olvane/charts/ViewOption.h>
 
@@ -31,12 +32,6 @@ CLI::Option* addSwitchOff(CLI::App& command, const std::string& name, bool& isOn
         name, [&isOn] { isOn = false; }, help);
 }
 
-std::string joined(std::span<const std::string_view> words) {
-    std::string text;
-    for (const std::string_view word : words) text.append(text.empty() ? "" : "|").append(word);
-    return text;
-}
-
 CLI::Option* addWord(CLI::App& command, const char* name, const charts::ViewOption& option,
                      charts::ViewRequest& request, const std::string& help) {
     const auto words = option.form.words;
@@ -46,7 +41,7 @@ CLI::Option* addWord(CLI::App& command, const char* name, const charts::ViewOpti
     };
     return command.add_option_function<std::string>(name, set, help)
         ->check(word({words.begin(), words.end()}))
-        ->type_name(joined(words));
+        ->type_name(joined(words, "|"));
 }
 
 // An option of the table under the command's own name. A switch changes what is usual.
