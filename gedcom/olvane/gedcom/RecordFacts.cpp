@@ -53,7 +53,7 @@ void RecordReader::beginFact(const GedcomLine& line, std::uint64_t tag) {
     Fact fact;
     fact.tag = name;
     fact.line = line.number;
-    if (trimmed(line.value) != "Y") fact.value = keptValue(line);
+    if (trimmed(line.value) != "Y") fact.value = storedValue(line);
     valueFromType_ = fact.value.empty();
     tables_.facts.push_back(fact);
     ++factsInHand().count;
@@ -63,10 +63,10 @@ void RecordReader::beginFact(const GedcomLine& line, std::uint64_t tag) {
 // that its trouble is reported once.
 void RecordReader::readFactDetail(const GedcomLine& line, std::uint64_t tag) {
     Fact& fact = tables_.facts.back();
-    if (tag == kPlace && fact.place.empty()) fact.place = keptValue(line);
-    if (tag == kType && valueFromType_ && fact.value.empty()) fact.value = keptValue(line);
+    if (tag == kPlace && fact.place.empty()) fact.place = storedValue(line);
+    if (tag == kType && valueFromType_ && fact.value.empty()) fact.value = storedValue(line);
     if (tag != kDate || fact.date.isGiven()) return;
-    fact.date = lastDate_.line == line.number ? lastDate_ : parseGedcomDate(keptValue(line));
+    fact.date = lastDate_.line == line.number ? lastDate_ : parseGedcomDate(storedValue(line));
     fact.date.line = line.number;
 }
 
@@ -77,7 +77,7 @@ Slice& RecordReader::factsInHand() {
 // Of several dates the first stands.
 void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
     if (date.isGiven()) return;
-    const std::string_view value = keptValue(line);
+    const std::string_view value = storedValue(line);
     if (value.empty()) {
         openDate_ = &date;
         return;
@@ -96,7 +96,7 @@ void RecordReader::readDate(const GedcomLine& line, GedcomDate& date) {
 
 // A phrase that is a date is as good as one.
 void RecordReader::readDatePhrase(const GedcomLine& line) {
-    *openDate_ = parseGedcomDate(keptValue(line));
+    *openDate_ = parseGedcomDate(storedValue(line));
     openDate_->line = line.number;
     if (factOpen_ && !tables_.facts.back().date.isGiven()) tables_.facts.back().date = *openDate_;
     openDate_ = nullptr;

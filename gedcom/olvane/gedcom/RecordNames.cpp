@@ -51,7 +51,7 @@ void fillFromSlashes(PersonName& name) {
 void RecordReader::beginName(const GedcomLine& line) {
     name_ = {};
     nameOpen_ = true;
-    name_.written = keptValue(line);
+    name_.written = storedValue(line);
 }
 
 void RecordReader::readNamePiece(const GedcomLine& line, std::uint64_t tag) {
@@ -69,7 +69,7 @@ void RecordReader::readNamePiece(const GedcomLine& line, std::uint64_t tag) {
         case kNickname:
             return addPiece(name_.nickname, line, ", ");
         case kType:
-            if (name_.type.empty()) name_.type = keptValue(line);
+            if (name_.type.empty()) name_.type = storedValue(line);
             return;
         case kMarriedName:
         case kMarriedNameInFull:
@@ -83,12 +83,12 @@ void RecordReader::readNamePiece(const GedcomLine& line, std::uint64_t tag) {
 }
 
 void RecordReader::addFurtherName(const GedcomLine& line, std::string_view type) {
-    const std::string_view value = keptValue(line);
+    const std::string_view value = storedValue(line);
     if (!value.empty()) furtherNames_.push_back({value, type});
 }
 
 void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator) {
-    const std::string_view more = keptValue(line);
+    const std::string_view more = storedValue(line);
     if (more.empty()) return;
     if (piece.first.empty()) {
         piece.first = more;
@@ -99,7 +99,7 @@ void RecordReader::addPiece(PieceDraft& piece, const GedcomLine& line, std::stri
     piece.joined += more;
 }
 
-std::string_view RecordReader::keptPiece(const PieceDraft& piece) {
+std::string_view RecordReader::storedPiece(const PieceDraft& piece) {
     return piece.joined.empty() ? piece.first : interner_.keepMade(piece.joined);
 }
 
@@ -108,16 +108,16 @@ void RecordReader::endName() {
     nameOpen_ = false;
     if (!name_.surname.first.empty() && !name_.surnamePrefix.first.empty()) {
         PieceDraft whole = name_.surnamePrefix;
-        whole.joined = std::string(keptPiece(whole)) + " " + std::string(keptPiece(name_.surname));
+        whole.joined = std::string(storedPiece(whole)) + " " + std::string(storedPiece(name_.surname));
         name_.surname = whole;
     }
     PersonName name;
     name.written = name_.written;
-    name.prefix = keptPiece(name_.prefix);
-    name.given = keptPiece(name_.given);
-    name.surname = keptPiece(name_.surname);
-    name.suffix = keptPiece(name_.suffix);
-    name.nickname = keptPiece(name_.nickname);
+    name.prefix = storedPiece(name_.prefix);
+    name.given = storedPiece(name_.given);
+    name.surname = storedPiece(name_.surname);
+    name.suffix = storedPiece(name_.suffix);
+    name.nickname = storedPiece(name_.nickname);
     name.type = name_.type;
     fillFromSlashes(name);
     appendWithGrowthEstimate(tables_.names, name, scanner_.share());

@@ -112,7 +112,7 @@ private:
     void readNamePiece(const GedcomLine& line, std::uint64_t tag);
     void addFurtherName(const GedcomLine& line, std::string_view type);
     void addPiece(PieceDraft& piece, const GedcomLine& line, std::string_view separator);
-    std::string_view keptPiece(const PieceDraft& piece);
+    std::string_view storedPiece(const PieceDraft& piece);
     void endName();
     void addFurtherNames(std::string_view given);
 
@@ -127,7 +127,7 @@ private:
 
     // Before 7.0, the value N negates the event.
     static bool didNotHappen(const GedcomLine& line) { return trimmed(line.value) == "N"; }
-    std::string_view keptValue(const GedcomLine& line) {
+    std::string_view storedValue(const GedcomLine& line) {
         return interner_.keep(scanner_.wholeValue(line), line.number);
     }
     Person& person() { return tables_.persons.back(); }
