@@ -15,8 +15,10 @@ import {
     laterSideFrom,
     paperNumbers,
     partText,
+    photoText,
     pictureNumbers,
     usualBoxesFrom,
+    withPhotos,
 } from "./pictureOptions.mjs";
 import { openFile } from "./reading.mjs";
 import { diagnosticFrom, remarkFrom } from "./remarks.mjs";
@@ -190,31 +192,35 @@ export class GedcomFile {
         const { exports } = this.#instance;
         const file = this.#opened();
         const { part, ...whole } = drawing;
-        const { theme, boxes, facts, title } = drawingNumbers(whole);
+        const { theme, boxes, facts, title, photos } = drawingNumbers(whole);
         const places = partText(part);
         this.#setPictureOptions(focus, options);
         const pointer = this.#instance.withText(title, (text) =>
-            this.#instance.withText(places, (shown) =>
-                exports.gedcom_svg(file, focus, theme, boxes, facts, text, shown),
+            this.#instance.withText(photoText(photos), (persons) =>
+                this.#instance.withText(places, (shown) =>
+                    exports.gedcom_svg(file, focus, theme, boxes, facts, text, persons, shown),
+                ),
             ),
         );
         if (pointer === 0) this.#refuse();
-        return this.#instance.text(pointer);
+        return withPhotos(this.#instance.text(pointer), photos);
     }
 
     sheets(focus, options = {}, drawing = {}, onPaper = {}) {
         const { exports } = this.#instance;
         const file = this.#opened();
-        const { theme, boxes, facts, title } = drawingNumbers(drawing);
+        const { theme, boxes, facts, title, photos } = drawingNumbers(drawing);
         const { paper, rows, columns, scale } = paperNumbers(onPaper);
         this.#setPictureOptions(focus, options);
         const pointer = this.#instance.withText(title, (text) =>
-            this.#instance.withText(paper, (name) =>
-                exports.gedcom_sheets(file, focus, theme, boxes, facts, text, name, rows, columns, scale),
+            this.#instance.withText(photoText(photos), (persons) =>
+                this.#instance.withText(paper, (name) =>
+                    exports.gedcom_sheets(file, focus, theme, boxes, facts, text, persons, name, rows, columns, scale),
+                ),
             ),
         );
         if (pointer === 0) this.#refuse();
-        return sheetsFrom(JSON.parse(this.#instance.text(pointer)));
+        return sheetsFrom(JSON.parse(this.#instance.text(pointer)), (svg) => withPhotos(svg, photos));
     }
 
     #setPictureOptions(focus, options) {

@@ -50,8 +50,8 @@ export function detailedNameFrom([text, type, nickname, details]) {
     return { text, type, nickname, details: detailsFrom(details) };
 }
 
-/** Lengths and sizes come in thousandths. */
-export function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes, sheets]) {
+/** Lengths and sizes come in thousandths; finished makes of the SVG of a sheet what is handed out. */
+export function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes, sheets], finished) {
     return {
         width: width / 1000,
         height: height / 1000,
@@ -59,6 +59,6 @@ export function sheetsFrom([width, height, scale, smallestName, smallestText, cu
         smallestName: smallestName / 1000,
         smallestText: smallestText / 1000,
         cutBoxes,
-        sheets: sheets.map(([row, column, svg]) => ({ row, column, svg })),
+        sheets: sheets.map(([row, column, svg]) => ({ row, column, svg: finished(svg) })),
     };
 }

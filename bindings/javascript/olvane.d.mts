@@ -272,6 +272,11 @@ export interface DrawingOptions {
     readonly show?: Iterable<ShownFact> | undefined;
     /** Stands above the picture. Empty for none: the picture is then called after its view and focus. */
     readonly title?: string | undefined;
+    /**
+     * Photographs in boxes, by the number of the person: addresses of images. A file that is to be seen elsewhere holds them as
+     * data. Names have their usual size then, on paper too.
+     */
+    readonly photos?: Iterable<readonly [number, string]> | undefined;
     /** Of `svg` alone: boxes by their index; the drawing ends around them. All of the picture if not given. */
     readonly part?: Iterable<number> | undefined;
 }

@@ -104,15 +104,32 @@ export function laterSideFrom({ exports }, view, direction, mirrored) {
 }
 
 /** What a caller asks of a drawing, as the module's numbers. */
-export function drawingNumbers({ theme = "light", boxes = "usual", show = [], title = "", ...rest }) {
+export function drawingNumbers({ theme = "light", boxes = "usual", show = [], title = "", photos = [], ...rest }) {
     const unknown = Object.keys(rest)[0];
-    if (unknown !== undefined) throw new TypeError(`there is no option ${unknown}, but theme, boxes, show, title`);
+    if (unknown !== undefined)
+        throw new TypeError(`there is no option ${unknown}, but theme, boxes, show, title, photos`);
     return {
         theme: wordNumber("theme", theme, THEMES),
         boxes: wordNumber("boxes", boxes, BOXES),
         facts: factBits(show),
         title: String(title),
+        photos: new Map(photos),
     };
+}
+
+/** The persons with a photograph, as the module reads them. */
+export function photoText(photos) {
+    return [...photos.keys()].map((id) => plainNumber("photos", id, { least: 1, most: MOST })).join(" ");
+}
+
+/** A drawing with the addresses of its photographs, which the module knows by number alone. */
+export function withPhotos(svg, photos) {
+    if (photos.size === 0) return svg;
+    return svg.replace(/ href="photo:(\d+)"/g, (_, id) => ` href="${escapedValue(String(photos.get(Number(id))))}"`);
+}
+
+function escapedValue(text) {
+    return text.replaceAll("&", "&amp;").replaceAll('"', "&quot;").replaceAll("<", "&lt;");
 }
 
 /** Boxes by their index, as the module reads them; empty for all of the picture. */

@@ -129,6 +129,23 @@ describe("what the module draws", () => {
         file.close();
     });
 
+    test("has photographs of persons by their addresses, whole and on paper", async () => {
+        const file = await fileOf(kSample);
+        const photos = new Map([
+            [1, 'data:image/png;base64,AA"&<'],
+            [99999, "nobody.png"],
+        ]);
+        const image = '<image href="data:image/png;base64,AA&quot;&amp;&lt;" ';
+        const svg = file.svg(1, {}, { photos });
+        assert.equal(svg.split("<image ").length, 2);
+        assert.ok(svg.includes(image));
+        assert.ok(!file.svg(1).includes("<image "));
+        const { sheets } = file.sheets(1, {}, { photos }, { paper: "A4" });
+        assert.ok(sheets[0].svg.includes(image));
+        assert.throws(() => file.svg(1, {}, { photos: [["I1", "a.png"]] }), /photos is "I1"/);
+        file.close();
+    });
+
     test("is refused by the name of a wrong option, and for nobody", async () => {
         const file = await fileOf(kSample);
         assert.throws(() => file.svg(1, {}, { theme: "blue" }), /theme is "blue", and takes one of light, dark, print/);

@@ -4,10 +4,12 @@
 // A picture of an open GEDCOM file as SVG, whole or on sheets of paper, the same bytes that the command draws, and what
 // its boxes and lines say.
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
 #include <cstddef>
+#include <cstdint>
 #include <exception>
 #include <stdexcept>
 #include <string>
@@ -47,7 +49,33 @@ const draw::DrawingTheme& themeOf(int number) {
     return *themes.at(static_cast<std::size_t>(number));
 }
 
-draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, unsigned facts) {
+// "3 4 7"
+std::vector<std::int32_t> numbersIn(std::string_view text) {
+    std::vector<std::int32_t> numbers;
+    while (!text.empty()) {
+        std::int32_t value = 0;
+        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+        if (error != std::errc()) throw std::invalid_argument("no list of numbers");
+        numbers.push_back(value);
+        text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+        if (!text.empty()) text.remove_prefix(1);
+    }
+    return numbers;
+}
+
+// photos lists the persons with a photograph, whose addresses are "photo:" and the number: JavaScript has the real ones.
+void addPhotos(draw::DrawingContent& content, std::string_view photos) {
+    if (photos.empty()) return;
+    std::vector<std::int32_t> persons = numbersIn(photos);
+    std::sort(persons.begin(), persons.end());
+    content.photoOf = [persons = std::move(persons)](std::int64_t id) {
+        const bool has = std::binary_search(persons.begin(), persons.end(), id);
+        return has ? "photo:" + std::to_string(id) : std::string();
+    };
+}
+
+draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, unsigned facts,
+                               const char* photos) {
     gedcom::GedcomLabels labels(file.data, factsOf(facts));
     draw::DrawingContent content;
     content.picture = pictureOf(file, request);
@@ -55,6 +83,7 @@ draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, un
     content.familyLabelOf = [labels](std::uint32_t number) { return labels.ofFamily(number); };
     content.countsHidden = true;
     content.laterSide = charts::laterSideOf(request.view.chart);
+    addPhotos(content, photos);
     return content;
 }
 
@@ -106,20 +135,6 @@ draw::DrawingOptions drawingOf(const PictureRequest& request, const draw::Drawin
     return options;
 }
 
-// "3 4 7"
-std::vector<picture::Index> placesIn(std::string_view text) {
-    std::vector<picture::Index> places;
-    while (!text.empty()) {
-        picture::Index place = 0;
-        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), place);
-        if (error != std::errc()) throw std::invalid_argument("a part that is no list of boxes");
-        places.push_back(place);
-        text.remove_prefix(static_cast<std::size_t>(end - text.data()));
-        if (!text.empty()) text.remove_prefix(1);
-    }
-    return places;
-}
-
 // Lengths and sizes are in thousandths, as JavaScript divides them.
 std::string sheetsJson(const draw::PaperDrawing& drawn) {
     const draw::SheetPlan& plan = drawn.drawing.plan;
@@ -168,18 +183,18 @@ OLVANE_EXPORT("usual_boxes") int usualBoxes(int view, int direction) {
     return static_cast<int>(form == charts::BoxForm::tall ? js::Boxes::tall : js::Boxes::wide);
 }
 
-// With the picture's options, sizes apart; boxes is one of Boxes. Where part names boxes
-// by their places, "3 4 7", the picture ends around them.
+// With the picture's options, sizes apart; boxes is one of Boxes. photos lists the persons with a photograph, "3 4 7".
+// Where part lists boxes by their places, the picture ends around them.
 // Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_svg")
 const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
-                      const char* title, const char* part) {
+                      const char* title, const char* photos, const char* part) {
     try {
         const js::PictureRequest request = js::requestInOnePiece(focus - 1, static_cast<js::Boxes>(boxes));
-        const draw::DrawingContent content = js::contentOf(*file, request, facts);
+        const draw::DrawingContent content = js::contentOf(*file, request, facts, photos);
         const draw::DrawingOptions options = js::drawingOf(request, content, theme, title);
         draw::SvgPicture picture = draw::drawSvg(content, options);
-        const std::vector<picture::Index> shown = js::placesIn(part);
+        const std::vector<std::int32_t> shown = js::numbersIn(part);
         if (!shown.empty())
             picture = draw::partOf(picture, draw::areaAround(content.picture, shown), options.title);
         js::lastText = std::move(picture.svg);
@@ -194,7 +209,8 @@ const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int box
 // each sheet its row, its column and its SVG. scale is by the size at 96 px an inch, 0 for what fits rows and columns.
 OLVANE_EXPORT("gedcom_sheets")
 const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,
-                         const char* title, const char* paper, int rows, int columns, double scale) {
+                         const char* title, const char* photos, const char* paper, int rows, int columns,
+                         double scale) {
     try {
         const auto size = draw::paperOf(paper);
         if (!size) throw std::invalid_argument(std::string(paper) + " is no paper");
@@ -208,7 +224,7 @@ const char* gedcomSheets(js::OpenFile* file, std::int32_t focus, int theme, int 
         const js::PictureRequest request = js::requestOnPaper(focus - 1, form);
         subject.folded = charts::foldsForPaper(request.view.chart.view);
         subject.contentOf = [&](double aspect) {
-            return js::contentOf(*file, js::requestOnPaper(focus - 1, form, aspect), facts);
+            return js::contentOf(*file, js::requestOnPaper(focus - 1, form, aspect), facts, photos);
         };
         subject.optionsOf = [&](const draw::DrawingContent& content) {
             return js::drawingOf(request, content, theme, title);

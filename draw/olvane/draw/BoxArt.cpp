@@ -76,6 +76,15 @@ void appendSilhouette(std::string& svg, const BoxFrame& box, kin::Sex sex, const
         colours.silhouette, "\"/>\n");
 }
 
+// Cut to its place, never stretched.
+void appendPhoto(std::string& svg, const BoxFrame& box) {
+    const double x = isWide(box) ? kInset : (box.width - kPhotoWidth) / 2;
+    const double height = isWide(box) ? box.height - 2 * kPhotoTop : kTallPhotoHeight;
+    put(svg, "<image href=\"", Escaped{box.photo}, "\" x=\"", number(x), "\" y=\"", number(kPhotoTop),
+        "\" width=\"", number(kPhotoWidth), "\" height=\"", number(height),
+        "\" preserveAspectRatio=\"xMidYMid slice\"/>\n");
+}
+
 std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
     std::string title = fullNameIn(label, box.language);
     if (!label.living && !label.birth.empty()) put(title, ", * ", label.birth);
@@ -140,7 +149,11 @@ void appendPersonBox(std::string& svg, const BoxFrame& box, const kin::PersonLab
     const kin::PersonLabel shown = shownLabel(label, box.language);
     openBox(svg, box, titleOf(box, label));
     appendFrame(svg, box, shown.sex, theme);
-    if (!isForPaper(box)) appendSilhouette(svg, box, shown.sex, theme);
+    if (!box.photo.empty()) {
+        appendPhoto(svg, box);
+    } else if (!isForPaper(box)) {
+        appendSilhouette(svg, box, shown.sex, theme);
+    }
     const std::vector<Badge> badges = badgesOf(box, label.living);
     appendTexts(svg, box, shown, badges, theme);
     appendBadges(svg, box, badges, theme);

@@ -16,6 +16,9 @@ namespace olvane::draw {
 
 constexpr double kInset = 7;  // from the border to any text
 constexpr double kSilhouetteWidth = 44;
+constexpr double kPhotoWidth = 42;  // of a photograph
+constexpr double kPhotoTop = 6;     // and from the upper edge of its box
+constexpr double kTallPhotoHeight = 50;
 constexpr double kMarkInside = 3;  // by which a mark at the edge reaches into its box, where no text goes
 constexpr double kBadgeHeight = kMarkInside + kMarkOutside;
 constexpr double kBadgeSize = 10;

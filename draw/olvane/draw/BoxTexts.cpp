@@ -92,7 +92,8 @@ TextRoom usualRoomOf(const BoxFrame& box) {
         const double left = kInset + kSilhouetteWidth + kInset;
         return {left, box.width - left - kInset, 4, box.height - 5, false};
     }
-    return {box.width / 2, box.width - 2 * kInset, 55, box.height - 6, true};
+    const double top = box.photo.empty() ? 55 : kPhotoTop + kTallPhotoHeight + 2;
+    return {box.width / 2, box.width - 2 * kInset, top, box.height - 6, true};
 }
 
 TextRoom textRoomOf(const BoxFrame& box, const std::vector<Badge>& badges) {

@@ -89,7 +89,7 @@ private:
             frame.isFocus = picture.focus == static_cast<picture::Index>(i);
             addKinship(frame, static_cast<picture::Index>(i));
             frame.marks = marks_[i];
-            frame.leastName = options_.leastNameSize;
+            frame.leastName = content_.photoOf ? 0 : options_.leastNameSize;
             frame.text = &picture_.text;
             appendBox(frame);
         }
@@ -158,10 +158,16 @@ private:
         if (frame.box->kind == picture::BoxKind::unknownParent) {
             appendUnknownParentBox(picture_.svg, frame, nameOfChild(*frame.box), theme());
         } else {
-            appendPersonBox(picture_.svg, frame, readableLabel(content_, frame.box->id), theme());
+            appendPerson(frame);
         }
         picture_.boxes.push_back(
             {{frame.x, frame.y, frame.width, frame.height}, start, picture_.svg.size() - start});
+    }
+
+    void appendPerson(BoxFrame frame) {
+        const kin::PersonLabel label = readableLabel(content_, frame.box->id);
+        if (content_.photoOf && !label.living) frame.photo = content_.photoOf(frame.box->id);
+        appendPersonBox(picture_.svg, frame, label, theme());
     }
 
     std::string nameOfChild(const picture::Box& unknown) const {

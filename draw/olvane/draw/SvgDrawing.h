@@ -29,6 +29,9 @@ struct DrawingContent {
     std::function<kin::PersonLabel(std::int64_t id)> labelOf;
     // What stands at the marriage line of a family that has a number, such as a year; nothing where not set.
     std::function<std::string(std::uint32_t family)> familyLabelOf;
+    // The address of somebody's photograph, as of an image in SVG: it stands in the box in place of the silhouette. An
+    // empty one for nobody's. Not asked for persons who may be living and are hidden, nor for cells of round charts.
+    std::function<std::string(std::int64_t id)> photoOf;
     // Whether the picture's numbers of hidden relatives are known; else the boxes' flags are all there is.
     bool countsHidden = false;
     // Where children stand, seen from their parents; the signs of what is expressed without a line point there.
@@ -42,7 +45,8 @@ struct DrawingOptions {
     // Sets the title above the picture as well.
     bool headline = false;
     // Names in boxes are set no smaller than this, in px, as far as the boxes allow; then they take the whole box, and
-    // silhouettes are left out. 0 for the usual sizes. A round chart sets names as its cells allow.
+    // silhouettes are left out. 0 for the usual sizes. A round chart sets names as its cells allow, and where there may
+    // be photographs all sizes are the usual ones.
     double leastNameSize = 0;
     // The size of the picture, by the size that it has at 96 px an inch.
     double scale = 1;

@@ -155,6 +155,12 @@ describe("details", kTwoAtOnce, () => {
         await photograph(visit, "photograph");
         await visit.page.keyboard.press("Escape");
         await visit.page.waitForSelector("#side-panel dialog", { state: "detached" });
+        // A saved picture has a copy of it as data.
+        await visit.page.click("#options-button");
+        await visit.page.check("#photos-in-boxes");
+        await visit.page.waitForSelector("#tree image.portrait");
+        const saved = await visit.page.evaluate(() => one("olvane-tree").saveSvg());
+        assert.equal(saved.match(/<image href="data:image\/jpeg;base64,[^"]+"/g)?.length, 1);
         await visit.end();
     });
 
@@ -238,6 +244,13 @@ describe("details of olvane page", { skip: command ? false : "no olvane command 
         assert.equal(await visit.box("I2").locator("image.portrait").count(), 0);
         assert.match(await visit.hash(), /photos=boxes/);
         await visit.page.keyboard.press("Escape");
+        // On paper and in a saved file as well, each with the photograph inside.
+        const imagesOf = (svg) => svg.match(/<image href="data:image\/jpeg;base64,[^"]+"/g)?.length ?? 0;
+        const drawn = await visit.page.evaluate(() => {
+            const tree = one("olvane-tree");
+            return { saved: tree.saveSvg(), sheet: tree.sheets({ paper: "A4" }).sheets[0].svg };
+        });
+        assert.deepEqual([imagesOf(drawn.saved), imagesOf(drawn.sheet)], [1, 1]);
         await photograph(visit, "photos-in-boxes");
         await visit.end();
     });

@@ -139,6 +139,29 @@ TEST_F(Picture, unknownParentInvitesInADashedBox) {
     EXPECT_EQ(countOf(svg, "stroke-dasharray=\"5 4\""), 1u);
 }
 
+TEST_F(Picture, photographTakesThePlaceOfTheSilhouetteAndIsCutToIt) {
+    content_.photoOf = [](std::int64_t id) { return id == 2 ? "a.png?b&c\"d" : ""; };
+    const std::string svg = draw();
+    EXPECT_EQ(countOf(svg, "<use href=\"#olvane-"), 3u);
+    EXPECT_EQ(countOf(svg, "<image href=\"a.png?b&amp;c&quot;d\" "), 1u);
+    EXPECT_EQ(countOf(svg, "preserveAspectRatio=\"xMidYMid slice\"/>"), 1u);
+}
+
+TEST_F(Picture, photographStaysWhereNamesAreWantedLarge) {
+    content_.photoOf = [](std::int64_t id) { return id == 2 ? "a.png" : ""; };
+    DrawingOptions options;
+    options.leastNameSize = 20;
+    const std::string svg = drawSvg(content_, options).svg;
+    EXPECT_EQ(countOf(svg, "<image "), 1u);
+    EXPECT_EQ(countOf(svg, "<use href=\"#olvane-"), 3u);
+}
+
+TEST_F(Picture, nobodyIsAskedForThePhotographOfSomebodyWhoIsHidden) {
+    labels_[2].living = true;
+    content_.photoOf = [](std::int64_t id) { return id == 2 ? "secret.png" : ""; };
+    EXPECT_THAT(draw(), Not(HasSubstr("secret")));
+}
+
 TEST_F(Picture, focusAloneHasTheFocusColour) {
     EXPECT_EQ(countOf(draw(), std::string(lightTheme().focus)), 2u);  // its two borders
 }

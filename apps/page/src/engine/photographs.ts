@@ -4,14 +4,18 @@
 // The photographs that came with a family: inside the page, or in the archive that was dropped. What a file links to
 // elsewhere is never fetched.
 
+import { html } from "../base/dom";
 import type { Archive } from "./archive";
 
 const kMostBytes = 32 * 2 ** 20; // of one photograph, unpacked
+const kCopySide = 480; // px that the copy of a photograph has at most: 4 cm on paper, at 300 an inch
 
 export class Photographs {
     static readonly none = new Photographs(() => null);
     private readonly found = new Map<string, Promise<string | null> | string | null>();
     private readonly made: string[] = [];
+    // Of each photograph of an archive, by its address.
+    private readonly copies = new Map<string, string>();
 
     private constructor(
         private readonly find: (file: string) => Promise<Uint8Array<ArrayBuffer> | null> | string | null,
@@ -43,19 +47,44 @@ export class Photographs {
         return url;
     }
 
+    /** A photograph as a data address, for a drawing that is saved or printed; null while it is unpacked. */
+    dataOf(url: string): string | null {
+        return url.startsWith("data:") ? url : (this.copies.get(url) ?? null);
+    }
+
     close(): void {
         for (const url of this.made) URL.revokeObjectURL(url);
         this.made.length = 0;
+        this.copies.clear();
         this.found.clear();
     }
 
-    private keep(file: string, bytes: Uint8Array<ArrayBuffer> | null): string | null {
+    private async keep(file: string, bytes: Uint8Array<ArrayBuffer> | null): Promise<string | null> {
         const type = bytes && typeOf(bytes);
-        const url = type ? URL.createObjectURL(new Blob([bytes], { type })) : null;
-        if (url) this.made.push(url);
+        const blob = type ? new Blob([bytes], { type }) : null;
+        const url = blob && URL.createObjectURL(blob);
+        if (url) {
+            this.made.push(url);
+            const copy = await smallCopy(blob).catch(() => null);
+            if (copy) this.copies.set(url, copy);
+        }
         this.found.set(file, url);
         return url;
     }
+}
+
+// A JPEG on white as a data address.
+async function smallCopy(photograph: Blob): Promise<string | null> {
+    const image = await createImageBitmap(photograph);
+    const part = Math.min(1, kCopySide / Math.max(image.width, image.height));
+    const canvas = html("canvas", { width: Math.ceil(image.width * part), height: Math.ceil(image.height * part) });
+    const pen = canvas.getContext("2d");
+    if (!pen) return null;
+    pen.fillStyle = "#fff";
+    pen.fillRect(0, 0, canvas.width, canvas.height);
+    pen.drawImage(image, 0, 0, canvas.width, canvas.height);
+    image.close();
+    return canvas.toDataURL("image/jpeg", 0.85);
 }
 
 // By the first bytes: a drawing with scripts in it, or anything else, is no photograph.

@@ -72,7 +72,10 @@ export class PaperDialog {
         this.purpose.addEventListener("change", () => this.choosePurpose());
         this.print.textContent = ui.paper.print;
         this.png.textContent = ui.paper.savePng;
-        onClick(this.print, () => window.print());
+        onClick(this.print, () => {
+            this.show(); // with the photographs that were unpacked since
+            window.print();
+        });
         onClick(this.png, () => void this.savePng());
         this.element.addEventListener("close", () => this.empty());
     }

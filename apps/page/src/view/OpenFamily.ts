@@ -61,16 +61,25 @@ export class OpenFamily {
     // The picture as the text of an SVG file, as the command draws it. Throws LayoutError.
     // part names boxes by their index, around which the drawing ends.
     svg(state: ViewState, theme: DrawingTheme, reader: Reader, part?: DrawingOptions["part"]): string {
-        return this.file.svg(state.focus, keeping(this.optionsOf(state, reader)), { theme, show: state.show, part });
+        const drawing = { theme, show: state.show, photos: this.photosIn(state, reader), part };
+        return this.file.svg(state.focus, keeping(this.optionsOf(state, reader)), drawing);
     }
 
     sheets(state: ViewState, paper: PaperOptions, reader: Reader): PaperSheets {
-        return this.file.sheets(
-            state.focus,
-            this.optionsOf(state, reader),
-            { theme: "print", show: state.show },
-            paper,
-        );
+        const drawing = { theme: "print", show: state.show, photos: this.photosIn(state, reader) } as const;
+        return this.file.sheets(state.focus, this.optionsOf(state, reader), drawing, paper);
+    }
+
+    // Photographs of the persons in a picture, as data: those that are unpacked.
+    private photosIn(state: ViewState, reader: Reader): Map<number, string> {
+        const photos = new Map<number, string>();
+        if (!state.photos) return photos;
+        for (const { person } of this.picture(state, reader).boxes) {
+            const url = person && this.portraitOf(person, () => undefined);
+            const data = url && this.photographs.dataOf(url);
+            if (data) photos.set(person, data);
+        }
+        return photos;
     }
 
     // The first photograph of a person, null where there is none; late is called when one of an archive is unpacked.
