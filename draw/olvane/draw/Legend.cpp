@@ -129,10 +129,20 @@ std::string Legend::svgIn(const PictureArea& area) const {
     return svg + "</g>\n";
 }
 
+// A small box within its frame, around a point.
+void Legend::appendFrameSign(std::string& svg, int x, int y) const {
+    put(svg, "<rect x=\"", whole(x - 7), "\" y=\"", whole(y - 5), "\" width=\"14\" height=\"10\" fill=\"",
+        options_.theme->page, "\" stroke=\"", options_.theme->line, "\"/>\n<rect x=\"", whole(x - 10),
+        "\" y=\"", whole(y - 8), "\" width=\"20\" height=\"16\" rx=\"3\" fill=\"none\" stroke=\"",
+        options_.theme->badge, "\" stroke-width=\"2\"/>\n");
+}
+
 void Legend::appendRow(std::string& svg, const PictureArea& area, int place, const LegendRow& row) const {
     const int left = static_cast<int>(area.x);
     const int y = static_cast<int>(area.y) + kPitch * place + kPitch / 2;
-    if (row.sign.empty()) {
+    if (row.isFrame) {
+        appendFrameSign(svg, left + kStroke / 2, y);
+    } else if (row.sign.empty()) {
         put(svg, "<path d=\"M", whole(left), " ", whole(y), "h", whole(kStroke), "\" fill=\"none\" stroke=\"",
             row.colour, "\" stroke-width=\"", number(row.width), "\"");
         if (!row.dashes.empty()) put(svg, " stroke-dasharray=\"", row.dashes, "\"");

@@ -26,6 +26,7 @@ struct LegendRow {
     std::string text;
     std::string sign;  // of a badge, instead of a line
     bool hollow = false;
+    bool isFrame = false;  // that of a common ancestor, instead of a line
 };
 
 // What is drawn of a picture, and where: the frame leads from its points to px.
@@ -53,6 +54,7 @@ public:
 private:
     int rowsWidth() const;
     int rowsHeight() const;
+    void appendFrameSign(std::string& svg, int x, int y) const;
     void appendRow(std::string& svg, const PictureArea& area, int place, const LegendRow& row) const;
 
     std::vector<LegendRow> rows_;

@@ -22,11 +22,16 @@ using picture::Font;
 using picture::kFontFamilies;
 
 constexpr double kHeadlineSize = 20;
+constexpr int kMostHeadline = 600;  // px of a title that widens a small picture
+
+std::string headlineOf(const DrawingOptions& options) {
+    return cleanText(cutText(options.title));
+}
 
 void appendHeadline(SvgPicture& picture, const DrawingOptions& options) {
     if (!options.headline) return;
     const Font font{kHeadlineSize, true};
-    const std::string text = fitLine(cleanText(cutText(options.title)), font, picture.width - 2 * kMargin);
+    const std::string text = fitLine(headlineOf(options), font, picture.width - 2 * kMargin);
     put(picture.svg, "<text x=\"", whole(kMargin), "\" y=\"", whole(kMargin + 12),
         "\" font-weight=\"bold\" font-size=\"", number(kHeadlineSize), "\" fill=\"", options.theme->text,
         "\">", Escaped{text}, "</text>\n");
@@ -62,6 +67,12 @@ Bounds boundsOf(const picture::Picture& picture, const std::vector<picture::Kins
 
 int wholePx(double size) {
     return static_cast<int>(std::ceil(std::clamp(size, 0.0, 1e9)));
+}
+
+int headlineWidth(const DrawingOptions& options) {
+    if (!options.headline) return 0;
+    const double text = picture::textWidth(headlineOf(options), {kHeadlineSize, true});
+    return std::min(wholePx(text), kMostHeadline) + 2 * kMargin;
 }
 
 void openPage(SvgPicture& picture, const DrawingOptions& options) {

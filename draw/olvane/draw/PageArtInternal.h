@@ -30,6 +30,9 @@ Bounds boundsOf(const picture::Picture& picture, const std::vector<picture::Kins
 // Up to the next whole px; a picture is at most as large as a renderer's numbers.
 int wholePx(double size);
 
+// What the headline needs with its margins, as far as a long one may widen a picture; 0 without one.
+int headlineWidth(const DrawingOptions& options);
+
 // From the beginning to the headline; the picture's size is known.
 void openPage(SvgPicture& picture, const DrawingOptions& options);
 void closePage(SvgPicture& picture);

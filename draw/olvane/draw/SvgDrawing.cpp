@@ -37,10 +37,12 @@ public:
         placePlates();
         const Bounds bounds = boundsOf(content_.picture, plates_);
         const int headline = options_.headline ? kHeadlineHeight : 0;
-        frame_ = {bounds.left, bounds.top, kMargin, kMargin + headline};
+        const int ownWidth = wholePx((bounds.right - bounds.left) * Frame::kScale) + 2 * kMargin;
+        const int width = std::max(ownWidth, headlineWidth(options_));
+        frame_ = {bounds.left, bounds.top, kMargin + (width - ownWidth) / 2, kMargin + headline};
         picture_.originX = frame_.x(0);
         picture_.originY = frame_.y(0);
-        picture_.width = wholePx((bounds.right - bounds.left) * Frame::kScale) + 2 * kMargin;
+        picture_.width = width;
         picture_.height = wholePx((bounds.bottom - bounds.top) * Frame::kScale) + 2 * kMargin + headline;
 
         SvgPicture lines;
@@ -178,6 +180,18 @@ private:
             options_.language);
     }
 
+    void addAncestorFrame(std::vector<LegendRow>& rows) const {
+        const picture::Picture& picture = content_.picture;
+        const bool isDrawn =
+            std::any_of(commonAncestors_.begin(), commonAncestors_.end(), [&picture](picture::Index place) {
+                return place != picture.focus && place != picture.other;
+            });
+        if (!isDrawn) return;
+        LegendRow& row = rows.emplace_back();
+        row.text = wordsOf(Phrase::commonAncestor, options_.language);
+        row.isFrame = true;
+    }
+
     void addSigns(std::vector<LegendRow>& rows) const {
         const picture::Picture& picture = content_.picture;
         bool hasHidden = false, hasFurther = false;
@@ -226,6 +240,7 @@ private:
                                 {},
                                 false});
         }
+        addAncestorFrame(rows);
         addSigns(rows);
         return rows;
     }

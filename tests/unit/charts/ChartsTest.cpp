@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <map>
 #include <set>
 #include <stdexcept>
 #include <string>
@@ -385,6 +386,33 @@ TEST(KinshipChart, severalWaysRunSideBySideAndNoneOverItself) {
         }
     }
     EXPECT_EQ(stems, (std::vector<double>{0, 2.5}));
+}
+
+// Four generations of brothers and sisters who married: the two at the foot are related by 15 ways, and all but those of
+// the nearest generations come down the same lines.
+TEST(KinshipChart, linesOfManyWaysAreNoBroaderThanThreeOfThem) {
+    const KinFamily family{"A0 + B0: A1.m B1.f", "A1 + B1: A2.m B2.f", "A2 + B2: A3.m B3.f",
+                           "A3 + B3: A4.m B4.f"};
+    ChartRequest request = requestFor(View::kinship, family["A4"]);
+    request.to = family["B4"];
+    request.mostWays = 0;
+    const Drawn drawn(family, request);
+    const olvane::picture::Picture& picture = drawn.picture;
+    ASSERT_EQ(picture.ways.size(), 15U);
+    std::map<double, int> together;  // by the height of an upright piece in the gap above the lowest row
+    const Box& lowest = boxOf(picture, family.graph(), family["A4"]);
+    for (std::size_t way = 0; way < picture.ways.size(); ++way) {
+        const auto pieces = picture.piecesOf(picture.ways[way]);
+        EXPECT_TRUE(way >= 3 || !pieces.empty());
+        for (const auto& piece : pieces) {
+            if (piece.x1 == piece.x2 && piece.y1 < lowest.y && piece.y2 > lowest.y && piece.x1 > lowest.x &&
+                piece.x1 < lowest.x + 55) {
+                ++together[piece.x1];
+            }
+        }
+    }
+    EXPECT_EQ(together.size(), 3U);
+    EXPECT_LE(together.rbegin()->first - together.begin()->first, 5.0 + 1e-9);
 }
 
 TEST(KinshipChart, ofStrangersShowsTheTwoWithoutAWay) {

@@ -226,6 +226,12 @@ TEST_F(PictureOfKinship, setsOffBothEndsAndTheCommonAncestor) {
     EXPECT_EQ(countOf(svg, "stroke=\"" + std::string(lightTheme().focus) + "\" stroke-width=\"4\""), 2u);
 }
 
+TEST_F(PictureOfKinship, legendExplainsTheFrameOfACommonAncestorWhereItIsDrawn) {
+    EXPECT_EQ(countOf(draw(), ">Common ancestor</text>"), 1u);
+    content_.picture.focus = 0;  // whose frame is that of an end
+    EXPECT_EQ(countOf(draw(), ">Common ancestor</text>"), 0u);
+}
+
 // A caption would lie over a line that leaves the box downwards.
 TEST_F(PictureOfKinship, writesAboveABoxWithALineBelow) {
     picture::Box& father = boxOf(0);
@@ -508,6 +514,19 @@ TEST_F(Picture, surnameStandsFirstWhereItIsWrittenSo) {
 TEST_F(Picture, rightToLeftNamesSayTheirDirection) {
     labels_[1].given = "שרה";
     EXPECT_THAT(draw(), HasSubstr("direction=\"rtl\">שרה</text>"));
+}
+
+TEST_F(Picture, longHeadlineWidensASmallPictureRoundItsMiddle) {
+    const SvgPicture narrow = drawSvg(content_, DrawingOptions());
+    DrawingOptions options;
+    options.headline = true;
+    options.title = "The descendants of Karl Berg and Ada Lund";
+    const SvgPicture wide = drawSvg(content_, options);
+    EXPECT_THAT(wide.svg, HasSubstr(">" + options.title + "</text>"));
+    EXPECT_GT(wide.width, narrow.width);
+    EXPECT_EQ(wide.originX - narrow.originX, (wide.width - narrow.width) / 2);
+    options.title += options.title + options.title + options.title;
+    EXPECT_EQ(drawSvg(content_, options).width, 600 + 2 * 28);
 }
 
 TEST_F(Picture, headlineIsDrawnWhenAskedFor) {

@@ -3,7 +3,8 @@
 
 // Each step of a way is a walk over the lines of one family, breadth first from the pieces that touch the one box to
 // a piece that touches the other. All steps of a way become one set of pieces, in which what lies on one line is
-// joined, so that dashes are drawn once wherever the way comes and goes by the same line.
+// joined, so that dashes are drawn once wherever the way comes and goes by the same line. What enough nearer ways take
+// already is cut from that set: a bundle of all of them would be wider than the room between two boxes.
 
 #include <olvane/picture/shared/WayLines.h>
 
@@ -23,6 +24,7 @@ namespace {
 constexpr double kNear = 0.01;       // points
 constexpr double kSideBySide = 2.5;  // points between ways that share a line
 constexpr double kIntoBox = 6;       // points that a way reaches into a box
+constexpr int kMostTogether = 3;     // ways that are drawn along one stretch of a line
 
 using kin::at;
 
@@ -185,6 +187,45 @@ private:
     std::vector<std::size_t> queue_;
 };
 
+// What is left of a part where fewer than kMostTogether of the earlier ways run.
+void addUncrowded(const Part& part, const std::vector<std::vector<Part>>& earlier, std::vector<Part>& left) {
+    struct Edge {
+        double place;
+        int step;
+    };
+    std::vector<Edge> edges;
+    for (const std::vector<Part>& way : earlier) {
+        for (const Part& other : way) {
+            const double from = std::max(part.from, other.from);
+            const double to = std::min(part.to, other.to);
+            if (!isOnOneLine(part, other) || to - from <= kNear) continue;
+            edges.push_back({from, 1});
+            edges.push_back({to, -1});
+        }
+    }
+    kin::mergeSort(edges.begin(), edges.end(), [](const Edge& a, const Edge& b) {
+        return a.place != b.place ? a.place < b.place : a.step < b.step;
+    });
+    int together = 0;
+    double from = part.from;
+    for (const Edge& edge : edges) {
+        const bool wasFree = together < kMostTogether;
+        together += edge.step;
+        if (wasFree == (together < kMostTogether)) continue;
+        if (wasFree && edge.place - from > kNear)
+            left.push_back({part.isUpright, part.across, from, edge.place});
+        from = edge.place;
+    }
+    if (together < kMostTogether && part.to - from > kNear)
+        left.push_back({part.isUpright, part.across, from, part.to});
+}
+
+std::vector<Part> uncrowded(const std::vector<Part>& parts, const std::vector<std::vector<Part>>& earlier) {
+    std::vector<Part> left;
+    for (const Part& part : parts) addUncrowded(part, earlier, left);
+    return left;
+}
+
 // 0, then in turns on both sides.
 double shiftOf(std::size_t lane) {
     const double steps = std::floor((static_cast<double>(lane) + 1) / 2);
@@ -208,7 +249,7 @@ void addWayLines(Picture& picture) {
     std::vector<std::size_t> lanes;
     picture.wayPieces.clear();
     for (Way& way : picture.ways) {
-        std::vector<Part> own = tracer.partsOf(way);
+        std::vector<Part> own = uncrowded(tracer.partsOf(way), parts);
         lanes.push_back(freeLane(parts, lanes, own));
         const double shift = shiftOf(lanes.back());
         way.firstPiece = static_cast<std::uint32_t>(picture.wayPieces.size());
