@@ -221,6 +221,7 @@ describe("options", kTwoAtOnce, () => {
         const wordsAtEnds = captions.map((caption) => caption.replaceAll(" ", "")).sort();
         assert.deepEqual(wordsAtEnds, ["husbandandfirstcousin", "wifeandfirstcousin"]);
         assert.ok((await visit.page.locator("#tree .ancestor").count()) > 0);
+        assert.ok((await visit.page.locator("#legend li").allTextContents()).includes("a common ancestor"));
         await photograph(visit, "kinship");
         await visit.follow("#person=I1");
         assert.equal(await visit.page.locator(".corner .ways li").count(), 0);

@@ -95,6 +95,7 @@ function legendOf(ui: UiMessages): HTMLDetailsElement {
         row(sign("female", silhouette("female")), items.female),
         row(sign("other", silhouette("other")), items.other),
         row(sign("focus"), items.focus),
+        row(sign("ancestor"), ui.commonAncestor),
         row(sign("more", "+3"), items.hidden),
         row(sign("missing", "?"), items.missing),
         row(sign("duplicate", icon("duplicates")), items.repeated),
