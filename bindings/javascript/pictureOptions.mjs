@@ -119,7 +119,8 @@ export function drawingNumbers({ theme = "light", boxes = "usual", show = [], ti
 
 /** The persons with a photograph, as the module reads them. */
 export function photoText(photos) {
-    return [...photos.keys()].map((id) => plainNumber("photos", id, { least: 1, most: MOST })).join(" ");
+    const persons = [...photos.keys()].map((id) => plainNumber("photos", id, { least: 1, most: MOST }));
+    return persons.length > 0 ? ` ${persons.join(" ")} ` : "";
 }
 
 /** A drawing with the addresses of its photographs, which the module knows by number alone. */

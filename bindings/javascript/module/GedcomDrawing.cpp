@@ -4,7 +4,6 @@
 // A picture of an open GEDCOM file as SVG, whole or on sheets of paper, the same bytes that the command draws, and what
 // its boxes and lines say.
 
-#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
@@ -49,28 +48,13 @@ const draw::DrawingTheme& themeOf(int number) {
     return *themes.at(static_cast<std::size_t>(number));
 }
 
-// "3 4 7"
-std::vector<std::int32_t> numbersIn(std::string_view text) {
-    std::vector<std::int32_t> numbers;
-    while (!text.empty()) {
-        std::int32_t value = 0;
-        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-        if (error != std::errc()) throw std::invalid_argument("no list of numbers");
-        numbers.push_back(value);
-        text.remove_prefix(static_cast<std::size_t>(end - text.data()));
-        if (!text.empty()) text.remove_prefix(1);
-    }
-    return numbers;
-}
-
-// photos lists the persons with a photograph, whose addresses are "photo:" and the number: JavaScript has the real ones.
+// photos lists the persons with a photograph, " 3 4 7 ", whose addresses are "photo:" and the number: JavaScript has the
+// real ones. It must outlive the content.
 void addPhotos(draw::DrawingContent& content, std::string_view photos) {
     if (photos.empty()) return;
-    std::vector<std::int32_t> persons = numbersIn(photos);
-    std::sort(persons.begin(), persons.end());
-    content.photoOf = [persons = std::move(persons)](std::int64_t id) {
-        const bool has = std::binary_search(persons.begin(), persons.end(), id);
-        return has ? "photo:" + std::to_string(id) : std::string();
+    content.photoOf = [photos](std::int64_t id) {
+        const std::string number = std::to_string(id);
+        return photos.find(" " + number + " ") == std::string_view::npos ? std::string() : "photo:" + number;
     };
 }
 
@@ -135,6 +119,20 @@ draw::DrawingOptions drawingOf(const PictureRequest& request, const draw::Drawin
     return options;
 }
 
+// "3 4 7"
+std::vector<std::int32_t> numbersIn(std::string_view text) {
+    std::vector<std::int32_t> numbers;
+    while (!text.empty()) {
+        std::int32_t value = 0;
+        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+        if (error != std::errc()) throw std::invalid_argument("no list of numbers");
+        numbers.push_back(value);
+        text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+        if (!text.empty()) text.remove_prefix(1);
+    }
+    return numbers;
+}
+
 // Lengths and sizes are in thousandths, as JavaScript divides them.
 std::string sheetsJson(const draw::PaperDrawing& drawn) {
     const draw::SheetPlan& plan = drawn.drawing.plan;
@@ -183,8 +181,8 @@ OLVANE_EXPORT("usual_boxes") int usualBoxes(int view, int direction) {
     return static_cast<int>(form == charts::BoxForm::tall ? js::Boxes::tall : js::Boxes::wide);
 }
 
-// With the picture's options, sizes apart; boxes is one of Boxes. photos lists the persons with a photograph, "3 4 7".
-// Where part lists boxes by their places, the picture ends around them.
+// With the picture's options, sizes apart; boxes is one of Boxes. photos lists the persons with a photograph, " 3 4 7 ".
+// Where part lists boxes by their places, "3 4 7", the picture ends around them.
 // Null for a picture that is refused; last_text then says why.
 OLVANE_EXPORT("gedcom_svg")
 const char* gedcomSvg(js::OpenFile* file, std::int32_t focus, int theme, int boxes, unsigned facts,

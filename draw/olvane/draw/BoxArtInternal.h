@@ -5,6 +5,7 @@
 
 #include <span>
 #include <string>
+#include <string_view>
 
 #include <olvane/draw/MarkArtInternal.h>
 #include <olvane/draw/SvgDrawing.h>
@@ -35,7 +36,7 @@ struct BoxFrame {
     bool countsHidden = false;  // the box's numbers of hidden relatives are known
     std::span<const BoxMark> marks;
     kin::Language language = kin::Language::english;
-    std::string photo;          // its address; empty for a silhouette
+    std::string_view photo;     // its address; empty for a silhouette
     double leastName = 0;       // DrawingOptions::leastNameSize
     TextSizes* text = nullptr;  // takes the sizes of what is written
 

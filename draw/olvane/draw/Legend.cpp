@@ -131,10 +131,9 @@ std::string Legend::svgIn(const PictureArea& area) const {
 
 // A small box within its frame, around a point.
 void Legend::appendFrameSign(std::string& svg, int x, int y) const {
-    put(svg, "<rect x=\"", whole(x - 7), "\" y=\"", whole(y - 5), "\" width=\"14\" height=\"10\" fill=\"",
-        options_.theme->page, "\" stroke=\"", options_.theme->line, "\"/>\n<rect x=\"", whole(x - 10),
-        "\" y=\"", whole(y - 8), "\" width=\"20\" height=\"16\" rx=\"3\" fill=\"none\" stroke=\"",
-        options_.theme->badge, "\" stroke-width=\"2\"/>\n");
+    put(svg, "<path d=\"M", whole(x - 7), " ", whole(y - 5),
+        "h14v10h-14zm-3 -3h20v16h-20z\" fill=\"none\" stroke=\"", options_.theme->badge,
+        "\" stroke-width=\"2\"/>\n");
 }
 
 void Legend::appendRow(std::string& svg, const PictureArea& area, int place, const LegendRow& row) const {

@@ -168,7 +168,9 @@ private:
 
     void appendPerson(BoxFrame frame) {
         const kin::PersonLabel label = readableLabel(content_, frame.box->id);
-        if (content_.photoOf && !label.living) frame.photo = content_.photoOf(frame.box->id);
+        const bool mayHavePhoto = content_.photoOf && !label.living;
+        const std::string photo = mayHavePhoto ? content_.photoOf(frame.box->id) : std::string();
+        frame.photo = photo;
         appendPersonBox(picture_.svg, frame, label, theme());
     }
 
@@ -182,10 +184,9 @@ private:
 
     void addAncestorFrame(std::vector<LegendRow>& rows) const {
         const picture::Picture& picture = content_.picture;
-        const bool isDrawn =
-            std::any_of(commonAncestors_.begin(), commonAncestors_.end(), [&picture](picture::Index place) {
-                return place != picture.focus && place != picture.other;
-            });
+        const bool isDrawn = std::any_of(
+            commonAncestors_.begin(), commonAncestors_.end(),
+            [&picture](picture::Index place) { return place != picture.focus && place != picture.other; });
         if (!isDrawn) return;
         LegendRow& row = rows.emplace_back();
         row.text = wordsOf(Phrase::commonAncestor, options_.language);

@@ -74,16 +74,14 @@ export class Photographs {
 }
 
 // A JPEG on white as a data address.
-async function smallCopy(photograph: Blob): Promise<string | null> {
+async function smallCopy(photograph: Blob): Promise<string> {
     const image = await createImageBitmap(photograph);
     const part = Math.min(1, kCopySide / Math.max(image.width, image.height));
     const canvas = html("canvas", { width: Math.ceil(image.width * part), height: Math.ceil(image.height * part) });
-    const pen = canvas.getContext("2d");
-    if (!pen) return null;
+    const pen = canvas.getContext("2d")!;
     pen.fillStyle = "#fff";
     pen.fillRect(0, 0, canvas.width, canvas.height);
     pen.drawImage(image, 0, 0, canvas.width, canvas.height);
-    image.close();
     return canvas.toDataURL("image/jpeg", 0.85);
 }
 

@@ -49,9 +49,13 @@ Part partBetween(const Point& a, const Point& b) {
     return {false, a.y, std::min(a.x, b.x), std::max(a.x, b.x)};
 }
 
+void sortParts(std::vector<Part>& parts) {
+    kin::mergeSort(parts.begin(), parts.end(), [](const Part& a, const Part& b) { return isBefore(a, b); });
+}
+
 // Sorted, and what touches on one line made one.
 std::vector<Part> joined(std::vector<Part> parts) {
-    kin::mergeSort(parts.begin(), parts.end(), [](const Part& a, const Part& b) { return isBefore(a, b); });
+    sortParts(parts);
     std::vector<Part> result;
     for (const Part& part : parts) {
         if (!result.empty() && isOnOneLine(result.back(), part) && part.from <= result.back().to + kNear) {
@@ -189,35 +193,28 @@ private:
 
 // What is left of a part where fewer than kMostTogether of the earlier ways run.
 void addUncrowded(const Part& part, const std::vector<std::vector<Part>>& earlier, std::vector<Part>& left) {
-    struct Edge {
-        double place;
-        int step;
-    };
-    std::vector<Edge> edges;
+    std::vector<Part> edges;  // across: where another way begins, with from = 1, or ends, with -1
     for (const std::vector<Part>& way : earlier) {
         for (const Part& other : way) {
             const double from = std::max(part.from, other.from);
             const double to = std::min(part.to, other.to);
             if (!isOnOneLine(part, other) || to - from <= kNear) continue;
-            edges.push_back({from, 1});
-            edges.push_back({to, -1});
+            edges.push_back({false, from, 1, 0});
+            edges.push_back({false, to, -1, 0});
         }
     }
-    kin::mergeSort(edges.begin(), edges.end(), [](const Edge& a, const Edge& b) {
-        return a.place != b.place ? a.place < b.place : a.step < b.step;
-    });
+    sortParts(edges);
+    edges.push_back({false, part.to, kMostTogether, 0});
     int together = 0;
     double from = part.from;
-    for (const Edge& edge : edges) {
+    for (const Part& edge : edges) {
         const bool wasFree = together < kMostTogether;
-        together += edge.step;
+        together += static_cast<int>(edge.from);
         if (wasFree == (together < kMostTogether)) continue;
-        if (wasFree && edge.place - from > kNear)
-            left.push_back({part.isUpright, part.across, from, edge.place});
-        from = edge.place;
+        if (wasFree && edge.across - from > kNear)
+            left.push_back({part.isUpright, part.across, from, edge.across});
+        from = edge.across;
     }
-    if (together < kMostTogether && part.to - from > kNear)
-        left.push_back({part.isUpright, part.across, from, part.to});
 }
 
 std::vector<Part> uncrowded(const std::vector<Part>& parts, const std::vector<std::vector<Part>>& earlier) {
