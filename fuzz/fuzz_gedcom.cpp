@@ -15,6 +15,7 @@
 #include <utility>
 #include <vector>
 
+#include <olvane/gedcom/DateText.h>
 #include <olvane/gedcom/GedcomDate.h>
 #include <olvane/gedcom/GedcomDetails.h>
 #include <olvane/gedcom/GedcomDiagnostic.h>
@@ -101,6 +102,11 @@ void lookAtDate(const GedcomDate& date) {
     HOLDS(sortText(date).size() <= kSortTextBytes);
     HOLDS(date.isRead() || sortText(date).empty());
     HOLDS(date.isRead() || displayYear(date) == date.written);
+    for (const char* language : {"en", "de", "es"}) {
+        const std::string words = dateText(date, language);
+        HOLDS(isUtf8(words) && words.empty() == date.written.empty());
+        HOLDS(date.isRead() || words == date.written);
+    }
     const GedcomDate again = parseGedcomDate(date.written);
     HOLDS(again.year == date.year && again.month == date.month && again.day == date.day);
 }

@@ -83,7 +83,7 @@ draw::DrawingContent contentOf(const gedcom::GedcomData& data, const DrawOptions
         texts = {hidden, [names](std::string_view text) { return names.shownPlace(text); },
                  [names](std::string_view text) { return names.shownText(text); }};
     }
-    const gedcom::GedcomLabels labels(data, options.shown, std::move(texts));
+    const gedcom::GedcomLabels labels(data, options.shown, std::move(texts), request.chart.language);
     draw::DrawingContent content;
     content.picture = std::move(picture);
     content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };

@@ -10,9 +10,10 @@
 #include <vector>
 
 #include <olvane/picture/TextMetrics.h>
+#include <olvane/source/GedcomLabels.h>
+#include <olvane/source/PersonFinder.h>
 
 #include <cli/UsageError.h>
-#include <olvane/source/PersonFinder.h>
 
 namespace olvane::cli {
 
@@ -67,12 +68,9 @@ std::vector<gedcom::PersonId> similarPersons(gedcom::PersonFinder& finder, const
     throw UsageError(start + "; perhaps one of these is meant:" + candidateList(data, similar));
 }
 
-std::string years(const gedcom::Person& person) {
-    std::string text;
-    if (person.birth.isGiven()) text += "* " + gedcom::displayYear(person.birth);
-    if (person.death.isGiven())
-        text += (text.empty() ? "" : " ") + ("\xE2\x80\xA0 " + gedcom::displayYear(person.death));
-    return text;
+// As in the box of a picture.
+std::string years(const gedcom::GedcomData& data, gedcom::PersonId id) {
+    return picture::cutText(kin::lifeLine(gedcom::GedcomLabels(data).ofPerson(id), " "));
 }
 
 }  // namespace
@@ -96,7 +94,7 @@ std::string readableName(const gedcom::GedcomData& data, gedcom::PersonId id) {
 std::string personLine(const gedcom::GedcomData& data, gedcom::PersonId id) {
     const gedcom::Person& person = data.person(id);
     const std::string xref = person.xref.empty() ? "-" : "@" + std::string(person.xref) + "@";
-    return std::to_string(id) + "\t" + xref + "\t" + readableName(data, id) + "\t" + years(person);
+    return std::to_string(id) + "\t" + xref + "\t" + readableName(data, id) + "\t" + years(data, id);
 }
 
 }  // namespace olvane::cli

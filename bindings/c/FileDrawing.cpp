@@ -152,9 +152,10 @@ std::string drawnFromFile(const olvane_file& file, std::int64_t focus, const olv
     const gedcom::ShownFacts shown{options.dates != 0, options.places != 0, options.occupation != 0,
                                    options.marriage != 0};
     const std::vector<bool> hidden = hiddenIn(file, options);
-    const gedcom::GedcomLabels labels(file.data, shown, hiddenTexts(file.data, hidden));
-    draw::DrawingContent content;
     const charts::ViewRequest request = requestOf(options, file.graph(), focus);
+    const gedcom::GedcomLabels labels(file.data, shown, hiddenTexts(file.data, hidden),
+                                      request.chart.language);
+    draw::DrawingContent content;
     content.picture = charts::pictureOf(source, file.graph(), request);
     content.laterSide = charts::laterSideOf(request.chart);
     picture::hidePersons(hidden, content.picture);

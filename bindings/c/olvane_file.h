@@ -100,7 +100,7 @@ typedef struct olvane_draw_options {
     const char* theme;       /* "light" (default), "dark" or "print" */
     const char* title;       /* stands above the picture; none by default */
     int32_t unknown_parents; /* family, pedigree: 1 for boxes of parents who are not known */
-    int32_t dates;           /* 1 for dates as a file writes them, instead of years */
+    int32_t dates;           /* 1 for whole dates, instead of years */
     int32_t places;      /* 1 for places of birth and death; of a file that was read with OLVANE_READ_FACTS */
     int32_t occupation;  /* 1 for the first occupation; of a file that was read with OLVANE_READ_FACTS */
     int32_t marriage;    /* 1 for the year at each line of a marriage */

@@ -4,7 +4,7 @@
 // A GEDCOM file that the module has read. Persons and families come over once, as rows; facts when they are asked for.
 
 import { GedcomError, LayoutError } from "./errors.mjs";
-import { detailedFactFrom, detailedNameFrom, detailsFrom, factFrom, sheetsFrom } from "./gedcomValues.mjs";
+import { detailedFactFrom, detailedNameFrom, detailsFrom, factFrom, labelFrom, sheetsFrom } from "./gedcomValues.mjs";
 import { Instance } from "./instance.mjs";
 import { refuseNested, runLayout } from "./layout.mjs";
 import { focusNumber } from "./options.mjs";
@@ -77,13 +77,24 @@ export class GedcomFile {
         return this.#answer("gedcom_family_facts", id).map(factFrom);
     }
 
-    labelOfPerson(id, show = []) {
-        const [birth, death, details] = this.#answer("gedcom_person_label", id, factBits(show));
-        return { birth, death, details };
+    labelOfPerson(id, show = [], language = "en") {
+        return this.labelsOfPersons([id], show, language)[0];
     }
 
-    labelOfFamily(id, show = []) {
-        return this.#answer("gedcom_family_label", id, factBits(show));
+    labelsOfPersons(persons, show = [], language = "en") {
+        const ids = Uint32Array.from(persons);
+        const labels = this.#instance.withText(String(language), (code) =>
+            this.#instance.withBytes(new Uint8Array(ids.buffer), (list) =>
+                this.#answer("gedcom_person_labels", list, ids.length, factBits(show), code),
+            ),
+        );
+        return labels.map(labelFrom);
+    }
+
+    labelOfFamily(id, show = [], language = "en") {
+        return this.#instance.withText(String(language), (code) =>
+            this.#answer("gedcom_family_label", id, factBits(show), code),
+        );
     }
 
     search(text, limit = Infinity) {

@@ -50,6 +50,10 @@ export function detailedNameFrom([text, type, nickname, details]) {
     return { text, type, nickname, details: detailsFrom(details) };
 }
 
+export function labelFrom([given, surname, surnameFirst, birth, death, details, lines, shortLines, life]) {
+    return { given, surname, surnameFirst: surnameFirst !== 0, birth, death, details, lines, shortLines, life };
+}
+
 /** Lengths and sizes come in thousandths; finished makes of the SVG of a sheet what is handed out. */
 export function sheetsFrom([width, height, scale, smallestName, smallestText, cutBoxes, sheets], finished) {
     return {

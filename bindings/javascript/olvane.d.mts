@@ -249,17 +249,27 @@ export interface PictureOptions {
 
 export type DrawingTheme = "light" | "dark" | "print";
 
-/** What boxes and lines say beside names and years: dates as written, places, the first occupation, the year of a marriage. */
+/** What boxes and lines say beside names and years: whole dates, places, the first occupation, the year of a marriage. */
 export const FACTS: readonly ["dates", "places", "occupation", "marriage"];
 export type ShownFact = (typeof FACTS)[number];
 
-/** What the box of a person says beside the name. A text is empty where nothing is known. */
+/** What the box of a person says. A text is empty where nothing is known. */
 export interface PersonLabel {
-    /** A year, or the date as the file writes it. */
+    /** The parts of the name, or what stands in its place as given. */
+    readonly given: string;
+    readonly surname: string;
+    readonly surnameFirst: boolean;
+    /** A year, or the whole date. */
     readonly birth: string;
     readonly death: string;
     /** Further lines: the places of birth and death, an occupation. */
     readonly details: readonly string[];
+    /** The lines of birth and death: "* 1809", "† 1882"; a cross alone for a death without a date. */
+    readonly lines: readonly string[];
+    /** The same lines, for where one has no room: years in the place of dates. */
+    readonly shortLines: readonly string[];
+    /** Birth and death for a sentence: "1809–1882", "born 12 Feb 1809, died 1882". */
+    readonly life: string;
 }
 
 /** How a picture is drawn as SVG. */
@@ -359,6 +369,17 @@ export interface Texts {
     runsRightToLeft(text: string): boolean;
     /** Of each text the words as searches compare them, small and without accents and apostrophes, with a space between. */
     foldedWords(texts: Iterable<string>): string[];
+    /**
+     * A date as a file writes it (GedcomDate.written), in words: "12 Feb 1809", "about 1809", "from 1809 to 1811". As
+     * written where it cannot be put into words without loss. Languages are those of GedcomFile.kinship.
+     */
+    dateText(written: string, language?: string): string;
+    /** "Kew, England" for "Kew,,,England". */
+    placeText(place: string): string;
+    /** "1809–1882" or "about 1809 – 1882", "born 1809", "died before 1882"; empty where neither year is known. */
+    yearsText(birth: LifeYear | null, death: LifeYear | null, language?: string): string;
+    /** What stands in the place of a name that is not known. */
+    unnamedText(language?: string): string;
 }
 
 /** A piece of a ring around the middle of a round chart: degrees clockwise from the top, and radii in px. */
@@ -383,6 +404,9 @@ export interface CellLine {
     /** How far the baseline is below y. */
     readonly baseline: number;
 }
+
+/** The year of a birth or death. A year of 0 is not known. */
+export type LifeYear = Pick<GedcomDate, "year" | "lastYear" | "mark">;
 
 /** A place in one of the lists of a picture. */
 export type PictureIndex = number;
@@ -596,7 +620,7 @@ export interface GedcomDate {
     readonly mark: "exact" | "about" | "before" | "after" | "between";
     /** The later year of a range; 0 without one. */
     readonly lastYear: number;
-    /** The year for a person to read: "1819", "~1819", "<1819", ">1819", "1819-1825", "44 BC". */
+    /** The year in few letters: "1819", "~1819", "<1819", ">1819", "1819-1825", "44 BC". Texts.dateText has whole dates. */
     readonly shown: string;
     /** Says how long something lasted, from, until or between, where the mark alone says after, before or between. */
     readonly period: boolean;
@@ -734,6 +758,8 @@ export interface SearchReason {
     readonly written: string;
     /** What the data call it: a tag of GEDCOM, the key of a field; empty for a name. */
     readonly label: string;
+    /** The text is a date, for Texts.dateText. */
+    readonly isDate: boolean;
 }
 
 /** A person whom a search has found. */
@@ -831,9 +857,11 @@ export class GedcomFile {
     /** Whom to show first where nobody said: the person with the most relatives near; 0 in a file of nobody. */
     readonly bestFocus: number;
     /** What drawings with these facts say in the box of a person; GedcomError for nobody. */
-    labelOfPerson(id: number, show?: Iterable<ShownFact>): PersonLabel;
+    labelOfPerson(id: number, show?: Iterable<ShownFact>, language?: string): PersonLabel;
+    /** Of many persons in one question, in their order. */
+    labelsOfPersons(ids: Iterable<number>, show?: Iterable<ShownFact>, language?: string): PersonLabel[];
     /** What they say at the marriage line of a family; empty for nothing. */
-    labelOfFamily(id: number, show?: Iterable<ShownFact>): string;
+    labelOfFamily(id: number, show?: Iterable<ShownFact>, language?: string): string;
     /**
      * Whom a text may mean, the best first. The words of the text stand in the record in any order: whole, as a beginning or,
      * from three letters on, from the middle; where nobody is found so, with one letter wrong, missing, too many or
@@ -846,7 +874,10 @@ export class GedcomFile {
      * asks whenever it has nothing else to do has no slow first search. Throws GedcomError where memory runs out.
      */
     prepareSearch(milliseconds?: number): boolean;
-    /** Notes, sources, media and links beside facts and names. Throws GedcomError for nobody. */
+    /**
+     * Notes, sources, media and links beside facts and names; facts in the order of a life, from birth to burial, and those
+     * without a date before death. Throws GedcomError for nobody.
+     */
     detailsOfPerson(id: number): PersonDetails;
     detailsOfFamily(id: number): FamilyDetails;
     /** First what was wrong in the file, then what is odd in its data: what a check of the file lists. */

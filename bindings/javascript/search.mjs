@@ -3,8 +3,8 @@
 
 // Whom a search has found, and why, from the module's JSON.
 
-function reasonFrom([foundIn, fit, word, text, written, label]) {
-    return { foundIn, fit, word, text, written, label };
+function reasonFrom([foundIn, fit, word, text, written, label, isDate]) {
+    return { foundIn, fit, word, text, written, label, isDate: isDate !== 0 };
 }
 
 function hitFrom([person, fit, reasons]) {

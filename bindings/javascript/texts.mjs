@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 
 // Measures and fits texts as the module's pictures do, so that a screen breaks lines where a file does, and folds them
-// as its searches do.
+// as its searches do. Puts dates and places into words.
+
+import { MARKS } from "./rows.mjs";
 
 const MOST_REMEMBERED = 20000;
 
@@ -86,6 +88,37 @@ export class Texts {
         return this.#instance
             .withText(lines.join("\n"), (pointer) => this.#answer(this.#instance.exports.folded_words(pointer)))
             .split("\n");
+    }
+
+    dateText(written, language = "en") {
+        return this.#instance.withText(written, (value) =>
+            this.#instance.withText(String(language), (code) =>
+                this.#answer(this.#instance.exports.date_text(value, code)),
+            ),
+        );
+    }
+
+    placeText(place) {
+        return this.#instance.withText(place, (pointer) => this.#answer(this.#instance.exports.place_text(pointer)));
+    }
+
+    yearsText(birth, death, language = "en") {
+        const dates = [birth, death].flatMap((date) => [
+            date?.year ?? 0,
+            date?.lastYear ?? 0,
+            date ? MARKS.indexOf(date.mark) : 0,
+        ]);
+        return this.#remembered(`y/${dates.join("/")}/${language}`, () =>
+            this.#instance.withText(String(language), (code) =>
+                this.#answer(this.#instance.exports.years_text(...dates, code)),
+            ),
+        );
+    }
+
+    unnamedText(language = "en") {
+        return this.#instance.withText(String(language), (code) =>
+            this.#answer(this.#instance.exports.unnamed_text(code)),
+        );
     }
 
     #answer(pointer) {

@@ -119,8 +119,20 @@ describe("what the module draws", () => {
 
     test("is what labels state beside the names", async () => {
         const file = await fileOf(kSample);
-        assert.deepEqual(file.labelOfPerson(1), { birth: "1809", death: "1882", details: [] });
-        assert.equal(file.labelOfPerson(1, ["dates"]).birth, "12 FEB 1809");
+        assert.deepEqual(file.labelOfPerson(1), {
+            given: "Charles Robert",
+            surname: "Darwin",
+            surnameFirst: false,
+            birth: "1809",
+            death: "1882",
+            details: [],
+            lines: ["* 1809", "† 1882"],
+            shortLines: ["* 1809", "† 1882"],
+            life: "1809–1882",
+        });
+        assert.equal(file.labelOfPerson(1, ["dates"]).birth, "12 Feb 1809");
+        assert.deepEqual(file.labelOfPerson(1, ["dates"], "de").lines, ["* 12. Feb. 1809", "† 19. Apr. 1882"]);
+        assert.deepEqual(file.labelsOfPersons([2, 1]), [file.labelOfPerson(2), file.labelOfPerson(1)]);
         const family = file.persons[0].coupleFamilies[0];
         assert.equal(file.labelOfFamily(family), "");
         assert.equal(file.labelOfFamily(family, ["marriage"]), file.families[family - 1].marriage.shown);

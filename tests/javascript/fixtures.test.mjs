@@ -39,6 +39,36 @@ test("a period is distinguished from an uncertain date", () => {
     }
 });
 
+test("dates, lives and places have the words of the rows", async () => {
+    const { dates, lives, places } = await rowsOf("dates.json");
+    const { texts } = olvane;
+    const birthOf = (written) => {
+        if (written === "") return null;
+        const text = `0 HEAD\n1 CHAR UTF-8\n0 @I1@ INDI\n1 BIRT\n2 DATE ${written}\n0 TRLR\n`;
+        return olvane.readGedcom(new TextEncoder().encode(text)).persons[0].birth;
+    };
+    for (const language of LANGUAGES) {
+        for (const row of dates) assert.equal(texts.dateText(row.written, language), row[language]);
+        for (const { birth, death, years } of lives)
+            assert.equal(texts.yearsText(birthOf(birth), birthOf(death), language), years[language]);
+    }
+    for (const { written, shown } of places) assert.equal(texts.placeText(written), shown);
+    assert.deepEqual(
+        ["en", "de-AT", "es", "fr"].map((language) => texts.unnamedText(language)),
+        ["Name not known", "Name unbekannt", "Nombre desconocido", "Name not known"],
+    );
+});
+
+test("facts for a reader stand in the order of a life, all others as in the file", async () => {
+    const { order } = await rowsOf("dates.json");
+    const lines = order.facts.map(([tag, date]) => `1 ${tag}\n${date && `2 DATE ${date}\n`}`);
+    const text = `0 HEAD\n1 CHAR UTF-8\n0 @I1@ INDI\n${lines.join("")}0 TRLR\n`;
+    const file = olvane.readGedcom(new TextEncoder().encode(text));
+    const listed = (facts) => facts.map(({ tag, date }) => [tag, date?.written ?? ""]);
+    assert.deepEqual(listed(file.detailsOfPerson(1).facts), order.lived);
+    assert.deepEqual(listed(file.factsOfPerson(1)), order.facts);
+});
+
 test("kinship has the words of the rows", () => {
     for (const row of persons.kinship) {
         const [from, to] = [personOf(row.from).id, personOf(row.to).id];

@@ -1,49 +1,66 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// What a language must say about dates and facts. All grammar stands in the tables: the callers know no case,
-// gender or order of words.
+// The words of a language about persons: names of facts from the page's tables, everything else from the module, which has
+// the words of pictures as well.
 
-import type { GedcomDate } from "olvane";
+import type { Person, Texts } from "olvane";
 import { english } from "./messages/en";
 import { german } from "./messages/de";
 import { spanish } from "./messages/es";
 
-export { english, german, spanish };
+/** By GEDCOM tag. */
+export type FactNames = Readonly<Record<string, string>>;
 
-/** Every language of dates and facts; relatives have their words in the module. */
-export const languages = [english, german, spanish] as const;
+/** Every language of names of facts, by its code. */
+export const factLanguages: Readonly<Record<string, FactNames>> = { en: english, de: german, es: spanish };
 
-/** Of a date, or of a time that lasted. */
-export type DateMark = GedcomDate["mark"] | "since" | "until" | "lasting";
-
-/** Dates that were read; months count from 1, and years before Christ are negative. */
-export interface DateWords {
-    /** "12 February 1809", "February 1809", "1809"; 0 for a month or day that is not given. */
-    day(year: number, month: number, day: number): string;
-    /** Puts the mark of a date before its text: "about 1809", "between 1809 and 1811", "until 1811". */
-    marked(mark: DateMark, first: string, last: string): string;
-    /** "born about 1809" */
-    born(date: string): string;
-    died(date: string): string;
-}
-
-export interface Messages {
+export class Messages {
     /** As in the lang attribute: "en", "de". */
     readonly language: string;
-    readonly unknownName: string;
-    readonly dates: DateWords;
-    /** By GEDCOM tag. */
-    readonly facts: Readonly<Record<string, string>>;
-}
 
-/** The table for a language tag such as "de-AT"; English for a language that has none. */
-export function messagesFor(languageTag: string): Messages {
-    const language = languageTag.toLowerCase().split(/[-_]/)[0];
-    return languages.find((messages) => messages.language === language) ?? english;
-}
+    /**
+     * For a language tag such as "de-AT"; English for a language that has no table. The module's texts are asked for where
+     * there is somebody to speak of.
+     */
+    constructor(
+        languageTag: string,
+        private readonly textsOfModule: () => Texts,
+    ) {
+        const language = languageTag.toLowerCase().split(/[-_]/)[0]!;
+        this.language = Object.hasOwn(factLanguages, language) ? language : "en";
+    }
 
-/** The name of a fact; the tag itself where the table has none. */
-export function factLabel(tag: string, messages: Messages): string {
-    return Object.hasOwn(messages.facts, tag) ? messages.facts[tag]! : tag;
+    private get texts(): Texts {
+        return this.textsOfModule();
+    }
+
+    /** The name to show, and a word for one who has none. */
+    nameOf(person: Person): string {
+        return person.shownName || this.unknownName;
+    }
+
+    get unknownName(): string {
+        return this.texts.unnamedText(this.language);
+    }
+
+    /** "1809–1882", "about 1809 – 1882", "born 1809"; empty where neither year is known. */
+    yearsOf(person: Person): string {
+        return this.texts.yearsText(person.birth, person.death, this.language);
+    }
+
+    /** "12 Feb 1809" for a date as the file writes it. */
+    dateText(written: string): string {
+        return this.texts.dateText(written, this.language);
+    }
+
+    placeText(place: string): string {
+        return this.texts.placeText(place);
+    }
+
+    /** The name of a fact; the tag itself where the table has none. */
+    factLabel(tag: string): string {
+        const facts = factLanguages[this.language]!;
+        return Object.hasOwn(facts, tag) ? facts[tag]! : tag;
+    }
 }

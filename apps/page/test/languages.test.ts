@@ -5,7 +5,7 @@
 
 import assert from "node:assert/strict";
 import { test } from "node:test";
-import { english, languages } from "../src/messages";
+import { factLanguages } from "../src/messages";
 import { uiLanguages } from "../src/messages/ui";
 
 type Table = Readonly<Record<string, unknown>>;
@@ -39,10 +39,11 @@ test("no language lacks a word of the interface", () => {
     }
 });
 
-test("no language lacks a word for dates and facts, and each language of the interface has them", () => {
-    for (const table of languages) assert.deepEqual(missing(table, english), [], `${table.language} lacks these words`);
-    assert.deepEqual(
-        languages.map(({ language }) => language).sort(),
-        uiLanguages.map(({ language }) => language).sort(),
-    );
+test("no language lacks the name of a fact, and each language of the interface has them", () => {
+    for (const [language, facts] of Object.entries(factLanguages)) {
+        assert.deepEqual(missing(facts, factLanguages["en"]!), [], `${language} lacks these words`);
+        assert.deepEqual(missing(factLanguages["en"]!, facts), [], `English lacks these words of ${language}`);
+        assert.deepEqual(emptyTexts(facts), [], `${language} has no text for these words`);
+    }
+    assert.deepEqual(Object.keys(factLanguages).sort(), uiLanguages.map(({ language }) => language).sort());
 });

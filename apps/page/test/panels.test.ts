@@ -6,38 +6,11 @@
 import "./stillBrowser";
 import assert from "node:assert/strict";
 import { test } from "node:test";
-import type { DetailedFact, Fact, SearchReason } from "olvane";
+import type { DetailedFact, SearchReason } from "olvane";
 import { wordsInName } from "../src/shell/searchReasons";
 import { ownNameOf, webAddress } from "../src/ui/DetailView";
-import { inLifeOrder } from "../src/ui/lifeOrder";
 import { type KeyActions, pictureKey } from "../src/ui/pictureKeys";
-import { date, person } from "./persons";
-
-function fact(tag: string, year = 0, more: Partial<Fact> = {}): Fact {
-    return { tag, value: "", date: year ? date(year) : null, place: "", ...more };
-}
-
-test("facts stand in the order of a life, whatever order the file has them in", () => {
-    const given = [
-        fact("BURI", 1882),
-        fact("DEAT", 1882),
-        fact("OCCU"),
-        fact("RESI", 1842),
-        fact("GRAD", 1831, { date: date(1831, { month: 4 }) }),
-        fact("EDUC", 1831, { date: date(1831, { month: 1 }) }),
-        fact("RELI"),
-        fact("BIRT"),
-    ];
-    assert.deepEqual(
-        inLifeOrder(given).map(({ tag }) => tag),
-        ["BIRT", "EDUC", "GRAD", "RESI", "OCCU", "RELI", "BURI", "DEAT"],
-    );
-});
-
-test("facts of one date stay as the file has them", () => {
-    const given = [fact("RESI", 1842), fact("CENS", 1842), fact("OCCU", 1842)];
-    assert.deepEqual(inLifeOrder(given), given);
-});
+import { person } from "./persons";
 
 test("only addresses of the web become links", () => {
     assert.equal(webAddress(" https://example.org/a b "), "https://example.org/a%20b");

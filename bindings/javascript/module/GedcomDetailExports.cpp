@@ -9,6 +9,7 @@
 #include <string>
 
 #include <olvane/gedcom/GedcomDetails.h>
+#include <olvane/gedcom/LifeOrder.h>
 
 #include "GedcomJson.h"
 #include "OpenFile.h"
@@ -20,10 +21,10 @@ namespace {
 
 void appendFacts(JsonText& json, const gedcom::GedcomData& data, std::span<const gedcom::Fact> facts) {
     json.begin();
-    for (const gedcom::Fact& fact : facts) {
+    for (const gedcom::Fact* fact : gedcom::inLifeOrder(facts)) {
         json.begin();
-        appendFact(json, fact);
-        appendDetails(json, gedcom::factDetails(data, fact));
+        appendFact(json, *fact);
+        appendDetails(json, gedcom::factDetails(data, *fact));
         json.end();
     }
     json.end();

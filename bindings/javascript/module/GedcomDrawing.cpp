@@ -22,6 +22,7 @@
 #include <olvane/draw/Paper.h>
 #include <olvane/draw/PaperDrawing.h>
 #include <olvane/draw/SvgDrawing.h>
+#include <olvane/picture/TextMetrics.h>
 #include <olvane/source/GedcomLabels.h>
 
 #include "JsonText.h"
@@ -60,7 +61,7 @@ void addPhotos(draw::DrawingContent& content, std::string_view photos) {
 
 draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, unsigned facts,
                                const char* photos) {
-    gedcom::GedcomLabels labels(file.data, factsOf(facts));
+    gedcom::GedcomLabels labels(file.data, factsOf(facts), {}, request.view.chart.language);
     draw::DrawingContent content;
     content.picture = pictureOf(file, request);
     content.labelOf = [labels](std::int64_t id) { return labels.ofPerson(id); };
@@ -71,16 +72,38 @@ draw::DrawingContent contentOf(OpenFile& file, const PictureRequest& request, un
     return content;
 }
 
-std::string labelText(const kin::PersonLabel& label) {
-    JsonText json;
+std::string readable(std::string_view text) {
+    return picture::cleanText(picture::cutText(text));
+}
+
+void appendTexts(JsonText& json, const std::vector<std::string>& texts) {
     json.begin();
+    for (const std::string& text : texts) json.string(readable(text));
+    json.end();
+}
+
+// As a drawing has it.
+void appendLabel(JsonText& json, const kin::PersonLabel& label, kin::Language language) {
+    const bool isUnnamed = label.given.empty() && label.surname.empty();
+    json.begin();
+    json.string(isUnnamed ? kin::unnamedText(language) : readable(label.given));
+    json.string(readable(label.surname));
+    json.number(label.surnameFirst ? 1 : 0);
     json.string(label.birth);
     json.string(label.death);
-    json.begin();
-    for (const std::string& detail : label.details) json.string(detail);
+    appendTexts(json, label.details);
+    appendTexts(json, kin::lifeLines(label));
+    appendTexts(json, kin::shortLifeLines(label));
+    json.string(readable(kin::lifeWords(label)));
     json.end();
-    json.end();
-    return std::move(json).take();
+}
+
+kin::Language languageOf(const char* code) {
+    return kin::languageOf(code).value_or(kin::Language::english);
+}
+
+gedcom::GedcomLabels labelsOf(const OpenFile& file, unsigned facts, const char* language) {
+    return gedcom::GedcomLabels(file.data, factsOf(facts), {}, languageOf(language));
 }
 
 enum class Boxes : int { usual, tall, wide };
@@ -239,19 +262,29 @@ OLVANE_EXPORT("paper_names") const char* paperNames() {
     return js::textOrRefusal([] { return js::linesOf(draw::paperNames()); });
 }
 
-// Birth, death and further lines of a person's box; facts as for gedcom_svg.
-OLVANE_EXPORT("gedcom_person_label")
-const char* gedcomPersonLabel(const js::OpenFile* file, std::uint32_t id, unsigned facts) {
-    return js::textOrRefusal(
-        [&] { return js::labelText(gedcom::GedcomLabels(file->data, js::factsOf(facts)).ofPerson(id)); });
+// What the boxes of some persons say beside their names; facts as for gedcom_svg, language is a code. JSON: birth, death,
+// further lines, birth and death as lines, and in words; before them the parts of the name and whether the surname is first.
+OLVANE_EXPORT("gedcom_person_labels")
+const char* gedcomPersonLabels(const js::OpenFile* file, const std::uint32_t* ids, std::uint32_t count,
+                               unsigned facts, const char* language) {
+    return js::textOrRefusal([&] {
+        const gedcom::GedcomLabels labels = js::labelsOf(*file, facts, language);
+        js::JsonText json;
+        json.begin();
+        for (std::uint32_t i = 0; i < count; ++i)
+            js::appendLabel(json, labels.ofPerson(ids[i]), js::languageOf(language));
+        json.end();
+        return std::move(json).take();
+    });
 }
 
 // What stands at a marriage line, as a JSON text.
 OLVANE_EXPORT("gedcom_family_label")
-const char* gedcomFamilyLabel(const js::OpenFile* file, std::uint32_t number, unsigned facts) {
+const char* gedcomFamilyLabel(const js::OpenFile* file, std::uint32_t number, unsigned facts,
+                              const char* language) {
     return js::textOrRefusal([&] {
         js::JsonText json;
-        json.string(gedcom::GedcomLabels(file->data, js::factsOf(facts)).ofFamily(number));
+        json.string(js::labelsOf(*file, facts, language).ofFamily(number));
         return std::move(json).take();
     });
 }

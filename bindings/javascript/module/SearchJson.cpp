@@ -27,6 +27,7 @@ std::string searchJson(const kin::PersonIndex& index, const kin::SearchTexts& te
             json.string(written.text);
             json.string(written.word);
             json.string(written.label);
+            json.number(written.isDate ? 1 : 0);
             json.end();
         }
         json.end();

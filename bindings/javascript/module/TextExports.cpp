@@ -1,16 +1,20 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Measuring and fitting of texts, as pictures have it; those texts are cut first, as in a picture. And their folding.
+// Measuring and fitting of texts, as pictures have it; those texts are cut first, as in a picture. Their folding, and dates
+// and places in words.
 
 #include <algorithm>
 #include <cmath>
 #include <cstddef>
+#include <cstdint>
 #include <exception>
 #include <string>
 #include <string_view>
 
+#include <olvane/gedcom/DateText.h>
 #include <olvane/kin/Folding.h>
+#include <olvane/kin/PersonLabel.h>
 #include <olvane/picture/TextFit.h>
 
 #include "OpenFile.h"
@@ -101,6 +105,39 @@ OLVANE_EXPORT("folded_words") const char* foldedWords(const char* text) {
             folded += '\n';
             rest.remove_prefix(end + 1);
         }
+    });
+}
+
+// As dateText; language is a code.
+OLVANE_EXPORT("date_text") const char* dateText(const char* written, const char* language) {
+    return answered(
+        [&] { return readable(gedcom::dateText(gedcom::parseGedcomDate(written), language).c_str()); });
+}
+
+OLVANE_EXPORT("place_text") const char* placeText(const char* place) {
+    return answered([&] { return readable(gedcom::placeText(place).c_str()); });
+}
+
+// As yearsText; marks are numbers of DateMark, and a year of 0 is not known.
+OLVANE_EXPORT("years_text")
+const char* yearsText(int birth, int birthLast, int birthMark, int death, int deathLast, int deathMark,
+                      const char* language) {
+    const auto date = [](int year, int last, int mark) {
+        gedcom::GedcomDate read;
+        read.year = static_cast<std::int16_t>(year);
+        read.lastYear = static_cast<std::int16_t>(last);
+        read.mark = static_cast<gedcom::DateMark>(mark);
+        return read;
+    };
+    return answered([&] {
+        return gedcom::yearsText(date(birth, birthLast, birthMark), date(death, deathLast, deathMark),
+                                 language);
+    });
+}
+
+OLVANE_EXPORT("unnamed_text") const char* unnamedText(const char* language) {
+    return answered([&] {
+        return std::string(kin::unnamedText(kin::languageOf(language).value_or(kin::Language::english)));
     });
 }
 

@@ -86,9 +86,9 @@ void appendPhoto(std::string& svg, const BoxFrame& box) {
 }
 
 std::string titleOf(const BoxFrame& box, const kin::PersonLabel& label) {
-    std::string title = fullNameIn(label, box.language);
-    if (!label.living && !label.birth.empty()) put(title, ", * ", label.birth);
-    if (!label.living && !label.death.empty()) put(title, ", \xE2\x80\xA0 ", label.death);
+    std::string title = kin::fullName(label, box.language);
+    const std::string life = kin::lifeWords(label);
+    if (!life.empty()) put(title, ", ", life);
     if (!label.living) {
         for (const std::string& detail : label.details) put(title, ", ", detail);
     }
@@ -111,11 +111,11 @@ void openBox(std::string& svg, const BoxFrame& box, const std::string& title) {
 kin::PersonLabel shownLabel(const kin::PersonLabel& label, kin::Language language) {
     if (!label.living) {
         kin::PersonLabel shown = label;
-        if (shown.given.empty() && shown.surname.empty()) shown.given = "?";
+        if (shown.given.empty() && shown.surname.empty()) shown.given = kin::unnamedText(language);
         return shown;
     }
     kin::PersonLabel shown;
-    shown.given = wordsOf(Phrase::living, language);
+    shown.given = kin::livingText(language);
     shown.living = true;
     return shown;
 }
@@ -124,7 +124,7 @@ kin::PersonLabel shownLabel(const kin::PersonLabel& label, kin::Language languag
 
 kin::PersonLabel readableLabel(const DrawingContent& content, std::int64_t id) {
     kin::PersonLabel label = content.labelOf(id);
-    for (std::string* text : {&label.given, &label.surname, &label.birth, &label.death})
+    for (std::string* text : {&label.given, &label.surname, &label.birth, &label.death, &label.life})
         *text = picture::cutText(*text);
     for (std::string& detail : label.details) detail = picture::cutText(detail);
     return label;

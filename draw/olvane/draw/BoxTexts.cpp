@@ -115,23 +115,39 @@ picture::FittedName nameOf(const kin::PersonLabel& label, const TextRoom& room, 
     return picture::fitName(cleanText(label.given), cleanText(label.surname), label.surnameFirst, names);
 }
 
-// Years in one line if they fit, then as many details as leave room for two lines of a name.
-std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
-    const Font font{room.yearsSize, false};
-    std::vector<std::string> years;
-    if (!label.birth.empty()) years.push_back("* " + cleanText(label.birth));
-    if (!label.death.empty()) years.push_back("\xE2\x80\xA0 " + cleanText(label.death));
+std::vector<std::string> cleanTexts(std::vector<std::string> lines) {
+    for (std::string& line : lines) line = cleanText(line);
+    return lines;
+}
+
+// How many details have room beside that number of lines and two lines of a name.
+std::size_t detailsBelow(std::size_t lines, const kin::PersonLabel& label, const TextRoom& room) {
     const double spare = room.bottom - room.top - room.leastNameHeight();
     const auto most = static_cast<std::size_t>(std::max(0.0, spare / room.yearsPitch));
-    const auto detailsBelow = [&](std::size_t lines) {
-        return std::min(label.details.size(), most - std::min(most, lines));
-    };
-    if (years.size() == 2) {
-        const std::string both = years[0] + "  " + years[1];
-        if (textWidth(both, font) <= room.widthOfFact(detailsBelow(1))) years = {both};
+    return std::min(label.details.size(), most - std::min(most, lines));
+}
+
+// Birth and death in one line if they fit, else each in its own, or in fewer letters where that has no room.
+std::vector<std::string> lifeLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
+    const Font font{room.yearsSize, false};
+    const std::string both = cleanText(kin::lifeLine(label));
+    if (both.empty()) return {};
+    if (textWidth(both, font) <= room.widthOfFact(detailsBelow(1, label, room))) return {both};
+    std::vector<std::string> lines = cleanTexts(kin::lifeLines(label));
+    std::vector<std::string> shorter = cleanTexts(kin::shortLifeLines(label));
+    const std::size_t below = detailsBelow(lines.size(), label, room);
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        if (textWidth(lines[i], font) > room.widthOfFact(below + lines.size() - 1 - i))
+            lines[i] = std::move(shorter[i]);
     }
-    std::vector<std::string> lines = std::move(years);
-    const std::size_t details = detailsBelow(lines.size());
+    return lines;
+}
+
+// Birth and death, then as many details as leave room for two lines of a name.
+std::vector<std::string> factLinesOf(const kin::PersonLabel& label, const TextRoom& room) {
+    const Font font{room.yearsSize, false};
+    std::vector<std::string> lines = lifeLinesOf(label, room);
+    const std::size_t details = detailsBelow(lines.size(), label, room);
     for (std::size_t i = 0; i < details; ++i) lines.push_back(cleanText(label.details[i]));
     for (std::size_t i = 0; i < lines.size(); ++i) {
         lines[i] = fitLine(lines[i], font, room.widthOfFact(lines.size() - 1 - i));

@@ -10,7 +10,6 @@
 #include <string_view>
 
 #include <olvane/kin/Language.h>
-#include <olvane/kin/PersonLabel.h>
 
 namespace olvane::draw {
 
@@ -19,8 +18,6 @@ enum class Phrase : std::uint8_t {
     viewOf,
     nobody,
     legend,
-    living,
-    nameNotKnown,
     focus,
     commonAncestor,
     inBoxes,
@@ -59,7 +56,7 @@ enum class Phrase : std::uint8_t {
     sheet,
     toSheet,
 };
-inline constexpr std::size_t kPhrases = 42;
+inline constexpr std::size_t kPhrases = 40;
 
 // A phrase without arguments, or with its {} as they are.
 std::string_view wordsOf(Phrase phrase, kin::Language language);
@@ -70,8 +67,5 @@ std::string phraseWith(Phrase phrase, kin::Language language,
 
 // "Family" for the view "family"; a view of another name is called by it.
 std::string viewTitle(std::string_view view, kin::Language language);
-
-// As kin::fullName, in that language where the name is not known or hidden.
-std::string fullNameIn(const kin::PersonLabel& label, kin::Language language);
 
 }  // namespace olvane::draw

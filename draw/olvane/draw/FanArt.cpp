@@ -139,20 +139,11 @@ private:
         svg_.boxes.push_back({area, start, svg_.svg.size() - start});
     }
 
-    static std::string yearsOf(const kin::PersonLabel& label) {
-        std::string years;
-        if (label.living) return years;
-        if (!label.birth.empty()) years = "* " + cleanText(label.birth);
-        if (!label.death.empty())
-            put(years, (years.empty() ? "" : "  "), ("\xE2\x80\xA0 " + cleanText(label.death)));
-        return years;
-    }
-
     std::string titleOf(const kin::PersonLabel& label, bool isFocus,
                         const std::vector<BoxMark>& marks) const {
-        std::string title = fullNameIn(label, options_.language);
-        const std::string years = yearsOf(label);
-        if (!years.empty()) put(title, ", ", years);
+        std::string title = kin::fullName(label, options_.language);
+        const std::string life = cleanText(kin::lifeWords(label));
+        if (!life.empty()) put(title, ", ", life);
         if (isFocus) title += wordsOf(Phrase::focus, options_.language);
         for (const BoxMark& mark : marks) put(title, ". ", mark.title);
         return title;
@@ -162,14 +153,13 @@ private:
     FanText textOf(const kin::PersonLabel& label, const std::vector<BoxMark>& marks) const {
         FanText text;
         if (label.living) {
-            text.given = wordsOf(Phrase::living, options_.language);
+            text.given = kin::livingText(options_.language);
         } else {
             text.given = cleanText(label.given);
             text.surname = cleanText(label.surname);
             text.surnameFirst = label.surnameFirst;
-            if (text.given.empty() && text.surname.empty()) text.given = "?";
-            if (!label.birth.empty()) text.facts.push_back("* " + cleanText(label.birth));
-            if (!label.death.empty()) text.facts.push_back("\xE2\x80\xA0 " + cleanText(label.death));
+            if (text.given.empty() && text.surname.empty()) text.given = kin::unnamedText(options_.language);
+            for (const std::string& line : kin::lifeLines(label)) text.facts.push_back(cleanText(line));
         }
         std::string signs;
         for (const BoxMark& mark : marks) put(signs, (signs.empty() ? "" : " "), mark.text);
@@ -211,7 +201,8 @@ private:
                 put(legend, "<rect x=\"", whole(kMargin), "\" y=\"", whole(y),
                     "\" width=\"28\" height=\"14\" fill=\"", fillOf(box), "\" stroke=\"", theme().line,
                     "\"/>\n");
-                name = cleanText(fullNameIn(readableLabel(content_, fan_.boxes[box].id), options_.language));
+                name =
+                    cleanText(kin::fullName(readableLabel(content_, fan_.boxes[box].id), options_.language));
             } else {
                 put(legend, "<text x=\"", whole(kMargin + 14), "\" y=\"", whole(y + 11),
                     "\" text-anchor=\"middle\" font-size=\"", number(kLegendSize), "\" fill=\"", theme().text,

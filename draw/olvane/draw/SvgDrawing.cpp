@@ -175,9 +175,9 @@ private:
     }
 
     std::string nameOfChild(const picture::Box& unknown) const {
-        if (unknown.childOf == picture::kNone) return fullNameIn(kin::PersonLabel(), options_.language);
+        if (unknown.childOf == picture::kNone) return kin::fullName(kin::PersonLabel(), options_.language);
         const picture::Box& child = content_.picture.boxes[static_cast<std::size_t>(unknown.childOf)];
-        return fullNameIn(
+        return kin::fullName(
             child.kind == picture::BoxKind::person ? readableLabel(content_, child.id) : kin::PersonLabel(),
             options_.language);
     }
@@ -272,7 +272,7 @@ std::string titleOf(std::string_view view, const DrawingContent& content, kin::L
     const picture::Index focus = content.picture.focus;
     if (focus == picture::kNone) return title;
     const std::int64_t id = content.picture.boxes[static_cast<std::size_t>(focus)].id;
-    return phraseWith(Phrase::viewOf, language, {title, fullNameIn(content.labelOf(id), language)});
+    return phraseWith(Phrase::viewOf, language, {title, kin::fullName(content.labelOf(id), language)});
 }
 
 SvgPicture drawSvg(const DrawingContent& content, const DrawingOptions& options) {

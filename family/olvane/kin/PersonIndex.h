@@ -132,6 +132,7 @@ struct WrittenReason {
     std::string text;   // "Kew, Surrey, England"; empty for an identifier
     std::string word;   // the word of it that was found, "Surrey"; of a date the whole
     std::string label;  // as in SearchText
+    bool isDate = false;
 };
 
 // Reads the record of a hit again. texts are those that the index was made of.

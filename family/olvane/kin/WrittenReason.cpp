@@ -36,7 +36,7 @@ WrittenReason writtenReason(const SearchTexts& texts, const SearchHit& hit, cons
         if (!found.text.empty() || text.in != reason.in || text.in == FoundIn::identifier) return;
         const std::string_view word = text.isDate ? text.text : foundWord(text, reason);
         if (word.empty() || (text.isDate && !holdsYears(text, wanted))) return;
-        found = {std::string(text.text), std::string(word), std::string(text.label)};
+        found = {std::string(text.text), std::string(word), std::string(text.label), text.isDate};
     });
     return found;
 }

@@ -84,7 +84,9 @@ bool readDualYear(std::string_view first, std::string_view second, ReadDate& res
     const int modulus = second.size() <= 2 ? (second.size() == 1 ? 10 : 100) : 10000;
     const bool fits = (*year + 1) % modulus == *later;
     result.date.year = fits ? *year + 1 : *year;
+    result.earlierYear = fits ? *year : 0;
     result.doubtful = !fits;
+    result.shortened = !fits;
     return true;
 }
 

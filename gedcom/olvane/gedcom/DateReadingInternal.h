@@ -18,6 +18,9 @@ struct ReadDate {
     CalendarDate date;
     bool doubtful = false;
     bool yearAlone = false;  // day and month are there, in an order that is not certain
+    bool shortened =
+        false;  // something that is written cannot be: a 31st of February, a second year that does not follow
+    int earlierYear = 0;  // of a year with two forms, whose later one is the date's; 0 for a year with one
 };
 
 // Reads [calendar] [weekday] [[day] month] year [B.C.], or a date in numbers. Empty where the words are no date; how many

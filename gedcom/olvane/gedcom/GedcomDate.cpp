@@ -12,17 +12,39 @@
 #include <olvane/gedcom/CalendarDaysInternal.h>
 #include <olvane/gedcom/DateReadingInternal.h>
 #include <olvane/gedcom/MonthCodesInternal.h>
+#include <olvane/gedcom/WrittenDateInternal.h>
 
 namespace olvane::gedcom {
 namespace {
 
-int gregorianYear(const ReadDate& read) {
-    return toGregorian(read.calendar, read.date).year;
+DateMark markOf(DateForm form) {
+    switch (form) {
+        case DateForm::about:
+        case DateForm::calculated:
+        case DateForm::estimated:
+            return DateMark::about;
+        case DateForm::before:
+        case DateForm::until:
+            return DateMark::before;
+        case DateForm::after:
+        case DateForm::since:
+            return DateMark::after;
+        case DateForm::between:
+        case DateForm::lasting:
+            return DateMark::between;
+        case DateForm::exact:
+            break;
+    }
+    return DateMark::exact;
+}
+
+bool isInBounds(const CalendarDate& date) {
+    return date.year <= kLastYear && date.year >= -kLastYear;
 }
 
 void store(const ReadDate& read, DateMark mark, GedcomDate& date) {
     const CalendarDate gregorian = toGregorian(read.calendar, read.date);
-    if (gregorian.year > kLastYear || gregorian.year < -kLastYear) return;
+    if (!isInBounds(gregorian)) return;
     date.year = static_cast<std::int16_t>(gregorian.year);
     date.month = static_cast<std::uint8_t>(gregorian.month);
     date.day = static_cast<std::uint8_t>(gregorian.day);
@@ -30,31 +52,52 @@ void store(const ReadDate& read, DateMark mark, GedcomDate& date) {
     date.isYearAlone = read.yearAlone;
 }
 
+void store(const WrittenDate& written, GedcomDate& date) {
+    store(written.first, markOf(written.form), date);
+    if (!written.last || date.year == 0) return;
+    const CalendarDate last = toGregorian(written.last->calendar, written.last->date);
+    if (isInBounds(last)) date.lastYear = static_cast<std::int16_t>(last.year);
+}
+
 bool onlyPhraseLeft(const WordScanner& words) {
     return words.atEnd() || words.front() == '(';
 }
 
 // The date, and the end of the range if one follows the joining word.
-void readRange(WordScanner& words, std::string_view joiningWord, DateMark markWithoutEnd, GedcomDate& date) {
+std::optional<WrittenDate> readRange(WordScanner& words, std::string_view joiningWord, DateForm withoutEnd,
+                                     DateForm withEnd) {
     const auto first = takeDate(words);
-    if (!first) return;
-    if (words.atEnd()) return store(*first, markWithoutEnd, date);
-    if (!words.skipIf({joiningWord})) return;
+    if (!first) return {};
+    WrittenDate date{withoutEnd, *first, {}, {}, true};
+    if (words.atEnd()) return date;
+    if (!words.skipIf({joiningWord})) return {};
     const auto last = takeDate(words);
-    if (!last || !onlyPhraseLeft(words)) return store(*first, DateMark::after, date);
-    store(*first, DateMark::between, date);
-    const int lastYear = gregorianYear(*last);
-    if (date.year != 0 && lastYear >= -kLastYear && lastYear <= kLastYear) {
-        date.lastYear = static_cast<std::int16_t>(lastYear);
-    }
+    date.isWhole = last && onlyPhraseLeft(words);
+    if (!date.isWhole) return date;
+    date.form = withEnd;
+    date.last = last;
+    date.phrase = words.rest();
+    return date;
 }
 
-void readSingle(WordScanner& words, DateMark mark, GedcomDate& date) {
+std::optional<WrittenDate> readSingle(WordScanner& words, DateForm form) {
     const auto read = takeDate(words);
-    if (read && onlyPhraseLeft(words)) store(*read, mark, date);
+    if (!read || !onlyPhraseLeft(words)) return {};
+    return WrittenDate{form, *read, {}, words.rest(), true};
 }
 
-enum class Qualifier : unsigned char { none, between, from, before, after, about, interpreted };
+enum class Qualifier : unsigned char {
+    none,
+    between,
+    from,
+    to,
+    before,
+    after,
+    about,
+    calculated,
+    estimated,
+    interpreted
+};
 
 struct QualifierWord {
     std::string_view word;
@@ -64,8 +107,8 @@ struct QualifierWord {
 // The standard's words first, then what people write.
 constexpr QualifierWord kQualifiers[] = {
     {"ABT", Qualifier::about},       {"BEF", Qualifier::before},    {"AFT", Qualifier::after},
-    {"BET", Qualifier::between},     {"FROM", Qualifier::from},     {"TO", Qualifier::before},
-    {"CAL", Qualifier::about},       {"EST", Qualifier::about},     {"INT", Qualifier::interpreted},
+    {"BET", Qualifier::between},     {"FROM", Qualifier::from},     {"TO", Qualifier::to},
+    {"CAL", Qualifier::calculated},  {"EST", Qualifier::estimated}, {"INT", Qualifier::interpreted},
     {"BETWEEN", Qualifier::between}, {"BEFORE", Qualifier::before}, {"VOR", Qualifier::before},
     {"AVANT", Qualifier::before},    {"VOOR", Qualifier::before},   {"ANTES", Qualifier::before},
     {"AFTER", Qualifier::after},     {"NACH", Qualifier::after},    {"APRES", Qualifier::after},
@@ -88,34 +131,34 @@ Qualifier takeQualifier(WordScanner& words) {
 }
 
 // "1850-1860", which the standard has no word for.
-bool readYearRange(std::string_view word, GedcomDate& date) {
+std::optional<WrittenDate> readYearRange(std::string_view word) {
     constexpr std::size_t kYearDigits = 4;
-    if (word.size() != 2 * kYearDigits + 1 || word[kYearDigits] != '-') return false;
+    if (word.size() != 2 * kYearDigits + 1 || word[kYearDigits] != '-') return {};
     const auto first = wholeNumber(word.substr(0, kYearDigits), kYearDigits);
     const auto last = wholeNumber(word.substr(kYearDigits + 1), kYearDigits);
-    if (!first || !last || *first == 0 || *last < *first) return false;
-    date.year = static_cast<std::int16_t>(*first);
-    date.lastYear = static_cast<std::int16_t>(*last);
-    date.mark = DateMark::between;
-    return true;
+    if (!first || !last || *first == 0 || *last < *first) return {};
+    WrittenDate date{DateForm::between, {}, ReadDate{}, {}, true};
+    date.first.date.year = *first;
+    date.last->date.year = *last;
+    return date;
 }
 
 // Takes the signs off that some programs set around a date or before it: "<1590>", "[1590]" and "~1590" are about that
 // year, "<1590" is before it and ">1590" after it.
-DateMark takeSigns(std::string_view& text) {
+DateForm takeSigns(std::string_view& text) {
     while (!text.empty() && isSpace(text.front())) text.remove_prefix(1);
     while (!text.empty() && isSpace(text.back())) text.remove_suffix(1);
-    if (text.size() < 2) return DateMark::exact;
+    if (text.size() < 2) return DateForm::exact;
     const char first = text.front();
     const char last = text.back();
     if ((first == '<' && last == '>') || (first == '[' && last == ']')) {
         text = text.substr(1, text.size() - 2);
-        return DateMark::about;
+        return DateForm::about;
     }
-    if (first != '<' && first != '>' && first != '~') return DateMark::exact;
+    if (first != '<' && first != '>' && first != '~') return DateForm::exact;
     text.remove_prefix(1);
-    if (first == '~') return DateMark::about;
-    return first == '<' ? DateMark::before : DateMark::after;
+    if (first == '~') return DateForm::about;
+    return first == '<' ? DateForm::before : DateForm::after;
 }
 
 // Number of two or four digits, or 0 where other characters stand.
@@ -163,34 +206,40 @@ bool readStandardDate(std::string_view text, GedcomDate& date) {
 
 }  // namespace
 
+std::optional<WrittenDate> readWrittenDate(std::string_view text) {
+    const DateForm signs = takeSigns(text);
+    WordScanner words(text);
+    const Qualifier qualifier = signs != DateForm::exact ? Qualifier::none : takeQualifier(words);
+    switch (qualifier) {
+        case Qualifier::between:
+            return readRange(words, "AND", DateForm::after, DateForm::between);
+        case Qualifier::from:
+            return readRange(words, "TO", DateForm::since, DateForm::lasting);
+        case Qualifier::to:
+            return readSingle(words, DateForm::until);
+        case Qualifier::before:
+            return readSingle(words, DateForm::before);
+        case Qualifier::after:
+            return readSingle(words, DateForm::after);
+        case Qualifier::about:
+            return readSingle(words, DateForm::about);
+        case Qualifier::calculated:
+            return readSingle(words, DateForm::calculated);
+        case Qualifier::estimated:
+            return readSingle(words, DateForm::estimated);
+        case Qualifier::interpreted:
+        case Qualifier::none:
+            break;
+    }
+    const auto years = readYearRange(text);
+    return years ? years : readSingle(words, signs);
+}
+
 GedcomDate parseGedcomDate(std::string_view written) {
     GedcomDate date;
     date.written = written;
     if (readStandardDate(written, date)) return date;
-    std::string_view text = written;
-    const DateMark signs = takeSigns(text);
-    WordScanner words(text);
-    const Qualifier qualifier = signs != DateMark::exact ? Qualifier::none : takeQualifier(words);
-    switch (qualifier) {
-        case Qualifier::between:
-            readRange(words, "AND", DateMark::after, date);
-            break;
-        case Qualifier::from:
-            readRange(words, "TO", DateMark::after, date);
-            break;
-        case Qualifier::before:
-            readSingle(words, DateMark::before, date);
-            break;
-        case Qualifier::after:
-            readSingle(words, DateMark::after, date);
-            break;
-        case Qualifier::about:
-            readSingle(words, DateMark::about, date);
-            break;
-        case Qualifier::interpreted:
-        case Qualifier::none:
-            if (!readYearRange(text, date)) readSingle(words, signs, date);
-    }
+    if (const auto read = readWrittenDate(written)) store(*read, date);
     return date;
 }
 

@@ -49,8 +49,9 @@ GedcomDate parseGedcomDate(std::string_view written);
 // begin with "-" and count from 9999 down. Empty for a date that was not read. At most 12 bytes.
 std::string sortText(const GedcomDate& date);
 
-// The year for a person to read: "1819", "44 BC"; with marks "~1819", "<1819", ">1819", "1819-1825".
-// A date that was not read is given as written.
-std::string displayYear(const GedcomDate& date);
+// The year for a person to read, in as few letters as a box has room for: "1819", "44 BC"; with marks "~1819", "<1819",
+// ">1819", "1819-1825". A date that was not read is given as written. The language is a code as in DateText.h, which has
+// whole dates.
+std::string displayYear(const GedcomDate& date, std::string_view language = "en");
 
 }  // namespace olvane::gedcom

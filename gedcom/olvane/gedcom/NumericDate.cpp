@@ -86,6 +86,7 @@ std::optional<int> wholeNumber(std::string_view digits, std::size_t longest) {
 void dropImpossibleDay(ReadDate& result) {
     if (result.date.day < 1 ||
         result.date.day > daysInMonth(result.calendar, result.date.year, result.date.month)) {
+        result.shortened = result.shortened || result.date.day != 0;
         result.date.day = 0;
     }
 }

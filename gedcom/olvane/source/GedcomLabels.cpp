@@ -5,6 +5,8 @@
 
 #include <utility>
 
+#include <olvane/gedcom/DateText.h>
+
 namespace olvane::gedcom {
 
 namespace {
@@ -42,8 +44,9 @@ bool isSurnameFirst(const PersonName& name) {
     return name.written.starts_with('/') && !name.written.ends_with('/');
 }
 
-GedcomLabels::GedcomLabels(const GedcomData& data, ShownFacts shown, HiddenTexts hidden)
-    : data_(&data), shown_(shown), hidden_(std::move(hidden)) {}
+GedcomLabels::GedcomLabels(const GedcomData& data, ShownFacts shown, HiddenTexts hidden,
+                           kin::Language language)
+    : data_(&data), shown_(shown), hidden_(std::move(hidden)), language_(kin::languageCode(language)) {}
 
 kin::PersonLabel GedcomLabels::ofPerson(std::int64_t id) const {
     const auto person = static_cast<PersonId>(id);
@@ -56,25 +59,40 @@ kin::PersonLabel GedcomLabels::ofPerson(std::int64_t id) const {
 
 std::string GedcomLabels::ofFamily(FamilyId number) const {
     if (!shown_.marriage) return {};
-    const GedcomDate& marriage = data_->family(number).marriage;
-    if (place(marriage.written).empty()) return {};
-    return marriage.isRead() ? displayYear(marriage) : beginningOf(marriage.written);
+    return beginningOf(displayYear(shownDate(data_->family(number).marriage), language_));
 }
 
 kin::PersonLabel GedcomLabels::known(PersonId id) const {
     const Person& person = data_->person(id);
     kin::PersonLabel label;
     setName(data_->firstName(id), label);
-    label.birth = dateText(person.birth);
-    label.death = dateText(person.death);
+    addLife(person, label);
     label.sex = sexOf(person.sex);
     if (shown_.needFacts()) addDetails(id, label);
     return label;
 }
 
-std::string GedcomLabels::dateText(const GedcomDate& date) const {
-    if (place(date.written).empty()) return {};
-    return shown_.dates || !date.isRead() ? beginningOf(date.written) : displayYear(date);
+void GedcomLabels::addLife(const Person& person, kin::PersonLabel& label) const {
+    const GedcomDate birth = shownDate(person.birth);
+    const GedcomDate death = shownDate(person.death);
+    label.birth = boxText(birth);
+    label.death = boxText(death);
+    label.dead = person.dead;
+    if (shown_.dates) {
+        label.shortBirth = beginningOf(displayYear(birth, language_));
+        label.shortDeath = beginningOf(displayYear(death, language_));
+    }
+    label.life =
+        beginningOf(shown_.dates ? lifeText(birth, death, language_) : yearsText(birth, death, language_));
+}
+
+// Nothing where it must not be shown.
+GedcomDate GedcomLabels::shownDate(const GedcomDate& date) const {
+    return place(date.written).empty() ? GedcomDate() : date;
+}
+
+std::string GedcomLabels::boxText(const GedcomDate& date) const {
+    return beginningOf(shown_.dates ? dateText(date, language_) : displayYear(date, language_));
 }
 
 // Birth and death with their places, in the order of life, then the occupation.
@@ -87,9 +105,10 @@ void GedcomLabels::addDetails(PersonId id, kin::PersonLabel& label) const {
         if (fact.tag == "DEAT" && deathPlace.empty()) deathPlace = place(fact.place);
         if (fact.tag == "OCCU" && occupation.empty()) occupation = anyText(fact.value);
     }
-    if (shown_.places && !birthPlace.empty()) label.details.push_back("* " + beginningOf(birthPlace));
+    if (shown_.places && !birthPlace.empty())
+        label.details.push_back("* " + beginningOf(placeText(birthPlace)));
     if (shown_.places && !deathPlace.empty())
-        label.details.push_back("\xE2\x80\xA0 " + beginningOf(deathPlace));
+        label.details.push_back("\xE2\x80\xA0 " + beginningOf(placeText(deathPlace)));
     if (shown_.occupation && !occupation.empty()) label.details.push_back(beginningOf(occupation));
 }
 

@@ -16,7 +16,7 @@ namespace olvane::gedcom {
 
 // What boxes and lines say beside names and years.
 struct ShownFacts {
-    bool dates = false;       // as the file writes them, instead of years
+    bool dates = false;       // whole, instead of years
     bool places = false;      // of birth and death
     bool occupation = false;  // the first one
     bool marriage = false;    // its year, at the marriage line
@@ -39,7 +39,7 @@ struct HiddenTexts {
 // Whether a name is written, and so read, with the surname first: "/Nagy/ Ilona".
 bool isSurnameFirst(const PersonName& name);
 
-// What a file says of the persons and families of a picture.
+// What a file says of the persons and families of a picture, in the language of its reader.
 //
 // Holds: refers to the data, which must outlive it. Safe to ask on several threads. Texts are at most kMostLabelBytes
 //        long, and cut between two characters: a name in a file may be of any length.
@@ -48,7 +48,8 @@ class GedcomLabels {
 public:
     static constexpr std::size_t kMostLabelBytes = 4000;
 
-    explicit GedcomLabels(const GedcomData& data, ShownFacts shown = {}, HiddenTexts hidden = {});
+    explicit GedcomLabels(const GedcomData& data, ShownFacts shown = {}, HiddenTexts hidden = {},
+                          kin::Language language = kin::Language::english);
 
     // Of a hidden person, that they are living and nothing else.
     kin::PersonLabel ofPerson(std::int64_t id) const;
@@ -57,7 +58,9 @@ public:
 
 private:
     kin::PersonLabel known(PersonId id) const;
-    std::string dateText(const GedcomDate& date) const;
+    void addLife(const Person& person, kin::PersonLabel& label) const;
+    GedcomDate shownDate(const GedcomDate& date) const;
+    std::string boxText(const GedcomDate& date) const;
     void addDetails(PersonId id, kin::PersonLabel& label) const;
     std::string_view place(std::string_view text) const;
     std::string_view anyText(std::string_view text) const;
@@ -65,6 +68,7 @@ private:
     const GedcomData* data_;
     ShownFacts shown_;
     HiddenTexts hidden_;
+    std::string_view language_;
 };
 
 // What the map of a population says of each person of a file, by place: the first name, and the years of birth and death.

@@ -255,7 +255,7 @@ describe("looks", kTwoAtOnce, () => {
         const visit = await visitDarwins("#person=I1", { locale: "de-AT" });
         const { page } = visit;
         assert.equal(await page.evaluate(() => document.documentElement.lang), "de");
-        assert.match(await page.innerText("#side-panel"), /Geburt\s+12\. Februar 1809/);
+        assert.match(await page.innerText("#side-panel"), /Geburt\s+12\. Feb\. 1809/);
         assert.match(await visit.label("I2"), /^Emma Wedgwood, 1808–1896, Ehefrau und Cousine ersten Grades/);
         assert.match(await visit.label("I5"), /Großvater väterlicherseits/);
         await photograph(visit, "german");

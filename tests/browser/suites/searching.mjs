@@ -56,7 +56,13 @@ describe("searching", kTwoAtOnce, () => {
 
     test("places, titles and facts are found, and named as the record names them", async () => {
         const lines = ["0 @I1@ INDI", "1 NAME Ada /Byron/", "2 NICK Countess", "1 SEX F", "1 BIRT", "2 DATE 1815"];
-        lines.push("2 PLAC Marylebone,,London", "1 TITL Lady Lovelace", "1 OCCU Mathematician");
+        lines.push(
+            "2 PLAC Marylebone,,London",
+            "1 TITL Lady Lovelace",
+            "1 OCCU Mathematician",
+            "1 CENS",
+            "2 DATE 30 MAR 1851",
+        );
         const visit = await visitFamily(gedcom(...lines), { name: "ada.ged" });
         const reasonOf = async (text) => {
             await visit.page.fill("#search", text);
@@ -66,6 +72,7 @@ describe("searching", kTwoAtOnce, () => {
         assert.deepEqual(await reasonOf("lovelace"), ["Title: Lady Lovelace"]);
         assert.deepEqual(await reasonOf("matematician"), ["Occupation: Mathematician"]);
         assert.deepEqual(await reasonOf("countess"), ["Nickname: Countess"]);
+        assert.deepEqual(await reasonOf("1851"), ["Census: 30 Mar 1851"]);
         assert.deepEqual(await reasonOf("@I1@"), ["Record: I1"]);
         await photograph(visit, "search-reasons");
         await visit.end();

@@ -235,8 +235,8 @@ describe("walking", kTwoAtOnce, () => {
     test("the panel lists facts and kinship, and its relatives are links", async () => {
         const visit = await visitDarwins();
         const { page } = visit;
-        assert.match(await page.innerText("#side-panel"), /Birth\s+12 February 1809/);
-        assert.match(await page.innerText("#side-panel"), /Death\s+19 April 1882/);
+        assert.match(await page.innerText("#side-panel"), /Birth\s+12 Feb 1809/);
+        assert.match(await page.innerText("#side-panel"), /Death\s+19 Apr 1882/);
         await page.click('#side-panel a[data-person-id="2"]');
         await visit.still();
         assert.equal(await visit.focus(), "I1", "reading about a relative loses no place");

@@ -496,11 +496,24 @@ TEST_F(Picture, manyMarksOfOneBoxAreCounted) {
     EXPECT_EQ(countOf(svg, ">+7</text>"), 2u) << "at the child and at the parent";
 }
 
-TEST_F(Picture, nameNotKnownIsAQuestionMark) {
+TEST_F(Picture, nameNotKnownStandsInTheBox) {
     labels_[2] = kin::PersonLabel();
     const std::string svg = draw();
-    EXPECT_THAT(svg, HasSubstr(">?</text>"));
+    EXPECT_THAT(svg, HasSubstr(">Name not</text>"));
     EXPECT_THAT(svg, HasSubstr("<title>Name not known</title>"));
+}
+
+// A date of which no more than its first word has room says nothing.
+TEST_F(Picture, aDateWithoutRoomInItsBoxIsInFewerLetters) {
+    labels_[2] = label("Ada", "Lund");
+    labels_[2].birth = "between 3 Apr 1869 and 7 Jun 1871";
+    labels_[2].shortBirth = "1869-1871";
+    labels_[2].death = "2 May 1890";
+    labels_[2].shortDeath = "1890";
+    const std::string svg = draw();
+    EXPECT_THAT(svg, HasSubstr(">* 1869-1871</text>"));
+    EXPECT_THAT(svg, HasSubstr(">\xE2\x80\xA0 2 May 1890</text>"));
+    EXPECT_THAT(svg, HasSubstr("* between 3 Apr 1869 and 7 Jun 1871"));
 }
 
 TEST_F(Picture, surnameStandsFirstWhereItIsWrittenSo) {

@@ -52,11 +52,43 @@ TEST(GedcomLabels, datesPlacesAndTheFirstOccupationStandWhereAskedFor) {
     const GedcomData data = dataOf(kCouple);
     ShownFacts shown;
     shown.dates = true;
-    EXPECT_EQ(GedcomLabels(data, shown).ofPerson(1).birth, "3 MAY 1819");
+    EXPECT_EQ(GedcomLabels(data, shown).ofPerson(1).birth, "3 May 1819");
     shown.places = true;
     EXPECT_THAT(GedcomLabels(data, shown).ofPerson(1).details, ElementsAre("* Bergen", "† Oslo"));
     shown.occupation = true;
     EXPECT_THAT(GedcomLabels(data, shown).ofPerson(1).details, ElementsAre("* Bergen", "† Oslo", "Weaver"));
+}
+
+TEST(GedcomLabels, datesAndLivesAreInTheLanguageOfTheReader) {
+    const GedcomData data = dataOf(kCouple);
+    ShownFacts shown;
+    EXPECT_EQ(GedcomLabels(data, shown, {}, kin::Language::german).ofPerson(1).life, "1819 – um 1890");
+    shown.dates = true;
+    const kin::PersonLabel ada = GedcomLabels(data, shown, {}, kin::Language::german).ofPerson(1);
+    EXPECT_EQ(kin::lifeLine(ada), "* 3. Mai 1819  † um 1890");
+    EXPECT_EQ(kin::lifeWords(ada), "geboren 3. Mai 1819, gestorben um 1890");
+    const kin::PersonLabel inSpanish = GedcomLabels(data, shown, {}, kin::Language::spanish).ofPerson(1);
+    EXPECT_THAT(kin::lifeLines(inSpanish), ElementsAre("* 3 may 1819", "† hacia 1890"));
+    EXPECT_THAT(kin::shortLifeLines(inSpanish), ElementsAre("* 1819", "† ~1890"));
+}
+
+TEST(GedcomLabels, aDeathWithoutADateIsACross) {
+    const GedcomData data =
+        dataOf("0 @A@ INDI\n1 BIRT\n2 DATE 1819\n1 DEAT Y\n0 @B@ INDI\n1 BURI\n0 @C@ INDI\n");
+    const GedcomLabels labels(data);
+    EXPECT_EQ(kin::lifeLine(labels.ofPerson(1)), "* 1819  †");
+    EXPECT_EQ(kin::lifeLine(labels.ofPerson(2)), "†");
+    EXPECT_EQ(kin::lifeLine(labels.ofPerson(3)), "");
+    kin::PersonLabel hidden = labels.ofPerson(1);
+    hidden.living = true;
+    EXPECT_EQ(kin::lifeLine(hidden) + kin::lifeWords(hidden), "");
+}
+
+TEST(GedcomLabels, emptyLevelsOfAPlaceAreLeftOut) {
+    const GedcomData data = dataOf("0 @A@ INDI\n1 BIRT\n2 PLAC Kew,,, England\n");
+    ShownFacts shown;
+    shown.places = true;
+    EXPECT_THAT(GedcomLabels(data, shown).ofPerson(1).details, ElementsAre("* Kew, England"));
 }
 
 TEST(GedcomLabels, marriageHasItsYearWhereAskedFor) {

@@ -8,7 +8,6 @@
 
 import type { DrawingTheme, GedcomFile, Olvane, PaperOptions, PaperSheets, Person } from "olvane";
 import type { ViewName } from "../base/views";
-import { nameOf, yearsOf } from "../messages/names";
 import { OpenFamily } from "../view/OpenFamily";
 import type { Box } from "../view/Picture";
 import type { Sight } from "../view/SharedLink";
@@ -291,11 +290,11 @@ export class OlvaneTree extends HTMLElement {
     }
 
     nameOf(person: Person): string {
-        return nameOf(person, this.viewer.messages);
+        return this.viewer.messages.nameOf(person);
     }
 
     yearsOf(person: Person): string {
-        return yearsOf(person, this.viewer.messages);
+        return this.viewer.messages.yearsOf(person);
     }
 
     /** To the focus; empty while it is not known. */

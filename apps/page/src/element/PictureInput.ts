@@ -6,7 +6,6 @@
 
 import type { Branch } from "olvane";
 import type { Messages } from "../messages";
-import { nameOf, yearsOf } from "../messages/names";
 import type { UiMessages } from "../messages/ui";
 import type { Scene } from "../scene/Scene";
 import { type OuterKey, pictureKey } from "../ui/pictureKeys";
@@ -60,9 +59,9 @@ export class PictureInput {
         const hidden = contents.hiddenOf(box);
         const boxes = picture.boxesOf(person.id).length;
         this.tooltip.show(element, {
-            name: nameOf(person, messages),
+            name: messages.nameOf(person),
             lines: [
-                yearsOf(person, messages),
+                messages.yearsOf(person),
                 box === picture.focusBox ? ui.inFocus : this.shown.kinshipOf(person),
                 hidden >= 0 ? ui.hiddenCount(hidden) : "",
                 boxes > 1 ? ui.severalBoxes(boxes) : "",

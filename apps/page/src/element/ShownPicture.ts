@@ -10,7 +10,6 @@
 import { type BranchSize, type DrawingTheme, type PaperOptions, type PaperSheets, type Person } from "olvane";
 import { hasFolds } from "../base/views";
 import type { Messages } from "../messages";
-import { nameOf } from "../messages/names";
 import type { UiMessages } from "../messages/ui";
 import { PictureContents } from "../scene/PictureContents";
 import type { OpenFamily } from "../view/OpenFamily";
@@ -115,7 +114,7 @@ export class ShownPicture {
     title(): string {
         const focus = this.opened?.person(this.shownState?.focus ?? 0);
         const { messages, ui } = this.words();
-        return focus ? ui.treeLabel(nameOf(focus, messages), ui.views[this.shownState!.view]) : "";
+        return focus ? ui.treeLabel(messages.nameOf(focus), ui.views[this.shownState!.view]) : "";
     }
 
     /** To the focus; empty while it is not known. */

@@ -8,8 +8,7 @@
 
 import { type Branch, LayoutError, type PictureOptions } from "olvane";
 import { html, setAttributes, svg } from "../base/dom";
-import { type Messages, messagesFor } from "../messages";
-import { nameOf } from "../messages/names";
+import { Messages } from "../messages";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import type { PictureContents } from "../scene/PictureContents";
 import { Scene } from "../scene/Scene";
@@ -126,7 +125,7 @@ export class Viewer {
         this.draw(this.shown.picture!, this.shown.contents!, anchor);
         const person = family.person(state.focus)!;
         const boxes = this.picture!.boxes.length;
-        this.announce(before, state, this.words.ui.focusNow(nameOf(person, this.messages), boxes));
+        this.announce(before, state, this.words.ui.focusNow(this.messages.nameOf(person), boxes));
         this.panelPerson = state.focus;
         this.refreshPanel();
         performance.measure("olvane-picture", { start });
@@ -258,7 +257,8 @@ export class Viewer {
     }
 
     private wordsOfLanguage(): { messages: Messages; ui: UiMessages } {
-        return { messages: messagesFor(this.languageTag), ui: uiMessagesFor(this.languageTag) };
+        const messages = new Messages(this.languageTag, () => this.shown.family!.file.texts);
+        return { messages, ui: uiMessagesFor(this.languageTag) };
     }
 
     /** Speaks the language that the element's attribute names now. */

@@ -8,7 +8,6 @@ import type { Person } from "olvane";
 import { iconButton } from "../base/controls";
 import { html } from "../base/dom";
 import type { Messages } from "../messages";
-import { nameOf, yearsOf } from "../messages/names";
 import type { UiMessages } from "../messages/ui";
 import { type FamilyMap, type Kin, kNobody } from "./FamilyMap";
 import { kReadable, MapCamera, type MapPlace } from "./MapCamera";
@@ -232,11 +231,11 @@ export class MapView {
     // --- drawing ---
 
     private nameOf(person: number): string {
-        return nameOf(this.person(person), this.messages);
+        return this.messages.nameOf(this.person(person));
     }
 
     private yearsOf(person: number): string {
-        return yearsOf(this.person(person), this.messages);
+        return this.messages.yearsOf(this.person(person));
     }
 
     private person(person: number): Person {

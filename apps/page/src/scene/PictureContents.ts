@@ -4,10 +4,9 @@
 // What stands in each box and what is read out for it. Kinship is stated only once it is known, since a search
 // through a large family must not hold up the picture.
 
-import type { BranchSize, NameParts, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
+import type { BranchSize, Person, PersonLabel, PictureFamily, ShownFact, Texts } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { nameOf, yearsOf } from "../messages/names";
 import type { BoxLook, BranchMark } from "./boxArt";
 import type { BoxContents } from "./Scene";
 import type { KinshipTexts } from "../view/KinshipTexts";
@@ -28,8 +27,11 @@ export interface Wording {
     readonly branchesOf: (person: number) => readonly BranchSize[];
 }
 
+const kLabelsAtOnce = 16; // boxes
+
 export class PictureContents implements BoxContents {
     kinshipKnown = false;
+    private readonly labels = new Map<number, PersonLabel>();
 
     constructor(
         private readonly family: OpenFamily,
@@ -89,14 +91,30 @@ export class PictureContents implements BoxContents {
     private branchMark(box: Box, size: BranchSize): BranchMark {
         const { ui, messages } = this.wording;
         const isFolded = box.folded.some(({ branch }) => branch === size.branch);
-        const name = nameOf(this.family.person(box.person)!, messages);
+        const name = messages.nameOf(this.family.person(box.person)!);
         const label = (isFolded ? ui.unfold : ui.fold)(ui.branches[size.branch], name, size.count);
         return { ...size, isFolded, label };
     }
 
     labelOf(family: PictureFamily): string {
-        const { show } = this.wording;
-        return show.has("marriage") && family.number > 0 ? this.family.file.labelOfFamily(family.number, show) : "";
+        const { show, ui } = this.wording;
+        return show.has("marriage") && family.number > 0
+            ? this.family.file.labelOfFamily(family.number, show, ui.language)
+            : "";
+    }
+
+    // Asked for many boxes at a time, since most of them are seen together.
+    private labelOfBox(box: Box): PersonLabel {
+        const known = this.labels.get(box.person);
+        if (known) return known;
+        const { boxes } = this.picture;
+        const first = Math.max(0, boxes.indexOf(box));
+        const persons = boxes.slice(first, first + kLabelsAtOnce).map(({ person }) => person);
+        const missing = [...new Set(persons)].filter((person) => person !== 0 && !this.labels.has(person));
+        const { show, ui } = this.wording;
+        const labels = this.family.file.labelsOfPersons(missing, show, ui.language);
+        missing.forEach((person, i) => this.labels.set(person, labels[i]!));
+        return this.labels.get(box.person)!;
     }
 
     private personLook(person: Person, box: Box): BoxLook {
@@ -105,12 +123,11 @@ export class PictureContents implements BoxContents {
         const kinship = this.kinshipKnown ? this.kinshipOf(person.id) : "";
         const hidden = this.hiddenOf(box);
         const { ui, messages, show } = this.wording;
-        const says: PersonLabel | null = show.size > 0 ? this.family.file.labelOfPerson(person.id, show) : null;
-        const dates = says && show.has("dates") ? datesOf(says) : [];
+        const says = this.labelOfBox(box);
         const label = [
-            nameOf(person, messages),
-            dates.join(", ") || yearsOf(person, messages),
-            ...(says?.details ?? []),
+            messages.nameOf(person),
+            says.life,
+            ...says.details,
             isFocus ? ui.inFocus : kinship,
             boxes > 1 && ui.severalBoxes(boxes),
             hidden >= 0 && box.folded.length === 0 && ui.hiddenCount(hidden),
@@ -124,14 +141,15 @@ export class PictureContents implements BoxContents {
             person: person.id,
             xref: person.xref,
             sex: person.sex,
-            name: nameParts(person, messages),
+            name: says,
             texts: this.texts,
             rightToLeft: this.texts.runsRightToLeft(person.name),
             inside: this.wording.render?.(person, box) ?? null,
             photo: this.wording.portraitOf?.(person.id) ?? null,
-            years: dates.join("  ") || shortYears(person),
-            dates,
-            details: says?.details ?? [],
+            years: says.lines.join("  "),
+            dates: says.lines,
+            shortDates: says.shortLines,
+            details: says.details,
             factHeight: factHeight(show),
             kinship: this.wording.kinshipInBoxes ? (this.kinshipKnown ? this.kinshipWordings(person.id) : []) : null,
             hidden,
@@ -160,6 +178,7 @@ export class PictureContents implements BoxContents {
             photo: null,
             years: "",
             dates: [],
+            shortDates: [],
             details: [],
             factHeight: factHeight(this.wording.show),
             kinship: null,
@@ -170,26 +189,7 @@ export class PictureContents implements BoxContents {
             marks: [],
             repeated: false,
             isFocus: false,
-            label: child ? ui.missingOf(what, nameOf(child, messages)) : what,
+            label: child ? ui.missingOf(what, messages.nameOf(child)) : what,
         };
     }
-}
-
-// The same in every language: "1809–1882", "* ~1809", "† 1882", and a cross alone for a death without a year.
-export function shortYears(person: Person): string {
-    const birth = person.birth?.year ? person.birth.shown : "";
-    const death = person.death?.year ? person.death.shown : "";
-    if (birth && death) return birth.length + death.length > 8 ? `${birth} \u2013 ${death}` : `${birth}\u2013${death}`;
-    if (death) return "\u2020 " + death;
-    return [birth && "* " + birth, person.dead && "\u2020"].filter(Boolean).join("  ");
-}
-
-function datesOf({ birth, death }: PersonLabel): string[] {
-    return [birth && "* " + birth, death && "\u2020 " + death].filter(Boolean);
-}
-
-function nameParts(person: Person, messages: Messages): NameParts {
-    const { given, surname, surnameFirst } = person;
-    if (!given || !surname) return { given: nameOf(person, messages), surname: "" };
-    return { given, surname, surnameFirst };
 }

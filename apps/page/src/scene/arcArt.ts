@@ -30,9 +30,9 @@ export function appendArc(group: SVGGElement, look: BoxLook, box: Box, arc: BoxA
     appendText(group, look, box, arc);
 }
 
-function appendText(group: SVGGElement, { texts, name, years }: BoxLook, box: Box, arc: BoxArc): void {
+function appendText(group: SVGGElement, { texts, name, dates }: BoxLook, box: Box, arc: BoxArc): void {
     const holder = svg("g", { transform: `translate(${arc.middleX - box.x} ${arc.middleY - box.y})` });
-    for (const line of texts.placeInCell(name, years ? [years] : [], arc)) {
+    for (const line of texts.placeInCell(name, dates, arc)) {
         const { text, isName, size, x, y, turn, baseline } = line;
         holder.append(
             svg(

@@ -37,8 +37,9 @@ export interface BoxLook {
     // What a program draws in place of everything within the frame.
     readonly inside: SVGElement | null;
     readonly years: string;
-    // Birth and death each, where dates are shown, for a room that is too narrow for years.
+    // Birth and death each, for a room that is too narrow for years, and in fewer letters.
     readonly dates: readonly string[];
+    readonly shortDates: readonly string[];
     // Further lines below the years.
     readonly details: readonly string[];
     // Of the box, for what is shown beside names and years.
@@ -239,9 +240,10 @@ function kinLines({ kinship, texts }: BoxLook, room: number): SizedLines {
 }
 
 // Years or dates, then the details.
-function factLines({ years, dates, details, texts }: BoxLook, room: number): string[] {
-    const isTooWide = dates.length > 1 && texts.width(years, kYearsSize) > room;
-    const lines = [...(isTooWide ? dates : [years]), ...details].filter(Boolean);
+function factLines({ years, dates, shortDates, details, texts }: BoxLook, room: number): string[] {
+    const hasRoom = (line: string) => texts.width(line, kYearsSize) <= room;
+    const life = hasRoom(years) ? [years] : dates.map((line, i) => (hasRoom(line) ? line : shortDates[i]!));
+    const lines = [...life, ...details].filter(Boolean);
     return lines.map((line) => texts.fitLine(line, kYearsSize, room));
 }
 

@@ -5,6 +5,7 @@
 
 import type { Person } from "olvane";
 import type { OlvaneTree } from "../element/OlvaneTree";
+import type { Messages } from "../messages";
 import type { MapHost } from "./MapHost";
 import type { SearchSource } from "./SearchBox";
 import type { Found } from "./searchReasons";
@@ -20,7 +21,12 @@ export class Finding implements SearchSource {
     constructor(
         private readonly tree: OlvaneTree,
         private readonly maps: MapHost,
+        private readonly messagesNow: () => Messages,
     ) {}
+
+    get messages(): Messages {
+        return this.messagesNow();
+    }
 
     /** Makes the index of the open family beside everything else, so that nobody's first letter waits for it. */
     prepare(): void {
@@ -46,11 +52,7 @@ export class Finding implements SearchSource {
     }
 
     nameOf(person: Person): string {
-        return this.tree.nameOf(person);
-    }
-
-    yearsOf(person: Person): string {
-        return this.tree.yearsOf(person);
+        return this.messages.nameOf(person);
     }
 
     kinshipOf(person: Person): string {

@@ -11,7 +11,7 @@ import { MapError } from "../map/mapBytes";
 import { mapPerson } from "../map/mapPerson";
 import { MapSearch } from "../map/mapSearch";
 import { MapView } from "../map/MapView";
-import { messagesFor } from "../messages";
+import { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import type { Found } from "./searchReasons";
 
@@ -147,7 +147,7 @@ export class MapHost {
         if (this.view) return this.view;
         const map = this.map!;
         const home = Math.max(0, map.person(this.home));
-        this.view = new MapView(map, ui, messagesFor(ui.language), home, {
+        this.view = new MapView(map, ui, new Messages(ui.language, () => this.texts), home, {
             openPerson: (number) => this.page.openPerson(number),
             mapMoved: () => this.moved(),
         });

@@ -7,6 +7,7 @@ import type { Olvane } from "olvane";
 import { recall } from "../base/dom";
 import type { OlvaneTree } from "../element/OlvaneTree";
 import type { EmbeddedFamily } from "../engine/engine";
+import { Messages } from "../messages";
 import { type UiMessages, uiMessagesFor } from "../messages/ui";
 import { Notices } from "../ui/Notices";
 import { FileOpening } from "./FileOpening";
@@ -38,7 +39,10 @@ export class Page {
     remarks: FileRemarks | null = null;
     unread: EmbeddedFamily | null = null; // the family beside an embedded map, read when somebody leaves the map
 
-    constructor(engine: Olvane, steps: PageSteps) {
+    constructor(
+        private readonly engine: Olvane,
+        steps: PageSteps,
+    ) {
         const language = recall("language") ?? navigator.language;
         this.ui = uiMessagesFor(language);
         this.tree.setAttribute("language", language);
@@ -55,6 +59,11 @@ export class Page {
             },
             engine.texts,
         );
+    }
+
+    /** In the language of the page, of a family or of a map. */
+    get messages(): Messages {
+        return new Messages(this.ui.language, () => this.engine.texts);
     }
 
     /** Of the family that is open, or of the map while there is nothing else. */

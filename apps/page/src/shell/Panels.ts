@@ -46,7 +46,7 @@ export class Panels {
         open: (files: readonly File[]) => void,
     ) {
         this.theme = new Theme(page.tree);
-        this.finding = new Finding(page.tree, page.maps);
+        this.finding = new Finding(page.tree, page.maps, () => page.messages);
         this.output = new PictureOutput(() => this.subject(), page.notices);
         this.input = fileInput((file) => open([file]));
         takeDrops(this.cover, open);

@@ -8,15 +8,14 @@ import type { Person } from "olvane";
 import type { UiMessages } from "../messages/ui";
 import { html, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
-import { messagesFor } from "../messages";
+import type { Messages } from "../messages";
 import { type Found, marked, reasonLines, wordsInName } from "./searchReasons";
 
 const kMostFound = 30;
 
 export interface SearchSource {
     find(text: string, limit: number): readonly Found[];
-    nameOf(person: Person): string;
-    yearsOf(person: Person): string;
+    readonly messages: Messages;
     kinshipOf(person: Person): string;
     choose(person: Person): void;
 }
@@ -31,7 +30,7 @@ export class SearchBox {
 
     constructor(
         private readonly source: SearchSource,
-        private readonly messages: UiMessages,
+        private readonly ui: UiMessages,
     ) {
         this.input = html("input", {
             id: "search",
@@ -40,8 +39,8 @@ export class SearchBox {
             "aria-autocomplete": "list",
             "aria-expanded": "false",
             "aria-controls": "search-list",
-            "aria-label": messages.search.label,
-            placeholder: messages.search.label,
+            "aria-label": ui.search.label,
+            placeholder: ui.search.label,
             autocomplete: "off",
             autocapitalize: "off",
             spellcheck: "false",
@@ -50,7 +49,7 @@ export class SearchBox {
         this.list = html("ul", {
             id: "search-list",
             role: "listbox",
-            "aria-label": messages.search.label,
+            "aria-label": ui.search.label,
             hidden: true,
         });
         this.status = html("div", { class: "unseen", role: "status" });
@@ -121,7 +120,7 @@ export class SearchBox {
         const found = this.source.find(text, kMostFound + 1);
         this.found = found.slice(0, kMostFound);
         const areMore = found.length > kMostFound;
-        const { search } = this.messages;
+        const { search } = this.ui;
         // To the first one, while the browser need not lay the new list out for that.
         this.list.scrollTop = 0;
         this.list.replaceChildren(...this.found.map((found, i) => this.option(found, i)));
@@ -134,7 +133,7 @@ export class SearchBox {
     }
 
     private counted(count: number): string {
-        const { search } = this.messages;
+        const { search } = this.ui;
         return count > 0 ? search.count(count) : search.none;
     }
 
@@ -144,7 +143,8 @@ export class SearchBox {
     }
 
     private option(found: Found, index: number): HTMLLIElement {
-        const { source, messages } = this;
+        const { source, ui } = this;
+        const { messages } = source;
         const { person } = found;
         const option = html(
             "li",
@@ -153,11 +153,11 @@ export class SearchBox {
             html(
                 "span",
                 { class: "who" },
-                html("bdi", { class: "name" }, ...marked(source.nameOf(person), wordsInName(found))),
+                html("bdi", { class: "name" }, ...marked(messages.nameOf(person), wordsInName(found))),
                 html("span", { class: "kin" }, source.kinshipOf(person)),
-                ...reasonLines(found, messages, messagesFor(messages.language)),
+                ...reasonLines(found, ui, messages),
             ),
-            html("span", { class: "years" }, source.yearsOf(person)),
+            html("span", { class: "years" }, messages.yearsOf(person)),
         );
         onClick(option, () => this.choose(person));
         return option;

@@ -6,9 +6,8 @@
 
 import type { Person, SearchHit, SearchReason } from "olvane";
 import { html } from "../base/dom";
-import { factLabel, type Messages } from "../messages";
+import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { placeText } from "../messages/names";
 
 /** Somebody whom a search has found. */
 export interface Found {
@@ -47,11 +46,18 @@ export function reasonLines({ person, hit }: Found, ui: UiMessages, messages: Me
         const text = reason.foundIn === "identifier" ? person.xref : reason.text;
         if (label === "" || text === "" || seen.has(label + text)) continue;
         seen.add(label + text);
-        const words = hit.reasons.filter((other) => other.text === reason.text).map(({ written }) => written);
-        const shown = reason.foundIn === "place" ? placeText(text) : text;
+        const shown = shownText(reason, text, messages);
+        const words = reason.isDate
+            ? [shown]
+            : hit.reasons.filter((other) => other.text === reason.text).map(({ written }) => written);
         lines.push(html("span", { class: "why" }, label + ": ", html("bdi", {}, ...marked(shown, words))));
     }
     return lines;
+}
+
+function shownText({ foundIn, isDate }: SearchReason, text: string, messages: Messages): string {
+    if (isDate) return messages.dateText(text);
+    return foundIn === "place" ? messages.placeText(text) : text;
 }
 
 // A given name or a surname alone stands in the whole name, too.
@@ -65,6 +71,6 @@ function labelOf(reason: SearchReason, person: Person, ui: UiMessages, messages:
     if (isShownName(reason, person)) return fit === "similar" ? ui.search.similar : "";
     if (foundIn === "birth" || foundIn === "death") return "";
     if (foundIn === "identifier") return ui.search.foundIn.identifier;
-    if (foundIn === "place" || foundIn === "other" || label !== "") return factLabel(label, messages);
+    if (foundIn === "place" || foundIn === "other" || label !== "") return messages.factLabel(label);
     return ui.search.foundIn[foundIn];
 }

@@ -6,11 +6,9 @@
 
 import type { DetailedFact, DetailedName, PersonDetails } from "olvane";
 import { html, isolated } from "../base/dom";
-import { factLabel, type Messages } from "../messages";
-import { dateText, placeText } from "../messages/names";
+import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
 import { type DetailView, ownNameOf } from "./DetailView";
-import { inLifeOrder } from "./lifeOrder";
 
 // Shown by the panel in other ways, or of no use to a reader.
 const kShownElsewhere = new Set([
@@ -37,7 +35,7 @@ export class FactLists {
         private readonly details: DetailView,
     ) {}
 
-    /** Facts in the order of a life; without any, an empty list. */
+    /** Facts as they come; without any, an empty list. */
     listOf(facts: readonly DetailedFact[]): HTMLElement {
         const list = html("dl", {});
         this.appendAll(list, facts);
@@ -94,11 +92,11 @@ export class FactLists {
 
     private appendFactOf(list: HTMLElement, fact: DetailedFact): void {
         const { date, place, value, details } = fact;
-        const label = ownNameOf(fact) || factLabel(fact.tag, this.messages);
+        const label = ownNameOf(fact) || this.messages.factLabel(fact.tag);
         const type = details.type === label || details.type === value ? "" : details.type;
         const parts = [
-            date && html("span", { class: "date" }, dateText(date, this.messages)),
-            place && html("span", { class: "place", dir: "auto" }, placeText(place)),
+            date && html("span", { class: "date" }, this.messages.dateText(date.written)),
+            place && html("span", { class: "place", dir: "auto" }, this.messages.placeText(place)),
             value && value !== "Y" && value !== label && html("span", { class: "value", dir: "auto" }, value),
             type && html("span", { class: "detail", dir: "auto" }, type),
             ...this.details.linesOf(details),
@@ -111,6 +109,6 @@ export class FactLists {
     }
 
     private appendAll(list: HTMLElement, facts: readonly DetailedFact[]): void {
-        for (const fact of inLifeOrder(facts)) if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(list, fact);
+        for (const fact of facts) if (!kShownElsewhere.has(fact.tag)) this.appendFactOf(list, fact);
     }
 }

@@ -8,7 +8,6 @@
 import type { GedcomFamily as Family, KinshipWay, Person } from "olvane";
 import type { Messages } from "../messages";
 import type { UiMessages } from "../messages/ui";
-import { nameOf, yearsOf } from "../messages/names";
 import type { OpenFamily } from "../view/OpenFamily";
 import { html, isolated, onClick } from "../base/dom";
 import { icon, silhouette } from "../base/icons";
@@ -98,14 +97,14 @@ export class SidePanel {
     private header(person: Person, { focus, kinship, boxes }: Standing): HTMLElement {
         const isFocus = person.id === focus.id;
         const relation = kinship
-            ? this.ui.relatedTo(kinship, "\u2068" + nameOf(focus, this.messages) + "\u2069")
-            : this.ui.notRelated("\u2068" + nameOf(focus, this.messages) + "\u2069");
+            ? this.ui.relatedTo(kinship, "\u2068" + this.messages.nameOf(focus) + "\u2069")
+            : this.ui.notRelated("\u2068" + this.messages.nameOf(focus) + "\u2069");
         const header = html(
             "header",
             {},
             silhouette(person.sex),
-            html("h2", { dir: "auto" }, nameOf(person, this.messages)),
-            html("p", { class: "years" }, yearsOf(person, this.messages)),
+            html("h2", { dir: "auto" }, this.messages.nameOf(person)),
+            html("p", { class: "years" }, this.messages.yearsOf(person)),
             html("p", { class: "kinship" }, isFocus ? this.ui.inFocus : relation),
         );
         if (!isFocus)
@@ -137,7 +136,7 @@ export class SidePanel {
     }
 
     private way({ text, persons }: KinshipWay, person: Person, family: OpenFamily): HTMLElement {
-        const names = persons.map((id) => isolated(nameOf(family.person(id)!, this.messages)));
+        const names = persons.map((id) => isolated(this.messages.nameOf(family.person(id)!)));
         const link = html(
             "a",
             { class: "way", href: this.events.waysAddressOf(person.id) },
@@ -240,8 +239,8 @@ export class SidePanel {
             "a",
             { class: "relative", href: this.events.addressOf(person.id), "data-person-id": person.id },
             silhouette(person.sex),
-            html("bdi", { class: "name" }, nameOf(person, this.messages)),
-            html("span", { class: "years" }, [yearsOf(person, this.messages), note].filter(Boolean).join(", ")),
+            html("bdi", { class: "name" }, this.messages.nameOf(person)),
+            html("span", { class: "years" }, [this.messages.yearsOf(person), note].filter(Boolean).join(", ")),
         );
         this.follow(link, () => this.events.select(person.id));
         return link;

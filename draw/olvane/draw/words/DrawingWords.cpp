@@ -19,8 +19,6 @@ constexpr std::array<Words, kPhrases> kWords{{
     {"{} of {}", "{}: {}", "{}: {}"},
     {"Nobody to show", "Niemand zu zeigen", "Nadie que mostrar"},
     {"Legend", "Legende", "Leyenda"},
-    {"Living", "Lebt", "Vive"},
-    {"Name not known", "Name unbekannt", "Nombre desconocido"},
     {" (focus of this picture)", " (Mittelpunkt dieses Bildes)", " (centro de esta imagen)"},
     {"Common ancestor", "Gemeinsamer Vorfahr", "Antepasado común"},
     {"Stands in {} boxes, all marked {}", "Steht in {} Kästen, alle mit der Marke {}",
@@ -116,13 +114,6 @@ std::string viewTitle(std::string_view view, kin::Language language) {
     const auto* const found =
         std::find_if(kViews.begin(), kViews.end(), [view](const ViewWords& one) { return one.view == view; });
     return std::string(found == kViews.end() ? view : inLanguage(found->words, language));
-}
-
-std::string fullNameIn(const kin::PersonLabel& label, kin::Language language) {
-    if (label.living) return std::string(wordsOf(Phrase::living, language));
-    if (label.given.empty() && label.surname.empty())
-        return std::string(wordsOf(Phrase::nameNotKnown, language));
-    return kin::fullName(label);
 }
 
 }  // namespace olvane::draw

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Olvane developers
 // SPDX-License-Identifier: MIT
 
-// Dates that were read, as texts that sort and as years for people to read.
+// Dates that were read, as texts that sort.
 
 #include <olvane/gedcom/GedcomDate.h>
 
@@ -12,10 +12,6 @@
 namespace olvane::gedcom {
 
 namespace {
-
-std::string yearText(int year) {
-    return year < 0 ? std::to_string(-year) + " BC" : std::to_string(year);
-}
 
 // Appends the number with leading zeros up to `digits` digits.
 void appendPadded(std::string& text, int number, std::size_t digits) {
@@ -54,19 +50,6 @@ std::string sortText(const GedcomDate& date) {
     if (date.mark == DateMark::after) return sortableDate(day) + "~";
     if (date.mark == DateMark::before && date.year > -kLastYear) return sortableDate(justBefore(day)) + "~";
     return sortableDate(day);
-}
-
-std::string displayYear(const GedcomDate& date) {
-    if (!date.isRead()) return std::string(date.written);
-    std::string text;
-    if (date.mark == DateMark::about) text.push_back('~');
-    if (date.mark == DateMark::before) text.push_back('<');
-    if (date.mark == DateMark::after) text.push_back('>');
-    text.append(yearText(date.year));
-    if (date.mark == DateMark::between && date.lastYear != 0 && date.lastYear != date.year) {
-        text.append("-").append(yearText(date.lastYear));
-    }
-    return text;
 }
 
 }  // namespace olvane::gedcom
