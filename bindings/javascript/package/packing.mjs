@@ -9,7 +9,7 @@ import { LETTERS } from "./unpack.mjs";
 
 /** A file in the format .lzma, whose header has the size of what is packed. */
 export function packedLzma(bytes) {
-    const options = ["--format=lzma", "--lzma1=preset=9e,lc=3,lp=0,pb=0,nice=273", "--stdout"];
+    const options = ["--format=lzma", "--lzma1=preset=9e,lc=2,lp=0,pb=0,nice=273", "--stdout"];
     const packed = execFileSync("xz", options, { input: bytes, maxBuffer: 1 << 30 });
     packed.writeBigUInt64LE(BigInt(bytes.length), 5);
     return packed;

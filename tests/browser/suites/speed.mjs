@@ -187,14 +187,14 @@ describe("speed", () => {
         context.diagnostic(
             `the page without a family: ${(page / 1000).toFixed(0)} kB; with 142 persons: ${((page + family) / 1000).toFixed(0)} kB`,
         );
-        assert.ok(page < 440_000, `${page} bytes`);
+        assert.ok(page < 442_500, `${page} bytes`);
         // Just above what they are, so that they grow no further unseen; 200 kB and 280 kB are the aims.
         const packed = async (bytes) => gzipSync(await bytes, { level: 9 }).length;
         const engine = await packed(engineIn(readFileSync(process.env.OLVANE_PAGE, "utf8")));
         context.diagnostic(`the engine, packed by gzip: ${(engine / 1000).toFixed(0)} kB`);
-        assert.ok(engine < 377_000, `${engine} bytes`);
+        assert.ok(engine < 380_500, `${engine} bytes`);
         const element = await packed(readFileSync(process.env.OLVANE_ELEMENT));
         context.diagnostic(`the element, packed by gzip: ${(element / 1000).toFixed(0)} kB`);
-        assert.ok(element < 340_000, `${element} bytes`);
+        assert.ok(element < 341_500, `${element} bytes`);
     });
 });
