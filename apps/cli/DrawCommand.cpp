@@ -197,6 +197,8 @@ int runDraw(const DrawOptions& options) {
     const Form form = formOf(options.output);
     const OutputRules rules{InputFiles({options.input.file}), {endingOf(form)}};
     checkOutput(options.output, rules);
+    // Before any font is looked for: Fontconfig has words of its own for a time that is none.
+    const auto date = form == Form::pdf ? sourceDate() : std::nullopt;
     const gedcom::GedcomData data =
         options.shown.needFacts() ? readFileWithFacts(options.input) : readFile(options.input);
     const Drawn drawn = options.paper.onPaper() ? drawOnSheets(data, options) : drawWhole(data, options);
@@ -209,7 +211,7 @@ int runDraw(const DrawOptions& options) {
         const double scale = options.paper.onPaper() || options.paper.scale <= 0 ? 1 : options.paper.scale;
         TerminalProgress progress;
         if (takesLong(drawn.sheets)) progress.announce("writing the PDF");
-        writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, sourceDate()), rules);
+        writeOutput(options.output, pdfOf(drawn.sheets, drawn.title, scale, date), rules);
     } else {
         writeSheets(options, form, drawn.sheets, rules);
     }
