@@ -36,6 +36,15 @@ before(async () => {
 });
 after(() => server?.close());
 
+// A page of the site, with a file that was dropped on it.
+async function visitSite() {
+    const context = await newContext();
+    const visit = await Visit.begin(context, address + "/page.html");
+    await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
+    await visit.untilFamily();
+    return { context, visit };
+}
+
 async function copiedLink(visit) {
     await visit.page.evaluate(() => {
         navigator.clipboard.writeText = (text) => Promise.resolve((window.copied = text)).then(() => {});
@@ -110,10 +119,7 @@ describe("sharing", kTwoAtOnce, () => {
     });
 
     test("on a site a file stays when that is asked for, and goes when it is taken back", async () => {
-        const context = await newContext();
-        const visit = await Visit.begin(context, address + "/page.html");
-        await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
-        await visit.untilFamily();
+        const { context, visit } = await visitSite();
         const kept = () => visit.page.evaluate(async () => (await indexedDB.databases()).length);
         assert.equal(await kept(), 0, "nothing is kept unasked");
         await visit.page.click("#file-button");
@@ -135,10 +141,7 @@ describe("sharing", kTwoAtOnce, () => {
     });
 
     test("a file that was kept and at once removed is not kept", async () => {
-        const context = await newContext();
-        const visit = await Visit.begin(context, address + "/page.html");
-        await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
-        await visit.untilFamily();
+        const { context, visit } = await visitSite();
         await visit.page.click("#file-button");
         await visit.page.evaluate(() => {
             const box = document.querySelector("#keep-file");
@@ -152,10 +155,7 @@ describe("sharing", kTwoAtOnce, () => {
     });
 
     test("a kept file that the browser cannot read now is there on the next visit", async () => {
-        const context = await newContext();
-        const visit = await Visit.begin(context, address + "/page.html");
-        await visit.drop("darwin-wedgwood.ged", sample("darwin-wedgwood.ged"));
-        await visit.untilFamily();
+        const { context, visit } = await visitSite();
         await visit.page.click("#file-button");
         await visit.page.check("#keep-file");
         await visit.page.waitForSelector("#notices .notice >> text=This file stays");

@@ -113,10 +113,6 @@ export class Picture {
         this.focusBox = this.boxes[values.focus] ?? this.byPerson.get(focus)?.[0] ?? this.boxes[0]!;
     }
 
-    get isRound(): boolean {
-        return this.boxes[0]?.arc !== null;
-    }
-
     areaOf(box: Box): Rectangle {
         return areaOf(box);
     }
